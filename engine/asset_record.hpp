@@ -1,0 +1,16 @@
+// The record that discovery keeps of each control of an adopted window.
+#pragma once
+
+#include <array>
+#include <string>
+
+#include "toolkit/ref.hpp"
+#include "toolkit/view.hpp"
+
+/// What a control was when it was found, in this order: its class name (a list of one), its frame
+/// (x, y, width, height, each in single precision) and the control itself, which its window owns.
+struct AssetRecord {
+  std::array<std::string, 1> classNames;
+  std::array<float, 4> frame{};
+  toolkit::Link<toolkit::View> control;
+};

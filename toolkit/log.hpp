@@ -1,0 +1,16 @@
+// The log: where diagnostic lines go (`NSLog` on macOS).
+#pragma once
+
+#include <string_view>
+
+namespace toolkit {
+
+class Log {
+ public:
+  virtual ~Log() = default;
+
+  /// Writes one line, given without its line end. Lines have no levels.
+  virtual void write(std::string_view line) = 0;
+};
+
+}  // namespace toolkit

@@ -1,0 +1,128 @@
+// Values: what property lists hold and tables keep.
+//
+// Invariants: a value is shared through counted references and has an identity, its address, for as
+// long as it is referred to. Values read from a file never change. Only arrays and dictionaries can
+// be mutable, and only those made so. The counting is safe on any thread, nothing else is.
+//
+// A value is sent messages without being asked first what it is: what its kind does not understand
+// raises. `->` on an absent reference answers zero, NO or absent.
+#pragma once
+
+#include <atomic>
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+#include "toolkit/ref.hpp"
+
+namespace toolkit {
+
+/// Pointer that shares ownership of a value by the count within the value.
+template <class T>
+class Counted {
+ public:
+  Counted() = default;
+  /// Takes over one count that the caller holds already.
+  static Counted adopt(T* value) {
+    Counted counted;
+    counted.value_ = value;
+    return counted;
+  }
+  /// Adds a count of its own.
+  static Counted share(T* value) {
+    if (value) value->retain();
+    return adopt(value);
+  }
+
+  Counted(const Counted& other) : Counted(share(other.value_)) {}
+  Counted(Counted&& other) noexcept : value_(std::exchange(other.value_, nullptr)) {}
+  template <class U, class = std::enable_if_t<std::is_convertible_v<U*, T*>>>
+  Counted(const Counted<U>& other) : Counted(share(other.get())) {}
+  Counted& operator=(Counted other) noexcept {
+    std::swap(value_, other.value_);
+    return *this;
+  }
+  ~Counted() {
+    if (value_) value_->release();
+  }
+
+  T* get() const { return value_; }
+  T& operator*() const { return *value_; }
+  friend bool operator==(const Counted& a, const Counted& b) { return a.value_ == b.value_; }
+  friend bool operator==(const Counted& a, std::nullptr_t) { return a.value_ == nullptr; }
+
+ private:
+  T* value_ = nullptr;
+};
+
+class Value;
+
+/// Counted reference to a value of the kind named, or to nothing.
+template <class T = Value>
+using ValueRef = Ref<T, Counted>;
+
+class Value {
+ public:
+  enum class Kind : std::uint8_t {
+    nothing,  ///< only of the object that stands for an absent value
+    string,
+    number,
+    date,
+    data,
+    null,
+    uid,
+    set,
+    array,
+    dictionary
+  };
+
+  static Value& nothing();
+  Value(const Value&) = delete;
+  Value& operator=(const Value&) = delete;
+
+  Kind kind() const { return kind_; }
+  /// The name of the kind in messages, such as "NSString".
+  std::string_view className() const;
+
+  // Conversions, of strings and numbers; any other kind raises. Strings convert by the rules of
+  // number_conversion.hpp. An integer out of the result's range keeps its low bits; a real is
+  // truncated, and one that is out of range or no number gives the nearest bound, or 0.
+  virtual std::int32_t intValue() const;
+  virtual std::int64_t integerValue() const;
+  virtual std::int64_t longValue() const;
+  virtual float floatValue() const;
+  virtual double doubleValue() const;
+  virtual bool boolValue() const;
+
+  /// How many elements a collection has; anything else raises.
+  virtual std::size_t count() const;
+  /// The element of an array; a range exception beyond its end. Anything but an array raises.
+  virtual ValueRef<> objectAtIndex(std::size_t index) const;
+
+  /// The value as a person would read it; a string is itself. Collections are in the old style.
+  virtual std::string description() const;
+
+  void retain() { count_.fetch_add(1, std::memory_order_relaxed); }
+  void release() {
+    if (count_.fetch_sub(1, std::memory_order_acq_rel) == 1) destroy();
+  }
+
+ protected:
+  explicit Value(Kind kind) : kind_(kind) {}
+  virtual ~Value() = default;
+  virtual void destroy();
+  [[noreturn]] void doesNotUnderstand(std::string_view selector) const;
+
+ private:
+  std::atomic<std::uint32_t> count_{1};
+  Kind kind_;
+};
+
+/// Whether arrays and dictionaries can change: `ignored` ones swallow every change (they stand for
+/// an absent collection), `immutable` ones raise an invalid-argument exception.
+enum class Mutability : std::uint8_t { ignored, immutable, changeable };
+
+}  // namespace toolkit

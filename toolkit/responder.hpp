@@ -1,0 +1,24 @@
+// Responders: objects to which a control sends its action.
+#pragma once
+
+#include <memory>
+#include <string_view>
+
+#include "toolkit/ref.hpp"
+
+namespace toolkit {
+
+class View;
+
+/// The target of a control, or a link of the chain along which the action of a control without a
+/// target travels: the control, its superviews, their window, the window's delegate.
+class Responder {
+ public:
+  virtual ~Responder() = default;
+
+  /// Performs `action` (a selector's text such as "buttonPushed:") on behalf of `sender`. NO when
+  /// this responder does not understand the action; the next one of the chain is asked then.
+  virtual bool tryToPerform(std::string_view action, const Ref<View>& sender);
+};
+
+}  // namespace toolkit

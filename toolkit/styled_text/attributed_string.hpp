@@ -1,0 +1,92 @@
+// Attributed strings: text with attributes that hold over ranges of it.
+//
+// Invariants: the runs cover the text without gap or overlap, in order; none is empty; two
+// neighbours differ in their attributes. Positions and lengths count bytes of the UTF-8 text, and
+// ranges are half-open.
+#pragma once
+
+#include <cstddef>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "toolkit/styled_text/color.hpp"
+#include "toolkit/styled_text/fonts.hpp"
+
+namespace toolkit {
+
+enum class TextAlignment : int { left = 0, right = 1, center = 2, justified = 3, natural = 4 };
+
+/// Layout of whole paragraphs. Lengths are points.
+struct ParagraphStyle {
+  TextAlignment alignment = TextAlignment::natural;
+  double firstLineHeadIndent = 0;
+  double headIndent = 0;
+
+  friend bool operator==(const ParagraphStyle&, const ParagraphStyle&) = default;
+};
+
+/// The attributes of a run; an absent one leaves the choice to whoever draws the text.
+struct TextAttributes {
+  std::optional<Font> font;
+  std::optional<Color> foregroundColor;
+  std::optional<Color> backgroundColor;
+  std::optional<ParagraphStyle> paragraphStyle;
+  std::optional<std::string> link;  ///< the address a click opens
+  bool underline = false;
+  bool strikethrough = false;
+  int superscript = 0;  ///< steps above the base line; negative below it
+
+  friend bool operator==(const TextAttributes&, const TextAttributes&) = default;
+};
+
+struct TextRange {
+  std::size_t location = 0;
+  std::size_t length = 0;
+
+  friend bool operator==(const TextRange&, const TextRange&) = default;
+};
+
+struct TextRun {
+  TextRange range;
+  TextAttributes attributes;
+
+  friend bool operator==(const TextRun&, const TextRun&) = default;
+};
+
+class AttributedString {
+ public:
+  AttributedString() = default;
+  explicit AttributedString(std::string text, const TextAttributes& attributes = {});
+
+  const std::string& string() const { return text_; }
+  std::size_t length() const { return text_.size(); }
+  const std::vector<TextRun>& runs() const { return runs_; }
+
+  /// Adds `text` behind what there is, all of it with `attributes`.
+  void append(std::string_view text, const TextAttributes& attributes);
+
+  /// Changes between these two are one edit: whoever shows the text sees only the whole of it.
+  /// Edits nest. An `endEditing` without its `beginEditing` raises a range exception.
+  void beginEditing();
+  void endEditing();
+
+  /// Sets one attribute over `range`, leaving the others. An absent value raises an
+  /// invalid-argument exception; a range beyond the text's end raises a range exception. Neither
+  /// changes anything.
+  void addFont(const std::optional<Font>& font, TextRange range);
+  void addForegroundColor(const std::optional<Color>& color, TextRange range);
+  void addParagraphStyle(const std::optional<ParagraphStyle>& style, TextRange range);
+
+  friend bool operator==(const AttributedString& a, const AttributedString& b) {
+    return a.text_ == b.text_ && a.runs_ == b.runs_;
+  }
+
+ private:
+  std::string text_;
+  std::vector<TextRun> runs_;
+  int editing_ = 0;  // depth of open edits
+};
+
+}  // namespace toolkit

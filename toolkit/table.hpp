@@ -1,0 +1,79 @@
+// Tables of things that are no values (controls, timers) under string keys, and lists of them.
+//
+// Both are shared: who asks the engine for one holds the very object that the engine changes. On an
+// absent table or list every change does nothing and every question answers zero or absent.
+#pragma once
+
+#include <cstddef>
+#include <functional>
+#include <map>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+#include "toolkit/ref.hpp"
+
+namespace toolkit {
+
+template <class T>
+class Table {
+ public:
+  using Entries = std::map<std::string, T, std::less<>>;
+
+  static Table& nothing() {
+    static Table table(false);
+    return table;
+  }
+  static Ref<Table> make() { return std::shared_ptr<Table>(new Table(true)); }
+
+  std::size_t count() const { return entries_.size(); }
+  /// The entries by key, in the keys' order.
+  const Entries& entries() const { return entries_; }
+  /// The entry under `key`, or a T made of nothing.
+  T objectForKey(std::string_view key) const {
+    const auto found = entries_.find(key);
+    return found == entries_.end() ? T{} : found->second;
+  }
+  bool contains(std::string_view key) const { return entries_.find(key) != entries_.end(); }
+
+  void setObject(T object, std::string_view key) {
+    if (exists_) entries_.insert_or_assign(std::string(key), std::move(object));
+  }
+  void removeObjectForKey(std::string_view key) {
+    if (const auto found = entries_.find(key); found != entries_.end()) entries_.erase(found);
+  }
+  void removeAllObjects() { Entries().swap(entries_); }
+
+ private:
+  explicit Table(bool exists) : exists_(exists) {}
+
+  Entries entries_;
+  bool exists_;  // false only of the one that stands for an absent table
+};
+
+template <class T>
+class List {
+ public:
+  static List& nothing() {
+    static List list(false);
+    return list;
+  }
+  static Ref<List> make() { return std::shared_ptr<List>(new List(true)); }
+
+  std::size_t count() const { return elements_.size(); }
+  const std::vector<T>& elements() const { return elements_; }
+
+  void addObject(T object) {
+    if (exists_) elements_.push_back(std::move(object));
+  }
+  void removeAllObjects() { std::vector<T>().swap(elements_); }
+
+ private:
+  explicit List(bool exists) : exists_(exists) {}
+
+  std::vector<T> elements_;
+  bool exists_;  // false only of the one that stands for an absent list
+};
+
+}  // namespace toolkit

@@ -1,0 +1,94 @@
+// Driving a toolkit from outside, as its user and its host do: one driver stands beside each
+// backend, so that the same scenarios and the same player run on every toolkit.
+#pragma once
+
+#include <functional>
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "toolkit/geometry.hpp"
+#include "toolkit/toolkit.hpp"
+
+namespace toolkit {
+
+/// The kinds of view that a host can be asked to make.
+enum class ViewKind { button, toggle, mixed, popUpButton, textField, imageView, box, plain };
+
+/// What a view is and shows, read at one moment.
+struct ViewPicture {
+  ViewKind kind = ViewKind::plain;  // push, toggle or mixed by the button's behaviour
+  std::string className;
+  long tag = 0;
+  Rect frame;
+  bool hidden = false;
+  bool enabled = true;  // YES of a view that cannot be disabled
+  State state = State::off;
+  bool highlighted = false;
+  AttributedString title;  // buttons
+  AttributedString text;   // any other control
+  std::string toolTip;
+  std::optional<std::string> image;  // the name of an image view's image
+  std::shared_ptr<Responder> target;
+  std::optional<std::string> action;
+  std::optional<Color> background;  // a button's, within its bezel
+};
+
+/// What a window is and shows, read at one moment.
+struct WindowPicture {
+  bool visible = false;
+  bool key = false;
+  int closes = 0;  // how often it was closed
+  Rect content;
+  unsigned style = 0;  // bits of StyleMask
+  Color background;
+  std::shared_ptr<Responder> delegate;
+  bool layered = false;                   // the content view draws through a layer
+  std::optional<std::string> layerImage;  // the name of its layer's contents
+  Ref<Window> sheetOf;                    // the window it is attached to as a sheet
+  std::vector<long> sheetEnds;            // return codes of the ends asked for, in order
+};
+
+class TestDriver {
+ public:
+  virtual ~TestDriver() = default;
+
+  /// The name that `--toolkit` takes, such as "memory".
+  virtual std::string_view name() const = 0;
+  virtual Toolkit& toolkit() = 0;
+
+  // --- as the host ---
+
+  /// A host's window, on the screen. The caller owns it: destroying the reference destroys it.
+  virtual Ref<Window> makeWindow(const Rect& content) = 0;
+  /// A view of the kind, in front of what `parent` holds. `parent` owns it.
+  virtual Ref<View> makeView(ViewKind kind, long tag, const Rect& frame,
+                             const Ref<View>& parent) = 0;
+  virtual void removeFromSuperview(const Ref<View>& view) = 0;
+  virtual void setFrame(const Ref<View>& view, const Rect& frame) = 0;
+  /// The text of a text field, the title of a button, the name of an image view's image.
+  virtual void setCaption(const Ref<View>& view, std::string_view text) = 0;
+  /// Where the toolkit's resource directory lies from now on.
+  virtual void setResourcePath(std::string_view path) = 0;
+  /// The class name that this toolkit gives a view of the kind.
+  virtual std::string_view className(ViewKind kind) const = 0;
+
+  // --- as the user ---
+
+  /// A click with the primary button where the user sees the view. Hidden or disabled controls, and
+  /// those behind a sheet, take none.
+  virtual void click(const Ref<View>& view) = 0;
+  /// Lets time pass: at once where the clock is virtual, really elsewhere. 0 or more seconds.
+  virtual void advance(double seconds) = 0;
+
+  // --- as an observer ---
+
+  virtual ViewPicture look(const Ref<View>& view) = 0;
+  virtual WindowPicture look(const Ref<Window>& window) = 0;
+  /// Whom every log line is handed as it comes, besides where the toolkit's log writes anyway.
+  virtual void setLogSink(std::function<void(std::string_view)> sink) = 0;
+};
+
+}  // namespace toolkit

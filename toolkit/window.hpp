@@ -1,0 +1,40 @@
+// Windows.
+#pragma once
+
+#include <memory>
+
+#include "toolkit/ref.hpp"
+#include "toolkit/responder.hpp"
+#include "toolkit/view.hpp"
+
+namespace toolkit {
+
+/// Bits of a window's style mask (`NSWindowStyleMask`).
+enum class StyleMask : unsigned { titled = 1, closable = 2, titledAndClosable = 3 };
+/// How a window's pixels are kept (`NSBackingStoreType`).
+enum class BackingStore : unsigned { buffered = 2 };
+
+class Window {
+ public:
+  virtual ~Window() = default;
+  static Window& nothing();
+
+  /// The view that holds the window's controls; owned by the window.
+  virtual Ref<View> contentView() const = 0;
+
+  /// Whom the window tells of what happens to it, and the end of its responder chain; null when it
+  /// has none or the delegate is gone. The window does not keep it alive.
+  virtual std::shared_ptr<Responder> delegate() const = 0;
+  virtual void setDelegate(const std::shared_ptr<Responder>& delegate) = 0;
+
+  virtual void setBackgroundColor(const Color& color) = 0;
+
+  /// Shows the window in front of the others and gives it the keyboard.
+  virtual void makeKeyAndOrderFront() = 0;
+  /// Takes the window off the screen; it can be shown again. A sheet leaves its parent.
+  virtual void orderOut() = 0;
+  /// Closes the window: off the screen, and no longer kept alive by the application.
+  virtual void close() = 0;
+};
+
+}  // namespace toolkit
