@@ -26,7 +26,14 @@ class Property {
 
   /// The value itself; on the engine's thread only, which is the one that replaces it.
   const T& operator*() const { return value_; }
-  auto operator->() const { return value_.operator->(); }
+  /// What the value refers to, where it is a reference; else the value.
+  auto operator->() const {
+    if constexpr (requires { value_.operator->(); }) {
+      return value_.operator->();
+    } else {
+      return &value_;
+    }
+  }
 
  private:
   mutable std::mutex mutex_;

@@ -260,6 +260,15 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
  private:
   explicit QZ_Plist_State_Parser(toolkit::Toolkit& toolkit) : toolkit_(toolkit) {}
 
+  bool runElement(const Value& element, Parameters& parameters, const ObjectId& id);
+  std::optional<std::string> keyOfTimer(const Timer& timer) const;
+  void rewriteFlashingEntry(const ObjectId& id);
+  bool setState(const ObjectId& id, toolkit::State state);
+  Window makeTutorialWindow(const toolkit::Rect& content);
+  Control makeControl(const toolkit::ValueRef<>& key, const Value& entry);
+  bool showHtml(std::string_view documentHead, std::optional<toolkit::TextAlignment> alignment,
+                const Value& html, const Value& fontName, const Value& size, const ObjectId& id);
+
   toolkit::Toolkit& toolkit_;  // the host's, which keeps it longer than the engine
 
   // The tables are the engine's own; so are the walk-through window and the controls that it built.

@@ -26,8 +26,8 @@ class Ref {
   template <class U, class = std::enable_if_t<std::is_convertible_v<U*, T*>>>
   Ref(const Ref<U, Pointer>& other) : object_(other.pointer()) {}
 
-  explicit operator bool() const { return object_ != nullptr; }
-  T* operator->() const { return object_ ? object_.get() : &T::nothing(); }
+  explicit operator bool() const { return object_.get() != nullptr; }
+  T* operator->() const { return *this ? object_.get() : &T::nothing(); }
   T& operator*() const { return *operator->(); }
 
   /// The owning pointer itself; null when the reference is absent.

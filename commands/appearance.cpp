@@ -1,0 +1,113 @@
+// The commands that change how one control looks: colours, title, tooltip, image; and its state.
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "engine/text_of.hpp"
+
+using toolkit::asButton;
+
+namespace {
+
+std::optional<toolkit::Color> colorNamed(std::string_view name) {
+  namespace colors = toolkit::colors;
+  struct Named {
+    std::string_view name;
+    toolkit::Color color;
+  };
+  static constexpr Named known[] = {
+      {"red", colors::red},     {"white", colors::white}, {"blue", colors::blue},
+      {"green", colors::green}, {"black", colors::black}, {"orange", colors::orange},
+      {"gray", colors::gray},
+  };
+  for (const auto& [knownName, color] : known) {
+    if (name == knownName) return color;
+  }
+  return std::nullopt;
+}
+
+// A title that can be changed; of no title at all there is none to change.
+toolkit::AttributedString titleOf(const QZ_Plist_State_Parser::Control& control) {
+  auto title = control->attributedTitle();
+  if (!title) throw toolkit::InvalidArgumentException("there is no title to copy");
+  return *std::move(title);
+}
+
+}  // namespace
+
+// Red, whatever colour is asked for.
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_BACKGROUND_COLOR(std::uint64_t,
+                                                                          const ObjectId& forId) {
+  const auto button = asButton(findObjectWithTag(forId->longValue()));
+  if (!button) return false;
+  button->setBackgroundColor(toolkit::colors::red);
+  return true;
+}
+
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_FOREGROUND_COLOR(
+    const Value& name, const ObjectId& FOR_OBJECT_ID) {
+  const auto color = colorNamed(textOf(name));
+  try {
+    const Control control = findObjectWithTag(FOR_OBJECT_ID->longValue());
+    toolkit::AttributedString title = titleOf(control);
+    title.addForegroundColor(color, {0, title.length()});
+    control->setAttributedTitle(title);
+    return true;
+  } catch (const toolkit::Exception&) {
+    toolkit_.log().write("Unable to set the foreground color");
+    return false;
+  }
+}
+
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TITLE(const Value& title,
+                                                               const ObjectId& forId) {
+  const auto button = asButton(findObjectWithTag(forId->longValue()));
+  if (!button) return false;
+  button->setTitle(textOf(title));
+  return true;
+}
+
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_STATE_ON(const ObjectId& id) {
+  return setState(id, toolkit::State::on);
+}
+
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_STATE_OFF(const ObjectId& id) {
+  return setState(id, toolkit::State::off);
+}
+
+// Neither the action is sent nor the state recorded: only a press does that.
+bool QZ_Plist_State_Parser::setState(const ObjectId& id, toolkit::State state) {
+  const auto button = asButton(findObjectWithTag(id->longValue()));
+  if (!button) return false;
+  button->setState(state);
+  return true;
+}
+
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TOOL_TIP(const Parameters& parameters,
+                                                                  const ObjectId& forObject) {
+  const std::size_t count = parameters->count();
+  if (count == 0) return false;
+  const Value toolTip = parameters->objectAtIndex(0);
+  const std::string_view text = textOf(toolTip);
+  // Only a second parameter that is the last one aims; otherwise it is the list's own control.
+  const long tag = count == 2 ? parameters->objectAtIndex(1)->intValue() : forObject->longValue();
+  const Control control = findObjectWithTag(tag);
+  if (!control) return false;
+  control->setToolTip(text);
+  control->needsDisplay();
+  return true;
+}
+
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH(
+    const Parameters& parameters, const ObjectId&) {
+  if (parameters->count() != 2) return false;
+  const long tag = parameters->objectAtIndex(1)->intValue();
+  // Two diagnostics that cannot come, after the count above; this is their place all the same.
+  if (!parameters) toolkit_.log().write("No commandInfo found.");
+  if (parameters->count() == 0) toolkit_.log().write("commandInfo count is zero.");
+  // Despite the command's name a resource name, not a path.
+  const auto image = toolkit_.images().imageNamed(textOf(parameters->objectAtIndex(0)));
+  const auto imageView = toolkit::asImageView(findObjectWithTag(tag));
+  if (!imageView) return false;
+  imageView->setImage(image);
+  imageView->needsDisplay();
+  return true;
+}

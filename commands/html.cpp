@@ -1,0 +1,101 @@
+// Styled text from HTML: a script's fragment within one of three fixed documents.
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "engine/text_of.hpp"
+#include "toolkit/styled_text/ascii.hpp"
+#include "toolkit/styled_text/html_reader.hpp"
+
+namespace {
+
+// The documents are fixed to the letter. Two differ by one blank in front of `vlink`, on purpose.
+#define DOCUMENT_HEAD                                                                       \
+  "<!DOCTYPE HTML PUBLIC \"-//W3C//DTD HTML 4.01 Transitional//EN\" "                       \
+  "\"http://www.w3.org/TR/html4/loose.dtd\"><html><head><meta http-equiv=\"Content-type\" " \
+  "content=\"text/html; charset=iso-8859-1\"></head>"
+
+constexpr std::string_view linkedTwoBlanks =
+    DOCUMENT_HEAD "<body bgcolor=\"#000000\" link=\"#00e5ff\"  vlink=\"#00e5ff\">";
+constexpr std::string_view linkedOneBlank =
+    DOCUMENT_HEAD "<body bgcolor=\"#000000\" link=\"#00e5ff\" vlink=\"#00e5ff\">";
+constexpr std::string_view plain = DOCUMENT_HEAD "<body bgcolor=\"#000000\">";
+#undef DOCUMENT_HEAD
+
+static_assert(linkedTwoBlanks.size() == 249 && linkedOneBlank.size() == 248 && plain.size() == 217);
+
+// Absent when the fragment has characters beyond ASCII, which must be written as references.
+std::optional<toolkit::AttributedString> read(std::string_view documentHead,
+                                              const toolkit::ValueRef<>& fragment,
+                                              const toolkit::Fonts& fonts) {
+  const auto document =
+      toolkit::asciiBytes(std::string(documentHead) + fragment->description() + "</body></html>");
+  return document ? toolkit::attributedStringFromHTML(*document, fonts) : std::nullopt;
+}
+
+void setStyle(toolkit::AttributedString& text, toolkit::TextAlignment alignment,
+              const std::optional<toolkit::Font>& font) {
+  const toolkit::TextRange all{0, text.length()};
+  text.beginEditing();
+  text.addParagraphStyle(toolkit::ParagraphStyle{.alignment = alignment}, all);
+  text.addFont(font, all);
+  text.endEditing();
+}
+
+void show(const toolkit::AttributedString& text, const toolkit::Ref<toolkit::View>& control) {
+  if (const auto button = toolkit::asButton(control)) {
+    button->setAttributedTitle(text);
+  } else {
+    control->setAttributedStringValue(text);
+  }
+}
+
+}  // namespace
+
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML(
+    const Value& html, const Value& WITH_FONT_NAME, const Value& WITH_SIZE,
+    const ObjectId& FOR_OBJECT_ID) {
+  return QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(false, html, WITH_FONT_NAME,
+                                                              WITH_SIZE, FOR_OBJECT_ID);
+}
+
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER(
+    const Value& html, const Value& WITH_FONT_NAME, const Value& WITH_SIZE,
+    const ObjectId& FOR_OBJECT_ID) {
+  return showHtml(linkedOneBlank, toolkit::TextAlignment::natural, html, WITH_FONT_NAME, WITH_SIZE,
+                  FOR_OBJECT_ID);
+}
+
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(
+    bool asIs, const Value& WITH_HTML, const Value& WITH_FONT_NAME, const Value& WITH_SIZE,
+    const ObjectId& FOR_OBJECT_ID) {
+  if (asIs) {
+    return showHtml(linkedTwoBlanks, std::nullopt, WITH_HTML, WITH_FONT_NAME, WITH_SIZE,
+                    FOR_OBJECT_ID);
+  }
+  return showHtml(plain, toolkit::TextAlignment::center, WITH_HTML, WITH_FONT_NAME, WITH_SIZE,
+                  FOR_OBJECT_ID);
+}
+
+// Without an alignment the HTML keeps its own alignment and fonts.
+bool QZ_Plist_State_Parser::showHtml(std::string_view documentHead,
+                                     std::optional<toolkit::TextAlignment> alignment,
+                                     const Value& html, const Value& fontName, const Value& size,
+                                     const ObjectId& id) {
+  const Control control = findObjectWithTag(id->longValue());
+  const auto points = static_cast<float>(size->intValue());  // whole points, also when not used
+  auto text = read(documentHead, html, toolkit_.fonts());
+  if (!text) return false;
+  try {
+    if (alignment) {
+      setStyle(*text, *alignment,
+               toolkit_.fonts().fontWithName(textOf(fontName), static_cast<double>(points)));
+    }
+    show(*text, control);
+    return true;
+  } catch (const toolkit::Exception&) {
+    // A range exception was to count as success, but what is asked is whether the exception is of
+    // the class of that exception's *name*, a string. None is, so every one is reported.
+    toolkit_.log().write("Couldn't set attributed string of HTML:" + html->description() +
+                         " to object.");
+    return false;
+  }
+}

@@ -1,0 +1,175 @@
+// The compound commands: one row each, which says how the parameters convert and what runs.
+
+#include <functional>
+#include <tuple>
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "engine/text_of.hpp"
+
+namespace {
+
+using Engine = QZ_Plist_State_Parser;
+using toolkit::asButton;
+using toolkit::asImageView;
+using toolkit::asTextField;
+
+// How a parameter, given by its position behind the name, becomes an argument. A position beyond
+// the end raises.
+struct Call {
+  Engine& engine;
+  const Engine::Parameters& parameters;
+  const Engine::ObjectId& id;
+  toolkit::Images& images;
+
+  Engine::Value at(std::size_t position) const { return parameters->objectAtIndex(position); }
+};
+
+template <std::size_t position>
+Engine::Value asIs(const Call& call) {
+  return call.at(position);
+}
+template <std::size_t position>
+std::uint64_t integer(const Call& call) {  // a negative one arrives as a very large one
+  return static_cast<std::uint64_t>(std::int64_t{call.at(position)->intValue()});
+}
+template <std::size_t position>
+Engine::ObjectId tag(const Call& call) {
+  return toolkit::Number::withLong(call.at(position)->intValue());
+}
+template <std::size_t position>
+bool flag(const Call& call) {
+  return call.at(position)->boolValue();
+}
+const Engine::Parameters& allParameters(const Call& call) { return call.parameters; }
+const Engine::ObjectId& objectId(const Call& call) { return call.id; }
+
+// Converts the parameters in the order written (which one is missed first depends on it), then
+// runs.
+template <auto processor, auto... conversions>
+bool run(const Call& call) {
+  const std::tuple<decltype(conversions(call))...> arguments{conversions(call)...};
+  return std::apply(
+      [&](const auto&... argument) { return std::invoke(processor, call.engine, argument...); },
+      arguments);
+}
+
+// The control commands aim at the list's own id, or at the tag that is their only parameter.
+long targetTag(const Call& call) {
+  return call.parameters->count() == 1 ? call.at(0)->intValue() : call.id->longValue();
+}
+
+bool enable(const Call& call) {
+  const auto control = call.engine.findObjectWithTag(targetTag(call));
+  if (!control) return false;
+  control->setEnabled(true);
+  control->needsDisplay();
+  return true;
+}
+
+bool disable(const Call& call) {
+  const auto control = call.engine.findObjectWithTag(targetTag(call));
+  // Unlike enabling: aimed by parameter at a control that is not there, it counts as done.
+  if (!control) return call.parameters->count() == 1;
+  control->setEnabled(false);
+  control->needsDisplay();
+  return true;
+}
+
+// Every test of the class is followed by a look-up of its own, so that a window that changes
+// meanwhile is met as it is then; whatever the class, the control is hidden or shown.
+template <bool hidden>
+bool hide(const Call& call) {
+  const long tag = targetTag(call);
+  const auto find = [&] { return call.engine.findObjectWithTag(tag); };
+  const auto change = [](const Engine::Control& control) {
+    control->setHidden(hidden);
+    control->needsDisplay();
+    return true;
+  };
+  const bool isButton = static_cast<bool>(asButton(find()));
+  Engine::Control control = find();
+  if (isButton) return control ? change(control) : false;
+  const bool isTextField = static_cast<bool>(asTextField(control));
+  control = find();
+  if (isTextField) return change(control);
+  const bool isImageView = static_cast<bool>(asImageView(control));
+  control = find();
+  control->setHidden(hidden);
+  (isImageView ? control : find())->needsDisplay();
+  return true;
+}
+
+bool loadBackground(const Call& call) {
+  const auto image = call.images.imageNamed(textOf(call.at(0)));
+  const auto content = call.engine.tutorialWindow()->contentView();
+  content->setWantsLayer(true);
+  content->setLayerContents(image);
+  return true;
+}
+
+// The title's position is read after the tag's, although the processor takes it first.
+bool setTitle(Engine& engine, const Engine::ObjectId& id, const Engine::Value& title) {
+  return engine.QZ_Plist_State_Processor_SET_TITLE(title, id);
+}
+
+constexpr auto setTag =
+    static_cast<bool (Engine::*)(const Engine::ObjectId&, const Engine::ObjectId&)>(
+        &Engine::QZ_Plist_State_Processor_SET_TAG);
+constexpr auto setTagWithTimer =
+    static_cast<bool (Engine::*)(const Engine::ObjectId&, const Engine::ObjectId&,
+                                 const Engine::Value&)>(&Engine::QZ_Plist_State_Processor_SET_TAG);
+
+struct Command {
+  const std::string& name;  // the constant itself: a host may rename the command at any time
+  bool (*run)(const Call& call);
+};
+
+// clang-format off
+#define NAME(name) QZ_PLIST_STATE_PARSER_##name
+#define PROCESSOR(name) &Engine::QZ_Plist_State_Processor_##name
+
+// In the order of recognition: where a host gave two commands one name, the first row has it.
+const Command commands[] = {
+    {NAME(SET_TOOL_TIP_FOR_ID),                  run<PROCESSOR(SET_TOOL_TIP), allParameters, objectId>},
+    {NAME(LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID), run<PROCESSOR(LOAD_GRAPHIC_OBJECT_WITH_PATH), allParameters, objectId>},
+    {NAME(DISABLE_OBJECT_WITH_ID),               disable},
+    {NAME(ENABLE_OBJECT_WITH_ID),                enable},
+    {NAME(HIDE_OBJECT_WITH_ID),                  hide<true>},
+    {NAME(SHOW_OBJECT_WITH_ID),                  hide<false>},
+    {NAME(LOAD_BACKGROUND_WITH_IMAGE),           loadBackground},
+    {NAME(FLASH_ID),                             run<PROCESSOR(FLASH_ID), tag<1>, flag<0>>},
+    {NAME(ALLOW_FLASHING),                       run<PROCESSOR(ALLOW_FLASHING), flag<0>>},
+    {NAME(SET_TEXT_FOR_OBJECT_ID),               run<PROCESSOR(SET_TEXT), asIs<0>, tag<1>>},
+    {NAME(PROCESS_COMMANDS_FOR_ID),              run<PROCESSOR(PROCESS_COMMANDS_FOR_ID), tag<0>>},
+    {NAME(SET_BACKGROUND_COLOR_FOR_OBJECT_ID),   run<PROCESSOR(SET_BACKGROUND_COLOR), integer<0>, tag<1>>},
+    {NAME(SET_TITLE_FOR_OBJECT_ID),              run<setTitle, tag<1>, asIs<0>>},
+    {NAME(SET_STATE_ON_FOR_OBJECT_ID),           run<PROCESSOR(SET_STATE_ON), tag<0>>},
+    {NAME(SET_STATE_OFF_FOR_OBJECT_ID),          run<PROCESSOR(SET_STATE_OFF), tag<0>>},
+    {NAME(SET_TAG_FOR_OBJECT_ID),                run<setTag, tag<0>, tag<1>>},
+    {NAME(SET_TAG_FOR_OBJECT_ID_WITH_TIMER),     run<setTagWithTimer, tag<0>, tag<1>, asIs<2>>},
+    {NAME(SET_TIMER_FOR_ID),                     run<PROCESSOR(SET_TIMER), integer<0>, tag<1>>},
+    {NAME(SET_ATTRIBUTED_STRING_AS_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID),
+     run<PROCESSOR(SET_ATTRIBUTED_STRING_AS_HTML), asIs<0>, asIs<1>, asIs<2>, tag<3>>},
+    {NAME(SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID),
+     run<PROCESSOR(SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER), asIs<0>, asIs<1>, asIs<2>, tag<3>>},
+    {NAME(SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID),
+     run<PROCESSOR(SET_ATTRIBUTED_STRING_AS_IS), flag<0>, asIs<1>, asIs<2>, asIs<3>, tag<4>>},
+    {NAME(SET_FOREGROUND_COLOR_FOR_OBJECT_ID),   run<PROCESSOR(SET_FOREGROUND_COLOR), asIs<0>, tag<1>>},
+};
+
+#undef NAME
+#undef PROCESSOR
+// clang-format on
+
+}  // namespace
+
+bool QZ_Plist_State_Parser::doCompoundCommand(std::string_view name,
+                                              const Parameters& withParameters,
+                                              const ObjectId& usingObject) {
+  for (const Command& command : commands) {
+    if (name == command.name) {
+      return command.run({*this, withParameters, usingObject, toolkit_.images()});
+    }
+  }
+  return false;
+}

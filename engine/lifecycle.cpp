@@ -1,0 +1,96 @@
+// The engine object: construction, teardown, destruction, and what it says of itself.
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "engine/tag_key.hpp"
+
+using toolkit::Link;
+
+namespace {
+
+constexpr double flasherPeriod = 0.5;  // seconds
+
+void stop(const toolkit::Ref<toolkit::Timer>& timer) {
+  if (timer->isValid()) timer->invalidate();
+}
+
+}  // namespace
+
+std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::init(toolkit::Toolkit& toolkit) {
+  return std::shared_ptr<QZ_Plist_State_Parser>(new QZ_Plist_State_Parser(toolkit));
+}
+
+std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::initWithWindow(
+    toolkit::Toolkit& toolkit, const Window& window) {
+  const auto engine = init(toolkit);
+  engine->window_.set(Link<toolkit::Window>::refer(window));
+  engine->buttonStates_ = toolkit::Dictionary::make();
+  engine->plistDictionary_.set(toolkit::Dictionary::make());
+  engine->flashingTagIds_.set(toolkit::Dictionary::make());
+  engine->addedObjectToTutorial_.set(toolkit::List<Control>::make());
+  engine->objectIdTimers_.set(toolkit::Table<Timer>::make());
+  // The timer keeps the engine alive for as long as it ticks.
+  engine->flashingTimer_.set(toolkit.runLoop().schedule(
+      flasherPeriod, true, [engine](const Timer& timer) { engine->flasherFired(timer); }));
+  engine->guiAssets_.set(toolkit::Table<AssetRecord>::make());
+  engine->originalTagValues_.set(toolkit::Dictionary::make());
+  return engine;
+}
+
+void QZ_Plist_State_Parser::terminateParser() {
+  const auto self = shared_from_this();  // the last timer that goes may be the last that keeps us
+  restoreOriginalTagValues();
+  terminating_ = true;
+  stop(*flashingTimer_);
+  flashingTimer_.set(nullptr);
+  // Tables are emptied before they are dropped: a host that kept one sees that it is over.
+  if (objectIdTimers_->count() > 0) {
+    killAllTimers();
+    objectIdTimers_.set(nullptr);
+  }
+  const Window tutorial = tutorialWindow_->get();
+  if (!(tutorial && tutorial == window_->get()) && addedObjectToTutorial_->count() > 0) {
+    addedObjectToTutorial_->removeAllObjects();
+    addedObjectToTutorial_.set(nullptr);
+  }
+  guiAssets_->removeAllObjects();
+  guiAssets_.set(nullptr);
+  plistDictionary_->removeAllObjects();
+  plistDictionary_.set(nullptr);
+  commandArray_.set(nullptr);
+  if (runningAsSheet_) {
+    toolkit_.application().endSheet(tutorial, 0);  // at every call, unlike the closing
+  } else if (!hasTerminated_) {
+    hasTerminated_ = true;
+    tutorial->close();
+  }
+}
+
+QZ_Plist_State_Parser::~QZ_Plist_State_Parser() {
+  stop(*flashingTimer_);
+  flashingTimer_.set(nullptr);
+  for (const auto& [key, timer] : objectIdTimers_->entries()) timer->invalidate();
+  objectIdTimers_->removeAllObjects();
+  objectIdTimers_.set(nullptr);
+  const Window tutorial = tutorialWindow_->get();
+  const Window host = window_->get();
+  // Unlike at teardown, an absent window on either side leaves the list as it is.
+  if (tutorial && host && tutorial != host) {
+    addedObjectToTutorial_->removeAllObjects();
+    addedObjectToTutorial_.set(nullptr);
+  }
+  originalTagValues_.set(nullptr);
+  guiAssets_.set(nullptr);
+  plistDictionary_.set(nullptr);
+  commandArray_.set(nullptr);
+  buttonStates_->removeAllObjects();
+}
+
+std::string QZ_Plist_State_Parser::currentCommandState() const {
+  return tagKey(lastTagId_->longValue());
+}
+
+bool QZ_Plist_State_Parser::tryToPerform(std::string_view action, const Control& sender) {
+  if (action != "buttonPushed:") return false;
+  buttonPushed(sender);
+  return true;
+}

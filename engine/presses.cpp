@@ -1,0 +1,40 @@
+// Presses: the user's, and those of object timers.
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "engine/tag_key.hpp"
+#include "toolkit/property_list/number_conversion.hpp"
+
+void QZ_Plist_State_Parser::buttonPushed(const Control& sender) {
+  const auto self = shared_from_this();
+  if (sender) killAllTimers();
+  const long tag = sender->tag();
+  const std::string key = tagKey(tag);
+  toolkit_.log().write("Button tag " + key + " pressed.");
+  buttonStates_->setObject(toolkit::Number::withBool(sender->state() == toolkit::State::on), key);
+  const Value list = plistDictionary_->objectForKey(key);
+  if (!list || !toolkit::asButton(sender)) return;
+  processCommandArray(list, toolkit::Number::withLong(tag));
+}
+
+void QZ_Plist_State_Parser::pseudoButtonPush(const Timer& timer) {
+  const auto self = shared_from_this();
+  const auto key = keyOfTimer(timer);
+  if (!key) return;  // replaced under its key since, or the walk-through is over
+  objectIdTimers_->removeObjectForKey(*key);
+  killAllTimers();
+  if (terminating_) return;
+  if (const auto button = toolkit::asButton(findObjectWithTag(toolkit::integerValueOf(*key)))) {
+    button->sendAction("buttonPushed:", self);
+  } else {
+    processCommandArray(plistDictionary_->objectForKey(*key),
+                        toolkit::Number::withLong(toolkit::intValueOf(*key)));
+  }
+}
+
+// A timer carries no tag: it is known by being the very one that the table holds.
+std::optional<std::string> QZ_Plist_State_Parser::keyOfTimer(const Timer& timer) const {
+  for (const auto& [key, pending] : objectIdTimers_->entries()) {
+    if (pending == timer) return key;
+  }
+  return std::nullopt;
+}

@@ -1,0 +1,35 @@
+// The command-list runner, through which every list runs, whoever starts it.
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "engine/text_of.hpp"
+#include "toolkit/uppercase.hpp"
+
+bool QZ_Plist_State_Parser::processCommandArray(const Value& list, const ObjectId& forObject) {
+  const auto self = shared_from_this();  // what runs may make the host let go of us
+  Parameters parameters = toolkit::Array::make();
+  lastTagId_.set(forObject);
+  // Outside of the guard: of a value that has no elements the caller hears.
+  const auto count = static_cast<std::int32_t>(list->count());
+  bool result = false;
+  for (std::int32_t i = 0; i < count; ++i) {
+    parameters->removeAllObjects();
+    try {
+      result = runElement(list->objectAtIndex(static_cast<std::size_t>(i)), parameters, forObject);
+    } catch (const toolkit::Exception& exception) {
+      toolkit_.log().write("Exception in processCommandArray: " + exception.reason());
+    }
+  }
+  return result;
+}
+
+// An array is a compound command, whose name is matched in upper case; anything else is taken for a
+// simple one, whose name is matched as written.
+bool QZ_Plist_State_Parser::runElement(const Value& element, Parameters& parameters,
+                                       const ObjectId& id) {
+  const auto compound = toolkit::asArray(element);
+  if (!compound) return doSimpleCommand(textOf(element), parameters, id);
+  const std::string name = toolkit::uppercased(textOf(compound->objectAtIndex(0)));
+  const auto& elements = compound->elements();
+  parameters = toolkit::Array::make({elements.begin() + 1, elements.end()});
+  return doCompoundCommand(name, parameters, id);
+}

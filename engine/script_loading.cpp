@@ -1,0 +1,69 @@
+// Loading a script and starting it, on its own or with the walk-through window as a sheet.
+
+#include <algorithm>
+#include <filesystem>
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "engine/tag_key.hpp"
+#include "toolkit/property_list/number_conversion.hpp"
+#include "toolkit/property_list/reader.hpp"
+
+namespace {
+
+bool isAbsolutePath(std::string_view path) {
+  return path.starts_with('~') || std::filesystem::path(path).is_absolute();
+}
+
+// A name is used exactly as given: ".plist" is never added to it. (No name at all reads as the text
+// that the system's formats print for nothing.)
+std::string scriptPath(const std::optional<std::string>& name, const toolkit::Files& files) {
+  const std::string given = name.value_or("(null)");
+  return isAbsolutePath(given) ? given : files.resourcePath() + "/" + given;
+}
+
+toolkit::ValueRef<toolkit::Dictionary> readScript(const std::string& path,
+                                                  const toolkit::Files& files) {
+  const auto contents = files.contentsAtPath(path);
+  return contents ? toolkit::dictionaryFromPropertyList(*contents) : nullptr;
+}
+
+// The smallest key read as a 32-bit integer: one that is no number counts as 0, and "007" as 7,
+// under which nothing need be stored.
+std::optional<std::string> smallestTagKey(const toolkit::Dictionary& script) {
+  const auto& entries = script.entries();
+  if (entries.empty()) return std::nullopt;
+  const auto smaller = [](const auto& a, const auto& b) {
+    return a.key->intValue() < b.key->intValue();
+  };
+  return tagKey(std::min_element(entries.begin(), entries.end(), smaller)->key->intValue());
+}
+
+}  // namespace
+
+bool QZ_Plist_State_Parser::loadPlist(const std::optional<std::string>& name,
+                                      const std::optional<std::string>& runFromKey,
+                                      const std::shared_ptr<toolkit::SheetDelegate>& withDelegate,
+                                      bool runAsSheet) {
+  const auto self = shared_from_this();  // what runs may make the host let go of us
+  const toolkit::Files& files = toolkit_.files();
+  runningAsSheet_ = runAsSheet;
+  const std::string path = scriptPath(name, files);
+  if (files.fileExistsAtPath(path)) {
+    plistDictionary_->removeAllObjects();
+    plistDictionary_.set(nullptr);
+    plistDictionary_.set(readScript(path, files));
+    if (!*plistDictionary_) return false;
+  }
+  if (runAsSheet) {
+    if (const Window tutorial = tutorialWindow_->get()) {
+      toolkit_.application().beginSheet(tutorial, window_->get(), withDelegate, nullptr);
+    } else {
+      toolkit_.log().write("SERIOUS ERROR WE DON'T HAVE A WINDOW IN WHICH TO SHOW WIDGETS");
+    }
+  }
+  if (!runFromKey) return true;
+  const auto key = runFromKey->empty() ? smallestTagKey(**plistDictionary_) : runFromKey;
+  if (!key) return false;
+  return processCommandArray(plistDictionary_->objectForKey(*key),
+                             toolkit::Number::withLong(toolkit::intValueOf(*key)));
+}

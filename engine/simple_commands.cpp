@@ -1,0 +1,64 @@
+// The simple commands: bare names that act on the control whose tag is the list's own id.
+
+#include "QZ_Plist_State_Parser.hpp"
+
+namespace {
+
+using Engine = QZ_Plist_State_Parser;
+
+struct Call {
+  Engine& engine;
+  const Engine::Control& control;  // absent when no control has the id
+  const Engine::ObjectId& id;
+};
+
+bool terminate(const Call& call) {
+  call.engine.setTerminating(true);
+  call.engine.QZ_Plist_State_Processor_TERMINATE_PARSER();
+  return true;
+}
+
+template <bool enabled>
+bool setEnabled(const Call& call) {
+  call.control->setEnabled(enabled);
+  return false;
+}
+
+template <bool hidden>
+bool setHidden(const Call& call) {
+  call.control->setHidden(hidden);
+  return false;
+}
+
+bool idle(const Call&) { return true; }
+
+// Without a limit: a list that holds this runs itself again from its first element.
+bool processCommands(const Call& call) {
+  return call.engine.QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(call.id);
+}
+
+struct Command {
+  const std::string& name;  // the constant itself: a host may rename the command at any time
+  bool (*run)(const Call& call);
+};
+
+const Command commands[] = {
+    {QZ_PLIST_STATE_PARSER_TERMINATE_PARSER, terminate},
+    {QZ_PLIST_STATE_PARSER_DISABLE_OBJECT_WITH_ID, setEnabled<false>},
+    {QZ_PLIST_STATE_PARSER_ENABLE_OBJECT_WITH_ID, setEnabled<true>},
+    {QZ_PLIST_STATE_PARSER_HIDE_OBJECT_WITH_ID, setHidden<true>},
+    {QZ_PLIST_STATE_PARSER_SHOW_OBJECT_WITH_ID, setHidden<false>},
+    {QZ_PLIST_STATE_PARSER_RETURN_TO_IDLE_LOOP, idle},
+    {QZ_PLIST_STATE_PARSER_PROCESS_COMMANDS_FOR_ID, processCommands},
+};
+
+}  // namespace
+
+bool QZ_Plist_State_Parser::doSimpleCommand(std::string_view name, const Parameters&,
+                                            const ObjectId& usingObject) {
+  const Control control = findObjectWithTag(usingObject->longValue());
+  for (const Command& command : commands) {
+    if (name == command.name) return command.run({*this, control, usingObject});
+  }
+  return false;
+}

@@ -1,0 +1,19 @@
+// The text of a script value that must be a string.
+#pragma once
+
+#include <string>
+#include <string_view>
+
+#include "toolkit/exception.hpp"
+#include "toolkit/property_list/scalars.hpp"
+
+/// The text of a string, valid as long as the value; empty for an absent one. Anything else raises.
+inline std::string_view textOf(const toolkit::ValueRef<>& value) {
+  if (!value) return {};
+  const auto string = toolkit::asString(value);
+  if (!string) {
+    throw toolkit::InvalidArgumentException(
+        "expected a string, got " + std::string(value->className()) + " " + value->description());
+  }
+  return string->text();
+}

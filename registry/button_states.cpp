@@ -1,0 +1,20 @@
+// The states of pressed buttons, which a host carries from one walk-through to the next.
+
+#include "QZ_Plist_State_Parser.hpp"
+
+QZ_Plist_State_Parser::Dictionary QZ_Plist_State_Parser::buttonStates() const {
+  return buttonStates_->copy(toolkit::Mutability::immutable);
+}
+
+bool QZ_Plist_State_Parser::setButtonSates(const Dictionary& states) {
+  const Control content = tutorialWindow_->get()->contentView();
+  if (states->count() == 0 || content->subviews().empty()) return false;
+  bool changed = false;
+  for (const auto& [key, value] : states->entries()) {
+    const auto button = toolkit::asButton(findObjectWithTag(key->integerValue()));
+    if (!button) continue;
+    button->setState(value->boolValue() ? toolkit::State::on : toolkit::State::off);
+    changed = true;
+  }
+  return changed;
+}

@@ -1,0 +1,67 @@
+// Discovery: adopting a window, wiring its buttons and recording its controls.
+
+#include <algorithm>
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "engine/tag_key.hpp"
+
+namespace {
+
+constexpr auto buttonAction = "buttonPushed:";
+
+bool isRecorded(toolkit::View& view) {
+  return view.asButton() || view.asImageView() || view.asTextField();
+}
+
+AssetRecord recordOf(const toolkit::Ref<toolkit::View>& view) {
+  const toolkit::Rect frame = view->frame();
+  return {{view->className()},
+          {static_cast<float>(frame.x), static_cast<float>(frame.y),
+           static_cast<float>(frame.width), static_cast<float>(frame.height)},
+          toolkit::Link<toolkit::View>::refer(view)};
+}
+
+// The first key that cannot be a tag's own: one more than the largest tag, which is never below 0.
+unsigned long firstOverflowKey(const toolkit::Subviews& views) {
+  long largest = 0;
+  for (const auto& view : views) largest = std::max(largest, view->tag());
+  return static_cast<unsigned long>(largest) + 1;
+}
+
+}  // namespace
+
+bool QZ_Plist_State_Parser::getGuiAssetsFromWindow(const Window& window) {
+  if (!window) return false;
+  // A window that is the engine's own stays so.
+  if (tutorialWindow_->get() != window) {
+    tutorialWindow_.set(toolkit::Link<toolkit::Window>::refer(window));
+  }
+  if (!window->delegate()) window->setDelegate(shared_from_this());
+  guiAssets_->removeAllObjects();
+  originalTagValues_->removeAllObjects();
+  const Control content = window->contentView();
+  const toolkit::Subviews views = content->subviews();  // a copy: it may change under the walk
+  unsigned long overflowKey = firstOverflowKey(views);
+  bool recorded = false;
+  for (const Control& view : views) {
+    if (!isRecorded(*view)) continue;
+    if (const auto button = toolkit::asButton(view)) {
+      button->setTarget(shared_from_this());
+      button->setAction(buttonAction);
+    }
+    const std::string own = tagKey(view->tag());
+    const std::string key = guiAssets_->contains(own) ? std::to_string(overflowKey++) : own;
+    guiAssets_->setObject(recordOf(view), key);
+    originalTagValues_->setObject(toolkit::Number::withLong(view->tag()), key);
+    toolkit_.log().write("Found tag value: " + own + " for object: " + view->className() +
+                         " using Key: " + key);
+    recorded = true;
+  }
+  return recorded;
+}
+
+bool QZ_Plist_State_Parser::forceButtonPushedToBeActionForGuiAttribute(const Control& object) {
+  if (!object || !(object->asButton() || object->asGradient())) return false;
+  object->setAction(buttonAction);  // the target stays as it is
+  return true;
+}

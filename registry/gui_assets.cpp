@@ -1,0 +1,135 @@
+// GUI-asset loading: the walk-through window and its controls, built from a description.
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "engine/text_of.hpp"
+
+namespace {
+
+constexpr auto windowClass = "NSWindow";
+constexpr auto buttonClass = "NSButton";
+constexpr auto imageViewClass = "NSImageView";
+constexpr auto textFieldClass = "NSTextField";
+
+constexpr toolkit::Rect defaultContent{100, 100, 640, 480};
+
+// A description entry is a list: class name, x, y, width, height.
+bool isOfClass(const toolkit::ValueRef<>& entry, std::string_view className) {
+  return textOf(entry->objectAtIndex(0)) == className;
+}
+
+// Read in single precision: 0.1 becomes 0.100000001490116.
+toolkit::Rect rectOf(const toolkit::ValueRef<>& entry) {
+  const auto length = [&](std::size_t position) {
+    return static_cast<double>(entry->objectAtIndex(position)->floatValue());
+  };
+  const double x = length(1);
+  const double y = length(2);
+  const double width = length(3);
+  return {x, y, width, length(4)};
+}
+
+}  // namespace
+
+bool QZ_Plist_State_Parser::loadGuiAssets(const Dictionary& description,
+                                          std::shared_ptr<toolkit::Exception>*) {
+  const Dictionary assets = description->copy(toolkit::Mutability::immutable);
+  addedObjectToTutorial_->removeAllObjects();
+  tutorialWindow_.set({});  // a window of an earlier load is only forgotten, not closed
+  if (assets->count() == 0) return false;
+
+  Value windowEntry;
+  for (const auto& [key, entry] : assets->entries()) {
+    const bool isWindow = isOfClass(entry, windowClass);
+    if (!isWindow || windowEntry) continue;
+    windowEntry = entry;
+    makeTutorialWindow(rectOf(entry))->makeKeyAndOrderFront();
+  }
+  // Discovery of the window, empty as it is, empties the records of an earlier one.
+  if (!windowEntry) getGuiAssetsFromWindow(makeTutorialWindow(defaultContent));
+
+  const Window window = tutorialWindow_->get();
+  if (!window) return false;
+  bool added = false;
+  for (const auto& [key, entry] : assets->entries()) {
+    const Control control = makeControl(key, entry);
+    if (!control) continue;
+    window->contentView()->addSubview(control);
+    added = true;
+  }
+  window->makeKeyAndOrderFront();
+  return added;
+}
+
+QZ_Plist_State_Parser::Window QZ_Plist_State_Parser::makeTutorialWindow(
+    const toolkit::Rect& content) {
+  const Window window = toolkit_.application().makeWindow(
+      content, toolkit::StyleMask::titledAndClosable, toolkit::BackingStore::buffered, true);
+  tutorialWindow_.set(toolkit::Link<toolkit::Window>::own(window));
+  window->setBackgroundColor(toolkit::colors::black);
+  // The buttons have no target: their actions reach the engine at the end of the responder chain.
+  window->setDelegate(shared_from_this());
+  return window;
+}
+
+// Absent for an entry that makes no control. Only buttons get a tag: scripts reach the others by
+// the toolkit's default tag, or after the host has tagged them.
+QZ_Plist_State_Parser::Control QZ_Plist_State_Parser::makeControl(const Value& key,
+                                                                  const Value& entry) {
+  // Everything is read before the class is looked at: a malformed entry raises whatever it is.
+  const std::string_view className = textOf(entry->objectAtIndex(0));
+  const toolkit::Rect frame = rectOf(entry);
+  toolkit::Application& application = toolkit_.application();
+  if (className == buttonClass) {
+    const auto button = application.makeButton(frame);
+    addedObjectToTutorial_->addObject(button);
+    button->setBezelStyle(toolkit::BezelStyle::texturedSquare);
+    button->setHidden(false);
+    button->setEnabled(true);
+    button->setAction("buttonPushed:");
+    button->setTag(key->integerValue());
+    return button;
+  }
+  if (className == imageViewClass) {
+    const auto imageView = application.makeImageView(frame);
+    addedObjectToTutorial_->addObject(imageView);
+    imageView->setImageFrameStyle(toolkit::ImageFrameStyle::none);
+    imageView->setImageScaling(toolkit::ImageScaling::proportionallyDown);
+    imageView->setImageAlignment(toolkit::ImageAlignment::center);
+    imageView->setHidden(false);
+    return imageView;
+  }
+  if (className == textFieldClass) {
+    const auto textField = application.makeTextField(frame);
+    addedObjectToTutorial_->addObject(textField);
+    textField->setDelegate(shared_from_this());
+    textField->setTitle("");
+    textField->setHidden(false);
+    return textField;
+  }
+  return {};
+}
+
+bool QZ_Plist_State_Parser::createNextGuiAssetEntry(Dictionary* entries,
+                                                    const std::optional<std::string>& forObject,
+                                                    const toolkit::Rect& usingFrame,
+                                                    std::uint64_t withTagId) {
+  if (!entries || !*entries || !forObject) return false;
+  for (const auto* className : {buttonClass, imageViewClass, textFieldClass, windowClass}) {
+    if (*forObject != className) continue;
+    const auto number = [](double length) {
+      return toolkit::Number::withFloat(static_cast<float>(length));
+    };
+    try {
+      (*entries)->setObject(
+          toolkit::Array::make(
+              {toolkit::String::make(className), number(usingFrame.x), number(usingFrame.y),
+               number(usingFrame.width), number(usingFrame.height)},
+              toolkit::Mutability::immutable),
+          std::to_string(withTagId));
+      return true;
+    } catch (const toolkit::Exception&) {
+      return false;
+    }
+  }
+  return false;
+}

@@ -1,0 +1,19 @@
+// Putting back the tags that controls had when they were found.
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "engine/tag_key.hpp"
+
+void QZ_Plist_State_Parser::restoreOriginalTagValues() {
+  if (!*guiAssets_) return;
+  const Dictionary tags = *originalTagValues_;
+  for (const auto& [key, value] : tags->entries()) {
+    const std::string name = key->description();
+    const long recorded = value->intValue();
+    const Control control = guiAssets_->objectForKey(name).control.get();
+    // Written also where nothing changes; a control that is gone has the tag 0 and no class.
+    toolkit_.log().write(
+        "Restoring tag value from: " + tagKey(control->tag()) + " to " + tagKey(recorded) +
+        " for object: " + (control ? control->className() : "(null)") + " with Key: " + name);
+    if (control->tag() != recorded) control->setTag(recorded);
+  }
+}

@@ -1,0 +1,41 @@
+// Object timers: one-shot countdowns, one for a tag key, that press the tag's button or run its
+// list.
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "engine/tag_key.hpp"
+
+void QZ_Plist_State_Parser::startTimerWithValue(std::uint64_t value,
+                                                const std::optional<std::string>& forKey) {
+  if (value == 0 || !forKey || forKey->empty()) return;
+  // Seconds in single precision: above 16,777,216 the low digits are lost.
+  const double interval = static_cast<double>(static_cast<float>(value));
+  const auto self = shared_from_this();
+  // A timer that is replaced goes on running; when it fires, no key is found for it.
+  objectIdTimers_->setObject(
+      toolkit_.runLoop().schedule(interval, false,
+                                  [self](const Timer& timer) { self->pseudoButtonPush(timer); }),
+      *forKey);
+}
+
+void QZ_Plist_State_Parser::killAllTimers() {
+  for (const auto& [key, timer] : objectIdTimers_->entries()) {
+    if (timer->isValid()) timer->invalidate();
+  }
+  objectIdTimers_->removeAllObjects();
+}
+
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TIMER(std::uint64_t value,
+                                                               const ObjectId& forId) {
+  const std::string key = tagKey(forId->integerValue());
+  if (findObjectWithTag(forId->intValue())) {
+    if (value != 0) {
+      startTimerWithValue(value, key);
+    } else {
+      objectIdTimers_->objectForKey(key)->invalidate();
+      objectIdTimers_->removeObjectForKey(key);
+    }
+  } else if (plistDictionary_->objectForKey(key)) {
+    startTimerWithValue(value, key);  // here 0 cancels nothing
+  }
+  return false;  // whatever happened
+}

@@ -1,0 +1,97 @@
+#include "toolkit/uppercase.hpp"
+
+#include <algorithm>
+#include <cstddef>
+#include <iterator>
+
+namespace toolkit {
+
+namespace {
+
+// Letters first, first + step, … last, whose upper-case form lies `distance` further on.
+struct Range {
+  char32_t first;
+  char32_t last;
+  char32_t step;
+  int distance;
+};
+
+// A letter whose upper case is several characters, given in UTF-8.
+struct Expansion {
+  char32_t letter;
+  std::string_view upper;
+};
+
+#include "toolkit/uppercase_table.inc"
+
+struct Decoded {
+  char32_t character;
+  std::size_t length;  // bytes; 0 where there is no UTF-8
+};
+
+Decoded decode(std::string_view text) {
+  const auto byte = [&](std::size_t i) { return static_cast<unsigned char>(text[i]); };
+  const std::size_t length = byte(0) >= 0xF0 ? 4 : byte(0) >= 0xE0 ? 3 : byte(0) >= 0xC2 ? 2 : 0;
+  if (length == 0 || length > text.size()) return {0, 0};
+  char32_t character = byte(0) & (0xFFu >> (length + 1));
+  for (std::size_t i = 1; i < length; ++i) {
+    if ((byte(i) & 0xC0) != 0x80) return {0, 0};
+    character = (character << 6) | (byte(i) & 0x3Fu);
+  }
+  return {character, length};
+}
+
+void encode(std::string& out, char32_t c) {
+  const auto put = [&](char32_t bits) { out += static_cast<char>(bits); };
+  if (c < 0x80) return put(c);
+  if (c < 0x800) {
+    put(0xC0 | (c >> 6));
+  } else {
+    if (c < 0x10000) {
+      put(0xE0 | (c >> 12));
+    } else {
+      put(0xF0 | (c >> 18));
+      put(0x80 | ((c >> 12) & 0x3F));
+    }
+    put(0x80 | ((c >> 6) & 0x3F));
+  }
+  put(0x80 | (c & 0x3F));
+}
+
+char32_t simpleUpper(char32_t c) {
+  const auto* range = std::lower_bound(std::begin(ranges), std::end(ranges), c,
+                                       [](const Range& r, char32_t x) { return r.last < x; });
+  if (range == std::end(ranges) || c < range->first) return c;
+  if ((c - range->first) % range->step != 0) return c;
+  return static_cast<char32_t>(static_cast<int>(c) + range->distance);
+}
+
+void appendUpper(std::string& out, char32_t c) {
+  const auto* found = std::lower_bound(std::begin(expansions), std::end(expansions), c,
+                                       [](const Expansion& e, char32_t x) { return e.letter < x; });
+  if (found != std::end(expansions) && found->letter == c) {
+    out += found->upper;
+  } else {
+    encode(out, simpleUpper(c));
+  }
+}
+
+}  // namespace
+
+std::string uppercased(std::string_view text) {
+  std::string out;
+  out.reserve(text.size());
+  while (!text.empty()) {
+    const char c = text.front();
+    const Decoded decoded = static_cast<unsigned char>(c) < 0x80 ? Decoded{0, 0} : decode(text);
+    if (decoded.length == 0) {
+      out += c >= 'a' && c <= 'z' ? static_cast<char>(c - 'a' + 'A') : c;
+    } else {
+      appendUpper(out, decoded.character);
+    }
+    text.remove_prefix(std::max<std::size_t>(decoded.length, 1));
+  }
+  return out;
+}
+
+}  // namespace toolkit

@@ -1,0 +1,186 @@
+// Text in the cells of a terminal.
+#include "tools/play/text_layout.hpp"
+
+#include <algorithm>
+#include <array>
+#include <cstdint>
+#include <cstdio>
+
+namespace tools::play {
+namespace {
+
+constexpr char32_t replacement = 0xFFFD;
+
+struct Character {
+  char32_t code = replacement;
+  std::size_t length = 1;  // bytes
+};
+
+struct Range {
+  char32_t first;
+  char32_t last;
+};
+
+/// The bytes that a leading byte says its character has; 0 for a byte that cannot lead.
+std::size_t sequenceLength(unsigned char lead) {
+  if (lead < 0x80) return 1;
+  if (lead >= 0xC2 && lead < 0xE0) return 2;
+  if (lead >= 0xE0 && lead < 0xF0) return 3;
+  return lead >= 0xF0 && lead < 0xF5 ? 4 : 0;
+}
+
+/// The character at the start of `text`, which is not empty. What is no UTF-8 is one replacement
+/// character a byte; so is a surrogate, which no terminal can show.
+Character firstCharacter(std::string_view text) {
+  const auto lead = static_cast<unsigned char>(text.front());
+  const std::size_t length = sequenceLength(lead);
+  if (length == 1) return {lead, 1};
+  if (length == 0 || length > text.size()) return {};
+  char32_t code = lead & (0xFFU >> (length + 1));
+  for (const char c : text.substr(1, length - 1)) {
+    const auto byte = static_cast<unsigned char>(c);
+    if ((byte & 0xC0U) != 0x80U) return {};
+    code = (code << 6U) | (byte & 0x3FU);
+  }
+  constexpr std::array<char32_t, 5> least = {0, 0, 0x80, 0x800, 0x10000};
+  const bool valid = code >= least.at(length) && code <= 0x10FFFF && (code < 0xD800 || code > 0xDFFF);
+  return valid ? Character{code, length} : Character{};
+}
+
+template <std::size_t N>
+bool isIn(const std::array<Range, N>& ranges, char32_t code) {
+  return std::any_of(ranges.begin(), ranges.end(),
+                     [code](const Range& r) { return code >= r.first && code <= r.last; });
+}
+
+std::size_t characterWidth(char32_t code) {
+  static constexpr std::array<Range, 6> none = {{{0x0300, 0x036F},
+                                                 {0x200B, 0x200D},
+                                                 {0x20D0, 0x20FF},
+                                                 {0xFE00, 0xFE0F},
+                                                 {0xFE20, 0xFE2F},
+                                                 {0xFEFF, 0xFEFF}}};
+  static constexpr std::array<Range, 9> wide = {{{0x1100, 0x115F},
+                                                 {0x2E80, 0x303E},
+                                                 {0x3041, 0xA4CF},
+                                                 {0xAC00, 0xD7A3},
+                                                 {0xF900, 0xFAFF},
+                                                 {0xFE30, 0xFE6F},
+                                                 {0xFF00, 0xFF60},
+                                                 {0x1F300, 0x1F9FF},
+                                                 {0x20000, 0x3FFFD}}};
+  if (isIn(none, code)) return 0;
+  return isIn(wide, code) ? 2 : 1;
+}
+
+/// Whether a terminal would act on the character, or turn the direction of what follows.
+bool disturbs(char32_t code) {
+  static constexpr std::array<Range, 5> disturbing = {
+      {{0x00, 0x1F}, {0x7F, 0x9F}, {0x200E, 0x200F}, {0x202A, 0x202E}, {0x2066, 0x2069}}};
+  return isIn(disturbing, code);
+}
+
+bool endsLine(char32_t code) { return code == '\n' || code == 0x2028 || code == 0x2029; }
+
+std::string escaped(char32_t code) {
+  std::array<char, 16> text{};
+  std::snprintf(text.data(), text.size(), "\\u{%x}", static_cast<unsigned>(code));
+  return text.data();
+}
+
+/// Where to cut `line` so that at most `width` columns, and at least one character, come before.
+std::size_t cutOff(std::string_view line, std::size_t width) {
+  std::size_t bytes = 0;
+  std::size_t columns = 0;
+  while (bytes < line.size()) {
+    const Character character = firstCharacter(line.substr(bytes));
+    columns += characterWidth(character.code);
+    if (columns > width && bytes > 0) break;
+    bytes += character.length;
+  }
+  return bytes;
+}
+
+void wrapLine(std::string_view line, std::size_t width, std::vector<std::string>& lines) {
+  while (displayWidth(line) > width) {
+    std::size_t end = cutOff(line, width);
+    std::size_t next = end;
+    // A space that stands just behind the last column still breaks the line there.
+    if (const auto space = line.rfind(' ', end); space != std::string_view::npos && space > 0) {
+      end = space;
+      next = space + 1;
+    }
+    lines.emplace_back(line.substr(0, end));
+    line.remove_prefix(next);
+  }
+  lines.emplace_back(line);
+}
+
+std::string padding(std::string_view text, std::size_t width) {
+  const std::size_t taken = displayWidth(text);
+  return std::string(width > taken ? width - taken : 0, ' ');
+}
+
+}  // namespace
+
+std::size_t displayWidth(std::string_view text) {
+  std::size_t width = 0;
+  while (!text.empty()) {
+    const Character character = firstCharacter(text);
+    width += characterWidth(character.code);
+    text.remove_prefix(character.length);
+  }
+  return width;
+}
+
+std::string printable(std::string_view text) {
+  std::string shown;
+  while (!text.empty()) {
+    const auto [code, length] = firstCharacter(text);
+    if (endsLine(code)) {
+      shown += '\n';
+    } else if (code == '\t') {
+      shown += ' ';
+    } else if (disturbs(code)) {
+      shown += escaped(code);
+    } else if (code == replacement) {
+      shown += "\uFFFD";
+    } else {
+      shown += text.substr(0, length);
+    }
+    text.remove_prefix(length);
+  }
+  return shown;
+}
+
+std::string quoted(std::string_view text) {
+  std::string shown = "“";
+  for (const char c : printable(text)) {
+    if (c == '\n') {
+      shown += "\\n";
+    } else {
+      shown += c;
+    }
+  }
+  return shown + "”";
+}
+
+std::vector<std::string> wrap(std::string_view text, std::size_t width) {
+  std::vector<std::string> lines;
+  for (std::size_t end = text.find('\n'); end != std::string_view::npos; end = text.find('\n')) {
+    wrapLine(text.substr(0, end), width, lines);
+    text.remove_prefix(end + 1);
+  }
+  wrapLine(text, width, lines);
+  return lines;
+}
+
+std::string padRight(std::string_view text, std::size_t width) {
+  return std::string(text) + padding(text, width);
+}
+
+std::string padLeft(std::string_view text, std::size_t width) {
+  return padding(text, width) + std::string(text);
+}
+
+}  // namespace tools::play
