@@ -10,7 +10,8 @@ bool QZ_Plist_State_Parser::setButtonSates(const Dictionary& states) {
   const Control content = tutorialWindow_->get()->contentView();
   if (states->count() == 0 || content->subviews().empty()) return false;
   bool changed = false;
-  for (const auto& [key, value] : states->entries()) {
+  const auto entries = states->entries();  // a copy: it may change under the walk
+  for (const auto& [key, value] : entries) {
     const auto button = toolkit::asButton(findObjectWithTag(key->integerValue()));
     if (!button) continue;
     button->setState(value->boolValue() ? toolkit::State::on : toolkit::State::off);
