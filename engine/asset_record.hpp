@@ -12,5 +12,5 @@
 struct AssetRecord {
   std::array<std::string, 1> classNames;
   std::array<float, 4> frame{};
-  toolkit::Link<toolkit::View> control;
+  toolkit::StoredRef<toolkit::View> control;
 };

@@ -3,7 +3,7 @@
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/tag_key.hpp"
 
-using toolkit::Link;
+using toolkit::StoredRef;
 
 namespace {
 
@@ -22,7 +22,7 @@ std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::init(toolkit::Tool
 std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::initWithWindow(
     toolkit::Toolkit& toolkit, const Window& window) {
   const auto engine = init(toolkit);
-  engine->window_.set(Link<toolkit::Window>::refer(window));
+  engine->window_.set(StoredRef<toolkit::Window>::refer(window));
   engine->buttonStates_ = toolkit::Dictionary::make();
   engine->plistDictionary_.set(toolkit::Dictionary::make());
   engine->flashingTagIds_.set(toolkit::Dictionary::make());

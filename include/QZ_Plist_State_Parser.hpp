@@ -214,7 +214,9 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
 
   /// The host window. A setter's window is kept alive, the constructor's is not.
   Window window() const { return window_.get().get(); }
-  void setWindow(const Window& window) { window_.set(toolkit::Link<toolkit::Window>::own(window)); }
+  void setWindow(const Window& window) {
+    window_.set(toolkit::StoredRef<toolkit::Window>::own(window));
+  }
   /// The script: tag key to command list.
   Dictionary plistDictionary() const { return plistDictionary_.get(); }
   void setPlistDictionary(Dictionary script) { plistDictionary_.set(std::move(script)); }
@@ -234,7 +236,7 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   /// kept alive, an adopted one is not.
   Window tutorialWindow() const { return tutorialWindow_.get().get(); }
   void setTutorialWindow(const Window& window) {
-    tutorialWindow_.set(toolkit::Link<toolkit::Window>::own(window));
+    tutorialWindow_.set(toolkit::StoredRef<toolkit::Window>::own(window));
   }
   /// The controls that the latest load of a description made, in that order.
   Controls addedObjectToTutorial() const { return addedObjectToTutorial_.get(); }
@@ -276,13 +278,13 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   bool runningAsSheet_ = false;
   bool terminating_ = false;
   bool hasTerminated_ = false;
-  Property<toolkit::Link<toolkit::Window>> window_;
+  Property<toolkit::StoredRef<toolkit::Window>> window_;
   Property<Dictionary> plistDictionary_;
   Property<Value> commandArray_;
   Property<ObjectId> objectId_;
   Property<Timer> flashingTimer_;
   Property<Dictionary> flashingTagIds_;
-  Property<toolkit::Link<toolkit::Window>> tutorialWindow_;
+  Property<toolkit::StoredRef<toolkit::Window>> tutorialWindow_;
   Property<Controls> addedObjectToTutorial_;
   Property<GuiAssets> guiAssets_;
   Property<ObjectId> lastTagId_;

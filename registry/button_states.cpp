@@ -3,15 +3,15 @@
 #include "QZ_Plist_State_Parser.hpp"
 
 QZ_Plist_State_Parser::Dictionary QZ_Plist_State_Parser::buttonStates() const {
-  return buttonStates_->copy(toolkit::Mutability::immutable);
+  return buttonStates_ ? buttonStates_->copy(toolkit::Mutability::immutable) : nullptr;
 }
 
 bool QZ_Plist_State_Parser::setButtonSates(const Dictionary& states) {
   const Control content = tutorialWindow_->get()->contentView();
   if (states->count() == 0 || content->subviews().empty()) return false;
   bool changed = false;
-  const auto entries = states->entries();  // a copy: it may change under the walk
-  for (const auto& [key, value] : entries) {
+  const Dictionary snapshot = states->copy(toolkit::Mutability::immutable);
+  for (const auto& [key, value] : snapshot->entries()) {
     const auto button = toolkit::asButton(findObjectWithTag(key->integerValue()));
     if (!button) continue;
     button->setState(value->boolValue() ? toolkit::State::on : toolkit::State::off);

@@ -18,7 +18,7 @@ AssetRecord recordOf(const toolkit::Ref<toolkit::View>& view) {
   return {{view->className()},
           {static_cast<float>(frame.x), static_cast<float>(frame.y),
            static_cast<float>(frame.width), static_cast<float>(frame.height)},
-          toolkit::Link<toolkit::View>::refer(view)};
+          toolkit::StoredRef<toolkit::View>::refer(view)};
 }
 
 // The first key that cannot be a tag's own: one more than the largest tag, which is never below 0.
@@ -34,7 +34,7 @@ bool QZ_Plist_State_Parser::getGuiAssetsFromWindow(const Window& window) {
   if (!window) return false;
   // A window that is the engine's own stays so.
   if (tutorialWindow_->get() != window) {
-    tutorialWindow_.set(toolkit::Link<toolkit::Window>::refer(window));
+    tutorialWindow_.set(toolkit::StoredRef<toolkit::Window>::refer(window));
   }
   if (!window->delegate()) window->setDelegate(shared_from_this());
   guiAssets_->removeAllObjects();

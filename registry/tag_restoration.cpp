@@ -5,8 +5,8 @@
 
 void QZ_Plist_State_Parser::restoreOriginalTagValues() {
   if (!*guiAssets_) return;
-  const auto entries = originalTagValues_->entries();  // a copy: it may change under the walk
-  for (const auto& [key, value] : entries) {
+  const Dictionary tags = originalTagValues_->copy(toolkit::Mutability::immutable);
+  for (const auto& [key, value] : tags->entries()) {
     const std::string name = key->description();
     const long recorded = value->intValue();
     const Control control = guiAssets_->objectForKey(name).control.get();

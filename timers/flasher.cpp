@@ -21,8 +21,8 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_ALLOW_FLASHING(bool allow) 
   if (allow) return true;
   // Every button that has a list loses its highlight, whether it was flashing or not; a flashing
   // one without a list keeps what it has.
-  const auto entries = plistDictionary_->entries();  // a copy: it may change under the walk
-  for (const auto& [key, list] : entries) {
+  const Dictionary script = plistDictionary_->copy(toolkit::Mutability::immutable);
+  for (const auto& [key, list] : script->entries()) {
     asButton(findObjectWithTag(key->intValue()))->highlight(false);
   }
   return true;

@@ -42,17 +42,17 @@ class Ref {
 /// Stored reference that says for each object it is given whether it keeps it alive (`own`) or
 /// leaves that to somebody else (`refer`); in the latter case it turns absent when the object goes.
 template <class T>
-class Link {
+class StoredRef {
  public:
-  static Link own(const Ref<T>& object) { return Link(object.pointer(), object.pointer()); }
-  static Link refer(const Ref<T>& object) { return Link(nullptr, object.pointer()); }
-  Link() = default;
+  static StoredRef own(const Ref<T>& object) { return StoredRef(object.pointer(), object.pointer()); }
+  static StoredRef refer(const Ref<T>& object) { return StoredRef(nullptr, object.pointer()); }
+  StoredRef() = default;
 
   /// The object, or absent when there is none or its owner let it go.
   Ref<T> get() const { return owned_ ? owned_ : referred_.lock(); }
 
  private:
-  Link(std::shared_ptr<T> owned, const std::shared_ptr<T>& referred)
+  StoredRef(std::shared_ptr<T> owned, const std::shared_ptr<T>& referred)
       : owned_(std::move(owned)), referred_(referred) {}
 
   std::shared_ptr<T> owned_;   // ours to keep alive

@@ -1,7 +1,10 @@
 // The values that hold other values: arrays, sets, dictionaries.
+//
+// Ending a collection takes no more stack however deeply collections nest in it.
 #pragma once
 
 #include <cstddef>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -10,33 +13,65 @@
 
 namespace toolkit {
 
-class Array final : public Value {
+/// What arrays, sets and dictionaries have in common.
+class Collection : public Value {
+ protected:
+  Collection(Kind kind, Mutability mutability) : Value(kind), mutability_(mutability) {}
+  /// Raises where the collection is immutable; says whether a change is to be made at all.
+  bool canChange(std::string_view selector) const;
+  /// Raises when `value` is absent.
+  void requirePresent(const ValueRef<>& value, std::string_view selector) const;
+
+ private:
+  void destroy() noexcept final;
+
+  Mutability mutability_;
+  Collection* nextToDestroy_ = nullptr;
+};
+
+class Array final : public Collection {
  public:
   static Array& nothing();
   static ValueRef<Array> make(std::vector<ValueRef<>> elements = {},
                               Mutability mutability = Mutability::changeable);
 
   /// The elements in order. Valid until the array changes.
-  const std::vector<ValueRef<>>& elements() const;
+  std::span<const ValueRef<>> elements() const { return elements_; }
   std::size_t count() const override;
   ValueRef<> objectAtIndex(std::size_t index) const override;
 
   /// Changes raise where `Mutability` says so; adding an absent value raises.
   void addObject(const ValueRef<>& value);
   void removeAllObjects();
+
+ private:
+  friend class Value;
+  explicit Array(Kind kind) : Collection(kind, Mutability::ignored) {}
+  Array(std::vector<ValueRef<>> elements, Mutability mutability);
+
+  std::vector<ValueRef<>> elements_;
 };
 
 /// Values without an order, from binary property lists; they keep the order of the file.
-class Set final : public Value {
+class Set final : public Collection {
  public:
+  static Set& nothing();
   static ValueRef<Set> make(std::vector<ValueRef<>> elements);
-  const std::vector<ValueRef<>>& elements() const;
+  /// The elements in the order of the file. Valid as long as the set is.
+  std::span<const ValueRef<>> elements() const { return elements_; }
   std::size_t count() const override;
+
+ private:
+  friend class Value;
+  explicit Set(Kind kind) : Collection(kind, Mutability::ignored) {}
+  explicit Set(std::vector<ValueRef<>> elements);
+
+  std::vector<ValueRef<>> elements_;
 };
 
 /// Values under keys. The keys that scripts and tables use are strings; a binary property list may
 /// hold others, which no look-up by string finds. Keys keep the order in which they first came.
-class Dictionary final : public Value {
+class Dictionary final : public Collection {
  public:
   struct Entry {
     ValueRef<> key;
@@ -48,7 +83,7 @@ class Dictionary final : public Value {
                                    Mutability mutability = Mutability::changeable);
 
   /// The entries in order. Valid until the dictionary changes.
-  const std::vector<Entry>& entries() const;
+  std::span<const Entry> entries() const { return entries_; }
   std::size_t count() const override;
   /// The value under a string key, or absent.
   ValueRef<> objectForKey(std::string_view key) const;
@@ -62,6 +97,14 @@ class Dictionary final : public Value {
   void setObject(const ValueRef<>& value, std::string_view key);
   void removeObjectForKey(std::string_view key);
   void removeAllObjects();
+
+ private:
+  friend class Value;
+  explicit Dictionary(Kind kind) : Collection(kind, Mutability::ignored) {}
+  Dictionary(std::vector<Entry> entries, Mutability mutability);
+  std::size_t position(std::string_view key) const;
+
+  std::vector<Entry> entries_;
 };
 
 /// `value` as the kind named, or absent when it is absent or of another kind.

@@ -1,6 +1,9 @@
 // The values that hold no other values: strings, numbers, dates, data, null, UIDs.
+//
+// Invariant: none of them ever changes.
 #pragma once
 
+#include <bit>
 #include <cstdint>
 #include <string>
 #include <string_view>
@@ -16,8 +19,23 @@ class String final : public Value {
   static String& nothing();
   static ValueRef<String> make(std::string_view text);
 
-  std::string_view text() const;
-  // ... the conversions of Value
+  /// The UTF-8; valid as long as the string is.
+  std::string_view text() const { return {trailingBytes(), size_}; }
+
+  std::int32_t intValue() const override;
+  std::int64_t integerValue() const override;
+  std::int64_t longValue() const override;
+  float floatValue() const override;
+  double doubleValue() const override;
+  bool boolValue() const override;
+
+ private:
+  friend class Value;
+  explicit String(Kind kind) : Value(kind) {}
+  explicit String(std::string_view text);
+  const char* trailingBytes() const { return reinterpret_cast<const char*>(this + 1); }
+
+  std::size_t size_ = 0;  // of the text, which stands right behind
 };
 
 /// A boolean, a 64-bit integer with or without sign, or a real.
@@ -32,36 +50,84 @@ class Number final : public Value {
   static ValueRef<Number> withFloat(float value);
   static ValueRef<Number> withDouble(double value);
 
-  Type type() const;
+  Type type() const { return type_; }
+  bool isReal() const { return type_ == Type::real32 || type_ == Type::real64; }
   /// The integer's bits; 0 or 1 of a boolean. Of a real: as `integerValue`.
   std::uint64_t bits() const;
+
+  std::int32_t intValue() const override;
+  std::int64_t integerValue() const override;
+  std::int64_t longValue() const override;
+  float floatValue() const override;
+  double doubleValue() const override;
+  bool boolValue() const override;
+
+ private:
+  friend class Value;
+  explicit Number(Kind kind) : Value(kind) {}
+  Number(Type type, std::uint64_t bits) : Value(Kind::number), type_(type), bits_(bits) {}
+  static ValueRef<Number> make(Type type, std::uint64_t bits);
+  double real() const { return std::bit_cast<double>(bits_); }
+
+  Type type_ = Type::signedInteger;
+  std::uint64_t bits_ = 0;  // of a real of either width: the bits of the double
 };
 
 /// A moment: seconds since 2001-01-01 00:00:00 UTC.
 class Date final : public Value {
  public:
+  static Date& nothing();
   static ValueRef<Date> make(double secondsSinceReferenceDate);
-  double secondsSinceReferenceDate() const;
+  double secondsSinceReferenceDate() const { return seconds_; }
+
+ private:
+  friend class Value;
+  explicit Date(Kind kind) : Value(kind) {}
+  explicit Date(double seconds) : Value(Kind::date), seconds_(seconds) {}
+
+  double seconds_ = 0;
 };
 
 /// Bytes.
 class Data final : public Value {
  public:
+  static Data& nothing();
   static ValueRef<Data> make(std::string_view bytes);
-  std::string_view bytes() const;
+  /// The bytes; valid as long as the data is.
+  std::string_view bytes() const { return {reinterpret_cast<const char*>(this + 1), size_}; }
+
+ private:
+  friend class Value;
+  explicit Data(Kind kind) : Value(kind) {}
+  explicit Data(std::string_view bytes);
+
+  std::size_t size_ = 0;  // of the bytes, which stand right behind
 };
 
 /// The null of binary property lists.
 class Null final : public Value {
  public:
+  static Null& nothing();
   static ValueRef<Null> make();
+
+ private:
+  friend class Value;
+  explicit Null(Kind kind) : Value(kind) {}
 };
 
 /// The reference number of keyed archives.
 class Uid final : public Value {
  public:
+  static Uid& nothing();
   static ValueRef<Uid> make(std::uint32_t number);
-  std::uint32_t number() const;
+  std::uint32_t number() const { return number_; }
+
+ private:
+  friend class Value;
+  explicit Uid(Kind kind) : Value(kind) {}
+  explicit Uid(std::uint32_t number) : Value(Kind::uid), number_(number) {}
+
+  std::uint32_t number_ = 0;
 };
 
 /// `value` as the kind named, or absent when it is absent or of another kind.

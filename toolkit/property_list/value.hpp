@@ -11,10 +11,10 @@
 #include <atomic>
 #include <cstddef>
 #include <cstdint>
+#include <new>
 #include <string>
 #include <string_view>
 #include <utility>
-#include <vector>
 
 #include "toolkit/ref.hpp"
 
@@ -79,12 +79,13 @@ class Value {
     dictionary
   };
 
+  /// Stands for an absent value: answers zero, NO, absent or empty text to everything.
   static Value& nothing();
   Value(const Value&) = delete;
   Value& operator=(const Value&) = delete;
 
   Kind kind() const { return kind_; }
-  /// The name of the kind in messages, such as "NSString".
+  /// The name of the kind in messages, such as "NSString"; empty for the object that is nothing.
   std::string_view className() const;
 
   // Conversions, of strings and numbers; any other kind raises. Strings convert by the rules of
@@ -92,9 +93,11 @@ class Value {
   // truncated, and one that is out of range or no number gives the nearest bound, or 0.
   virtual std::int32_t intValue() const;
   virtual std::int64_t integerValue() const;
+  /// The same as `integerValue`.
   virtual std::int64_t longValue() const;
   virtual float floatValue() const;
   virtual double doubleValue() const;
+  /// Of a number: whether it is other than zero.
   virtual bool boolValue() const;
 
   /// How many elements a collection has; anything else raises.
@@ -102,8 +105,11 @@ class Value {
   /// The element of an array; a range exception beyond its end. Anything but an array raises.
   virtual ValueRef<> objectAtIndex(std::size_t index) const;
 
-  /// The value as a person would read it; a string is itself. Collections are in the old style.
-  virtual std::string description() const;
+  /// The value as a person would read it, in one line unless a string in it has more: a string is
+  /// itself, a number decimal (a boolean 1 or 0, a real in the fewest digits that read back the
+  /// same), a date in ISO 8601, data `<hex>`, null `<null>`. Collections are in the old style,
+  /// `( a, b )` and `{ k = v; }`, and the strings in them quoted where that style asks for it.
+  std::string description() const;
 
   void retain() { count_.fetch_add(1, std::memory_order_relaxed); }
   void release() {
@@ -113,8 +119,29 @@ class Value {
  protected:
   explicit Value(Kind kind) : kind_(kind) {}
   virtual ~Value() = default;
-  virtual void destroy();
-  [[noreturn]] void doesNotUnderstand(std::string_view selector) const;
+
+  /// The one object of class T that is nothing. It is never destroyed: it is used until the very
+  /// end of the program, where other objects' destructors still run.
+  template <class T>
+  static T& nothingAs() {
+    alignas(T) static std::byte storage[sizeof(T)];
+    static T& object = *new (storage) T(Kind::nothing);
+    return object;
+  }
+
+  /// Bytes that a value keeps right behind itself, in the same allocation.
+  enum class Trailing : std::size_t {};
+  static void* operator new(std::size_t size, Trailing extra) {
+    return ::operator new(size + static_cast<std::size_t>(extra));
+  }
+  static void* operator new(std::size_t, void* place) { return place; }
+  static void operator delete(void* memory) { ::operator delete(memory); }
+  static void operator delete(void* memory, Trailing) { ::operator delete(memory); }
+
+  /// Ends the value, whose last reference is gone.
+  virtual void destroy() noexcept;
+  /// Raises, unless the value is nothing: that understands every message.
+  void requireUnderstanding(std::string_view selector) const;
 
  private:
   std::atomic<std::uint32_t> count_{1};

@@ -6,9 +6,11 @@
 #pragma once
 
 #include <cstddef>
+#include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include "toolkit/styled_text/color.hpp"
@@ -22,9 +24,28 @@ enum class TextAlignment : int { left = 0, right = 1, center = 2, justified = 3,
 struct ParagraphStyle {
   TextAlignment alignment = TextAlignment::natural;
   double firstLineHeadIndent = 0;
-  double headIndent = 0;
+  double headIndent = 0;  ///< of the other lines; where it is the greater, the first line hangs
 
   friend bool operator==(const ParagraphStyle&, const ParagraphStyle&) = default;
+};
+
+/// The address that a click on a link opens. Copies share one text: however long it is, the runs
+/// that a link falls into cost no more.
+class Link {
+ public:
+  // Both convert, so that an address can be assigned where a link is asked for.
+  Link(std::string address) : address_(std::make_shared<const std::string>(std::move(address))) {}
+  Link(const char* address) : Link(std::string(address)) {}
+
+  const std::string& address() const { return *address_; }
+  operator const std::string&() const { return *address_; }
+
+  friend bool operator==(const Link& a, const Link& b) {
+    return a.address_ == b.address_ || *a.address_ == *b.address_;
+  }
+
+ private:
+  std::shared_ptr<const std::string> address_;
 };
 
 /// The attributes of a run; an absent one leaves the choice to whoever draws the text.
@@ -33,7 +54,7 @@ struct TextAttributes {
   std::optional<Color> foregroundColor;
   std::optional<Color> backgroundColor;
   std::optional<ParagraphStyle> paragraphStyle;
-  std::optional<std::string> link;  ///< the address a click opens
+  std::optional<Link> link;
   bool underline = false;
   bool strikethrough = false;
   int superscript = 0;  ///< steps above the base line; negative below it

@@ -43,7 +43,8 @@ Character firstCharacter(std::string_view text) {
     code = (code << 6U) | (byte & 0x3FU);
   }
   constexpr std::array<char32_t, 5> least = {0, 0, 0x80, 0x800, 0x10000};
-  const bool valid = code >= least.at(length) && code <= 0x10FFFF && (code < 0xD800 || code > 0xDFFF);
+  const bool valid =
+      code >= least.at(length) && code <= 0x10FFFF && (code < 0xD800 || code > 0xDFFF);
   return valid ? Character{code, length} : Character{};
 }
 
@@ -153,7 +154,7 @@ std::string printable(std::string_view text) {
   return shown;
 }
 
-std::string quoted(std::string_view text) {
+std::string quote(std::string_view text) {
   std::string shown = "“";
   for (const char c : printable(text)) {
     if (c == '\n') {

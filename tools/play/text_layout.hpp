@@ -21,10 +21,10 @@ std::size_t displayWidth(std::string_view text);
 std::string printable(std::string_view text);
 
 /// `text` on one line between “ and ”, line ends written "\n".
-std::string quoted(std::string_view text);
+std::string quote(std::string_view text);
 
-/// `text` in lines of at most `width` columns (1 or more), broken at line ends, else at spaces, else
-/// anywhere. At least one line.
+/// `text` in lines of at most `width` columns (1 or more), broken at line ends, else at spaces,
+/// else anywhere. At least one line.
 std::vector<std::string> wrap(std::string_view text, std::size_t width);
 
 /// `text` with spaces behind it, or in front of it, up to `width` columns.

@@ -1,0 +1,106 @@
+// What several tests of the memory toolkit need: recorders, and a directory of their own.
+#pragma once
+
+#include <gtest/gtest.h>
+#include <unistd.h>
+
+#include <filesystem>
+#include <fstream>
+#include <functional>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+#include "toolkit/application.hpp"
+#include "toolkit/memory/memory_driver.hpp"
+#include "toolkit/responder.hpp"
+
+namespace toolkit::memory::test {
+
+/// Understands the actions it is told to, and remembers whose senders asked for which.
+class Recorder : public Responder {
+ public:
+  explicit Recorder(std::string understood = "pressed:") : understood_(std::move(understood)) {}
+
+  bool tryToPerform(std::string_view action, const Ref<View>& sender) override {
+    asked.emplace_back(action);
+    if (action != understood_) return false;
+    senders.push_back(sender->tag());
+    if (perform) perform(sender);
+    return true;
+  }
+
+  std::vector<std::string> asked;               // all actions it was asked to perform
+  std::vector<long> senders;                    // the tags of those it performed for
+  std::function<void(const Ref<View>&)> perform;  // what performing is, besides
+
+ private:
+  std::string understood_;
+};
+
+/// Remembers the ends of sheets that it is told of.
+class SheetRecorder : public SheetDelegate {
+ public:
+  void sheetDidEnd(const Ref<Window>& sheet, long returnCode, void* contextInfo) override {
+    sheets.push_back(sheet);
+    codes.push_back(returnCode);
+    context = contextInfo;
+    if (orderOut) sheet->orderOut();
+  }
+
+  std::vector<Ref<Window>> sheets;
+  std::vector<long> codes;
+  void* context = nullptr;
+  bool orderOut = false;
+};
+
+/// A fresh directory that goes with all it holds when the test ends.
+class Directory {
+ public:
+  Directory() {
+    static int made = 0;
+    path_ = std::filesystem::temp_directory_path() /
+            ("memory-toolkit-" + std::to_string(::getpid()) + "-" + std::to_string(made++));
+    std::filesystem::create_directories(path_);
+  }
+  ~Directory() { std::filesystem::remove_all(path_); }
+  Directory(const Directory&) = delete;
+  Directory& operator=(const Directory&) = delete;
+
+  std::string path() const { return path_.string(); }
+  std::string path(const std::string& name) const { return (path_ / name).string(); }
+  void write(const std::string& name, std::string_view contents) const {
+    std::filesystem::create_directories((path_ / name).parent_path());
+    std::ofstream(path_ / name, std::ios::binary) << contents;
+  }
+  void remove(const std::string& name) const { std::filesystem::remove_all(path_ / name); }
+
+ private:
+  std::filesystem::path path_;
+};
+
+/// A driver, and a host's window on its screen.
+class MemoryTest : public testing::Test {
+ protected:
+  Ref<View> make(ViewKind kind, long tag = 1) { return makeIn(window->contentView(), kind, tag); }
+  Ref<View> makeIn(const Ref<View>& parent, ViewKind kind, long tag) {
+    return driver.makeView(kind, tag, {10, 20, 30, 40}, parent);
+  }
+  /// A button with the target and the action given.
+  Ref<Button> makeButton(const std::shared_ptr<Responder>& target, ViewKind kind = ViewKind::button,
+                         long tag = 1) {
+    const Ref<Button> button = asButton(make(kind, tag));
+    button->setTarget(target);
+    button->setAction("pressed:");
+    return button;
+  }
+
+  MemoryDriver driver;
+  MemoryToolkit& toolkit = driver.toolkit();
+  Application& application = toolkit.application();
+  Ref<Window> window = driver.makeWindow({100, 100, 640, 480});
+};
+
+}  // namespace toolkit::memory::test

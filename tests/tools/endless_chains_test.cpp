@@ -1,0 +1,88 @@
+#include "tools/endless_chains.hpp"
+
+#include <gtest/gtest.h>
+
+#include "toolkit/property_list/scalars.hpp"
+
+namespace {
+
+using toolkit::Array;
+using toolkit::Dictionary;
+using toolkit::Number;
+using toolkit::String;
+using toolkit::ValueRef;
+
+ValueRef<> chain(long tag) {
+  return Array::make({String::make("Process_Commands_For_Id"), Number::withLong(tag)});
+}
+
+// A script of lists that only chain: to each key, the tags in order.
+ValueRef<Dictionary> script(const std::vector<std::pair<std::string, std::vector<long>>>& lists) {
+  const auto script = Dictionary::make();
+  for (const auto& [key, tags] : lists) {
+    const auto list = Array::make();
+    for (const long tag : tags) list->addObject(chain(tag));
+    script->setObject(list, key);
+  }
+  return script;
+}
+
+TEST(EndlessChains, AreTheLoopsARunEndsUpIn) {
+  const struct {
+    const char* what;
+    std::vector<std::pair<std::string, std::vector<long>>> lists;
+    std::vector<std::string> loops;
+  } cases[] = {
+      {"no chains", {{"1", {}}, {"2", {}}}, {}},
+      {"chains that end", {{"1", {2, 3}}, {"2", {3}}, {"3", {}}}, {}},
+      {"a chain to no list", {{"1", {9}}}, {}},
+      {"a list that runs itself", {{"1", {1}}}, {"1 -> 1"}},
+      {"two that run each other", {{"3", {7}}, {"7", {3}}}, {"3 -> 7 -> 3"}},
+      {"the way to a loop is no part of it", {{"1", {2}}, {"2", {3}}, {"3", {2}}}, {"2 -> 3 -> 2"}},
+      {"a list that ends is passed by", {{"1", {5, 2}}, {"2", {1}}, {"5", {}}}, {"1 -> 2 -> 1"}},
+      {"the first that never ends is where a run stays",
+       {{"1", {1, 2}}, {"2", {2}}},
+       {"1 -> 1", "2 -> 2"}},
+      {"a key that no tag spells", {{"007", {7}}}, {}},
+  };
+  for (const auto& c : cases)
+    EXPECT_EQ(tools::endlessChains(script(c.lists)).loops, c.loops) << c.what;
+}
+
+TEST(EndlessChains, ASimpleCommandChainsToItsOwnList) {
+  const auto list = Array::make({String::make("PROCESS_COMMANDS_FOR_ID")});
+  const auto script = Dictionary::make();
+  script->setObject(list, "4");
+  EXPECT_EQ(tools::endlessChains(script).loops, std::vector<std::string>{"4 -> 4"});
+}
+
+TEST(EndlessChains, SayForEveryListWhereItEndsUp) {
+  const auto chains = tools::endlessChains(script({{"1", {2}}, {"2", {2}}, {"3", {1}}, {"4", {}}}));
+  ASSERT_EQ(chains.loops, std::vector<std::string>{"2 -> 2"});
+  EXPECT_EQ(chains.loopOf.size(), 3U);
+  EXPECT_FALSE(chains.loopOf.contains("4"));
+}
+
+TEST(EndlessChains, WhatIsNoListChainsToNothing) {
+  const auto script = Dictionary::make();
+  script->setObject(String::make("text"), "1");
+  script->setObject(
+      Array::make({Array::make(), Array::make({Number::withLong(1), chain(1)}),
+                   Array::make({String::make("PROCESS_COMMANDS_FOR_ID"), Array::make()})}),
+      "2");
+  EXPECT_TRUE(tools::endlessChains(script).loops.empty());
+}
+
+TEST(EndlessChains, OfAHundredThousandListsAreFoundAtOnce) {
+  const auto script = Dictionary::make();
+  std::vector<Dictionary::Entry> entries;
+  constexpr long count = 100'000;
+  for (long i = 0; i < count; ++i) {
+    entries.push_back({String::make(std::to_string(i)), Array::make({chain((i + 1) % count)})});
+  }
+  const auto chains = tools::endlessChains(Dictionary::make(std::move(entries)));
+  EXPECT_EQ(chains.loops.size(), 1U);
+  EXPECT_EQ(chains.loopOf.size(), static_cast<std::size_t>(count));
+}
+
+}  // namespace

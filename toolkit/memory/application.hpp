@@ -1,0 +1,35 @@
+// The memory toolkit's application: makes windows and controls, and keeps the screen.
+#pragma once
+
+#include <memory>
+
+#include "toolkit/application.hpp"
+#include "toolkit/memory/screen.hpp"
+
+namespace toolkit::memory {
+
+class MemoryApplication final : public Application {
+ public:
+  MemoryApplication() : screen_(std::make_shared<Screen>()) {}
+  /// Takes every window off the screen, and so lets go of those that it kept alive.
+  ~MemoryApplication() override { screen_->orderAllOut(); }
+  MemoryApplication(const MemoryApplication&) = delete;
+  MemoryApplication& operator=(const MemoryApplication&) = delete;
+
+  Ref<Window> makeWindow(const Rect& content, StyleMask style, BackingStore backing,
+                         bool defer) override;
+  Ref<Button> makeButton(const Rect& frame) override;
+  Ref<ImageView> makeImageView(const Rect& frame) override;
+  Ref<TextField> makeTextField(const Rect& frame) override;
+  void beginSheet(const Ref<Window>& sheet, const Ref<Window>& parent,
+                  const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo) override;
+  void endSheet(const Ref<Window>& sheet, long returnCode) override;
+
+  /// The screen of this application's windows, for whoever makes windows and views of its own.
+  const std::shared_ptr<Screen>& screen() const { return screen_; }
+
+ private:
+  std::shared_ptr<Screen> screen_;  // views and windows only refer to it
+};
+
+}  // namespace toolkit::memory

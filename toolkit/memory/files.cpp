@@ -1,0 +1,56 @@
+#include "toolkit/memory/files.hpp"
+
+#include <filesystem>
+#include <fstream>
+#include <system_error>
+
+namespace toolkit::memory {
+
+namespace fs = std::filesystem;
+
+namespace {
+
+// Paths are UTF-8 in the interface, and whatever the system has underneath.
+fs::path systemPath(std::string_view path) { return std::u8string(path.begin(), path.end()); }
+
+std::string utf8(const fs::path& path) {
+  const std::u8string text = path.u8string();
+  return {text.begin(), text.end()};
+}
+
+// What is at `path`, links followed. A path that holds a NUL would reach the system cut off there,
+// and name another file.
+fs::file_status statusOf(std::string_view path) {
+  if (path.find('\0') != std::string_view::npos) return fs::file_status(fs::file_type::not_found);
+  std::error_code error;
+  return fs::status(systemPath(path), error);
+}
+
+}  // namespace
+
+void MemoryFiles::setResourcePath(std::string_view path) {
+  std::error_code error;
+  const fs::path absolute = fs::absolute(systemPath(path), error).lexically_normal();
+  resourcePath_ = utf8(absolute);
+  while (resourcePath_.ends_with('/')) resourcePath_.pop_back();
+}
+
+bool MemoryFiles::fileExistsAtPath(std::string_view path) const {
+  return fs::exists(statusOf(path));
+}
+
+std::optional<std::string> MemoryFiles::contentsAtPath(std::string_view path) const {
+  if (!isRegularFile(path)) return std::nullopt;
+  std::ifstream file(systemPath(path), std::ios::binary);
+  if (!file) return std::nullopt;
+  std::string contents;
+  char block[1 << 16];
+  while (file.read(block, sizeof block) || file.gcount() > 0)
+    contents.append(block, static_cast<std::size_t>(file.gcount()));
+  if (file.bad()) return std::nullopt;
+  return contents;
+}
+
+bool isRegularFile(std::string_view path) { return fs::is_regular_file(statusOf(path)); }
+
+}  // namespace toolkit::memory

@@ -1,0 +1,17 @@
+#include "toolkit/memory/fonts.hpp"
+
+#include "toolkit/font_names.hpp"
+
+namespace toolkit::memory {
+
+std::optional<Font> MemoryFonts::fontWithName(std::string_view name, double size) const {
+  static const FontFamily families[] = {
+      {"Arial", false},   {"Courier", true},          {"Courier New", true},
+      {"Georgia", false}, {"Helvetica", false},       {"Lucida Grande", false},
+      {"Menlo", true},    {"Monaco", true},           {"Times", false},
+      {"Verdana", false}, {"Times New Roman", false},
+  };
+  return fontNamed(name, size, families);
+}
+
+}  // namespace toolkit::memory

@@ -1,0 +1,40 @@
+// The driver of the memory toolkit.
+#pragma once
+
+#include <memory>
+
+#include "toolkit/memory/memory_toolkit.hpp"
+#include "toolkit/test_driver.hpp"
+
+namespace toolkit::memory {
+
+class MemoryDriver final : public TestDriver {
+ public:
+  std::string_view name() const override { return "memory"; }
+  MemoryToolkit& toolkit() override { return toolkit_; }
+
+  Ref<Window> makeWindow(const Rect& content) override;
+  /// With an absent `parent`, a view that is in no window yet.
+  Ref<View> makeView(ViewKind kind, long tag, const Rect& frame, const Ref<View>& parent) override;
+  void removeFromSuperview(const Ref<View>& view) override;
+  void setFrame(const Ref<View>& view, const Rect& frame) override;
+  void setCaption(const Ref<View>& view, std::string_view text) override;
+  void setResourcePath(std::string_view path) override;
+  std::string_view className(ViewKind kind) const override;
+
+  /// Buttons take clicks; nothing else here does anything with one.
+  void click(const Ref<View>& view) override;
+  void advance(double seconds) override;
+
+  ViewPicture look(const Ref<View>& view) override;
+  WindowPicture look(const Ref<Window>& window) override;
+  void setLogSink(std::function<void(std::string_view)> sink) override;
+
+ private:
+  MemoryToolkit toolkit_;
+};
+
+/// A driver with a memory toolkit of its own.
+std::unique_ptr<TestDriver> makeMemoryDriver();
+
+}  // namespace toolkit::memory

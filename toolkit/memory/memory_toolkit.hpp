@@ -1,0 +1,40 @@
+// The memory toolkit: a whole toolkit without a display. It keeps windows, views, sheets, the
+// responder chain and the clock as AppKit does, and behaves the same at every run; docs/toolkits.md
+// lists its rules.
+#pragma once
+
+#include "toolkit/memory/application.hpp"
+#include "toolkit/memory/files.hpp"
+#include "toolkit/memory/fonts.hpp"
+#include "toolkit/memory/images.hpp"
+#include "toolkit/memory/log.hpp"
+#include "toolkit/memory/run_loop.hpp"
+#include "toolkit/toolkit.hpp"
+
+namespace toolkit::memory {
+
+class MemoryToolkit final : public Toolkit {
+ public:
+  MemoryToolkit() = default;
+  MemoryToolkit(const MemoryToolkit&) = delete;
+  MemoryToolkit& operator=(const MemoryToolkit&) = delete;
+
+  MemoryApplication& application() override { return application_; }
+  MemoryRunLoop& runLoop() override { return runLoop_; }
+  MemoryImages& images() override { return images_; }
+  MemoryFonts& fonts() override { return fonts_; }
+  MemoryFiles& files() override { return files_; }
+  MemoryLog& log() override { return log_; }
+
+ private:
+  MemoryLog log_;
+  MemoryFiles files_;
+  MemoryImages images_{files_};
+  MemoryFonts fonts_;
+  MemoryApplication application_;
+  // The last, so that it ends first: the actions of its timers hold engines, whose ends still use
+  // the other roles.
+  MemoryRunLoop runLoop_;
+};
+
+}  // namespace toolkit::memory

@@ -1,0 +1,76 @@
+#include "toolkit/memory/view_node.hpp"
+
+#include <algorithm>
+
+#include "toolkit/exception.hpp"
+#include "toolkit/memory/window.hpp"
+
+namespace toolkit::memory {
+
+ViewNode::ViewNode(std::string_view className, const Rect& frame,
+                   const std::shared_ptr<Screen>& screen)
+    : className_(className), frame_(frame), screen_(screen) {
+  changed();
+}
+
+std::shared_ptr<ViewNode> ViewNode::of(const Ref<View>& view) {
+  return std::dynamic_pointer_cast<ViewNode>(view.pointer());
+}
+
+Ref<View> ViewNode::view() { return std::shared_ptr<View>(shared_from_this(), &role()); }
+
+std::shared_ptr<MemoryWindow> ViewNode::window() const {
+  auto root = shared_from_this();
+  while (const auto superview = root->superview()) root = superview;
+  return root->window_.lock();
+}
+
+bool ViewNode::takesInput() const {
+  for (auto view = shared_from_this(); view; view = view->superview())
+    if (view->hidden_) return false;
+  const auto window = this->window();
+  return window && window->takesInput();
+}
+
+bool ViewNode::isWithin(const ViewNode& view) const {
+  for (auto around = shared_from_this(); around; around = around->superview())
+    if (around.get() == &view) return true;
+  return false;
+}
+
+void ViewNode::insert(const Ref<View>& view) {
+  const auto node = of(view);
+  const auto refuse = [&](std::string_view what) {
+    throw InvalidArgumentException("-[" + className_ + " addSubview:]: " + std::string(what));
+  };
+  if (!view) refuse("the view is absent");
+  if (!node) refuse("the view, of class " + view->className() + ", is another toolkit's");
+  if (!node->window_.expired()) refuse("the view is the content view of a window");
+  if (isWithin(*node)) refuse("the view is the superview itself, or lies around it");
+
+  node->removeFromSuperview();
+  subviews_.push_back(node->view());  // `view` may have been a reference into the list just left
+  node->superview_ = weak_from_this();
+  changed();
+}
+
+void ViewNode::removeFromSuperview() {
+  const auto superview = this->superview();
+  if (!superview) return;
+  const auto kept = shared_from_this();  // the superview's reference may be the last one
+  superview_.reset();
+  Subviews& list = superview->subviews_;
+  list.erase(std::find(list.begin(), list.end(), view()));
+  superview->changed();
+}
+
+void ViewNode::changed() {
+  if (const auto screen = screen_.lock()) changedAt_ = screen->drawings();
+}
+
+bool ViewNode::isRedrawPending() const {
+  const auto screen = screen_.lock();
+  return screen && changedAt_ == screen->drawings();
+}
+
+}  // namespace toolkit::memory

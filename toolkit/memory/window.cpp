@@ -1,0 +1,81 @@
+#include "toolkit/memory/window.hpp"
+
+#include <utility>
+
+#include "toolkit/memory/views.hpp"
+
+namespace toolkit::memory {
+
+MemoryWindow::MemoryWindow(const std::shared_ptr<Screen>& screen, const Rect& content,
+                           StyleMask style, KeptBy keptBy)
+    : screen_(screen), content_(content), style_(style), keptBy_(keptBy) {}
+
+std::shared_ptr<MemoryWindow> MemoryWindow::make(const std::shared_ptr<Screen>& screen,
+                                                 const Rect& content, StyleMask style,
+                                                 KeptBy keptBy) {
+  const std::shared_ptr<MemoryWindow> window(new MemoryWindow(screen, content, style, keptBy));
+  const auto view = std::make_shared<MemoryView<View>>(
+      class_names::view, Rect{0, 0, content.width, content.height}, screen);
+  view->becomeContentViewOf(window);
+  window->contentView_ = view;
+  return window;
+}
+
+MemoryWindow::~MemoryWindow() {
+  if (const auto screen = screen_.lock()) screen->orderOut(*this);
+}
+
+std::shared_ptr<MemoryWindow> MemoryWindow::of(const Ref<Window>& window) {
+  return std::dynamic_pointer_cast<MemoryWindow>(window.pointer());
+}
+
+void MemoryWindow::makeKeyAndOrderFront() {
+  if (const auto screen = screen_.lock()) screen->orderFront(shared_from_this());
+}
+
+void MemoryWindow::orderOut() {
+  const auto screen = screen_.lock();
+  // What kept the window on the screen may be all that keeps it.
+  const auto kept = screen ? screen->orderOut(*this) : nullptr;
+  sheetParent_.reset();
+}
+
+void MemoryWindow::close() {
+  ++closes_;
+  orderOut();
+}
+
+bool MemoryWindow::isVisible() const {
+  const auto screen = screen_.lock();
+  return screen && screen->shows(*this);
+}
+
+bool MemoryWindow::isKey() const {
+  const auto screen = screen_.lock();
+  return screen && screen->keyWindow() == this;
+}
+
+bool MemoryWindow::takesInput() const {
+  const auto screen = screen_.lock();
+  return screen && screen->shows(*this) && !screen->hasSheetOver(*this);
+}
+
+void MemoryWindow::beginAsSheet(const std::shared_ptr<MemoryWindow>& parent,
+                                const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo) {
+  session_ = Session{delegate, contextInfo};
+  sheetParent_ = parent;
+  // A window that is attached to itself, in however many steps, could never be used again.
+  for (auto above = parent; above; above = above->sheetParent())
+    if (above.get() == this) sheetParent_.reset();
+  makeKeyAndOrderFront();
+}
+
+void MemoryWindow::endAsSheet(long returnCode) {
+  sheetEnds_.push_back(returnCode);
+  const auto session = std::exchange(session_, std::nullopt);
+  if (!session) return;
+  if (const auto delegate = session->delegate.lock())
+    delegate->sheetDidEnd(shared_from_this(), returnCode, session->contextInfo);
+}
+
+}  // namespace toolkit::memory

@@ -1,0 +1,131 @@
+// What `Value::description` answers.
+#include <array>
+#include <charconv>
+#include <string>
+#include <string_view>
+
+#include "toolkit/property_list/calendar.hpp"
+#include "toolkit/property_list/collections.hpp"
+#include "toolkit/property_list/scalars.hpp"
+#include "toolkit/property_list/walk.hpp"
+
+namespace toolkit {
+namespace {
+
+template <class Numeric>
+std::string decimal(Numeric number) {
+  std::array<char, 32> buffer;
+  const auto [end, error] = std::to_chars(buffer.data(), buffer.data() + buffer.size(), number);
+  return {buffer.data(), end};
+}
+
+std::string describe(const Number& number) {
+  switch (number.type()) {
+    case Number::Type::boolean:
+      return number.boolValue() ? "1" : "0";
+    case Number::Type::signedInteger:
+      return decimal(number.integerValue());
+    case Number::Type::unsignedInteger:
+      return decimal(number.bits());
+    case Number::Type::real32:
+      return decimal(number.floatValue());
+    case Number::Type::real64:
+      return decimal(number.doubleValue());
+  }
+  return {};
+}
+
+std::string hex(std::string_view bytes) {
+  constexpr std::string_view digits = "0123456789abcdef";
+  std::string text = "<";
+  for (const char c : bytes) {
+    const auto byte = static_cast<unsigned char>(c);
+    text += {digits[byte >> 4], digits[byte & 15]};
+  }
+  return text + ">";
+}
+
+/// Whether the old style writes a text without quotes.
+bool isBare(std::string_view text) {
+  constexpr std::string_view bare =
+      "abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ0123456789_$/:.-";
+  return !text.empty() && !text.starts_with("//") && !text.starts_with("/*") &&
+         text.find_first_not_of(bare) == std::string_view::npos;
+}
+
+std::string quoted(std::string_view text) {
+  if (isBare(text)) return std::string(text);
+  std::string result = "\"";
+  for (const char c : text) {
+    if (c == '"' || c == '\\') result += '\\';
+    if (c == '\n') {
+      result += "\\n";
+    } else {
+      result += c;
+    }
+  }
+  return result + '"';
+}
+
+std::string describeScalar(const Value& value) {
+  switch (value.kind()) {
+    case Value::Kind::string:
+      return std::string(static_cast<const String&>(value).text());
+    case Value::Kind::number:
+      return describe(static_cast<const Number&>(value));
+    case Value::Kind::date:
+      return iso8601(static_cast<const Date&>(value).secondsSinceReferenceDate());
+    case Value::Kind::data:
+      return hex(static_cast<const Data&>(value).bytes());
+    case Value::Kind::null:
+      return "<null>";
+    case Value::Kind::uid:
+      return "<uid " + decimal(static_cast<const Uid&>(value).number()) + ">";
+    default:
+      return {};
+  }
+}
+
+/// Writes collections in the old style, on one line.
+struct Describer {
+  std::string text;
+
+  void scalar(const Value& value) {
+    const std::string description = describeScalar(value);
+    text += value.kind() == Value::Kind::string ? quoted(description) : description;
+  }
+
+  void open(const Value& collection) {
+    if (collection.kind() != Value::Kind::array) text += '{';
+    if (collection.kind() != Value::Kind::dictionary) text += '(';
+  }
+
+  void beforeChild(const Value& collection, std::size_t index) {
+    if (collection.kind() != Value::Kind::dictionary) {
+      text += index == 0 ? " " : ", ";
+    } else if (index % 2 == 0) {
+      text += index == 0 ? " " : "; ";
+    } else {
+      text += " = ";
+    }
+  }
+
+  void close(const Value& collection) {
+    const bool isDictionary = collection.kind() == Value::Kind::dictionary;
+    if (isDictionary && collection.count() != 0) text += ';';
+    text += ' ';
+    if (!isDictionary) text += ')';
+    if (collection.kind() != Value::Kind::array) text += '}';
+  }
+};
+
+}  // namespace
+
+std::string Value::description() const {
+  if (!isCollection(*this)) return describeScalar(*this);
+  Describer describer;
+  walk(*this, describer);
+  return std::move(describer.text);
+}
+
+}  // namespace toolkit

@@ -1,0 +1,118 @@
+#include "toolkit/property_list/scalars.hpp"
+
+#include <cstring>
+
+#include "toolkit/property_list/number_conversion.hpp"
+
+namespace toolkit {
+namespace {
+
+void copyBehind(void* object, std::size_t size, std::string_view bytes) {
+  if (!bytes.empty()) std::memcpy(static_cast<char*>(object) + size, bytes.data(), bytes.size());
+}
+
+}  // namespace
+
+String& String::nothing() { return nothingAs<String>(); }
+
+String::String(std::string_view text) : Value(Kind::string), size_(text.size()) {
+  copyBehind(this, sizeof *this, text);
+}
+
+ValueRef<String> String::make(std::string_view text) {
+  return Counted<String>::adopt(new (Trailing{text.size()}) String(text));
+}
+
+std::int32_t String::intValue() const { return intValueOf(text()); }
+std::int64_t String::integerValue() const { return integerValueOf(text()); }
+std::int64_t String::longValue() const { return integerValue(); }
+float String::floatValue() const { return static_cast<float>(doubleValue()); }
+double String::doubleValue() const { return doubleValueOf(text()); }
+bool String::boolValue() const { return boolValueOf(text()); }
+
+Number& Number::nothing() { return nothingAs<Number>(); }
+
+ValueRef<Number> Number::make(Type type, std::uint64_t bits) {
+  return Counted<Number>::adopt(new (Trailing{0}) Number(type, bits));
+}
+
+ValueRef<Number> Number::withBool(bool value) { return make(Type::boolean, value ? 1 : 0); }
+ValueRef<Number> Number::withLong(std::int64_t value) {
+  return make(Type::signedInteger, static_cast<std::uint64_t>(value));
+}
+ValueRef<Number> Number::withUnsignedLong(std::uint64_t value) {
+  return make(Type::unsignedInteger, value);
+}
+ValueRef<Number> Number::withFloat(float value) {
+  return make(Type::real32, std::bit_cast<std::uint64_t>(static_cast<double>(value)));
+}
+ValueRef<Number> Number::withDouble(double value) {
+  return make(Type::real64, std::bit_cast<std::uint64_t>(value));
+}
+
+std::uint64_t Number::bits() const {
+  return isReal() ? static_cast<std::uint64_t>(integerValue()) : bits_;
+}
+
+std::int32_t Number::intValue() const {
+  return isReal() ? truncatedToInt(real()) : static_cast<std::int32_t>(bits_);
+}
+
+std::int64_t Number::integerValue() const {
+  return isReal() ? truncatedToInteger(real()) : static_cast<std::int64_t>(bits_);
+}
+
+std::int64_t Number::longValue() const { return integerValue(); }
+float Number::floatValue() const { return static_cast<float>(doubleValue()); }
+
+double Number::doubleValue() const {
+  if (isReal()) return real();
+  if (type_ == Type::unsignedInteger) return static_cast<double>(bits_);
+  return static_cast<double>(static_cast<std::int64_t>(bits_));
+}
+
+bool Number::boolValue() const { return isReal() ? real() != 0 : bits_ != 0; }
+
+Date& Date::nothing() { return nothingAs<Date>(); }
+
+ValueRef<Date> Date::make(double secondsSinceReferenceDate) {
+  return Counted<Date>::adopt(new (Trailing{0}) Date(secondsSinceReferenceDate));
+}
+
+Data& Data::nothing() { return nothingAs<Data>(); }
+
+Data::Data(std::string_view bytes) : Value(Kind::data), size_(bytes.size()) {
+  copyBehind(this, sizeof *this, bytes);
+}
+
+ValueRef<Data> Data::make(std::string_view bytes) {
+  return Counted<Data>::adopt(new (Trailing{bytes.size()}) Data(bytes));
+}
+
+Null& Null::nothing() { return nothingAs<Null>(); }
+ValueRef<Null> Null::make() { return Counted<Null>::adopt(new (Trailing{0}) Null(Kind::null)); }
+
+Uid& Uid::nothing() { return nothingAs<Uid>(); }
+ValueRef<Uid> Uid::make(std::uint32_t number) {
+  return Counted<Uid>::adopt(new (Trailing{0}) Uid(number));
+}
+
+namespace {
+
+template <class T>
+ValueRef<T> asKind(const ValueRef<>& value, Value::Kind kind) {
+  if (value->kind() != kind) return nullptr;
+  return Counted<T>::share(static_cast<T*>(value.pointer().get()));
+}
+
+}  // namespace
+
+ValueRef<String> asString(const ValueRef<>& value) {
+  return asKind<String>(value, Value::Kind::string);
+}
+
+ValueRef<Number> asNumber(const ValueRef<>& value) {
+  return asKind<Number>(value, Value::Kind::number);
+}
+
+}  // namespace toolkit

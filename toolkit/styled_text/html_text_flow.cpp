@@ -1,0 +1,82 @@
+// White space and lines.
+#include "toolkit/styled_text/html_text_flow.hpp"
+
+#include "toolkit/styled_text/html_words.hpp"
+
+namespace toolkit::html {
+
+void TextFlow::addText(std::string_view text, const Style& style) {
+  append(style.preformatted ? withPlainLineEnds(text) : collapsed(text), style);
+}
+
+void TextFlow::addCharacters(std::string_view characters, const Style& style) {
+  append(characters, style, End::character);
+}
+
+void TextFlow::addMarker(std::string_view marker, const Style& style) {
+  hanging_ = true;
+  append('\t' + std::string(marker) + '\t', style, End::opening);
+}
+
+void TextFlow::addCellTab(const Style& style) { append("\t", style, End::opening); }
+
+void TextFlow::breakLine(bool withinParagraph, const Style& style) {
+  if (withinParagraph) {
+    append("\u2028", style, End::lineSeparator);
+  } else {
+    append("\n", style, End::newLine);
+  }
+}
+
+void TextFlow::startBlock(const Style& style) {
+  if (end_ != End::opening) endLine(style);
+}
+
+void TextFlow::endLine(const Style& style) {
+  if (end_ != End::newLine) append("\n", style, End::newLine);
+}
+
+/// `text` without the white space that does not count, which `end_` tells and is kept up to date
+/// for.
+std::string_view TextFlow::collapsed(std::string_view text) {
+  scratch_.clear();
+  for (const char c : text) {
+    if (!isSpace(c)) {
+      scratch_ += c;
+      end_ = End::character;
+    } else if (end_ == End::character) {
+      scratch_ += ' ';
+      end_ = End::space;
+    }
+  }
+  return scratch_;
+}
+
+/// `text`, which stays as it is, except that every line end is a new line.
+std::string_view TextFlow::withPlainLineEnds(std::string_view text) {
+  scratch_.clear();
+  for (std::size_t i = 0; i < text.size(); ++i) {
+    const bool pair = text.substr(i, 2) == "\r\n";
+    if (!pair) scratch_ += text[i] == '\r' ? '\n' : text[i];
+  }
+  if (!text.empty()) end_ = scratch_.back() == '\n' ? End::newLine : End::character;
+  return scratch_;
+}
+
+void TextFlow::append(std::string_view text, const Style& style, End end) {
+  append(text, style);
+  end_ = end;
+}
+
+void TextFlow::append(std::string_view text, const Style& style) {
+  if (hanging_) {
+    const std::string_view line = text.substr(0, text.find('\n'));
+    hanging_ = line.size() == text.size();
+    const std::string_view first = text.substr(0, line.size() + (hanging_ ? 0 : 1));
+    text_.append(first, textAttributes(style, true));
+    text.remove_prefix(first.size());
+  }
+  if (!text.empty()) text_.append(text, textAttributes(style, false));
+}
+
+}  // namespace toolkit::html

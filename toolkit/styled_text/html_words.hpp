@@ -1,0 +1,83 @@
+// Small tools for the words of HTML and CSS: ASCII letters without regard to case, numbers without
+// regard to locale.
+#pragma once
+
+#include <charconv>
+#include <cstdint>
+#include <optional>
+#include <string>
+#include <string_view>
+
+namespace toolkit::html {
+
+/// White space as HTML knows it.
+constexpr bool isSpace(char c) {
+  return c == ' ' || c == '\t' || c == '\n' || c == '\r' || c == '\f';
+}
+
+constexpr bool isDigit(char c) { return c >= '0' && c <= '9'; }
+
+constexpr char lowered(char c) {
+  return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+}
+
+constexpr bool isLetter(char c) { return lowered(c) >= 'a' && lowered(c) <= 'z'; }
+
+inline std::string lowered(std::string_view text) {
+  std::string result(text);
+  for (char& c : result) c = lowered(c);
+  return result;
+}
+
+constexpr std::string_view trimmed(std::string_view text) {
+  while (!text.empty() && isSpace(text.front())) text.remove_prefix(1);
+  while (!text.empty() && isSpace(text.back())) text.remove_suffix(1);
+  return text;
+}
+
+/// Cuts off, and returns, what stands in front of the first `separator`: all, where there is none.
+constexpr std::string_view takeUntil(std::string_view& text, char separator) {
+  const std::size_t end = text.find(separator);
+  const std::string_view part = text.substr(0, end);
+  text.remove_prefix(end == std::string_view::npos ? text.size() : end + 1);
+  return part;
+}
+
+/// Cuts off, and returns, the first word, with the white space around it.
+constexpr std::string_view takeWord(std::string_view& text) {
+  text = trimmed(text);
+  std::size_t end = 0;
+  while (end < text.size() && !isSpace(text[end])) ++end;
+  const std::string_view word = text.substr(0, end);
+  text = trimmed(text.substr(end));
+  return word;
+}
+
+/// Cuts off, and returns, the decimal number that `text` begins with, as in "-1.5em".
+inline std::optional<double> takeNumber(std::string_view& text) {
+  std::string_view digits = text;
+  if (digits.starts_with('+')) digits.remove_prefix(1);
+  const std::string_view unsignedDigits =
+      digits.starts_with('-') && digits.size() == text.size() ? digits.substr(1) : digits;
+  // Without this from_chars would read "inf" and "nan".
+  if (unsignedDigits.empty() || (!isDigit(unsignedDigits.front()) && unsignedDigits.front() != '.'))
+    return std::nullopt;
+  double number = 0;
+  const auto [end, error] = std::from_chars(digits.data(), digits.data() + digits.size(), number,
+                                            std::chars_format::fixed);
+  if (error != std::errc()) return std::nullopt;
+  text.remove_prefix(static_cast<std::size_t>(end - text.data()));
+  return number;
+}
+
+/// The integer that an attribute's value begins with; absent where none does or it is beyond 32
+/// bits.
+inline std::optional<std::int32_t> leadingInteger(std::string_view text) {
+  text = trimmed(text);
+  if (text.starts_with('+')) text.remove_prefix(1);
+  std::int32_t number = 0;
+  const auto error = std::from_chars(text.data(), text.data() + text.size(), number).ec;
+  return error == std::errc() ? std::optional(number) : std::nullopt;
+}
+
+}  // namespace toolkit::html

@@ -1,0 +1,99 @@
+#include "tools/endless_chains.hpp"
+
+#include <algorithm>
+#include <optional>
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "engine/tag_key.hpp"
+#include "toolkit/uppercase.hpp"
+
+namespace tools {
+
+namespace {
+
+using Keys = std::vector<std::string>;
+using Graph = std::map<std::string, Keys, std::less<>>;
+
+// The key that an element chains to, where it does.
+std::optional<std::string> target(const toolkit::ValueRef<>& element, const std::string& own) {
+  const std::string& chain = QZ_PLIST_STATE_PARSER_PROCESS_COMMANDS_FOR_ID;
+  if (const auto simple = toolkit::asString(element)) {
+    return simple->text() == chain ? std::optional(own) : std::nullopt;
+  }
+  const auto compound = toolkit::asArray(element);
+  if (compound->count() < 2) return std::nullopt;
+  const auto name = toolkit::asString(compound->elements()[0]);
+  if (!name || toolkit::uppercased(name->text()) != chain) return std::nullopt;
+  try {
+    return tagKey(compound->elements()[1]->intValue());
+  } catch (const toolkit::Exception&) {
+    return std::nullopt;  // no tag: the run goes on with the next element
+  }
+}
+
+Graph chainsOf(const toolkit::ValueRef<toolkit::Dictionary>& script) {
+  Graph graph;
+  for (const auto& [key, list] : script->entries()) {
+    const auto name = toolkit::asString(key);
+    if (!name) continue;
+    Keys& targets = graph[std::string(name->text())];
+    const auto elements = toolkit::asArray(list);
+    for (const auto& element : elements->elements()) {
+      if (auto to = target(element, std::string(name->text()))) targets.push_back(*std::move(to));
+    }
+  }
+  return graph;
+}
+
+// Takes out the lists that come to their end: those that chain to none but such lists.
+void removeEndingLists(Graph& graph) {
+  std::map<std::string, Keys, std::less<>> callers;
+  std::map<std::string, std::size_t, std::less<>> open;  // chains to lists not yet known to end
+  Keys ending;
+  for (const auto& [key, targets] : graph) {
+    for (const auto& to : targets) {
+      if (!graph.contains(to)) continue;
+      callers[to].push_back(key);
+      ++open[key];
+    }
+    if (!open.contains(key)) ending.push_back(key);
+  }
+  while (!ending.empty()) {
+    const std::string key = ending.back();
+    ending.pop_back();
+    for (const auto& caller : callers[key]) {
+      if (--open[caller] == 0) ending.push_back(caller);
+    }
+    graph.erase(key);
+  }
+}
+
+}  // namespace
+
+EndlessChains endlessChains(const toolkit::ValueRef<toolkit::Dictionary>& script) {
+  Graph graph = chainsOf(script);
+  removeEndingLists(graph);
+  EndlessChains chains;
+  for (const auto& [start, unused] : graph) {
+    Keys path;
+    std::map<std::string, std::size_t, std::less<>> placeInPath;
+    std::string key = start;
+    while (!chains.loopOf.contains(key) && !placeInPath.contains(key)) {
+      placeInPath[key] = path.size();
+      path.push_back(key);
+      const Keys& targets = graph[key];
+      key = *std::find_if(targets.begin(), targets.end(),
+                          [&](const auto& to) { return graph.contains(to); });
+    }
+    if (!chains.loopOf.contains(key)) {
+      std::string loop;
+      for (std::size_t i = placeInPath[key]; i < path.size(); ++i) loop += path[i] + " -> ";
+      chains.loops.push_back(loop + key);
+      chains.loopOf[key] = chains.loops.size() - 1;
+    }
+    for (const auto& passed : path) chains.loopOf[passed] = chains.loopOf[key];
+  }
+  return chains;
+}
+
+}  // namespace tools

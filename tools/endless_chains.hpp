@@ -1,0 +1,28 @@
+// Endless chains: lists of a script that run each other without end.
+//
+// The engine sets no limit to chaining, so such a script exhausts the stack. Which lists do is
+// known beforehand, as a run takes every list from its first element to its last: of a list that
+// chains to some that come back and some that do not, the first that does not is where the run
+// stays.
+#pragma once
+
+#include <cstddef>
+#include <map>
+#include <string>
+#include <vector>
+
+#include "toolkit/property_list/collections.hpp"
+
+namespace tools {
+
+struct EndlessChains {
+  /// Each loop once, as its lists' keys in the order in which they run: "3 -> 7 -> 3".
+  std::vector<std::string> loops;
+  /// For every list that never comes to its end, the loop (by its place in `loops`) it ends up in.
+  std::map<std::string, std::size_t, std::less<>> loopOf;
+};
+
+/// The endless chains of a script; what in it is no list chains to nothing.
+EndlessChains endlessChains(const toolkit::ValueRef<toolkit::Dictionary>& script);
+
+}  // namespace tools

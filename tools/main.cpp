@@ -1,0 +1,12 @@
+// qz-walkthrough: plays and tests scripted walk-throughs.
+#include <string>
+#include <vector>
+
+#include "tools/play_command.hpp"
+#include "tools/shell.hpp"
+#include "tools/test_command.hpp"
+
+int main(int argc, char** argv) {
+  const std::vector<std::string> arguments(argv + (argc > 0 ? 1 : 0), argv + argc);
+  return tools::runTool(arguments, {tools::addPlayCommand, tools::addTestCommand});
+}

@@ -1,0 +1,135 @@
+// The host's window that a walk-through is played over.
+#include "tools/play/host_window.hpp"
+
+#include <cstddef>
+
+#include "toolkit/property_list/collections.hpp"
+#include "toolkit/property_list/scalars.hpp"
+#include "tools/failure.hpp"
+#include "tools/play/input_file.hpp"
+#include "tools/play/plist_entry.hpp"
+#include "tools/play/text_layout.hpp"
+#include "tools/play/words.hpp"
+#include "tools/scenario/near_miss.hpp"
+#include "tools/view_kinds.hpp"
+
+namespace tools::play {
+namespace {
+
+using toolkit::State;
+using toolkit::ViewKind;
+
+bool isWindow(const toolkit::ValueRef<>& entry) {
+  const auto name = toolkit::asString(toolkit::asDictionary(entry)->objectForKey("class"));
+  return name->text() == "NSWindow";
+}
+
+void readWindow(const PlistEntry& entry, HostWindow& host) {
+  entry.expectOnly({"class", "frame", "title"});
+  host.title = entry.text("title");
+  host.content = entry.requiredRect("frame");
+}
+
+ViewKind readKind(const PlistEntry& entry) {
+  const std::string name = entry.requiredText("class");
+  if (name == "NSWindow") entry.fail("class", "a control (the window is the first entry)");
+  const auto kind = viewKindNamed(name);
+  if (!kind) {
+    std::string names = "one of NSWindow";
+    for (const std::string_view known : viewKindNames()) names.append(", ").append(known);
+    entry.fail("class", names);
+  }
+  return *kind;
+}
+
+State readState(const PlistEntry& entry, ViewKind kind) {
+  if (!entry.has("state")) return State::off;
+  const std::string name = entry.text("state");
+  if (name == "on") return State::on;
+  if (name == "mixed" && kind == ViewKind::mixed) return State::mixed;
+  if (name != "off") {
+    entry.fail("state", kind == ViewKind::mixed ? "“on”, “off” or “mixed”" : "“on” or “off”");
+  }
+  return State::off;
+}
+
+/// The keys that an entry of the kind may have: a caption only where the kind shows one, a state
+/// only where it has one.
+std::vector<std::string_view> keysOf(ViewKind kind) {
+  std::vector<std::string_view> keys = {"class", "tag", "frame", "hidden", "toolTip"};
+  if (kind == ViewKind::imageView) keys.push_back("image");
+  if (isButton(kind) || kind == ViewKind::textField) keys.push_back("title");
+  if (isButton(kind)) keys.push_back("state");
+  if (kind != ViewKind::plain && kind != ViewKind::box) keys.push_back("enabled");
+  return keys;
+}
+
+HostControl readControl(const PlistEntry& entry) {
+  HostControl control;
+  control.kind = readKind(entry);
+  entry.expectOnly(keysOf(control.kind));
+  control.tag = entry.integer("tag");
+  control.frame = entry.requiredRect("frame");
+  const std::string_view captionKey = control.kind == ViewKind::imageView ? "image" : "title";
+  if (entry.has(captionKey)) control.caption = entry.text(captionKey);
+  control.hidden = entry.flag("hidden", false);
+  control.enabled = entry.flag("enabled", true);
+  control.state = readState(entry, control.kind);
+  control.toolTip = entry.text("toolTip");
+  return control;
+}
+
+void expectImage(toolkit::Toolkit& toolkit, std::string_view name, std::string_view file) {
+  if (toolkit.images().imageNamed(name)) return;
+  throw Failure(ExitStatus::badInput, std::string(file) + ": image " + quote(name) +
+                                          ": expected an image of this name in " +
+                                          toolkit.files().resourcePath());
+}
+
+void makeControl(toolkit::TestDriver& driver, const HostControl& control,
+                 const toolkit::Ref<toolkit::View>& parent) {
+  const auto view = driver.makeView(control.kind, control.tag, control.frame, parent);
+  if (control.caption) driver.setCaption(view, *control.caption);
+  view->setHidden(control.hidden);
+  // A view that is no control does not understand being disabled.
+  if (!control.enabled) view->setEnabled(false);
+  toolkit::asButton(view)->setState(control.state);
+  if (!control.toolTip.empty()) view->setToolTip(control.toolTip);
+}
+
+}  // namespace
+
+HostWindow parseHostWindow(const toolkit::ValueRef<>& root, std::string_view file) {
+  const auto entries = toolkit::asArray(root);
+  if (!entries) {
+    throw Failure(ExitStatus::badInput,
+                  std::string(file) + ": expected an array of controls, found " + foundWords(root));
+  }
+  HostWindow host;
+  for (std::size_t i = 0; i < entries->count(); ++i) {
+    const auto value = entries->objectAtIndex(i);
+    const PlistEntry entry(file, "entry " + std::to_string(i + 1), value);
+    if (i == 0 && isWindow(value)) {
+      readWindow(entry, host);
+    } else {
+      host.controls.push_back(readControl(entry));
+    }
+  }
+  return host;
+}
+
+toolkit::Ref<toolkit::Window> makeHostWindow(toolkit::TestDriver& driver, const HostWindow& host,
+                                             std::string_view file) {
+  for (const HostControl& control : host.controls) {
+    if (control.kind == ViewKind::imageView && control.caption) {
+      expectImage(driver.toolkit(), *control.caption, file);
+    }
+  }
+  const auto window = driver.makeWindow(host.content);
+  for (const HostControl& control : host.controls) {
+    makeControl(driver, control, window->contentView());
+  }
+  return window;
+}
+
+}  // namespace tools::play

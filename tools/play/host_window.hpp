@@ -1,0 +1,42 @@
+// The host's window that a walk-through is played over, and the file that describes it: an array of
+// controls. docs/host-windows.md has the format.
+#pragma once
+
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "toolkit/geometry.hpp"
+#include "toolkit/property_list/value.hpp"
+#include "toolkit/test_driver.hpp"
+
+namespace tools::play {
+
+struct HostControl {
+  toolkit::ViewKind kind = toolkit::ViewKind::plain;
+  long tag = 0;
+  toolkit::Rect frame;
+  /// The title of a button, the text of a field, the name of an image; absent: the toolkit's own.
+  std::optional<std::string> caption;
+  bool hidden = false;
+  bool enabled = true;
+  toolkit::State state = toolkit::State::off;
+  std::string toolTip;
+};
+
+struct HostWindow {
+  std::string title;
+  toolkit::Rect content{100, 100, 640, 480};  ///< on the screen
+  std::vector<HostControl> controls;          ///< back to front
+};
+
+/// The window that `root` describes. A Failure that begins with `file` says which entry is wrong,
+/// counted from 1.
+HostWindow parseHostWindow(const toolkit::ValueRef<>& root, std::string_view file);
+
+/// Puts the window on the driver's screen. A Failure when one of its images is not known.
+toolkit::Ref<toolkit::Window> makeHostWindow(toolkit::TestDriver& driver, const HostWindow& host,
+                                             std::string_view file);
+
+}  // namespace tools::play

@@ -1,0 +1,163 @@
+// What changed from one picture of a walk-through to the next.
+//
+// Each thing pictured is put into a list of facts, always the same ones in the same order; two
+// lists are then compared line by line.
+#include "tools/play/picture_diff.hpp"
+
+#include <algorithm>
+#include <cstddef>
+#include <map>
+#include <utility>
+
+#include "tools/play/text_layout.hpp"
+#include "tools/play/words.hpp"
+
+namespace tools::play {
+namespace {
+
+struct Fact {
+  std::string what;
+  std::string value;
+};
+
+using Facts = std::vector<Fact>;
+
+std::string yesOrNo(bool value) { return value ? "yes" : "no"; }
+
+std::string quotedOrNone(const std::optional<std::string>& text) {
+  return text ? quote(*text) : "none";
+}
+
+std::string rectWords(const toolkit::Rect& rect) {
+  return numberWords(rect.width) + " × " + numberWords(rect.height) + " at " + numberWords(rect.x) +
+         ", " + numberWords(rect.y);
+}
+
+Facts factsOf(const ControlPicture& control) {
+  const toolkit::ViewPicture& view = control.view;
+  return {{"tag", std::to_string(view.tag)},
+          {"frame", rectWords(view.frame)},
+          {"title", quote(view.title.string())},
+          {"text", quote(view.text.string())},
+          {"image", quotedOrNone(view.image)},
+          {"hidden", yesOrNo(view.hidden)},
+          {"enabled", yesOrNo(view.enabled)},
+          {"state", std::string(stateWord(view.state))},
+          {"flashing", yesOrNo(control.flashing)},
+          {"highlighted", yesOrNo(view.highlighted)},
+          {"background", view.background ? colorWords(*view.background) : "none"},
+          {"tooltip", view.toolTip.empty() ? "none" : quote(view.toolTip)}};
+}
+
+Facts factsOf(const std::optional<toolkit::WindowPicture>& window) {
+  const toolkit::WindowPicture shown = window.value_or(toolkit::WindowPicture{});
+  return {{"window", window ? "there" : "none"},
+          {"rectangle", rectWords(shown.content)},
+          {"on the screen", yesOrNo(shown.visible)},
+          {"times closed", std::to_string(shown.closes)},
+          {"sheet", yesOrNo(static_cast<bool>(shown.sheetOf))},
+          {"background", colorWords(shown.background)},
+          {"background image", quotedOrNone(shown.layerImage)}};
+}
+
+Facts factsOf(const StepPicture& picture) {
+  return {{"list started last", picture.lastList.value_or("none")},
+          {"flashing allowed", yesOrNo(picture.flashingAllowed)},
+          {"walk-through ended", yesOrNo(picture.ended)}};
+}
+
+std::vector<Change> compare(const Facts& before, const Facts& now) {
+  std::vector<Change> changes;
+  for (std::size_t i = 0; i < now.size(); ++i) {
+    if (before[i].value == now[i].value) continue;
+    changes.push_back({now[i].what, before[i].value, now[i].value});
+  }
+  return changes;
+}
+
+/// The attributes of a text from its start to its end, with the pieces of text that they hold over
+/// or without.
+std::string runWords(const toolkit::AttributedString& text, bool withText) {
+  if (text.runs().size() == 1) return styleWords(text.runs().front().attributes);
+  std::string words;
+  for (const auto& [range, attributes] : text.runs()) {
+    if (!words.empty()) words += "; ";
+    if (withText) words += quote(text.string().substr(range.location, range.length)) + " ";
+    words += styleWords(attributes);
+  }
+  return words.empty() ? "plain" : words;
+}
+
+/// How the styling changed. A text that is another now is quoted already; its pieces would only
+/// repeat it.
+void compareStyles(const toolkit::AttributedString& before, const toolkit::AttributedString& now,
+                   std::vector<Change>& changes) {
+  const bool sameText = before.string() == now.string();
+  if (sameText && before == now) return;
+  const Change change = {"style", runWords(before, sameText), runWords(now, sameText)};
+  if (change.before != change.now) changes.push_back(change);
+}
+
+bool isSame(const std::weak_ptr<const void>& a, const std::weak_ptr<const void>& b) {
+  return !a.owner_before(b) && !b.owner_before(a);
+}
+
+const ControlPicture* find(const ControlPicture& control, const StepPicture& picture) {
+  const auto found = std::find_if(
+      picture.controls.begin(), picture.controls.end(),
+      [&control](const ControlPicture& c) { return isSame(c.identity, control.identity); });
+  return found == picture.controls.end() ? nullptr : &*found;
+}
+
+ControlChanges compareControl(const ControlPicture* before, const ControlPicture& now) {
+  if (before == nullptr) return {true, {}};
+  ControlChanges result{false, compare(factsOf(*before), factsOf(now))};
+  compareStyles(before->view.title, now.view.title, result.changes);
+  compareStyles(before->view.text, now.view.text, result.changes);
+  return result;
+}
+
+/// The timers of both pictures by key: before and now.
+auto pairUp(const StepPicture& before, const StepPicture& now) {
+  std::map<std::string, std::pair<const TimerPicture*, const TimerPicture*>> pairs;
+  for (const TimerPicture& timer : before.timers) pairs[timer.key].first = &timer;
+  for (const TimerPicture& timer : now.timers) pairs[timer.key].second = &timer;
+  return pairs;
+}
+
+void compareTimers(const StepPicture& before, const StepPicture& now,
+                   std::vector<Change>& changes) {
+  for (const auto& [key, pair] : pairUp(before, now)) {
+    const auto [old, current] = pair;
+    if (old && current && isSame(old->identity, current->identity)) continue;
+    const auto words = [](const TimerPicture* timer) {
+      return timer ? secondsWords(timer->timeLeft) + " left" : "none";
+    };
+    changes.push_back({"timer of list " + key, words(old), words(current)});
+  }
+}
+
+}  // namespace
+
+bool PictureChanges::none() const {
+  return window.empty() && gone.empty() && engine.empty() &&
+         std::none_of(controls.begin(), controls.end(), [](const ControlChanges& control) {
+           return control.isNew || !control.changes.empty();
+         });
+}
+
+PictureChanges diffPictures(const StepPicture& before, const StepPicture& now) {
+  PictureChanges changes;
+  changes.window = compare(factsOf(before.window), factsOf(now.window));
+  for (const ControlPicture& control : now.controls) {
+    changes.controls.push_back(compareControl(find(control, before), control));
+  }
+  for (const ControlPicture& control : before.controls) {
+    if (!find(control, now)) changes.gone.push_back(control);
+  }
+  changes.engine = compare(factsOf(before), factsOf(now));
+  compareTimers(before, now, changes.engine);
+  return changes;
+}
+
+}  // namespace tools::play

@@ -1,0 +1,128 @@
+// Playing a script, from reading it to the end of the transcript.
+#include "tools/play/play.hpp"
+
+#include <algorithm>
+#include <filesystem>
+#include <istream>
+#include <memory>
+#include <ostream>
+
+#include "toolkit/property_list/collections.hpp"
+#include "toolkit/property_list/number_conversion.hpp"
+#include "tools/drivers.hpp"
+#include "tools/play/input_file.hpp"
+#include "tools/play/pressing.hpp"
+#include "tools/play/prompt.hpp"
+#include "tools/play/session.hpp"
+#include "tools/play/stage.hpp"
+#include "tools/play/text_layout.hpp"
+
+namespace tools::play {
+namespace {
+
+namespace fs = std::filesystem;
+
+using Script = toolkit::ValueRef<toolkit::Dictionary>;
+
+/// The script's keys in the order of their tags.
+std::vector<std::string> sortedKeys(const Script& script) {
+  std::vector<std::string> keys = script->allKeys();
+  std::stable_sort(keys.begin(), keys.end(), [](const std::string& a, const std::string& b) {
+    return toolkit::integerValueOf(a) < toolkit::integerValueOf(b);
+  });
+  return keys;
+}
+
+std::string listOfKeys(const Script& script) {
+  std::string list;
+  for (const std::string& key : sortedKeys(script)) {
+    list.append(list.empty() ? "" : ", ").append(printable(key));
+  }
+  return list;
+}
+
+/// Fails unless the script has a list to start with.
+void checkStart(const Script& script, const PlayOptions& options) {
+  const std::string& file = options.script;
+  if (script->allKeys().empty()) {
+    throw Failure(ExitStatus::failed, file + ": expected at least one list, found an empty script");
+  }
+  std::string key = options.startKey;
+  // The engine's own rule: the smallest tag as a number, and its list under the decimal form.
+  if (key.empty()) key = std::to_string(toolkit::intValueOf(sortedKeys(script).front()));
+  const auto list = script->objectForKey(key);
+  if (!list) {
+    throw Failure(ExitStatus::failed, file + ": no list under the start key " + quote(key) +
+                                          "; expected one of " + listOfKeys(script));
+  }
+  if (!toolkit::asArray(list)) {
+    throw Failure(ExitStatus::badInput, file + ": start key " + quote(key) +
+                                            ": expected a list of commands, found " +
+                                            foundWords(list));
+  }
+}
+
+void checkDirectory(const std::string& path) {
+  std::error_code error;
+  if (fs::is_directory(path, error)) return;
+  throw Failure(ExitStatus::badInput, path + ": no such directory; expected one with images");
+}
+
+/// Asks for one step after the other until the walk-through ends or the user quits.
+void playInteractively(Session& session, const Terminal& terminal) {
+  std::string line;
+  while (!session.picture().ended) {
+    terminal.out << '\n' << promptText << std::flush;
+    if (!std::getline(terminal.in, line)) {
+      terminal.out << '\n';
+      return;
+    }
+    const Request request = parseRequest(line);
+    if (std::holds_alternative<Quit>(request)) return;
+    if (const auto* pressed = std::get_if<Press>(&request)) {
+      const auto reason = whyNotPress(session.picture(), pressed->tag);
+      if (reason) {
+        terminal.out << "  " << *reason << '\n';
+      } else {
+        session.perform(*pressed);
+      }
+    } else if (const auto* passed = std::get_if<Advance>(&request)) {
+      session.perform(*passed);
+    } else if (const auto* unclear = std::get_if<Unclear>(&request)) {
+      terminal.out << "  " << unclear->hint << '\n';
+    } else {
+      terminal.out << promptHelp;
+    }
+  }
+}
+
+/// Hands the engine's log lines on, each below what the transcript already shows.
+void connectLog(toolkit::TestDriver& driver, const Terminal& terminal) {
+  driver.setLogSink([&terminal](std::string_view line) {
+    terminal.out << std::flush;
+    terminal.log << printable(line) << std::endl;
+  });
+}
+
+}  // namespace
+
+ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
+  const Script script = readDictionaryFile(options.script, "a script");
+  checkStart(script, options);
+  const fs::path path = fs::absolute(options.script);
+  if (options.resources) checkDirectory(*options.resources);
+
+  const auto driver = makeDriver(options.toolkit);
+  driver->setResourcePath(options.resources ? *options.resources : path.parent_path().string());
+  connectLog(*driver, terminal);
+  Stage stage(*driver, options, script);
+  Session session(*driver, stage, terminal.out, terminal.style);
+
+  session.start(path.string(), options.startKey);
+  for (const Step& step : options.steps) session.perform(step);
+  if (options.steps.empty() && terminal.interactive) playInteractively(session, terminal);
+  session.conclude();
+  return session.failed() ? ExitStatus::failed : ExitStatus::fine;
+}
+
+}  // namespace tools::play

@@ -1,0 +1,85 @@
+// What a user can press, and where the walk-through stands.
+#include "tools/play/pressing.hpp"
+
+#include <algorithm>
+#include <vector>
+
+#include "tools/play/text_layout.hpp"
+#include "tools/play/words.hpp"
+
+namespace tools::play {
+namespace {
+
+bool canBePressed(const ControlPicture& control) {
+  return isButton(control.view.kind) && !control.view.hidden && control.view.enabled &&
+         !control.shadowed;
+}
+
+/// "1", "1 or 2", "1, 2 or 3".
+std::string alternatives(const std::vector<std::string>& items) {
+  std::string words;
+  for (std::size_t i = 0; i < items.size(); ++i) {
+    if (i > 0) words += i + 1 == items.size() ? " or " : ", ";
+    words += items[i];
+  }
+  return words;
+}
+
+std::string pressableWords(const StepPicture& picture) {
+  std::vector<std::string> buttons;
+  for (const ControlPicture& control : picture.controls) {
+    if (canBePressed(control)) buttons.push_back(pressWords(picture, control.view.tag));
+  }
+  return buttons.empty() ? "; no button can be pressed" : "; press " + alternatives(buttons);
+}
+
+}  // namespace
+
+const ControlPicture* controlWithTag(const StepPicture& picture, long tag) {
+  const auto found =
+      std::find_if(picture.controls.begin(), picture.controls.end(),
+                   [tag](const ControlPicture& control) { return control.view.tag == tag; });
+  return found == picture.controls.end() ? nullptr : &*found;
+}
+
+std::string pressWords(const StepPicture& picture, long tag) {
+  const std::string words = std::to_string(tag);
+  const ControlPicture* control = controlWithTag(picture, tag);
+  if (!control || !isButton(control->view.kind)) return words;
+  const std::string title = contentOf(*control);
+  const std::string firstLine = title.substr(0, title.find('\n'));
+  return firstLine.empty() ? words : words + " (" + firstLine + ")";
+}
+
+std::optional<std::string> whyNotPress(const StepPicture& picture, long tag) {
+  if (picture.ended) return "the walk-through has ended";
+  if (!picture.window || !picture.window->visible) return "the window is not on the screen";
+  const std::string name = std::to_string(tag);
+  const ControlPicture* control = controlWithTag(picture, tag);
+  if (!control) return "no control has the tag " + name + pressableWords(picture);
+  if (canBePressed(*control)) return std::nullopt;
+  const auto is = [&](std::string_view what) {
+    return "control " + name + " is " + std::string(what) + pressableWords(picture);
+  };
+  if (!isButton(control->view.kind)) return is("no button");
+  return is(control->view.hidden ? "hidden" : "disabled");
+}
+
+std::string standing(const StepPicture& picture) {
+  if (picture.ended) return "The walk-through ended.";
+  std::vector<std::string> ways;
+  std::vector<std::string> buttons;
+  for (const ControlPicture& control : picture.controls) {
+    const bool moves = control.hasList && canBePressed(control);
+    if (moves) buttons.push_back(pressWords(picture, control.view.tag));
+  }
+  if (!buttons.empty()) ways.push_back("a press of " + alternatives(buttons));
+  for (const TimerPicture& timer : picture.timers) {
+    ways.push_back("list " + timer.key + " to run in " + secondsWords(timer.timeLeft));
+  }
+  if (!ways.empty()) return "The walk-through waits for " + alternatives(ways) + ".";
+  return "The walk-through stands still: no timer is pending, and no button that can be pressed "
+         "has a list.";
+}
+
+}  // namespace tools::play

@@ -1,0 +1,62 @@
+// What a walk-through is played on.
+#include "tools/play/stage.hpp"
+
+#include "tools/play/gui_description.hpp"
+#include "tools/play/input_file.hpp"
+#include "tools/play/stand_in.hpp"
+
+namespace tools::play {
+namespace {
+
+constexpr toolkit::Rect parentContent{80, 80, 800, 600};
+
+/// Takes the sheet away when it has ended, which is its delegate's part.
+class SheetRemover final : public toolkit::SheetDelegate {
+ public:
+  void sheetDidEnd(const toolkit::Ref<toolkit::Window>& sheet, long, void*) override {
+    sheet->orderOut();
+  }
+};
+
+}  // namespace
+
+Stage::Stage(toolkit::TestDriver& driver, const PlayOptions& options,
+             const QZ_Plist_State_Parser::Dictionary& script)
+    : driver_(driver), sheet_(options.sheet), delegate_(std::make_shared<SheetRemover>()) {
+  if (sheet_) parent_ = driver_.makeWindow(parentContent);
+  if (options.assets) {
+    buildFrom(*options.assets);
+  } else if (options.window) {
+    const auto root = readPropertyListFile(*options.window, "a host's window");
+    adopt(parseHostWindow(root, *options.window), *options.window);
+  } else {
+    adopt(standInWindow(script), options.script);
+  }
+}
+
+Stage::~Stage() {
+  if (!engine_ || engine_->terminating()) return;
+  driver_.setLogSink({});  // what is left to be tidied up is no part of the walk-through
+  engine_->terminateParser();
+}
+
+void Stage::buildFrom(const std::string& descriptionFile) {
+  const auto description = readDictionaryFile(descriptionFile, "a description of a window");
+  checkGuiDescription(description, descriptionFile);
+  engine_ = QZ_Plist_State_Parser::initWithWindow(driver_.toolkit(), parent_);
+  engine_->loadGuiAssets(description, nullptr);
+}
+
+void Stage::adopt(const HostWindow& host, const std::string& file) {
+  title_ = host.title;
+  adopted_ = makeHostWindow(driver_, host, file);
+  if (sheet_) adopted_->orderOut();  // it is not seen before it is attached
+  engine_ = QZ_Plist_State_Parser::initWithWindow(driver_.toolkit(), sheet_ ? parent_ : adopted_);
+  engine_->getGuiAssetsFromWindow(adopted_);
+}
+
+bool Stage::load(const std::string& script, const std::string& startKey) {
+  return engine_->loadPlist(script, startKey, delegate_, sheet_);
+}
+
+}  // namespace tools::play

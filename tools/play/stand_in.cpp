@@ -1,0 +1,108 @@
+// A window for a script that is played without one: guesses each tag's kind from what the script
+// does with it.
+#include "tools/play/stand_in.hpp"
+
+#include <map>
+#include <string>
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "toolkit/property_list/scalars.hpp"
+#include "toolkit/uppercase.hpp"
+#include "tools/play/whole_number.hpp"
+
+namespace tools::play {
+namespace {
+
+using toolkit::ViewKind;
+
+/// Which element of a compound command is a tag, and what the command takes the control for.
+struct TagUse {
+  const std::string& command;
+  std::size_t element;
+  ViewKind kind;
+};
+
+constexpr auto anything = ViewKind::textField;
+
+const TagUse tagUses[] = {
+    {QZ_PLIST_STATE_PARSER_LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID, 2, ViewKind::imageView},
+    {QZ_PLIST_STATE_PARSER_SET_STATE_ON_FOR_OBJECT_ID, 1, ViewKind::toggle},
+    {QZ_PLIST_STATE_PARSER_SET_STATE_OFF_FOR_OBJECT_ID, 1, ViewKind::toggle},
+    {QZ_PLIST_STATE_PARSER_FLASH_ID, 2, ViewKind::button},
+    {QZ_PLIST_STATE_PARSER_SET_TITLE_FOR_OBJECT_ID, 2, ViewKind::button},
+    {QZ_PLIST_STATE_PARSER_SET_BACKGROUND_COLOR_FOR_OBJECT_ID, 2, ViewKind::button},
+    {QZ_PLIST_STATE_PARSER_SET_FOREGROUND_COLOR_FOR_OBJECT_ID, 2, ViewKind::button},
+    {QZ_PLIST_STATE_PARSER_SET_TEXT_FOR_OBJECT_ID, 2, ViewKind::textField},
+    {QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID, 4,
+     ViewKind::textField},
+    {QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID,
+     4, ViewKind::textField},
+    {QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID,
+     5, ViewKind::textField},
+    {QZ_PLIST_STATE_PARSER_HIDE_OBJECT_WITH_ID, 1, anything},
+    {QZ_PLIST_STATE_PARSER_SHOW_OBJECT_WITH_ID, 1, anything},
+    {QZ_PLIST_STATE_PARSER_ENABLE_OBJECT_WITH_ID, 1, anything},
+    {QZ_PLIST_STATE_PARSER_DISABLE_OBJECT_WITH_ID, 1, anything},
+    {QZ_PLIST_STATE_PARSER_SET_TOOL_TIP_FOR_ID, 2, anything},
+    {QZ_PLIST_STATE_PARSER_SET_TAG_FOR_OBJECT_ID, 2, anything},
+    {QZ_PLIST_STATE_PARSER_SET_TAG_FOR_OBJECT_ID_WITH_TIMER, 2, anything},
+};
+
+/// The more a kind can do, the less it may be taken for another.
+int rank(ViewKind kind) {
+  if (kind == ViewKind::imageView) return 3;
+  if (kind == ViewKind::toggle) return 2;
+  return kind == ViewKind::button ? 1 : 0;
+}
+
+using Kinds = std::map<long, ViewKind>;
+
+void take(Kinds& kinds, long tag, ViewKind kind) {
+  const auto [place, isNew] = kinds.emplace(tag, kind);
+  if (!isNew && rank(kind) > rank(place->second)) place->second = kind;
+}
+
+void takeTargets(Kinds& kinds, const toolkit::ValueRef<toolkit::Array>& command) {
+  const auto name = toolkit::uppercased(toolkit::asString(command->objectAtIndex(0))->text());
+  for (const TagUse& use : tagUses) {
+    if (name != use.command || command->count() <= use.element) continue;
+    const auto tag = command->objectAtIndex(use.element);
+    if (toolkit::asString(tag) || toolkit::asNumber(tag)) take(kinds, tag->intValue(), use.kind);
+  }
+}
+
+Kinds kindsByTag(const toolkit::ValueRef<toolkit::Dictionary>& script) {
+  Kinds kinds;
+  for (const std::string& key : script->allKeys()) {
+    if (const auto tag = wholeNumber<long>(key)) take(kinds, *tag, ViewKind::button);
+    for (const auto& element : toolkit::asArray(script->objectForKey(key))->elements()) {
+      const auto command = toolkit::asArray(element);
+      if (command->count() > 0) takeTargets(kinds, command);
+    }
+  }
+  return kinds;
+}
+
+}  // namespace
+
+HostWindow standInWindow(const toolkit::ValueRef<toolkit::Dictionary>& script) {
+  constexpr double rowHeight = 30;
+  constexpr double controlHeight = 24;
+  const Kinds kinds = kindsByTag(script);
+  HostWindow host;
+  host.title = "stand-in";
+  host.content.height = rowHeight * static_cast<double>(kinds.size());
+  double y = host.content.height;
+  for (const auto& [tag, kind] : kinds) {
+    y -= rowHeight;
+    HostControl control;
+    control.kind = kind;
+    control.tag = tag;
+    control.frame = {0, y, host.content.width, controlHeight};
+    if (rank(kind) == 1 || rank(kind) == 2) control.caption = std::to_string(tag);
+    host.controls.push_back(control);
+  }
+  return host;
+}
+
+}  // namespace tools::play

@@ -1,0 +1,62 @@
+// Looking at a walk-through from outside.
+#include "tools/play/step_picture.hpp"
+
+#include <algorithm>
+#include <set>
+#include <utility>
+
+namespace tools::play {
+namespace {
+
+ControlPicture lookAtControl(toolkit::TestDriver& driver, const QZ_Plist_State_Parser& engine,
+                             const toolkit::Ref<toolkit::View>& view) {
+  const std::string key = std::to_string(view->tag());
+  ControlPicture picture;
+  picture.identity = view.pointer();
+  picture.view = driver.look(view);
+  picture.flashing = engine.flashing() && view->asButton() != nullptr &&
+                     engine.flashingTagIds()->objectForKey(key)->boolValue();
+  picture.hasList = static_cast<bool>(engine.plistDictionary()->objectForKey(key));
+  return picture;
+}
+
+std::vector<ControlPicture> lookAtControls(toolkit::TestDriver& driver,
+                                           const QZ_Plist_State_Parser& engine) {
+  std::vector<ControlPicture> controls;
+  std::set<long> tags;
+  const auto content = engine.tutorialWindow()->contentView();
+  for (const auto& view : content->subviews()) {
+    controls.push_back(lookAtControl(driver, engine, view));
+    controls.back().shadowed = !tags.insert(view->tag()).second;
+  }
+  return controls;
+}
+
+std::vector<TimerPicture> lookAtTimers(const QZ_Plist_State_Parser& engine) {
+  std::vector<TimerPicture> timers;
+  const auto table = engine.objectIdTimers();
+  for (const auto& [key, timer] : table->entries()) {
+    timers.push_back({timer.pointer(), key, timer->timeLeft()});
+  }
+  std::stable_sort(timers.begin(), timers.end(), [](const TimerPicture& a, const TimerPicture& b) {
+    return a.timeLeft < b.timeLeft;
+  });
+  return timers;
+}
+
+}  // namespace
+
+StepPicture takePicture(toolkit::TestDriver& driver, const QZ_Plist_State_Parser& engine,
+                        std::string title) {
+  StepPicture picture;
+  picture.title = std::move(title);
+  if (const auto window = engine.tutorialWindow()) picture.window = driver.look(window);
+  picture.controls = lookAtControls(driver, engine);
+  picture.timers = lookAtTimers(engine);
+  if (engine.lastTagId()) picture.lastList = engine.currentCommandState();
+  picture.flashingAllowed = engine.flashing();
+  picture.ended = engine.terminating();
+  return picture;
+}
+
+}  // namespace tools::play

@@ -1,0 +1,20 @@
+// Numbers that a text is as a whole.
+#pragma once
+
+#include <charconv>
+#include <optional>
+#include <string_view>
+#include <system_error>
+
+namespace tools::play {
+
+/// The number that `text` is from its first character to its last, or nothing.
+template <class T>
+std::optional<T> wholeNumber(std::string_view text) {
+  T number{};
+  const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
+  const bool whole = error == std::errc{} && end == text.data() + text.size();
+  return whole ? std::optional(number) : std::nullopt;
+}
+
+}  // namespace tools::play

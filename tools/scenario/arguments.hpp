@@ -1,0 +1,47 @@
+// The words of one statement, by the slots of its form.
+#pragma once
+
+#include <cstdint>
+#include <functional>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+#include "tools/scenario/lexer.hpp"
+
+namespace tools::scenario {
+
+struct Statement;
+
+class Arguments {
+ public:
+  /// `slot` is a slot of the form, or one of its own words. It outlives the arguments.
+  void add(std::string_view slot, Word word) { words_.emplace_back(slot, std::move(word)); }
+
+  bool has(std::string_view slot) const;
+  /// The word in a slot; asking for one that is not there is a mistake of ours.
+  const Word& word(std::string_view slot) const;
+  const std::string& text(std::string_view slot) const { return word(slot).text; }
+  std::vector<std::string> texts(std::string_view slot) const;
+
+  // Numbers; the parser has seen that they are such.
+  double number(std::string_view slot) const;
+  std::int64_t whole(std::string_view slot) const;
+  std::uint64_t unsignedWhole(std::string_view slot) const;
+
+  /// The statement that this one holds, of those that hold one.
+  const std::shared_ptr<const Statement>& nested() const { return nested_; }
+  void setNested(std::shared_ptr<const Statement> statement) { nested_ = std::move(statement); }
+
+  /// The same arguments with `change` made to every text, also within JSON, but not within the
+  /// statement that is held.
+  Arguments changed(const std::function<std::string(std::string)>& change) const;
+
+ private:
+  std::vector<std::pair<std::string_view, Word>> words_;
+  std::shared_ptr<const Statement> nested_;
+};
+
+}  // namespace tools::scenario

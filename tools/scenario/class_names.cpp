@@ -1,0 +1,54 @@
+// The names of the kinds of view.
+
+#include "tools/scenario/class_names.hpp"
+
+#include <algorithm>
+#include <cctype>
+
+#include "tools/view_kinds.hpp"
+
+namespace tools::scenario {
+namespace {
+
+bool isNameCharacter(char c) {
+  return c == '_' || std::isalnum(static_cast<unsigned char>(c)) != 0;
+}
+
+}  // namespace
+
+// Names that a toolkit gives to several kinds are the same from then on; so are theirs.
+ClassNames::ClassNames(const toolkit::TestDriver& driver) {
+  for (const auto name : viewKindNames()) {
+    const std::string standard(name.substr(0, name.find(':')));
+    const std::string own(driver.className(*viewKindNamed(name)));
+    const auto first = standsFor_.try_emplace(standard, standard).first->second;
+    const auto second = standsFor_.try_emplace(own, first).first->second;
+    for (auto& [key, representative] : standsFor_) {
+      if (representative == second) representative = first;
+    }
+  }
+}
+
+std::string ClassNames::unified(std::string_view text) const {
+  std::string result;
+  while (!text.empty()) {
+    const auto end = std::find_if_not(text.begin(), text.end(), isNameCharacter);
+    const auto length = std::max<std::size_t>(1, static_cast<std::size_t>(end - text.begin()));
+    const auto word = text.substr(0, length);
+    const auto found = standsFor_.find(word);
+    result += found == standsFor_.end() ? word : found->second;
+    text.remove_prefix(length);
+  }
+  return result;
+}
+
+Json ClassNames::unified(const Json& value) const {
+  if (value.is_string()) return unified(std::string_view(value.get_ref<const std::string&>()));
+  auto result = value;
+  if (value.is_structured()) {
+    for (auto& element : result) element = unified(element);
+  }
+  return result;
+}
+
+}  // namespace tools::scenario

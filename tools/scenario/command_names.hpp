@@ -1,0 +1,29 @@
+// The exported command names, by the names of their constants.
+#pragma once
+
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+namespace tools::scenario {
+
+/// The constants' names, in the order of their declaration.
+std::vector<std::string_view> commandConstants();
+
+/// Renames commands, and gives them their names back in the end.
+class RenamedCommands {
+ public:
+  RenamedCommands() = default;
+  ~RenamedCommands();
+  RenamedCommands(const RenamedCommands&) = delete;
+  RenamedCommands& operator=(const RenamedCommands&) = delete;
+
+  /// `constant` is one of `commandConstants`.
+  void rename(std::string_view constant, std::string name);
+
+ private:
+  std::vector<std::pair<std::string*, std::string>> before_;
+};
+
+}  // namespace tools::scenario

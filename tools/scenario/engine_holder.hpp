@@ -1,0 +1,39 @@
+// The engine of a scenario, as its host holds it and as an observer sees it.
+#pragma once
+
+#include <memory>
+#include <vector>
+
+#include "QZ_Plist_State_Parser.hpp"
+
+namespace tools::scenario {
+
+using Engine = QZ_Plist_State_Parser;
+
+class EngineHolder {
+ public:
+  EngineHolder() = default;
+  /// Stops the engines that are still there, for a running flasher would keep them for good.
+  ~EngineHolder();
+  EngineHolder(const EngineHolder&) = delete;
+  EngineHolder& operator=(const EngineHolder&) = delete;
+
+  /// Takes a new engine in place of the one before.
+  void begin(std::shared_ptr<Engine> engine);
+  /// The host lets go of the engine.
+  void release();
+
+  /// The engine that the host holds; throws an Unmet when it holds none.
+  std::shared_ptr<Engine> held() const;
+  /// The engine, whether or not the host still holds it; null when there is none (any more).
+  std::shared_ptr<Engine> current() const { return current_.lock(); }
+  /// The same; throws an Unmet instead of giving null.
+  std::shared_ptr<Engine> existing() const;
+
+ private:
+  std::shared_ptr<Engine> held_;              // the host's
+  std::weak_ptr<Engine> current_;             // the latest
+  std::vector<std::weak_ptr<Engine>> begun_;  // all of them
+};
+
+}  // namespace tools::scenario

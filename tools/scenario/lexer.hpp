@@ -1,0 +1,59 @@
+// From the text of a scenario file to its statements' words.
+//
+// A word is bare, "quoted", or JSON that begins with a bracket or a brace. A statement ends with
+// its line, unless a bracket or brace is open. A `#` where a word could start, also within JSON,
+// starts a comment; only where it is followed by a whole number and the word ends there or goes on
+// with a dot, as in #5 or #-3.text, it is the name of a control by its tag.
+#pragma once
+
+#include <stdexcept>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "tools/scenario/json.hpp"
+
+namespace tools::scenario {
+
+/// A place in a file. Both count from 1; columns count characters.
+struct Position {
+  int line = 1;
+  int column = 1;
+
+  friend bool operator==(const Position&, const Position&) = default;
+};
+
+/// The text is no scenario: where, and what is wrong.
+class SyntaxError : public std::runtime_error {
+ public:
+  SyntaxError(Position at, const std::string& message) : std::runtime_error(message), at_(at) {}
+  Position at() const { return at_; }
+
+ private:
+  Position at_;
+};
+
+struct Word {
+  enum class Kind { bare, quoted, json };
+
+  Kind kind = Kind::bare;
+  std::string text;  ///< quoted: without the quotation marks and escapes; JSON: as it stands
+  Json value;        ///< of JSON only
+  Position at;
+
+  bool isBare(std::string_view word) const { return kind == Kind::bare && text == word; }
+};
+
+struct Line {
+  std::vector<Word> words;  ///< at least one
+  Position end;             ///< right behind the last word
+  std::string source;       ///< the first line of the text, with an ellipsis if more follow
+};
+
+/// Deeper JSON is refused, as deeper property lists are.
+inline constexpr int deepestNesting = 512;
+
+/// The words of `text`, which is UTF-8, by statement. Throws a SyntaxError.
+std::vector<Line> readWords(std::string_view text);
+
+}  // namespace tools::scenario

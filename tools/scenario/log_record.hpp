@@ -1,0 +1,35 @@
+// The log of a scenario: every line, and how far it has been expected.
+#pragma once
+
+#include <cstddef>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace tools::scenario {
+
+class LogRecord {
+ public:
+  struct Entry {
+    std::string text;
+    int statementLine;  ///< of the statement during which it was logged
+  };
+
+  void add(std::string_view text) { entries_.push_back({std::string(text), statementLine}); }
+
+  /// The next entry that was not yet expected; nothing when there is none.
+  const Entry* next() const { return expected_ < entries_.size() ? &entries_[expected_] : nullptr; }
+  std::size_t left() const { return entries_.size() - expected_; }
+  void expectNext() { ++expected_; }
+  void ignoreAll() { expected_ = entries_.size(); }
+
+  /// The line of the statement that is being performed.
+  int statementLine = 0;
+
+ private:
+  std::vector<Entry> entries_;
+  std::size_t expected_ = 0;
+};
+
+}  // namespace tools::scenario

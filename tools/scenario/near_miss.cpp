@@ -1,0 +1,56 @@
+// "Did you mean": the distance between words.
+
+#include "tools/scenario/near_miss.hpp"
+
+#include <algorithm>
+#include <cstddef>
+#include <numeric>
+
+namespace tools::scenario {
+namespace {
+
+// Row by row of the usual table of distances between prefixes; `before` is the row before the
+// last, which a swap of neighbours goes back to.
+std::size_t distance(std::string_view a, std::string_view b) {
+  std::vector<std::size_t> before;
+  std::vector<std::size_t> last(b.size() + 1);
+  std::iota(last.begin(), last.end(), std::size_t{0});
+  for (std::size_t i = 1; i <= a.size(); ++i) {
+    std::vector<std::size_t> row(b.size() + 1, i);
+    for (std::size_t j = 1; j <= b.size(); ++j) {
+      const std::size_t replaced = last[j - 1] + (a[i - 1] == b[j - 1] ? 0 : 1);
+      row[j] = std::min({last[j] + 1, row[j - 1] + 1, replaced});
+      const bool swapped = i > 1 && j > 1 && a[i - 1] == b[j - 2] && a[i - 2] == b[j - 1];
+      if (swapped) row[j] = std::min(row[j], before[j - 2] + 1);
+    }
+    before = std::move(last);
+    last = std::move(row);
+  }
+  return last[b.size()];
+}
+
+// A word much longer than any candidate is none of them; measuring it would take long.
+constexpr std::size_t longestWord = 100;
+
+}  // namespace
+
+std::optional<std::string> nearest(std::string_view word,
+                                   const std::vector<std::string_view>& candidates) {
+  if (word.size() > longestWord) return std::nullopt;
+  std::optional<std::string> nearest;
+  std::size_t least = std::max<std::size_t>(1, word.size() / 3) + 1;
+  for (const auto candidate : candidates) {
+    const auto found = distance(word, candidate);
+    if (found >= least) continue;
+    least = found;
+    nearest = std::string(candidate);
+  }
+  return nearest;
+}
+
+std::string didYouMean(std::string_view word, const std::vector<std::string_view>& candidates) {
+  const auto candidate = nearest(word, candidates);
+  return candidate ? "; did you mean \"" + *candidate + "\"?" : "";
+}
+
+}  // namespace tools::scenario

@@ -1,0 +1,52 @@
+// How statements refer to things: the names that a scenario declares, #TAG and @INDEX for controls,
+// and NAME.PROPERTY.
+#pragma once
+
+#include <cstddef>
+#include <map>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "tools/scenario/lexer.hpp"
+
+namespace tools::scenario {
+
+/// The tag in "#TAG"; nothing when `text` is something else.
+std::optional<long> tagIn(std::string_view text);
+/// The index in "@INDEX"; nothing when `text` is something else.
+std::optional<std::size_t> indexIn(std::string_view text);
+
+/// "SUBJECT", "SUBJECT.PROPERTY" or "SUBJECT.PROPERTY.KEY"; a key may hold further dots.
+struct Path {
+  std::string subject;
+  std::optional<std::string> property;
+  std::optional<std::string> key;
+};
+Path splitPath(std::string_view text);
+
+/// What a name can stand for.
+enum class NameKind { window, control, kept };
+std::string_view describe(NameKind kind);
+
+/// The names that the statements up to here declare. Windows, controls and kept things share them.
+class Names {
+ public:
+  /// Why `word` cannot be declared; nothing when it can.
+  std::optional<std::string> whyNotNew(const Word& word) const;
+  void declare(const Word& word, NameKind kind);
+
+  /// What `name` stands for, also of the names that need no declaration: `tutorial`, #TAG, @INDEX.
+  std::optional<NameKind> kindOf(std::string_view name) const;
+  std::vector<std::string_view> all() const;
+
+ private:
+  struct Declared {
+    NameKind kind;
+    int line;
+  };
+  std::map<std::string, Declared, std::less<>> names_;
+};
+
+}  // namespace tools::scenario

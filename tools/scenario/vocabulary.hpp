@@ -1,0 +1,100 @@
+// What the parser is told about the language: the forms of its statements, the properties that they
+// can name, and what values these take. Nothing here says what a statement does.
+#pragma once
+
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "tools/scenario/json.hpp"
+#include "tools/scenario/lexer.hpp"
+
+namespace tools::scenario {
+
+/// What may stand behind the `=>` of a statement.
+enum class Result {
+  never,    ///< it has no `=>`
+  nothing,  ///< only `raises`
+  flag,     ///< YES, NO or `raises`
+  control,  ///< a control, `none` or `raises`
+};
+
+/// How a statement is written. In `syntax`, words of lower-case letters stand for themselves and
+/// words of capitals for a slot (see slots.cpp); `a|B` is one or the other, `[...]` may be left
+/// out, `A...` takes all words that are left.
+struct Form {
+  std::string_view syntax;
+  Result result = Result::never;
+};
+
+/// The kinds of value that a place takes; they combine.
+enum class Takes : unsigned {
+  nothing = 0,
+  flag = 1U << 0U,      ///< YES, NO
+  whole = 1U << 1U,     ///< a number without a fraction
+  number = 1U << 2U,    ///< any number
+  text = 1U << 3U,      ///< any word, also 5 and YES
+  list = 1U << 4U,      ///< a JSON list
+  object = 1U << 5U,    ///< a JSON object
+  window = 1U << 6U,    ///< the name of a window
+  state = 1U << 7U,     ///< on, off or mixed, for 1, 0 and -1
+  mixed = 1U << 8U,     ///< mixed
+  absent = 1U << 9U,    ///< absent
+  present = 1U << 10U,  ///< present
+  empty = 1U << 11U,    ///< empty
+};
+constexpr Takes operator|(Takes a, Takes b) {
+  return static_cast<Takes>(static_cast<unsigned>(a) | static_cast<unsigned>(b));
+}
+constexpr bool includes(Takes all, Takes some) {
+  return (static_cast<unsigned>(all) & static_cast<unsigned>(some)) != 0;
+}
+
+inline constexpr Takes anyJson =
+    Takes::flag | Takes::number | Takes::text | Takes::list | Takes::object;
+
+/// A value as it is written in a scenario.
+struct Wanted {
+  enum class Kind { value, absent, present, empty };
+
+  Kind kind = Kind::value;
+  Json value;
+
+  /// Whether `actual`, which may be absent, is what is wanted. `empty` is a list, object or text
+  /// without anything in it.
+  bool holdsFor(const std::optional<Json>& actual) const;
+};
+
+/// `word` as a value of one of the kinds; nothing when it is none. Where both are taken, a bare
+/// number is a number and no text.
+std::optional<Wanted> readValue(const Word& word, Takes takes);
+/// The kinds in words, such as `YES or NO`.
+std::string describe(Takes takes);
+/// The wanted value in words, as a scenario writes it.
+std::string show(const Wanted& wanted);
+
+/// What `NAME.PROPERTY` can be.
+struct PropertyInfo {
+  std::string_view name;
+  Takes read = Takes::nothing;     ///< what it can be expected to be
+  Takes written = Takes::nothing;  ///< what it can be set to
+};
+
+struct Vocabulary {
+  std::vector<Form> forms;
+  std::vector<PropertyInfo> engine;
+  std::vector<PropertyInfo> control;
+  std::vector<PropertyInfo> window;
+  std::vector<std::string_view> constants;  ///< the exported command names
+};
+
+/// The constant's whole name, for `name` may leave its prefix out.
+std::string fullConstantName(std::string_view name);
+
+/// The word in a message: in quotation marks, or `JSON`.
+std::string describe(const Word& word);
+/// `a, b or c`.
+std::string enumerate(const std::vector<std::string>& words);
+
+}  // namespace tools::scenario

@@ -1,0 +1,108 @@
+// The tool's shell.
+#include "tools/shell.hpp"
+
+#include <CLI/CLI.hpp>
+
+#include <algorithm>
+#include <exception>
+#include <iostream>
+
+#include "tools/scenario/near_miss.hpp"
+
+namespace tools {
+namespace {
+
+constexpr const char* toolName = "qz-walkthrough";
+
+constexpr const char* exitStatuses =
+    "Exit status:\n"
+    "  0  all went well\n"
+    "  1  a test failed, or a walk-through could not start or go on as asked\n"
+    "  2  bad usage, or a file that is not what it should be";
+
+int report(ExitStatus status, const std::string& message) {
+  std::cout.flush();
+  std::cerr << toolName << ": " << message << std::endl;
+  return static_cast<int>(status);
+}
+
+/// The command that was given, or the tool itself when there is none.
+const CLI::App& chosen(const CLI::App& app) {
+  const auto commands = app.get_subcommands();
+  return commands.empty() ? app : *commands.front();
+}
+
+/// Why no command was recognised: which there are, and what stands where one should.
+std::string commandExpected(const CLI::App& app) {
+  std::vector<std::string_view> names;
+  std::string list;
+  for (const CLI::App* command : app.get_subcommands({})) {
+    names.push_back(command->get_name());
+    list += (list.empty() ? "" : " or ") + command->get_name();
+  }
+  const auto rest = app.remaining();
+  if (rest.empty()) return "expected a command: " + list;
+  const bool isOption = rest.front().starts_with("-");
+  return (isOption ? "unknown option " : "unknown command ") + rest.front() + "; expected " + list +
+         scenario::didYouMean(rest.front(), names);
+}
+
+std::string unexpectedArgument(const CLI::App& command) {
+  const std::string argument = command.remaining(true).front();
+  if (!argument.starts_with("-")) return "unexpected argument " + argument;
+  const std::string name = argument.substr(0, argument.find('='));
+  std::vector<std::string> options;
+  for (const CLI::Option* option : command.get_options()) {
+    options.push_back(option->get_name(false, true));
+  }
+  return "unknown option " + name + scenario::didYouMean(name, {options.begin(), options.end()});
+}
+
+/// What is wrong with the command line, in one line.
+std::string explain(const CLI::ParseError& error, const CLI::App& app) {
+  const CLI::App& command = chosen(app);
+  std::string words = error.what();
+  if (&command == &app) {
+    words = commandExpected(app);
+  } else if (dynamic_cast<const CLI::ExtrasError*>(&error)) {
+    words = unexpectedArgument(command);
+  }
+  const std::string help = &command == &app ? "" : command.get_name() + " ";
+  return words + "; see " + toolName + " " + help + "--help";
+}
+
+int parse(CLI::App& app, std::vector<std::string> arguments, const int& status) {
+  try {
+    // CLI11 takes the arguments from the back.
+    std::reverse(arguments.begin(), arguments.end());
+    app.parse(std::move(arguments));
+    return status;
+  } catch (const CLI::Success& success) {
+    return app.exit(success);  // prints the help or the version
+  } catch (const CLI::ParseError& error) {
+    return report(ExitStatus::badInput, explain(error, app));
+  } catch (const Failure& failure) {
+    return report(failure.status(), failure.what());
+  } catch (const std::exception& error) {
+    return report(ExitStatus::failed, error.what());
+  }
+}
+
+}  // namespace
+
+int runTool(const std::vector<std::string>& arguments, const std::vector<AddCommand>& commands) {
+  CLI::App app("Plays and tests scripted walk-throughs over the controls of a window.", toolName);
+  int status = static_cast<int>(ExitStatus::fine);
+  app.set_version_flag("--version", std::string(toolName) + " " + QZ_VERSION);
+  app.footer(exitStatuses);
+  app.require_subcommand(1);
+  for (const AddCommand add : commands) add(app, status);
+
+  const int result = parse(app, arguments, status);
+  if (!std::cout.flush()) {
+    return report(ExitStatus::failed, "standard output cannot be written");
+  }
+  return result;
+}
+
+}  // namespace tools
