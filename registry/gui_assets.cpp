@@ -51,9 +51,11 @@ bool QZ_Plist_State_Parser::loadGuiAssets(const Dictionary& description,
   if (!window) return false;
   bool added = false;
   for (const auto& [key, entry] : assets->entries()) {
-    const Control control = makeControl(key, entry);
-    if (!control) continue;
-    window->contentView()->addSubview(control);
+    if (!makeControl(key, entry)) continue;
+    // What goes into the window is the list's last control. Without a list, as after termination,
+    // that is none; the entry counts all the same.
+    const auto& controls = addedObjectToTutorial_->elements();
+    if (!controls.empty()) window->contentView()->addSubview(controls.back());
     added = true;
   }
   window->makeKeyAndOrderFront();

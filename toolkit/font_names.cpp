@@ -4,6 +4,8 @@
 
 #include "toolkit/font_names.hpp"
 
+#include "toolkit/ascii.hpp"
+
 namespace toolkit {
 
 namespace {
@@ -19,10 +21,6 @@ constexpr Style styles[] = {
     {"italic", false, true},     {"oblique", false, true},  {"bolditalic", true, true},
     {"boldoblique", true, true},
 };
-
-constexpr char lowered(char c) {
-  return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
-}
 
 std::string folded(std::string_view name) {
   std::string result;

@@ -4,9 +4,11 @@
 
 #include "tools/play_command.hpp"
 #include "tools/shell.hpp"
+#include "tools/stack_guard.hpp"
 #include "tools/test_command.hpp"
 
 int main(int argc, char** argv) {
+  tools::installStackGuard();
   const std::vector<std::string> arguments(argv + (argc > 0 ? 1 : 0), argv + argc);
   return tools::runTool(arguments, {tools::addPlayCommand, tools::addTestCommand});
 }

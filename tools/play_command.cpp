@@ -10,7 +10,6 @@
 #include <iostream>
 #include <memory>
 
-#include "tools/drivers.hpp"
 #include "tools/play/play.hpp"
 #include "tools/play/prompt.hpp"
 #include "tools/play/text_layout.hpp"
@@ -18,7 +17,7 @@
 namespace tools {
 namespace {
 
-constexpr std::size_t narrowest = 60;  // columns; a picture needs them
+constexpr std::size_t narrowest = 72;  // columns; a picture needs them
 constexpr std::size_t widest = 140;    // lines any longer are hard to read
 
 /// How to write to standard output: in colour to a terminal whose user has nothing against it.
@@ -54,19 +53,6 @@ void addAdvance(play::PlayOptions& options, const std::string& text) {
   options.steps.emplace_back(play::Advance{*seconds});
 }
 
-void setToolkit(play::PlayOptions& options, const std::string& name) {
-  std::string known;
-  for (const auto& driver : driverNames()) {
-    if (driver == name) {
-      options.toolkit = name;
-      return;
-    }
-    known.append(known.empty() ? "" : ", ").append(driver);
-  }
-  throw CLI::ValidationError("--toolkit: expected one of " + known + ", found " +
-                             play::quote(name));
-}
-
 void addWindowOptions(CLI::App& command, play::PlayOptions& options) {
   auto* window = command.add_option("--window", options.window,
                                     "The host's window, a property list of its controls");
@@ -79,11 +65,9 @@ void addWindowOptions(CLI::App& command, play::PlayOptions& options) {
                   "The directory of the images; the script's own without it")
       ->type_name("DIR");
   command.add_flag("--sheet", options.sheet, "Show it as a sheet over another window of the host");
-  command
-      .add_option_function<std::string>(
-          "--toolkit", [&options](const std::string& name) { setToolkit(options, name); },
-          "What to play it on; memory without it")
-      ->type_name("NAME");
+  command.add_option("--toolkit", options.toolkit, "The toolkit to play it on")
+      ->type_name("NAME")
+      ->capture_default_str();
 }
 
 /// Steps are collected while the command line is read, for their order across both options counts.

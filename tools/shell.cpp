@@ -8,6 +8,7 @@
 #include <iostream>
 
 #include "tools/scenario/near_miss.hpp"
+#include "tools/scenario/vocabulary.hpp"
 
 namespace tools {
 namespace {
@@ -18,7 +19,8 @@ constexpr const char* exitStatuses =
     "Exit status:\n"
     "  0  all went well\n"
     "  1  a test failed, or a walk-through could not start or go on as asked\n"
-    "  2  bad usage, or a file that is not what it should be";
+    "  2  bad usage, or a file that is not what it should be\n"
+    "  3  a script's lists ran each other without end";
 
 int report(ExitStatus status, const std::string& message) {
   std::cout.flush();
@@ -35,11 +37,8 @@ const CLI::App& chosen(const CLI::App& app) {
 /// Why no command was recognised: which there are, and what stands where one should.
 std::string commandExpected(const CLI::App& app) {
   std::vector<std::string_view> names;
-  std::string list;
-  for (const CLI::App* command : app.get_subcommands({})) {
-    names.push_back(command->get_name());
-    list += (list.empty() ? "" : " or ") + command->get_name();
-  }
+  for (const CLI::App* command : app.get_subcommands({})) names.push_back(command->get_name());
+  const std::string list = scenario::enumerate({names.begin(), names.end()});
   const auto rest = app.remaining();
   if (rest.empty()) return "expected a command: " + list;
   const bool isOption = rest.front().starts_with("-");

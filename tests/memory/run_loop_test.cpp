@@ -21,8 +21,9 @@ class RunLoopTest : public testing::Test {
  protected:
   /// Schedules a timer that adds its name and the time to `fired`.
   Ref<Timer> note(const std::string& name, double interval, bool repeats = false) {
-    return loop.schedule(interval, repeats,
-                         [this, name](const Ref<Timer>&) { fired.push_back({name, loop.now()}); });
+    return loop.schedule(interval, repeats, [this, name](const Ref<Timer>&) {
+      fired.push_back({name, loop.now()});
+    });
   }
   std::string names() const {
     std::string all;

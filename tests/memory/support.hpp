@@ -29,11 +29,13 @@ class Recorder : public Responder {
     if (action != understood_) return false;
     senders.push_back(sender->tag());
     if (perform) perform(sender);
+    performed.emplace_back(action);
     return true;
   }
 
-  std::vector<std::string> asked;               // all actions it was asked to perform
-  std::vector<long> senders;                    // the tags of those it performed for
+  std::vector<std::string> asked;      // all actions it was asked to perform
+  std::vector<std::string> performed;  // as their names read when they had been performed
+  std::vector<long> senders;           // the tags of those it performed for
   std::function<void(const Ref<View>&)> perform;  // what performing is, besides
 
  private:

@@ -24,8 +24,8 @@ constexpr Message messages[] = {
      [](View& view) { view.setAttributedStringValue(AttributedString("text")); }, true},
     {"highlight:", [](View& view) { view.highlight(true); }, false},
     {"attributedTitle", [](View& view) { view.attributedTitle(); }, false},
-    {"setAttributedTitle:",
-     [](View& view) { view.setAttributedTitle(AttributedString("title")); }, false},
+    {"setAttributedTitle:", [](View& view) { view.setAttributedTitle(AttributedString("title")); },
+     false},
 };
 
 /// The reason of what `message` raised, if it raised.

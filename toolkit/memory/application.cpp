@@ -1,3 +1,5 @@
+// Making windows and controls; sheets are passed on to their windows.
+
 #include "toolkit/memory/application.hpp"
 
 #include "toolkit/memory/views.hpp"

@@ -1,3 +1,5 @@
+// The catalogue: the families that walk-throughs written on the Mac ask for.
+
 #include "toolkit/memory/fonts.hpp"
 
 #include "toolkit/font_names.hpp"

@@ -2,9 +2,7 @@
 // image is its name and the place of its file.
 #pragma once
 
-#include <array>
 #include <map>
-#include <optional>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -13,10 +11,6 @@
 #include "toolkit/image.hpp"
 
 namespace toolkit::memory {
-
-/// The suffixes of image formats, in the order in which a name without one is tried with them.
-inline constexpr std::array<std::string_view, 9> imageSuffixes = {
-    "png", "jpg", "jpeg", "gif", "tiff", "tif", "bmp", "icns", "pdf"};
 
 class MemoryImage final : public Image {
  public:
@@ -35,13 +29,10 @@ class MemoryImages final : public Images {
   /// `files` says where the resource directory is.
   explicit MemoryImages(const Files& files) : files_(files) {}
 
-  /// The same image whenever the same name leads to the same file. A name that could lead out of
-  /// the resource directory finds nothing.
+  /// The same image whenever the same name leads to the same file.
   Ref<Image> imageNamed(std::string_view name) override;
 
  private:
-  std::optional<std::string> pathOf(std::string_view name) const;
-
   const Files& files_;  // the toolkit's, as this is
   std::map<std::string, std::shared_ptr<MemoryImage>, std::less<>> found_;
 };

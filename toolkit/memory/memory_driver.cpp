@@ -1,3 +1,6 @@
+// Making, moving and looking at things through the classes of this toolkit; what time and clicks do
+// is theirs.
+
 #include "toolkit/memory/memory_driver.hpp"
 
 #include <algorithm>

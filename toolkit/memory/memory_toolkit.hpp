@@ -4,11 +4,11 @@
 #pragma once
 
 #include "toolkit/memory/application.hpp"
-#include "toolkit/memory/files.hpp"
 #include "toolkit/memory/fonts.hpp"
 #include "toolkit/memory/images.hpp"
 #include "toolkit/memory/log.hpp"
 #include "toolkit/memory/run_loop.hpp"
+#include "toolkit/system_files.hpp"
 #include "toolkit/toolkit.hpp"
 
 namespace toolkit::memory {
@@ -23,12 +23,12 @@ class MemoryToolkit final : public Toolkit {
   MemoryRunLoop& runLoop() override { return runLoop_; }
   MemoryImages& images() override { return images_; }
   MemoryFonts& fonts() override { return fonts_; }
-  MemoryFiles& files() override { return files_; }
+  SystemFiles& files() override { return files_; }
   MemoryLog& log() override { return log_; }
 
  private:
   MemoryLog log_;
-  MemoryFiles files_;
+  SystemFiles files_;
   MemoryImages images_{files_};
   MemoryFonts fonts_;
   MemoryApplication application_;

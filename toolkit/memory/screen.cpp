@@ -1,3 +1,6 @@
+// The order of windows. Sheets know their parents and not the other way round, so that whatever a
+// parent needs to know of its sheets is asked of the windows that show.
+
 #include "toolkit/memory/screen.hpp"
 
 #include <algorithm>
@@ -25,9 +28,10 @@ bool Screen::hasSheetOver(const MemoryWindow& window) const {
 }
 
 void Screen::orderFront(const std::shared_ptr<MemoryWindow>& window) {
-  const std::shared_ptr<MemoryWindow> kept = orderOut(*window);
+  orderOut(*window);
   shown_.push_back({window.get(), window->isKeptOnScreen() ? window : nullptr});
   key_ = window.get();
+  // Over a copy: the sheets change their places.
   for (MemoryWindow* const other : windows())
     if (other->sheetParent() == window) orderFront(other->shared_from_this());
 }

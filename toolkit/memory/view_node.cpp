@@ -1,3 +1,6 @@
+// The tree of views: which lies in which, up to the window. Superviews own; every look upwards goes
+// through references that turn absent when a superview or a window ends before its views.
+
 #include "toolkit/memory/view_node.hpp"
 
 #include <algorithm>
@@ -57,10 +60,10 @@ void ViewNode::insert(const Ref<View>& view) {
 void ViewNode::removeFromSuperview() {
   const auto superview = this->superview();
   if (!superview) return;
-  const auto kept = shared_from_this();  // the superview's reference may be the last one
+  const Ref<View> self = view();  // and kept, for the superview's reference may be the last one
   superview_.reset();
   Subviews& list = superview->subviews_;
-  list.erase(std::find(list.begin(), list.end(), view()));
+  list.erase(std::find(list.begin(), list.end(), self));
   superview->changed();
 }
 
@@ -68,6 +71,7 @@ void ViewNode::changed() {
   if (const auto screen = screen_.lock()) changedAt_ = screen->drawings();
 }
 
+// Counting the drawings spares every drawing the walk over all views to mark them drawn.
 bool ViewNode::isRedrawPending() const {
   const auto screen = screen_.lock();
   return screen && changedAt_ == screen->drawings();

@@ -1,3 +1,5 @@
+// Sending actions, and buttons.
+
 #include "toolkit/memory/views.hpp"
 
 #include "toolkit/memory/window.hpp"
@@ -48,7 +50,7 @@ State MemoryButton::stateAfterClick() const {
 
 void MemoryButton::click() {
   if (!isEnabled() || !takesInput()) return;
-  highlight(false);
+  highlight(false);  // the mouse button is up again
   setState(stateAfterClick());
   send(action_, target());
 }

@@ -1,5 +1,6 @@
 #include "toolkit/property_list/calendar.hpp"
 
+#include <algorithm>
 #include <array>
 #include <charconv>
 #include <cmath>
@@ -10,9 +11,33 @@ namespace toolkit {
 namespace {
 
 constexpr double secondsPerDay = 86400;
-constexpr std::int64_t daysPerEra = 146097;          // 400 years
-constexpr std::int64_t referenceDay = 730791;        // 2001-01-01, counted from 0000-03-01
+constexpr std::int64_t daysPerEra = 146097;    // 400 years
+constexpr std::int64_t referenceDay = 730791;  // 2001-01-01, counted from 0000-03-01
+// Later years than this are taken for it: there a double tells no days apart any more.
+constexpr std::int64_t latestYear = 1'000'000'000'000;
 constexpr double exactSeconds = 9007199254740992.0;  // 2^53: up to here a double counts by ones
+
+bool isDigit(char c) { return c >= '0' && c <= '9'; }
+
+bool isLeap(std::int64_t year) { return year % 4 == 0 && (year % 100 != 0 || year % 400 == 0); }
+
+std::int64_t floorDivide(std::int64_t a, std::int64_t b) { return (a >= 0 ? a : a - (b - 1)) / b; }
+
+/// From 2001-01-01 to the first day of `year`.
+std::int64_t daysBeforeYear(std::int64_t year) {
+  const std::int64_t past = year - 1;
+  return 365 * (year - 2001) + floorDivide(past, 4) - floorDivide(past, 100) +
+         floorDivide(past, 400) - 485;
+}
+
+/// The platform reads this from a table of sixteen months, the first and the last two of which are
+/// empty; a month beyond the table counts as 65535 days.
+std::int64_t daysBeforeMonth(int month, bool leap) {
+  constexpr std::array<int, 16> days = {0,   0,   31,  59,  90,  120, 151, 181,
+                                        212, 243, 273, 304, 334, 365, 0,   0};
+  if (month >= static_cast<int>(days.size())) return 65535;
+  return days[static_cast<std::size_t>(month)] + (month > 2 && leap ? 1 : 0);
+}
 
 std::string shortest(double number) {
   std::array<char, 32> buffer;
@@ -48,6 +73,30 @@ std::string iso8601(double secondsSinceReferenceDate) {
   const double fraction = secondsSinceReferenceDate - whole;
   // The fraction's own digits, without the 0 before the point.
   return text.data() + (fraction > 0 ? shortest(fraction).substr(1) : "") + "Z";
+}
+
+std::optional<double> secondsOfDate(std::string_view text) {
+  const bool negative = text.starts_with('-');
+  if (negative) text.remove_prefix(1);
+  std::int64_t year = 0;
+  std::size_t digits = 0;
+  for (; digits < text.size() && isDigit(text[digits]); ++digits) {
+    year = std::min(year * 10 + (text[digits] - '0'), latestYear);
+  }
+  text.remove_prefix(digits);
+  constexpr std::string_view pattern = "-00-00T00:00:00Z";
+  if (digits == 0 || text.size() != pattern.size()) return std::nullopt;
+  std::array<int, 5> fields{};
+  std::size_t seen = 0;
+  for (std::size_t i = 0; i < pattern.size(); ++i) {
+    if (pattern[i] != '0' ? text[i] != pattern[i] : !isDigit(text[i])) return std::nullopt;
+    if (pattern[i] == '0') fields[seen / 2] = fields[seen / 2] * 10 + (text[i] - '0');
+    if (pattern[i] == '0') ++seen;
+  }
+  if (negative) year = -year;
+  const auto [month, day, hour, minute, second] = fields;
+  const std::int64_t days = daysBeforeYear(year) + daysBeforeMonth(month, isLeap(year)) + day - 1;
+  return static_cast<double>(days) * secondsPerDay + hour * 3600.0 + minute * 60.0 + second;
 }
 
 }  // namespace toolkit

@@ -1,7 +1,9 @@
 // Dates as the texts of property lists write them.
 #pragma once
 
+#include <optional>
 #include <string>
+#include <string_view>
 
 namespace toolkit {
 
@@ -9,5 +11,10 @@ namespace toolkit {
 /// moment that is infinite, no number or beyond the years that a double counts exactly, its number
 /// of seconds.
 std::string iso8601(double secondsSinceReferenceDate);
+
+/// The moment that an XML property list writes as `[-]Y…-MM-DDThh:mm:ssZ`, in seconds since
+/// 2001-01-01 00:00:00 UTC; nothing for any other text. Each field counts on from the ones before
+/// it: the 30th of February is the 2nd of March, the 13th month the next year's first.
+std::optional<double> secondsOfDate(std::string_view text);
 
 }  // namespace toolkit

@@ -1,5 +1,6 @@
 #include "toolkit/property_list/collections.hpp"
 
+#include <iterator>
 #include <utility>
 
 #include "toolkit/exception.hpp"
@@ -8,8 +9,27 @@
 namespace toolkit {
 namespace {
 
-bool isKey(const ValueRef<>& value, std::string_view key) {
-  return value->kind() == Value::Kind::string && static_cast<const String&>(*value).text() == key;
+// Up to here looking at every key is faster than hashing the one that is looked up.
+constexpr std::size_t mostWithoutIndex = 8;
+
+bool isText(const Value& key, std::string_view text) {
+  return key.kind() == Value::Kind::string && static_cast<const String&>(key).text() == text;
+}
+
+/// A reference from one value of a document to another: it takes no count, since none is given
+/// back.
+ValueRef<> uncounted(Value* value) { return Counted<Value>::adopt(value); }
+
+std::pmr::vector<ValueRef<>> uncounted(std::span<Value* const> values, Document* document) {
+  std::pmr::vector<ValueRef<>> references(document);
+  references.reserve(values.size());
+  for (Value* value : values) references.push_back(uncounted(value));
+  return references;
+}
+
+std::pmr::vector<ValueRef<>> moved(std::vector<ValueRef<>>&& values) {
+  return {std::make_move_iterator(values.begin()), std::make_move_iterator(values.end()),
+          std::pmr::new_delete_resource()};
 }
 
 std::string message(const Value& value, std::string_view selector) {
@@ -43,11 +63,18 @@ void Collection::destroy() noexcept {
 
 Array& Array::nothing() { return nothingAs<Array>(); }
 
-Array::Array(std::vector<ValueRef<>> elements, Mutability mutability)
-    : Collection(Kind::array, mutability), elements_(std::move(elements)) {}
+Array::Array(std::vector<ValueRef<>>&& elements, Mutability mutability)
+    : Collection(Kind::array, mutability), elements_(moved(std::move(elements))) {}
+
+Array::Array(std::span<Value* const> elements, Document* document)
+    : Collection(Kind::array, Mutability::immutable), elements_(uncounted(elements, document)) {}
 
 ValueRef<Array> Array::make(std::vector<ValueRef<>> elements, Mutability mutability) {
-  return Counted<Array>::adopt(new (Trailing{0}) Array(std::move(elements), mutability));
+  return makeAlone<Array>(0, std::move(elements), mutability);
+}
+
+Array* Array::make(Document& document, std::span<Value* const> elements) {
+  return makeIn<Array>(document, 0, elements, &document);
 }
 
 std::size_t Array::count() const { return elements_.size(); }
@@ -74,35 +101,117 @@ void Array::removeAllObjects() {
 
 Set& Set::nothing() { return nothingAs<Set>(); }
 
-Set::Set(std::vector<ValueRef<>> elements)
-    : Collection(Kind::set, Mutability::immutable), elements_(std::move(elements)) {}
+Set::Set(std::vector<ValueRef<>>&& elements)
+    : Collection(Kind::set, Mutability::immutable), elements_(moved(std::move(elements))) {}
+
+Set::Set(std::span<Value* const> elements, Document* document)
+    : Collection(Kind::set, Mutability::immutable), elements_(uncounted(elements, document)) {}
 
 ValueRef<Set> Set::make(std::vector<ValueRef<>> elements) {
-  return Counted<Set>::adopt(new (Trailing{0}) Set(std::move(elements)));
+  return makeAlone<Set>(0, std::move(elements));
+}
+
+Set* Set::make(Document& document, std::span<Value* const> elements) {
+  return makeIn<Set>(document, 0, elements, &document);
 }
 
 std::size_t Set::count() const { return elements_.size(); }
 
 Dictionary& Dictionary::nothing() { return nothingAs<Dictionary>(); }
 
-Dictionary::Dictionary(std::vector<Entry> entries, Mutability mutability)
-    : Collection(Kind::dictionary, mutability), entries_(std::move(entries)) {}
+Dictionary::Dictionary(std::span<Entry> entries, Mutability mutability)
+    : Collection(Kind::dictionary, mutability) {
+  entries_.reserve(entries.size());
+  for (Entry& entry : entries) {
+    const std::size_t at = positionOf(*entry.key);
+    if (at == KeyIndex::none) {
+      append(std::move(entry));
+    } else {
+      entries_[at].value = std::move(entry.value);
+    }
+  }
+}
+
+Dictionary::Dictionary(std::span<Value* const> keysAndValues, Duplicates duplicates,
+                       Document* document)
+    : Collection(Kind::dictionary, Mutability::immutable), entries_(document) {
+  // All memory is asked for before the first reference is there, which no destructor may see.
+  const std::size_t count = keysAndValues.size() / 2;
+  entries_.reserve(count);
+  if (count > mostWithoutIndex) {
+    index_.reset(new (document->place(sizeof(KeyIndex)).memory) KeyIndex(count, document));
+  }
+  for (std::size_t i = 0; i < keysAndValues.size(); i += 2) {
+    Value* key = keysAndValues[i];
+    Value* value = keysAndValues[i + 1];
+    const std::size_t at = positionOf(*key);
+    if (at == KeyIndex::none) {
+      append({uncounted(key), uncounted(value)});
+    } else if (duplicates == Duplicates::lastWins) {
+      // Not assigned: that would give back a count that the earlier value never took.
+      std::construct_at(&entries_[at].value, uncounted(value));
+    }
+  }
+}
+
+Dictionary::Dictionary(const Dictionary& other, Mutability mutability)
+    : Collection(Kind::dictionary, mutability),
+      entries_(other.entries_, std::pmr::new_delete_resource()) {
+  if (other.index_) {
+    index_ = std::make_unique<KeyIndex>(*other.index_, std::pmr::new_delete_resource());
+  }
+}
 
 ValueRef<Dictionary> Dictionary::make(std::vector<Entry> entries, Mutability mutability) {
-  return Counted<Dictionary>::adopt(new (Trailing{0}) Dictionary(std::move(entries), mutability));
+  return makeAlone<Dictionary>(0, std::span(entries), mutability);
+}
+
+Dictionary* Dictionary::make(Document& document, std::span<Value* const> keysAndValues,
+                             Duplicates duplicates) {
+  return makeIn<Dictionary>(document, 0, keysAndValues, duplicates, &document);
+}
+
+ValueRef<Dictionary> Dictionary::copy(Mutability mutability) const {
+  return makeAlone<Dictionary>(0, *this, mutability);
 }
 
 std::size_t Dictionary::count() const { return entries_.size(); }
 
-std::size_t Dictionary::position(std::string_view key) const {
-  std::size_t at = 0;
-  while (at < entries_.size() && !isKey(entries_[at].key, key)) ++at;
-  return at;
+template <class Hash, class IsKey>
+std::size_t Dictionary::positionWhere(Hash hash, IsKey isKey) const {
+  const auto isKeyAt = [&](std::size_t at) { return isKey(*entries_[at].key); };
+  if (index_) return index_->find(hash(), isKeyAt);
+  for (std::size_t at = 0; at < entries_.size(); ++at) {
+    if (isKeyAt(at)) return at;
+  }
+  return KeyIndex::none;
+}
+
+std::size_t Dictionary::positionOf(std::string_view key) const {
+  return positionWhere([&] { return hashOf(key); },
+                       [&](const Value& other) { return isText(other, key); });
+}
+
+std::size_t Dictionary::positionOf(const Value& key) const {
+  return positionWhere([&] { return hashOfKey(key); },
+                       [&](const Value& other) { return sameKey(other, key); });
+}
+
+void Dictionary::append(Entry&& entry) {
+  if (index_ ? index_->isFull() : entries_.size() == mostWithoutIndex) growIndex();
+  entries_.push_back(std::move(entry));
+  if (index_) index_->append(hashOfKey(*entries_.back().key));
+}
+
+void Dictionary::growIndex() {
+  auto larger = std::make_unique<KeyIndex>(2 * entries_.size(), std::pmr::new_delete_resource());
+  for (const Entry& entry : entries_) larger->append(hashOfKey(*entry.key));
+  index_ = std::move(larger);
 }
 
 ValueRef<> Dictionary::objectForKey(std::string_view key) const {
-  const std::size_t at = position(key);
-  return at < entries_.size() ? entries_[at].value : nullptr;
+  const std::size_t at = positionOf(key);
+  return at == KeyIndex::none ? nullptr : entries_[at].value;
 }
 
 std::vector<std::string> Dictionary::allKeys() const {
@@ -114,29 +223,31 @@ std::vector<std::string> Dictionary::allKeys() const {
   return keys;
 }
 
-ValueRef<Dictionary> Dictionary::copy(Mutability mutability) const {
-  return make(entries_, mutability);
-}
-
 void Dictionary::setObject(const ValueRef<>& value, std::string_view key) {
   if (!canChange("setObject:forKey:")) return;
   requirePresent(value, "setObject:forKey:");
-  const std::size_t at = position(key);
-  if (at < entries_.size()) {
-    entries_[at].value = value;
+  const std::size_t at = positionOf(key);
+  if (at == KeyIndex::none) {
+    append({String::make(key), value});
   } else {
-    entries_.push_back({String::make(key), value});
+    entries_[at].value = value;
   }
 }
 
 void Dictionary::removeObjectForKey(std::string_view key) {
   if (!canChange("removeObjectForKey:")) return;
-  const std::size_t at = position(key);
-  if (at < entries_.size()) entries_.erase(entries_.begin() + static_cast<std::ptrdiff_t>(at));
+  const std::size_t at = positionOf(key);
+  if (at == KeyIndex::none) return;
+  if (index_) {
+    index_->remove(at, [&](std::size_t position) { return hashOfKey(*entries_[position].key); });
+  }
+  entries_.erase(entries_.begin() + static_cast<std::ptrdiff_t>(at));
 }
 
 void Dictionary::removeAllObjects() {
-  if (canChange("removeAllObjects")) entries_.clear();
+  if (!canChange("removeAllObjects")) return;
+  entries_.clear();
+  index_.reset();
 }
 
 ValueRef<Array> asArray(const ValueRef<>& value) {

@@ -4,11 +4,15 @@
 #pragma once
 
 #include <cstddef>
+#include <cstdint>
+#include <memory>
+#include <memory_resource>
 #include <span>
 #include <string>
 #include <string_view>
 #include <vector>
 
+#include "toolkit/property_list/key_index.hpp"
 #include "toolkit/property_list/value.hpp"
 
 namespace toolkit {
@@ -44,12 +48,16 @@ class Array final : public Collection {
   void addObject(const ValueRef<>& value);
   void removeAllObjects();
 
+  /// As an immutable part of `document`, like its elements; the caller gets no count.
+  static Array* make(Document& document, std::span<Value* const> elements);
+
  private:
   friend class Value;
   explicit Array(Kind kind) : Collection(kind, Mutability::ignored) {}
-  Array(std::vector<ValueRef<>> elements, Mutability mutability);
+  Array(std::vector<ValueRef<>>&& elements, Mutability mutability);
+  Array(std::span<Value* const> elements, Document* document);
 
-  std::vector<ValueRef<>> elements_;
+  std::pmr::vector<ValueRef<>> elements_{std::pmr::new_delete_resource()};
 };
 
 /// Values without an order, from binary property lists; they keep the order of the file.
@@ -57,6 +65,8 @@ class Set final : public Collection {
  public:
   static Set& nothing();
   static ValueRef<Set> make(std::vector<ValueRef<>> elements);
+  /// As a part of `document`, like its elements; the caller gets no count.
+  static Set* make(Document& document, std::span<Value* const> elements);
   /// The elements in the order of the file. Valid as long as the set is.
   std::span<const ValueRef<>> elements() const { return elements_; }
   std::size_t count() const override;
@@ -64,9 +74,10 @@ class Set final : public Collection {
  private:
   friend class Value;
   explicit Set(Kind kind) : Collection(kind, Mutability::ignored) {}
-  explicit Set(std::vector<ValueRef<>> elements);
+  explicit Set(std::vector<ValueRef<>>&& elements);
+  Set(std::span<Value* const> elements, Document* document);
 
-  std::vector<ValueRef<>> elements_;
+  std::pmr::vector<ValueRef<>> elements_{std::pmr::new_delete_resource()};
 };
 
 /// Values under keys. The keys that scripts and tables use are strings; a binary property list may
@@ -78,9 +89,17 @@ class Dictionary final : public Collection {
     ValueRef<> value;
   };
 
+  /// Which value a key has that comes more than once.
+  enum class Duplicates : std::uint8_t { firstWins, lastWins };
+
   static Dictionary& nothing();
+  /// Of a key that comes more than once the last value counts.
   static ValueRef<Dictionary> make(std::vector<Entry> entries = {},
                                    Mutability mutability = Mutability::changeable);
+  /// As an immutable part of `document`, like its keys and values, which alternate in
+  /// `keysAndValues`; the caller gets no count.
+  static Dictionary* make(Document& document, std::span<Value* const> keysAndValues,
+                          Duplicates duplicates);
 
   /// The entries in order. Valid until the dictionary changes.
   std::span<const Entry> entries() const { return entries_; }
@@ -101,10 +120,21 @@ class Dictionary final : public Collection {
  private:
   friend class Value;
   explicit Dictionary(Kind kind) : Collection(kind, Mutability::ignored) {}
-  Dictionary(std::vector<Entry> entries, Mutability mutability);
-  std::size_t position(std::string_view key) const;
+  Dictionary(std::span<Entry> entries, Mutability mutability);
+  Dictionary(std::span<Value* const> keysAndValues, Duplicates duplicates, Document* document);
+  Dictionary(const Dictionary& other, Mutability mutability);
 
-  std::vector<Entry> entries_;
+  template <class Hash, class IsKey>
+  std::size_t positionWhere(Hash hash, IsKey isKey) const;
+  std::size_t positionOf(std::string_view key) const;
+  std::size_t positionOf(const Value& key) const;
+  void append(Entry&& entry);
+  void growIndex();
+
+  std::pmr::vector<Entry> entries_{std::pmr::new_delete_resource()};
+  // Only where there are many entries. In a document it lies in the document's memory: it is safe
+  // in this pointer because no destructor runs there.
+  std::unique_ptr<KeyIndex> index_;
 };
 
 /// `value` as the kind named, or absent when it is absent or of another kind.

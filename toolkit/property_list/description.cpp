@@ -1,4 +1,5 @@
 // What `Value::description` answers.
+#include <algorithm>
 #include <array>
 #include <charconv>
 #include <string>
@@ -6,6 +7,7 @@
 
 #include "toolkit/property_list/calendar.hpp"
 #include "toolkit/property_list/collections.hpp"
+#include "toolkit/property_list/old_style_tokens.hpp"
 #include "toolkit/property_list/scalars.hpp"
 #include "toolkit/property_list/walk.hpp"
 
@@ -47,10 +49,8 @@ std::string hex(std::string_view bytes) {
 
 /// Whether the old style writes a text without quotes.
 bool isBare(std::string_view text) {
-  constexpr std::string_view bare =
-      "abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ0123456789_$/:.-";
   return !text.empty() && !text.starts_with("//") && !text.starts_with("/*") &&
-         text.find_first_not_of(bare) == std::string_view::npos;
+         std::all_of(text.begin(), text.end(), isBareCharacter);
 }
 
 std::string quoted(std::string_view text) {

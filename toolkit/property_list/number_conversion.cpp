@@ -3,10 +3,13 @@
 #include <algorithm>
 #include <charconv>
 #include <limits>
+#include <string>
 #include <system_error>
 
 namespace toolkit {
 namespace {
+
+constexpr std::size_t longestRealName = 9;  // "-infinity"
 
 bool isDigit(char c) { return c >= '0' && c <= '9'; }
 bool isSign(char c) { return c == '+' || c == '-'; }
@@ -27,11 +30,6 @@ std::size_t spaceLength(std::string_view text) {
   if (at(0) == 0xE2 && at(1) == 0x80 && at(2) >= 0x80 && at(2) <= 0x8B) return 3;
   if (at(0) == 0xE3 && at(1) == 0x80 && at(2) == 0x80) return 3;
   return 0;
-}
-
-std::string_view withoutLeadingSpace(std::string_view text) {
-  while (const std::size_t length = spaceLength(text)) text.remove_prefix(length);
-  return text;
 }
 
 /// The sign and the digits that `text` starts with, clamped to the range of Integer.
@@ -102,6 +100,11 @@ bool boolValueOf(std::string_view text) {
 std::int32_t truncatedToInt(double value) { return truncated<std::int32_t>(value); }
 std::int64_t truncatedToInteger(double value) { return truncated<std::int64_t>(value); }
 
+std::string_view withoutLeadingSpace(std::string_view text) {
+  while (const std::size_t length = spaceLength(text)) text.remove_prefix(length);
+  return text;
+}
+
 std::size_t decimalLength(std::string_view text) {
   std::size_t at = !text.empty() && isSign(text.front()) ? 1 : 0;
   const std::size_t whole = digitCount(text.substr(at));
@@ -129,6 +132,17 @@ double decimalValue(std::string_view text) {
     value = isHuge(text) ? std::numeric_limits<double>::infinity() : 0;
   }
   return negative ? -value : value;
+}
+
+std::optional<double> namedReal(std::string_view text) {
+  std::string name(text.substr(0, longestRealName + 1));
+  for (char& c : name) c = c >= 'A' && c <= 'Z' ? static_cast<char>(c | 0x20) : c;
+  if (name == "nan") return std::numeric_limits<double>::quiet_NaN();
+  const bool negative = name.starts_with('-');
+  if (!name.empty() && isSign(name.front())) name.erase(0, 1);
+  if (name != "inf" && name != "infinity") return std::nullopt;
+  const double infinity = std::numeric_limits<double>::infinity();
+  return negative ? -infinity : infinity;
 }
 
 }  // namespace toolkit

@@ -27,11 +27,17 @@ bool boolValueOf(std::string_view text);
 std::int32_t truncatedToInt(double value);
 std::int64_t truncatedToInteger(double value);
 
+/// `text` from its first character on that is no white space.
+std::string_view withoutLeadingSpace(std::string_view text);
+
 /// How many bytes at the start of `text` make up a decimal real: a sign, digits with or without a
 /// point (one digit at least), an exponent that has digits. 0 when none does.
 std::size_t decimalLength(std::string_view text);
 /// The real that `text` stands for, all of which `decimalLength` accepts: the nearest double, or
 /// infinity, or zero with the sign.
 double decimalValue(std::string_view text);
+/// What `nan`, and `inf` or `infinity` with or without a sign, stand for, in any case; nothing for
+/// any other text.
+std::optional<double> namedReal(std::string_view text);
 
 }  // namespace toolkit

@@ -20,7 +20,11 @@ String::String(std::string_view text) : Value(Kind::string), size_(text.size()) 
 }
 
 ValueRef<String> String::make(std::string_view text) {
-  return Counted<String>::adopt(new (Trailing{text.size()}) String(text));
+  return makeAlone<String>(text.size(), text);
+}
+
+String* String::make(Document& document, std::string_view text) {
+  return makeIn<String>(document, text.size(), text);
 }
 
 std::int32_t String::intValue() const { return intValueOf(text()); }
@@ -32,22 +36,23 @@ bool String::boolValue() const { return boolValueOf(text()); }
 
 Number& Number::nothing() { return nothingAs<Number>(); }
 
-ValueRef<Number> Number::make(Type type, std::uint64_t bits) {
-  return Counted<Number>::adopt(new (Trailing{0}) Number(type, bits));
+ValueRef<Number> Number::withBool(bool value) {
+  return makeAlone<Number>(0, Type::boolean, std::uint64_t{value});
 }
-
-ValueRef<Number> Number::withBool(bool value) { return make(Type::boolean, value ? 1 : 0); }
 ValueRef<Number> Number::withLong(std::int64_t value) {
-  return make(Type::signedInteger, static_cast<std::uint64_t>(value));
+  return makeAlone<Number>(0, Type::signedInteger, static_cast<std::uint64_t>(value));
 }
 ValueRef<Number> Number::withUnsignedLong(std::uint64_t value) {
-  return make(Type::unsignedInteger, value);
+  return makeAlone<Number>(0, Type::unsignedInteger, value);
 }
 ValueRef<Number> Number::withFloat(float value) {
-  return make(Type::real32, std::bit_cast<std::uint64_t>(static_cast<double>(value)));
+  return makeAlone<Number>(0, Type::real32, std::bit_cast<std::uint64_t>(double{value}));
 }
 ValueRef<Number> Number::withDouble(double value) {
-  return make(Type::real64, std::bit_cast<std::uint64_t>(value));
+  return makeAlone<Number>(0, Type::real64, std::bit_cast<std::uint64_t>(value));
+}
+Number* Number::make(Document& document, Type type, std::uint64_t bits) {
+  return makeIn<Number>(document, 0, type, bits);
 }
 
 std::uint64_t Number::bits() const {
@@ -76,7 +81,10 @@ bool Number::boolValue() const { return isReal() ? real() != 0 : bits_ != 0; }
 Date& Date::nothing() { return nothingAs<Date>(); }
 
 ValueRef<Date> Date::make(double secondsSinceReferenceDate) {
-  return Counted<Date>::adopt(new (Trailing{0}) Date(secondsSinceReferenceDate));
+  return makeAlone<Date>(0, secondsSinceReferenceDate);
+}
+Date* Date::make(Document& document, double secondsSinceReferenceDate) {
+  return makeIn<Date>(document, 0, secondsSinceReferenceDate);
 }
 
 Data& Data::nothing() { return nothingAs<Data>(); }
@@ -85,16 +93,19 @@ Data::Data(std::string_view bytes) : Value(Kind::data), size_(bytes.size()) {
   copyBehind(this, sizeof *this, bytes);
 }
 
-ValueRef<Data> Data::make(std::string_view bytes) {
-  return Counted<Data>::adopt(new (Trailing{bytes.size()}) Data(bytes));
+ValueRef<Data> Data::make(std::string_view bytes) { return makeAlone<Data>(bytes.size(), bytes); }
+Data* Data::make(Document& document, std::string_view bytes) {
+  return makeIn<Data>(document, bytes.size(), bytes);
 }
 
 Null& Null::nothing() { return nothingAs<Null>(); }
-ValueRef<Null> Null::make() { return Counted<Null>::adopt(new (Trailing{0}) Null(Kind::null)); }
+ValueRef<Null> Null::make() { return makeAlone<Null>(0, Kind::null); }
+Null* Null::make(Document& document) { return makeIn<Null>(document, 0, Kind::null); }
 
 Uid& Uid::nothing() { return nothingAs<Uid>(); }
-ValueRef<Uid> Uid::make(std::uint32_t number) {
-  return Counted<Uid>::adopt(new (Trailing{0}) Uid(number));
+ValueRef<Uid> Uid::make(std::uint32_t number) { return makeAlone<Uid>(0, number); }
+Uid* Uid::make(Document& document, std::uint32_t number) {
+  return makeIn<Uid>(document, 0, number);
 }
 
 namespace {

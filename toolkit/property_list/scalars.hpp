@@ -18,9 +18,11 @@ class String final : public Value {
  public:
   static String& nothing();
   static ValueRef<String> make(std::string_view text);
+  /// As a part of `document`; the caller gets no count.
+  static String* make(Document& document, std::string_view text);
 
   /// The UTF-8; valid as long as the string is.
-  std::string_view text() const { return {trailingBytes(), size_}; }
+  std::string_view text() const { return {reinterpret_cast<const char*>(this + 1), size_}; }
 
   std::int32_t intValue() const override;
   std::int64_t integerValue() const override;
@@ -33,7 +35,6 @@ class String final : public Value {
   friend class Value;
   explicit String(Kind kind) : Value(kind) {}
   explicit String(std::string_view text);
-  const char* trailingBytes() const { return reinterpret_cast<const char*>(this + 1); }
 
   std::size_t size_ = 0;  // of the text, which stands right behind
 };
@@ -49,6 +50,9 @@ class Number final : public Value {
   static ValueRef<Number> withUnsignedLong(std::uint64_t value);
   static ValueRef<Number> withFloat(float value);
   static ValueRef<Number> withDouble(double value);
+  /// As a part of `document`; the caller gets no count. `bits` are the integer's, or those of a
+  /// double for a real of either width.
+  static Number* make(Document& document, Type type, std::uint64_t bits);
 
   Type type() const { return type_; }
   bool isReal() const { return type_ == Type::real32 || type_ == Type::real64; }
@@ -66,7 +70,6 @@ class Number final : public Value {
   friend class Value;
   explicit Number(Kind kind) : Value(kind) {}
   Number(Type type, std::uint64_t bits) : Value(Kind::number), type_(type), bits_(bits) {}
-  static ValueRef<Number> make(Type type, std::uint64_t bits);
   double real() const { return std::bit_cast<double>(bits_); }
 
   Type type_ = Type::signedInteger;
@@ -78,6 +81,7 @@ class Date final : public Value {
  public:
   static Date& nothing();
   static ValueRef<Date> make(double secondsSinceReferenceDate);
+  static Date* make(Document& document, double secondsSinceReferenceDate);
   double secondsSinceReferenceDate() const { return seconds_; }
 
  private:
@@ -93,6 +97,7 @@ class Data final : public Value {
  public:
   static Data& nothing();
   static ValueRef<Data> make(std::string_view bytes);
+  static Data* make(Document& document, std::string_view bytes);
   /// The bytes; valid as long as the data is.
   std::string_view bytes() const { return {reinterpret_cast<const char*>(this + 1), size_}; }
 
@@ -109,6 +114,7 @@ class Null final : public Value {
  public:
   static Null& nothing();
   static ValueRef<Null> make();
+  static Null* make(Document& document);
 
  private:
   friend class Value;
@@ -120,6 +126,7 @@ class Uid final : public Value {
  public:
   static Uid& nothing();
   static ValueRef<Uid> make(std::uint32_t number);
+  static Uid* make(Document& document, std::uint32_t number);
   std::uint32_t number() const { return number_; }
 
  private:

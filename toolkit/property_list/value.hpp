@@ -1,8 +1,9 @@
 // Values: what property lists hold and tables keep.
 //
 // Invariants: a value is shared through counted references and has an identity, its address, for as
-// long as it is referred to. Values read from a file never change. Only arrays and dictionaries can
-// be mutable, and only those made so. The counting is safe on any thread, nothing else is.
+// long as it is referred to. Values read from a file never change; a reference to one of them keeps
+// all of that file's values (see document.hpp). Only arrays and dictionaries can be mutable, and
+// only those made so. The counting is safe on any thread, nothing else is.
 //
 // A value is sent messages without being asked first what it is: what its kind does not understand
 // raises. `->` on an absent reference answers zero, NO or absent.
@@ -16,6 +17,7 @@
 #include <string_view>
 #include <utility>
 
+#include "toolkit/property_list/document.hpp"
 #include "toolkit/ref.hpp"
 
 namespace toolkit {
@@ -111,14 +113,19 @@ class Value {
   /// `( a, b )` and `{ k = v; }`, and the strings in them quoted where that style asks for it.
   std::string description() const;
 
-  void retain() { count_.fetch_add(1, std::memory_order_relaxed); }
+  void retain() {
+    if (inDocument_) return document().retain();
+    count_.fetch_add(1, std::memory_order_relaxed);
+  }
   void release() {
+    if (inDocument_) return document().release();
     if (count_.fetch_sub(1, std::memory_order_acq_rel) == 1) destroy();
   }
 
  protected:
   explicit Value(Kind kind) : kind_(kind) {}
   virtual ~Value() = default;
+  static void operator delete(void* memory) { ::operator delete(memory); }
 
   /// The one object of class T that is nothing. It is never destroyed: it is used until the very
   /// end of the program, where other objects' destructors still run.
@@ -129,14 +136,20 @@ class Value {
     return object;
   }
 
-  /// Bytes that a value keeps right behind itself, in the same allocation.
-  enum class Trailing : std::size_t {};
-  static void* operator new(std::size_t size, Trailing extra) {
-    return ::operator new(size + static_cast<std::size_t>(extra));
+  /// A value of its own that keeps `extra` bytes right behind itself.
+  template <class T, class... Arguments>
+  static Counted<T> makeAlone(std::size_t extra, Arguments&&... arguments) {
+    return Counted<T>::adopt(new (Extra{extra}) T(std::forward<Arguments>(arguments)...));
   }
-  static void* operator new(std::size_t, void* place) { return place; }
-  static void operator delete(void* memory) { ::operator delete(memory); }
-  static void operator delete(void* memory, Trailing) { ::operator delete(memory); }
+  /// The same as a part of a document; it has no count of its own.
+  template <class T, class... Arguments>
+  static T* makeIn(Document& document, std::size_t extra, Arguments&&... arguments) {
+    const Document::Place place = document.place(sizeof(T) + extra);
+    T* value = new (place.memory) T(std::forward<Arguments>(arguments)...);
+    value->inDocument_ = true;
+    value->count_.store(place.distance, std::memory_order_relaxed);
+    return value;
+  }
 
   /// Ends the value, whose last reference is gone.
   virtual void destroy() noexcept;
@@ -144,8 +157,24 @@ class Value {
   void requireUnderstanding(std::string_view selector) const;
 
  private:
+  enum class Extra : std::size_t {};
+  static void* operator new(std::size_t size, Extra extra) {
+    return ::operator new(size + static_cast<std::size_t>(extra));
+  }
+  static void* operator new(std::size_t, void* place) { return place; }
+  static void operator delete(void* memory, Extra) { ::operator delete(memory); }
+  static void operator delete(void*, void*) {}
+
+  Document& document() const {
+    const std::size_t distance = count_.load(std::memory_order_relaxed) * Document::unit;
+    const auto* block = reinterpret_cast<const std::byte*>(this) - distance;
+    return *reinterpret_cast<const Document::Block*>(block)->document;
+  }
+
+  // In a document: how many units the value stands from the start of its block.
   std::atomic<std::uint32_t> count_{1};
   Kind kind_;
+  bool inDocument_ = false;
 };
 
 /// Whether arrays and dictionaries can change: `ignored` ones swallow every change (they stand for

@@ -50,11 +50,11 @@ class Link {
 
 /// The attributes of a run; an absent one leaves the choice to whoever draws the text.
 struct TextAttributes {
-  std::optional<Font> font;
-  std::optional<Color> foregroundColor;
-  std::optional<Color> backgroundColor;
-  std::optional<ParagraphStyle> paragraphStyle;
-  std::optional<Link> link;
+  std::optional<Font> font{};
+  std::optional<Color> foregroundColor{};
+  std::optional<Color> backgroundColor{};
+  std::optional<ParagraphStyle> paragraphStyle{};
+  std::optional<Link> link{};
   bool underline = false;
   bool strikethrough = false;
   int superscript = 0;  ///< steps above the base line; negative below it

@@ -1,9 +1,10 @@
 // Turns a document's tags and text into styled text: which elements are open, what a tag closes
 // besides, what each writes.
 //
-// Where elements overlap, formatting that is still open goes on behind the element that ends: in
-// `<b><i></b>x</i>` x is in italics. So an end tag takes its element out from under the others
-// where it is formatting, and closes the others with it where it is not.
+// Where elements overlap, formatting goes on: in `<b><i></b>x</i>` x is in italics, and in
+// `<p><i></p><p>x</i></p>` it is as well. So the end tag of formatting takes its element out from
+// under those within it, and any other end tag suspends the formatting that it closes, until the
+// next text resumes it.
 #pragma once
 
 #include <cstddef>
@@ -32,38 +33,52 @@ class Builder {
   AttributedString finish();
 
  private:
-  struct Element {
-    Tag tag;
-    /// On the heap, for styles point to what they hold.
-    std::unique_ptr<const Declarations> declarations;
-    Style style;
-    // Of a list: how its items are marked, and the number of the next.
+  /// How the items of a list are marked, and the number of the next.
+  struct List {
     MarkerKind marker = MarkerKind::disc;
     std::int64_t number = 1;
-    // Of a row: whether it has a cell yet, and where its text begins.
+  };
+
+  /// Whether a row has a cell yet, and where its text begins.
+  struct Row {
     bool hasCell = false;
     std::size_t textBegin = 0;
   };
 
-  /// The position of an open element. The body, at 0, is never looked for: 0 is "none".
+  struct Element {
+    Tag tag;
+    /// On the heap, for styles point to what they hold.
+    std::unique_ptr<const Declarations> declarations;
+    Style style{};
+    List list{};                              ///< of a list
+    Row row{};                                ///< of a row
+    std::vector<Element> suspendedOutside{};  ///< of a cell: it begins with nothing suspended
+  };
+
+  /// The position of an open element. The document itself, at 0, is never looked for: 0 is "none".
   using Position = std::size_t;
 
-  void readBody(const Attributes& attributes);
+  void colorLinks(const Attributes& body);
   void open(Tag tag, const Attributes& attributes);
-  void push(Tag tag, const Attributes& attributes);
+  Element element(Tag tag, const Attributes& attributes) const;
+  void push(Element element);
+  Element pop();
 
   void closeForStart(Tag tag);
   void closeForTablePart(Tag tag);
-  bool closeNearest(const TagSet& wanted, const TagSet& barriers);
+  bool closeNearest(const TagSet& wanted, const TagSet& barriers = {});
   void closeFrom(Position first);
   void leave(const Element& element);
-  void removeFormatting(Tag tag);
+  void endFormatting(Tag tag);
+  void resumeFormatting();
   void restyleFrom(Position first);
 
-  void startList(Element& list, const Attributes& attributes);
-  void writeMarker(const Attributes& attributes);
+  void enter(Tag tag, const Attributes& attributes);
+  void startList(const Attributes& attributes);
+  void startItem(const Attributes& attributes);
   void startCell();
   void breakLine();
+  void writeImage();
   void writeRule();
 
   Position nearest(const TagSet& wanted, const TagSet& barriers = {}) const;
@@ -71,11 +86,12 @@ class Builder {
   const Style& style() const { return elements_.back().style; }
 
   StyleSource source_;
-  std::vector<Element> elements_;  // the open ones, the body first
+  std::vector<Element> elements_;   // the open ones, the document first
+  std::vector<Element> suspended_;  // formatting, the innermost first
   TextFlow flow_;
   bool inHead_ = false;
-  bool linkColored_ = false;       // a body has said which colour links have
-  bool dropsNewLine_ = false;      // directly behind <pre>
+  bool linksColored_ = false;  // a body has said which colour links have
+  bool dropsNewLine_ = false;  // directly behind <pre>
 };
 
 }  // namespace toolkit::html

@@ -138,6 +138,7 @@ Color legacyColor(std::string_view value) {
   while (length - from > 2 && isZero(0) && isZero(1) && isZero(2)) ++from;
   std::string telling;
   for (std::size_t part = 0; part < 3; ++part) {
+    if (length == 1) telling += '0';  // "f00", unlike "#f00", is nearly black
     telling += digits.substr(part * length + from, std::min<std::size_t>(length - from, 2));
   }
   return hexColor(telling);

@@ -110,6 +110,10 @@ void declareFontElement(const Attributes& attributes, const Fonts& fonts, Declar
   if (const auto color = attributes[Attribute::color]) own.color = attributeColor(*color);
 }
 
+void declareBody(const Attributes& attributes, Declarations& own) {
+  if (const auto color = attributes[Attribute::text]) own.color = attributeColor(*color);
+}
+
 void declareLink(const Attributes& attributes, const Color& color, Declarations& own) {
   const auto written = attributes[Attribute::href];
   const std::string_view address = written ? trimmed(*written) : std::string_view();
@@ -127,6 +131,7 @@ Declarations declarationsOf(Tag tag, const Attributes& attributes, const StyleSo
   declareLetters(tag, source.fonts, own);
   declareLines(tag, own);
   if (tag == Tag::font) declareFontElement(attributes, source.fonts, own);
+  if (tag == Tag::body) declareBody(attributes, own);
   if (tag == Tag::a) declareLink(attributes, source.linkColor, own);
   if (alignedByAttribute.contains(tag)) {
     if (const auto align = attributes[Attribute::align]) {
@@ -142,6 +147,7 @@ Declarations declarationsOf(Tag tag, const Attributes& attributes, const StyleSo
     readInlineStyle(*css, source.fonts, own);
   }
   if (!aligned.contains(tag)) own.alignment.reset();
+  if (tag == Tag::body) own.backgroundColor.reset();  // the page's, no attribute of text on it
   return own;
 }
 

@@ -33,7 +33,7 @@ void TextFlow::startBlock(const Style& style) {
 }
 
 void TextFlow::endLine(const Style& style) {
-  if (end_ != End::newLine) append("\n", style, End::newLine);
+  if (!isLineEmpty()) append("\n", style, End::newLine);
 }
 
 /// `text` without the white space that does not count, which `end_` tells and is kept up to date
@@ -69,14 +69,19 @@ void TextFlow::append(std::string_view text, const Style& style, End end) {
 }
 
 void TextFlow::append(std::string_view text, const Style& style) {
-  if (hanging_) {
-    const std::string_view line = text.substr(0, text.find('\n'));
-    hanging_ = line.size() == text.size();
-    const std::string_view first = text.substr(0, line.size() + (hanging_ ? 0 : 1));
-    text_.append(first, textAttributes(style, true));
-    text.remove_prefix(first.size());
+  while (!text.empty()) {
+    const bool endsLine = text.front() == '\n';
+    const std::string_view part = endsLine ? text.substr(0, 1) : text.substr(0, text.find('\n'));
+    TextAttributes attributes = textAttributes(style, hanging_);
+    if (isLineEmpty()) paragraph_ = attributes.paragraphStyle;
+    if (endsLine) attributes.paragraphStyle = paragraph_;
+    text_.append(part, attributes);
+    if (endsLine) {
+      hanging_ = false;
+      lineBegin_ = length();
+    }
+    text.remove_prefix(part.size());
   }
-  if (!text.empty()) text_.append(text, textAttributes(style, false));
 }
 
 }  // namespace toolkit::html

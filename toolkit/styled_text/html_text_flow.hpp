@@ -1,9 +1,11 @@
 // The text that a document turns into, as it grows: where white space collapses, where new lines
-// stand, which attributes hold.
+// stand, which attributes hold. A new line belongs to the paragraph that it ends: it has the
+// paragraph style of its first character.
 #pragma once
 
 #include <cstddef>
 #include <cstdint>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -38,7 +40,7 @@ class TextFlow {
   /// A new line, unless the current one is empty.
   void endLine(const Style& style);
 
-  bool isLineEmpty() const { return end_ == End::newLine; }
+  bool isLineEmpty() const { return length() == lineBegin_; }
   std::size_t length() const { return text_.length(); }
 
   AttributedString take() { return std::move(text_); }
@@ -54,8 +56,10 @@ class TextFlow {
 
   AttributedString text_;
   End end_ = End::newLine;  // a text begins as a new line does
-  bool hanging_ = false;    // the current line begins with a marker
-  std::string scratch_;     // kept for its memory
+  std::size_t lineBegin_ = 0;
+  std::optional<ParagraphStyle> paragraph_;  // of the current line's first character
+  bool hanging_ = false;                     // the current line begins with a marker
+  std::string scratch_;                      // kept for its memory
 };
 
 }  // namespace toolkit::html

@@ -80,14 +80,22 @@ MarkerKind bulletAtLevel(std::size_t level) {
 
 std::string marker(MarkerKind kind, std::int64_t number) {
   switch (kind) {
-    case MarkerKind::disc: return "\u2022";
-    case MarkerKind::circle: return "\u25E6";
-    case MarkerKind::square: return "\u25AA";
-    case MarkerKind::decimal: return std::to_string(number) + '.';
-    case MarkerKind::lowerAlpha: return letters(number) + '.';
-    case MarkerKind::upperAlpha: return uppercase(letters(number)) + '.';
-    case MarkerKind::lowerRoman: return roman(number) + '.';
-    case MarkerKind::upperRoman: return uppercase(roman(number)) + '.';
+    case MarkerKind::disc:
+      return "\u2022";
+    case MarkerKind::circle:
+      return "\u25E6";
+    case MarkerKind::square:
+      return "\u25AA";
+    case MarkerKind::decimal:
+      return std::to_string(number) + '.';
+    case MarkerKind::lowerAlpha:
+      return letters(number) + '.';
+    case MarkerKind::upperAlpha:
+      return uppercase(letters(number)) + '.';
+    case MarkerKind::lowerRoman:
+      return roman(number) + '.';
+    case MarkerKind::upperRoman:
+      return uppercase(roman(number)) + '.';
   }
   return {};
 }

@@ -131,9 +131,10 @@ void compareTimers(const StepPicture& before, const StepPicture& now,
     const auto [old, current] = pair;
     if (old && current && isSame(old->identity, current->identity)) continue;
     const auto words = [](const TimerPicture* timer) {
-      return timer ? secondsWords(timer->timeLeft) + " left" : "none";
+      return timer ? "fires " + whenWords(timer->timeLeft) : "none";
     };
-    changes.push_back({"timer of list " + key, words(old), words(current)});
+    const std::string anew = old && current ? "armed anew, " : "";
+    changes.push_back({"timer of list " + key, words(old), anew + words(current)});
   }
 }
 

@@ -11,7 +11,8 @@ namespace tools::play {
 namespace {
 
 constexpr std::size_t widestContent = 44;     // a longer text goes on below
-constexpr std::size_t narrowestRemarks = 24;  // however narrow the terminal
+constexpr std::size_t narrowestContent = 16;  // however narrow the terminal
+constexpr std::size_t narrowestRemarks = 20;  // the same
 constexpr std::size_t hang = 2;               // how far later lines of a paragraph are moved in
 constexpr std::string_view margin = "  ";
 constexpr std::string_view gap = "  ";
@@ -105,7 +106,7 @@ class Renderer {
                                           : "No list was started";
     if (picture_.flashingAllowed) words += "; flashing is allowed";
     for (const TimerPicture& timer : picture_.timers) {
-      words += "; list " + timer.key + " runs in " + secondsWords(timer.timeLeft);
+      words += "; list " + timer.key + " runs " + whenWords(timer.timeLeft);
     }
     if (picture_.ended) words += "; the walk-through has ended";
     addParagraph(words + ".", "");
@@ -117,7 +118,12 @@ class Renderer {
     for (const Row& row : rows) {
       tagWidth_ = std::max(tagWidth_, displayWidth(row.tag));
       kindWidth_ = std::max(kindWidth_, displayWidth(row.kind));
-      for (const std::string& line : wrap(row.content, widestContent)) {
+    }
+    const std::size_t room = widthFrom(contentColumn()) - gap.size();
+    const std::size_t widest =
+        std::clamp(room - std::min(room, narrowestRemarks), narrowestContent, widestContent);
+    for (const Row& row : rows) {
+      for (const std::string& line : wrap(row.content, widest)) {
         contentWidth_ = std::max(contentWidth_, displayWidth(line));
       }
     }

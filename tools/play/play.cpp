@@ -16,6 +16,8 @@
 #include "tools/play/session.hpp"
 #include "tools/play/stage.hpp"
 #include "tools/play/text_layout.hpp"
+#include "tools/scenario/near_miss.hpp"
+#include "tools/scenario/vocabulary.hpp"
 
 namespace tools::play {
 namespace {
@@ -60,6 +62,14 @@ void checkStart(const Script& script, const PlayOptions& options) {
                                             ": expected a list of commands, found " +
                                             foundWords(list));
   }
+}
+
+std::unique_ptr<toolkit::TestDriver> requireDriver(const std::string& name) {
+  if (auto driver = makeDriver(name)) return driver;
+  const auto known = driverNames();
+  throw Failure(ExitStatus::badInput, "unknown toolkit " + printable(name) + "; this build has " +
+                                          scenario::enumerate({known.begin(), known.end()}) +
+                                          scenario::didYouMean(name, known));
 }
 
 void checkDirectory(const std::string& path) {
@@ -112,7 +122,7 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   const fs::path path = fs::absolute(options.script);
   if (options.resources) checkDirectory(*options.resources);
 
-  const auto driver = makeDriver(options.toolkit);
+  const auto driver = requireDriver(options.toolkit);
   driver->setResourcePath(options.resources ? *options.resources : path.parent_path().string());
   connectLog(*driver, terminal);
   Stage stage(*driver, options, script);

@@ -6,6 +6,7 @@
 
 #include "tools/play/text_layout.hpp"
 #include "tools/play/words.hpp"
+#include "tools/scenario/vocabulary.hpp"
 
 namespace tools::play {
 namespace {
@@ -15,22 +16,12 @@ bool canBePressed(const ControlPicture& control) {
          !control.shadowed;
 }
 
-/// "1", "1 or 2", "1, 2 or 3".
-std::string alternatives(const std::vector<std::string>& items) {
-  std::string words;
-  for (std::size_t i = 0; i < items.size(); ++i) {
-    if (i > 0) words += i + 1 == items.size() ? " or " : ", ";
-    words += items[i];
-  }
-  return words;
-}
-
 std::string pressableWords(const StepPicture& picture) {
   std::vector<std::string> buttons;
   for (const ControlPicture& control : picture.controls) {
     if (canBePressed(control)) buttons.push_back(pressWords(picture, control.view.tag));
   }
-  return buttons.empty() ? "; no button can be pressed" : "; press " + alternatives(buttons);
+  return buttons.empty() ? "; no button can be pressed" : "; press " + scenario::enumerate(buttons);
 }
 
 }  // namespace
@@ -73,11 +64,11 @@ std::string standing(const StepPicture& picture) {
     const bool moves = control.hasList && canBePressed(control);
     if (moves) buttons.push_back(pressWords(picture, control.view.tag));
   }
-  if (!buttons.empty()) ways.push_back("a press of " + alternatives(buttons));
+  if (!buttons.empty()) ways.push_back("a press of " + scenario::enumerate(buttons));
   for (const TimerPicture& timer : picture.timers) {
-    ways.push_back("list " + timer.key + " to run in " + secondsWords(timer.timeLeft));
+    ways.push_back("list " + timer.key + " to run " + whenWords(timer.timeLeft));
   }
-  if (!ways.empty()) return "The walk-through waits for " + alternatives(ways) + ".";
+  if (!ways.empty()) return "The walk-through waits for " + scenario::enumerate(ways) + ".";
   return "The walk-through stands still: no timer is pending, and no button that can be pressed "
          "has a list.";
 }

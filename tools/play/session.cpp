@@ -32,7 +32,7 @@ void Session::press(long tag) {
 }
 
 void Session::advance(double seconds) {
-  const std::string heading = "let " + secondsWords(seconds) + " pass";
+  const std::string heading = "let " + numberWords(seconds) + " s pass";
   if (picture().ended) return refuse(heading, "the walk-through has ended");
   run(heading, [&] { driver_.advance(seconds); });
 }

@@ -4,6 +4,7 @@
 #include "tools/play/gui_description.hpp"
 #include "tools/play/input_file.hpp"
 #include "tools/play/stand_in.hpp"
+#include "tools/stack_guard.hpp"
 
 namespace tools::play {
 namespace {
@@ -32,10 +33,12 @@ Stage::Stage(toolkit::TestDriver& driver, const PlayOptions& options,
   } else {
     adopt(standInWindow(script), options.script);
   }
+  guardScript(*engine_, options.script, script);
 }
 
 Stage::~Stage() {
-  if (!engine_ || engine_->terminating()) return;
+  forgetScript();
+  if (engine_->terminating()) return;
   driver_.setLogSink({});  // what is left to be tidied up is no part of the walk-through
   engine_->terminateParser();
 }

@@ -3,8 +3,9 @@
 
 #include <algorithm>
 #include <array>
-#include <cstdint>
 #include <cstdio>
+
+#include "toolkit/property_list/utf8.hpp"
 
 namespace tools::play {
 namespace {
@@ -21,31 +22,14 @@ struct Range {
   char32_t last;
 };
 
-/// The bytes that a leading byte says its character has; 0 for a byte that cannot lead.
-std::size_t sequenceLength(unsigned char lead) {
-  if (lead < 0x80) return 1;
-  if (lead >= 0xC2 && lead < 0xE0) return 2;
-  if (lead >= 0xE0 && lead < 0xF0) return 3;
-  return lead >= 0xF0 && lead < 0xF5 ? 4 : 0;
-}
-
 /// The character at the start of `text`, which is not empty. What is no UTF-8 is one replacement
 /// character a byte; so is a surrogate, which no terminal can show.
 Character firstCharacter(std::string_view text) {
-  const auto lead = static_cast<unsigned char>(text.front());
-  const std::size_t length = sequenceLength(lead);
-  if (length == 1) return {lead, 1};
-  if (length == 0 || length > text.size()) return {};
-  char32_t code = lead & (0xFFU >> (length + 1));
-  for (const char c : text.substr(1, length - 1)) {
-    const auto byte = static_cast<unsigned char>(c);
-    if ((byte & 0xC0U) != 0x80U) return {};
-    code = (code << 6U) | (byte & 0x3FU);
-  }
-  constexpr std::array<char32_t, 5> least = {0, 0, 0x80, 0x800, 0x10000};
-  const bool valid =
-      code >= least.at(length) && code <= 0x10FFFF && (code < 0xD800 || code > 0xDFFF);
-  return valid ? Character{code, length} : Character{};
+  constexpr std::size_t longest = 4;
+  if (toolkit::validUtf8Length(text.substr(0, longest)) == 0) return {};
+  std::size_t length = 0;
+  const char32_t code = toolkit::nextCodePoint(text, length);
+  return {code, length};
 }
 
 template <std::size_t N>
@@ -103,7 +87,7 @@ std::size_t cutOff(std::string_view line, std::size_t width) {
 }
 
 void wrapLine(std::string_view line, std::size_t width, std::vector<std::string>& lines) {
-  while (displayWidth(line) > width) {
+  while (cutOff(line, width) < line.size()) {
     std::size_t end = cutOff(line, width);
     std::size_t next = end;
     // A space that stands just behind the last column still breaks the line there.

@@ -130,9 +130,9 @@ std::string numberWords(double number) {
   return text.data();
 }
 
-std::string secondsWords(double seconds) {
+std::string whenWords(double seconds) {
   constexpr double year = 365.0 * 24 * 3600;
-  return seconds < year ? numberWords(seconds) + " s" : "practically never";
+  return seconds < year ? "in " + numberWords(seconds) + " s" : "practically never";
 }
 
 const toolkit::AttributedString& captionOf(const ControlPicture& control) {

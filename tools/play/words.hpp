@@ -26,8 +26,9 @@ std::string colorWords(const toolkit::Color& color);
 /// The attributes of a run, such as "Times 12 bold, red, centred"; "plain" when it has none.
 std::string styleWords(const toolkit::TextAttributes& attributes);
 
-/// Seconds such as "2 s" or "0.5 s"; "practically never" from a year on.
-std::string secondsWords(double seconds);
+/// When something happens that so many seconds are left to: "in 2.5 s", or, from a year on,
+/// "practically never".
+std::string whenWords(double seconds);
 
 /// A number in as few digits as say it, such as "12" or "12.5".
 std::string numberWords(double number);

@@ -9,11 +9,11 @@
 
 namespace tools::scenario {
 
-void Cast::nameWindow(const std::string& name, toolkit::Link<toolkit::Window> window) {
+void Cast::nameWindow(const std::string& name, toolkit::StoredRef<toolkit::Window> window) {
   windows_.insert_or_assign(name, std::move(window));
 }
 
-void Cast::nameControl(const std::string& name, toolkit::Link<toolkit::View> control) {
+void Cast::nameControl(const std::string& name, toolkit::StoredRef<toolkit::View> control) {
   controls_.insert_or_assign(name, std::move(control));
 }
 
@@ -50,17 +50,17 @@ Cast::View Cast::findControl(const std::string& name) const {
 
 void Cast::letGo(const std::string& name) {
   if (const auto window = windows_.find(name); window != windows_.end()) {
-    window->second = toolkit::Link<toolkit::Window>::refer(window->second.get());
+    window->second = toolkit::StoredRef<toolkit::Window>::refer(window->second.get());
   }
   if (const auto control = controls_.find(name); control != controls_.end()) {
-    control->second = toolkit::Link<toolkit::View>::refer(control->second.get());
+    control->second = toolkit::StoredRef<toolkit::View>::refer(control->second.get());
   }
 }
 
 void Cast::keep(const std::string& controlName) {
   const auto control = controls_.find(controlName);
   if (control == controls_.end()) return;
-  control->second = toolkit::Link<toolkit::View>::own(control->second.get());
+  control->second = toolkit::StoredRef<toolkit::View>::own(control->second.get());
 }
 
 std::optional<std::string> Cast::nameOf(const Window& window) const {

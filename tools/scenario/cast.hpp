@@ -21,8 +21,8 @@ class Cast {
   /// `engines` outlives the cast; its engine knows #TAG, @INDEX and `tutorial`.
   explicit Cast(const EngineHolder& engines) : engines_(engines) {}
 
-  void nameWindow(const std::string& name, toolkit::Link<toolkit::Window> window);
-  void nameControl(const std::string& name, toolkit::Link<toolkit::View> control);
+  void nameWindow(const std::string& name, toolkit::StoredRef<toolkit::Window> window);
+  void nameControl(const std::string& name, toolkit::StoredRef<toolkit::View> control);
 
   /// The window; throws an Unmet when there is none.
   Window window(const std::string& name) const;
@@ -44,8 +44,8 @@ class Cast {
 
  private:
   const EngineHolder& engines_;
-  std::map<std::string, toolkit::Link<toolkit::Window>> windows_;
-  std::map<std::string, toolkit::Link<toolkit::View>> controls_;
+  std::map<std::string, toolkit::StoredRef<toolkit::Window>> windows_;
+  std::map<std::string, toolkit::StoredRef<toolkit::View>> controls_;
 };
 
 }  // namespace tools::scenario

@@ -42,11 +42,11 @@ std::string ClassNames::unified(std::string_view text) const {
   return result;
 }
 
-Json ClassNames::unified(const Json& value) const {
-  if (value.is_string()) return unified(std::string_view(value.get_ref<const std::string&>()));
+Json ClassNames::unifiedTexts(const Json& value) const {
+  if (value.is_string()) return unified(value.get_ref<const std::string&>());
   auto result = value;
   if (value.is_structured()) {
-    for (auto& element : result) element = unified(element);
+    for (auto& element : result) element = unifiedTexts(element);
   }
   return result;
 }

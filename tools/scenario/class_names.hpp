@@ -19,7 +19,7 @@ class ClassNames {
   /// become the same.
   std::string unified(std::string_view text) const;
   /// The same in every text of a value.
-  Json unified(const Json& value) const;
+  Json unifiedTexts(const Json& value) const;
 
  private:
   std::map<std::string, std::string, std::less<>> standsFor_;

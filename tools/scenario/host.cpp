@@ -9,8 +9,7 @@
 
 namespace tools::scenario {
 
-bool HostResponder::tryToPerform(std::string_view name,
-                                 const toolkit::Ref<toolkit::View>& sender) {
+bool HostResponder::tryToPerform(std::string_view name, const toolkit::Ref<toolkit::View>& sender) {
   if (name != action) return false;
   performed_(sender);
   return true;
@@ -24,9 +23,9 @@ void SheetRecorder::sheetDidEnd(const toolkit::Ref<toolkit::Window>& sheet, long
 }
 
 std::vector<Reactions::Reaction> Reactions::take(const Event& event) {
-  const auto taken = std::stable_partition(
-      waiting_.begin(), waiting_.end(),
-      [&](const Reaction& reaction) { return !reaction.isFor(event); });
+  const auto taken =
+      std::stable_partition(waiting_.begin(), waiting_.end(),
+                            [&](const Reaction& reaction) { return !reaction.isFor(event); });
   std::vector<Reaction> reactions(std::make_move_iterator(taken),
                                   std::make_move_iterator(waiting_.end()));
   waiting_.erase(taken, waiting_.end());

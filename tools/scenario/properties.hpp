@@ -1,5 +1,5 @@
-// The properties of the engine, of controls and of windows: what they show, and what they can be set
-// to.
+// The properties of the engine, of controls and of windows: what they show, and what they can be
+// set to.
 #pragma once
 
 #include <functional>
@@ -28,6 +28,9 @@ Reading readWindowProperty(Stage& stage, const Cast::Window& window, std::string
 void writeEngineProperty(Stage& stage, Engine& engine, std::string_view name, const Wanted& value);
 void writeControlProperty(Stage& stage, const Cast::View& control, std::string_view name,
                           const Wanted& value);
+
+/// `engine`, `host`, `other` or nothing.
+Reading showResponder(const Stage& stage, const std::shared_ptr<toolkit::Responder>& responder);
 
 /// A timer as it shows: its interval, and whether it can still fire.
 Reading showTimer(const toolkit::Ref<toolkit::Timer>& timer);

@@ -118,8 +118,8 @@ bool isNewName(const Word& word, SlotContext& context) {
 
 NameKind requireDeclared(const Word& word, const SlotContext& context) {
   if (const auto kind = context.names.kindOf(word.text)) return *kind;
-  throw SyntaxError(
-      word.at, inQuotes(word.text) + " is not declared" + didYouMean(word.text, context.names.all()));
+  throw SyntaxError(word.at, inQuotes(word.text) + " is not declared" +
+                                 didYouMean(word.text, context.names.all()));
 }
 
 template <NameKind... kinds>
@@ -170,8 +170,6 @@ const PropertyInfo& requireProperty(const Word& word, const Path& path, const Su
   throw SyntaxError(word.at, std::string(subject.described) + " has no property " +
                                  inQuotes(*path.property) + didYouMean(*path.property, names));
 }
-
-constexpr Takes anyExpectation = anyJson | Takes::absent | Takes::present | Takes::empty;
 
 bool isReadable(const Word& word, SlotContext& context) {
   if (word.kind != Word::Kind::bare) return false;

@@ -28,6 +28,7 @@ struct Kept {
   std::function<Reading()> read;
   toolkit::Ref<toolkit::Timer> timer;  ///< absent when it is a table
   bool isFlasher = false;
+  bool namesClasses = false;  ///< its texts are names of classes
 };
 
 /// What a statement's call gave.

@@ -6,6 +6,7 @@
 #include <cmath>
 #include <cstdint>
 #include <limits>
+#include <span>
 #include <string>
 #include <utility>
 #include <vector>
@@ -34,11 +35,15 @@ Json fromReal(double real) {
 
 Json fromNumber(const Number& number) {
   switch (number.type()) {
-    case Number::Type::boolean: return number.boolValue();
-    case Number::Type::unsignedInteger: return number.bits();
-    case Number::Type::signedInteger: return number.integerValue();
+    case Number::Type::boolean:
+      return number.boolValue();
+    case Number::Type::unsignedInteger:
+      return number.bits();
+    case Number::Type::signedInteger:
+      return number.integerValue();
     case Number::Type::real32:
-    case Number::Type::real64: break;
+    case Number::Type::real64:
+      break;
   }
   return fromReal(number.doubleValue());
 }
@@ -54,7 +59,7 @@ std::string hexadecimal(std::string_view bytes) {
   return text;
 }
 
-Json fromElements(const std::vector<ValueRef<>>& elements) {
+Json fromElements(std::span<const ValueRef<>> elements) {
   auto json = Json::array();
   for (const auto& element : elements) json.push_back(toJson(element));
   return json;
@@ -91,19 +96,25 @@ Json toJson(const ValueRef<>& value) {
   using Kind = toolkit::Value::Kind;
   switch (value->kind()) {
     case Kind::nothing:
-    case Kind::null: break;
-    case Kind::string: return std::string(static_cast<const toolkit::String&>(*value).text());
-    case Kind::number: return fromNumber(static_cast<const Number&>(*value));
-    case Kind::array: return fromElements(static_cast<const toolkit::Array&>(*value).elements());
-    case Kind::dictionary: return fromDictionary(static_cast<const toolkit::Dictionary&>(*value));
+    case Kind::null:
+      break;
+    case Kind::string:
+      return std::string(static_cast<const toolkit::String&>(*value).text());
+    case Kind::number:
+      return fromNumber(static_cast<const Number&>(*value));
+    case Kind::array:
+      return fromElements(static_cast<const toolkit::Array&>(*value).elements());
+    case Kind::dictionary:
+      return fromDictionary(static_cast<const toolkit::Dictionary&>(*value));
     case Kind::set:
       return {{"set", fromElements(static_cast<const toolkit::Set&>(*value).elements())}};
     case Kind::data:
       return {{"data", hexadecimal(static_cast<const toolkit::Data&>(*value).bytes())}};
-    case Kind::uid: return {{"uid", static_cast<const toolkit::Uid&>(*value).number()}};
+    case Kind::uid:
+      return {{"uid", static_cast<const toolkit::Uid&>(*value).number()}};
     case Kind::date:
-      return {
-          {"date", fromReal(static_cast<const toolkit::Date&>(*value).secondsSinceReferenceDate())}};
+      return {{"date",
+               fromReal(static_cast<const toolkit::Date&>(*value).secondsSinceReferenceDate())}};
   }
   return nullptr;
 }

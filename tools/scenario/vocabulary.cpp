@@ -2,6 +2,8 @@
 
 #include "tools/scenario/vocabulary.hpp"
 
+#include <algorithm>
+#include <cassert>
 #include <utility>
 
 namespace tools::scenario {
@@ -108,6 +110,13 @@ std::string show(const Wanted& wanted) {
       break;
   }
   return show(wanted.value);
+}
+
+const PropertyInfo& infoNamed(const std::vector<PropertyInfo>& infos, std::string_view name) {
+  const auto found = std::find_if(infos.begin(), infos.end(),
+                                  [&](const PropertyInfo& info) { return info.name == name; });
+  assert(found != infos.end());
+  return *found;
 }
 
 std::string fullConstantName(std::string_view name) {

@@ -54,6 +54,8 @@ constexpr bool includes(Takes all, Takes some) {
 inline constexpr Takes anyJson =
     Takes::flag | Takes::number | Takes::text | Takes::list | Takes::object;
 
+inline constexpr Takes anyExpectation = anyJson | Takes::absent | Takes::present | Takes::empty;
+
 /// A value as it is written in a scenario.
 struct Wanted {
   enum class Kind { value, absent, present, empty };
@@ -79,7 +81,11 @@ struct PropertyInfo {
   std::string_view name;
   Takes read = Takes::nothing;     ///< what it can be expected to be
   Takes written = Takes::nothing;  ///< what it can be set to
+  bool namesClasses = false;       ///< its texts are names of classes
 };
+
+/// The property named; one that is not there is a mistake of ours.
+const PropertyInfo& infoNamed(const std::vector<PropertyInfo>& infos, std::string_view name);
 
 struct Vocabulary {
   std::vector<Form> forms;

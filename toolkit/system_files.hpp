@@ -1,5 +1,4 @@
-// The memory toolkit's files: those of the file system, with a resource directory that the host
-// chooses.
+// Files as the operating system has them, for toolkits that have nothing of their own.
 #pragma once
 
 #include <optional>
@@ -8,15 +7,15 @@
 
 #include "toolkit/files.hpp"
 
-namespace toolkit::memory {
+namespace toolkit {
 
-class MemoryFiles final : public Files {
+class SystemFiles final : public Files {
  public:
-  /// The resource directory is the working directory, as it was then, until another is set.
-  MemoryFiles() { setResourcePath("."); }
+  /// The resource directory is the working directory until another is set.
+  SystemFiles() { setResourcePath(""); }
 
   std::string resourcePath() const override { return resourcePath_; }
-  /// A relative path is taken from the working directory.
+  /// A relative path, and an empty one, starts at the working directory of this moment.
   void setResourcePath(std::string_view path);
 
   bool fileExistsAtPath(std::string_view path) const override;
@@ -30,4 +29,4 @@ class MemoryFiles final : public Files {
 /// Whether a regular file, or a link to one, is at `path`.
 bool isRegularFile(std::string_view path);
 
-}  // namespace toolkit::memory
+}  // namespace toolkit

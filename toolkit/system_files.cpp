@@ -1,10 +1,13 @@
-#include "toolkit/memory/files.hpp"
+// Files through the standard library, which reports everything by error codes here: a path that
+// cannot be looked at is a path where nothing is.
+
+#include "toolkit/system_files.hpp"
 
 #include <filesystem>
 #include <fstream>
 #include <system_error>
 
-namespace toolkit::memory {
+namespace toolkit {
 
 namespace fs = std::filesystem;
 
@@ -28,18 +31,17 @@ fs::file_status statusOf(std::string_view path) {
 
 }  // namespace
 
-void MemoryFiles::setResourcePath(std::string_view path) {
+void SystemFiles::setResourcePath(std::string_view path) {
   std::error_code error;
-  const fs::path absolute = fs::absolute(systemPath(path), error).lexically_normal();
-  resourcePath_ = utf8(absolute);
+  resourcePath_ = utf8(fs::current_path(error) / systemPath(path));
   while (resourcePath_.ends_with('/')) resourcePath_.pop_back();
 }
 
-bool MemoryFiles::fileExistsAtPath(std::string_view path) const {
+bool SystemFiles::fileExistsAtPath(std::string_view path) const {
   return fs::exists(statusOf(path));
 }
 
-std::optional<std::string> MemoryFiles::contentsAtPath(std::string_view path) const {
+std::optional<std::string> SystemFiles::contentsAtPath(std::string_view path) const {
   if (!isRegularFile(path)) return std::nullopt;
   std::ifstream file(systemPath(path), std::ios::binary);
   if (!file) return std::nullopt;
@@ -53,4 +55,4 @@ std::optional<std::string> MemoryFiles::contentsAtPath(std::string_view path) co
 
 bool isRegularFile(std::string_view path) { return fs::is_regular_file(statusOf(path)); }
 
-}  // namespace toolkit::memory
+}  // namespace toolkit

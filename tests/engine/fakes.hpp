@@ -1,0 +1,104 @@
+// A window and views of a test's own, which note what they are told and can be made to misbehave.
+#pragma once
+
+#include <functional>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "toolkit/view.hpp"
+#include "toolkit/window.hpp"
+
+namespace fakes {
+
+/// A view of the role given that understands what every view does, and notes the calls that change
+/// or ask how it is drawn.
+template <class Role>
+class FakeRole : public Role {
+ public:
+  explicit FakeRole(long tag = 0) : tag_(tag) {}
+
+  std::string className() const override { return "Fake"; }
+  long tag() const override { return tag_; }
+  void setTag(long tag) override { tag_ = tag; }
+  toolkit::Rect frame() const override { return {}; }
+  const toolkit::Subviews& subviews() const override { return views; }
+  void addSubview(const toolkit::Ref<toolkit::View>& view) override { views.push_back(view); }
+  void setHidden(bool hidden) override { note(hidden ? "hide" : "show"); }
+  void setToolTip(std::string_view) override {}
+  bool needsDisplay() const override {
+    note("needsDisplay");
+    return false;
+  }
+  void setWantsLayer(bool wants) override { note(wants ? "layer" : "no layer"); }
+  void setLayerContents(const toolkit::Ref<toolkit::Image>&) override { note("contents"); }
+  void setEnabled(bool enabled) override { note(enabled ? "enable" : "disable"); }
+
+  toolkit::Subviews views;
+  /// What happened to the view, in order.
+  mutable std::vector<std::string> calls;
+  /// Called with every call before it is noted.
+  std::function<void(const std::string&)> onCall;
+
+ private:
+  void note(const std::string& call) const {
+    if (onCall) onCall(call);
+    calls.push_back(call);
+  }
+
+  long tag_;
+};
+
+/// A view that passes for a kind of control where the kind is only asked for.
+class FakeView : public FakeRole<toolkit::View> {
+ public:
+  enum class Kind { plain, button, textField, imageView };
+
+  explicit FakeView(long tag = 0, Kind kind = Kind::plain) : FakeRole(tag), kind_(kind) {}
+
+  toolkit::Button* asButton() override { return as<toolkit::Button>(Kind::button); }
+  toolkit::TextField* asTextField() override { return as<toolkit::TextField>(Kind::textField); }
+  toolkit::ImageView* asImageView() override { return as<toolkit::ImageView>(Kind::imageView); }
+
+ private:
+  template <class T>
+  T* as(Kind kind) const {
+    return kind_ == kind ? &T::nothing() : nullptr;
+  }
+
+  Kind kind_;
+};
+
+class FakeWindow final : public toolkit::Window {
+ public:
+  explicit FakeWindow(toolkit::Ref<toolkit::View> content) : content_(std::move(content)) {}
+
+  toolkit::Ref<toolkit::View> contentView() const override { return content_; }
+  std::shared_ptr<toolkit::Responder> delegate() const override { return delegate_.lock(); }
+  void setDelegate(const std::shared_ptr<toolkit::Responder>& delegate) override {
+    delegate_ = delegate;
+  }
+  void setBackgroundColor(const toolkit::Color&) override {}
+  void makeKeyAndOrderFront() override {}
+  void orderOut() override {}
+  void close() override {
+    ++closes;
+    if (onClose) onClose();
+  }
+
+  int closes = 0;
+  std::function<void()> onClose;
+
+ private:
+  toolkit::Ref<toolkit::View> content_;
+  std::weak_ptr<toolkit::Responder> delegate_;
+};
+
+/// A window over one view of the test's own.
+inline std::shared_ptr<FakeWindow> windowWith(const std::shared_ptr<toolkit::View>& view) {
+  const auto content = std::make_shared<FakeRole<toolkit::View>>();
+  content->views.emplace_back(view);
+  return std::make_shared<FakeWindow>(content);
+}
+
+}  // namespace fakes

@@ -1,0 +1,149 @@
+// The runner: which exceptions it catches, and lists that no scenario can write.
+
+#include <gtest/gtest.h>
+
+#include <functional>
+#include <memory>
+#include <new>
+#include <stdexcept>
+#include <string>
+#include <utility>
+#include <vector>
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "tests/engine/fakes.hpp"
+#include "toolkit/memory/memory_driver.hpp"
+
+namespace {
+
+using toolkit::Array;
+using toolkit::Number;
+using toolkit::String;
+using toolkit::ValueRef;
+
+ValueRef<> text(std::string_view text) { return String::make(text); }
+
+class Runner : public testing::Test {
+ protected:
+  Runner() {
+    driver.setLogSink([this](std::string_view line) { log.emplace_back(line); });
+    engine->setTutorialWindow(fakes::windowWith(view));
+  }
+
+  bool run(std::vector<ValueRef<>> elements) {
+    return engine->processCommandArray(Array::make(std::move(elements)), Number::withLong(tag));
+  }
+
+  static constexpr long tag = 7;
+  std::vector<std::string> log;
+  toolkit::memory::MemoryDriver driver;
+  std::shared_ptr<fakes::FakeView> view = std::make_shared<fakes::FakeView>(tag);
+  std::shared_ptr<QZ_Plist_State_Parser> engine = QZ_Plist_State_Parser::init(driver.toolkit());
+};
+
+TEST_F(Runner, CatchesEveryKindOfToolkitExceptionAndLogsItsReason) {
+  const std::function<void()> raises[] = {
+      [] { throw toolkit::Exception("NSGenericException", "out of order"); },
+      [] { throw toolkit::RangeException("out of order"); },
+      [] { throw toolkit::InvalidArgumentException("out of order"); },
+  };
+  for (const auto& raise : raises) {
+    view->onCall = [&](const std::string&) { raise(); };
+    EXPECT_TRUE(run({text("IDLE_LOOP"), text("HIDE_OBJECT_WITH_ID")}));
+  }
+  EXPECT_EQ(log, std::vector<std::string>(3, "Exception in processCommandArray: out of order"));
+}
+
+TEST_F(Runner, LetsEverythingElseThrough) {
+  view->onCall = [](const std::string&) { throw std::bad_alloc(); };
+  EXPECT_THROW(run({text("HIDE_OBJECT_WITH_ID")}), std::bad_alloc);
+  EXPECT_THROW(run({Array::make({text("HIDE_OBJECT_WITH_ID")})}), std::bad_alloc);
+  view->onCall = [](const std::string&) { throw std::runtime_error("not the toolkit's"); };
+  EXPECT_THROW(run({text("HIDE_OBJECT_WITH_ID")}), std::runtime_error);
+  view->onCall = [](const std::string&) { throw 5; };
+  EXPECT_THROW(run({text("HIDE_OBJECT_WITH_ID")}), int);
+  EXPECT_TRUE(log.empty());
+}
+
+TEST_F(Runner, LetsThemThroughNestedRunsToo) {
+  engine->setPlistDictionary(toolkit::Dictionary::make());
+  engine->plistDictionary()->setObject(Array::make({text("HIDE_OBJECT_WITH_ID")}), "7");
+  view->onCall = [](const std::string&) { throw std::bad_alloc(); };
+  EXPECT_THROW(run({Array::make({text("PROCESS_COMMANDS_FOR_ID"), text("7")})}), std::bad_alloc);
+  EXPECT_TRUE(log.empty());
+}
+
+TEST_F(Runner, WorksOnAfterAnExceptionWentThrough) {
+  view->onCall = [](const std::string&) { throw std::bad_alloc(); };
+  EXPECT_THROW(run({text("HIDE_OBJECT_WITH_ID")}), std::bad_alloc);
+  EXPECT_EQ(engine->currentCommandState(), "7");
+  view->onCall = nullptr;
+  EXPECT_TRUE(run({text("HIDE_OBJECT_WITH_ID"), text("IDLE_LOOP")}));
+  EXPECT_EQ(view->calls, std::vector<std::string>{"hide"});
+}
+
+TEST_F(Runner, ARaisingViewIsAnElementThatRaised) {
+  view->onCall = [](const std::string&) { throw toolkit::RangeException("no"); };
+  EXPECT_TRUE(run({text("IDLE_LOOP"), Array::make({text("DISABLE_OBJECT_WITH_ID")})}));
+  EXPECT_EQ(log.size(), 1U);
+}
+
+TEST_F(Runner, RunsAMillionElements) {
+  std::vector<ValueRef<>> elements(1'000'000, text("SHOW_OBJECT_WITH_ID"));
+  elements.back() = text("IDLE_LOOP");
+  EXPECT_TRUE(run(std::move(elements)));
+  EXPECT_EQ(view->calls.size(), 999'999U);
+}
+
+TEST_F(Runner, RunsAMillionCompoundElements) {
+  const ValueRef<> hide = Array::make({text("hide_object_with_id"), Number::withLong(tag)});
+  EXPECT_TRUE(run(std::vector<ValueRef<>>(1'000'000, hide)));
+  EXPECT_EQ(view->calls.size(), 2'000'000U);  // each is hidden, and asked about a redraw
+}
+
+TEST_F(Runner, TakesTheElementsThatThereWereAtTheStart) {
+  const auto list = Array::make({text("HIDE_OBJECT_WITH_ID"), text("IDLE_LOOP")});
+  view->onCall = [&](const std::string&) { list->addObject(text("NO_SUCH_COMMAND")); };
+  EXPECT_TRUE(engine->processCommandArray(list, Number::withLong(tag)));
+  EXPECT_EQ(list->count(), 3U);
+}
+
+TEST_F(Runner, ElementsThatVanishMeanwhileRaiseOneByOne) {
+  const auto list =
+      Array::make({text("HIDE_OBJECT_WITH_ID"), text("IDLE_LOOP"), text("IDLE_LOOP")});
+  view->onCall = [&](const std::string&) { list->removeAllObjects(); };
+  EXPECT_FALSE(engine->processCommandArray(list, Number::withLong(tag)));
+  EXPECT_EQ(log.size(), 2U);
+}
+
+TEST_F(Runner, ACommandsParametersAreItsOwnList) {
+  const auto command = Array::make({text("set_tool_tip_for_id"), text("tip")});
+  EXPECT_TRUE(run({command, command}));
+  EXPECT_EQ(command->count(), 2U);
+}
+
+TEST_F(Runner, TheIdIsHandedOnAsItIs) {
+  const auto id = Number::withDouble(7.9);
+  EXPECT_FALSE(engine->processCommandArray(Array::make({text("HIDE_OBJECT_WITH_ID")}), id));
+  EXPECT_TRUE(engine->lastTagId() == id);
+  EXPECT_EQ(engine->currentCommandState(), "7");
+  EXPECT_EQ(view->calls, std::vector<std::string>{"hide"});
+}
+
+TEST_F(Runner, WithoutAnIdARunIsForTheTag0) {
+  view->setTag(0);
+  EXPECT_FALSE(engine->processCommandArray(Array::make({text("HIDE_OBJECT_WITH_ID")}), nullptr));
+  EXPECT_FALSE(engine->lastTagId());
+  EXPECT_EQ(engine->currentCommandState(), "0");
+  EXPECT_EQ(view->calls, std::vector<std::string>{"hide"});
+}
+
+// The dispatcher itself expects upper case: the runner sees to that.
+TEST_F(Runner, TheDispatcherTakesNamesToTheLetter) {
+  const auto id = Number::withLong(tag);
+  EXPECT_FALSE(engine->doCompoundCommand("hide_object_with_id", Array::make(), id));
+  EXPECT_TRUE(engine->doCompoundCommand("HIDE_OBJECT_WITH_ID", Array::make(), id));
+  EXPECT_THROW(engine->doCompoundCommand("FLASH_ID", Array::make(), id), toolkit::RangeException);
+}
+
+}  // namespace

@@ -1,0 +1,124 @@
+// Upper case by the rules of Unicode: every class of letter, and whatever is no letter.
+
+#include "toolkit/uppercase.hpp"
+
+#include <gtest/gtest.h>
+
+#include <string>
+#include <string_view>
+
+namespace {
+
+using toolkit::uppercased;
+
+struct Case {
+  const char* name;
+  std::string_view text;
+  std::string_view upper;
+};
+
+void check(const Case& wanted) { EXPECT_EQ(uppercased(wanted.text), wanted.upper) << wanted.name; }
+
+TEST(Uppercase, SingleLetters) {
+  constexpr Case cases[] = {
+      {"ASCII", "abcxyz", "ABCXYZ"},
+      {"ASCII around the letters", "@[`{/:09AZ_", "@[`{/:09AZ_"},
+      {"Latin-1", "àöøþ", "ÀÖØÞ"},
+      {"no letter between Latin-1's", "÷×", "÷×"},
+      {"out of Latin-1", "ÿ", "Ÿ"},
+      {"the micro sign", "µ", "Μ"},
+      {"pairs side by side", "āăĳžǆ", "ĀĂĲŽǄ"},
+      {"the title-case digraphs", "ǅǈǋǲ", "ǄǇǊǱ"},
+      {"the dotless i", "ı", "I"},
+      {"the long s", "ſ", "S"},
+      {"letters whose capitals lie apart", "ɐɽɫʞ", "ⱯⱤⱢꞰ"},
+      {"Greek", "αβγώϊ", "ΑΒΓΏΪ"},
+      {"the final sigma", "ςσ", "ΣΣ"},
+      {"Greek symbols", "ϐϑϕϖϰϱϵ", "ΒΘΦΠΚΡΕ"},
+      {"Cyrillic", "абвяёџ", "АБВЯЁЏ"},
+      {"Armenian", "աֆ", "ԱՖ"},
+      {"Georgian", "აჰ", "ᲐᲰ"},
+      {"Cherokee", "ꭰꮿᏸ", "ᎠᏯᏰ"},
+      {"Glagolitic and Coptic", "ⰰⲁ", "ⰀⲀ"},
+      {"Roman numerals", "ⅰⅿ", "ⅠⅯ"},
+      {"letters in circles", "ⓐⓩ", "ⒶⓏ"},
+      {"full-width letters", "ａｚ", "ＡＺ"},
+      {"letters beyond 16 bits", "𐐨𞤢", "𐐀𞤀"},
+      {"the combining iota", "\u0345", "Ι"},
+  };
+  for (const Case& wanted : cases) check(wanted);
+}
+
+TEST(Uppercase, LettersThatBecomeSeveral) {
+  constexpr Case cases[] = {
+      {"the sharp s", "straße", "STRASSE"},
+      {"Latin ligatures", "ﬀﬁﬂﬃﬄﬅﬆ", "FFFIFLFFIFFLSTST"},
+      {"Armenian ligatures", "ևﬓ", "ԵՒՄՆ"},
+      {"letters with marks that have no capital", "ŉǰẖẗẘẙẚ", "ʼNJ̌H̱T̈W̊Y̊Aʾ"},
+      {"Greek with two marks", "ΐΰ", "Ϊ́Ϋ́"},
+      {"Greek with an iota below", "ᾳῃῳᾀ", "ΑΙΗΙΩΙἈΙ"},
+      {"Greek with an iota beside", "ᾼῌῼᾈ", "ΑΙΗΙΩΙἈΙ"},
+  };
+  for (const Case& wanted : cases) check(wanted);
+}
+
+TEST(Uppercase, WhatHasNoUpperCaseStays) {
+  using namespace std::string_view_literals;
+  const Case cases[] = {
+      {"nothing", "", ""},
+      {"capitals", "ABCÄÖΩЖİ", "ABCÄÖΩЖİ"},
+      {"signs that look like letters", "K Å ℵ", "K Å ℵ"},
+      {"letters without case", "漢字 あア 가 א ا ª º", "漢字 あア 가 א ا ª º"},
+      {"digits and signs", "12 ٣ ½ €", "12 ٣ ½ €"},
+      {"a zero byte", "a\0b"sv, "A\0B"sv},
+      {"pictures", "🙂é", "🙂É"},
+  };
+  for (const Case& wanted : cases) check(wanted);
+}
+
+// A name that is no text matches no command, but must not be lost or read beyond its end either.
+TEST(Uppercase, BytesThatAreNoTextStay) {
+  constexpr Case cases[] = {
+      {"a lone continuation", "a\x80z", "A\x80Z"},
+      {"a lead without continuation", "\xC3z", "\xC3Z"},
+      {"a lead at the end", "z\xC3", "Z\xC3"},
+      {"three bytes cut short", "z\xE2\x93", "Z\xE2\x93"},
+      {"four bytes cut short", "\xF0\x90\x90z", "\xF0\x90\x90Z"},
+      {"bytes that never occur", "a\xFE\xFF\xC0\xC1z", "A\xFE\xFF\xC0\xC1Z"},
+      {"a surrogate", "a\xED\xA0\x80z", "A\xED\xA0\x80Z"},
+  };
+  for (const Case& wanted : cases) check(wanted);
+}
+
+std::string encoded(char32_t c) {
+  const auto byte = [](char32_t bits) { return static_cast<char>(bits); };
+  if (c < 0x80) return {byte(c)};
+  if (c < 0x800) return {byte(0xC0 | c >> 6), byte(0x80 | (c & 0x3F))};
+  if (c < 0x10000) {
+    return {byte(0xE0 | c >> 12), byte(0x80 | (c >> 6 & 0x3F)), byte(0x80 | (c & 0x3F))};
+  }
+  return {byte(0xF0 | c >> 18), byte(0x80 | (c >> 12 & 0x3F)), byte(0x80 | (c >> 6 & 0x3F)),
+          byte(0x80 | (c & 0x3F))};
+}
+
+TEST(Uppercase, UpperCaseIsUpperCaseAlready) {
+  int changed = 0;
+  for (char32_t c = 0; c < 0x110000; ++c) {
+    const std::string text = encoded(c);
+    const std::string upper = uppercased(text);
+    ASSERT_EQ(uppercased(upper), upper) << std::hex << static_cast<unsigned>(c);
+    if (upper != text) ++changed;
+  }
+  EXPECT_GT(changed,
+            1400);  // Unicode has so many letters with another upper case, and more to come
+}
+
+TEST(Uppercase, EveryCharacterIsOnItsOwn) {
+  for (char32_t c = 0x80; c < 0x20000; ++c) {
+    const std::string text = encoded(c);
+    ASSERT_EQ(uppercased("a" + text + "z"), "A" + uppercased(text) + "Z")
+        << std::hex << static_cast<unsigned>(c);
+  }
+}
+
+}  // namespace

@@ -1,0 +1,146 @@
+// The driver: what a host and an observer get to see through it.
+
+#include <gtest/gtest.h>
+
+#include "tests/memory/support.hpp"
+
+namespace toolkit::memory::test {
+namespace {
+
+using DriverTest = MemoryTest;
+
+TEST_F(DriverTest, MakesEveryKindOfView) {
+  const struct {
+    ViewKind kind;
+    const char* className;
+    bool button, textField, imageView;
+  } cases[] = {
+      {ViewKind::button, "NSButton", true, false, false},
+      {ViewKind::toggle, "NSButton", true, false, false},
+      {ViewKind::mixed, "NSButton", true, false, false},
+      {ViewKind::popUpButton, "NSPopUpButton", true, false, false},
+      {ViewKind::textField, "NSTextField", false, true, false},
+      {ViewKind::imageView, "NSImageView", false, false, true},
+      {ViewKind::box, "NSBox", false, false, false},
+      {ViewKind::plain, "NSView", false, false, false},
+  };
+  for (const auto& c : cases) {
+    const Ref<View> view = make(c.kind, 7);
+    EXPECT_EQ(driver.look(view).kind, c.kind) << c.className;
+    EXPECT_EQ(view->className(), c.className);
+    EXPECT_EQ(driver.look(view).className, c.className);
+    EXPECT_EQ(driver.className(c.kind), c.className);
+    EXPECT_EQ(view->tag(), 7);
+    EXPECT_EQ(view->frame(), (Rect{10, 20, 30, 40}));
+    EXPECT_EQ(view->asButton() != nullptr, c.button);
+    EXPECT_EQ(view->asTextField() != nullptr, c.textField);
+    EXPECT_EQ(view->asImageView() != nullptr, c.imageView);
+    EXPECT_EQ(window->contentView()->subviews().back(), view);
+  }
+}
+
+TEST_F(DriverTest, ACaptionIsWhatTheKindShows) {
+  const Directory directory;
+  directory.write("sky.png", "");
+  driver.setResourcePath(directory.path());
+  const struct {
+    ViewKind kind;
+    const char* title;
+    const char* text;
+    std::optional<std::string> image;
+  } cases[] = {
+      {ViewKind::button, "sky", "", std::nullopt},
+      {ViewKind::popUpButton, "sky", "", std::nullopt},
+      {ViewKind::textField, "", "sky", std::nullopt},
+      {ViewKind::imageView, "", "", "sky"},
+      {ViewKind::box, "", "", std::nullopt},
+      {ViewKind::plain, "", "", std::nullopt},
+  };
+  for (const auto& c : cases) {
+    const Ref<View> view = make(c.kind);
+    driver.setCaption(view, "sky");
+    const ViewPicture picture = driver.look(view);
+    EXPECT_EQ(picture.title, AttributedString(c.title));
+    EXPECT_EQ(picture.text, AttributedString(c.text));
+    EXPECT_EQ(picture.image, c.image);
+  }
+}
+
+TEST_F(DriverTest, AnUnknownImageClearsAnImageView) {
+  const Directory directory;
+  directory.write("sky.png", "");
+  driver.setResourcePath(directory.path());
+  const Ref<View> view = make(ViewKind::imageView);
+  driver.setCaption(view, "sky");
+  driver.setCaption(view, "nonesuch");
+  EXPECT_EQ(driver.look(view).image, std::nullopt);
+}
+
+TEST_F(DriverTest, AbsentThingsLookLikeNothing) {
+  const ViewPicture view = driver.look(Ref<View>());
+  EXPECT_EQ(view.className, "");
+  EXPECT_EQ(view.tag, 0);
+  const WindowPicture picture = driver.look(Ref<Window>());
+  EXPECT_FALSE(picture.visible);
+  EXPECT_EQ(picture.closes, 0);
+  driver.setCaption(nullptr, "text");
+  driver.setFrame(nullptr, {});
+  driver.removeFromSuperview(nullptr);
+  EXPECT_TRUE(driver.makeView(ViewKind::button, 4, {}, nullptr));
+}
+
+TEST_F(DriverTest, TimePassesOnTheToolkitsClock) {
+  int firings = 0;
+  toolkit.runLoop().schedule(0.5, true, [&](const Ref<Timer>&) { ++firings; });
+  driver.advance(0.25);
+  EXPECT_EQ(firings, 0);
+  driver.advance(3);
+  EXPECT_EQ(firings, 6);
+  EXPECT_EQ(toolkit.runLoop().now(), 3.25);
+}
+
+TEST(MemoryDriverFactory, MakesADriverThatIsItsOwnWorld) {
+  const std::unique_ptr<TestDriver> one = makeMemoryDriver();
+  const std::unique_ptr<TestDriver> two = makeMemoryDriver();
+  EXPECT_EQ(one->name(), "memory");
+  const Ref<Window> window = one->makeWindow({});
+  const Ref<Window> other = two->makeWindow({});
+  EXPECT_TRUE(one->look(window).key);
+  EXPECT_TRUE(two->look(other).key);
+}
+
+/// Stands for an engine: held by a timer's action, it uses the toolkit to its very end.
+struct Engine : Responder {
+  explicit Engine(Toolkit& used) : toolkit(used) {}
+  ~Engine() override {
+    timer->invalidate();
+    toolkit.log().write("ended");
+    toolkit.images().imageNamed("sky");
+    toolkit.application().endSheet(window, 0);
+    window->close();
+  }
+  Toolkit& toolkit;
+  Ref<Timer> timer;
+  Ref<Window> window;
+};
+
+TEST(MemoryDriverEnd, EnginesThatTimersHoldEndBeforeTheToolkit) {
+  std::string lines;
+  auto driver = std::make_unique<MemoryDriver>();
+  driver->setLogSink([&](std::string_view line) { lines += line; });
+  {
+    const auto engine = std::make_shared<Engine>(driver->toolkit());
+    engine->window = driver->toolkit().application().makeWindow({}, StyleMask::titled,
+                                                                BackingStore::buffered, false);
+    engine->window->makeKeyAndOrderFront();
+    engine->window->setDelegate(engine);
+    engine->timer = driver->toolkit().runLoop().schedule(0.5, true, [engine](const Ref<Timer>&) {});
+  }
+  driver->advance(1);
+  EXPECT_EQ(lines, "");
+  driver = nullptr;
+  EXPECT_EQ(lines, "ended");
+}
+
+}  // namespace
+}  // namespace toolkit::memory::test

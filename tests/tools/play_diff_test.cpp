@@ -1,0 +1,172 @@
+// What changed from one picture to the next.
+#include <gtest/gtest.h>
+
+#include <functional>
+
+#include "play_support.hpp"
+#include "tools/play/picture_diff.hpp"
+
+namespace tools::play {
+
+// For the messages of failed tests.
+void PrintTo(const Change& change, std::ostream* out) {
+  *out << change.what << ": " << change.before << " -> " << change.now;
+}
+
+namespace {
+
+using toolkit::AttributedString;
+using toolkit::TextAttributes;
+using toolkit::ViewKind;
+using Changes = std::vector<Change>;
+
+TextAttributes bold() {
+  TextAttributes attributes;
+  attributes.font = toolkit::Font{"Times", 12, true, false, false};
+  return attributes;
+}
+
+/// Two runs, the second of them bold.
+AttributedString halfBold(const std::string& first, const std::string& second) {
+  AttributedString text(first);
+  text.append(second, bold());
+  return text;
+}
+
+StepPicture oneControl(ViewKind kind) {
+  StepPicture picture = windowPicture();
+  picture.controls = {controlPicture(kind, 7)};
+  return picture;
+}
+
+TEST(PlayDiff, namesEveryChangeOfAControl) {
+  const struct {
+    std::function<void(ControlPicture&)> change;
+    Change expected;
+  } cases[] = {
+      {[](auto& c) { c.view.tag = 40; }, {"tag", "7", "40"}},
+      {[](auto& c) {
+         c.view.frame = {1, 2, 3, 4.5};
+       },
+       {"frame", "0 × 0 at 0, 0", "3 × 4.5 at 1, 2"}},
+      {[](auto& c) { c.view.title = AttributedString("Next"); }, {"title", "“”", "“Next”"}},
+      {[](auto& c) { c.view.text = AttributedString("a\nb"); }, {"text", "“”", "“a\\nb”"}},
+      {[](auto& c) { c.view.image = "disk"; }, {"image", "none", "“disk”"}},
+      {[](auto& c) { c.view.hidden = true; }, {"hidden", "no", "yes"}},
+      {[](auto& c) { c.view.enabled = false; }, {"enabled", "yes", "no"}},
+      {[](auto& c) { c.view.state = toolkit::State::mixed; }, {"state", "off", "mixed"}},
+      {[](auto& c) { c.flashing = true; }, {"flashing", "no", "yes"}},
+      {[](auto& c) { c.view.highlighted = true; }, {"highlighted", "no", "yes"}},
+      {[](auto& c) { c.view.background = toolkit::colors::red; }, {"background", "none", "red"}},
+      {[](auto& c) { c.view.toolTip = "Help"; }, {"tooltip", "none", "“Help”"}},
+  };
+  for (const auto& c : cases) {
+    const StepPicture before = oneControl(ViewKind::button);
+    StepPicture now = before;
+    c.change(now.controls[0]);
+    const PictureChanges changes = diffPictures(before, now);
+    EXPECT_EQ(changes.controls[0].changes, Changes{c.expected});
+    EXPECT_FALSE(changes.none()) << c.expected.what;
+  }
+}
+
+TEST(PlayDiff, namesEveryChangeOfTheWindow) {
+  const struct {
+    std::function<void(toolkit::WindowPicture&)> change;
+    Change expected;
+  } cases[] = {
+      {[](auto& w) {
+         w.content = {0, 0, 10, 20};
+       },
+       {"rectangle", "480 × 320 at 200, 200", "10 × 20 at 0, 0"}},
+      {[](auto& w) { w.visible = false; }, {"on the screen", "yes", "no"}},
+      {[](auto& w) { w.closes = 2; }, {"times closed", "0", "2"}},
+      {[](auto& w) {
+         w.background = {0, 0, 0, 0.5};
+       },
+       {"background", "white", "#000000 at 50%"}},
+      {[](auto& w) { w.layerImage = "paper"; }, {"background image", "none", "“paper”"}},
+  };
+  for (const auto& c : cases) {
+    const StepPicture before = windowPicture();
+    StepPicture now = before;
+    c.change(*now.window);
+    EXPECT_EQ(diffPictures(before, now).window, Changes{c.expected});
+  }
+}
+
+TEST(PlayDiff, stylesCountBesideTheText) {
+  const struct {
+    const char* what;
+    AttributedString before;
+    AttributedString now;
+    Changes expected;
+  } cases[] = {
+      {"the same text in another style",
+       AttributedString("Hi"),
+       AttributedString("Hi", bold()),
+       {{"style", "plain", "Times 12 bold"}}},
+      {"the same text, styled elsewhere",
+       halfBold("ab", "c"),
+       halfBold("a", "bc"),
+       {{"style", "“ab” plain; “c” Times 12 bold", "“a” plain; “bc” Times 12 bold"}}},
+      {"another text in the same styles",
+       halfBold("ab", "c"),
+       halfBold("x", "yz"),
+       {{"text", "“abc”", "“xyz”"}}},
+      {"another text in other styles",
+       halfBold("ab", "c"),
+       AttributedString("x"),
+       {{"text", "“abc”", "“x”"}, {"style", "plain; Times 12 bold", "plain"}}},
+  };
+  for (const auto& c : cases) {
+    StepPicture before = oneControl(ViewKind::textField);
+    before.controls[0].view.text = c.before;
+    StepPicture now = before;
+    now.controls[0].view.text = c.now;
+    EXPECT_EQ(diffPictures(before, now).controls[0].changes, c.expected) << c.what;
+  }
+}
+
+TEST(PlayDiff, controlsAreKnownAgainByThemselvesNotByTheirTag) {
+  StepPicture before = windowPicture();
+  before.controls = {controlPicture(ViewKind::button, 1, "A"),
+                     controlPicture(ViewKind::button, 2, "B")};
+  StepPicture now = before;
+  now.controls[0].view.tag = 2;
+  now.controls[1] = controlPicture(ViewKind::button, 2, "B");
+  const PictureChanges changes = diffPictures(before, now);
+  EXPECT_EQ(changes.controls[0].changes, (Changes{{"tag", "1", "2"}}));
+  EXPECT_TRUE(changes.controls[1].isNew);
+  ASSERT_EQ(changes.gone.size(), 1U);
+  EXPECT_EQ(changes.gone[0].view.title.string(), "B");
+}
+
+TEST(PlayDiff, timersCountWhenArmedAndWhenGone) {
+  StepPicture before = windowPicture();
+  before.timers = {{newIdentity(), "3", 1}, {newIdentity(), "5", 2}, {newIdentity(), "7", 3}};
+  StepPicture now = before;
+  now.timers[0].timeLeft = 0.5;                   // only runs on
+  now.timers[1] = {newIdentity(), "5", 2};        // armed anew
+  now.timers[2] = {newIdentity(), "-1", 1.8e19};  // another one
+  const Changes expected = {{"timer of list -1", "none", "fires practically never"},
+                            {"timer of list 5", "fires in 2 s", "armed anew, fires in 2 s"},
+                            {"timer of list 7", "fires in 3 s", "none"}};
+  EXPECT_EQ(diffPictures(before, now).engine, expected);
+}
+
+TEST(PlayDiff, namesWhatTheEngineIsUpTo) {
+  const StepPicture before = windowPicture();
+  StepPicture now = before;
+  now.lastList = "9";
+  now.flashingAllowed = true;
+  now.ended = true;
+  const Changes expected = {{"list started last", "none", "9"},
+                            {"flashing allowed", "no", "yes"},
+                            {"walk-through ended", "no", "yes"}};
+  EXPECT_EQ(diffPictures(before, now).engine, expected);
+  EXPECT_TRUE(diffPictures(now, now).none());
+}
+
+}  // namespace
+}  // namespace tools::play

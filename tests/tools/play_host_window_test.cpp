@@ -1,0 +1,165 @@
+// Files that describe a host's window.
+#include <gtest/gtest.h>
+
+#include "play_files.hpp"
+#include "toolkit/memory/memory_driver.hpp"
+#include "tools/failure.hpp"
+#include "tools/play/host_window.hpp"
+#include "tools/play/input_file.hpp"
+
+namespace tools::play {
+namespace {
+
+using toolkit::State;
+using toolkit::ViewKind;
+
+HostWindow read(std::string_view text) {
+  const WorkingDirectory directory;
+  directory.write("host.plist", text);
+  return parseHostWindow(readPropertyListFile("host.plist", "a host's window"), "host.plist");
+}
+
+/// What a bad file's message is.
+std::string refusal(std::string_view text) {
+  try {
+    read(text);
+  } catch (const Failure& failure) {
+    EXPECT_EQ(failure.status(), ExitStatus::badInput);
+    return failure.what();
+  }
+  return "accepted";
+}
+
+TEST(PlayHostWindow, readsTheWindowAndItsControls) {
+  const HostWindow host = read(
+      "({class = NSWindow; frame = (1, 2, 300, 200); title = Backup;},"
+      " {class = \"NSButton:mixed\"; tag = \"-7\"; frame = (1, 2.5, 3, 4); title = Go;"
+      "  state = mixed; enabled = NO; hidden = YES; toolTip = Help;})");
+  EXPECT_EQ(host.title, "Backup");
+  EXPECT_EQ(host.content, (toolkit::Rect{1, 2, 300, 200}));
+  ASSERT_EQ(host.controls.size(), 1U);
+  const HostControl& control = host.controls[0];
+  EXPECT_EQ(control.kind, ViewKind::mixed);
+  EXPECT_EQ(control.tag, -7);
+  EXPECT_EQ(control.frame, (toolkit::Rect{1, 2.5, 3, 4}));
+  EXPECT_EQ(control.caption, "Go");
+  EXPECT_EQ(control.state, State::mixed);
+  EXPECT_TRUE(control.hidden);
+  EXPECT_FALSE(control.enabled);
+  EXPECT_EQ(control.toolTip, "Help");
+}
+
+TEST(PlayHostWindow, readsNumbersAndFlagsOfXml) {
+  const HostWindow host = read(
+      "<plist><array><dict><key>class</key><string>NSTextField</string>"
+      "<key>tag</key><integer>4</integer><key>hidden</key><true/>"
+      "<key>frame</key><array><integer>1</integer><real>2.5</real><integer>3</integer>"
+      "<integer>4</integer></array></dict></array></plist>");
+  EXPECT_EQ(host.controls[0].tag, 4);
+  EXPECT_EQ(host.controls[0].frame, (toolkit::Rect{1, 2.5, 3, 4}));
+  EXPECT_TRUE(host.controls[0].hidden);
+}
+
+TEST(PlayHostWindow, whatIsAbsentHasADefault) {
+  const HostWindow host = read("({class = NSTextField; frame = (0, 0, 1, 1);})");
+  EXPECT_EQ(host.title, "");
+  EXPECT_EQ(host.content, (toolkit::Rect{100, 100, 640, 480}));
+  EXPECT_EQ(host.controls[0].tag, 0);
+  EXPECT_EQ(host.controls[0].caption, std::nullopt);
+  EXPECT_TRUE(host.controls[0].enabled);
+  EXPECT_FALSE(host.controls[0].hidden);
+}
+
+TEST(PlayHostWindow, saysWhichEntryIsWrongAndWhatWasExpected) {
+  const std::string frame = "frame = (0, 0, 1, 1);";
+  const struct {
+    std::string text;
+    std::string message;
+  } cases[] = {
+      {"{}", ": expected an array of controls, found a dictionary"},
+      {"(text)", ": entry 1: expected a dictionary, found the string “text”"},
+      {"({" + frame + "})", ": entry 1: class: expected a string, found nothing"},
+      {"({class = NSButon; " + frame + "})",
+       ": entry 1: class: expected one of NSWindow, NSButton, NSButton:toggle, NSButton:mixed, "
+       "NSPopUpButton, NSTextField, NSImageView, NSBox, NSView, found the string “NSButon”"},
+      {"({class = NSView; " + frame + "}, {class = NSWindow; " + frame + "})",
+       ": entry 2: class: expected a control (the window is the first entry), found the string "
+       "“NSWindow”"},
+      {"({class = NSBox; " + frame + " title = x;})",
+       ": entry 1: unknown key “title”; expected class, tag, frame, hidden, toolTip"},
+      {"({class = NSButton; " + frame + " tittle = x;})",
+       ": entry 1: unknown key “tittle”; expected class, tag, frame, hidden, toolTip, title, "
+       "state, enabled; did you mean \"title\"?"},
+      {"({class = NSButton; " + frame + " tag = 1.5;})",
+       ": entry 1: tag: expected a whole number, found the string “1.5”"},
+      {"({class = NSButton; " + frame + " hidden = perhaps;})",
+       ": entry 1: hidden: expected YES or NO, found the string “perhaps”"},
+      {"({class = NSButton; " + frame + " state = mixed;})",
+       ": entry 1: state: expected “on” or “off”, found the string “mixed”"},
+      {"({class = \"NSButton:mixed\"; " + frame + " state = half;})",
+       ": entry 1: state: expected “on”, “off” or “mixed”, found the string “half”"},
+      {"({class = NSButton; " + frame + " title = (x);})",
+       ": entry 1: title: expected a string, found an array of 1"},
+      {"({class = NSWindow; " + frame + " tag = 1;})",
+       ": entry 1: unknown key “tag”; expected class, frame, title"},
+  };
+  for (const auto& c : cases) EXPECT_EQ(refusal(c.text), "host.plist" + c.message) << c.text;
+}
+
+TEST(PlayHostWindow, saysWhatIsWrongWithAFrame) {
+  const std::string four = ": expected four numbers (x, y, width, height), found ";
+  const struct {
+    std::string frame;
+    std::string message;
+  } cases[] = {
+      {"", four + "nothing"},
+      {"frame = wide;", four + "the string “wide”"},
+      {"frame = (0, 0, 1);", four + "an array of 3"},
+      {"frame = (0, 0, 1, x);", "[3]: expected a number, found the string “x”"},
+      {"frame = (0, nan, 1, 1);", "[1]: expected a number, found the string “nan”"},
+      {"frame = (0, 0, \"-1\", 1);",
+       ": expected a width and a height of 0 or more, found an array of 4"},
+  };
+  for (const auto& c : cases) {
+    EXPECT_EQ(refusal("({class = NSView; " + c.frame + "})"),
+              "host.plist: entry 1: frame" + c.message)
+        << c.frame;
+  }
+}
+
+TEST(PlayHostWindow, putsItOnTheScreen) {
+  const auto driver = toolkit::memory::makeMemoryDriver();
+  const HostWindow host = read(
+      "({class = NSWindow; frame = (1, 2, 300, 200);},"
+      " {class = \"NSButton:toggle\"; tag = 7; frame = (1, 2, 3, 4); title = Go; state = on;"
+      "  enabled = NO; toolTip = Help;},"
+      " {class = NSTextField; frame = (0, 0, 1, 1); title = Hello; hidden = YES;})");
+  const auto window = makeHostWindow(*driver, host, "host.plist");
+  EXPECT_EQ(driver->look(window).content, host.content);
+  EXPECT_TRUE(driver->look(window).visible);
+  const auto& views = window->contentView()->subviews();
+  ASSERT_EQ(views.size(), 2U);
+  const auto button = driver->look(views[0]);
+  EXPECT_EQ(button.kind, ViewKind::toggle);
+  EXPECT_EQ(button.tag, 7);
+  EXPECT_EQ(button.title.string(), "Go");
+  EXPECT_EQ(button.state, State::on);
+  EXPECT_FALSE(button.enabled);
+  EXPECT_EQ(button.toolTip, "Help");
+  EXPECT_EQ(driver->look(views[1]).text.string(), "Hello");
+  EXPECT_TRUE(driver->look(views[1]).hidden);
+}
+
+TEST(PlayHostWindow, anImageMustBeKnown) {
+  const WorkingDirectory directory;
+  const auto driver = toolkit::memory::makeMemoryDriver();
+  driver->setResourcePath(directory.path());
+  const HostWindow host = read("({class = NSImageView; frame = (0, 0, 1, 1); image = disk;})");
+  EXPECT_THROW(makeHostWindow(*driver, host, "host.plist"), Failure);
+  directory.write("disk.png", "not looked into");
+  const auto window = makeHostWindow(*driver, host, "host.plist");
+  EXPECT_EQ(driver->look(window->contentView()->subviews()[0]).image, "disk");
+}
+
+}  // namespace
+}  // namespace tools::play

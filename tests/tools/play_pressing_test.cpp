@@ -1,0 +1,86 @@
+// What a user can press, and where the walk-through stands.
+#include <gtest/gtest.h>
+
+#include "play_support.hpp"
+#include "tools/play/pressing.hpp"
+
+namespace tools::play {
+namespace {
+
+using toolkit::ViewKind;
+
+StepPicture buttons() {
+  StepPicture picture = windowPicture();
+  auto next = controlPicture(ViewKind::button, 1, "Next\nplease");
+  next.hasList = true;
+  auto hidden = controlPicture(ViewKind::button, 2, "Back");
+  hidden.view.hidden = true;
+  hidden.hasList = true;
+  auto disabled = controlPicture(ViewKind::button, 3, "Stop");
+  disabled.view.enabled = false;
+  disabled.hasList = true;
+  auto toggle = controlPicture(ViewKind::toggle, 4);
+  auto text = controlPicture(ViewKind::textField, 5, "Hello");
+  auto front = controlPicture(ViewKind::button, 5, "In front");
+  front.shadowed = true;
+  front.hasList = true;
+  picture.controls = {next, hidden, disabled, toggle, text, front};
+  return picture;
+}
+
+TEST(PlayPressing, saysWhyAControlCannotBePressed) {
+  const std::string others = "; press 1 (Next) or 4";
+  const struct {
+    long tag;
+    std::optional<std::string> reason;
+  } cases[] = {
+      {1, std::nullopt},
+      {2, "control 2 is hidden" + others},
+      {3, "control 3 is disabled" + others},
+      {4, std::nullopt},
+      {5, "control 5 is no button" + others},
+      {6, "no control has the tag 6" + others},
+  };
+  for (const auto& c : cases) EXPECT_EQ(whyNotPress(buttons(), c.tag), c.reason) << c.tag;
+}
+
+TEST(PlayPressing, nothingCanBePressedWithoutAWindow) {
+  StepPicture picture = buttons();
+  picture.window->visible = false;
+  EXPECT_EQ(whyNotPress(picture, 1), "the window is not on the screen");
+  picture.window.reset();
+  EXPECT_EQ(whyNotPress(picture, 1), "the window is not on the screen");
+  picture.ended = true;
+  EXPECT_EQ(whyNotPress(picture, 1), "the walk-through has ended");
+}
+
+TEST(PlayPressing, saysWhenThereIsNothingElseToPress) {
+  EXPECT_EQ(whyNotPress(windowPicture(), 1), "no control has the tag 1; no button can be pressed");
+}
+
+TEST(PlayPressing, namesAButtonByTagAndTitle) {
+  EXPECT_EQ(pressWords(buttons(), 1), "1 (Next)");
+  EXPECT_EQ(pressWords(buttons(), 4), "4");
+  EXPECT_EQ(pressWords(buttons(), 5), "5");
+  EXPECT_EQ(pressWords(buttons(), -6), "-6");
+}
+
+TEST(PlayPressing, saysWhatTheWalkThroughWaitsFor) {
+  StepPicture picture = buttons();
+  EXPECT_EQ(standing(picture), "The walk-through waits for a press of 1 (Next).");
+  picture.controls[3].hasList = true;
+  picture.timers = {{newIdentity(), "8", 2}, {newIdentity(), "9", 1e18}};
+  EXPECT_EQ(standing(picture),
+            "The walk-through waits for a press of 1 (Next) or 4, list 8 to run in 2 s or list 9 "
+            "to run practically never.");
+  picture.controls.clear();
+  picture.timers.clear();
+  EXPECT_EQ(standing(picture),
+            "The walk-through stands still: no timer is pending, and no button that can be "
+            "pressed has a list.");
+  picture.ended = true;
+  EXPECT_EQ(standing(picture), "The walk-through ended.");
+}
+
+}  // namespace
+}  // namespace tools::play

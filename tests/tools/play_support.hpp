@@ -1,0 +1,51 @@
+// Pictures of walk-throughs for the tests of what is said about them.
+#pragma once
+
+#include <deque>
+#include <fstream>
+#include <memory>
+#include <sstream>
+#include <string>
+
+#include "tools/play/step_picture.hpp"
+
+namespace tools::play {
+
+/// Something that pictures can be told apart by, kept to the end of the program.
+inline std::weak_ptr<const void> newIdentity() {
+  static std::deque<std::shared_ptr<int>> identities;
+  return identities.emplace_back(std::make_shared<int>());
+}
+
+inline ControlPicture controlPicture(toolkit::ViewKind kind, long tag,
+                                     const std::string& caption = "") {
+  ControlPicture control;
+  control.identity = newIdentity();
+  control.view.kind = kind;
+  control.view.tag = tag;
+  const bool isText = kind == toolkit::ViewKind::textField;
+  if (!caption.empty()) {
+    (isText ? control.view.text : control.view.title) = toolkit::AttributedString(caption);
+  }
+  return control;
+}
+
+inline StepPicture windowPicture() {
+  StepPicture picture;
+  picture.title = "Backup";
+  picture.window.emplace();
+  picture.window->visible = true;
+  picture.window->content = {200, 200, 480, 320};
+  picture.window->background = toolkit::colors::white;
+  return picture;
+}
+
+/// The whole text of a file in tests/data/play.
+inline std::string playData(const std::string& name) {
+  std::ifstream file(std::string(QZ_TEST_DATA) + "/play/" + name, std::ios::binary);
+  std::ostringstream text;
+  text << file.rdbuf();
+  return text.str();
+}
+
+}  // namespace tools::play

@@ -1,0 +1,124 @@
+// Old-style property lists, and the strings files that are dictionaries without braces.
+#include <span>
+#include <string>
+
+#include "toolkit/property_list/collections.hpp"
+#include "toolkit/property_list/format_readers.hpp"
+#include "toolkit/property_list/old_style_tokens.hpp"
+#include "toolkit/property_list/scalars.hpp"
+#include "toolkit/property_list/utf8.hpp"
+
+namespace toolkit {
+namespace {
+
+class OldStyleReader {
+ public:
+  OldStyleReader(std::string_view text, Document& document, ValueOffsets* offsets)
+      : tokens_(text), document_(document), offsets_(offsets) {}
+
+  Value* root();
+
+ private:
+  bool isAtValue() const;
+  Value* value(std::size_t depth);
+  Value* content(std::size_t depth);
+  Value* string();
+  Value* array(std::size_t depth);
+  Value* entries(std::size_t depth);
+  Value* noted(Value* value, std::size_t offset);
+
+  OldStyleTokens tokens_;
+  Document& document_;
+  ValueOffsets* offsets_;
+  std::vector<Value*> pending_;  // what the open containers hold so far, the outermost's first
+};
+
+Value* OldStyleReader::root() {
+  // A file of nothing but white space and comments is a strings file without strings.
+  if (!tokens_.skipToToken()) return entries(0);
+  Value* result = value(0);
+  if (!tokens_.skipToToken()) return result;
+  if (result->kind() != Value::Kind::string) tokens_.refuseUnexpected("the end of the file");
+  // More than one string: the keys and values of a strings file. What follows its last pair and
+  // cannot begin a key is ignored.
+  tokens_.startAgain();
+  if (offsets_) offsets_->clear();
+  return entries(0);
+}
+
+bool OldStyleReader::isAtValue() const {
+  const char c = tokens_.peek();
+  return tokens_.isAtString() || c == '{' || c == '(' || c == '<';
+}
+
+Value* OldStyleReader::noted(Value* value, std::size_t offset) {
+  if (offsets_) offsets_->emplace_back(value, offset);
+  return value;
+}
+
+Value* OldStyleReader::value(std::size_t depth) {
+  if (!tokens_.skipToToken() || !isAtValue()) tokens_.refuseUnexpected("a value");
+  if (depth > deepestNesting) {
+    tokens_.refuse("more than " + std::to_string(deepestNesting) + " levels in one another");
+  }
+  const std::size_t offset = tokens_.offset();
+  return noted(content(depth), offset);
+}
+
+Value* OldStyleReader::content(std::size_t depth) {
+  if (tokens_.isAtString()) return string();
+  if (tokens_.take('<')) return Data::make(document_, tokens_.data());
+  if (tokens_.take('(')) return array(depth);
+  tokens_.take('{');
+  Value* dictionary = entries(depth);
+  if (!tokens_.take('}')) tokens_.refuseUnexpected("a key or '}'");
+  return dictionary;
+}
+
+Value* OldStyleReader::string() { return String::make(document_, tokens_.string()); }
+
+Value* OldStyleReader::array(std::size_t depth) {
+  const std::size_t first = pending_.size();
+  do {
+    // Nothing needs to follow a comma.
+    if (!tokens_.skipToToken() || !isAtValue()) break;
+    pending_.push_back(value(depth + 1));
+  } while (tokens_.take(','));
+  if (!tokens_.take(')')) tokens_.refuseUnexpected("',' or ')'");
+  Value* result = Array::make(document_, std::span(pending_).subspan(first));
+  pending_.resize(first);
+  return result;
+}
+
+/// `key = value;` and `key;`, which is its own value, as long as keys follow.
+Value* OldStyleReader::entries(std::size_t depth) {
+  const std::size_t first = pending_.size();
+  while (tokens_.skipToToken() && tokens_.isAtString()) {
+    const std::size_t offset = tokens_.offset();
+    Value* key = noted(string(), offset);
+    pending_.push_back(key);
+    tokens_.skipToToken();
+    if (tokens_.take('=')) {
+      pending_.push_back(value(depth + 1));
+    } else if (tokens_.peek() == ';') {
+      pending_.push_back(key);
+    } else {
+      tokens_.refuseUnexpected("'=' or ';' after the key");
+    }
+    if (!tokens_.take(';')) tokens_.refuseUnexpected("';'");
+  }
+  Value* result = Dictionary::make(document_, std::span(pending_).subspan(first),
+                                   Dictionary::Duplicates::lastWins);
+  pending_.resize(first);
+  return result;
+}
+
+}  // namespace
+
+Value* readOldStyle(std::string_view text, Document& document, ValueOffsets* offsets) {
+  const std::size_t valid = validUtf8Length(text);
+  if (valid != text.size()) throw RefusedAt{valid, "the text is not valid UTF-8"};
+  return OldStyleReader(text, document, offsets).root();
+}
+
+}  // namespace toolkit

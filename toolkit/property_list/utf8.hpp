@@ -1,0 +1,45 @@
+// UTF-8, strict where files are read, and generalized (surrogates like any code point) in values.
+#pragma once
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+
+namespace toolkit {
+
+/// How many bytes at the start of `text` are valid UTF-8 as Unicode defines it: no overlong forms,
+/// no surrogates, nothing above U+10FFFF. All of `text` when that is its size.
+std::size_t validUtf8Length(std::string_view text);
+
+/// Appends a code point up to U+10FFFF, surrogates included.
+void appendUtf8(std::string& text, char32_t codePoint);
+
+/// The code point that starts at `position` in generalized UTF-8; moves `position` behind it.
+char32_t nextCodePoint(std::string_view text, std::size_t& position);
+
+inline bool isSurrogate(char32_t codePoint) { return codePoint >= 0xD800 && codePoint <= 0xDFFF; }
+inline bool isHighSurrogate(char32_t unit) { return unit >= 0xD800 && unit <= 0xDBFF; }
+inline bool isLowSurrogate(char32_t unit) { return unit >= 0xDC00 && unit <= 0xDFFF; }
+inline char32_t combineSurrogates(char32_t high, char32_t low) {
+  return 0x10000 + ((high - 0xD800) << 10) + (low - 0xDC00);
+}
+
+/// Builds text from UTF-16 units that come one by one; halves of a pair that meet become one code
+/// point, a half that stays alone is kept as it is.
+class Utf16Appender {
+ public:
+  explicit Utf16Appender(std::string& text) : text_(text) {}
+  void append(char16_t unit);
+  /// Text that is whole code points already: a half that waits stays alone.
+  void append(std::string_view utf8) {
+    if (utf8.empty()) return;
+    waitingHigh_ = false;
+    text_ += utf8;
+  }
+
+ private:
+  std::string& text_;
+  bool waitingHigh_ = false;  // whether the text ends with a half that can still be joined
+};
+
+}  // namespace toolkit

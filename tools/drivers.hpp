@@ -1,0 +1,18 @@
+// The toolkits that this build of the tool has, by name.
+#pragma once
+
+#include <memory>
+#include <string_view>
+#include <vector>
+
+#include "toolkit/test_driver.hpp"
+
+namespace tools {
+
+/// The names that `--toolkit` takes.
+std::vector<std::string_view> driverNames();
+
+/// A driver with a toolkit of its own; null when this build has none of that name.
+std::unique_ptr<toolkit::TestDriver> makeDriver(std::string_view name);
+
+}  // namespace tools

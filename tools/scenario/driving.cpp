@@ -1,0 +1,173 @@
+// Statements that drive the engine: its operations, a user's presses, and time.
+
+#include <optional>
+
+#include "tools/scenario/statements.hpp"
+#include "tools/scenario/unmet.hpp"
+#include "tools/scenario/values.hpp"
+
+namespace tools::scenario {
+namespace {
+
+// --- arguments as the engine takes them; what the statement leaves out or calls `none` is absent
+// ---
+
+std::optional<std::string> optionalText(const Arguments& a, std::string_view slot) {
+  return a.has(slot) ? std::optional(a.text(slot)) : std::nullopt;
+}
+
+Engine::ObjectId objectId(const Arguments& a) {
+  return a.has("ID") ? toolkit::Number::withLong(a.whole("ID")) : Engine::ObjectId();
+}
+
+Engine::Value value(const Arguments& a, std::string_view slot) {
+  if (!a.has(slot)) return {};
+  return toValue(readValue(a.word(slot), anyJson).value().value);
+}
+
+Engine::Dictionary dictionary(const Arguments& a) {
+  return a.has("OBJECT") ? toDictionary(a.word("OBJECT").value) : Engine::Dictionary();
+}
+
+Engine::Control control(const Stage& stage, const Arguments& a) {
+  return a.has("C") ? stage.cast.control(a.text("C")) : Engine::Control();
+}
+
+Engine::Window window(const Stage& stage, const Arguments& a) {
+  return a.has("W") ? stage.cast.window(a.text("W")) : Engine::Window();
+}
+
+// --- the operations ---
+
+Outcome engine(Stage& stage, const Arguments& a) {
+  auto& toolkit = stage.driver.toolkit();
+  stage.engines.begin(a.has("plain") ? Engine::init(toolkit)
+                                     : Engine::initWithWindow(toolkit, window(stage, a)));
+  return {};
+}
+
+Outcome adopt(Stage& stage, const Arguments& a) {
+  return stage.engines.held()->getGuiAssetsFromWindow(window(stage, a));
+}
+
+Outcome assets(Stage& stage, const Arguments& a) {
+  const auto description = a.has("entries") ? stage.entries : dictionary(a);
+  return stage.engines.held()->loadGuiAssets(description, nullptr);
+}
+
+Outcome load(Stage& stage, const Arguments& a) {
+  return stage.engines.held()->loadPlist(optionalText(a, "TEXT"), optionalText(a, "KEY"),
+                                         stage.sheetDelegate, a.has("sheet"));
+}
+
+Outcome run(Stage& stage, const Arguments& a) {
+  return stage.engines.held()->processCommandArray(value(a, "JSON"), objectId(a));
+}
+
+Outcome simple(Stage& stage, const Arguments& a) {
+  return stage.engines.held()->doSimpleCommand(a.text("TEXT"), toolkit::Array::make(), objectId(a));
+}
+
+Outcome compound(Stage& stage, const Arguments& a) {
+  return stage.engines.held()->doCompoundCommand(a.text("TEXT"), toolkit::asArray(value(a, "LIST")),
+                                                 objectId(a));
+}
+
+Outcome press(Stage& stage, const Arguments& a) {
+  stage.driver.click(stage.cast.control(a.text("C")));
+  return {};
+}
+
+Outcome push(Stage& stage, const Arguments& a) {
+  stage.engines.held()->buttonPushed(control(stage, a));
+  return {};
+}
+
+Outcome advance(Stage& stage, const Arguments& a) {
+  stage.driver.advance(a.number("SECONDS"));
+  return {};
+}
+
+Outcome states(Stage& stage, const Arguments& a) {
+  return stage.engines.held()->setButtonSates(dictionary(a));
+}
+
+Outcome restore(Stage& stage, const Arguments&) {
+  stage.engines.held()->restoreOriginalTagValues();
+  return {};
+}
+
+Outcome terminate(Stage& stage, const Arguments&) {
+  stage.engines.held()->terminateParser();
+  return {};
+}
+
+Outcome killTimers(Stage& stage, const Arguments&) {
+  stage.engines.held()->killAllTimers();
+  return {};
+}
+
+Outcome wire(Stage& stage, const Arguments& a) {
+  return stage.engines.held()->forceButtonPushedToBeActionForGuiAttribute(control(stage, a));
+}
+
+Outcome highlight(Stage& stage, const Arguments& a) {
+  return stage.engines.held()->QZ_Plist_State_Processor_HIGHLIGHT_ID(objectId(a));
+}
+
+Outcome find(Stage& stage, const Arguments& a) {
+  return stage.engines.held()->findObjectWithTag(a.whole("TAG"));
+}
+
+Outcome timer(Stage& stage, const Arguments& a) {
+  stage.engines.held()->startTimerWithValue(a.unsignedWhole("UNSIGNED"), optionalText(a, "KEY"));
+  return {};
+}
+
+Outcome fire(Stage& stage, const Arguments& a) {
+  const auto fired = a.has("KEPT") ? stage.kept[a.text("KEPT")] : Kept();
+  if (a.has("KEPT") && !fired.timer)
+    throw Unmet("a kept timer", a.text("KEPT") + ", which is none");
+  if (fired.isFlasher) {
+    stage.engines.held()->flasherFired(fired.timer);
+  } else {
+    stage.engines.held()->pseudoButtonPush(fired.timer);
+  }
+  return {};
+}
+
+Outcome entry(Stage& stage, const Arguments& a) {
+  return stage.engines.held()->createNextGuiAssetEntry(
+      &stage.entries, optionalText(a, "TEXT"),
+      {a.number("X"), a.number("Y"), a.number("WIDTH"), a.number("HEIGHT")},
+      a.unsignedWhole("UNSIGNED"));
+}
+
+constexpr StatementKind table[] = {
+    {"engine [plain|W]", Result::nothing, engine},
+    {"adopt none|W", Result::flag, adopt},
+    {"assets none|entries|OBJECT", Result::flag, assets},
+    {"load none|TEXT [from KEY] [as sheet]", Result::flag, load},
+    {"run none|JSON for none|ID", Result::flag, run},
+    {"simple TEXT for none|ID", Result::flag, simple},
+    {"compound TEXT none|LIST for none|ID", Result::flag, compound},
+    {"press C", Result::nothing, press},
+    {"push none|C", Result::nothing, push},
+    {"advance SECONDS", Result::nothing, advance},
+    {"states none|OBJECT", Result::flag, states},
+    {"restore", Result::nothing, restore},
+    {"terminate", Result::nothing, terminate},
+    {"killtimers", Result::nothing, killTimers},
+    {"wire none|C", Result::flag, wire},
+    {"highlight none|ID", Result::flag, highlight},
+    {"find TAG", Result::control, find},
+    {"timer UNSIGNED none|KEY", Result::nothing, timer},
+    {"fire none|KEPT", Result::nothing, fire},
+    {"entry none|TEXT UNSIGNED X Y WIDTH HEIGHT", Result::flag, entry},
+};
+
+}  // namespace
+
+std::span<const StatementKind> drivingStatements() { return table; }
+
+}  // namespace tools::scenario

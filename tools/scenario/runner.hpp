@@ -1,0 +1,49 @@
+// Running scenarios, each on a stage of its own.
+#pragma once
+
+#include <filesystem>
+#include <functional>
+#include <memory>
+#include <string>
+#include <vector>
+
+#include "toolkit/test_driver.hpp"
+#include "tools/scenario/parser.hpp"
+
+namespace tools::scenario {
+
+/// A scenario file that was read.
+struct LoadedFile {
+  std::string path;  ///< as the user named it
+  ScenarioFile contents;
+};
+
+enum class Verdict { passed, failed, skipped };
+
+struct Report {
+  Verdict verdict = Verdict::passed;
+  std::string file;
+  std::string title;  ///< the file's name where the whole file is the scenario
+  int line = 0;       ///< where the scenario begins
+  double seconds = 0;
+  // Of a failed one: where and what ("expected …, got …"), and the statement. Of a skipped one:
+  // why.
+  int failedLine = 0;
+  std::string problem;
+  std::string statement;
+};
+
+struct Runner {
+  /// Makes the toolkit for one scenario.
+  std::function<std::unique_ptr<toolkit::TestDriver>()> makeDriver;
+  std::string toolkit;  ///< its name
+  /// Is told of every statement that was performed: file, statement, outcome in words.
+  std::function<void(const std::string&, const Statement&, const std::string&)> performed;
+
+  Report run(const LoadedFile& file, const Scenario& scenario) const;
+};
+
+/// The scenario's title, or the file's name where the whole file is the scenario.
+std::string titleOf(const LoadedFile& file, const Scenario& scenario);
+
+}  // namespace tools::scenario

@@ -1,0 +1,129 @@
+// Statements that set a scenario up: files, windows, controls.
+
+#include <cstddef>
+#include <fstream>
+#include <sstream>
+
+#include "toolkit/property_list/xml_writer.hpp"
+#include "tools/scenario/statements.hpp"
+#include "tools/scenario/unmet.hpp"
+#include "tools/scenario/values.hpp"
+#include "tools/view_kinds.hpp"
+
+namespace tools::scenario {
+namespace {
+
+using toolkit::Rect;
+
+Outcome script(Stage& stage, const Arguments& a) {
+  const auto value = readValue(a.word("JSON"), anyJson).value().value;
+  stage.resources.write(a.text("FILE"), toolkit::writeXmlPropertyList(toValue(value)));
+  return {};
+}
+
+Outcome file(Stage& stage, const Arguments& a) {
+  stage.resources.write(a.text("FILE"), a.text("TEXT"));
+  return {};
+}
+
+Outcome copy(Stage& stage, const Arguments& a) {
+  const auto path = stage.folder / a.text("PATH");
+  std::ifstream source(path, std::ios::binary);
+  std::ostringstream contents;
+  // An empty file is one too, though reading it out sets the stream's fail bit.
+  if (std::filesystem::is_regular_file(path)) contents << source.rdbuf();
+  if (!source || !std::filesystem::is_regular_file(path)) {
+    throw Unmet("the file " + a.text("PATH") + " in " + stage.folder.string(), "none");
+  }
+  stage.resources.write(a.text("FILE"), contents.str());
+  return {};
+}
+
+Outcome image(Stage& stage, const Arguments& a) {
+  stage.resources.writeImage(a.text("FILE"));
+  return {};
+}
+
+Rect rectangle(const Arguments& a, const Rect& otherwise) {
+  if (!a.has("X")) return otherwise;
+  return {a.number("X"), a.number("Y"), a.number("WIDTH"), a.number("HEIGHT")};
+}
+
+Outcome window(Stage& stage, const Arguments& a) {
+  const auto made = stage.driver.makeWindow(rectangle(a, {100, 100, 640, 480}));
+  stage.cast.nameWindow(a.text("+W"), toolkit::StoredRef<toolkit::Window>::own(made));
+  return {};
+}
+
+Cast::View viewNamed(const Stage& stage, const std::string& place) {
+  return stage.cast.namesWindow(place) ? stage.cast.window(place)->contentView()
+                                       : stage.cast.control(place);
+}
+
+// Five in a row, so that none lies over another and each can be clicked.
+Rect nextFrame(const Cast::View& parent) {
+  const auto index = parent->subviews().size();
+  return {20.0 + 120.0 * static_cast<double>(index % 5),
+          20.0 + 40.0 * static_cast<double>(index / 5), 100, 30};
+}
+
+Outcome control(Stage& stage, const Arguments& a) {
+  const auto parent = viewNamed(stage, a.text("PLACE"));
+  const auto made = stage.driver.makeView(*viewKindNamed(a.text("CLASS")), a.whole("TAG"),
+                                          rectangle(a, nextFrame(parent)), parent);
+  stage.cast.nameControl(a.text("+C"), toolkit::StoredRef<toolkit::View>::refer(made));
+  return {};
+}
+
+Outcome controls(Stage& stage, const Arguments& a) {
+  const auto parent = viewNamed(stage, a.text("PLACE"));
+  const auto kind = *viewKindNamed(a.text("CLASS"));
+  for (long i = 0; i < a.whole("COUNT"); ++i) {
+    stage.driver.makeView(kind, a.whole("TAG") + i, nextFrame(parent), parent);
+  }
+  return {};
+}
+
+Outcome delegate(Stage& stage, const Arguments& a) {
+  stage.cast.window(a.text("W"))->setDelegate(stage.host);
+  return {};
+}
+
+Outcome target(Stage& stage, const Arguments& a) {
+  const auto button = toolkit::asButton(stage.cast.control(a.text("C")));
+  if (!button) throw Unmet("a button", a.text("C") + ", which is none");
+  button->setTarget(stage.host);
+  button->setAction(HostResponder::action);
+  return {};
+}
+
+Outcome name(Stage& stage, const Arguments& a) {
+  if (a.has("+W")) {
+    stage.cast.nameWindow(
+        a.text("+W"), toolkit::StoredRef<toolkit::Window>::refer(stage.cast.window(a.text("W"))));
+  } else {
+    stage.cast.nameControl(
+        a.text("+C"), toolkit::StoredRef<toolkit::View>::refer(stage.cast.control(a.text("C"))));
+  }
+  return {};
+}
+
+constexpr StatementKind table[] = {
+    {"script FILE JSON", Result::never, script},
+    {"file FILE TEXT", Result::never, file},
+    {"copy FILE PATH", Result::never, copy},
+    {"image FILE", Result::never, image},
+    {"window +W [X Y WIDTH HEIGHT]", Result::never, window},
+    {"control +C CLASS TAG in PLACE [X Y WIDTH HEIGHT]", Result::never, control},
+    {"controls COUNT CLASS TAG in PLACE", Result::never, controls},
+    {"delegate W", Result::never, delegate},
+    {"target C", Result::never, target},
+    {"name +C C", Result::never, name},
+    {"name +W W", Result::never, name},
+};
+
+}  // namespace
+
+std::span<const StatementKind> settingUpStatements() { return table; }
+
+}  // namespace tools::scenario

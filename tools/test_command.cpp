@@ -1,0 +1,132 @@
+// The command `test`.
+#include "tools/test_command.hpp"
+
+#include <CLI/CLI.hpp>
+
+#include <algorithm>
+#include <fstream>
+#include <iostream>
+#include <memory>
+
+#include "tools/drivers.hpp"
+#include "tools/failure.hpp"
+#include "tools/scenario/junit.hpp"
+#include "tools/scenario/near_miss.hpp"
+#include "tools/scenario/runner.hpp"
+#include "tools/scenario/scenario_files.hpp"
+
+namespace tools {
+namespace {
+
+using scenario::LoadedFile;
+using scenario::Report;
+using scenario::Scenario;
+using scenario::Verdict;
+
+void requireToolkit(const std::string& name) {
+  const auto known = driverNames();
+  if (std::find(known.begin(), known.end(), name) != known.end()) return;
+  throw Failure(ExitStatus::badInput, "unknown toolkit " + name + "; this build has " +
+                                          scenario::enumerate({known.begin(), known.end()}) +
+                                          scenario::didYouMean(name, known));
+}
+
+/// Opened before anything runs, so that a report that cannot be written is no surprise at the end.
+std::ofstream openReport(const std::string& path) {
+  std::ofstream stream(path, std::ios::binary);
+  if (!stream) throw Failure(ExitStatus::badInput, path + ": the report cannot be written");
+  return stream;
+}
+
+void print(std::ostream& out, const Report& report) {
+  if (report.verdict != Verdict::failed) return;
+  out << report.file << ':' << report.failedLine << ": " << report.problem << "\n    "
+      << report.statement << '\n';
+  if (report.line != report.failedLine) {
+    out << "    in " << report.file << ':' << report.line << ": " << report.title << '\n';
+  }
+}
+
+void printSummary(std::ostream& out, const std::vector<Report>& reports) {
+  const auto count = [&](Verdict verdict) {
+    return std::count_if(reports.begin(), reports.end(),
+                         [&](const Report& report) { return report.verdict == verdict; });
+  };
+  out << count(Verdict::passed) << " passed, " << count(Verdict::failed) << " failed";
+  if (const auto skipped = count(Verdict::skipped); skipped > 0)
+    out << ", " << skipped << " skipped";
+  out << std::endl;
+}
+
+template <class Use>
+void forEachChosen(const std::vector<LoadedFile>& files, const std::string& filter, Use use) {
+  for (const auto& file : files) {
+    for (const auto& one : file.contents.scenarios) {
+      if (scenario::titleOf(file, one).find(filter) != std::string::npos) use(file, one);
+    }
+  }
+}
+
+void list(const std::vector<LoadedFile>& files, const std::string& filter, std::ostream& out) {
+  forEachChosen(files, filter, [&](const LoadedFile& file, const Scenario& one) {
+    out << file.path << ':' << one.line << ": " << scenario::titleOf(file, one) << '\n';
+  });
+}
+
+std::vector<Report> run(const TestOptions& options, const std::vector<LoadedFile>& files,
+                        std::ostream& out) {
+  const scenario::Runner runner{[&] { return makeDriver(options.toolkit); }, options.toolkit,
+                                [&](const std::string& file, const scenario::Statement& statement,
+                                    const std::string& outcome) {
+                                  if (!options.verbose) return;
+                                  out << file << ':' << statement.at.line << ": "
+                                      << statement.source << "  [" << outcome << "]\n";
+                                }};
+  std::vector<Report> reports;
+  forEachChosen(files, options.filter, [&](const LoadedFile& file, const Scenario& one) {
+    if (options.verbose) out << "# " << scenario::titleOf(file, one) << '\n';
+    reports.push_back(runner.run(file, one));
+    print(out, reports.back());
+  });
+  return reports;
+}
+
+}  // namespace
+
+int runTests(const TestOptions& options, std::ostream& out, std::ostream& problems) {
+  requireToolkit(options.toolkit);
+  const auto read = scenario::readScenarios(options.paths);
+  for (const auto& problem : read.problems) problems << problem << '\n';
+  if (!read.problems.empty()) return static_cast<int>(ExitStatus::badInput);
+  if (options.list) {
+    list(read.files, options.filter, out);
+    return static_cast<int>(ExitStatus::fine);
+  }
+  auto report = options.junit ? openReport(*options.junit) : std::ofstream();
+  const auto reports = run(options, read.files, out);
+  printSummary(out, reports);
+  if (options.junit) {
+    report << junitReport(reports);
+    report.close();
+    if (!report) throw Failure(ExitStatus::failed, *options.junit + ": the report was not written");
+  }
+  const bool failed = std::any_of(reports.begin(), reports.end(),
+                                  [](const Report& one) { return one.verdict == Verdict::failed; });
+  return static_cast<int>(failed ? ExitStatus::failed : ExitStatus::fine);
+}
+
+void addTestCommand(CLI::App& app, int& status) {
+  const auto options = std::make_shared<TestOptions>();
+  auto* const command = app.add_subcommand("test", "Run scenarios and say which hold");
+  command->add_option("FILE", options->paths, "Scenario files (.walk), or directories of them")
+      ->required();
+  command->add_option("--toolkit", options->toolkit, "The toolkit to run on")
+      ->capture_default_str();
+  command->add_option("--filter", options->filter, "Run only scenarios whose title contains this");
+  command->add_flag("--list", options->list, "Name the scenarios instead of running them");
+  command->add_flag("--verbose", options->verbose, "Print every statement with its result");
+  command->add_option("--junit", options->junit, "Write a JUnit report to this file");
+  command->callback([options, &status] { status = runTests(*options, std::cout, std::cerr); });
+}
+
+}  // namespace tools
