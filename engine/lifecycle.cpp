@@ -68,8 +68,9 @@ void QZ_Plist_State_Parser::terminateParser() {
 QZ_Plist_State_Parser::~QZ_Plist_State_Parser() {
   stop(*flashingTimer_);
   flashingTimer_.set(nullptr);
-  for (const auto& [key, timer] : objectIdTimers_->entries()) timer->invalidate();
-  objectIdTimers_->removeAllObjects();
+  const Timers timers = *objectIdTimers_;
+  for (const auto& [key, timer] : timers->entries()) timer->invalidate();
+  timers->removeAllObjects();
   objectIdTimers_.set(nullptr);
   const Window tutorial = tutorialWindow_->get();
   const Window host = window_->get();

@@ -33,7 +33,8 @@ void QZ_Plist_State_Parser::pseudoButtonPush(const Timer& timer) {
 
 // A timer carries no tag: it is known by being the very one that the table holds.
 std::optional<std::string> QZ_Plist_State_Parser::keyOfTimer(const Timer& timer) const {
-  for (const auto& [key, pending] : objectIdTimers_->entries()) {
+  const Timers timers = *objectIdTimers_;
+  for (const auto& [key, pending] : timers->entries()) {
     if (pending == timer) return key;
   }
   return std::nullopt;

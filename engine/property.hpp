@@ -1,8 +1,8 @@
 // Property: a field of the engine that any thread may get or replace while the engine runs on its
 // own.
 //
-// `get` and `set` are atomic: what `get` returns stays valid whoever replaces the field at the same
-// moment. The engine itself reads its fields directly, on its own thread, where nobody else writes.
+// Invariant: whatever is read of a field, by `get` or by the engine itself, stays valid to the end
+// of the expression that reads it, whoever replaces the field at the same moment.
 #pragma once
 
 #include <mutex>
@@ -24,18 +24,23 @@ class Property {
     std::swap(value_, value);
   }
 
-  /// The value itself; on the engine's thread only, which is the one that replaces it.
-  const T& operator*() const { return value_; }
+  /// The same as `get`, as the engine writes it.
+  T operator*() const { return get(); }
   /// What the value refers to, where it is a reference; else the value.
   auto operator->() const {
-    if constexpr (requires { value_.operator->(); }) {
-      return value_.operator->();
+    if constexpr (requires(const T& value) { value.operator->(); }) {
+      return get();
     } else {
-      return &value_;
+      return Held{get()};
     }
   }
 
  private:
+  struct Held {
+    T value;
+    const T* operator->() const { return &value; }
+  };
+
   mutable std::mutex mutex_;
   T value_{};
 };

@@ -18,10 +18,11 @@ void QZ_Plist_State_Parser::startTimerWithValue(std::uint64_t value,
 }
 
 void QZ_Plist_State_Parser::killAllTimers() {
-  for (const auto& [key, timer] : objectIdTimers_->entries()) {
+  const Timers timers = *objectIdTimers_;
+  for (const auto& [key, timer] : timers->entries()) {
     if (timer->isValid()) timer->invalidate();
   }
-  objectIdTimers_->removeAllObjects();
+  timers->removeAllObjects();
 }
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TIMER(std::uint64_t value,

@@ -33,6 +33,7 @@ std::optional<ViewKind> viewKindNamed(std::string_view name) {
 
 std::vector<std::string_view> viewKindNames() {
   std::vector<std::string_view> names;
+  names.reserve(namedKinds.size());
   for (const NamedKind& named : namedKinds) names.push_back(named.name);
   return names;
 }

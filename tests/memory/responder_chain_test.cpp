@@ -115,15 +115,20 @@ TEST_F(ResponderChain, AWindowDoesNotKeepItsDelegate) {
 // --- what an action does to its sender ---
 
 TEST_F(ResponderChain, AControlMayRemoveItselfInItsAction) {
-  const std::weak_ptr<View> button = makeButton(nullptr, ViewKind::button, 3).pointer();
-  delegate->perform = [&](const Ref<View>& sender) {
+  const std::shared_ptr<Responder> receivers[] = {nullptr, target};
+  target->perform = delegate->perform = [this](const Ref<View>& sender) {
     driver.removeFromSuperview(sender);
     EXPECT_EQ(sender->tag(), 3);
   };
-  // As a raw pointer: nothing but the superview keeps the button.
-  std::dynamic_pointer_cast<MemoryButton>(button.lock()).get()->click();
+  for (const auto& receiver : receivers) {
+    const std::weak_ptr<View> watched = makeButton(receiver, ViewKind::button, 3).pointer();
+    // As a plain pointer: nothing but the superview keeps the button.
+    View* const button = watched.lock().get();
+    dynamic_cast<MemoryButton*>(button)->click();
+    EXPECT_TRUE(watched.expired());
+  }
   EXPECT_EQ(delegate->senders, std::vector<long>{3});
-  EXPECT_TRUE(button.expired());
+  EXPECT_EQ(target->senders, std::vector<long>{3});
 }
 
 TEST_F(ResponderChain, TheWindowMayEndInAnAction) {
@@ -139,14 +144,15 @@ TEST_F(ResponderChain, TheWindowMayEndInAnAction) {
 }
 
 TEST_F(ResponderChain, ATargetMayEndInItsAction) {
-  const Ref<Button> button = makeButton(target);
+  const Ref<Button> button = makeButton(nullptr);
   const std::weak_ptr<Recorder> watched = target;
   long senders = 0;
-  target->perform = [&](const Ref<View>&) {
-    target = nullptr;
+  std::shared_ptr<Responder> receiver = std::move(target);  // the only one that keeps it
+  watched.lock()->perform = [&](const Ref<View>&) {
+    receiver = nullptr;
     senders = watched.lock()->senders.front();
   };
-  EXPECT_TRUE(button->sendAction("pressed:", target));
+  EXPECT_TRUE(button->sendAction("pressed:", receiver));
   EXPECT_TRUE(watched.expired());
   EXPECT_EQ(senders, 1);
 }

@@ -57,8 +57,19 @@ TEST(HtmlMarkup, KeepsFormattingThatOverlaps) {
       {"<b><b>a</b>b</b>c", "ab{bold}|c"},
       {"<p><b>a<i>b</p></b>c</i>d", "a{bold}|b{bold italic}|\n|c{italic}|d"},
       {"<p><u>a<b>b</p><p><i>c", "a{underline}|b{bold underline}|\n|c{bold italic underline}|\n"},
-      {"<p><b>a</p><img><p><b>b</p><br>", "a{bold}|\n|\uFFFC{bold}|\n|b{bold}|\n|\n{bold}"},
+      {"<p><b>a</p><img><p>b</p><br>", "a{bold}|\n|\uFFFC\nb\n\n{bold}"},
       {"<a href=u>x<p>y</a>z", "x\ny{#0000ee link=u underline}|z\n"},
+  }));
+}
+
+TEST(HtmlMarkup, KeepsThreeOfAKindThatOverlap) {
+  expectRuns(std::to_array<Case>({
+      {"<p><big><big><big>a<p>b", "a{20.74}|\n|b{20.74}|\n"},
+      {"<p><big><big><big><big>a<p>b", "a{24.89}|\n|b{20.74}|\n"},
+      {"<p><b><b><b><b>a<p>b</b></b>c</b>d", "a{bold}|\n|bc{bold}|d\n"},
+      {"<p><font size=1><font size=2><font size=1><font color=red><font size=1><font size=1>a<p>"
+       "</font></font></font>b</font>c",
+       "a{7.5 #ff0000}|\n|b{7.5}|c{9.75}|\n"},
   }));
 }
 

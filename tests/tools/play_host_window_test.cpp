@@ -5,7 +5,6 @@
 #include "toolkit/memory/memory_driver.hpp"
 #include "tools/failure.hpp"
 #include "tools/play/host_window.hpp"
-#include "tools/play/input_file.hpp"
 
 namespace tools::play {
 namespace {
@@ -16,7 +15,7 @@ using toolkit::ViewKind;
 HostWindow read(std::string_view text) {
   const WorkingDirectory directory;
   directory.write("host.plist", text);
-  return parseHostWindow(readPropertyListFile("host.plist", "a host's window"), "host.plist");
+  return parseHostWindow(InputFile("host.plist", "a host's window"));
 }
 
 /// What a bad file's message is.

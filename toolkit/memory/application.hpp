@@ -11,8 +11,6 @@ namespace toolkit::memory {
 class MemoryApplication final : public Application {
  public:
   MemoryApplication() : screen_(std::make_shared<Screen>()) {}
-  /// Takes every window off the screen, and so lets go of those that it kept alive.
-  ~MemoryApplication() override { screen_->orderAllOut(); }
   MemoryApplication(const MemoryApplication&) = delete;
   MemoryApplication& operator=(const MemoryApplication&) = delete;
 
@@ -29,7 +27,7 @@ class MemoryApplication final : public Application {
   const std::shared_ptr<Screen>& screen() const { return screen_; }
 
  private:
-  std::shared_ptr<Screen> screen_;  // views and windows only refer to it
+  std::shared_ptr<Screen> screen_;  // views and windows only refer to it, so it ends with this
 };
 
 }  // namespace toolkit::memory

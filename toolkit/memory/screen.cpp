@@ -46,12 +46,6 @@ std::shared_ptr<MemoryWindow> Screen::orderOut(const MemoryWindow& window) {
   return kept;
 }
 
-void Screen::orderAllOut() {
-  key_ = nullptr;
-  // Windows end here; they find themselves off the screen already.
-  const std::vector<Shown> ending = std::exchange(shown_, {});
-}
-
 const MemoryWindow* Screen::heirOf(const MemoryWindow& window) const {
   const auto parent = window.sheetParent();
   if (parent && shows(*parent)) return parent.get();

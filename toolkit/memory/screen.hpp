@@ -32,8 +32,6 @@ class Screen {
   /// Takes `window` off, if it is on. The key goes to the window that it was a sheet over, or else
   /// to the front-most. Gives back what kept the window alive here, which may be the last that did.
   std::shared_ptr<MemoryWindow> orderOut(const MemoryWindow& window);
-  /// Takes every window off.
-  void orderAllOut();
 
   /// Redraws whatever needs it, on the screen and off it: what is ordered front later is drawn
   /// then.

@@ -60,10 +60,9 @@ void ViewNode::insert(const Ref<View>& view) {
 void ViewNode::removeFromSuperview() {
   const auto superview = this->superview();
   if (!superview) return;
-  const Ref<View> self = view();  // and kept, for the superview's reference may be the last one
   superview_.reset();
   Subviews& list = superview->subviews_;
-  list.erase(std::find(list.begin(), list.end(), self));
+  list.erase(std::find(list.begin(), list.end(), view()));  // which may be the end of this view
   superview->changed();
 }
 

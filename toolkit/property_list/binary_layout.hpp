@@ -1,4 +1,5 @@
-// The layout of binary property lists: trailer, object markers, numbers. All numbers are big-endian.
+// The layout of binary property lists: trailer, object markers, numbers. All numbers are
+// big-endian.
 //
 //   "bplist0?"  objects …  offset table (one offset an object)  trailer (32 bytes)
 //

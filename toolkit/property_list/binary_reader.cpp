@@ -1,7 +1,6 @@
 // Binary property lists.
 #include <algorithm>
 #include <bit>
-#include <limits>
 #include <span>
 #include <string>
 
@@ -11,6 +10,7 @@
 #include "toolkit/property_list/key_index.hpp"
 #include "toolkit/property_list/scalars.hpp"
 #include "toolkit/property_list/utf8.hpp"
+#include "toolkit/property_list/walk.hpp"
 
 namespace toolkit {
 namespace {
@@ -21,8 +21,9 @@ using binary::Trailer;
 constexpr std::size_t largestSize = 16;  // of an offset or a reference
 
 // Objects may overlap, and a small file can so hold objects that are huge all together. What a file
-// honestly needs is its own size; this many times as much is read, and a little more for tiny files.
-constexpr std::size_t mostOverlap = 8;
+// honestly needs is its own size; this many times as much is read, and a little more for tiny
+// files.
+constexpr std::size_t mostOverlap = 2;
 constexpr std::size_t overlapForFree = 64 * 1024;
 
 [[noreturn]] void refuse(std::size_t offset, std::string reason) {
@@ -56,8 +57,9 @@ void checkTrailer(const Trailer& trailer, std::string_view bytes) {
   check(trailer.tableOffset > binary::headerSize && trailer.tableOffset < start, 24,
         "the offset table does not lie between the header and the trailer");
   const std::uint64_t tableSize = start - trailer.tableOffset;
-  check(tableSize % trailer.offsetSize == 0 && tableSize / trailer.offsetSize == trailer.objectCount,
-        8, "the offset table does not fill the space up to the trailer");
+  check(
+      tableSize % trailer.offsetSize == 0 && tableSize / trailer.offsetSize == trailer.objectCount,
+      8, "the offset table does not fill the space up to the trailer");
   check(reaches(trailer.referenceSize, trailer.objectCount), 7,
         "the references are too small for the number of objects");
   check(reaches(trailer.offsetSize, trailer.tableOffset), 6,
@@ -66,49 +68,254 @@ void checkTrailer(const Trailer& trailer, std::string_view bytes) {
 
 class BinaryReader {
  public:
-  BinaryReader(std::string_view bytes, Document& document, ValueOffsets* offsets);
+  BinaryReader(std::string_view bytes, Document& document, ValueOffsets* offsets)
+      : trailer_(readTrailer(bytes)), document_(document), offsets_(offsets) {
+    checkTrailer(trailer_, bytes);
+    objects_ = bytes.substr(0, trailer_.tableOffset);
+    table_ = bytes.substr(trailer_.tableOffset, trailer_.objectCount * trailer_.offsetSize);
+    budget_ = mostOverlap * bytes.size() + overlapForFree;
+  }
+
   Value* root();
 
  private:
-  /// The bytes of an object behind its marker, which are taken one part after the other.
-  struct Content {
-    std::size_t object;     // where it starts
-    std::size_t at;         // what comes next
-    std::size_t length;     // in whatever the object counts in
-  };
-
   std::uint64_t offsetOf(std::uint64_t index) const;
+  void checkTable() const;
   Value* object(std::uint64_t index, std::size_t depth);
-  Value* read(std::size_t offset, std::size_t depth);
-  Value* simple(std::size_t offset);
+  Value* content(std::size_t offset, std::size_t depth);
+  Value* constant(std::size_t offset);
   Value* integer(std::size_t offset);
   Value* real(std::size_t offset);
   Value* date(std::size_t offset);
   Value* uid(std::size_t offset);
-  Value* data(std::size_t offset);
   Value* ascii(std::size_t offset);
   Value* utf16(std::size_t offset);
   Value* array(std::size_t offset, std::size_t depth);
   Value* set(std::size_t offset, std::size_t depth);
   Value* dictionary(std::size_t offset, std::size_t depth);
 
-  unsigned low(std::size_t offset) const { return static_cast<unsigned char>(bytes_[offset]) & 15; }
-  std::string_view fixed(std::size_t offset, std::size_t size);
-  std::string_view counted(std::size_t offset, std::size_t unitSize);
-  std::string_view take(std::size_t object, std::size_t at, std::uint64_t count,
-                        std::size_t unitSize);
-  void readReferences(std::string_view references, std::size_t depth);
+  unsigned low(std::size_t offset) const {
+    return static_cast<unsigned char>(objects_[offset]) & 15;
+  }
+  std::string_view contentOf(std::size_t offset, std::size_t unitSize);
+  std::string_view take(std::size_t at, std::uint64_t count, std::size_t unitSize);
+  Value* reference(std::string_view references, std::size_t index, std::size_t depth);
 
-  std::string_view bytes_;
   Trailer trailer_;
-  std::size_t end_;  // of the objects
+  std::string_view objects_;  // and the header in front of them
+  std::string_view table_;
   Document& document_;
   ValueOffsets* offsets_;
-  std::vector<Value*> objects_;  // by index, as far as they are read
+  std::size_t budget_;           // how many bytes of content may still be read
+  std::vector<Value*> values_;   // by index, as far as they are read
   std::vector<Value*> pending_;  // what the open containers hold so far, the outermost's first
-  std::string buffer_;
-  std::size_t budget_;  // how many bytes of objects may still be read
+  std::string buffer_;           // of strings that do not stand in the file as they are
 };
+
+std::uint64_t BinaryReader::offsetOf(std::uint64_t index) const {
+  return binary::number(table_.substr(index * trailer_.offsetSize, trailer_.offsetSize));
+}
+
+/// Every entry must lead to before the table, whether it is used or not.
+void BinaryReader::checkTable() const {
+  for (std::uint64_t index = 0; index < trailer_.objectCount; ++index) {
+    if (offsetOf(index) >= objects_.size()) {
+      refuse(objects_.size() + index * trailer_.offsetSize,
+             "the offset does not lead to before the offset table");
+    }
+  }
+}
+
+Value* BinaryReader::root() {
+  checkTable();
+  values_.resize(trailer_.objectCount);
+  return object(trailer_.topObject, 0);
+}
+
+Value* BinaryReader::object(std::uint64_t index, std::size_t depth) {
+  Value* const beingRead = &Value::nothing();
+  if (values_[index] && values_[index] != beingRead) return values_[index];
+  const std::size_t offset = offsetOf(index);
+  if (values_[index] == beingRead) refuse(offset, "the object holds itself");
+  if (offset < binary::headerSize) refuse(offset, "an object cannot lie in the header");
+  if (depth > deepestNesting) {
+    refuse(offset, "more than " + std::to_string(deepestNesting) + " levels in one another");
+  }
+  values_[index] = beingRead;
+  Value* value = content(offset, depth);
+  if (offsets_) offsets_->emplace_back(value, offset);
+  return values_[index] = value;
+}
+
+Value* BinaryReader::content(std::size_t offset, std::size_t depth) {
+  const auto marker = static_cast<unsigned char>(objects_[offset]);
+  if (marker == static_cast<unsigned char>(Marker::date)) return date(offset);
+  switch (Marker{static_cast<std::uint8_t>(marker & 0xF0U)}) {
+    case Marker::null:
+      return constant(offset);
+    case Marker::integer:
+      return integer(offset);
+    case Marker::real:
+      return real(offset);
+    case Marker::data:
+      return Data::make(document_, contentOf(offset, 1));
+    case Marker::ascii:
+      return ascii(offset);
+    case Marker::utf16:
+      return utf16(offset);
+    case Marker::uid:
+      return uid(offset);
+    case Marker::array:
+      return array(offset, depth);
+    case Marker::set:
+      return set(offset, depth);
+    case Marker::dictionary:
+      return dictionary(offset, depth);
+    default:
+      refuse(offset, "unknown kind of object");
+  }
+}
+
+/// `count` units of content from `at` on, which must lie before the offset table.
+std::string_view BinaryReader::take(std::size_t at, std::uint64_t count, std::size_t unitSize) {
+  if (count > (objects_.size() - at) / unitSize) {
+    refuse(at, "the object reaches beyond the objects' space");
+  }
+  const std::size_t size = count * unitSize;
+  if (size > budget_) refuse(at, "the objects overlap too often");
+  budget_ -= size;
+  return objects_.substr(at, size);
+}
+
+/// The content of an object whose marker counts it in units.
+std::string_view BinaryReader::contentOf(std::size_t offset, std::size_t unitSize) {
+  if (low(offset) != binary::longLength) return take(offset + 1, low(offset), unitSize);
+  const std::size_t length = offset + 1;
+  if (length == objects_.size() || (static_cast<unsigned char>(objects_[length]) & 0xF0) != 0x10) {
+    refuse(length, "expected the object's length, an integer");
+  }
+  const std::string_view digits = take(length + 1, std::uint64_t{1} << low(length), 1);
+  return take(length + 1 + digits.size(), binary::number(digits), unitSize);
+}
+
+Value* BinaryReader::constant(std::size_t offset) {
+  switch (Marker{static_cast<std::uint8_t>(objects_[offset])}) {
+    case Marker::null:
+      return Null::make(document_);
+    case Marker::no:
+      return Number::make(document_, Number::Type::boolean, 0);
+    case Marker::yes:
+      return Number::make(document_, Number::Type::boolean, 1);
+    default:
+      refuse(offset, "unknown kind of object");
+  }
+}
+
+Value* BinaryReader::integer(std::size_t offset) {
+  const std::size_t size = std::size_t{1} << low(offset);
+  if (size > 16) refuse(offset, "an integer of more than 16 bytes");
+  const std::uint64_t bits = binary::number(take(offset + 1, size, 1));
+  // Eight bytes have a sign; sixteen are how integers are written that need the highest bit.
+  const bool isUnsigned = size == 16 && bits > std::uint64_t{INT64_MAX};
+  return Number::make(
+      document_, isUnsigned ? Number::Type::unsignedInteger : Number::Type::signedInteger, bits);
+}
+
+Value* BinaryReader::real(std::size_t offset) {
+  const std::size_t size = std::size_t{1} << low(offset);
+  if (size != 4 && size != 8) refuse(offset, "a real of neither 4 nor 8 bytes");
+  const std::uint64_t bits = binary::number(take(offset + 1, size, 1));
+  if (size == 8) return Number::make(document_, Number::Type::real64, bits);
+  const double real{std::bit_cast<float>(static_cast<std::uint32_t>(bits))};
+  return Number::make(document_, Number::Type::real32, std::bit_cast<std::uint64_t>(real));
+}
+
+Value* BinaryReader::date(std::size_t offset) {
+  return Date::make(document_, std::bit_cast<double>(binary::number(take(offset + 1, 8, 1))));
+}
+
+Value* BinaryReader::uid(std::size_t offset) {
+  const std::uint64_t number = binary::number(take(offset + 1, low(offset) + 1, 1));
+  if (number > UINT32_MAX) refuse(offset, "a UID of more than 32 bits");
+  return Uid::make(document_, static_cast<std::uint32_t>(number));
+}
+
+/// Bytes from 0x80 are not ASCII; they count as Latin-1.
+Value* BinaryReader::ascii(std::size_t offset) {
+  const std::string_view bytes = contentOf(offset, 1);
+  const auto isAscii = [](char byte) { return static_cast<unsigned char>(byte) < 0x80; };
+  if (std::all_of(bytes.begin(), bytes.end(), isAscii)) return String::make(document_, bytes);
+  buffer_.clear();
+  for (const char byte : bytes) appendUtf8(buffer_, static_cast<unsigned char>(byte));
+  return String::make(document_, buffer_);
+}
+
+Value* BinaryReader::utf16(std::size_t offset) {
+  const std::string_view bytes = contentOf(offset, 2);
+  if (bytes.empty()) refuse(offset, "a UTF-16 string of no characters");
+  buffer_.clear();
+  Utf16Appender appender(buffer_);
+  for (std::size_t at = 0; at < bytes.size(); at += 2) {
+    appender.append(static_cast<char16_t>(binary::number(bytes.substr(at, 2))));
+  }
+  return String::make(document_, buffer_);
+}
+
+Value* BinaryReader::reference(std::string_view references, std::size_t index, std::size_t depth) {
+  const std::string_view bytes =
+      references.substr(index * trailer_.referenceSize, trailer_.referenceSize);
+  const std::uint64_t object = binary::number(bytes);
+  if (object >= trailer_.objectCount) {
+    refuse(static_cast<std::size_t>(bytes.data() - objects_.data()),
+           "the object referred to does not exist");
+  }
+  return this->object(object, depth);
+}
+
+Value* BinaryReader::array(std::size_t offset, std::size_t depth) {
+  const std::string_view references = contentOf(offset, trailer_.referenceSize);
+  const std::size_t first = pending_.size();
+  const std::size_t count = references.size() / trailer_.referenceSize;
+  for (std::size_t i = 0; i < count; ++i) pending_.push_back(reference(references, i, depth + 1));
+  Value* result = Array::make(document_, std::span(pending_).subspan(first));
+  pending_.resize(first);
+  return result;
+}
+
+Value* BinaryReader::set(std::size_t offset, std::size_t depth) {
+  const std::string_view references = contentOf(offset, trailer_.referenceSize);
+  const std::size_t first = pending_.size();
+  const std::size_t count = references.size() / trailer_.referenceSize;
+  KeyIndex index(count, std::pmr::new_delete_resource());
+  for (std::size_t i = 0; i < count; ++i) {
+    Value* element = reference(references, i, depth + 1);
+    const std::uint64_t hash = hashOfKey(*element);
+    const auto isElement = [&](std::size_t at) { return sameKey(*pending_[first + at], *element); };
+    if (index.find(hash, isElement) != KeyIndex::none) continue;
+    index.append(hash);
+    pending_.push_back(element);
+  }
+  Value* result = Set::make(document_, std::span(pending_).subspan(first));
+  pending_.resize(first);
+  return result;
+}
+
+Value* BinaryReader::dictionary(std::size_t offset, std::size_t depth) {
+  // All keys stand first, then all values.
+  const std::string_view references = contentOf(offset, 2 * std::size_t{trailer_.referenceSize});
+  const std::size_t first = pending_.size();
+  const std::size_t count = references.size() / trailer_.referenceSize / 2;
+  for (std::size_t i = 0; i < count; ++i) {
+    Value* key = reference(references, i, depth + 1);
+    if (isCollection(*key)) refuse(offset, "a collection as the key of a dictionary");
+    pending_.push_back(key);
+    pending_.push_back(reference(references, count + i, depth + 1));
+  }
+  Value* result = Dictionary::make(document_, std::span(pending_).subspan(first),
+                                   Dictionary::Duplicates::firstWins);
+  pending_.resize(first);
+  return result;
+}
 
 }  // namespace
 

@@ -16,7 +16,7 @@
 namespace toolkit {
 
 std::uint64_t hashOf(std::string_view text);
-/// Of a value that holds no others; equal keys have equal hashes.
+/// The same for keys that are the same.
 std::uint64_t hashOfKey(const Value& key);
 
 /// Whether two keys are the same: strings by their text, numbers by what they count to (a boolean

@@ -16,6 +16,7 @@ namespace {
 
 /// Deeper elements take the place of their parents, as in browsers: what a tag costs is bounded.
 constexpr std::size_t maxDepth = 256;
+constexpr std::size_t maxSuspended = 16;
 
 constexpr TagSet paragraphs = tags::headings | TagSet{Tag::li, Tag::p};
 constexpr TagSet partsOfTables = tags::cells | tags::rowGroups | TagSet{Tag::caption, Tag::tr};
@@ -64,7 +65,7 @@ void Builder::startTag(Tag tag, const Attributes& attributes) {
       writeRule();
       break;
     case Tag::img:
-      flow_.addCharacters("\uFFFC", style());
+      writeImage();
       break;
     case Tag::body:
       colorLinks(attributes);
@@ -190,7 +191,7 @@ void Builder::closeFrom(Position first) {
   while (elements_.size() > first) {
     Element element = pop();
     if (tags::formatting.contains(element.tag)) {
-      suspended_.push_back(std::move(element));
+      suspend(std::move(element));
     } else {
       leave(element);
     }
@@ -218,6 +219,16 @@ void Builder::endFormatting(Tag tag) {
     elements_.erase(elements_.begin() + static_cast<std::ptrdiff_t>(open));
     restyleFrom(open);
   }
+}
+
+/// A tag left open in a paragraph may be left open in thousands. Of more than three alike the outer
+/// ones end, as in browsers, and of more than are ever meant.
+void Builder::suspend(Element formatting) {
+  const auto alike =
+      std::count_if(suspended_.begin(), suspended_.end(), [&formatting](const Element& element) {
+        return element.tag == formatting.tag && *element.declarations == *formatting.declarations;
+      });
+  if (alike < 3 && suspended_.size() < maxSuspended) suspended_.push_back(std::move(formatting));
 }
 
 void Builder::resumeFormatting() {

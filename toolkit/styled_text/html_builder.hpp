@@ -70,6 +70,7 @@ class Builder {
   void closeFrom(Position first);
   void leave(const Element& element);
   void endFormatting(Tag tag);
+  void suspend(Element formatting);
   void resumeFormatting();
   void restyleFrom(Position first);
 

@@ -31,6 +31,8 @@ std::optional<double> fontElementSize(std::string_view value);
 struct FontSize {
   double scale = 1;
   double points = 0;
+
+  friend bool operator==(const FontSize&, const FontSize&) = default;
 };
 
 /// The value of CSS's `font-size`: a length, a percentage or a keyword; absent where it is none.

@@ -30,6 +30,8 @@ struct Declarations {
   int superscript = 0;
   double indent = 0;
   bool preformatted = false;
+
+  friend bool operator==(const Declarations&, const Declarations&) = default;
 };
 
 /// What the open elements' declarations amount to. Small, for every start tag copies one: it points

@@ -4,8 +4,6 @@
 #include <string>
 
 #include "toolkit/property_list/scalars.hpp"
-#include "tools/failure.hpp"
-#include "tools/play/input_file.hpp"
 #include "tools/play/text_layout.hpp"
 
 namespace tools::play {
@@ -15,36 +13,33 @@ bool answersFloatValue(const toolkit::ValueRef<>& value) {
   return toolkit::asNumber(value) || toolkit::asString(value);
 }
 
-[[noreturn]] void fail(std::string_view file, const std::string& message) {
-  throw Failure(ExitStatus::badInput, std::string(file) + ": " + message);
-}
-
-void checkEntry(const toolkit::ValueRef<>& value, const std::string& where, std::string_view file) {
+void checkEntry(const InputFile& file, const std::string& name, const toolkit::ValueRef<>& value) {
   const auto entry = toolkit::asArray(value);
   if (entry->count() < 5) {
-    const std::string found =
-        entry ? "an array of " + std::to_string(entry->count()) : foundWords(value);
-    fail(file, where + "expected an array of a class name and four numbers, found " + found);
+    file.fail(value, name + "expected an array of a class name and four numbers, found " +
+                         foundWords(value));
   }
-  if (!toolkit::asString(entry->objectAtIndex(0))) {
-    fail(file, where + "expected a class name first, found " + foundWords(entry->objectAtIndex(0)));
+  const auto className = entry->objectAtIndex(0);
+  if (!toolkit::asString(className)) {
+    file.fail(className, name + "expected a class name first, found " + foundWords(className));
   }
   for (std::size_t i = 1; i < 5; ++i) {
-    if (answersFloatValue(entry->objectAtIndex(i))) continue;
-    fail(file, where + "element " + std::to_string(i) + ": expected a number, found " +
-                   foundWords(entry->objectAtIndex(i)));
+    const auto length = entry->objectAtIndex(i);
+    if (answersFloatValue(length)) continue;
+    file.fail(length, name + "element " + std::to_string(i) + ": expected a number, found " +
+                          foundWords(length));
   }
 }
 
 }  // namespace
 
-void checkGuiDescription(const toolkit::ValueRef<toolkit::Dictionary>& description,
-                         std::string_view file) {
+void checkGuiDescription(const InputFile& file) {
+  const auto description = file.dictionary();
   if (description->count() == 0) {
-    fail(file, "expected a description of at least one control, found an empty dictionary");
+    file.fail(description, "expected at least one entry, found an empty dictionary");
   }
   for (const auto& [key, value] : description->entries()) {
-    checkEntry(value, "entry " + quote(key->description()) + ": ", file);
+    checkEntry(file, "entry " + quote(key->description()) + ": ", value);
   }
 }
 

@@ -6,7 +6,6 @@
 #include "toolkit/property_list/collections.hpp"
 #include "toolkit/property_list/scalars.hpp"
 #include "tools/failure.hpp"
-#include "tools/play/input_file.hpp"
 #include "tools/play/plist_entry.hpp"
 #include "tools/play/text_layout.hpp"
 #include "tools/play/words.hpp"
@@ -57,10 +56,10 @@ State readState(const PlistEntry& entry, ViewKind kind) {
 /// only where it has one.
 std::vector<std::string_view> keysOf(ViewKind kind) {
   std::vector<std::string_view> keys = {"class", "tag", "frame", "hidden", "toolTip"};
-  if (kind == ViewKind::imageView) keys.push_back("image");
-  if (isButton(kind) || kind == ViewKind::textField) keys.push_back("title");
-  if (isButton(kind)) keys.push_back("state");
-  if (kind != ViewKind::plain && kind != ViewKind::box) keys.push_back("enabled");
+  if (kind == ViewKind::imageView) keys.emplace_back("image");
+  if (isButton(kind) || kind == ViewKind::textField) keys.emplace_back("title");
+  if (isButton(kind)) keys.emplace_back("state");
+  if (kind != ViewKind::plain && kind != ViewKind::box) keys.emplace_back("enabled");
   return keys;
 }
 
@@ -99,11 +98,10 @@ void makeControl(toolkit::TestDriver& driver, const HostControl& control,
 
 }  // namespace
 
-HostWindow parseHostWindow(const toolkit::ValueRef<>& root, std::string_view file) {
-  const auto entries = toolkit::asArray(root);
+HostWindow parseHostWindow(const InputFile& file) {
+  const auto entries = toolkit::asArray(file.root());
   if (!entries) {
-    throw Failure(ExitStatus::badInput,
-                  std::string(file) + ": expected an array of controls, found " + foundWords(root));
+    file.fail(file.root(), "expected an array of controls, found " + foundWords(file.root()));
   }
   HostWindow host;
   for (std::size_t i = 0; i < entries->count(); ++i) {
@@ -125,7 +123,7 @@ toolkit::Ref<toolkit::Window> makeHostWindow(toolkit::TestDriver& driver, const 
       expectImage(driver.toolkit(), *control.caption, file);
     }
   }
-  const auto window = driver.makeWindow(host.content);
+  auto window = driver.makeWindow(host.content);
   for (const HostControl& control : host.controls) {
     makeControl(driver, control, window->contentView());
   }

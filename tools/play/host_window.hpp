@@ -8,8 +8,8 @@
 #include <vector>
 
 #include "toolkit/geometry.hpp"
-#include "toolkit/property_list/value.hpp"
 #include "toolkit/test_driver.hpp"
+#include "tools/play/input_file.hpp"
 
 namespace tools::play {
 
@@ -31,9 +31,8 @@ struct HostWindow {
   std::vector<HostControl> controls;          ///< back to front
 };
 
-/// The window that `root` describes. A Failure that begins with `file` says which entry is wrong,
-/// counted from 1.
-HostWindow parseHostWindow(const toolkit::ValueRef<>& root, std::string_view file);
+/// The window that the file describes. A Failure says which entry is wrong, counted from 1.
+HostWindow parseHostWindow(const InputFile& file);
 
 /// Puts the window on the driver's screen. A Failure when one of its images is not known.
 toolkit::Ref<toolkit::Window> makeHostWindow(toolkit::TestDriver& driver, const HostWindow& host,

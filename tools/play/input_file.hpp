@@ -1,25 +1,39 @@
 // The property lists that the tool is given. Whatever is wrong with one ends the command with a
-// Failure that says where and what was expected.
+// Failure that says where ("FILE:LINE:COLUMN"), what is wrong, and what was expected.
 #pragma once
 
 #include <string>
 #include <string_view>
 
 #include "toolkit/property_list/collections.hpp"
+#include "toolkit/property_list/positions.hpp"
 #include "toolkit/property_list/value.hpp"
 
 namespace tools::play {
 
-/// The value in the property list at `path`, of any of the three formats. `what` names what the
-/// file was to hold, such as "a script".
-toolkit::ValueRef<> readPropertyListFile(const std::string& path, std::string_view what);
+class InputFile {
+ public:
+  /// Reads the property list at `path`, in any of the formats. `what` is what the file is to hold,
+  /// such as "a script".
+  InputFile(std::string path, std::string_view what);
 
-/// The same where the root must be a dictionary.
-toolkit::ValueRef<toolkit::Dictionary> readDictionaryFile(const std::string& path,
-                                                          std::string_view what);
+  const std::string& path() const { return path_; }
+  const toolkit::ValueRef<>& root() const { return root_; }
+  /// The root of a file that must be a dictionary.
+  toolkit::ValueRef<toolkit::Dictionary> dictionary() const;
 
-/// A value as a message shows what was found, such as `the string “abc”` or "an array"; "nothing"
-/// when it is absent.
+  /// Ends the command: `message` is about `value`, which stands in this file.
+  [[noreturn]] void fail(const toolkit::ValueRef<>& value, const std::string& message) const;
+
+ private:
+  std::string path_;
+  std::string what_;
+  toolkit::ValueRef<> root_;
+  toolkit::PositionTable positions_;
+};
+
+/// A value as a message shows what was found, such as `the string “abc”` or "an array of 3";
+/// "nothing" when it is absent.
 std::string foundWords(const toolkit::ValueRef<>& value);
 
 }  // namespace tools::play

@@ -163,10 +163,11 @@ class Renderer {
 
   void addChanges(const std::vector<Change>& changes, std::size_t column) {
     for (const auto& [what, before, now] : changes) {
-      const std::string was = "↳ " + what + ": " + before;
+      std::string was = "↳ ";
+      was.append(what).append(": ").append(before);
       const std::string is = "→ " + now;
       if (displayWidth(was) + 1 + displayWidth(is) <= widthFrom(column)) {
-        addHanging(was + " " + is, column, yellow);
+        addHanging(was.append(" ").append(is), column, yellow);
       } else {
         addHanging(was, column, yellow);
         addHanging(is, column + 2, yellow);

@@ -44,23 +44,21 @@ std::string listOfKeys(const Script& script) {
 }
 
 /// Fails unless the script has a list to start with.
-void checkStart(const Script& script, const PlayOptions& options) {
-  const std::string& file = options.script;
+void checkStart(const InputFile& file, std::string key) {
+  const Script script = file.dictionary();
   if (script->allKeys().empty()) {
-    throw Failure(ExitStatus::failed, file + ": expected at least one list, found an empty script");
+    file.fail(script, "expected at least one list, found an empty script");
   }
-  std::string key = options.startKey;
   // The engine's own rule: the smallest tag as a number, and its list under the decimal form.
   if (key.empty()) key = std::to_string(toolkit::intValueOf(sortedKeys(script).front()));
   const auto list = script->objectForKey(key);
   if (!list) {
-    throw Failure(ExitStatus::failed, file + ": no list under the start key " + quote(key) +
+    throw Failure(ExitStatus::failed, file.path() + ": no list under the start key " + quote(key) +
                                           "; expected one of " + listOfKeys(script));
   }
   if (!toolkit::asArray(list)) {
-    throw Failure(ExitStatus::badInput, file + ": start key " + quote(key) +
-                                            ": expected a list of commands, found " +
-                                            foundWords(list));
+    file.fail(list, "start key " + quote(key) + ": expected a list of commands, found " +
+                        foundWords(list));
   }
 }
 
@@ -117,15 +115,15 @@ void connectLog(toolkit::TestDriver& driver, const Terminal& terminal) {
 }  // namespace
 
 ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
-  const Script script = readDictionaryFile(options.script, "a script");
-  checkStart(script, options);
+  const InputFile file(options.script, "a script");
+  checkStart(file, options.startKey);
   const fs::path path = fs::absolute(options.script);
   if (options.resources) checkDirectory(*options.resources);
 
   const auto driver = requireDriver(options.toolkit);
   driver->setResourcePath(options.resources ? *options.resources : path.parent_path().string());
   connectLog(*driver, terminal);
-  Stage stage(*driver, options, script);
+  Stage stage(*driver, options, file.dictionary());
   Session session(*driver, stage, terminal.out, terminal.style);
 
   session.start(path.string(), options.startKey);

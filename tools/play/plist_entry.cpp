@@ -4,10 +4,9 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <utility>
 
 #include "toolkit/property_list/scalars.hpp"
-#include "tools/failure.hpp"
-#include "tools/play/input_file.hpp"
 #include "tools/play/text_layout.hpp"
 #include "tools/play/whole_number.hpp"
 #include "tools/scenario/near_miss.hpp"
@@ -43,21 +42,21 @@ std::optional<double> numberOf(const toolkit::ValueRef<>& value) {
   return number && std::isfinite(*number) ? number : std::nullopt;
 }
 
-PlistEntry::PlistEntry(std::string_view file, std::string_view name,
-                       const toolkit::ValueRef<>& value)
-    : where_(std::string(file) + ": " + std::string(name)), fields_(toolkit::asDictionary(value)) {
-  if (!fields_) failWith(": expected a dictionary, found " + foundWords(value));
+PlistEntry::PlistEntry(const InputFile& file, std::string name, const toolkit::ValueRef<>& value)
+    : file_(file), name_(std::move(name)), value_(value), fields_(toolkit::asDictionary(value)) {
+  if (!fields_) failAt(value_, "expected a dictionary, found " + foundWords(value));
 }
 
 bool PlistEntry::has(std::string_view key) const { return static_cast<bool>(valueOf(key)); }
 
 void PlistEntry::expectOnly(const std::vector<std::string_view>& keys) const {
-  for (const std::string& key : fields_->allKeys()) {
+  for (const auto& [keyValue, value] : fields_->entries()) {
+    const std::string key = keyValue->description();
     if (std::find(keys.begin(), keys.end(), key) != keys.end()) continue;
     std::string known;
     for (const std::string_view k : keys) known.append(known.empty() ? "" : ", ").append(k);
-    failWith(": unknown key " + quote(key) + "; expected " + known +
-             scenario::didYouMean(key, keys));
+    failAt(keyValue,
+           "unknown key " + quote(key) + "; expected " + known + scenario::didYouMean(key, keys));
   }
 }
 
@@ -95,7 +94,8 @@ toolkit::Rect PlistEntry::requiredRect(std::string_view key) const {
     const auto number = numberOf(list->objectAtIndex(i));
     if (!number) {
       const std::string place = std::string(key) + "[" + std::to_string(i) + "]";
-      failWith(": " + place + ": expected a number, found " + foundWords(list->objectAtIndex(i)));
+      const auto element = list->objectAtIndex(i);
+      failAt(element, place + ": expected a number, found " + foundWords(element));
     }
     numbers.at(i) = *number;
   }
@@ -105,16 +105,18 @@ toolkit::Rect PlistEntry::requiredRect(std::string_view key) const {
 }
 
 void PlistEntry::fail(std::string_view key, std::string_view expected) const {
-  failWith(": " + std::string(key) + ": expected " + std::string(expected) + ", found " +
-           foundWords(valueOf(key)));
+  const auto value = valueOf(key);
+  // What is missing has no place but that of the entry that lacks it.
+  failAt(value ? value : value_,
+         std::string(key) + ": expected " + std::string(expected) + ", found " + foundWords(value));
 }
 
 toolkit::ValueRef<> PlistEntry::valueOf(std::string_view key) const {
   return fields_->objectForKey(key);
 }
 
-void PlistEntry::failWith(const std::string& message) const {
-  throw Failure(ExitStatus::badInput, where_ + message);
+void PlistEntry::failAt(const toolkit::ValueRef<>& value, const std::string& message) const {
+  file_.fail(value, name_ + ": " + message);
 }
 
 }  // namespace tools::play

@@ -10,6 +10,7 @@
 #include "toolkit/geometry.hpp"
 #include "toolkit/property_list/collections.hpp"
 #include "toolkit/property_list/value.hpp"
+#include "tools/play/input_file.hpp"
 
 namespace tools::play {
 
@@ -18,11 +19,11 @@ namespace tools::play {
 std::optional<double> numberOf(const toolkit::ValueRef<>& value);
 
 /// An entry whose fields stand under keys. Reading a field that is not what it should be throws a
-/// Failure: "FILE: entry 3: tag: expected …, found …".
+/// Failure: "FILE:LINE:COLUMN: entry 3: tag: expected …, found …".
 class PlistEntry {
  public:
-  /// `name` is how messages call it, such as "entry 3".
-  PlistEntry(std::string_view file, std::string_view name, const toolkit::ValueRef<>& value);
+  /// `name` is how messages call it, such as "entry 3". The file outlives it.
+  PlistEntry(const InputFile& file, std::string name, const toolkit::ValueRef<>& value);
 
   bool has(std::string_view key) const;
   /// Fails when the entry has a key that is none of these.
@@ -38,9 +39,12 @@ class PlistEntry {
 
  private:
   toolkit::ValueRef<> valueOf(std::string_view key) const;
-  [[noreturn]] void failWith(const std::string& message) const;
+  /// `value` is what the message is about.
+  [[noreturn]] void failAt(const toolkit::ValueRef<>& value, const std::string& message) const;
 
-  std::string where_;
+  const InputFile& file_;
+  std::string name_;
+  toolkit::ValueRef<> value_;
   toolkit::ValueRef<toolkit::Dictionary> fields_;
 };
 

@@ -34,7 +34,7 @@ const ControlPicture* controlWithTag(const StepPicture& picture, long tag) {
 }
 
 std::string pressWords(const StepPicture& picture, long tag) {
-  const std::string words = std::to_string(tag);
+  std::string words = std::to_string(tag);
   const ControlPicture* control = controlWithTag(picture, tag);
   if (!control || !isButton(control->view.kind)) return words;
   const std::string title = contentOf(*control);

@@ -28,8 +28,7 @@ Stage::Stage(toolkit::TestDriver& driver, const PlayOptions& options,
   if (options.assets) {
     buildFrom(*options.assets);
   } else if (options.window) {
-    const auto root = readPropertyListFile(*options.window, "a host's window");
-    adopt(parseHostWindow(root, *options.window), *options.window);
+    adopt(parseHostWindow(InputFile(*options.window, "a host's window")), *options.window);
   } else {
     adopt(standInWindow(script), options.script);
   }
@@ -44,10 +43,10 @@ Stage::~Stage() {
 }
 
 void Stage::buildFrom(const std::string& descriptionFile) {
-  const auto description = readDictionaryFile(descriptionFile, "a description of a window");
-  checkGuiDescription(description, descriptionFile);
+  const InputFile file(descriptionFile, "a description of a window");
+  checkGuiDescription(file);
   engine_ = QZ_Plist_State_Parser::initWithWindow(driver_.toolkit(), parent_);
-  engine_->loadGuiAssets(description, nullptr);
+  engine_->loadGuiAssets(file.dictionary(), nullptr);
 }
 
 void Stage::adopt(const HostWindow& host, const std::string& file) {

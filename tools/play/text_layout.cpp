@@ -103,7 +103,9 @@ void wrapLine(std::string_view line, std::size_t width, std::vector<std::string>
 
 std::string padding(std::string_view text, std::size_t width) {
   const std::size_t taken = displayWidth(text);
-  return std::string(width > taken ? width - taken : 0, ' ');
+  std::string spaces;
+  spaces.resize(width > taken ? width - taken : 0, ' ');
+  return spaces;
 }
 
 }  // namespace

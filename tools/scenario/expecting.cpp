@@ -10,8 +10,16 @@
 namespace tools::scenario {
 namespace {
 
+[[noreturn]] void refuse(const Wanted& wanted, const Reading& reading) {
+  auto got = show(reading);
+  if (reading && reading->is_structured() && reading->type() == wanted.value.type()) {
+    got += " (they differ at " + whereDifferent(wanted.value, *reading) + ")";
+  }
+  throw Unmet(show(wanted), got);
+}
+
 void requireSame(const Wanted& wanted, const Reading& reading) {
-  if (!wanted.holdsFor(reading)) throw Unmet(show(wanted), show(reading));
+  if (!wanted.holdsFor(reading)) refuse(wanted, reading);
 }
 
 Outcome state(Stage& stage, const Arguments& a) {
@@ -136,7 +144,7 @@ Outcome property(Stage& stage, const Arguments& a) {
   const auto& names = stage.classNames;
   const Wanted unified{wanted.kind, names.unifiedTexts(wanted.value)};
   if (!unified.holdsFor(names.unifiedTexts(*shown.reading))) {
-    throw Unmet(show(wanted), show(shown.reading));
+    refuse(wanted, shown.reading);
   }
   return {};
 }

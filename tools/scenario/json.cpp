@@ -50,6 +50,25 @@ bool sameJson(const Json& a, const Json& b) {
   return a == b;
 }
 
+std::string whereDifferent(const Json& a, const Json& b) {
+  if (a.is_array() && b.is_array()) {
+    const auto both = std::min(a.size(), b.size());
+    std::size_t i = 0;
+    while (i < both && sameJson(a[i], b[i])) ++i;
+    return "[" + std::to_string(i) + "]" + (i < both ? whereDifferent(a[i], b[i]) : "");
+  }
+  if (!a.is_object() || !b.is_object()) return "";
+  for (const auto& [key, value] : a.items()) {
+    const auto other = b.find(key);
+    if (other == b.end()) return "." + key;
+    if (!sameJson(value, *other)) return "." + key + whereDifferent(value, *other);
+  }
+  // All that `a` has is the same, so `b` has a key more.
+  const auto more =
+      std::ranges::find_if(b.items(), [&](const auto& item) { return !a.contains(item.key()); });
+  return "." + more.key();
+}
+
 std::string show(const Json& value) {
   if (value.is_boolean()) return value.get<bool>() ? "YES" : "NO";
   return value.dump(-1, ' ', false, Json::error_handler_t::replace);

@@ -19,6 +19,10 @@ std::optional<Json> numberIn(std::string_view text);
 /// to order. YES is not 1.
 bool sameJson(const Json& a, const Json& b);
 
+/// Where two values that are not the same first differ, such as `[0].font`; empty when it is at
+/// their root.
+std::string whereDifferent(const Json& a, const Json& b);
+
 /// A value as a scenario would write it, on one line: a boolean is YES or NO unless it stands
 /// within a list or an object. Bytes that are no UTF-8 show as U+FFFD.
 std::string show(const Json& value);

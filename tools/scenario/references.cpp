@@ -3,16 +3,16 @@
 #include "tools/scenario/references.hpp"
 
 #include <algorithm>
-#include <array>
 #include <charconv>
+#include <iterator>
 
 namespace tools::scenario {
 namespace {
 
 // Words that would read as something else where a name can stand.
-constexpr std::array<std::string_view, 14> reservedNames = {
-    "absent", "constant", "delegate", "empty", "engine",  "entries", "host",
-    "log",    "none",     "of",       "plain", "present", "timer",   "tutorial"};
+constexpr std::string_view reservedNames[] = {"absent", "delegate", "engine", "entries",
+                                              "log",    "none",     "plain",  "present",
+                                              "state",  "tutorial"};
 
 template <class Integer>
 std::optional<Integer> integerBehind(char sign, std::string_view text) {
@@ -75,7 +75,7 @@ std::optional<std::string> Names::whyNotNew(const Word& word) const {
            " is no name; names are made of letters, digits, _ and -, and begin with a "
            "letter or _";
   }
-  if (std::find(reservedNames.begin(), reservedNames.end(), word.text) != reservedNames.end()) {
+  if (std::ranges::find(reservedNames, word.text) != std::end(reservedNames)) {
     return shown + " has a meaning of its own here; take another name";
   }
   if (const auto found = names_.find(word.text); found != names_.end()) {

@@ -40,9 +40,8 @@ Report Runner::run(const LoadedFile& file, const Scenario& scenario) const {
   }
   const auto start = std::chrono::steady_clock::now();
   const auto driver = makeDriver();
-  const auto folder = std::filesystem::absolute(file.path).parent_path();
   try {
-    Stage stage(*driver, folder, [&](const Statement& statement, const std::string& outcome) {
+    Stage stage(*driver, file.path, [&](const Statement& statement, const std::string& outcome) {
       performed(file.path, statement, outcome);
     });
     perform(stage, file, scenario);

@@ -1,6 +1,7 @@
 // Statements that set a scenario up: files, windows, controls.
 
 #include <cstddef>
+#include <filesystem>
 #include <fstream>
 #include <sstream>
 
@@ -27,13 +28,14 @@ Outcome file(Stage& stage, const Arguments& a) {
 }
 
 Outcome copy(Stage& stage, const Arguments& a) {
-  const auto path = stage.folder / a.text("PATH");
+  const auto folder = std::filesystem::absolute(stage.file).parent_path();
+  const auto path = folder / a.text("PATH");
   std::ifstream source(path, std::ios::binary);
   std::ostringstream contents;
   // An empty file is one too, though reading it out sets the stream's fail bit.
   if (std::filesystem::is_regular_file(path)) contents << source.rdbuf();
   if (!source || !std::filesystem::is_regular_file(path)) {
-    throw Unmet("the file " + a.text("PATH") + " in " + stage.folder.string(), "none");
+    throw Unmet("the file " + a.text("PATH") + " in " + folder.string(), "none");
   }
   stage.resources.write(a.text("FILE"), contents.str());
   return {};

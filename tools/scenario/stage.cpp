@@ -7,6 +7,7 @@
 
 #include "tools/scenario/statements.hpp"
 #include "tools/scenario/unmet.hpp"
+#include "tools/stack_guard.hpp"
 
 namespace tools::scenario {
 namespace {
@@ -23,6 +24,17 @@ class Replaced {
  private:
   T& place_;
   T before_;
+};
+
+/// While it lives, a script that exhausts the stack ends the tool with a line that names the place.
+class GuardedStack {
+ public:
+  GuardedStack(const std::shared_ptr<Engine>& engine, const std::string& place) {
+    if (engine) guardScript(*engine, place, {});
+  }
+  ~GuardedStack() { forgetScript(); }
+  GuardedStack(const GuardedStack&) = delete;
+  GuardedStack& operator=(const GuardedStack&) = delete;
 };
 
 std::string replaceAll(std::string text, std::string_view what, const std::string& with) {
@@ -42,7 +54,7 @@ std::string describe(const Outcome& outcome, const Cast& cast) {
     case Result::nothing:
       break;
   }
-  return "done";
+  return "ok";
 }
 
 void requireOutcome(const Clause& clause, const Outcome& outcome, const Cast& cast) {
@@ -57,10 +69,9 @@ void requireOutcome(const Clause& clause, const Outcome& outcome, const Cast& ca
 
 }  // namespace
 
-Stage::Stage(toolkit::TestDriver& driverToUse, std::filesystem::path folderOfFile,
-             Performed performed)
+Stage::Stage(toolkit::TestDriver& driverToUse, std::string nameOfFile, Performed performed)
     : driver(driverToUse),
-      folder(std::move(folderOfFile)),
+      file(std::move(nameOfFile)),
       classNames(driverToUse),
       host(std::make_shared<HostResponder>([this](const Cast::View& sender) {
         happened({Reactions::Event::Kind::action, {}, sender});
@@ -82,6 +93,8 @@ Stage::Stage(toolkit::TestDriver& driverToUse, std::filesystem::path folderOfFil
 Stage::~Stage() { driver.setLogSink({}); }
 
 void Stage::perform(const Statement& statement) {
+  const auto engine = engines.current();
+  const GuardedStack guarded(engine, file + ":" + std::to_string(statement.at.line));
   performHere(statement);
   if (auto failed = std::exchange(failedReaction_, std::nullopt)) throw Failed(*failed);
 }

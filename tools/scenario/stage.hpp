@@ -1,7 +1,6 @@
 // The stage of one scenario: all that its statements act on, fresh for each.
 #pragma once
 
-#include <filesystem>
 #include <functional>
 #include <map>
 #include <memory>
@@ -52,10 +51,10 @@ struct Failed {
 /// which outlives the stage.
 class Stage {
  public:
-  /// `folder` is where the scenario's file stands. `performed` is told of every statement that was
+  /// `file` is the scenario's, as messages name it. `performed` is told of every statement that was
   /// performed, and its outcome in words.
   using Performed = std::function<void(const Statement&, const std::string& outcome)>;
-  Stage(toolkit::TestDriver& driver, std::filesystem::path folder, Performed performed);
+  Stage(toolkit::TestDriver& driver, std::string file, Performed performed);
   ~Stage();
   Stage(const Stage&) = delete;
   Stage& operator=(const Stage&) = delete;
@@ -68,7 +67,7 @@ class Stage {
   void requireNothingLeft(const Statement& last);
 
   toolkit::TestDriver& driver;
-  const std::filesystem::path folder;
+  const std::string file;
   const ClassNames classNames;
   const ResourceDirectory resources;
   LogRecord log;

@@ -1,0 +1,101 @@
+// The property lists that the tool is given.
+#include "tools/play/input_file.hpp"
+
+#include <cerrno>
+#include <cstring>
+#include <filesystem>
+#include <fstream>
+#include <sstream>
+#include <utility>
+
+#include "toolkit/property_list/reader.hpp"
+#include "toolkit/property_list/scalars.hpp"
+#include "tools/failure.hpp"
+#include "tools/play/text_layout.hpp"
+
+namespace tools::play {
+namespace {
+
+[[noreturn]] void refuse(const std::string& message) {
+  throw Failure(ExitStatus::badInput, message);
+}
+
+std::string contentsOf(const std::string& path, const std::string& what) {
+  std::error_code error;
+  const auto status = std::filesystem::status(path, error);
+  if (!exists(status)) refuse(path + ": no such file; expected " + what);
+  if (is_directory(status)) refuse(path + ": a directory; expected " + what);
+  errno = 0;
+  std::ifstream file(path, std::ios::binary);
+  std::ostringstream contents;
+  // An empty file sets the fail bit of what it is copied to; the reader has the better message.
+  if (file && file.peek() != std::ifstream::traits_type::eof()) contents << file.rdbuf();
+  if (file.bad() || !file.is_open()) {
+    refuse(path + ": cannot be read (" + std::strerror(errno) + "); expected " + what);
+  }
+  return contents.str();
+}
+
+/// A place as a prefix of messages about it.
+std::string where(const std::string& path, const std::optional<toolkit::Position>& position) {
+  if (!position) return path + ": ";
+  if (const auto* text = std::get_if<toolkit::TextPosition>(&*position)) {
+    return path + ":" + std::to_string(text->line) + ":" + std::to_string(text->column) + ": ";
+  }
+  return path + ": " + toolkit::description(*position) + ": ";
+}
+
+}  // namespace
+
+InputFile::InputFile(std::string path, std::string_view what)
+    : path_(std::move(path)), what_(what) {
+  const auto result = toolkit::readPropertyList(contentsOf(path_, what_), &positions_);
+  if (const auto& refusal = result.refusal) {
+    refuse(where(path_, refusal->position) + printable(refusal->reason) + " (read as " +
+           std::string(toolkit::description(refusal->format)) + ")");
+  }
+  root_ = result.value;
+}
+
+toolkit::ValueRef<toolkit::Dictionary> InputFile::dictionary() const {
+  auto dictionary = toolkit::asDictionary(root_);
+  if (!dictionary) {
+    fail(root_, "expected " + what_ + " (a dictionary), found " + foundWords(root_));
+  }
+  return dictionary;
+}
+
+void InputFile::fail(const toolkit::ValueRef<>& value, const std::string& message) const {
+  refuse(where(path_, positions_.of(*value)) + message);
+}
+
+std::string foundWords(const toolkit::ValueRef<>& value) {
+  switch (value->kind()) {
+    case toolkit::Value::Kind::string:
+      return "the string " + quote(value->description());
+    case toolkit::Value::Kind::number:
+      return toolkit::asNumber(value)->type() == toolkit::Number::Type::boolean
+                 ? std::string(value->boolValue() ? "YES" : "NO")
+                 : "the number " + value->description();
+    case toolkit::Value::Kind::date:
+      return "a date";
+    case toolkit::Value::Kind::data:
+      return "data";
+    case toolkit::Value::Kind::null:
+      return "a null";
+    case toolkit::Value::Kind::uid:
+      return "a UID";
+    case toolkit::Value::Kind::set:
+      return "a set";
+    case toolkit::Value::Kind::array:
+      return value->count() == 0 ? "an empty array"
+                                 : "an array of " + std::to_string(value->count());
+    case toolkit::Value::Kind::dictionary:
+      return value->count() == 0 ? "an empty dictionary" : "a dictionary";
+    case toolkit::Value::Kind::nothing:
+      break;
+  }
+  return "nothing";
+}
+
+}  // namespace tools::play
