@@ -54,8 +54,8 @@ bool QZ_Plist_State_Parser::loadGuiAssets(const Dictionary& description,
     if (!makeControl(key, entry)) continue;
     // What goes into the window is the list's last control. Without a list, as after termination,
     // that is none; the entry counts all the same.
-    const auto& controls = addedObjectToTutorial_->elements();
-    if (!controls.empty()) window->contentView()->addSubview(controls.back());
+    const Controls controls = *addedObjectToTutorial_;
+    if (controls->count() > 0) window->contentView()->addSubview(controls->elements().back());
     added = true;
   }
   window->makeKeyAndOrderFront();

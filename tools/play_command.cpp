@@ -79,7 +79,7 @@ void addStepOptions(CLI::App& command, play::PlayOptions& options) {
           "--press",
           [&options](const std::vector<std::string>& tags) { addPresses(options, tags); },
           "Press the buttons with these tags, in turn")
-      ->type_name("TAG...")
+      ->type_name("TAG")
       ->trigger_on_parse();
   command
       .add_option_function<std::string>(
@@ -93,7 +93,7 @@ void addStepOptions(CLI::App& command, play::PlayOptions& options) {
 
 void addPlayCommand(CLI::App& app, int& status) {
   CLI::App* command =
-      app.add_subcommand("play", "Plays a script and shows, step by step, what its user would see");
+      app.add_subcommand("play", "Play a script and show, step by step, what its user would see");
   const auto options = std::make_shared<play::PlayOptions>();
   command->add_option("SCRIPT", options->script, "The script, a property list")
       ->required()

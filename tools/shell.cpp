@@ -94,6 +94,8 @@ int runTool(const std::vector<std::string>& arguments, const std::vector<AddComm
   int status = static_cast<int>(ExitStatus::fine);
   app.set_version_flag("--version", std::string(toolName) + " " + QZ_VERSION);
   app.footer(exitStatuses);
+  app.get_formatter()->label("SUBCOMMAND", "COMMAND");
+  app.get_formatter()->label("Subcommands", "Commands");
   app.require_subcommand(1);
   for (const AddCommand add : commands) add(app, status);
 

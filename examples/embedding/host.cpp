@@ -48,7 +48,8 @@ int play(const char* resources) {
 
   // Nobody tells the host that the script has ended it: ask after every press.
   if (!engine->terminating()) engine->terminateParser();
-  for (const auto& [tag, on] : engine->buttonStates()->entries()) {
+  const auto states = engine->buttonStates();  // held, for the entries live no longer than it
+  for (const auto& [tag, on] : states->entries()) {
     std::cout << "pressed: " << tag->description() << (on->boolValue() ? " (on)\n" : " (off)\n");
   }
   std::cout << "last list: " << engine->currentCommandState() << '\n';

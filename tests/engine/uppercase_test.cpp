@@ -55,7 +55,7 @@ TEST(Uppercase, LettersThatBecomeSeveral) {
       {"Latin ligatures", "ﬀﬁﬂﬃﬄﬅﬆ", "FFFIFLFFIFFLSTST"},
       {"Armenian ligatures", "ևﬓ", "ԵՒՄՆ"},
       {"letters with marks that have no capital", "ŉǰẖẗẘẙẚ", "ʼNJ̌H̱T̈W̊Y̊Aʾ"},
-      {"Greek with two marks", "ΐΰ", "Ϊ́Ϋ́"},
+      {"Greek with two marks", "ΐΰ", "\u0399\u0308\u0301\u03A5\u0308\u0301"},
       {"Greek with an iota below", "ᾳῃῳᾀ", "ΑΙΗΙΩΙἈΙ"},
       {"Greek with an iota beside", "ᾼῌῼᾈ", "ΑΙΗΙΩΙἈΙ"},
   };

@@ -94,9 +94,9 @@ TEST_F(RunLoopTest, TheClockShowsTheTimeOfTheFiring) {
 
 TEST_F(RunLoopTest, ARepeatingTimerDoesNotDrift) {
   note("r", 0.1, true);
-  loop.advance(100'000);
-  ASSERT_EQ(fired.size(), 1'000'000u);
-  EXPECT_EQ(fired.back().at, 100'000);
+  loop.advance(10'000);
+  ASSERT_EQ(fired.size(), 100'000u);
+  EXPECT_EQ(fired.back().at, 10'000);
   for (std::size_t i = 0; i < fired.size(); ++i)
     ASSERT_EQ(fired[i].at, static_cast<double>(i + 1) * 0.1);
 }

@@ -10,6 +10,19 @@ namespace {
 
 using namespace styled_text_tests;
 
+struct ValueCase {
+  const char* value;
+  const char* runs;
+};
+
+template <std::size_t N>
+void expectValues(const std::string& property, const std::array<ValueCase, N>& cases) {
+  for (const auto& [value, runs] : cases) {
+    const std::string html = "<span style='" + property + ": " + value + "'>x</span>";
+    EXPECT_EQ(runsText(read(html)), runs) << html;
+  }
+}
+
 TEST(HtmlStyle, IsTimes12WhenNothingIsAskedFor) {
   const auto text = read("x");
   ASSERT_EQ(text.runs().size(), 1U);
@@ -99,47 +112,37 @@ TEST(HtmlStyle, GrowsAndShrinksByAFifthOfTheSmallerSize) {
 }
 
 TEST(HtmlStyle, ReadsSizesOfCss) {
-  const struct {
-    const char* size;
-    const char* runs;
-  } cases[] = {
-      {"14pt", "x{14}"},
-      {"16px", "x"},
-      {"20PX", "x{15}"},
-      {"1.5em", "x{18}"},
-      {".5em", "x{6}"},
-      {"150%", "x{18}"},
-      {"2ex", "x"},
-      {"1in", "x{72}"},
-      {"2.54cm", "x{72}"},
-      {"25.4mm", "x{72}"},
-      {"2pc", "x{24}"},
-      {"2rem", "x{24}"},
-      {"xx-small", "x{6.75}"},
-      {"x-small", "x{7.5}"},
-      {"small", "x{9.75}"},
-      {"medium", "x"},
-      {"Large", "x{13.5}"},
-      {"x-large", "x{18}"},
-      {"xx-large", "x{24}"},
-      {"+14pt", "x{14}"},
-      {"14 pt", "x"},
-      {"14", "x"},
-      {"-14pt", "x"},
-      {"pt", "x"},
-      {"huge", "x"},
-      {"", "x"},
-      {"inf", "x"},
-      {"nanpt", "x"},
-      {"0", "x{1}"},
-      {"0.01pt", "x{1}"},
-      {"1e3pt", "x"},
-      {"99999pt", "x{1000}"},
-      {"+-3pt", "x"},
-  };
-  for (const auto& [size, runs] : cases) {
-    const std::string html = std::string("<span style='font-size:") + size + "'>x</span>";
-    EXPECT_EQ(runsText(read(html)), runs) << html;
+  expectValues("font-size", std::to_array<ValueCase>({
+                                {"14pt", "x{14}"},
+                                {"16px", "x"},
+                                {"20PX", "x{15}"},
+                                {"1.5em", "x{18}"},
+                                {".5em", "x{6}"},
+                                {"150%", "x{18}"},
+                                {"2ex", "x"},
+                                {"1in", "x{72}"},
+                                {"2.54cm", "x{72}"},
+                                {"25.4mm", "x{72}"},
+                                {"2pc", "x{24}"},
+                                {"2rem", "x{24}"},
+                                {"xx-small", "x{6.75}"},
+                                {"x-small", "x{7.5}"},
+                                {"small", "x{9.75}"},
+                                {"medium", "x"},
+                                {"Large", "x{13.5}"},
+                                {"x-large", "x{18}"},
+                                {"xx-large", "x{24}"},
+                                {"+14pt", "x{14}"},
+                                {"0", "x{1}"},
+                                {"0.01pt", "x{1}"},
+                                {"99999pt", "x{1000}"},
+                            }));
+}
+
+TEST(HtmlStyle, PassesOverSizesThatAreNone) {
+  for (const std::string size :
+       {"14 pt", "14", "-14pt", "pt", "huge", "", "inf", "nanpt", "1e3pt", "+-3pt"}) {
+    EXPECT_EQ(runsText(read("<big style='font-size:" + size + "'>x")), "x{14.4}") << size;
   }
 }
 
@@ -177,47 +180,39 @@ TEST(HtmlStyle, ReadsInlineStyleSheetsLeniently) {
 }
 
 TEST(HtmlStyle, ReadsColorsOfCss) {
-  const struct {
-    const char* color;
-    const char* runs;
-  } cases[] = {
-      {"#f00", "x{#ff0000}"},
-      {"#00E5ff", "x{#00e5ff}"},
-      {"rgb(1,2,3)", "x{#010203}"},
-      {"RGB( 300 , -5 , 50% )", "x{#ff0080}"},
-      {"rgba(255,0,0,.5)", "x{#ff0000/0.5}"},
-      {"black", "x{#000000}"},
-      {"Silver", "x{#c0c0c0}"},
-      {"gray", "x{#808080}"},
-      {"white", "x{#ffffff}"},
-      {"maroon", "x{#800000}"},
-      {"purple", "x{#800080}"},
-      {"fuchsia", "x{#ff00ff}"},
-      {"green", "x{#008000}"},
-      {"lime", "x{#00ff00}"},
-      {"olive", "x{#808000}"},
-      {"yellow", "x{#ffff00}"},
-      {"navy", "x{#000080}"},
-      {"teal", "x{#008080}"},
-      {"aqua", "x{#00ffff}"},
-      {"aliceblue", "x{#f0f8ff}"},
-      {"LightGoldenrodYellow", "x{#fafad2}"},
-      {"darkslategrey", "x{#2f4f4f}"},
-      {"yellowgreen", "x{#9acd32}"},
-      {"#ff", "x"},
-      {"#ggg", "x"},
-      {"ff0000", "x"},
-      {"rgb(1,2)", "x"},
-      {"rgb(1,2,3,4,5)", "x"},
-      {"rgb(1,2,3", "x"},
-      {"rgb 1,2,3)", "x"},
-      {"hsv(1,2,3)", "x"},
-      {"rgb(a,b,c)", "x"},
-      {"", "x"},
-  };
-  for (const auto& [color, runs] : cases) {
-    const std::string html = std::string("<span style='color: ") + color + "'>x</span>";
-    EXPECT_EQ(runsText(read(html)), runs) << html;
+  expectValues("color", std::to_array<ValueCase>({
+                            {"#f00", "x{#ff0000}"},
+                            {"#00E5ff", "x{#00e5ff}"},
+                            {"rgb(1,2,3)", "x{#010203}"},
+                            {"RGB( 300 , -5 , 50% )", "x{#ff0080}"},
+                            {"rgba(255,0,0,.5)", "x{#ff0000/0.5}"},
+                            {"black", "x{#000000}"},
+                            {"Silver", "x{#c0c0c0}"},
+                            {"gray", "x{#808080}"},
+                            {"white", "x{#ffffff}"},
+                            {"maroon", "x{#800000}"},
+                            {"purple", "x{#800080}"},
+                            {"fuchsia", "x{#ff00ff}"},
+                            {"green", "x{#008000}"},
+                            {"lime", "x{#00ff00}"},
+                            {"olive", "x{#808000}"},
+                            {"yellow", "x{#ffff00}"},
+                            {"navy", "x{#000080}"},
+                            {"teal", "x{#008080}"},
+                            {"aqua", "x{#00ffff}"},
+                            {"aliceblue", "x{#f0f8ff}"},
+                            {"LightGoldenrodYellow", "x{#fafad2}"},
+                            {"darkslategrey", "x{#2f4f4f}"},
+                            {"yellowgreen", "x{#9acd32}"},
+                        }));
+}
+
+TEST(HtmlStyle, PassesOverColorsThatAreNone) {
+  for (const std::string color :
+       {"#ff", "#ggg", "ff0000", "rgb(1,2)", "rgb(1,2,3,4,5)", "rgb(1,2,3", "rgb 1,2,3)",
+        "hsv(1,2,3)", "rgb(a,b,c)", "rgb(1 2,3,4)", ""}) {
+    EXPECT_EQ(runsText(read("<font color=red style='color:" + color + "'>x")), "x{#ff0000}")
+        << color;
   }
 }
 

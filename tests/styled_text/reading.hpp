@@ -4,7 +4,6 @@
 
 #include <gtest/gtest.h>
 
-#include <algorithm>
 #include <array>
 #include <cmath>
 #include <cstdio>
@@ -16,20 +15,22 @@
 
 namespace styled_text_tests {
 
+inline std::string lowercase(std::string text) {
+  for (char& c : text) c = c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
+  return text;
+}
+
 /// Knows a few families, by their names in any case, and one bold font of its own.
 class Catalogue final : public toolkit::Fonts {
  public:
   std::optional<toolkit::Font> fontWithName(std::string_view name, double size) const override {
     ++lookUps;
-    std::string key(name);
-    std::transform(key.begin(), key.end(), key.begin(),
-                   [](char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c + 32) : c; });
+    const std::string key = lowercase(std::string(name));
     if (key == "arial-bold") return toolkit::Font{"Arial", size, true};
     for (const char* family : {"Times", "Helvetica", "Courier", "Arial", "Comic Sans MS"}) {
-      std::string known(family);
-      std::transform(known.begin(), known.end(), known.begin(),
-                     [](char c) { return c >= 'A' && c <= 'Z' ? static_cast<char>(c + 32) : c; });
-      if (key == known) return toolkit::Font{family, size, false, false, key == "courier"};
+      if (key == lowercase(family)) {
+        return toolkit::Font{family, size, false, false, key == "courier"};
+      }
     }
     return std::nullopt;
   }

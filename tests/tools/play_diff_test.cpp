@@ -117,7 +117,19 @@ TEST(PlayDiff, stylesCountBesideTheText) {
       {"another text in other styles",
        halfBold("ab", "c"),
        AttributedString("x"),
-       {{"text", "“abc”", "“x”"}, {"style", "plain; Times 12 bold", "plain"}}},
+       {{"text", "“abc”", "“x”"}, {"style", "2 pieces", "plain"}}},
+      {"another text in as many other styles",
+       halfBold("ab", "c"),
+       [] {
+         AttributedString text("x", bold());
+         text.append("y", {});
+         return text;
+       }(),
+       {{"text", "“abc”", "“xy”"}, {"style", "2 pieces", "other 2 pieces"}}},
+      {"a text where there was none, in no style",
+       AttributedString(),
+       AttributedString("x"),
+       {{"text", "“”", "“x”"}}},
   };
   for (const auto& c : cases) {
     StepPicture before = oneControl(ViewKind::textField);

@@ -34,12 +34,11 @@ std::string dumpString(std::string_view text) {
     if (c == '"' || c == '\\') dump += '\\';
     if (c >= 0x20 && c < 0x7F) {
       dump += static_cast<char>(c);
-    } else if (c < 0x10000) {
-      dump += formatted("\\u%04x", static_cast<unsigned>(c));
-    } else {
-      const auto offset = static_cast<unsigned>(c - 0x10000);
-      dump += formatted("\\u%04x\\u%04x", 0xD800 + (offset >> 10), 0xDC00 + (offset & 0x3FF));
+      continue;
     }
+    std::u16string units;
+    appendUtf16(units, c);
+    for (const char16_t unit : units) dump += formatted("\\u%04x", unsigned{unit});
   }
   return dump + '"';
 }

@@ -80,6 +80,16 @@ void appendUtf8(std::string& text, char32_t codePoint) {
   byte(0x80 | (codePoint & 0x3F));
 }
 
+void appendUtf16(std::u16string& text, char32_t codePoint) {
+  if (codePoint < 0x10000) {
+    text += static_cast<char16_t>(codePoint);
+    return;
+  }
+  const char32_t offset = codePoint - 0x10000;
+  text += static_cast<char16_t>(0xD800 + (offset >> 10));
+  text += static_cast<char16_t>(0xDC00 + (offset & 0x3FF));
+}
+
 char32_t nextCodePoint(std::string_view text, std::size_t& position) {
   const unsigned lead = byteAt(text, position++);
   if (lead < 0xC0) return lead;

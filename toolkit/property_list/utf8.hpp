@@ -14,6 +14,9 @@ std::size_t validUtf8Length(std::string_view text);
 /// Appends a code point up to U+10FFFF, surrogates included.
 void appendUtf8(std::string& text, char32_t codePoint);
 
+/// Appends a code point as one UTF-16 unit or two.
+void appendUtf16(std::u16string& text, char32_t codePoint);
+
 /// The code point that starts at `position` in generalized UTF-8; moves `position` behind it.
 char32_t nextCodePoint(std::string_view text, std::size_t& position);
 

@@ -3,7 +3,6 @@
 #include "toolkit/styled_text/html_builder.hpp"
 
 #include <algorithm>
-#include <iterator>
 #include <string>
 #include <utility>
 

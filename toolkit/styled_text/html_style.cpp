@@ -20,85 +20,49 @@ constexpr TagSet aligned = tags::blocks | tags::cells | tags::rowGroups | TagSet
 /// Elements whose `bgcolor` shows behind their text; the body's is the page's.
 constexpr TagSet coloredBehind = tags::cells | tags::tableParts;
 
-void makeHeading(Declarations& own, double scale) {
-  own.size.scale = scale;
-  own.bold = true;
-}
+constexpr TagSet bold = tags::headings | TagSet{Tag::b, Tag::strong, Tag::th};
+constexpr TagSet italic{Tag::address, Tag::cite, Tag::dfn, Tag::em, Tag::i, Tag::var};
+constexpr TagSet underlined{Tag::ins, Tag::u};
+constexpr TagSet struckOut{Tag::del, Tag::s, Tag::strike};
+constexpr TagSet fixedPitch{Tag::code, Tag::kbd, Tag::pre, Tag::samp, Tag::tt};
+constexpr TagSet indented = tags::lists | TagSet{Tag::blockquote, Tag::dd};
+constexpr TagSet centered{Tag::caption, Tag::center, Tag::th};
 
-/// Declares what the element does to letters.
-void declareLetters(Tag tag, const Fonts& fonts, Declarations& own) {
+/// What the element multiplies the size by.
+double scaleOf(Tag tag) {
   switch (tag) {
-    case Tag::b:
-    case Tag::strong:
-    case Tag::th:
-      own.bold = true;
-      break;
-    case Tag::address:
-    case Tag::cite:
-    case Tag::dfn:
-    case Tag::em:
-    case Tag::i:
-    case Tag::var:
-      own.italic = true;
-      break;
-    case Tag::ins:
-    case Tag::u:
-      own.underline = true;
-      break;
-    case Tag::del:
-    case Tag::s:
-    case Tag::strike:
-      own.strikethrough = true;
-      break;
-    // The size stays: whoever draws the text chooses how small it is off the base line.
-    case Tag::sup:
-      own.superscript = 1;
-      break;
-    case Tag::sub:
-      own.superscript = -1;
-      break;
-    case Tag::big:
-      own.size.scale = sizeStep;
-      break;
-    case Tag::small:
-      own.size.scale = 1 / sizeStep;
-      break;
-    case Tag::code:
-    case Tag::kbd:
-    case Tag::pre:
-    case Tag::samp:
-    case Tag::tt:
-      own.face = fixedPitchFont(fonts);
-      break;
     case Tag::h1:
-      makeHeading(own, 2);
-      break;
+      return 2;
     case Tag::h2:
-      makeHeading(own, 1.5);
-      break;
+      return 1.5;
     case Tag::h3:
-      makeHeading(own, 1.17);
-      break;
-    case Tag::h4:
-      makeHeading(own, 1);
-      break;
+      return 1.17;
     case Tag::h5:
-      makeHeading(own, 0.83);
-      break;
+      return 0.83;
     case Tag::h6:
-      makeHeading(own, 0.67);
-      break;
+      return 0.67;
+    case Tag::big:
+      return sizeStep;
+    case Tag::small:
+      return 1 / sizeStep;
     default:
-      break;
+      return 1;
   }
 }
 
-/// Declares what the element does to lines.
-void declareLines(Tag tag, Declarations& own) {
-  const bool indented = tags::lists.contains(tag) || tag == Tag::blockquote || tag == Tag::dd;
-  const bool centered = tag == Tag::center || tag == Tag::caption || tag == Tag::th;
-  if (indented) own.indent = indentStep;
-  if (centered) own.alignment = TextAlignment::center;
+/// Declares what the element says by being what it is.
+void declareNature(Tag tag, const Fonts& fonts, Declarations& own) {
+  if (bold.contains(tag)) own.bold = true;
+  if (italic.contains(tag)) own.italic = true;
+  if (fixedPitch.contains(tag)) own.face = fixedPitchFont(fonts);
+  own.size.scale = scaleOf(tag);
+  own.underline = underlined.contains(tag);
+  own.strikethrough = struckOut.contains(tag);
+  // Its size stays: whoever draws the text chooses how small it is off the base line.
+  if (tag == Tag::sup) own.superscript = 1;
+  if (tag == Tag::sub) own.superscript = -1;
+  if (indented.contains(tag)) own.indent = indentStep;
+  if (centered.contains(tag)) own.alignment = TextAlignment::center;
   own.preformatted = tag == Tag::pre;
 }
 
@@ -128,8 +92,7 @@ void declareLink(const Attributes& attributes, const Color& color, Declarations&
 
 Declarations declarationsOf(Tag tag, const Attributes& attributes, const StyleSource& source) {
   Declarations own;
-  declareLetters(tag, source.fonts, own);
-  declareLines(tag, own);
+  declareNature(tag, source.fonts, own);
   if (tag == Tag::font) declareFontElement(attributes, source.fonts, own);
   if (tag == Tag::body) declareBody(attributes, own);
   if (tag == Tag::a) declareLink(attributes, source.linkColor, own);

@@ -75,27 +75,42 @@ std::vector<Change> compare(const Facts& before, const Facts& now) {
   return changes;
 }
 
-/// The attributes of a text from its start to its end, with the pieces of text that they hold over
-/// or without.
-std::string runWords(const toolkit::AttributedString& text, bool withText) {
+std::vector<toolkit::TextAttributes> attributesOf(const toolkit::AttributedString& text) {
+  std::vector<toolkit::TextAttributes> attributes;
+  for (const auto& run : text.runs()) attributes.push_back(run.attributes);
+  return attributes;
+}
+
+/// How a text is styled; of one in several styles, every piece.
+std::string stylesWords(const toolkit::AttributedString& text) {
+  if (text.runs().empty()) return "plain";
   if (text.runs().size() == 1) return styleWords(text.runs().front().attributes);
   std::string words;
   for (const auto& [range, attributes] : text.runs()) {
-    if (!words.empty()) words += "; ";
-    if (withText) words += quote(text.string().substr(range.location, range.length)) + " ";
-    words += styleWords(attributes);
+    words.append(words.empty() ? "" : "; ")
+        .append(quote(text.string().substr(range.location, range.length)))
+        .append(" ")
+        .append(styleWords(attributes));
   }
-  return words.empty() ? "plain" : words;
+  return words;
 }
 
-/// How the styling changed. A text that is another now is quoted already; its pieces would only
-/// repeat it.
+/// The same in short, for a text whose pieces the pictures before and after list anyway.
+std::string stylesInShort(const toolkit::AttributedString& text) {
+  return text.runs().size() < 2 ? stylesWords(text)
+                                : std::to_string(text.runs().size()) + " pieces";
+}
+
 void compareStyles(const toolkit::AttributedString& before, const toolkit::AttributedString& now,
                    std::vector<Change>& changes) {
-  const bool sameText = before.string() == now.string();
-  if (sameText && before == now) return;
-  const Change change = {"style", runWords(before, sameText), runWords(now, sameText)};
-  if (change.before != change.now) changes.push_back(change);
+  if (before.string() == now.string()) {
+    if (before != now) changes.push_back({"style", stylesWords(before), stylesWords(now)});
+    return;
+  }
+  if (stylesWords(before) == stylesWords(now) || attributesOf(before) == attributesOf(now)) return;
+  const std::string was = stylesInShort(before);
+  const std::string is = stylesInShort(now);
+  changes.push_back({"style", was, is == was ? "other " + is : is});
 }
 
 bool isSame(const std::weak_ptr<const void>& a, const std::weak_ptr<const void>& b) {

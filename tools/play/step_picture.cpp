@@ -14,7 +14,8 @@ ControlPicture lookAtControl(toolkit::TestDriver& driver, const QZ_Plist_State_P
   ControlPicture picture;
   picture.identity = view.pointer();
   picture.view = driver.look(view);
-  picture.flashing = engine.flashing() && view->asButton() != nullptr &&
+  picture.flashing = engine.flashing() && engine.flashingTimer()->isValid() &&
+                     view->asButton() != nullptr &&
                      engine.flashingTagIds()->objectForKey(key)->boolValue();
   picture.hasList = static_cast<bool>(engine.plistDictionary()->objectForKey(key));
   return picture;
