@@ -65,7 +65,7 @@ class Builder {
   Element pop();
 
   void closeForStart(Tag tag);
-  void closeForTablePart(Tag tag);
+  void closeForTablePart(Tag part);
   bool closeNearest(const TagSet& wanted, const TagSet& barriers = {});
   void closeFrom(Position first);
   void leave(const Element& element);

@@ -125,11 +125,11 @@ std::optional<Reference> readNumeric(std::string_view bytes) {
 /// The Latin-1 entity that `name` begins with, the longest; in an attribute, all of `name`.
 std::optional<Reference> readUnterminated(std::string_view name, ReferencePlace place) {
   constexpr std::size_t shortest = 2;
-  const std::size_t least = place == ReferencePlace::attribute ? name.size() : shortest;
+  const std::size_t least =
+      place == ReferencePlace::attribute ? std::max(name.size(), shortest) : shortest;
   for (std::size_t length = std::min(name.size(), longestName); length >= least; --length) {
     const auto character = entityNamed(name.substr(0, length));
     if (character && *character <= 0xFF) return Reference{*character, length + 1};
-    if (length == 0) break;
   }
   return std::nullopt;
 }

@@ -55,19 +55,16 @@ constexpr std::string_view takeWord(std::string_view& text) {
 
 /// Cuts off, and returns, the decimal number that `text` begins with, as in "-1.5em".
 inline std::optional<double> takeNumber(std::string_view& text) {
-  std::string_view digits = text;
-  if (digits.starts_with('+')) digits.remove_prefix(1);
-  const std::string_view unsignedDigits =
-      digits.starts_with('-') && digits.size() == text.size() ? digits.substr(1) : digits;
-  // Without this from_chars would read "inf" and "nan".
-  if (unsignedDigits.empty() || (!isDigit(unsignedDigits.front()) && unsignedDigits.front() != '.'))
-    return std::nullopt;
+  const bool negative = text.starts_with('-');
+  const std::string_view digits = negative || text.starts_with('+') ? text.substr(1) : text;
+  // Without this from_chars would read a second sign, "inf" and "nan".
+  if (digits.empty() || (!isDigit(digits.front()) && digits.front() != '.')) return std::nullopt;
   double number = 0;
   const auto [end, error] = std::from_chars(digits.data(), digits.data() + digits.size(), number,
                                             std::chars_format::fixed);
   if (error != std::errc()) return std::nullopt;
   text.remove_prefix(static_cast<std::size_t>(end - text.data()));
-  return number;
+  return negative ? -number : number;
 }
 
 /// The integer that an attribute's value begins with; absent where none does or it is beyond 32

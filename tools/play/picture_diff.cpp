@@ -75,7 +75,9 @@ std::vector<Change> compare(const Facts& before, const Facts& now) {
   return changes;
 }
 
+/// The attributes of each piece of a text; an empty one counts as plain.
 std::vector<toolkit::TextAttributes> attributesOf(const toolkit::AttributedString& text) {
+  if (text.runs().empty()) return {toolkit::TextAttributes{}};
   std::vector<toolkit::TextAttributes> attributes;
   for (const auto& run : text.runs()) attributes.push_back(run.attributes);
   return attributes;
@@ -107,7 +109,7 @@ void compareStyles(const toolkit::AttributedString& before, const toolkit::Attri
     if (before != now) changes.push_back({"style", stylesWords(before), stylesWords(now)});
     return;
   }
-  if (stylesWords(before) == stylesWords(now) || attributesOf(before) == attributesOf(now)) return;
+  if (attributesOf(before) == attributesOf(now)) return;
   const std::string was = stylesInShort(before);
   const std::string is = stylesInShort(now);
   changes.push_back({"style", was, is == was ? "other " + is : is});

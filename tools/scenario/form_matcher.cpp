@@ -166,6 +166,9 @@ std::vector<std::string_view> ownWords(const std::vector<std::string>& expected)
 }
 
 [[noreturn]] void refuseKeyword(const Word& word, const Vocabulary& vocabulary) {
+  if (word.kind != Word::Kind::bare) {
+    throw SyntaxError(word.at, "expected a statement, which begins with a bare word");
+  }
   std::vector<std::string_view> keywords;
   for (const auto& form : vocabulary.forms) keywords.push_back(keywordOf(form));
   throw SyntaxError(word.at,

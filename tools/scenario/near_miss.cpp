@@ -41,7 +41,7 @@ std::optional<std::string> nearest(std::string_view word,
   std::size_t least = std::max<std::size_t>(1, word.size() / 3) + 1;
   for (const auto candidate : candidates) {
     const auto found = distance(word, candidate);
-    if (found >= least) continue;
+    if (found >= least || found >= word.size()) continue;  // of one letter nothing would be left
     least = found;
     nearest = std::string(candidate);
   }

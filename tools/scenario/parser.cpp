@@ -29,6 +29,7 @@ class FileParser {
 
   ScenarioFile parse(std::string_view text) {
     const auto lines = readWords(text);
+    if (!lines.empty()) currentAt_ = lines.front().words.front().at;
     Scenario common;
     Scenario* current = &common;
     for (const auto& line : lines) {
@@ -40,9 +41,9 @@ class FileParser {
         current->statements.push_back(statement(line.words, line.end, line.source, 0));
       }
     }
-    requireStatements(*current, lines.empty() ? Position{} : lines.front().words.front().at);
+    requireStatements(*current);
     if (file_.scenarios.empty()) {
-      common.line = lines.front().words.front().at.line;
+      common.line = currentAt_.line;
       file_.scenarios.push_back(std::move(common));
     } else {
       file_.common = std::move(common.statements);
@@ -57,10 +58,11 @@ class FileParser {
     if (file_.scenarios.empty()) {
       commonNames_ = names_;
     } else {
-      requireStatements(file_.scenarios.back(), {file_.scenarios.back().line, 1});
+      requireStatements(file_.scenarios.back());
     }
     names_ = commonNames_;
-    Scenario scenario{"", line.words.front().at.line, common.only, {}};
+    currentAt_ = line.words.front().at;
+    Scenario scenario{"", currentAt_.line, common.only, {}};
     for (const auto& word : match(line).arguments.texts("TEXT")) {
       scenario.title += (scenario.title.empty() ? "" : " ") + word;
     }
@@ -69,8 +71,8 @@ class FileParser {
   }
 
   // A scenario in which nothing stands would pass without having tried anything.
-  static void requireStatements(const Scenario& scenario, Position at) {
-    if (scenario.statements.empty()) throw SyntaxError(at, "a scenario without a statement");
+  void requireStatements(const Scenario& current) const {
+    if (current.statements.empty()) throw SyntaxError(currentAt_, "a scenario without a statement");
   }
 
   Statement statement(std::span<const Word> words, Position end, const std::string& source,
@@ -131,6 +133,7 @@ class FileParser {
   Names names_;
   Names commonNames_;
   ScenarioFile file_;
+  Position currentAt_;  // where the scenario begins that is being read
 };
 
 }  // namespace
