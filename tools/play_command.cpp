@@ -12,7 +12,7 @@
 
 #include "tools/play/play.hpp"
 #include "tools/play/prompt.hpp"
-#include "tools/play/text_layout.hpp"
+#include "tools/text_layout.hpp"
 
 namespace tools {
 namespace {
@@ -37,8 +37,7 @@ void addPresses(play::PlayOptions& options, const std::vector<std::string>& tags
   for (const std::string& text : tags) {
     const auto tag = play::parseTag(text);
     if (!tag) {
-      throw CLI::ValidationError("--press: expected a tag (a whole number), found " +
-                                 play::quote(text));
+      throw CLI::ValidationError("--press: expected a tag (a whole number), found " + quote(text));
     }
     options.steps.emplace_back(play::Press{*tag});
   }
@@ -47,8 +46,7 @@ void addPresses(play::PlayOptions& options, const std::vector<std::string>& tags
 void addAdvance(play::PlayOptions& options, const std::string& text) {
   const auto seconds = play::parseSeconds(text);
   if (!seconds) {
-    throw CLI::ValidationError("--advance: expected seconds from 0 to 86400, found " +
-                               play::quote(text));
+    throw CLI::ValidationError("--advance: expected seconds from 0 to 86400, found " + quote(text));
   }
   options.steps.emplace_back(play::Advance{*seconds});
 }

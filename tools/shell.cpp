@@ -9,6 +9,7 @@
 
 #include "tools/scenario/near_miss.hpp"
 #include "tools/scenario/vocabulary.hpp"
+#include "tools/text_layout.hpp"
 
 namespace tools {
 namespace {
@@ -24,7 +25,7 @@ constexpr const char* exitStatuses =
 
 int report(ExitStatus status, const std::string& message) {
   std::cout.flush();
-  std::cerr << toolName << ": " << message << std::endl;
+  std::cerr << toolName << ": " << oneLine(message) << std::endl;
   return static_cast<int>(status);
 }
 
@@ -57,14 +58,27 @@ std::string unexpectedArgument(const CLI::App& command) {
   return "unknown option " + name + scenario::didYouMean(name, {options.begin(), options.end()});
 }
 
+/// CLI11 says "--press: 1 required TAG missing" of an option whose value is missing.
+std::string missingValue(std::string words) {
+  constexpr std::string_view required = ": 1 required ";
+  constexpr std::string_view missing = " missing";
+  const std::size_t at = words.find(required);
+  if (at == std::string::npos || !words.ends_with(missing)) return words;
+  words.erase(words.size() - missing.size());
+  return words.replace(at, required.size(), ": expected ");
+}
+
 /// What is wrong with the command line, in one line.
 std::string explain(const CLI::ParseError& error, const CLI::App& app) {
   const CLI::App& command = chosen(app);
   std::string words = error.what();
   if (&command == &app) {
     words = commandExpected(app);
-  } else if (dynamic_cast<const CLI::ExtrasError*>(&error)) {
+  } else if (command.remaining_size(true) > 0) {
+    // Whatever else is wrong, what is not understood comes first: it may be the reason.
     words = unexpectedArgument(command);
+  } else if (dynamic_cast<const CLI::ArgumentMismatch*>(&error)) {
+    words = missingValue(words);
   }
   const std::string help = &command == &app ? "" : command.get_name() + " ";
   return words + "; see " + toolName + " " + help + "--help";

@@ -4,6 +4,7 @@
 #include <CLI/CLI.hpp>
 
 #include <algorithm>
+#include <filesystem>
 #include <fstream>
 #include <iostream>
 #include <memory>
@@ -42,7 +43,8 @@ void print(std::ostream& out, const Report& report) {
   if (report.verdict != Verdict::failed) return;
   out << report.file << ':' << report.failedLine << ": " << report.problem << "\n    "
       << report.statement << '\n';
-  if (report.line != report.failedLine) {
+  // A title that is the file's name adds nothing.
+  if (report.title != std::filesystem::path(report.file).filename().string()) {
     out << "    in " << report.file << ':' << report.line << ": " << report.title << '\n';
   }
 }
@@ -65,6 +67,15 @@ void forEachChosen(const std::vector<LoadedFile>& files, const std::string& filt
       if (scenario::titleOf(file, one).find(filter) != std::string::npos) use(file, one);
     }
   }
+}
+
+/// A run of nothing would look like one in which all went well.
+void requireAny(const std::vector<LoadedFile>& files, const std::string& filter) {
+  bool any = false;
+  forEachChosen(files, filter, [&](const LoadedFile&, const Scenario&) { any = true; });
+  if (any) return;
+  throw Failure(ExitStatus::badInput,
+                "no scenario has " + scenario::inQuotes(filter) + " in its title");
 }
 
 void list(const std::vector<LoadedFile>& files, const std::string& filter, std::ostream& out) {
@@ -98,6 +109,7 @@ int runTests(const TestOptions& options, std::ostream& out, std::ostream& proble
   const auto read = scenario::readScenarios(options.paths);
   for (const auto& problem : read.problems) problems << problem << '\n';
   if (!read.problems.empty()) return static_cast<int>(ExitStatus::badInput);
+  requireAny(read.files, options.filter);
   if (options.list) {
     list(read.files, options.filter, out);
     return static_cast<int>(ExitStatus::fine);

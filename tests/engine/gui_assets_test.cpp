@@ -3,6 +3,7 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
 #include <memory>
 #include <optional>
 #include <string>
@@ -39,6 +40,7 @@ class ObservedApplication final : public toolkit::Application {
     return application_.makeWindow(content, style, backing, defer);
   }
   Ref<toolkit::Button> makeButton(const toolkit::Rect& frame) override {
+    if (onButton) onButton();
     return application_.makeButton(frame);
   }
   Ref<toolkit::ImageView> makeImageView(const toolkit::Rect& frame) override {
@@ -58,6 +60,7 @@ class ObservedApplication final : public toolkit::Application {
 
   std::vector<WindowOrder> orders;
   bool refuses = false;
+  std::function<void()> onButton;  // called before a button is made
 
  private:
   toolkit::Application& application_;
@@ -67,17 +70,14 @@ class ObservedApplication final : public toolkit::Application {
 class ObservedToolkit final : public toolkit::Toolkit {
  public:
   toolkit::Application& application() override { return observed; }
-  toolkit::RunLoop& runLoop() override { return driver_.toolkit().runLoop(); }
-  toolkit::Images& images() override { return driver_.toolkit().images(); }
-  toolkit::Fonts& fonts() override { return driver_.toolkit().fonts(); }
-  toolkit::Files& files() override { return driver_.toolkit().files(); }
-  toolkit::Log& log() override { return driver_.toolkit().log(); }
+  toolkit::RunLoop& runLoop() override { return driver.toolkit().runLoop(); }
+  toolkit::Images& images() override { return driver.toolkit().images(); }
+  toolkit::Fonts& fonts() override { return driver.toolkit().fonts(); }
+  toolkit::Files& files() override { return driver.toolkit().files(); }
+  toolkit::Log& log() override { return driver.toolkit().log(); }
 
- private:
-  MemoryDriver driver_;
-
- public:
-  ObservedApplication observed{driver_.toolkit().application()};
+  MemoryDriver driver;
+  ObservedApplication observed{driver.toolkit().application()};
 };
 
 ValueRef<> entry(std::string_view className, const std::vector<double>& frame) {
@@ -145,6 +145,42 @@ TEST_F(GuiAssets, WithoutAWindowNoControlIsMade) {
   EXPECT_EQ(toolkit.observed.orders.size(), 2U);
   EXPECT_FALSE(engine->tutorialWindow());
   EXPECT_EQ(engine->addedObjectToTutorial()->count(), 0U);
+}
+
+// Without a window there is nothing to discover, which is what would empty the records.
+TEST_F(GuiAssets, WithoutAWindowTheRecordsOfADiscoveryStay) {
+  const auto window = toolkit.driver.makeWindow({0, 0, 300, 200});
+  toolkit.driver.makeView(toolkit::ViewKind::button, 7, {0, 0, 9, 9}, window->contentView());
+  EXPECT_TRUE(engine->getGuiAssetsFromWindow(window));
+  toolkit.observed.refuses = true;
+  EXPECT_FALSE(load({{"1", entry("NSButton", {0, 0, 9, 9})}}));
+  EXPECT_EQ(engine->guiAssets()->count(), 1U);
+  EXPECT_EQ(engine->originalTagValues()->count(), 1U);
+}
+
+// Another window takes the front while the controls are made.
+TEST_F(GuiAssets, DescribedWindowShowsBeforeItsControlsAndAgainAfterThem) {
+  const auto other = toolkit.driver.makeWindow({0, 0, 300, 200});
+  bool shown = false;
+  toolkit.observed.onButton = [&] {
+    const auto picture = toolkit.driver.look(engine->tutorialWindow());
+    shown = picture.visible && picture.key;
+    other->makeKeyAndOrderFront();
+  };
+  EXPECT_TRUE(load(
+      {{"1", entry("NSButton", {0, 0, 9, 9})}, {"window", entry("NSWindow", {1, 2, 300, 400})}}));
+  EXPECT_TRUE(shown);
+  EXPECT_TRUE(toolkit.driver.look(engine->tutorialWindow()).key);
+}
+
+TEST_F(GuiAssets, DefaultWindowShowsOnlyAfterItsControls) {
+  bool shown = true;
+  toolkit.observed.onButton = [&] {
+    shown = toolkit.driver.look(engine->tutorialWindow()).visible;
+  };
+  EXPECT_TRUE(load({{"1", entry("NSButton", {0, 0, 9, 9})}}));
+  EXPECT_FALSE(shown);
+  EXPECT_TRUE(toolkit.driver.look(engine->tutorialWindow()).visible);
 }
 
 TEST_F(GuiAssets, ControlsAreSetUpForTheirKind) {

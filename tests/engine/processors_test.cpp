@@ -81,13 +81,14 @@ TEST_F(Processors, TagsBeyond32BitsAreFoundAndGiven) {
   EXPECT_TRUE(engine->flashingTagIds()->objectForKey("5000000000")->boolValue());
 }
 
-// A tag is compared with its low 32 bits where a tick or a timer looks for it.
-TEST_F(Processors, TicksAndTimersLookForTheLow32Bits) {
+// Both look for 32 bits: a tick by the key's text, which is clamped, a timer by the id's number,
+// which keeps its low bits.
+TEST_F(Processors, TicksAndTimersLookFor32Bits) {
   constexpr long large = 4'294'967'303;  // 7 in its low 32 bits
   EXPECT_TRUE(engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(large), true));
   engine->QZ_Plist_State_Processor_ALLOW_FLASHING(true);
   driver.advance(0.75);
-  EXPECT_FALSE(driver.look(button).highlighted);  // the key reads as the largest 32-bit number
+  EXPECT_FALSE(driver.look(button).highlighted);  // the key reads as 2147483647
   EXPECT_FALSE(engine->QZ_Plist_State_Processor_SET_TIMER(3, Number::withLong(large)));
   EXPECT_TRUE(engine->objectIdTimers()->contains("4294967303"));
 }

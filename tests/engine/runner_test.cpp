@@ -101,6 +101,19 @@ TEST_F(Runner, RunsAHundredThousandCompoundElements) {
   EXPECT_EQ(view->calls.size(), 200'000U);  // each is hidden, and asked about a redraw
 }
 
+TEST_F(Runner, ListsMayCallOneAnotherAThousandDeep) {
+  const auto script = toolkit::Dictionary::make();
+  for (long key = 1; key <= 1000; ++key) {
+    const ValueRef<> call =
+        Array::make({text("PROCESS_COMMANDS_FOR_ID"), Number::withLong(key + 1)});
+    script->setObject(Array::make({call}), std::to_string(key));
+  }
+  script->setObject(Array::make({text("IDLE_LOOP")}), "1001");
+  engine->setPlistDictionary(script);
+  EXPECT_TRUE(engine->QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(Number::withLong(1)));
+  EXPECT_EQ(engine->currentCommandState(), "1001");
+}
+
 TEST_F(Runner, TakesTheElementsThatThereWereAtTheStart) {
   const auto list = Array::make({text("HIDE_OBJECT_WITH_ID"), text("IDLE_LOOP")});
   view->onCall = [&](const std::string&) { list->addObject(text("NO_SUCH_COMMAND")); };

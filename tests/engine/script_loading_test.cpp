@@ -6,6 +6,7 @@
 #include <fstream>
 #include <memory>
 #include <optional>
+#include <random>
 #include <string>
 
 #include "QZ_Plist_State_Parser.hpp"
@@ -19,9 +20,8 @@ namespace fs = std::filesystem;
 class ScriptLoading : public testing::Test {
  protected:
   ScriptLoading() {
-    const auto* const test = testing::UnitTest::GetInstance()->current_test_info();
-    resources = fs::temp_directory_path() / ("qz-script-loading-" + std::string(test->name()));
-    fs::remove_all(resources);
+    const auto number = std::to_string(std::random_device()());
+    resources = fs::temp_directory_path() / ("qz-script-loading-" + number);
     fs::create_directories(resources);
     driver.setResourcePath(resources.string());
   }

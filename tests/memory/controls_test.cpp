@@ -181,7 +181,7 @@ TEST_F(ControlsTest, AClickThatDoesNotArriveDoesNothing) {
     EXPECT_EQ(button->state(), state) << obstacle.what;
     obstacle.put(false);
     driver.click(button);
-    EXPECT_EQ(target->senders.size(), 1u) << "no longer " << obstacle.what;
+    EXPECT_EQ(target->senders.size(), 1U) << "no longer " << obstacle.what;
     state = button->state();
   }
 }

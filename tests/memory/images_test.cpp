@@ -59,7 +59,7 @@ TEST_F(ImagesTest, OnlyImageFilesAreFoundByNamesThatFit) {
 TEST_F(ImagesTest, ANameIsNoPath) {
   using namespace std::string_view_literals;
   directory.write("sub/inside.png", "");
-  directory.write("sub/..\\inside.png", "");
+  directory.write(R"(sub/..\inside.png)", "");
   directory.write("inside.png", "");
   directory.write(".png", "");
   directory.write("...png", "");

@@ -46,7 +46,7 @@ TEST_F(ResponderChain, WithATargetThatIsGoneItDoesToo) {
   target = nullptr;
   EXPECT_EQ(driver.look(button).target, nullptr);
   driver.click(button);
-  EXPECT_EQ(delegate->senders.size(), 1u);
+  EXPECT_EQ(delegate->senders.size(), 1U);
 }
 
 TEST_F(ResponderChain, ATargetThatDoesNotUnderstandEndsIt) {
@@ -92,7 +92,7 @@ TEST_F(ResponderChain, SendActionAsksNeitherForEnabledNorForHidden) {
   button->setEnabled(false);
   button->setHidden(true);
   EXPECT_TRUE(button->sendAction("pressed:", nullptr));
-  EXPECT_EQ(delegate->senders.size(), 1u);
+  EXPECT_EQ(delegate->senders.size(), 1U);
 }
 
 TEST_F(ResponderChain, AControlWithoutAnActionSendsNone) {
@@ -173,7 +173,7 @@ TEST_F(ResponderChain, AnActionMayPressAgain) {
     if (delegate->senders.size() < 3) driver.click(button);
   };
   driver.click(button);
-  EXPECT_EQ(delegate->senders.size(), 3u);
+  EXPECT_EQ(delegate->senders.size(), 3U);
   EXPECT_EQ(button->state(), State::on);
 }
 

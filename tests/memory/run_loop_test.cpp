@@ -86,7 +86,7 @@ TEST_F(RunLoopTest, TheClockShowsTheTimeOfTheFiring) {
   note("r", 0.5, true);
   loop.advance(1.5);
   const double expected[] = {0.5, 1, 1.25, 1.5};
-  ASSERT_EQ(fired.size(), 4u);
+  ASSERT_EQ(fired.size(), 4U);
   for (std::size_t i = 0; i < 4; ++i) EXPECT_EQ(fired[i].at, expected[i]) << i;
   loop.advance(0.25);
   EXPECT_EQ(loop.now(), 1.75);
@@ -95,7 +95,7 @@ TEST_F(RunLoopTest, TheClockShowsTheTimeOfTheFiring) {
 TEST_F(RunLoopTest, ARepeatingTimerDoesNotDrift) {
   note("r", 0.1, true);
   loop.advance(10'000);
-  ASSERT_EQ(fired.size(), 100'000u);
+  ASSERT_EQ(fired.size(), 100'000U);
   EXPECT_EQ(fired.back().at, 10'000);
   for (std::size_t i = 0; i < fired.size(); ++i)
     ASSERT_EQ(fired[i].at, static_cast<double>(i + 1) * 0.1);

@@ -69,7 +69,7 @@ TEST_F(SheetsTest, ItsParentBringsItAlongToTheFront) {
   window->makeKeyAndOrderFront();
   std::vector<Ref<Window>> shown;
   for (MemoryWindow* const each : toolkit.application().screen()->windows())
-    shown.push_back(each->shared_from_this());
+    shown.emplace_back(each->shared_from_this());
   EXPECT_TRUE((shown == std::vector<Ref<Window>>{other, window, sheet, onSheet}));
   EXPECT_TRUE(driver.look(onSheet).key);
   EXPECT_FALSE(takesClicks(sheet));

@@ -40,12 +40,12 @@ std::optional<std::string> reasonOf(const Message& message, View& view) {
 
 class UnrecognizedSelector : public MemoryTest {
  protected:
-  void expectRaises(const Message& message, View& view) {
+  static void expectRaises(const Message& message, View& view) {
     EXPECT_EQ(reasonOf(message, view), "-[" + view.className() + " " +
                                            std::string(message.selector) +
                                            "]: unrecognized selector sent to instance");
   }
-  void expectUnderstands(const Message& message, View& view) {
+  static void expectUnderstands(const Message& message, View& view) {
     EXPECT_EQ(reasonOf(message, view), std::nullopt) << view.className();
   }
 };

@@ -18,7 +18,7 @@ class WindowsTest : public MemoryTest {
   void expectShown(const std::vector<Ref<Window>>& expected) {
     std::vector<Ref<Window>> shown;
     for (MemoryWindow* const each : toolkit.application().screen()->windows())
-      shown.push_back(each->shared_from_this());
+      shown.emplace_back(each->shared_from_this());
     EXPECT_TRUE(shown == expected);
     for (const Ref<Window>& each : expected)
       EXPECT_EQ(driver.look(each).key, each == expected.back());
@@ -31,7 +31,7 @@ TEST_F(WindowsTest, ANewWindowIsOffTheScreenAndEmpty) {
   EXPECT_FALSE(picture.visible || picture.key || picture.layered);
   EXPECT_EQ(picture.closes, 0);
   EXPECT_EQ(picture.content, (Rect{200, 300, 800, 600}));
-  EXPECT_EQ(picture.style, 3u);
+  EXPECT_EQ(picture.style, 3U);
   EXPECT_EQ(picture.background, windowBackground);
   EXPECT_EQ(picture.delegate, nullptr);
   EXPECT_FALSE(picture.sheetOf);
@@ -104,7 +104,7 @@ TEST_F(WindowsTest, TheApplicationKeepsItsWindowsWhileTheyAreOnTheScreen) {
       made->makeKeyAndOrderFront();
     }
     ASSERT_FALSE(watched.expired());
-    goOff(*watched.lock().get());
+    goOff(*watched.lock());
     EXPECT_TRUE(watched.expired());
   }
 }

@@ -95,7 +95,6 @@ TEST(Dictionaries, OfAKeyThatComesTwiceTheLastValueCounts) {
 }
 
 TEST(Dictionaries, KeepKeysOfOtherKindsApart) {
-  const auto dictionary = Dictionary::make();
   const auto mixed = Dictionary::make({{Number::withLong(1), Null::make()},
                                        {String::make("1"), Number::withLong(7)},
                                        {Number::withBool(true), Null::make()}});
@@ -136,7 +135,7 @@ TEST(Keys, AreTheSameByWhatTheyCountTo) {
   for (const auto& [a, b, same] : cases) {
     EXPECT_EQ(sameKey(*a, *b), same) << a->description() << " and " << b->description();
     EXPECT_EQ(sameKey(*b, *a), same) << a->description() << " and " << b->description();
-    if (same) EXPECT_EQ(hashOfKey(*a), hashOfKey(*b)) << a->description();
+    EXPECT_TRUE(!same || hashOfKey(*a) == hashOfKey(*b)) << a->description();
   }
 }
 

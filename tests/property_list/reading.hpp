@@ -6,6 +6,7 @@
 
 #include "toolkit/property_list/canonical_dump.hpp"
 #include "toolkit/property_list/reader.hpp"
+#include "toolkit/property_list/scalars.hpp"
 
 namespace toolkit {
 

@@ -192,8 +192,10 @@ TEST(AttributedString, KeepsItsInvariantsUnderRandomEdits) {
 
 TEST(Link, SharesItsAddressAmongCopiesAndComparesByIt) {
   const toolkit::Link link = "http://example.com/";
-  const toolkit::Link copy = link;
-  EXPECT_EQ(&link.address(), &copy.address());
+  toolkit::Link other("http://example.org/");
+  EXPECT_NE(link, other);
+  other = link;
+  EXPECT_EQ(&link.address(), &other.address());
   EXPECT_EQ(link, toolkit::Link(std::string("http://example.com/")));
   EXPECT_NE(link, toolkit::Link("http://example.com"));
   const std::string& address = link;

@@ -275,10 +275,10 @@ TEST(HtmlLimits, ReadLongAttributes) {
                                 repeated("9", size),   repeated("font-size:9", size),
                                 repeated("&#x", size), repeated("rgb(", size)};
   for (const std::string& value : values) {
-    for (const std::string name : {"style", "color", "face", "size", "href", "x"}) {
-      expectSound("<font " + name + "=\"" + value + "\"><a href=\"" + value + "\">x");
+    for (const std::string_view name : {"style", "color", "face", "size", "href", "x"}) {
+      expectSound(joined({"<font ", name, "=\"", value, "\"><a href=\"", value, "\">x"}));
     }
-    expectSound("<ol start=\"" + value + "\" type=\"" + value + "\"><li value=\"" + value + "\">x");
+    expectSound(joined({"<ol start='", value, "' type='", value, "'><li value='", value, "'>x"}));
   }
 }
 

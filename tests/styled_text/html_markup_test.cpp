@@ -126,24 +126,27 @@ TEST(HtmlMarkup, TakesForTextWhatIsNoTag) {
 }
 
 TEST(HtmlMarkup, ReadsTheDocumentsOfScripts) {
-  const std::string head =
-      "<!DOCTYPE HTML PUBLIC \"-//W3C//DTD HTML 4.01 Transitional//EN\" "
-      "\"http://www.w3.org/TR/html4/loose.dtd\"><html><head><meta http-equiv=\"Content-type\" "
-      "content=\"text/html; charset=iso-8859-1\"></head>";
-  const std::string tail = "</body></html>";
-  const std::string fragment = "<p>See <a href=\"http://x.org/\">this</a>.</p>";
-  EXPECT_EQ(runsText(read(head + "<body bgcolor=\"#000000\">" + fragment + tail)),
+  constexpr std::string_view head =
+      R"(<!DOCTYPE HTML PUBLIC "-//W3C//DTD HTML 4.01 Transitional//EN" )"
+      R"("http://www.w3.org/TR/html4/loose.dtd"><html><head><meta http-equiv="Content-type" )"
+      R"(content="text/html; charset=iso-8859-1"></head>)";
+  constexpr std::string_view plain = R"(<body bgcolor="#000000">)";
+  constexpr std::string_view oneBlank =
+      R"(<body bgcolor="#000000" link="#00e5ff" vlink="#00e5ff">)";
+  constexpr std::string_view twoBlanks =
+      R"(<body bgcolor="#000000" link="#00e5ff"  vlink="#00e5ff">)";
+  constexpr std::string_view tail = "</body></html>";
+  constexpr std::string_view fragment = R"(<p>See <a href="http://x.org/">this</a>.</p>)";
+  EXPECT_EQ(runsText(read(joined({head, plain, fragment, tail}))),
             "See |this{#0000ee link=http://x.org/ underline}|.\n");
-  for (const std::string blanks : {" ", "  "}) {
-    const std::string body =
-        "<body bgcolor=\"#000000\" link=\"#00e5ff\"" + blanks + "vlink=\"#00e5ff\">";
-    EXPECT_EQ(runsText(read(head + body + fragment + tail)),
+  for (const std::string_view body : {oneBlank, twoBlanks}) {
+    EXPECT_EQ(runsText(read(joined({head, body, fragment, tail}))),
               "See |this{#00e5ff link=http://x.org/ underline}|.\n");
-    EXPECT_EQ(runsText(read(head + body + tail)), "");
-    EXPECT_EQ(runsText(read(head + body + "b" + tail)), "b");
+    EXPECT_EQ(runsText(read(joined({head, body, tail}))), "");
+    EXPECT_EQ(runsText(read(joined({head, body, "b", tail}))), "b");
     // A script may bring a document of its own.
-    EXPECT_EQ(runsText(read(head + body + head + "<body text=white>b" + tail + "\n" + tail)),
-              "b {#ffffff}");
+    const std::string document = joined({head, "<body text=white>b", tail});
+    EXPECT_EQ(runsText(read(joined({head, body, document, "\n", tail}))), "b {#ffffff}");
   }
 }
 

@@ -64,12 +64,12 @@ TEST(HtmlText, OpensAndClosesEveryBlockWithANewLine) {
   constexpr std::array blocks = {
       "p",     "div", "h1",     "h2", "h3", "h4",         "h5", "h6",   "ul",  "ol",   "pre",
       "table", "tr",  "center", "dl", "dt", "blockquote", "dd", "form", "dir", "menu", "fieldset"};
-  for (const std::string name : blocks) {
-    const std::string element = "<" + name + ">x</" + name + ">";
+  for (const std::string_view name : blocks) {
+    const std::string element = joined({"<", name, ">x</", name, ">"});
     EXPECT_EQ(read(element).string(), "x\n") << element;
-    EXPECT_EQ(read("a" + element + "b").string(), "a\nx\nb") << element;
-    EXPECT_EQ(read("a<br>" + element + element).string(), "a\nx\nx\n") << element;
-    EXPECT_EQ(read("<div>" + element + "</div>").string(), "x\n") << element;
+    EXPECT_EQ(read(joined({"a", element, "b"})).string(), "a\nx\nb") << element;
+    EXPECT_EQ(read(joined({"a<br>", element, element})).string(), "a\nx\nx\n") << element;
+    EXPECT_EQ(read(joined({"<div>", element, "</div>"})).string(), "x\n") << element;
   }
   EXPECT_EQ(read("a<li>x</li>b").string(), "a\n\t\u2022\tx\nb");
 }
@@ -131,7 +131,7 @@ TEST(HtmlText, QuotesInTurns) {
 
 TEST(HtmlText, PutsACharacterForImagesAndALineForRules) {
   expectTexts(std::to_array<TextCase>({
-      {"a <img src=\"x.png\" alt=\"picture\"> b", "a \uFFFC b"},
+      {"a <img src='x.png' alt='picture'> b", "a \uFFFC b"},
       {"<img><img>", "\uFFFC\uFFFC"},
       {"a<hr>b", "a\n\nb"},
       {"<p>a</p><hr><p>b</p>", "a\n\nb\n"},

@@ -69,59 +69,69 @@ TEST(PlayHostWindow, whatIsAbsentHasADefault) {
   EXPECT_FALSE(host.controls[0].hidden);
 }
 
-TEST(PlayHostWindow, saysWhichEntryIsWrongAndWhatWasExpected) {
-  const std::string frame = "frame = (0, 0, 1, 1);";
+TEST(PlayHostWindow, saysWhatIsWrongWithTheList) {
   const struct {
     std::string text;
     std::string message;
   } cases[] = {
-      {"{}", ": expected an array of controls, found a dictionary"},
-      {"(text)", ": entry 1: expected a dictionary, found the string “text”"},
-      {"({" + frame + "})", ": entry 1: class: expected a string, found nothing"},
-      {"({class = NSButon; " + frame + "})",
-       ": entry 1: class: expected one of NSWindow, NSButton, NSButton:toggle, NSButton:mixed, "
-       "NSPopUpButton, NSTextField, NSImageView, NSBox, NSView, found the string “NSButon”"},
-      {"({class = NSView; " + frame + "}, {class = NSWindow; " + frame + "})",
-       ": entry 2: class: expected a control (the window is the first entry), found the string "
+      {"{}", "1:1: expected an array of controls, found an empty dictionary"},
+      {"(text)", "1:2: entry 1: expected a dictionary, found the string “text”"},
+      {"({frame = (0, 0, 1, 1);})", "1:2: entry 1: class: expected a string, found nothing"},
+      {"({class = NSView; frame = (0, 0, 1, 1);},\n {class = NSWindow;})",
+       "2:11: entry 2: class: expected a control (the window is the first entry), found the string "
        "“NSWindow”"},
-      {"({class = NSBox; " + frame + " title = x;})",
-       ": entry 1: unknown key “title”; expected class, tag, frame, hidden, toolTip"},
-      {"({class = NSButton; " + frame + " tittle = x;})",
-       ": entry 1: unknown key “tittle”; expected class, tag, frame, hidden, toolTip, title, "
-       "state, enabled; did you mean \"title\"?"},
-      {"({class = NSButton; " + frame + " tag = 1.5;})",
-       ": entry 1: tag: expected a whole number, found the string “1.5”"},
-      {"({class = NSButton; " + frame + " hidden = perhaps;})",
-       ": entry 1: hidden: expected YES or NO, found the string “perhaps”"},
-      {"({class = NSButton; " + frame + " state = mixed;})",
-       ": entry 1: state: expected “on” or “off”, found the string “mixed”"},
-      {"({class = \"NSButton:mixed\"; " + frame + " state = half;})",
-       ": entry 1: state: expected “on”, “off” or “mixed”, found the string “half”"},
-      {"({class = NSButton; " + frame + " title = (x);})",
-       ": entry 1: title: expected a string, found an array of 1"},
-      {"({class = NSWindow; " + frame + " tag = 1;})",
-       ": entry 1: unknown key “tag”; expected class, frame, title"},
+      {"({class = NSButon; frame = (0, 0, 1, 1);})",
+       "1:11: entry 1: class: expected one of NSWindow, NSButton, NSButton:toggle, NSButton:mixed, "
+       "NSPopUpButton, NSTextField, NSImageView, NSBox, NSView, found the string “NSButon”"},
+      {"({class = NSWindow; frame = (0, 0, 1, 1); tag = 1;})",
+       "1:43: entry 1: unknown key “tag”; expected class, frame, title"},
   };
-  for (const auto& c : cases) EXPECT_EQ(refusal(c.text), "host.plist" + c.message) << c.text;
+  for (const auto& c : cases) EXPECT_EQ(refusal(c.text), "host.plist:" + c.message) << c.text;
+}
+
+TEST(PlayHostWindow, saysWhatIsWrongWithAField) {
+  const struct {
+    std::string kind;
+    std::string field;
+    std::string message;
+  } cases[] = {
+      {"NSBox", "title = x;", "unknown key “title”; expected class, tag, frame, hidden, toolTip"},
+      {"NSButton", "tittle = x;",
+       "unknown key “tittle”; expected class, tag, frame, hidden, toolTip, title, state, enabled; "
+       "did you mean \"title\"?"},
+      {"NSButton", "tag = 1.5;", "tag: expected a whole number, found the string “1.5”"},
+      {"NSButton", "hidden = perhaps;", "hidden: expected YES or NO, found the string “perhaps”"},
+      {"NSButton", "state = mixed;", "state: expected “on” or “off”, found the string “mixed”"},
+      {"\"NSButton:mixed\"", "state = half;",
+       "state: expected “on”, “off” or “mixed”, found the string “half”"},
+      {"NSButton", "title = (x);", "title: expected a string, found an array of 1"},
+  };
+  for (const auto& c : cases) {
+    const std::string text = "({ class = " + c.kind + "; frame = (0, 0, 1, 1);\n" + c.field + "})";
+    const std::string message = refusal(text);
+    EXPECT_TRUE(message.starts_with("host.plist:2:")) << message;
+    EXPECT_TRUE(message.ends_with(": entry 1: " + c.message)) << message;
+  }
 }
 
 TEST(PlayHostWindow, saysWhatIsWrongWithAFrame) {
   const std::string four = ": expected four numbers (x, y, width, height), found ";
+  const std::string length = ": expected a number of 0 or more, found ";
   const struct {
     std::string frame;
+    std::string place;
     std::string message;
   } cases[] = {
-      {"", four + "nothing"},
-      {"frame = wide;", four + "the string “wide”"},
-      {"frame = (0, 0, 1);", four + "an array of 3"},
-      {"frame = (0, 0, 1, x);", "[3]: expected a number, found the string “x”"},
-      {"frame = (0, nan, 1, 1);", "[1]: expected a number, found the string “nan”"},
-      {"frame = (0, 0, \"-1\", 1);",
-       ": expected a width and a height of 0 or more, found an array of 4"},
+      {"", "1:2", four + "nothing"},
+      {"frame = wide;", "1:27", four + "the string “wide”"},
+      {"frame = (0, 0, 1);", "1:27", four + "an array of 3"},
+      {"frame = (0, nan, 1, 1);", "1:31", "[1]: expected a number, found the string “nan”"},
+      {"frame = (0, 0, 1, x);", "1:37", "[3]" + length + "the string “x”"},
+      {"frame = (0, 0, \"-1\", 1);", "1:34", "[2]" + length + "the string “-1”"},
   };
   for (const auto& c : cases) {
     EXPECT_EQ(refusal("({class = NSView; " + c.frame + "})"),
-              "host.plist: entry 1: frame" + c.message)
+              "host.plist:" + c.place + ": entry 1: frame" + c.message)
         << c.frame;
   }
 }

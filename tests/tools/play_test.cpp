@@ -180,15 +180,16 @@ TEST(Play, saysWhatIsWrongWithTheStart) {
   EXPECT_EQ(refusal(options, ExitStatus::failed),
             "script.plist: no list under the start key “9”; expected one of 1, 2, 3, 4");
   options.startKey = "4";
-  EXPECT_EQ(refusal(options),
-            "script.plist: start key “4”: expected a list of commands, found the string “text”");
+  EXPECT_EQ(
+      refusal(options),
+      "script.plist:1:146: start key “4”: expected a list of commands, found the string “text”");
   options.startKey = "";
   directory.write("script.plist", "{ 10 = (); 007 = (); abc = (); }");
   EXPECT_EQ(refusal(options, ExitStatus::failed),
             "script.plist: no list under the start key “0”; expected one of abc, 007, 10");
   directory.write("script.plist", "{}");
-  EXPECT_EQ(refusal(options, ExitStatus::failed),
-            "script.plist: expected at least one list, found an empty script");
+  EXPECT_EQ(refusal(options),
+            "script.plist:1:1: expected at least one list, found an empty script");
 }
 
 TEST(Play, saysWhatIsWrongWithADescription) {
@@ -199,15 +200,17 @@ TEST(Play, saysWhatIsWrongWithADescription) {
     std::string text;
     std::string message;
   } cases[] = {
-      {"()", ": expected a description of a window (a dictionary), found an array of 0"},
-      {"{}", ": expected a description of at least one control, found an empty dictionary"},
+      {"()", ":1:1: expected a description of a window (a dictionary), found an empty array"},
+      {"{}", ":1:1: expected at least one entry, found an empty dictionary"},
       {"{1 = text;}",
-       ": entry “1”: expected an array of a class name and four numbers, found the string “text”"},
+       ":1:6: entry “1”: expected an array of a class name and four numbers, found the string "
+       "“text”"},
       {"{1 = (NSButton, 0, 0, 0);}",
-       ": entry “1”: expected an array of a class name and four numbers, found an array of 4"},
-      {"{1 = ((), 0, 0, 0, 0);}", ": entry “1”: expected a class name first, found an array of 0"},
+       ":1:6: entry “1”: expected an array of a class name and four numbers, found an array of 4"},
+      {"{1 = ((), 0, 0, 0, 0);}",
+       ":1:7: entry “1”: expected a class name first, found an empty array"},
       {"{1 = (NSButton, 0, 0, {}, 0);}",
-       ": entry “1”: element 3: expected a number, found a dictionary"},
+       ":1:23: entry “1”: element 3: expected a number, found an empty dictionary"},
   };
   for (const auto& c : cases) {
     directory.write("assets.plist", c.text);
@@ -228,11 +231,17 @@ TEST(Play, saysWhatIsWrongWithAFile) {
   options = smallScript(directory);
   options.resources = "images";
   EXPECT_EQ(refusal(options), "images: no such directory; expected one with images");
-  directory.write("script.plist", "(a)");
   options = {};
   options.script = "script.plist";
+  directory.write("script.plist", "{ 1 = (");
   EXPECT_EQ(refusal(options),
-            "script.plist: expected a script (a dictionary), found an array of 1");
+            "script.plist:1:8: expected ',' or ')', found the end of the file (read as old-style "
+            "property list)");
+  directory.write("script.plist", "");
+  EXPECT_EQ(refusal(options), "script.plist: an empty file; expected a script");
+  directory.write("script.plist", "(a)");
+  EXPECT_EQ(refusal(options),
+            "script.plist:1:1: expected a script (a dictionary), found an array of 1");
 }
 
 }  // namespace

@@ -4,9 +4,9 @@
 #include <string>
 #include <vector>
 
-#include "tools/play/text_layout.hpp"
+#include "tools/text_layout.hpp"
 
-namespace tools::play {
+namespace tools {
 namespace {
 
 TEST(PlayTextLayout, widthIsThatOfATerminal) {
@@ -52,6 +52,7 @@ TEST(PlayTextLayout, whatDisturbsATerminalIsWrittenOut) {
 
 TEST(PlayTextLayout, quotedTextIsOneLine) {
   EXPECT_EQ(quote("one\ntwo"), "“one\\ntwo”");
+  EXPECT_EQ(oneLine("one\ntwo\x1b"), "one\\ntwo\\u{1b}");
   EXPECT_EQ(quote(""), "“”");
 }
 
@@ -82,4 +83,4 @@ TEST(PlayTextLayout, paddingCountsColumns) {
 }
 
 }  // namespace
-}  // namespace tools::play
+}  // namespace tools

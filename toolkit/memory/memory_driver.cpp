@@ -37,12 +37,15 @@ const Kind& rowOf(ViewKind kind) {
                        [&](const Kind& row) { return row.kind == kind; });
 }
 
+bool behavesAs(const Kind& row, const MemoryButton* button) {
+  return button ? row.behavior && *row.behavior == button->behavior() : !row.behavior;
+}
+
 // A view of a class that is not in the table, a host's own, is a plain one.
 ViewKind kindOf(View& view) {
   const auto* const button = dynamic_cast<const MemoryButton*>(&view);
-  const auto behavior = button ? std::optional(button->behavior()) : std::nullopt;
   const auto* const row = std::find_if(std::begin(kinds), std::end(kinds), [&](const Kind& known) {
-    return known.className == view.className() && known.behavior == behavior;
+    return known.className == view.className() && behavesAs(known, button);
   });
   return row == std::end(kinds) ? ViewKind::plain : row->kind;
 }
@@ -75,15 +78,15 @@ void describe(const MemoryButton& button, ViewPicture& picture) {
 }  // namespace
 
 Ref<Window> MemoryDriver::makeWindow(const Rect& content) {
-  const auto window = MemoryWindow::make(toolkit_.application().screen(), content,
-                                         StyleMask::titledAndClosable, KeptBy::maker);
+  auto window = MemoryWindow::make(toolkit_.application().screen(), content,
+                                   StyleMask::titledAndClosable, KeptBy::maker);
   window->makeKeyAndOrderFront();
   return window;
 }
 
 Ref<View> MemoryDriver::makeView(ViewKind kind, long tag, const Rect& frame,
                                  const Ref<View>& parent) {
-  const Ref<View> view = makeNode(rowOf(kind), frame, toolkit_.application().screen())->view();
+  Ref<View> view = makeNode(rowOf(kind), frame, toolkit_.application().screen())->view();
   view->setTag(tag);
   parent->addSubview(view);
   return view;

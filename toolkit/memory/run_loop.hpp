@@ -5,7 +5,6 @@
 // nothing here. The clock never goes back.
 #pragma once
 
-#include <compare>
 #include <cstdint>
 #include <map>
 #include <memory>
@@ -40,7 +39,9 @@ class MemoryRunLoop final : public RunLoop {
   struct Due {
     double time;          // on this clock, in seconds
     std::uint64_t order;  // of scheduling; unique
-    friend auto operator<=>(const Due&, const Due&) = default;
+    bool operator<(const Due& other) const {
+      return time < other.time || (time == other.time && order < other.order);
+    }
   };
   using Queue = std::map<Due, std::shared_ptr<ScheduledTimer>>;
 

@@ -12,6 +12,7 @@ bool ControlNode::send(std::string_view action, const std::shared_ptr<Responder>
   // action and target: what is needed until the end is held here.
   const std::string selector(action);
   const Ref<View> sender = view();
+  // NOLINTNEXTLINE(performance-unnecessary-copy-initialization)
   if (const auto receiver = target) return receiver->tryToPerform(selector, sender);
 
   for (auto responder = shared_from_this(); responder; responder = responder->superview())

@@ -16,7 +16,7 @@ MemoryWindow::MemoryWindow(const std::shared_ptr<Screen>& screen, const Rect& co
 std::shared_ptr<MemoryWindow> MemoryWindow::make(const std::shared_ptr<Screen>& screen,
                                                  const Rect& content, StyleMask style,
                                                  KeptBy keptBy) {
-  const std::shared_ptr<MemoryWindow> window(new MemoryWindow(screen, content, style, keptBy));
+  std::shared_ptr<MemoryWindow> window(new MemoryWindow(screen, content, style, keptBy));
   const auto view = std::make_shared<MemoryView<View>>(
       class_names::view, Rect{0, 0, content.width, content.height}, screen);
   view->becomeContentViewOf(window);

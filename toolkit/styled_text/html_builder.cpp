@@ -47,7 +47,7 @@ bool isWhiteSpace(std::string_view text) { return std::all_of(text.begin(), text
 Builder::Builder(const Fonts& fonts) : source_{fonts} {
   Declarations document;
   document.face = commonFont(fonts);
-  push({Tag::html, std::make_unique<const Declarations>(std::move(document))});
+  push(Tag::html, std::move(document));
 }
 
 void Builder::startTag(Tag tag, const Attributes& attributes) {
@@ -68,7 +68,7 @@ void Builder::startTag(Tag tag, const Attributes& attributes) {
       break;
     case Tag::body:
       colorLinks(attributes);
-      push(element(tag, attributes));
+      push(tag, declarationsOf(tag, attributes, source_));
       break;
     default:
       open(tag, attributes);
@@ -135,12 +135,15 @@ void Builder::open(Tag tag, const Attributes& attributes) {
   } else if (!tags::rowGroups.contains(tag)) {
     resumeFormatting();
   }
-  push(element(tag, attributes));
+  push(tag, declarationsOf(tag, attributes, source_));
   enter(tag, attributes);
 }
 
-Builder::Element Builder::element(Tag tag, const Attributes& attributes) const {
-  return {tag, std::make_unique<const Declarations>(declarationsOf(tag, attributes, source_))};
+void Builder::push(Tag tag, Declarations declarations) {
+  Element element;
+  element.tag = tag;
+  element.declarations = std::make_unique<const Declarations>(std::move(declarations));
+  push(std::move(element));
 }
 
 void Builder::push(Element element) {
@@ -231,7 +234,11 @@ void Builder::suspend(Element formatting) {
 }
 
 void Builder::resumeFormatting() {
-  for (; !suspended_.empty(); suspended_.pop_back()) push(std::move(suspended_.back()));
+  while (!suspended_.empty()) {
+    Element formatting = std::move(suspended_.back());
+    suspended_.pop_back();
+    push(std::move(formatting));
+  }
 }
 
 void Builder::restyleFrom(Position first) {

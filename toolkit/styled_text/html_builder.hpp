@@ -46,13 +46,13 @@ class Builder {
   };
 
   struct Element {
-    Tag tag;
+    Tag tag = Tag::unknown;
     /// On the heap, for styles point to what they hold.
     std::unique_ptr<const Declarations> declarations;
-    Style style{};
-    List list{};                              ///< of a list
-    Row row{};                                ///< of a row
-    std::vector<Element> suspendedOutside{};  ///< of a cell: it begins with nothing suspended
+    Style style;
+    List list;                              ///< of a list
+    Row row;                                ///< of a row
+    std::vector<Element> suspendedOutside;  ///< of a cell: it begins with nothing suspended
   };
 
   /// The position of an open element. The document itself, at 0, is never looked for: 0 is "none".
@@ -60,7 +60,7 @@ class Builder {
 
   void colorLinks(const Attributes& body);
   void open(Tag tag, const Attributes& attributes);
-  Element element(Tag tag, const Attributes& attributes) const;
+  void push(Tag tag, Declarations declarations);
   void push(Element element);
   Element pop();
 

@@ -72,10 +72,11 @@ static_assert(std::is_sorted(namedColors.begin(), namedColors.end(),
 
 std::optional<Color> colorNamed(std::string_view name) {
   const std::string key = lowered(name);
-  const auto found = std::lower_bound(
-      namedColors.begin(), namedColors.end(), key,
+  const NamedColor* const end = namedColors.data() + namedColors.size();
+  const NamedColor* const found = std::lower_bound(
+      namedColors.data(), end, key,
       [](const NamedColor& color, std::string_view wanted) { return color.name < wanted; });
-  if (found == namedColors.end() || found->name != key) return std::nullopt;
+  if (found == end || found->name != key) return std::nullopt;
   const auto part = [rgb = found->rgb](unsigned shift) { return ((rgb >> shift) & 0xFFU) / 255.0; };
   return Color{part(16), part(8), part(0)};
 }

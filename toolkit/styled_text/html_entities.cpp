@@ -81,10 +81,11 @@ char32_t fromWindows1252(char32_t code) {
 }
 
 std::optional<char32_t> entityNamed(std::string_view name) {
-  const auto found = std::lower_bound(
-      entities.begin(), entities.end(), name,
+  const Entity* const end = entities.data() + entities.size();
+  const Entity* const found = std::lower_bound(
+      entities.data(), end, name,
       [](const Entity& entity, std::string_view key) { return entity.name < key; });
-  if (found == entities.end() || found->name != name) return std::nullopt;
+  if (found == end || found->name != name) return std::nullopt;
   return found->character;
 }
 

@@ -121,10 +121,10 @@ void Tokenizer::skipContent(Tag element) {
 }
 
 std::string_view Tokenizer::takeWhile(bool (*taken)(char), std::size_t from) {
-  const auto begin = rest_.begin() + static_cast<std::ptrdiff_t>(std::min(from, rest_.size()));
-  const auto end = std::find_if_not(begin, rest_.end(), taken);
-  const std::string_view part = rest_.substr(0, static_cast<std::size_t>(end - rest_.begin()));
-  rest_.remove_prefix(part.size());
+  std::size_t end = std::min(from, rest_.size());
+  while (end < rest_.size() && taken(rest_[end])) ++end;
+  const std::string_view part = rest_.substr(0, end);
+  rest_.remove_prefix(end);
   return part;
 }
 

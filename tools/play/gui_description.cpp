@@ -4,7 +4,7 @@
 #include <string>
 
 #include "toolkit/property_list/scalars.hpp"
-#include "tools/play/text_layout.hpp"
+#include "tools/text_layout.hpp"
 
 namespace tools::play {
 namespace {

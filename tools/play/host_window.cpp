@@ -7,9 +7,9 @@
 #include "toolkit/property_list/scalars.hpp"
 #include "tools/failure.hpp"
 #include "tools/play/plist_entry.hpp"
-#include "tools/play/text_layout.hpp"
 #include "tools/play/words.hpp"
 #include "tools/scenario/near_miss.hpp"
+#include "tools/text_layout.hpp"
 #include "tools/view_kinds.hpp"
 
 namespace tools::play {

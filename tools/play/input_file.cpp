@@ -11,7 +11,7 @@
 #include "toolkit/property_list/reader.hpp"
 #include "toolkit/property_list/scalars.hpp"
 #include "tools/failure.hpp"
-#include "tools/play/text_layout.hpp"
+#include "tools/text_layout.hpp"
 
 namespace tools::play {
 namespace {
@@ -28,11 +28,11 @@ std::string contentsOf(const std::string& path, const std::string& what) {
   errno = 0;
   std::ifstream file(path, std::ios::binary);
   std::ostringstream contents;
-  // An empty file sets the fail bit of what it is copied to; the reader has the better message.
-  if (file && file.peek() != std::ifstream::traits_type::eof()) contents << file.rdbuf();
+  contents << file.rdbuf();
   if (file.bad() || !file.is_open()) {
     refuse(path + ": cannot be read (" + std::strerror(errno) + "); expected " + what);
   }
+  if (contents.str().empty()) refuse(path + ": an empty file; expected " + what);
   return contents.str();
 }
 

@@ -9,8 +9,8 @@
 #include <map>
 #include <utility>
 
-#include "tools/play/text_layout.hpp"
 #include "tools/play/words.hpp"
+#include "tools/text_layout.hpp"
 
 namespace tools::play {
 namespace {

@@ -4,8 +4,8 @@
 #include <algorithm>
 #include <vector>
 
-#include "tools/play/text_layout.hpp"
 #include "tools/play/words.hpp"
+#include "tools/text_layout.hpp"
 
 namespace tools::play {
 namespace {

@@ -15,9 +15,9 @@
 #include "tools/play/prompt.hpp"
 #include "tools/play/session.hpp"
 #include "tools/play/stage.hpp"
-#include "tools/play/text_layout.hpp"
 #include "tools/scenario/near_miss.hpp"
 #include "tools/scenario/vocabulary.hpp"
+#include "tools/text_layout.hpp"
 
 namespace tools::play {
 namespace {
@@ -108,7 +108,7 @@ void playInteractively(Session& session, const Terminal& terminal) {
 void connectLog(toolkit::TestDriver& driver, const Terminal& terminal) {
   driver.setLogSink([&terminal](std::string_view line) {
     terminal.out << std::flush;
-    terminal.log << printable(line) << std::endl;
+    terminal.log << oneLine(line) << std::endl;
   });
 }
 

@@ -7,15 +7,15 @@
 #include <utility>
 
 #include "toolkit/property_list/scalars.hpp"
-#include "tools/play/text_layout.hpp"
-#include "tools/play/whole_number.hpp"
+#include "tools/play/parse_number.hpp"
 #include "tools/scenario/near_miss.hpp"
+#include "tools/text_layout.hpp"
 
 namespace tools::play {
 namespace {
 
 std::optional<long> integerOf(const toolkit::ValueRef<>& value) {
-  if (const auto text = toolkit::asString(value)) return wholeNumber<long>(text->text());
+  if (const auto text = toolkit::asString(value)) return parseNumber<long>(text->text());
   const auto number = toolkit::asNumber(value);
   const bool isInteger = number && number->type() == toolkit::Number::Type::signedInteger;
   return isInteger ? std::optional<long>(number->longValue()) : std::nullopt;
@@ -35,7 +35,7 @@ std::optional<bool> flagOf(const toolkit::ValueRef<>& value) {
 std::optional<double> numberOf(const toolkit::ValueRef<>& value) {
   std::optional<double> number;
   if (const auto text = toolkit::asString(value)) {
-    number = wholeNumber<double>(text->text());
+    number = parseNumber<double>(text->text());
   } else if (const auto stored = toolkit::asNumber(value)) {
     if (stored->type() != toolkit::Number::Type::boolean) number = stored->doubleValue();
   }
@@ -91,16 +91,17 @@ toolkit::Rect PlistEntry::requiredRect(std::string_view key) const {
   if (list->count() != 4) fail(key, expected);
   std::array<double, 4> numbers{};
   for (std::size_t i = 0; i < numbers.size(); ++i) {
-    const auto number = numberOf(list->objectAtIndex(i));
-    if (!number) {
-      const std::string place = std::string(key) + "[" + std::to_string(i) + "]";
-      const auto element = list->objectAtIndex(i);
-      failAt(element, place + ": expected a number, found " + foundWords(element));
+    const auto element = list->objectAtIndex(i);
+    const auto number = numberOf(element);
+    const bool isLength = i >= 2;
+    if (!number || (isLength && *number < 0)) {
+      const std::string_view wanted = isLength ? "a number of 0 or more" : "a number";
+      failAt(element, std::string(key) + "[" + std::to_string(i) + "]: expected " +
+                          std::string(wanted) + ", found " + foundWords(element));
     }
     numbers.at(i) = *number;
   }
   const auto [x, y, width, height] = numbers;
-  if (width < 0 || height < 0) fail(key, "a width and a height of 0 or more");
   return {x, y, width, height};
 }
 

@@ -4,9 +4,9 @@
 #include <algorithm>
 #include <vector>
 
-#include "tools/play/text_layout.hpp"
 #include "tools/play/words.hpp"
 #include "tools/scenario/vocabulary.hpp"
+#include "tools/text_layout.hpp"
 
 namespace tools::play {
 namespace {

@@ -1,8 +1,8 @@
 // What the user of an interactive walk-through asks for.
 #include "tools/play/prompt.hpp"
 
-#include "tools/play/text_layout.hpp"
-#include "tools/play/whole_number.hpp"
+#include "tools/play/parse_number.hpp"
+#include "tools/text_layout.hpp"
 
 namespace tools::play {
 namespace {
@@ -37,10 +37,10 @@ Request parseRequest(std::string_view line) {
   return Unclear{"expected a tag, +seconds, ? or q, found " + found};
 }
 
-std::optional<long> parseTag(std::string_view text) { return wholeNumber<long>(text); }
+std::optional<long> parseTag(std::string_view text) { return parseNumber<long>(text); }
 
 std::optional<double> parseSeconds(std::string_view text) {
-  const auto seconds = wholeNumber<double>(text);
+  const auto seconds = parseNumber<double>(text);
   // Not the other way round: that would let "nan" pass.
   return seconds && *seconds >= 0 && *seconds <= longestAdvance ? seconds : std::nullopt;
 }

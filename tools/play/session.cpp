@@ -3,8 +3,8 @@
 
 #include "toolkit/exception.hpp"
 #include "tools/play/pressing.hpp"
-#include "tools/play/text_layout.hpp"
 #include "tools/play/words.hpp"
+#include "tools/text_layout.hpp"
 
 namespace tools::play {
 

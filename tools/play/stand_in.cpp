@@ -8,7 +8,7 @@
 #include "QZ_Plist_State_Parser.hpp"
 #include "toolkit/property_list/scalars.hpp"
 #include "toolkit/uppercase.hpp"
-#include "tools/play/whole_number.hpp"
+#include "tools/play/parse_number.hpp"
 
 namespace tools::play {
 namespace {
@@ -74,7 +74,7 @@ void takeTargets(Kinds& kinds, const toolkit::ValueRef<toolkit::Array>& command)
 Kinds kindsByTag(const toolkit::ValueRef<toolkit::Dictionary>& script) {
   Kinds kinds;
   for (const std::string& key : script->allKeys()) {
-    if (const auto tag = wholeNumber<long>(key)) take(kinds, *tag, ViewKind::button);
+    if (const auto tag = parseNumber<long>(key)) take(kinds, *tag, ViewKind::button);
     for (const auto& element : toolkit::asArray(script->objectForKey(key))->elements()) {
       const auto command = toolkit::asArray(element);
       if (command->count() > 0) takeTargets(kinds, command);

@@ -27,8 +27,9 @@ std::vector<ControlPicture> lookAtControls(toolkit::TestDriver& driver,
   std::set<long> tags;
   const auto content = engine.tutorialWindow()->contentView();
   for (const auto& view : content->subviews()) {
-    controls.push_back(lookAtControl(driver, engine, view));
-    controls.back().shadowed = !tags.insert(view->tag()).second;
+    ControlPicture& control = controls.emplace_back(lookAtControl(driver, engine, view));
+    control.shadowed = !tags.insert(view->tag()).second;
+    if (control.shadowed) control.flashing = false;  // the one behind it flashes in its place
   }
   return controls;
 }

@@ -29,7 +29,6 @@ class Transcript {
 
   /// What showed at the end of the last step.
   const StepPicture& latest() const { return latest_; }
-  int steps() const { return steps_; }
 
  private:
   std::ostream& out_;

@@ -6,7 +6,7 @@
 #include <cstdio>
 #include <utility>
 
-#include "tools/play/text_layout.hpp"
+#include "tools/text_layout.hpp"
 
 namespace tools::play {
 namespace {

@@ -1,4 +1,4 @@
-// Numbers that a text is as a whole.
+// Reading a text as one number.
 #pragma once
 
 #include <charconv>
@@ -10,7 +10,7 @@ namespace tools::play {
 
 /// The number that `text` is from its first character to its last, or nothing.
 template <class T>
-std::optional<T> wholeNumber(std::string_view text) {
+std::optional<T> parseNumber(std::string_view text) {
   T number{};
   const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
   const bool whole = error == std::errc{} && end == text.data() + text.size();

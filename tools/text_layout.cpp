@@ -1,5 +1,5 @@
 // Text in the cells of a terminal.
-#include "tools/play/text_layout.hpp"
+#include "tools/text_layout.hpp"
 
 #include <algorithm>
 #include <array>
@@ -7,7 +7,7 @@
 
 #include "toolkit/property_list/utf8.hpp"
 
-namespace tools::play {
+namespace tools {
 namespace {
 
 constexpr char32_t replacement = 0xFFFD;
@@ -140,8 +140,8 @@ std::string printable(std::string_view text) {
   return shown;
 }
 
-std::string quote(std::string_view text) {
-  std::string shown = "“";
+std::string oneLine(std::string_view text) {
+  std::string shown;
   for (const char c : printable(text)) {
     if (c == '\n') {
       shown += "\\n";
@@ -149,8 +149,10 @@ std::string quote(std::string_view text) {
       shown += c;
     }
   }
-  return shown + "”";
+  return shown;
 }
+
+std::string quote(std::string_view text) { return "“" + oneLine(text) + "”"; }
 
 std::vector<std::string> wrap(std::string_view text, std::size_t width) {
   std::vector<std::string> lines;
@@ -170,4 +172,4 @@ std::string padLeft(std::string_view text, std::size_t width) {
   return padding(text, width) + std::string(text);
 }
 
-}  // namespace tools::play
+}  // namespace tools

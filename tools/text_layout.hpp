@@ -9,7 +9,7 @@
 #include <string_view>
 #include <vector>
 
-namespace tools::play {
+namespace tools {
 
 /// The columns that `text` takes: two for an East Asian wide character or an emoji, none for a
 /// combining mark.
@@ -20,7 +20,10 @@ std::size_t displayWidth(std::string_view text);
 /// paragraph separators become line ends.
 std::string printable(std::string_view text);
 
-/// `text` on one line between “ and ”, line ends written "\n".
+/// The same on one line: line ends are written "\n".
+std::string oneLine(std::string_view text);
+
+/// The same on one line between “ and ”.
 std::string quote(std::string_view text);
 
 /// `text` in lines of at most `width` columns (1 or more), broken at line ends, else at spaces,
@@ -31,4 +34,4 @@ std::vector<std::string> wrap(std::string_view text, std::size_t width);
 std::string padRight(std::string_view text, std::size_t width);
 std::string padLeft(std::string_view text, std::size_t width);
 
-}  // namespace tools::play
+}  // namespace tools

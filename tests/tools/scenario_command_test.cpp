@@ -1,0 +1,208 @@
+// The command line of `qz-walkthrough test`: what it runs, prints and leaves behind.
+#include <gtest/gtest.h>
+
+#include <cstdlib>
+#include <filesystem>
+#include <fstream>
+#include <iostream>
+#include <regex>
+#include <sstream>
+#include <string>
+#include <vector>
+
+#include "play_files.hpp"
+#include "tools/shell.hpp"
+#include "tools/test_command.hpp"
+
+namespace tools {
+namespace {
+
+namespace fs = std::filesystem;
+
+const std::string data = QZ_TEST_DATA "/scenarios/";
+
+struct Result {
+  int status;
+  std::string out;
+  std::string err;
+};
+
+std::string withoutFolder(std::string text) {
+  for (auto at = text.find(data); at != std::string::npos; at = text.find(data)) {
+    text.erase(at, data.size());
+  }
+  return text;
+}
+
+/// Runs the tool; the folder of the test's files is left out of what it printed.
+Result run(const std::vector<std::string>& arguments) {
+  std::ostringstream out;
+  std::ostringstream err;
+  auto* const outBefore = std::cout.rdbuf(out.rdbuf());
+  auto* const errBefore = std::cerr.rdbuf(err.rdbuf());
+  const int status = runTool(arguments, {addTestCommand});
+  std::cout.rdbuf(outBefore);
+  std::cerr.rdbuf(errBefore);
+  return {status, withoutFolder(out.str()), withoutFolder(err.str())};
+}
+
+/// Tests in a working directory of their own.
+class ScenarioCommand : public testing::Test {
+ protected:
+  void write(const std::string& name, const std::string& text) const {
+    const auto folder = fs::path(name).parent_path();
+    if (!folder.empty()) fs::create_directories(folder);
+    directory_.write(name, text);
+  }
+
+  play::WorkingDirectory directory_;
+};
+
+TEST_F(ScenarioCommand, printsFailuresAndCounts) {
+  const auto result = run({"test", data + "failing.walk"});
+  EXPECT_EQ(result.status, 1);
+  EXPECT_EQ(result.err, "");
+  EXPECT_EQ(result.out,
+            "failing.walk:10: expected \"Well done\", got \"\"\n"
+            "    expect label.text \"Well done\"\n"
+            "    in failing.walk:9: this one fails\n"
+            "failing.walk:14: expected no further log line, got \"Found tag value: 5 for object: "
+            "NSTextField using Key: 5\" logged in line 14\n"
+            "    adopt panel => YES\n"
+            "    in failing.walk:13: this one fails in the common beginning's wake\n"
+            "failing.walk:21: expected {\"5\":[]}, got {} (they differ at .5)\n"
+            "    expect engine.guiAssets { …\n"
+            "    in failing.walk:20: the text over several lines is shortened\n"
+            "1 passed, 3 failed, 1 skipped\n");
+}
+
+TEST_F(ScenarioCommand, aFileThatIsOneScenario) {
+  const auto result = run({"test", data + "whole-file.walk"});
+  EXPECT_EQ(result.status, 1);
+  EXPECT_EQ(result.out,
+            "whole-file.walk:3: expected \"7\", got \"0\"\n    expect state 7\n"
+            "0 passed, 1 failed\n");
+}
+
+TEST_F(ScenarioCommand, whatPassesIsOnlyCounted) {
+  write("a.walk", "engine\nexpect state 0\n");
+  const auto result = run({"test", "a.walk", "a.walk"});
+  EXPECT_EQ(result.status, 0);
+  EXPECT_EQ(result.out, "1 passed, 0 failed\n");
+}
+
+TEST_F(ScenarioCommand, nothingRunsWhenAFileIsRefused) {
+  const auto result =
+      run({"test", data + "failing.walk", data + "refused.walk", data + "none.walk"});
+  EXPECT_EQ(result.status, 2);
+  EXPECT_EQ(result.out, "");
+  EXPECT_EQ(result.err,
+            "none.walk: no such file or directory\n"
+            "refused.walk:3:3: unknown statement \"controll\"; did you mean \"control\"?\n");
+}
+
+TEST_F(ScenarioCommand, directoriesStandForTheScenariosBelow) {
+  write("b/two.walk", "engine\nexpect state 1\n");
+  write("a.walk", "engine\nexpect state 2\n");
+  write("b/notes.txt", "no scenario");
+  const auto result = run({"test", "."});
+  EXPECT_EQ(result.status, 1);
+  EXPECT_EQ(result.out,
+            "./a.walk:2: expected \"2\", got \"0\"\n    expect state 2\n"
+            "./b/two.walk:2: expected \"1\", got \"0\"\n    expect state 1\n"
+            "0 passed, 2 failed\n");
+  fs::create_directories("empty");
+  EXPECT_EQ(run({"test", "empty"}).err, "empty: no .walk file in or below this directory\n");
+}
+
+TEST_F(ScenarioCommand, listsAndFilters) {
+  const auto list = run({"test", "--list", "--filter", "fails", data + "failing.walk"});
+  EXPECT_EQ(list.status, 0);
+  EXPECT_EQ(list.out,
+            "failing.walk:9: this one fails\n"
+            "failing.walk:13: this one fails in the common beginning's wake\n");
+  EXPECT_EQ(run({"test", "--filter", "passes", data + "failing.walk"}).out, "1 passed, 0 failed\n");
+}
+
+TEST_F(ScenarioCommand, aFilterThatNothingFitsFails) {
+  const auto result = run({"test", "--filter", "nothing", data + "failing.walk"});
+  EXPECT_EQ(result.status, 2);
+  EXPECT_EQ(result.err, "qz-walkthrough: no scenario has \"nothing\" in its title\n");
+}
+
+TEST_F(ScenarioCommand, verboselyEveryStatementIsPrinted) {
+  write("a.walk",
+        "window w\nengine\nadopt w => NO\nfind 5 => none\n"
+        "compound FLASH_ID [] for 1 => raises\n");
+  EXPECT_EQ(run({"test", "--verbose", "a.walk"}).out,
+            "# a.walk\n"
+            "a.walk:1: window w  [ok]\n"
+            "a.walk:2: engine  [ok]\n"
+            "a.walk:3: adopt w => NO  [NO]\n"
+            "a.walk:4: find 5 => none  [none]\n"
+            "a.walk:5: compound FLASH_ID [] for 1 => raises  [raised NSRangeException: -[NSArray "
+            "objectAtIndex:]: index 1 beyond bounds for empty array]\n"
+            "1 passed, 0 failed\n");
+}
+
+TEST_F(ScenarioCommand, badUsageIsOneLine) {
+  write("a.walk", "engine\n");
+  const struct {
+    std::vector<std::string> arguments;
+    std::string line;
+  } cases[] = {
+      {{"test", "--toolkit", "memry", "a.walk"},
+       "unknown toolkit memry; this build has memory; did you mean \"memory\"?"},
+      {{"test", "--junit", "no/report.xml", "a.walk"},
+       "no/report.xml: the report cannot be written"},
+      {{"test", "--verbos", "a.walk"},
+       "unknown option --verbos; did you mean \"--verbose\"?; see qz-walkthrough test --help"},
+      {{"test"}, "FILE is required; see qz-walkthrough test --help"},
+  };
+  for (const auto& test : cases) {
+    const auto result = run(test.arguments);
+    EXPECT_EQ(result.status, 2) << test.line;
+    EXPECT_EQ(result.err, "qz-walkthrough: " + test.line + "\n");
+    EXPECT_EQ(result.out, "");
+  }
+}
+
+TEST_F(ScenarioCommand, writesAReport) {
+  EXPECT_EQ(run({"test", "--junit", "report.xml", data + "failing.walk"}).status, 1);
+  std::stringstream xml;
+  xml << std::ifstream("report.xml").rdbuf();
+  const std::regex suite(
+      "<testsuite name=\"[^\"]*failing.walk\" tests=\"5\" failures=\"3\" "
+      "errors=\"0\" skipped=\"1\" time=\"[0-9]+[.][0-9]{6}\">");
+  EXPECT_TRUE(std::regex_search(xml.str(), suite)) << xml.str();
+}
+
+TEST_F(ScenarioCommand, resourceDirectoriesAreRemoved) {
+  write("a.walk",
+        "script deep/er/intro.plist {}\nimage star\nengine\n"
+        "scenario passes\nload deep/er/intro.plist => YES\n"
+        "scenario fails\nexpect state 1\n");
+  fs::create_directories("temporary");
+  // A directory of our own, for other tests may be running.
+  const auto before = fs::temp_directory_path();
+  ::setenv("TMPDIR", fs::absolute("temporary").c_str(), 1);
+  const auto result = run({"test", "a.walk"});
+  ::setenv("TMPDIR", before.c_str(), 1);
+  EXPECT_NE(result.out.find("1 passed, 1 failed\n"), std::string::npos) << result.out;
+  EXPECT_TRUE(fs::is_empty("temporary"));
+}
+
+TEST_F(ScenarioCommand, withoutADirectoryForTemporaryFilesNothingRuns) {
+  write("a.walk", "engine\n");
+  const auto before = fs::temp_directory_path();
+  ::setenv("TMPDIR", fs::absolute("nowhere").c_str(), 1);
+  const auto result = run({"test", "a.walk"});
+  ::setenv("TMPDIR", before.c_str(), 1);
+  EXPECT_EQ(result.status, 1);
+  EXPECT_TRUE(
+      result.err.starts_with("qz-walkthrough: cannot make a directory for temporary files: "))
+      << result.err;
+}
+
+}  // namespace
+}  // namespace tools
