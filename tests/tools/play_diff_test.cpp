@@ -26,6 +26,12 @@ TextAttributes bold() {
   return attributes;
 }
 
+TextAttributes indented(double firstLine) {
+  TextAttributes attributes;
+  attributes.paragraphStyle = {{toolkit::TextAlignment::natural, firstLine, 0}};
+  return attributes;
+}
+
 /// Two runs, the second of them bold.
 AttributedString halfBold(const std::string& first, const std::string& second) {
   AttributedString text(first);
@@ -110,6 +116,10 @@ TEST(PlayDiff, stylesCountBesideTheText) {
        halfBold("ab", "c"),
        halfBold("a", "bc"),
        {{"style", "“ab” plain; “c” Times 12 bold", "“a” plain; “bc” Times 12 bold"}}},
+      {"the same text in a style that no word is for",
+       AttributedString("Hi", indented(1)),
+       AttributedString("Hi", indented(2)),
+       {{"style", "plain", "other plain"}}},
       {"another text in the same styles",
        halfBold("ab", "c"),
        halfBold("x", "yz"),

@@ -223,6 +223,8 @@ TEST(Play, saysWhatIsWrongWithAFile) {
   PlayOptions options;
   options.script = "missing.plist";
   EXPECT_EQ(refusal(options), "missing.plist: no such file; expected a script");
+  options.script = "";
+  EXPECT_EQ(refusal(options), "an empty path; expected that of a script");
   options.script = ".";
   EXPECT_EQ(refusal(options), ".: a directory; expected a script");
   options = smallScript(directory);

@@ -21,6 +21,7 @@ namespace {
 }
 
 std::string contentsOf(const std::string& path, const std::string& what) {
+  if (path.empty()) refuse("an empty path; expected that of " + what);
   std::error_code error;
   const auto status = std::filesystem::status(path, error);
   if (!exists(status)) refuse(path + ": no such file; expected " + what);

@@ -105,13 +105,11 @@ std::string stylesInShort(const toolkit::AttributedString& text) {
 
 void compareStyles(const toolkit::AttributedString& before, const toolkit::AttributedString& now,
                    std::vector<Change>& changes) {
-  if (before.string() == now.string()) {
-    if (before != now) changes.push_back({"style", stylesWords(before), stylesWords(now)});
-    return;
-  }
-  if (attributesOf(before) == attributesOf(now)) return;
-  const std::string was = stylesInShort(before);
-  const std::string is = stylesInShort(now);
+  const bool sameText = before.string() == now.string();
+  if (sameText ? before == now : attributesOf(before) == attributesOf(now)) return;
+  const auto words = sameText ? stylesWords : stylesInShort;
+  const std::string was = words(before);
+  const std::string is = words(now);
   changes.push_back({"style", was, is == was ? "other " + is : is});
 }
 

@@ -76,6 +76,14 @@ void checkDirectory(const std::string& path) {
   throw Failure(ExitStatus::badInput, path + ": no such directory; expected one with images");
 }
 
+void pressIfPossible(Session& session, const Press& press, std::ostream& out) {
+  if (const auto reason = whyNotPress(session.picture(), press.tag)) {
+    out << "  " << *reason << '\n';
+  } else {
+    session.perform(press);
+  }
+}
+
 /// Asks for one step after the other until the walk-through ends or the user quits.
 void playInteractively(Session& session, const Terminal& terminal) {
   std::string line;
@@ -88,12 +96,7 @@ void playInteractively(Session& session, const Terminal& terminal) {
     const Request request = parseRequest(line);
     if (std::holds_alternative<Quit>(request)) return;
     if (const auto* pressed = std::get_if<Press>(&request)) {
-      const auto reason = whyNotPress(session.picture(), pressed->tag);
-      if (reason) {
-        terminal.out << "  " << *reason << '\n';
-      } else {
-        session.perform(*pressed);
-      }
+      pressIfPossible(session, *pressed, terminal.out);
     } else if (const auto* passed = std::get_if<Advance>(&request)) {
       session.perform(*passed);
     } else if (const auto* unclear = std::get_if<Unclear>(&request)) {
