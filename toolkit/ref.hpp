@@ -44,7 +44,9 @@ class Ref {
 template <class T>
 class StoredRef {
  public:
-  static StoredRef own(const Ref<T>& object) { return StoredRef(object.pointer(), object.pointer()); }
+  static StoredRef own(const Ref<T>& object) {
+    return StoredRef(object.pointer(), object.pointer());
+  }
   static StoredRef refer(const Ref<T>& object) { return StoredRef(nullptr, object.pointer()); }
   StoredRef() = default;
 

@@ -6,8 +6,9 @@
 
 namespace toolkit {
 
-/// `text` (UTF-8) in upper case by Unicode's full mappings, in no particular language. One character
-/// may become several: "ß" becomes "SS", the ligature "ﬁ" becomes "FI". What is no UTF-8 stays.
+/// `text` (UTF-8) in upper case by Unicode's full mappings, in no particular language. One
+/// character may become several: "ß" becomes "SS", the ligature "ﬁ" becomes "FI". What is no UTF-8
+/// stays.
 std::string uppercased(std::string_view text);
 
 }  // namespace toolkit

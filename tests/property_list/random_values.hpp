@@ -62,7 +62,7 @@ class RandomValues {
   }
 
   ValueRef<> special() {
-    if (isForXml_ || random_() % 2 == 0) return Uid::make(random_());
+    if (isForXml_ || random_() % 2 == 0) return Uid::make(static_cast<std::uint32_t>(random_()));
     if (random_() % 2 == 0) return Null::make();
     return Set::make({String::make(text()), integer()});
   }
@@ -92,7 +92,8 @@ class RandomValues {
     std::string text;
     const bool isAscii = random_() % 2 == 0;
     for (std::size_t left = random_() % 40; left > 0; --left) {
-      char32_t c = isAscii ? random_() % 0x80 : random_() % 0x110000 >> random_() % 21;
+      auto c = static_cast<char32_t>(isAscii ? random_() % 0x80
+                                             : random_() % 0x110000 >> random_() % 21);
       if (isForXml_ && isSurrogate(c)) c = 0xFEFF;
       appendUtf8(text, c);
     }
