@@ -101,53 +101,63 @@ TEST(PlayDiff, namesEveryChangeOfTheWindow) {
   }
 }
 
-TEST(PlayDiff, stylesCountBesideTheText) {
+/// What is said of a text field that shows `now` after `before`.
+Changes textChanges(const AttributedString& before, const AttributedString& now) {
+  StepPicture first = oneControl(ViewKind::textField);
+  first.controls[0].view.text = before;
+  StepPicture second = first;
+  second.controls[0].view.text = now;
+  return diffPictures(first, second).controls[0].changes;
+}
+
+TEST(PlayDiff, theStyleOfATextThatStaysIsToldPieceByPiece) {
   const struct {
     const char* what;
     AttributedString before;
     AttributedString now;
     Changes expected;
   } cases[] = {
-      {"the same text in another style",
+      {"another style",
        AttributedString("Hi"),
        AttributedString("Hi", bold()),
        {{"style", "plain", "Times 12 bold"}}},
-      {"the same text, styled elsewhere",
+      {"styled elsewhere",
        halfBold("ab", "c"),
        halfBold("a", "bc"),
        {{"style", "“ab” plain; “c” Times 12 bold", "“a” plain; “bc” Times 12 bold"}}},
-      {"the same text in a style that no word is for",
+      {"a style that no word is for",
        AttributedString("Hi", indented(1)),
        AttributedString("Hi", indented(2)),
        {{"style", "plain", "other plain"}}},
-      {"another text in the same styles",
-       halfBold("ab", "c"),
-       halfBold("x", "yz"),
-       {{"text", "“abc”", "“xyz”"}}},
-      {"another text in other styles",
+      {"the same", halfBold("ab", "c"), halfBold("ab", "c"), {}},
+  };
+  for (const auto& c : cases) EXPECT_EQ(textChanges(c.before, c.now), c.expected) << c.what;
+}
+
+TEST(PlayDiff, theStyleOfAnotherTextIsToldInShort) {
+  AttributedString boldFirst("x", bold());
+  boldFirst.append("y", {});
+  const struct {
+    const char* what;
+    AttributedString before;
+    AttributedString now;
+    Changes expected;
+  } cases[] = {
+      {"the same styles", halfBold("ab", "c"), halfBold("x", "yz"), {{"text", "“abc”", "“xyz”"}}},
+      {"fewer styles",
        halfBold("ab", "c"),
        AttributedString("x"),
        {{"text", "“abc”", "“x”"}, {"style", "2 pieces", "plain"}}},
-      {"another text in as many other styles",
+      {"as many other styles",
        halfBold("ab", "c"),
-       [] {
-         AttributedString text("x", bold());
-         text.append("y", {});
-         return text;
-       }(),
+       boldFirst,
        {{"text", "“abc”", "“xy”"}, {"style", "2 pieces", "other 2 pieces"}}},
-      {"a text where there was none, in no style",
+      {"none where there was no text",
        AttributedString(),
        AttributedString("x"),
        {{"text", "“”", "“x”"}}},
   };
-  for (const auto& c : cases) {
-    StepPicture before = oneControl(ViewKind::textField);
-    before.controls[0].view.text = c.before;
-    StepPicture now = before;
-    now.controls[0].view.text = c.now;
-    EXPECT_EQ(diffPictures(before, now).controls[0].changes, c.expected) << c.what;
-  }
+  for (const auto& c : cases) EXPECT_EQ(textChanges(c.before, c.now), c.expected) << c.what;
 }
 
 TEST(PlayDiff, controlsAreKnownAgainByThemselvesNotByTheirTag) {

@@ -44,6 +44,7 @@ TEST(ScenarioLexer, wordsStatementsAndComments) {
       {"comments that begin like one", "a #5th\nb #5,\nc #-\nd #", {{"a"}, {"b"}, {"c"}, {"d"}}},
       {"quoted words", R"(a "b c" "" "d # e")", {{"a", "'b c'", "''", "'d # e'"}}},
       {"escapes", R"("\" \\ \/ \n \u00fc \ud83d\ude00")", {{"'\" \\ / \n ü 😀'"}}},
+      {"a tab in a quoted word", "\"a\tb\"", {{"'a\tb'"}}},
       {"an escaped star keeps its backslash", R"("a \* b" "\\*")", {{"'a \\* b'", "'\\*'"}}},
       {"other letters", "grüße 価格 😀", {{"grüße", "価格", "😀"}}},
       {"JSON", R"(a {"k": [1, "x ] y"]} b)", {{"a", R"(<{"k":[1,"x ] y"]}>)", "b"}}},
@@ -92,6 +93,7 @@ TEST(ScenarioLexer, refusesWhatIsNoText) {
       {"beyond Unicode", "\xF4\x90\x80\x80", "1:1: a byte that is no UTF-8"},
       {"a cut character", "ü\xE4\xBE", "1:2: a byte that is no UTF-8"},
       {"a NUL", std::string("a \0", 3), "1:3: a control character"},
+      {"a lone carriage return", "a\rb", "1:2: a control character"},
       {"an escape character", "a\n\x1B", "2:1: a control character"},
   };
   for (const auto& test : cases) EXPECT_EQ(refusalOf(test.text), test.refusal) << test.name;
@@ -104,6 +106,7 @@ TEST(ScenarioLexer, refusesBrokenWords) {
     std::string refusal;
   } cases[] = {
       {"open quotation mark", "a \"b\nc\"", "1:3: this quotation mark is not closed on its line"},
+      {"the same on Windows", "a \"b\r\nc\"", "1:3: this quotation mark is not closed on its line"},
       {"text behind a quoted word", "\"a\"b",
        "1:4: expected a blank after the closing quotation mark"},
       {"quotation mark in a word", "ab\"c",

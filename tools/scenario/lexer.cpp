@@ -72,15 +72,16 @@ class Lexer {
 
   Line line() {
     Line line;
+    skipBlanks();
     const auto start = offset_;
-    for (; !atEnd() && peek() != '\n'; skipBlanks()) {
-      if (isBlank(peek())) continue;
+    while (!atEnd() && peek() != '\n') {
       if (atComment()) {
         skipComment();
       } else {
         line.words.push_back(word());
         line.end = at_;
       }
+      skipBlanks();
     }
     line.source = shortSource(text_.substr(start, offset_ - start));
     if (!atEnd()) take();
@@ -88,7 +89,6 @@ class Lexer {
   }
 
   static std::string shortSource(std::string_view source) {
-    while (!source.empty() && isBlank(source.front())) source.remove_prefix(1);
     const auto end = source.find('\n');
     std::string first(source.substr(0, end));
     while (!first.empty() && isBlank(first.back())) first.pop_back();
@@ -127,9 +127,10 @@ class Lexer {
     Word word{Word::Kind::quoted, {}, {}, at_};
     std::string raw(1, take());
     while (peek() != '"') {
-      if (peek() == '\n')
+      if (peek() == '\n' || peek() == '\r') {
         throw SyntaxError(word.at, "this quotation mark is not closed on its line");
-      raw += peek() == '\\' ? escape() : std::string(1, take());
+      }
+      raw += peek() == '\\' ? escape() : plainCharacter();
     }
     raw += take();
     requireWordEnd("the closing quotation mark");
@@ -138,6 +139,12 @@ class Lexer {
     if (decoded.is_discarded()) throw SyntaxError(word.at, "a \\u escape without its partner");
     word.text = decoded.get<std::string>();
     return word;
+  }
+
+  /// A byte as JSON reads it, which has no tabs within quotation marks.
+  std::string plainCharacter() {
+    const char c = take();
+    return c == '\t' ? "\\t" : std::string(1, c);
   }
 
   /// An escape as JSON reads it. `\*` is none of JSON's, but what the pattern of a log line needs.
@@ -260,7 +267,8 @@ void requireText(std::string_view text) {
     const auto length = characterLength(text);
     if (length == 0) throw SyntaxError(at, "a byte that is no UTF-8");
     const auto c = static_cast<unsigned char>(text[0]);
-    if (c < 0x20 && c != '\t' && c != '\n' && c != '\r') {
+    const bool endsLine = c == '\n' || text.starts_with("\r\n");
+    if (c < 0x20 && c != '\t' && !endsLine) {
       throw SyntaxError(at, "a control character");
     }
     at = c == '\n' ? Position{at.line + 1, 1} : Position{at.line, at.column + 1};
