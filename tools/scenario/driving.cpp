@@ -124,10 +124,16 @@ Outcome timer(Stage& stage, const Arguments& a) {
   return {};
 }
 
+Kept keptTimer(const Stage& stage, const std::string& name) {
+  const auto kept = stage.kept.find(name);
+  if (kept == stage.kept.end() || !kept->second.timer) {
+    throw Unmet("a kept timer", name + ", which is none");
+  }
+  return kept->second;
+}
+
 Outcome fire(Stage& stage, const Arguments& a) {
-  const auto fired = a.has("KEPT") ? stage.kept[a.text("KEPT")] : Kept();
-  if (a.has("KEPT") && !fired.timer)
-    throw Unmet("a kept timer", a.text("KEPT") + ", which is none");
+  const auto fired = a.has("KEPT") ? keptTimer(stage, a.text("KEPT")) : Kept();
   if (fired.isFlasher) {
     stage.engines.held()->flasherFired(fired.timer);
   } else {

@@ -93,8 +93,8 @@ Stage::Stage(toolkit::TestDriver& driverToUse, std::string nameOfFile, Performed
 Stage::~Stage() { driver.setLogSink({}); }
 
 void Stage::perform(const Statement& statement) {
-  const auto engine = engines.current();
-  const GuardedStack guarded(engine, file + ":" + std::to_string(statement.at.line));
+  // Nothing here keeps the engine for as long as the statement lasts: it may have to end meanwhile.
+  const GuardedStack guarded(engines.current(), file + ":" + std::to_string(statement.at.line));
   performHere(statement);
   if (auto failed = std::exchange(failedReaction_, std::nullopt)) throw Failed(*failed);
 }
