@@ -29,6 +29,7 @@ struct WindowOrder {
 };
 
 /// The memory toolkit's application, which notes what windows it is asked for and can refuse them.
+/// Its controls come hidden, disabled and untidy, so that whatever is not set up shows.
 class ObservedApplication final : public toolkit::Application {
  public:
   explicit ObservedApplication(toolkit::Application& application) : application_(application) {}
@@ -41,13 +42,24 @@ class ObservedApplication final : public toolkit::Application {
   }
   Ref<toolkit::Button> makeButton(const toolkit::Rect& frame) override {
     if (onButton) onButton();
-    return application_.makeButton(frame);
+    const auto button = application_.makeButton(frame);
+    button->setHidden(true);
+    button->setEnabled(false);
+    return button;
   }
   Ref<toolkit::ImageView> makeImageView(const toolkit::Rect& frame) override {
-    return application_.makeImageView(frame);
+    const auto imageView = application_.makeImageView(frame);
+    imageView->setHidden(true);
+    imageView->setImageFrameStyle(toolkit::ImageFrameStyle{3});
+    imageView->setImageScaling(toolkit::ImageScaling{1});
+    imageView->setImageAlignment(toolkit::ImageAlignment{2});
+    return imageView;
   }
   Ref<toolkit::TextField> makeTextField(const toolkit::Rect& frame) override {
-    return application_.makeTextField(frame);
+    const auto textField = application_.makeTextField(frame);
+    textField->setHidden(true);
+    textField->setStringValue("untidy");
+    return textField;
   }
   void beginSheet(const Ref<toolkit::Window>& sheet, const Ref<toolkit::Window>& parent,
                   const std::shared_ptr<toolkit::SheetDelegate>& delegate,
@@ -187,12 +199,19 @@ TEST_F(GuiAssets, ControlsAreSetUpForTheirKind) {
   ASSERT_TRUE(load({{"1", entry("NSButton", {0, 0, 9, 9})},
                     {"2", entry("NSImageView", {0, 0, 9, 9})},
                     {"3", entry("NSTextField", {0, 0, 9, 9})}}));
-  EXPECT_EQ(static_cast<int>(made<toolkit::memory::MemoryButton>(0).bezelStyle()), 8);
+  const auto& button = made<toolkit::memory::MemoryButton>(0);
+  EXPECT_EQ(static_cast<int>(button.bezelStyle()), 8);
+  EXPECT_FALSE(button.isHidden());
+  EXPECT_TRUE(button.isEnabled());
   const auto& imageView = made<toolkit::memory::MemoryImageView>(1);
   EXPECT_EQ(static_cast<int>(imageView.imageFrameStyle()), 0);
   EXPECT_EQ(static_cast<int>(imageView.imageScaling()), 0);
   EXPECT_EQ(static_cast<int>(imageView.imageAlignment()), 0);
-  EXPECT_EQ(made<toolkit::memory::MemoryTextField>(2).delegate(), engine);
+  EXPECT_FALSE(imageView.isHidden());
+  const auto& textField = made<toolkit::memory::MemoryTextField>(2);
+  EXPECT_EQ(textField.delegate(), engine);
+  EXPECT_EQ(textField.stringValue(), "");
+  EXPECT_FALSE(textField.isHidden());
 }
 
 TEST_F(GuiAssets, ImageViewsAndTextFieldsKeepTheToolkitsDefaultTag) {

@@ -4,6 +4,7 @@
 
 #include <memory>
 #include <optional>
+#include <string>
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "toolkit/memory/memory_driver.hpp"
@@ -167,6 +168,74 @@ TEST_F(Lifetime, AnEngineMayEndAfterItsToolkit) {
   driver.reset();
   engine.reset();
   EXPECT_EQ(timers->count(), 0U);
+}
+
+/// A host that lets go of its engine from within a call, at the first line that is logged.
+class LetGo : public Lifetime {
+ protected:
+  LetGo() {
+    engine = Engine::initWithWindow(driver->toolkit(), nullptr);
+    engine->getGuiAssetsFromWindow(window);
+    const Engine::Value raises = toolkit::Array::make();
+    const auto text = [](std::string_view name) { return toolkit::String::make(name); };
+    const auto speak =
+        toolkit::Array::make({text("SET_TITLE_FOR_OBJECT_ID"), text("done"), Number::withLong(7)});
+    engine->plistDictionary()->setObject(toolkit::Array::make({raises, speak}), "7");
+    engine->plistDictionary()->setObject(toolkit::Array::make({raises, speak}), "8");
+    driver->setLogSink([this](std::string_view) { engine.reset(); });
+  }
+
+  /// Calls the engine, which nothing but the host keeps, and says whether it did all there was to
+  /// do and then ended.
+  template <class Call>
+  bool endsOnlyAfter(Call call) {
+    engine->flashingTimer()->invalidate();
+    const std::weak_ptr<Engine> watched = engine;
+    call(*engine);
+    return !engine && watched.expired();
+  }
+  std::string title() { return driver->look(button).title.string(); }
+
+  toolkit::Ref<toolkit::Window> window = driver->makeWindow({0, 0, 300, 200});
+  toolkit::Ref<toolkit::View> button =
+      driver->makeView(toolkit::ViewKind::button, 7, {20, 20, 100, 30}, window->contentView());
+};
+
+TEST_F(LetGo, InARunTheRunIsDone) {
+  EXPECT_TRUE(endsOnlyAfter([](Engine& called) {
+    called.processCommandArray(called.plistDictionary()->objectForKey("7"), Number::withLong(7));
+  }));
+  EXPECT_EQ(title(), "done");
+}
+
+TEST_F(LetGo, InAPressItsListIsDone) {
+  EXPECT_TRUE(endsOnlyAfter([this](Engine& called) { called.buttonPushed(button); }));
+  EXPECT_EQ(title(), "done");
+}
+
+TEST_F(LetGo, InALoadItsListIsDone) {
+  EXPECT_TRUE(endsOnlyAfter(
+      [](Engine& called) { EXPECT_TRUE(called.loadPlist("none.plist", "7", nullptr, false)); }));
+  EXPECT_EQ(title(), "done");
+}
+
+TEST_F(LetGo, InATimersPressItsListIsDone) {
+  const auto fired = timer();
+  engine->objectIdTimers()->setObject(fired, "7");
+  EXPECT_TRUE(endsOnlyAfter([&](Engine& called) { called.pseudoButtonPush(fired); }));
+  EXPECT_EQ(title(), "done");
+}
+
+TEST_F(LetGo, InATimersOwnListTheListIsDone) {
+  const auto fired = timer();
+  engine->objectIdTimers()->setObject(fired, "8");
+  EXPECT_TRUE(endsOnlyAfter([&](Engine& called) { called.pseudoButtonPush(fired); }));
+  EXPECT_EQ(title(), "done");
+}
+
+TEST_F(LetGo, InATerminationTheWindowIsClosed) {
+  EXPECT_TRUE(endsOnlyAfter([](Engine& called) { called.terminateParser(); }));
+  EXPECT_EQ(driver->look(window).closes, 1);
 }
 
 }  // namespace

@@ -93,6 +93,15 @@ TEST_F(Processors, TicksAndTimersLookFor32Bits) {
   EXPECT_TRUE(engine->objectIdTimers()->contains("4294967303"));
 }
 
+TEST_F(Processors, AListIsChainedByAllTheBitsOfItsTag) {
+  const auto script = toolkit::Dictionary::make();
+  script->setObject(toolkit::Array::make({toolkit::String::make("IDLE_LOOP")}), "4294967303");
+  engine->setPlistDictionary(script);
+  EXPECT_TRUE(
+      engine->QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(Number::withLong(4'294'967'303)));
+  EXPECT_EQ(engine->currentCommandState(), "4294967303");
+}
+
 TEST_F(Processors, ATimerValueHas64Bits) {
   engine->QZ_Plist_State_Processor_SET_TIMER(8'589'934'592, Number::withLong(7));
   EXPECT_EQ(engine->objectIdTimers()->objectForKey("7")->interval(), 8'589'934'592.0);
