@@ -2,7 +2,6 @@
 
 #include <algorithm>
 #include <array>
-#include <bit>
 #include <utility>
 
 #include "toolkit/property_list/utf8.hpp"
@@ -10,73 +9,8 @@
 namespace toolkit {
 namespace {
 
-constexpr std::array<std::string_view, 11> tagNames = {
-    "plist", "array", "dict", "key", "string", "integer", "real", "date", "data", "true", "false"};
-
-/// A tag without attributes or spaces, from the name to the `>`: it fits in one word, so that one
-/// comparison recognizes it. It is how tags are spelled nearly always.
-struct PlainTag {
-  std::uint64_t word = 0;
-  std::uint64_t mask = 0;
-  std::size_t size = 0;
-
-  constexpr PlainTag() = default;
-  constexpr PlainTag(std::string_view name, std::string_view end) : size(name.size() + end.size()) {
-    std::array<char, sizeof word> bytes{};
-    std::array<char, sizeof word> used{};
-    for (std::size_t i = 0; i < size; ++i) {
-      bytes[i] = i < name.size() ? name[i] : end[i - name.size()];
-      used[i] = '\xFF';
-    }
-    word = std::bit_cast<std::uint64_t>(bytes);
-    mask = std::bit_cast<std::uint64_t>(used);
-  }
-  bool matches(std::uint64_t text) const { return (text & mask) == word; }
-};
-
-struct PlainTags {
-  std::array<PlainTag, tagNames.size()> tags;
-  constexpr PlainTags() {
-    for (std::size_t i = 0; i < tags.size(); ++i) tags[i] = PlainTag(tagNames[i], ">");
-  }
-  const PlainTag& operator[](XmlElement element) const {
-    return tags[static_cast<std::size_t>(element)];
-  }
-};
-constexpr PlainTags plainTags;
-
 constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
 constexpr int mostReferenceDigits = 8;
-
-constexpr std::array byFrequency = {XmlElement::string, XmlElement::integer,    XmlElement::array,
-                                    XmlElement::key,    XmlElement::dictionary, XmlElement::real,
-                                    XmlElement::data,   XmlElement::date,       XmlElement::plist};
-
-bool isSpace(char c) { return c == ' ' || c == '\t' || c == '\n' || c == '\r'; }
-
-// Eight bytes at once.
-constexpr std::uint64_t ones = 0x0101010101010101;
-constexpr std::uint64_t highBits = 0x80 * ones;
-
-std::uint64_t loadWord(const char* at) {
-  std::uint64_t word = 0;
-  std::memcpy(&word, at, sizeof word);
-  return word;
-}
-
-/// Sets the high bit of each byte that is zero, and nothing else.
-std::uint64_t zeroBytes(std::uint64_t word) {
-  constexpr std::uint64_t lowBits = ~highBits;
-  return ~(((word & lowBits) + lowBits) | word | lowBits);
-}
-
-/// How many bytes stand before the first whose high bit is set.
-std::size_t bytesBefore(std::uint64_t marks) {
-  const bool firstIsLowest = std::endian::native == std::endian::little;
-  return static_cast<std::size_t>(firstIsLowest ? std::countr_zero(marks)
-                                                : std::countl_zero(marks)) /
-         8;
-}
 
 std::string shown(char c) {
   const auto byte = static_cast<unsigned char>(c);
@@ -87,12 +21,6 @@ std::string shown(char c) {
 
 }  // namespace
 
-std::string_view tagName(XmlElement element) { return tagNames[static_cast<std::size_t>(element)]; }
-
-void XmlTokens::skipSpace() {
-  while (at_ < end_ && isSpace(*at_)) ++at_;
-}
-
 void XmlTokens::skipPast(std::string_view mark, std::size_t start, std::string_view what) {
   const std::size_t found = rest().find(mark, start);
   if (found == std::string_view::npos) refuse(std::string(what) + " is not closed");
@@ -100,7 +28,7 @@ void XmlTokens::skipPast(std::string_view mark, std::size_t start, std::string_v
 }
 
 void XmlTokens::skipDoctype() {
-  if (!rest().starts_with("<!DOCTYPE")) refuse("<!DOCTYPE or a comment is expected after <!");
+  if (!isAt("<!DOCTYPE")) refuse("<!DOCTYPE or a comment is expected after <!");
   const std::size_t end = rest().find_first_of("[>");
   if (end == std::string_view::npos) refuse("the DOCTYPE is not closed");
   at_ += end;
@@ -108,17 +36,20 @@ void XmlTokens::skipDoctype() {
   ++at_;
 }
 
+void XmlTokens::refuseNoMarkup(std::string_view expected) const {
+  if (left() < 2) refuse("expected " + std::string(expected) + ", found the end of the file");
+  refuse("expected " + std::string(expected) + ", found " + shown(*at_));
+}
+
 XmlTag XmlTokens::openRoot() {
   while (true) {
-    skipSpace();
-    if (at_ == end_) refuse("the file ends before its first element");
-    if (*at_ != '<') refuse("expected '<', found " + shown(*at_));
-    if (rest().starts_with("<!--")) {
+    if (!skipToMarkup()) refuseNoMarkup("an element");
+    if (isAt("<!--")) {
       // Here, unlike between elements, the platform takes no empty comment.
       skipPast("-->", 5, "the comment");
-    } else if (rest().starts_with("<!")) {
+    } else if (isAt("<!")) {
       skipDoctype();
-    } else if (rest().starts_with("<?")) {
+    } else if (isAt("<?")) {
       skipPast("?>", 2, "the processing instruction");
     } else {
       return openTag();
@@ -126,36 +57,10 @@ XmlTag XmlTokens::openRoot() {
   }
 }
 
-bool XmlTokens::open(XmlTag& tag) {
-  while (true) {
-    skipSpace();
-    if (at_ == end_) refuse("the file ends inside of an element");
-    if (*at_ != '<') refuse("expected a tag, found " + shown(*at_));
-    const char next = at_ + 1 < end_ ? at_[1] : '\0';
-    if (next == '/') return false;
-    if (next == '?') {
-      skipPast("?>", 2, "the processing instruction");
-    } else if (next == '!') {
-      if (!rest().starts_with("<!--")) refuse("only comments may start with <! between elements");
-      skipPast("-->", 4, "the comment");
-    } else {
-      tag = openTag();
-      return true;
-    }
-  }
-}
-
-XmlTag XmlTokens::openTag() {
-  if (static_cast<std::size_t>(end_ - at_) > sizeof(std::uint64_t)) {
-    const std::uint64_t word = loadWord(at_ + 1);
-    for (const XmlElement element : byFrequency) {
-      if (!plainTags[element].matches(word)) continue;
-      const XmlTag tag{element, false, offset()};
-      at_ += 1 + plainTags[element].size;
-      return tag;
-    }
-  }
-  return openUnusualTag();
+void XmlTokens::skipBetweenElements() {
+  if (isAt("<?")) return skipPast("?>", 2, "the processing instruction");
+  if (!isAt("<!--")) refuse("only comments may start with <! between elements");
+  skipPast("-->", 4, "the comment");
 }
 
 XmlTag XmlTokens::openUnusualTag() {
@@ -167,23 +72,13 @@ XmlTag XmlTokens::openUnusualTag() {
   const bool selfClosed = tagEnd > start && tagEnd[-1] == '/';
   if (selfClosed && nameEnd == tagEnd) --nameEnd;
   const std::string_view name(start, static_cast<std::size_t>(nameEnd - start));
-  const auto* const found = std::find(tagNames.begin(), tagNames.end(), name);
-  if (found == tagNames.end()) {
+  const auto* const found = std::find(xmlTagNames.begin(), xmlTagNames.end(), name);
+  if (found == xmlTagNames.end()) {
     refuse(name.empty() ? "a tag without a name" : "unknown tag <" + std::string(name) + ">");
   }
-  const XmlTag tag{static_cast<XmlElement>(found - tagNames.begin()), selfClosed, offset()};
+  const XmlTag tag{static_cast<XmlElement>(found - xmlTagNames.begin()), selfClosed, offset()};
   at_ = tagEnd + 1;
   return tag;
-}
-
-void XmlTokens::close(XmlElement element) {
-  const PlainTag& plain = plainTags[element];
-  const bool fits = static_cast<std::size_t>(end_ - at_) >= 2 + sizeof(std::uint64_t);
-  if (fits && at_[0] == '<' && at_[1] == '/' && plain.matches(loadWord(at_ + 2))) {
-    at_ += 2 + plain.size;
-    return;
-  }
-  closeUnusually(element);
 }
 
 void XmlTokens::closeUnusually(XmlElement element) {
@@ -203,28 +98,10 @@ std::string_view XmlTokens::rawText() {
   return raw;
 }
 
-/// Moves on to a `<`, a `&` or the end; says whether all that it passed is ASCII for certain.
-bool XmlTokens::skipPlainText() {
-  std::uint64_t seen = 0;
-  while (static_cast<std::size_t>(end_ - at_) >= sizeof seen) {
-    const std::uint64_t word = loadWord(at_);
-    seen |= word;
-    const std::uint64_t marks = zeroBytes(word ^ (ones * '<')) | zeroBytes(word ^ (ones * '&'));
-    if (marks != 0) {
-      at_ += bytesBefore(marks);
-      return (seen & highBits) == 0;
-    }
-    at_ += sizeof word;
-  }
-  while (at_ < end_ && *at_ != '<' && *at_ != '&') ++at_;
-  return false;
-}
-
-std::string_view XmlTokens::text() {
-  const char* const start = at_;
-  const bool isAscii = skipPlainText();
-  const bool isPlain = at_ < end_ && *at_ == '<' && !rest().starts_with("<!");
-  if (isPlain && isAscii) return {start, static_cast<std::size_t>(at_ - start)};
+/// The text from `start` on, up to a place that it may hold entities, CDATA or other than ASCII
+/// before or at.
+std::string_view XmlTokens::unusualText(const char* start) {
+  const bool isPlain = at_ < end_ && *at_ == '<' && !isAt("<!");
   std::string_view text = isPlain ? std::string_view(start, static_cast<std::size_t>(at_ - start))
                                   : resolvedText(start);
   const std::size_t valid = validUtf8Length(text);
@@ -242,7 +119,7 @@ std::string_view XmlTokens::resolvedText(const char* start) {
     if (at_ == end_) refuse("the file ends inside of a text");
     if (*at_ == '&') {
       appendEntity();
-    } else if (!rest().starts_with("<!")) {
+    } else if (!isAt("<!")) {
       return buffer_;
     } else {
       appendCdata();
@@ -256,9 +133,9 @@ std::string_view XmlTokens::resolvedText(const char* start) {
 void XmlTokens::appendEntity() {
   constexpr std::array<std::pair<std::string_view, char>, 5> entities = {
       {{"&lt;", '<'}, {"&gt;", '>'}, {"&amp;", '&'}, {"&apos;", '\''}, {"&quot;", '"'}}};
-  if (rest().starts_with("&#")) return appendCharacterReference();
+  if (isAt("&#")) return appendCharacterReference();
   for (const auto& [name, character] : entities) {
-    if (!rest().starts_with(name)) continue;
+    if (!isAt(name)) continue;
     buffer_ += character;
     at_ += name.size();
     return;
@@ -298,7 +175,7 @@ void XmlTokens::appendCharacterReference() {
 void XmlTokens::appendCdata() {
   constexpr std::string_view opening = "<![CDATA[";
   constexpr std::string_view closing = "]]>";
-  if (!rest().starts_with(opening)) refuse("a text may hold CDATA, but no comment or declaration");
+  if (!isAt(opening)) refuse("a text may hold CDATA, but no comment or declaration");
   const std::size_t end = rest().find(closing, opening.size());
   if (end == std::string_view::npos) refuse("the CDATA section is not closed");
   buffer_ += rest().substr(opening.size(), end - opening.size());

@@ -6,30 +6,14 @@
 
 #include <cstddef>
 #include <cstdint>
-#include <cstring>
 #include <string>
 #include <string_view>
 
 #include "toolkit/property_list/refusal.hpp"
+#include "toolkit/property_list/words.hpp"
+#include "toolkit/property_list/xml_tags.hpp"
 
 namespace toolkit {
-
-enum class XmlElement : std::uint8_t {
-  plist,
-  array,
-  dictionary,
-  key,
-  string,
-  integer,
-  real,
-  date,
-  data,
-  yes,
-  no
-};
-
-/// The name in tags, such as "dict".
-std::string_view tagName(XmlElement element);
 
 struct XmlTag {
   XmlElement element;
@@ -62,23 +46,104 @@ class XmlTokens {
   [[noreturn]] void refuse(std::string reason) const { throw RefusedAt{offset(), reason}; }
 
  private:
-  std::string_view rest() const { return {at_, static_cast<std::size_t>(end_ - at_)}; }
-  void skipSpace();
+  static bool isSpace(char c);
+  std::size_t left() const { return static_cast<std::size_t>(end_ - at_); }
+  std::string_view rest() const { return {at_, left()}; }
+  bool isAt(std::string_view text) const { return rest().starts_with(text); }
+
+  bool skipToMarkup();
   void skipPast(std::string_view mark, std::size_t start, std::string_view what);
   void skipDoctype();
+  void skipBetweenElements();
   XmlTag openTag();
   XmlTag openUnusualTag();
   void closeUnusually(XmlElement element);
-  std::string_view resolvedText(const char* start);
   bool skipPlainText();
+  std::string_view unusualText(const char* start);
+  std::string_view resolvedText(const char* start);
   void appendEntity();
   void appendCharacterReference();
   void appendCdata();
+  [[noreturn]] void refuseNoMarkup(std::string_view expected) const;
 
   const char* begin_;
   const char* at_;
   const char* end_;
   std::string buffer_;  // of text that does not stand in the file as it is
 };
+
+// What runs once for each element of a file is defined here, to become part of its caller's loop.
+
+inline bool XmlTokens::isSpace(char c) {
+  constexpr std::uint64_t spaces = 1ULL << ' ' | 1ULL << '\t' | 1ULL << '\n' | 1ULL << '\r';
+  const auto byte = static_cast<unsigned char>(c);
+  return byte <= ' ' && (spaces >> byte & 1) != 0;
+}
+
+/// Skips white space; whether a `<` with something behind it follows.
+inline bool XmlTokens::skipToMarkup() {
+  while (at_ < end_ && isSpace(*at_)) ++at_;
+  return left() > 1 && *at_ == '<';
+}
+
+inline bool XmlTokens::open(XmlTag& tag) {
+  while (true) {
+    if (!skipToMarkup()) refuseNoMarkup("a tag");
+    if (at_[1] == '/') return false;
+    if (at_[1] != '!' && at_[1] != '?') break;
+    skipBetweenElements();
+  }
+  tag = openTag();
+  return true;
+}
+
+inline XmlTag XmlTokens::openTag() {
+  if (left() > words::size) {
+    const std::uint64_t word = words::load(at_ + 1);
+    for (const PlainTag& plain : plainTags) {
+      if (!plain.matches(word)) continue;
+      const XmlTag tag{plain.element, plain.selfClosed, offset()};
+      at_ += 1 + plain.size;
+      return tag;
+    }
+  }
+  return openUnusualTag();
+}
+
+inline void XmlTokens::close(XmlElement element) {
+  const PlainTag& plain = plainClosingTags[static_cast<std::size_t>(element)];
+  if (left() >= 2 + words::size && at_[0] == '<' && at_[1] == '/' &&
+      plain.matches(words::load(at_ + 2))) {
+    at_ += 2 + plain.size;
+  } else {
+    closeUnusually(element);
+  }
+}
+
+/// Moves on to a `<`, a `&` or the end; whether all that it passed is ASCII for certain.
+inline bool XmlTokens::skipPlainText() {
+  std::uint64_t seen = 0;
+  while (left() >= words::size) {
+    const std::uint64_t word = words::load(at_);
+    seen |= word;
+    const std::uint64_t ends = words::bytesThatAre('<', word) | words::bytesThatAre('&', word);
+    if (ends != 0) {
+      at_ += words::charactersBefore(ends);
+      return (seen & words::highBits) == 0;
+    }
+    at_ += words::size;
+  }
+  while (at_ < end_ && *at_ != '<' && *at_ != '&') ++at_;
+  return false;
+}
+
+inline std::string_view XmlTokens::text() {
+  const char* const start = at_;
+  const bool isAscii = skipPlainText();
+  if (isAscii && *at_ == '<' && left() > 1 && at_[1] != '!') {
+    return {start, static_cast<std::size_t>(at_ - start)};
+  }
+  return unusualText(start);
+}
 
 }  // namespace toolkit

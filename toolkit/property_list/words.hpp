@@ -1,0 +1,40 @@
+// Eight characters at a time, in one 64-bit word.
+#pragma once
+
+#include <bit>
+#include <cstddef>
+#include <cstdint>
+#include <cstring>
+
+namespace toolkit::words {
+
+constexpr std::size_t size = sizeof(std::uint64_t);
+constexpr std::uint64_t ones = 0x0101010101010101;
+constexpr std::uint64_t highBits = 0x80 * ones;
+
+/// The word that starts at `characters`, eight of which there must be.
+inline std::uint64_t load(const char* characters) {
+  std::uint64_t word = 0;
+  std::memcpy(&word, characters, sizeof word);
+  return word;
+}
+
+/// Sets the high bit of each byte that is zero, and nothing else.
+inline std::uint64_t zeroBytes(std::uint64_t word) {
+  return ~(((word & ~highBits) + ~highBits) | word | ~highBits);
+}
+
+/// Sets the high bit of each byte that is `c`, and nothing else.
+inline std::uint64_t bytesThatAre(char c, std::uint64_t word) {
+  return zeroBytes(word ^ (ones * static_cast<unsigned char>(c)));
+}
+
+/// How many characters stand before the first whose high bit is set.
+inline std::size_t charactersBefore(std::uint64_t marks) {
+  const bool firstIsLowest = std::endian::native == std::endian::little;
+  return static_cast<std::size_t>(firstIsLowest ? std::countr_zero(marks)
+                                                : std::countl_zero(marks)) /
+         8;
+}
+
+}  // namespace toolkit::words
