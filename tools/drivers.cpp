@@ -1,7 +1,12 @@
 // The toolkits that this build of the tool has.
 #include "tools/drivers.hpp"
 
+#include <string>
+
 #include "toolkit/memory/memory_driver.hpp"
+#include "tools/failure.hpp"
+#include "tools/scenario/near_miss.hpp"
+#include "tools/scenario/vocabulary.hpp"
 
 namespace tools {
 namespace {
@@ -28,6 +33,14 @@ std::unique_ptr<toolkit::TestDriver> makeDriver(std::string_view name) {
     if (driver.name == name) return driver.make();
   }
   return nullptr;
+}
+
+std::unique_ptr<toolkit::TestDriver> requireDriver(std::string_view name) {
+  if (auto driver = makeDriver(name)) return driver;
+  const auto known = driverNames();
+  throw Failure(ExitStatus::badInput, "unknown toolkit " + std::string(name) + "; this build has " +
+                                          scenario::enumerate({known.begin(), known.end()}) +
+                                          scenario::didYouMean(name, known));
 }
 
 }  // namespace tools

@@ -15,4 +15,7 @@ std::vector<std::string_view> driverNames();
 /// A driver with a toolkit of its own; null when this build has none of that name.
 std::unique_ptr<toolkit::TestDriver> makeDriver(std::string_view name);
 
+/// The same, but a Failure where that gives null.
+std::unique_ptr<toolkit::TestDriver> requireDriver(std::string_view name);
+
 }  // namespace tools

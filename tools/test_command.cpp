@@ -12,9 +12,9 @@
 #include "tools/drivers.hpp"
 #include "tools/failure.hpp"
 #include "tools/scenario/junit.hpp"
-#include "tools/scenario/near_miss.hpp"
 #include "tools/scenario/runner.hpp"
 #include "tools/scenario/scenario_files.hpp"
+#include "tools/text_layout.hpp"
 
 namespace tools {
 namespace {
@@ -24,14 +24,6 @@ using scenario::Report;
 using scenario::Scenario;
 using scenario::Verdict;
 
-void requireToolkit(const std::string& name) {
-  const auto known = driverNames();
-  if (std::find(known.begin(), known.end(), name) != known.end()) return;
-  throw Failure(ExitStatus::badInput, "unknown toolkit " + name + "; this build has " +
-                                          scenario::enumerate({known.begin(), known.end()}) +
-                                          scenario::didYouMean(name, known));
-}
-
 /// Opened before anything runs, so that a report that cannot be written is no surprise at the end.
 std::ofstream openReport(const std::string& path) {
   std::ofstream stream(path, std::ios::binary);
@@ -39,13 +31,17 @@ std::ofstream openReport(const std::string& path) {
   return stream;
 }
 
+std::string place(const std::string& file, int line) {
+  return oneLine(file) + ":" + std::to_string(line) + ": ";
+}
+
 void print(std::ostream& out, const Report& report) {
   if (report.verdict != Verdict::failed) return;
-  out << report.file << ':' << report.failedLine << ": " << report.problem << "\n    "
-      << report.statement << '\n';
+  out << place(report.file, report.failedLine) << oneLine(report.problem) << "\n    "
+      << oneLine(report.statement) << '\n';
   // A title that is the file's name adds nothing.
   if (report.title != std::filesystem::path(report.file).filename().string()) {
-    out << "    in " << report.file << ':' << report.line << ": " << report.title << '\n';
+    out << "    in " << place(report.file, report.line) << oneLine(report.title) << '\n';
   }
 }
 
@@ -80,7 +76,7 @@ void requireAny(const std::vector<LoadedFile>& files, const std::string& filter)
 
 void list(const std::vector<LoadedFile>& files, const std::string& filter, std::ostream& out) {
   forEachChosen(files, filter, [&](const LoadedFile& file, const Scenario& one) {
-    out << file.path << ':' << one.line << ": " << scenario::titleOf(file, one) << '\n';
+    out << place(file.path, one.line) << oneLine(scenario::titleOf(file, one)) << '\n';
   });
 }
 
@@ -90,12 +86,12 @@ std::vector<Report> run(const TestOptions& options, const std::vector<LoadedFile
                                 [&](const std::string& file, const scenario::Statement& statement,
                                     const std::string& outcome) {
                                   if (!options.verbose) return;
-                                  out << file << ':' << statement.at.line << ": "
-                                      << statement.source << "  [" << outcome << "]\n";
+                                  out << place(file, statement.at.line) << oneLine(statement.source)
+                                      << "  [" << oneLine(outcome) << "]\n";
                                 }};
   std::vector<Report> reports;
   forEachChosen(files, options.filter, [&](const LoadedFile& file, const Scenario& one) {
-    if (options.verbose) out << "# " << scenario::titleOf(file, one) << '\n';
+    if (options.verbose) out << "# " << oneLine(scenario::titleOf(file, one)) << '\n';
     reports.push_back(runner.run(file, one));
     print(out, reports.back());
   });
@@ -105,9 +101,9 @@ std::vector<Report> run(const TestOptions& options, const std::vector<LoadedFile
 }  // namespace
 
 int runTests(const TestOptions& options, std::ostream& out, std::ostream& problems) {
-  requireToolkit(options.toolkit);
+  requireDriver(options.toolkit);  // else it would be missed only where something runs
   const auto read = scenario::readScenarios(options.paths);
-  for (const auto& problem : read.problems) problems << problem << '\n';
+  for (const auto& problem : read.problems) problems << oneLine(problem) << '\n';
   if (!read.problems.empty()) return static_cast<int>(ExitStatus::badInput);
   requireAny(read.files, options.filter);
   if (options.list) {

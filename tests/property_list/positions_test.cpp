@@ -38,7 +38,7 @@ TEST(Refusals, SayWhatAndWhere) {
        "line 1, column 16: data is written in base64, in ASCII "
        "(read as XML property list)"},
       {"<array><true/>",
-       "line 1, column 15: the file ends inside of an element "
+       "line 1, column 15: expected a tag, found the end of the file "
        "(read as XML property list)"},
       {"<array></dict>", "line 1, column 8: expected </array> (read as XML property list)"},
       {"<?xml encoding='bogus'?><true/>",

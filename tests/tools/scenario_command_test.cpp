@@ -145,6 +145,13 @@ TEST_F(ScenarioCommand, verboselyEveryStatementIsPrinted) {
             "1 passed, 0 failed\n");
 }
 
+TEST_F(ScenarioCommand, whatWouldDisturbATerminalIsWrittenOut) {
+  write("a.walk", "engine\nexpect state \"\u009b\"\nscenario x\nengine\n");
+  EXPECT_EQ(run({"test", "a.walk"}).out,
+            "a.walk:2: expected \"\\u{9b}\", got \"0\"\n    expect state \"\\u{9b}\"\n"
+            "    in a.walk:3: x\n0 passed, 1 failed\n");
+}
+
 TEST_F(ScenarioCommand, badUsageIsOneLine) {
   write("a.walk", "engine\n");
   const struct {

@@ -1,13 +1,13 @@
 // Binary property lists.
 #include <algorithm>
 #include <bit>
-#include <span>
 #include <string>
 
 #include "toolkit/property_list/binary_layout.hpp"
 #include "toolkit/property_list/collections.hpp"
 #include "toolkit/property_list/format_readers.hpp"
 #include "toolkit/property_list/key_index.hpp"
+#include "toolkit/property_list/pending_values.hpp"
 #include "toolkit/property_list/scalars.hpp"
 #include "toolkit/property_list/utf8.hpp"
 #include "toolkit/property_list/walk.hpp"
@@ -69,7 +69,7 @@ void checkTrailer(const Trailer& trailer, std::string_view bytes) {
 class BinaryReader {
  public:
   BinaryReader(std::string_view bytes, Document& document, ValueOffsets* offsets)
-      : trailer_(readTrailer(bytes)), document_(document), offsets_(offsets) {
+      : trailer_(readTrailer(bytes)), document_(document), offsets_(offsets), pending_(document) {
     checkTrailer(trailer_, bytes);
     objects_ = bytes.substr(0, trailer_.tableOffset);
     table_ = bytes.substr(trailer_.tableOffset, trailer_.objectCount * trailer_.offsetSize);
@@ -106,10 +106,10 @@ class BinaryReader {
   std::string_view table_;
   Document& document_;
   ValueOffsets* offsets_;
-  std::size_t budget_;           // how many bytes of content may still be read
-  std::vector<Value*> values_;   // by index, as far as they are read
-  std::vector<Value*> pending_;  // what the open containers hold so far, the outermost's first
-  std::string buffer_;           // of strings that do not stand in the file as they are
+  std::size_t budget_;          // how many bytes of content may still be read
+  std::vector<Value*> values_;  // by index, as far as they are read
+  PendingValues pending_;
+  std::string buffer_;  // of strings that do not stand in the file as they are
 };
 
 std::uint64_t BinaryReader::offsetOf(std::uint64_t index) const {
@@ -274,47 +274,40 @@ Value* BinaryReader::reference(std::string_view references, std::size_t index, s
 
 Value* BinaryReader::array(std::size_t offset, std::size_t depth) {
   const std::string_view references = contentOf(offset, trailer_.referenceSize);
-  const std::size_t first = pending_.size();
   const std::size_t count = references.size() / trailer_.referenceSize;
-  for (std::size_t i = 0; i < count; ++i) pending_.push_back(reference(references, i, depth + 1));
-  Value* result = Array::make(document_, std::span(pending_).subspan(first));
-  pending_.resize(first);
-  return result;
+  const auto array = pending_.open();
+  for (std::size_t i = 0; i < count; ++i) pending_.add(reference(references, i, depth + 1));
+  return pending_.closeArray(array);
 }
 
 Value* BinaryReader::set(std::size_t offset, std::size_t depth) {
   const std::string_view references = contentOf(offset, trailer_.referenceSize);
-  const std::size_t first = pending_.size();
   const std::size_t count = references.size() / trailer_.referenceSize;
+  const auto set = pending_.open();
   KeyIndex index(count, std::pmr::new_delete_resource());
   for (std::size_t i = 0; i < count; ++i) {
     Value* element = reference(references, i, depth + 1);
     const std::uint64_t hash = hashOfKey(*element);
-    const auto isElement = [&](std::size_t at) { return sameKey(*pending_[first + at], *element); };
+    const auto isElement = [&](std::size_t at) { return sameKey(*pending_.in(set)[at], *element); };
     if (index.find(hash, isElement) != KeyIndex::none) continue;
     index.append(hash);
-    pending_.push_back(element);
+    pending_.add(element);
   }
-  Value* result = Set::make(document_, std::span(pending_).subspan(first));
-  pending_.resize(first);
-  return result;
+  return pending_.closeSet(set);
 }
 
 Value* BinaryReader::dictionary(std::size_t offset, std::size_t depth) {
   // All keys stand first, then all values.
   const std::string_view references = contentOf(offset, 2 * std::size_t{trailer_.referenceSize});
-  const std::size_t first = pending_.size();
   const std::size_t count = references.size() / trailer_.referenceSize / 2;
+  const auto entries = pending_.open();
   for (std::size_t i = 0; i < count; ++i) {
     Value* key = reference(references, i, depth + 1);
     if (isCollection(*key)) refuse(offset, "a collection as the key of a dictionary");
-    pending_.push_back(key);
-    pending_.push_back(reference(references, count + i, depth + 1));
+    pending_.addKey(key, entries);
+    pending_.add(reference(references, count + i, depth + 1));
   }
-  Value* result = Dictionary::make(document_, std::span(pending_).subspan(first),
-                                   Dictionary::Duplicates::firstWins);
-  pending_.resize(first);
-  return result;
+  return pending_.closeDictionary(entries, Dictionary::Duplicates::firstWins);
 }
 
 }  // namespace

@@ -9,9 +9,6 @@
 namespace toolkit {
 namespace {
 
-// Up to here looking at every key is faster than hashing the one that is looked up.
-constexpr std::size_t mostWithoutIndex = 8;
-
 bool isText(const Value& key, std::string_view text) {
   return key.kind() == Value::Kind::string && static_cast<const String&>(key).text() == text;
 }
@@ -123,16 +120,18 @@ Dictionary::Dictionary(std::span<Entry> entries, Mutability mutability)
     : Collection(Kind::dictionary, mutability) {
   entries_.reserve(entries.size());
   for (Entry& entry : entries) {
-    const std::size_t at = positionOf(*entry.key);
+    const std::uint64_t hash = hashOfKey(*entry.key);
+    const std::size_t at = positionOf(*entry.key, hash);
     if (at == KeyIndex::none) {
-      append(std::move(entry));
+      append(std::move(entry), hash);
     } else {
       entries_[at].value = std::move(entry.value);
     }
   }
 }
 
-Dictionary::Dictionary(std::span<Value* const> keysAndValues, Duplicates duplicates,
+Dictionary::Dictionary(std::span<Value* const> keysAndValues,
+                       std::span<const std::uint64_t> laterHashes, Duplicates duplicates,
                        Document* document)
     : Collection(Kind::dictionary, Mutability::immutable), entries_(document) {
   // All memory is asked for before the first reference is there, which no destructor may see.
@@ -141,12 +140,15 @@ Dictionary::Dictionary(std::span<Value* const> keysAndValues, Duplicates duplica
   if (count > mostWithoutIndex) {
     index_.reset(new (document->place(sizeof(KeyIndex)).memory) KeyIndex(count, document));
   }
-  for (std::size_t i = 0; i < keysAndValues.size(); i += 2) {
-    Value* key = keysAndValues[i];
-    Value* value = keysAndValues[i + 1];
-    const std::size_t at = positionOf(*key);
+  for (std::size_t i = 0; i < count; ++i) {
+    Value* key = keysAndValues[2 * i];
+    Value* value = keysAndValues[2 * i + 1];
+    const std::uint64_t hash = i >= mostWithoutIndex ? laterHashes[i - mostWithoutIndex]
+                               : index_              ? hashOfKey(*key)
+                                                     : 0;
+    const std::size_t at = positionOf(*key, hash);
     if (at == KeyIndex::none) {
-      append({uncounted(key), uncounted(value)});
+      append({uncounted(key), uncounted(value)}, hash);
     } else if (duplicates == Duplicates::lastWins) {
       // Not assigned: that would give back a count that the earlier value never took.
       std::construct_at(&entries_[at].value, uncounted(value));
@@ -167,8 +169,8 @@ ValueRef<Dictionary> Dictionary::make(std::vector<Entry> entries, Mutability mut
 }
 
 Dictionary* Dictionary::make(Document& document, std::span<Value* const> keysAndValues,
-                             Duplicates duplicates) {
-  return makeIn<Dictionary>(document, 0, keysAndValues, duplicates, &document);
+                             std::span<const std::uint64_t> laterHashes, Duplicates duplicates) {
+  return makeIn<Dictionary>(document, 0, keysAndValues, laterHashes, duplicates, &document);
 }
 
 ValueRef<Dictionary> Dictionary::copy(Mutability mutability) const {
@@ -177,30 +179,30 @@ ValueRef<Dictionary> Dictionary::copy(Mutability mutability) const {
 
 std::size_t Dictionary::count() const { return entries_.size(); }
 
-template <class Hash, class IsKey>
-std::size_t Dictionary::positionWhere(Hash hash, IsKey isKey) const {
+/// `hash` counts only where there is an index.
+template <class IsKey>
+std::size_t Dictionary::positionWhere(std::uint64_t hash, IsKey isKey) const {
   const auto isKeyAt = [&](std::size_t at) { return isKey(*entries_[at].key); };
-  if (index_) return index_->find(hash(), isKeyAt);
+  if (index_) return index_->find(hash, isKeyAt);
   for (std::size_t at = 0; at < entries_.size(); ++at) {
     if (isKeyAt(at)) return at;
   }
   return KeyIndex::none;
 }
 
-std::size_t Dictionary::positionOf(std::string_view key) const {
-  return positionWhere([&] { return hashOf(key); },
-                       [&](const Value& other) { return isText(other, key); });
+std::size_t Dictionary::positionOf(std::string_view key, std::uint64_t hash) const {
+  return positionWhere(hash, [&](const Value& other) { return isText(other, key); });
 }
 
-std::size_t Dictionary::positionOf(const Value& key) const {
-  return positionWhere([&] { return hashOfKey(key); },
-                       [&](const Value& other) { return sameKey(other, key); });
+std::size_t Dictionary::positionOf(const Value& key, std::uint64_t hash) const {
+  return positionWhere(hash, [&](const Value& other) { return sameKey(other, key); });
 }
 
-void Dictionary::append(Entry&& entry) {
-  if (index_ ? index_->isFull() : entries_.size() == mostWithoutIndex) growIndex();
+void Dictionary::append(Entry&& entry, std::uint64_t hash) {
+  const bool hadIndex = index_ != nullptr;
+  if (hadIndex ? index_->isFull() : entries_.size() == mostWithoutIndex) growIndex();
   entries_.push_back(std::move(entry));
-  if (index_) index_->append(hashOfKey(*entries_.back().key));
+  if (index_) index_->append(hadIndex ? hash : hashOfKey(*entries_.back().key));
 }
 
 void Dictionary::growIndex() {
@@ -210,7 +212,7 @@ void Dictionary::growIndex() {
 }
 
 ValueRef<> Dictionary::objectForKey(std::string_view key) const {
-  const std::size_t at = positionOf(key);
+  const std::size_t at = positionOf(key, hashFor(key));
   return at == KeyIndex::none ? nullptr : entries_[at].value;
 }
 
@@ -226,9 +228,10 @@ std::vector<std::string> Dictionary::allKeys() const {
 void Dictionary::setObject(const ValueRef<>& value, std::string_view key) {
   if (!canChange("setObject:forKey:")) return;
   requirePresent(value, "setObject:forKey:");
-  const std::size_t at = positionOf(key);
+  const std::uint64_t hash = hashFor(key);
+  const std::size_t at = positionOf(key, hash);
   if (at == KeyIndex::none) {
-    append({String::make(key), value});
+    append({String::make(key), value}, hash);
   } else {
     entries_[at].value = value;
   }
@@ -236,7 +239,7 @@ void Dictionary::setObject(const ValueRef<>& value, std::string_view key) {
 
 void Dictionary::removeObjectForKey(std::string_view key) {
   if (!canChange("removeObjectForKey:")) return;
-  const std::size_t at = positionOf(key);
+  const std::size_t at = positionOf(key, hashFor(key));
   if (at == KeyIndex::none) return;
   if (index_) {
     index_->remove(at, [&](std::size_t position) { return hashOfKey(*entries_[position].key); });

@@ -96,10 +96,13 @@ class Dictionary final : public Collection {
   /// Of a key that comes more than once the last value counts.
   static ValueRef<Dictionary> make(std::vector<Entry> entries = {},
                                    Mutability mutability = Mutability::changeable);
+  /// Up to here looking at every key is faster than hashing the one that is looked up.
+  static constexpr std::size_t mostWithoutIndex = 8;
   /// As an immutable part of `document`, like its keys and values, which alternate in
-  /// `keysAndValues`; the caller gets no count.
+  /// `keysAndValues`; the caller gets no count. `laterHashes` are those of the keys after the first
+  /// `mostWithoutIndex` of them, taken while each was at hand: later a large file's keys are cold.
   static Dictionary* make(Document& document, std::span<Value* const> keysAndValues,
-                          Duplicates duplicates);
+                          std::span<const std::uint64_t> laterHashes, Duplicates duplicates);
 
   /// The entries in order. Valid until the dictionary changes.
   std::span<const Entry> entries() const { return entries_; }
@@ -121,14 +124,16 @@ class Dictionary final : public Collection {
   friend class Value;
   explicit Dictionary(Kind kind) : Collection(kind, Mutability::ignored) {}
   Dictionary(std::span<Entry> entries, Mutability mutability);
-  Dictionary(std::span<Value* const> keysAndValues, Duplicates duplicates, Document* document);
+  Dictionary(std::span<Value* const> keysAndValues, std::span<const std::uint64_t> laterHashes,
+             Duplicates duplicates, Document* document);
   Dictionary(const Dictionary& other, Mutability mutability);
 
-  template <class Hash, class IsKey>
-  std::size_t positionWhere(Hash hash, IsKey isKey) const;
-  std::size_t positionOf(std::string_view key) const;
-  std::size_t positionOf(const Value& key) const;
-  void append(Entry&& entry);
+  template <class IsKey>
+  std::size_t positionWhere(std::uint64_t hash, IsKey isKey) const;
+  std::size_t positionOf(const Value& key, std::uint64_t hash) const;
+  std::size_t positionOf(std::string_view key, std::uint64_t hash) const;
+  std::uint64_t hashFor(std::string_view key) const { return index_ ? hashOf(key) : 0; }
+  void append(Entry&& entry, std::uint64_t hash);
   void growIndex();
 
   std::pmr::vector<Entry> entries_{std::pmr::new_delete_resource()};

@@ -159,14 +159,14 @@ bool sameKey(const Value& a, const Value& b) {
 }
 
 KeyIndex::KeyIndex(std::size_t count, std::pmr::memory_resource* memory)
-    : slots_(std::bit_ceil(2 * count), free, memory) {
+    : slots_(std::bit_ceil(count + count / 3 + 4), memory) {
   if (count >= free) throw std::length_error("too many keys in a dictionary");
 }
 
 void KeyIndex::append(std::uint64_t hash) {
-  std::size_t slot = home(hash);
-  while (slots_[slot] != free) slot = next(slot);
-  slots_[slot] = static_cast<Position>(used_++);
+  std::size_t at = home(hash);
+  while (slots_[at].position != free) at = next(at);
+  slots_[at] = {static_cast<Position>(used_++), tagOf(hash)};
 }
 
 }  // namespace toolkit

@@ -38,13 +38,15 @@ class KeyIndex {
   /// The position of the key with that hash for which `isKeyAt(position)` holds, or `none`.
   template <class IsKeyAt>
   std::size_t find(std::uint64_t hash, IsKeyAt isKeyAt) const {
-    for (std::size_t slot = home(hash); slots_[slot] != free; slot = next(slot)) {
-      if (isKeyAt(std::size_t{slots_[slot]})) return slots_[slot];
+    for (std::size_t at = home(hash); slots_[at].position != free; at = next(at)) {
+      if (slots_[at].tag == tagOf(hash) && isKeyAt(std::size_t{slots_[at].position})) {
+        return slots_[at].position;
+      }
     }
     return none;
   }
 
-  bool isFull() const { return used_ >= slots_.size() / 2; }
+  bool isFull() const { return used_ >= slots_.size() / 4 * 3; }
   /// Takes in a key that is not there yet, whose position is one after the last. Not when full.
   void append(std::uint64_t hash);
   /// Takes a key out; the positions after it move down by one. `hashAt(position)` is the hash of a
@@ -55,28 +57,35 @@ class KeyIndex {
  private:
   using Position = std::uint32_t;
   static constexpr Position free = std::numeric_limits<Position>::max();
-  std::size_t home(std::uint64_t hash) const { return hash & (slots_.size() - 1); }
-  std::size_t next(std::size_t slot) const { return (slot + 1) & (slots_.size() - 1); }
 
-  std::pmr::vector<Position> slots_;  // a power of two of them, half at most in use
+  struct Slot {
+    Position position = free;
+    std::uint32_t tag = 0;  // other bits of the hash, so that few keys need to be looked at
+  };
+
+  static std::uint32_t tagOf(std::uint64_t hash) { return static_cast<std::uint32_t>(hash >> 32); }
+  std::size_t home(std::uint64_t hash) const { return hash & (slots_.size() - 1); }
+  std::size_t next(std::size_t at) const { return (at + 1) & (slots_.size() - 1); }
+
+  std::pmr::vector<Slot> slots_;  // a power of two of them, some always free
   std::size_t used_ = 0;
 };
 
 template <class HashAt>
 void KeyIndex::remove(std::size_t position, HashAt hashAt) {
   std::size_t gap = home(hashAt(position));
-  while (slots_[gap] != position) gap = next(gap);
+  while (slots_[gap].position != position) gap = next(gap);
   // A key that a look-up would reach only across the gap moves into it, which leaves the next gap.
-  for (std::size_t slot = next(gap); slots_[slot] != free; slot = next(slot)) {
+  for (std::size_t at = next(gap); slots_[at].position != free; at = next(at)) {
     const std::size_t mask = slots_.size() - 1;
-    const std::size_t wanted = home(hashAt(std::size_t{slots_[slot]}));
-    if (((slot - wanted) & mask) < ((slot - gap) & mask)) continue;
-    slots_[gap] = slots_[slot];
-    gap = slot;
+    const std::size_t wanted = home(hashAt(std::size_t{slots_[at].position}));
+    if (((at - wanted) & mask) < ((at - gap) & mask)) continue;
+    slots_[gap] = slots_[at];
+    gap = at;
   }
-  slots_[gap] = free;
-  for (Position& other : slots_) {
-    if (other != free && other > position) --other;
+  slots_[gap] = {};
+  for (Slot& slot : slots_) {
+    if (slot.position != free && slot.position > position) --slot.position;
   }
   --used_;
 }

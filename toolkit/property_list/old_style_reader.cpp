@@ -1,10 +1,10 @@
 // Old-style property lists, and the strings files that are dictionaries without braces.
-#include <span>
 #include <string>
 
 #include "toolkit/property_list/collections.hpp"
 #include "toolkit/property_list/format_readers.hpp"
 #include "toolkit/property_list/old_style_tokens.hpp"
+#include "toolkit/property_list/pending_values.hpp"
 #include "toolkit/property_list/scalars.hpp"
 #include "toolkit/property_list/utf8.hpp"
 
@@ -14,7 +14,7 @@ namespace {
 class OldStyleReader {
  public:
   OldStyleReader(std::string_view text, Document& document, ValueOffsets* offsets)
-      : tokens_(text), document_(document), offsets_(offsets) {}
+      : tokens_(text), document_(document), offsets_(offsets), pending_(document) {}
 
   Value* root();
 
@@ -30,7 +30,7 @@ class OldStyleReader {
   OldStyleTokens tokens_;
   Document& document_;
   ValueOffsets* offsets_;
-  std::vector<Value*> pending_;  // what the open containers hold so far, the outermost's first
+  PendingValues pending_;
 };
 
 Value* OldStyleReader::root() {
@@ -78,39 +78,34 @@ Value* OldStyleReader::content(std::size_t depth) {
 Value* OldStyleReader::string() { return String::make(document_, tokens_.string()); }
 
 Value* OldStyleReader::array(std::size_t depth) {
-  const std::size_t first = pending_.size();
+  const auto array = pending_.open();
   do {
     // Nothing needs to follow a comma.
     if (!tokens_.skipToToken() || !isAtValue()) break;
-    pending_.push_back(value(depth + 1));
+    pending_.add(value(depth + 1));
   } while (tokens_.take(','));
   if (!tokens_.take(')')) tokens_.refuseUnexpected("',' or ')'");
-  Value* result = Array::make(document_, std::span(pending_).subspan(first));
-  pending_.resize(first);
-  return result;
+  return pending_.closeArray(array);
 }
 
 /// `key = value;` and `key;`, which is its own value, as long as keys follow.
 Value* OldStyleReader::entries(std::size_t depth) {
-  const std::size_t first = pending_.size();
+  const auto dictionary = pending_.open();
   while (tokens_.skipToToken() && tokens_.isAtString()) {
     const std::size_t offset = tokens_.offset();
     Value* key = noted(string(), offset);
-    pending_.push_back(key);
+    pending_.addKey(key, dictionary);
     tokens_.skipToToken();
     if (tokens_.take('=')) {
-      pending_.push_back(value(depth + 1));
+      pending_.add(value(depth + 1));
     } else if (tokens_.peek() == ';') {
-      pending_.push_back(key);
+      pending_.add(key);
     } else {
       tokens_.refuseUnexpected("'=' or ';' after the key");
     }
     if (!tokens_.take(';')) tokens_.refuseUnexpected("';'");
   }
-  Value* result = Dictionary::make(document_, std::span(pending_).subspan(first),
-                                   Dictionary::Duplicates::lastWins);
-  pending_.resize(first);
-  return result;
+  return pending_.closeDictionary(dictionary, Dictionary::Duplicates::lastWins);
 }
 
 }  // namespace

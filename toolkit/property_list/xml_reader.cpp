@@ -1,7 +1,6 @@
 // XML property lists: what their elements mean.
 #include <bit>
 #include <limits>
-#include <span>
 #include <string>
 
 #include "toolkit/property_list/base64.hpp"
@@ -10,6 +9,7 @@
 #include "toolkit/property_list/format_readers.hpp"
 #include "toolkit/property_list/hexadecimal.hpp"
 #include "toolkit/property_list/number_conversion.hpp"
+#include "toolkit/property_list/pending_values.hpp"
 #include "toolkit/property_list/scalars.hpp"
 #include "toolkit/property_list/xml_tokens.hpp"
 
@@ -19,7 +19,7 @@ namespace {
 class XmlReader {
  public:
   XmlReader(std::string_view text, Document& document, ValueOffsets* offsets)
-      : tokens_(text), document_(document), offsets_(offsets) {}
+      : tokens_(text), document_(document), offsets_(offsets), pending_(document) {}
 
   Value* root() {
     const XmlTag tag = tokens_.openRoot();
@@ -47,7 +47,7 @@ class XmlReader {
   XmlTokens tokens_;
   Document& document_;
   ValueOffsets* offsets_;
-  std::vector<Value*> pending_;  // what the open containers hold so far, the outermost's first
+  PendingValues pending_;
   std::size_t depth_ = 0;
 };
 
@@ -119,16 +119,14 @@ Value* XmlReader::boolean(const XmlTag& tag) {
 }
 
 Value* XmlReader::array(const XmlTag& tag) {
-  if (tag.selfClosed) return Array::make(document_, std::span<Value* const>());
+  const auto array = pending_.open();
+  if (tag.selfClosed) return pending_.closeArray(array);
   enterContainer();
-  const std::size_t first = pending_.size();
   XmlTag element;
-  while (tokens_.open(element)) pending_.push_back(value(element));
+  while (tokens_.open(element)) pending_.add(value(element));
   tokens_.close(XmlElement::array);
   --depth_;
-  Value* result = Array::make(document_, std::span(pending_).subspan(first));
-  pending_.resize(first);
-  return result;
+  return pending_.closeArray(array);
 }
 
 /// What a keyed archive's reference is in XML: a dictionary of nothing but an integer `CF$UID`.
@@ -143,29 +141,28 @@ const Number* archiverUid(const Dictionary& dictionary) {
 
 Value* XmlReader::dictionary(const XmlTag& tag) {
   constexpr auto duplicates = Dictionary::Duplicates::lastWins;
-  if (tag.selfClosed) return Dictionary::make(document_, {}, duplicates);
+  const auto entries = pending_.open();
+  if (tag.selfClosed) return pending_.closeDictionary(entries, duplicates);
   enterContainer();
-  const std::size_t first = pending_.size();
   XmlTag element;
   while (tokens_.open(element)) {
     if (element.element != XmlElement::key) {
       throw RefusedAt{element.offset, "expected <key> or </dict>, found <" +
                                           std::string(tagName(element.element)) + ">"};
     }
-    pending_.push_back(value(element));
+    Value* key = value(element);
+    pending_.addKey(key, entries);
     if (!tokens_.open(element)) {
-      throw RefusedAt{element.offset,
-                      "the key \"" + pending_.back()->description() + "\" has no value"};
+      throw RefusedAt{element.offset, "the key \"" + key->description() + "\" has no value"};
     }
-    pending_.push_back(value(element));
+    pending_.add(value(element));
   }
   tokens_.close(XmlElement::dictionary);
   --depth_;
-  auto* result = Dictionary::make(document_, std::span(pending_).subspan(first), duplicates);
-  pending_.resize(first);
+  Dictionary* result = pending_.closeDictionary(entries, duplicates);
   const Number* uid = archiverUid(*result);
-  return uid ? static_cast<Value*>(Uid::make(document_, static_cast<std::uint32_t>(uid->bits())))
-             : result;
+  if (!uid) return result;
+  return Uid::make(document_, static_cast<std::uint32_t>(uid->bits()));
 }
 
 Value* XmlReader::onlyValueIn(const XmlTag& plist) {
@@ -210,13 +207,15 @@ Value* XmlReader::integer() {
 Value* XmlReader::real() {
   const std::size_t start = tokens_.offset();
   const std::string_view text = tokens_.text();
-  std::optional<double> number = namedReal(text);
-  if (!number) {
-    const std::string_view decimal = withoutLeadingSpace(text);
-    if (decimal.empty() || decimalLength(decimal) != decimal.size()) {
-      throw RefusedAt{start, "\"" + std::string(text) + "\" is not a decimal number"};
-    }
+  const std::string_view decimal = withoutLeadingSpace(text);
+  std::optional<double> number;
+  if (!decimal.empty() && decimalLength(decimal) == decimal.size()) {
     number = decimalValue(decimal);
+  } else {
+    number = namedReal(text);
+  }
+  if (!number) {
+    throw RefusedAt{start, "\"" + std::string(text) + "\" is not a decimal number"};
   }
   return Number::make(document_, Number::Type::real64, std::bit_cast<std::uint64_t>(*number));
 }

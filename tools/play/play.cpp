@@ -62,14 +62,6 @@ void checkStart(const InputFile& file, std::string key) {
   }
 }
 
-std::unique_ptr<toolkit::TestDriver> requireDriver(const std::string& name) {
-  if (auto driver = makeDriver(name)) return driver;
-  const auto known = driverNames();
-  throw Failure(ExitStatus::badInput, "unknown toolkit " + printable(name) + "; this build has " +
-                                          scenario::enumerate({known.begin(), known.end()}) +
-                                          scenario::didYouMean(name, known));
-}
-
 void checkDirectory(const std::string& path) {
   std::error_code error;
   if (fs::is_directory(path, error)) return;

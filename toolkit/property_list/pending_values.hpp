@@ -1,0 +1,63 @@
+// What the open collections of a file hold so far, while a reader is inside of them.
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <span>
+#include <vector>
+
+#include "toolkit/property_list/collections.hpp"
+#include "toolkit/property_list/document.hpp"
+#include "toolkit/property_list/key_index.hpp"
+
+namespace toolkit {
+
+/// A stack: collections are opened and closed in turn, and what is added goes to the one opened
+/// last.
+class PendingValues {
+ public:
+  explicit PendingValues(Document& document) : document_(document) {}
+
+  /// A collection that is open: where the stack stood when it began.
+  struct Collecting {
+    std::size_t firstValue;
+    std::size_t firstHash;
+  };
+  Collecting open() const { return {values_.size(), hashes_.size()}; }
+
+  void add(Value* value) { values_.push_back(value); }
+  /// The key of the value that is added next.
+  void addKey(Value* key, const Collecting& dictionary) {
+    if ((values_.size() - dictionary.firstValue) / 2 >= Dictionary::mostWithoutIndex) {
+      hashes_.push_back(hashOfKey(*key));
+    }
+    values_.push_back(key);
+  }
+  /// What a collection holds so far; in a dictionary, keys and values alternate.
+  std::span<Value* const> in(const Collecting& collection) const {
+    return std::span(values_).subspan(collection.firstValue);
+  }
+
+  Array* closeArray(const Collecting& array) {
+    return closed(array, Array::make(document_, in(array)));
+  }
+  Set* closeSet(const Collecting& set) { return closed(set, Set::make(document_, in(set))); }
+  Dictionary* closeDictionary(const Collecting& dictionary, Dictionary::Duplicates duplicates) {
+    const auto hashes = std::span(hashes_).subspan(dictionary.firstHash);
+    return closed(dictionary, Dictionary::make(document_, in(dictionary), hashes, duplicates));
+  }
+
+ private:
+  template <class T>
+  T* closed(const Collecting& collection, T* made) {
+    values_.resize(collection.firstValue);
+    hashes_.resize(collection.firstHash);
+    return made;
+  }
+
+  Document& document_;
+  std::vector<Value*> values_;         // of the collections that are open, the outermost's first
+  std::vector<std::uint64_t> hashes_;  // of their keys, but for the first few of each
+};
+
+}  // namespace toolkit
