@@ -5,8 +5,7 @@
 
 #include "toolkit/memory/memory_driver.hpp"
 #include "tools/failure.hpp"
-#include "tools/scenario/near_miss.hpp"
-#include "tools/scenario/vocabulary.hpp"
+#include "tools/suggestions.hpp"
 
 namespace tools {
 namespace {
@@ -39,8 +38,8 @@ std::unique_ptr<toolkit::TestDriver> requireDriver(std::string_view name) {
   if (auto driver = makeDriver(name)) return driver;
   const auto known = driverNames();
   throw Failure(ExitStatus::badInput, "unknown toolkit " + std::string(name) + "; this build has " +
-                                          scenario::enumerate({known.begin(), known.end()}) +
-                                          scenario::didYouMean(name, known));
+                                          enumerate({known.begin(), known.end()}) +
+                                          didYouMean(name, known));
 }
 
 }  // namespace tools

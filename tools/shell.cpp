@@ -7,8 +7,7 @@
 #include <exception>
 #include <iostream>
 
-#include "tools/scenario/near_miss.hpp"
-#include "tools/scenario/vocabulary.hpp"
+#include "tools/suggestions.hpp"
 #include "tools/text_layout.hpp"
 
 namespace tools {
@@ -39,12 +38,12 @@ const CLI::App& chosen(const CLI::App& app) {
 std::string commandExpected(const CLI::App& app) {
   std::vector<std::string_view> names;
   for (const CLI::App* command : app.get_subcommands({})) names.push_back(command->get_name());
-  const std::string list = scenario::enumerate({names.begin(), names.end()});
+  const std::string list = enumerate({names.begin(), names.end()});
   const auto rest = app.remaining();
   if (rest.empty()) return "expected a command: " + list;
   const bool isOption = rest.front().starts_with("-");
   return (isOption ? "unknown option " : "unknown command ") + rest.front() + "; expected " + list +
-         scenario::didYouMean(rest.front(), names);
+         didYouMean(rest.front(), names);
 }
 
 std::string unexpectedArgument(const CLI::App& command) {
@@ -55,7 +54,7 @@ std::string unexpectedArgument(const CLI::App& command) {
   for (const CLI::Option* option : command.get_options()) {
     options.push_back(option->get_name(false, true));
   }
-  return "unknown option " + name + scenario::didYouMean(name, {options.begin(), options.end()});
+  return "unknown option " + name + didYouMean(name, {options.begin(), options.end()});
 }
 
 /// CLI11 says "--press: 1 required TAG missing" of an option whose value is missing.

@@ -5,9 +5,9 @@
 #include <vector>
 
 #include "tools/scenario/json.hpp"
-#include "tools/scenario/near_miss.hpp"
 #include "tools/scenario/vocabulary.hpp"
 #include "tools/scenario/wildcard.hpp"
+#include "tools/suggestions.hpp"
 
 namespace tools::scenario {
 namespace {

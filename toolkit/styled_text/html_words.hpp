@@ -8,6 +8,8 @@
 #include <string>
 #include <string_view>
 
+#include "toolkit/ascii.hpp"
+
 namespace toolkit::html {
 
 /// White space as HTML knows it.
@@ -17,9 +19,7 @@ constexpr bool isSpace(char c) {
 
 constexpr bool isDigit(char c) { return c >= '0' && c <= '9'; }
 
-constexpr char lowered(char c) {
-  return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;
-}
+using toolkit::lowered;
 
 constexpr bool isLetter(char c) { return lowered(c) >= 'a' && lowered(c) <= 'z'; }
 

@@ -8,7 +8,7 @@
 #include "tools/failure.hpp"
 #include "tools/play/plist_entry.hpp"
 #include "tools/play/words.hpp"
-#include "tools/scenario/near_miss.hpp"
+#include "tools/suggestions.hpp"
 #include "tools/text_layout.hpp"
 #include "tools/view_kinds.hpp"
 

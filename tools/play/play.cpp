@@ -15,8 +15,7 @@
 #include "tools/play/prompt.hpp"
 #include "tools/play/session.hpp"
 #include "tools/play/stage.hpp"
-#include "tools/scenario/near_miss.hpp"
-#include "tools/scenario/vocabulary.hpp"
+#include "tools/suggestions.hpp"
 #include "tools/text_layout.hpp"
 
 namespace tools::play {

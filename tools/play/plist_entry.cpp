@@ -8,7 +8,7 @@
 
 #include "toolkit/property_list/scalars.hpp"
 #include "tools/play/parse_number.hpp"
-#include "tools/scenario/near_miss.hpp"
+#include "tools/suggestions.hpp"
 #include "tools/text_layout.hpp"
 
 namespace tools::play {
@@ -55,8 +55,7 @@ void PlistEntry::expectOnly(const std::vector<std::string_view>& keys) const {
     if (std::find(keys.begin(), keys.end(), key) != keys.end()) continue;
     std::string known;
     for (const std::string_view k : keys) known.append(known.empty() ? "" : ", ").append(k);
-    failAt(keyValue,
-           "unknown key " + quote(key) + "; expected " + known + scenario::didYouMean(key, keys));
+    failAt(keyValue, "unknown key " + quote(key) + "; expected " + known + didYouMean(key, keys));
   }
 }
 

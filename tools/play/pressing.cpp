@@ -5,7 +5,7 @@
 #include <vector>
 
 #include "tools/play/words.hpp"
-#include "tools/scenario/vocabulary.hpp"
+#include "tools/suggestions.hpp"
 #include "tools/text_layout.hpp"
 
 namespace tools::play {
@@ -21,7 +21,7 @@ std::string pressableWords(const StepPicture& picture) {
   for (const ControlPicture& control : picture.controls) {
     if (canBePressed(control)) buttons.push_back(pressWords(picture, control.view.tag));
   }
-  return buttons.empty() ? "; no button can be pressed" : "; press " + scenario::enumerate(buttons);
+  return buttons.empty() ? "; no button can be pressed" : "; press " + enumerate(buttons);
 }
 
 }  // namespace
@@ -64,11 +64,11 @@ std::string standing(const StepPicture& picture) {
     const bool moves = control.hasList && canBePressed(control);
     if (moves) buttons.push_back(pressWords(picture, control.view.tag));
   }
-  if (!buttons.empty()) ways.push_back("a press of " + scenario::enumerate(buttons));
+  if (!buttons.empty()) ways.push_back("a press of " + enumerate(buttons));
   for (const TimerPicture& timer : picture.timers) {
     ways.push_back("list " + timer.key + " to run " + whenWords(timer.timeLeft));
   }
-  if (!ways.empty()) return "The walk-through waits for " + scenario::enumerate(ways) + ".";
+  if (!ways.empty()) return "The walk-through waits for " + enumerate(ways) + ".";
   return "The walk-through stands still: no timer is pending, and no button that can be pressed "
          "has a list.";
 }

@@ -6,8 +6,8 @@
 #include <cctype>
 #include <optional>
 
-#include "tools/scenario/near_miss.hpp"
 #include "tools/scenario/slots.hpp"
+#include "tools/suggestions.hpp"
 
 namespace tools::scenario {
 namespace {

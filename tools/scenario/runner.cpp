@@ -6,6 +6,7 @@
 #include <chrono>
 
 #include "tools/scenario/stage.hpp"
+#include "tools/suggestions.hpp"
 
 namespace tools::scenario {
 namespace {

@@ -8,7 +8,7 @@
 #include <iterator>
 #include <limits>
 
-#include "tools/scenario/near_miss.hpp"
+#include "tools/suggestions.hpp"
 #include "tools/view_kinds.hpp"
 
 namespace tools::scenario {

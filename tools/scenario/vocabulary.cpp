@@ -6,6 +6,8 @@
 #include <cassert>
 #include <utility>
 
+#include "tools/suggestions.hpp"
+
 namespace tools::scenario {
 namespace {
 
@@ -126,15 +128,6 @@ std::string fullConstantName(std::string_view name) {
 
 std::string describe(const Word& word) {
   return word.kind == Word::Kind::json ? "JSON" : inQuotes(word.text);
-}
-
-std::string enumerate(const std::vector<std::string>& words) {
-  std::string text;
-  for (std::size_t i = 0; i < words.size(); ++i) {
-    if (i > 0) text += i + 1 == words.size() ? " or " : ", ";
-    text += words[i];
-  }
-  return text;
 }
 
 }  // namespace tools::scenario

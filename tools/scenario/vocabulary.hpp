@@ -100,7 +100,5 @@ std::string fullConstantName(std::string_view name);
 
 /// The word in a message: in quotation marks, or `JSON`.
 std::string describe(const Word& word);
-/// `a, b or c`.
-std::string enumerate(const std::vector<std::string>& words);
 
 }  // namespace tools::scenario

@@ -1,12 +1,12 @@
-// "Did you mean": the distance between words.
+// Words that are known beside one that is not, by the distance between them.
 
-#include "tools/scenario/near_miss.hpp"
+#include "tools/suggestions.hpp"
 
 #include <algorithm>
 #include <cstddef>
 #include <numeric>
 
-namespace tools::scenario {
+namespace tools {
 namespace {
 
 // Row by row of the usual table of distances between prefixes; `before` is the row before the
@@ -34,6 +34,15 @@ constexpr std::size_t longestWord = 100;
 
 }  // namespace
 
+std::string enumerate(const std::vector<std::string>& words) {
+  std::string text;
+  for (std::size_t i = 0; i < words.size(); ++i) {
+    if (i > 0) text += i + 1 == words.size() ? " or " : ", ";
+    text += words[i];
+  }
+  return text;
+}
+
 std::optional<std::string> nearest(std::string_view word,
                                    const std::vector<std::string_view>& candidates) {
   if (word.size() > longestWord) return std::nullopt;
@@ -53,4 +62,4 @@ std::string didYouMean(std::string_view word, const std::vector<std::string_view
   return candidate ? "; did you mean \"" + *candidate + "\"?" : "";
 }
 
-}  // namespace tools::scenario
+}  // namespace tools
