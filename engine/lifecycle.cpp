@@ -21,7 +21,7 @@ std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::init(toolkit::Tool
 
 std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::initWithWindow(
     toolkit::Toolkit& toolkit, const Window& window) {
-  const auto engine = init(toolkit);
+  auto engine = init(toolkit);
   engine->window_.set(StoredRef<toolkit::Window>::refer(window));
   engine->buttonStates_ = toolkit::Dictionary::make();
   engine->plistDictionary_.set(toolkit::Dictionary::make());
@@ -71,18 +71,10 @@ QZ_Plist_State_Parser::~QZ_Plist_State_Parser() {
   const Timers timers = *objectIdTimers_;
   for (const auto& [key, timer] : timers->entries()) timer->invalidate();
   timers->removeAllObjects();
-  objectIdTimers_.set(nullptr);
   const Window tutorial = tutorialWindow_->get();
   const Window host = window_->get();
   // Unlike at teardown, an absent window on either side leaves the list as it is.
-  if (tutorial && host && tutorial != host) {
-    addedObjectToTutorial_->removeAllObjects();
-    addedObjectToTutorial_.set(nullptr);
-  }
-  originalTagValues_.set(nullptr);
-  guiAssets_.set(nullptr);
-  plistDictionary_.set(nullptr);
-  commandArray_.set(nullptr);
+  if (tutorial && host && tutorial != host) addedObjectToTutorial_->removeAllObjects();
   buttonStates_->removeAllObjects();
 }
 

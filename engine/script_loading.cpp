@@ -50,7 +50,6 @@ bool QZ_Plist_State_Parser::loadPlist(const std::optional<std::string>& name,
   const std::string path = scriptPath(name, files);
   if (files.fileExistsAtPath(path)) {
     plistDictionary_->removeAllObjects();
-    plistDictionary_.set(nullptr);
     plistDictionary_.set(readScript(path, files));
     if (!*plistDictionary_) return false;
   }

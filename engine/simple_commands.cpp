@@ -13,7 +13,6 @@ struct Call {
 };
 
 bool terminate(const Call& call) {
-  call.engine.setTerminating(true);
   call.engine.QZ_Plist_State_Processor_TERMINATE_PARSER();
   return true;
 }

@@ -12,8 +12,9 @@ inline std::string_view textOf(const toolkit::ValueRef<>& value) {
   if (!value) return {};
   const auto string = toolkit::asString(value);
   if (!string) {
-    throw toolkit::InvalidArgumentException(
-        "expected a string, got " + std::string(value->className()) + " " + value->description());
+    // Not its description, which a small file can make longer than memory.
+    throw toolkit::InvalidArgumentException("expected a string, got " +
+                                            std::string(value->className()));
   }
   return string->text();
 }

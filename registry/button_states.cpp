@@ -8,7 +8,7 @@ QZ_Plist_State_Parser::Dictionary QZ_Plist_State_Parser::buttonStates() const {
 
 bool QZ_Plist_State_Parser::setButtonSates(const Dictionary& states) {
   const Control content = tutorialWindow_->get()->contentView();
-  if (states->count() == 0 || content->subviews().empty()) return false;
+  if (content->subviews().empty()) return false;
   bool changed = false;
   const Dictionary snapshot = states->copy(toolkit::Mutability::immutable);
   for (const auto& [key, value] : snapshot->entries()) {

@@ -64,8 +64,8 @@ bool QZ_Plist_State_Parser::loadGuiAssets(const Dictionary& description,
 
 QZ_Plist_State_Parser::Window QZ_Plist_State_Parser::makeTutorialWindow(
     const toolkit::Rect& content) {
-  const Window window = toolkit_.application().makeWindow(
-      content, toolkit::StyleMask::titledAndClosable, toolkit::BackingStore::buffered, true);
+  Window window = toolkit_.application().makeWindow(content, toolkit::StyleMask::titledAndClosable,
+                                                    toolkit::BackingStore::buffered, true);
   tutorialWindow_.set(toolkit::StoredRef<toolkit::Window>::own(window));
   window->setBackgroundColor(toolkit::colors::black);
   // The buttons have no target: their actions reach the engine at the end of the responder chain.

@@ -33,7 +33,6 @@ void QZ_Plist_State_Parser::rewriteFlashingEntry(const ObjectId& id) {
     if (toolkit::intValueOf(key) != id->intValue()) continue;
     const std::string ownKey = tagKey(id->longValue());
     const bool flag = flashing->objectForKey(ownKey)->boolValue();
-    flashing->removeObjectForKey(ownKey);
     flashing->setObject(toolkit::Number::withBool(flag), ownKey);
     return;
   }

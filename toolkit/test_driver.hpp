@@ -70,6 +70,8 @@ class TestDriver {
   virtual void setFrame(const Ref<View>& view, const Rect& frame) = 0;
   /// The text of a text field, the title of a button, the name of an image view's image.
   virtual void setCaption(const Ref<View>& view, std::string_view text) = 0;
+  /// What the window's title bar says; nothing where there are no title bars.
+  virtual void setWindowTitle(const Ref<Window>& /*window*/, std::string_view /*title*/) {}
   /// Where the toolkit's resource directory lies from now on.
   virtual void setResourcePath(std::string_view path) = 0;
   /// The class name that this toolkit gives a view of the kind.
@@ -83,7 +85,25 @@ class TestDriver {
   /// Lets time pass: at once where the clock is virtual, really elsewhere. 0 or more seconds.
   virtual void advance(double seconds) = 0;
 
+  // --- with a person at the screen ---
+
+  /// Whether a person can see the windows and act on them.
+  virtual bool hasPerson() const { return false; }
+  /// Hands the windows over to that person. `willAct` is told of a control before its action is
+  /// sent on their behalf. `goesOn` is asked whenever something may have happened; NO ends it. What
+  /// an action or a timer raises leaves here.
+  virtual void handOver(const std::function<void(const Ref<View>&)>& /*willAct*/,
+                        const std::function<bool()>& /*goesOn*/) {}
+
   // --- as an observer ---
+
+  /// Whether windows have pixels, so that there can be pictures of them.
+  virtual bool draws() const { return false; }
+  /// Writes the window as it shows, with the window under it when it is a sheet, to a PNG file. NO
+  /// when the window is not on the screen, or the file cannot be written.
+  virtual bool savePicture(const Ref<Window>& /*window*/, const std::string& /*path*/) {
+    return false;
+  }
 
   virtual ViewPicture look(const Ref<View>& view) = 0;
   virtual WindowPicture look(const Ref<Window>& window) = 0;

@@ -14,7 +14,7 @@ namespace {
 using Keys = std::vector<std::string>;
 using Graph = std::map<std::string, Keys, std::less<>>;
 
-// The key that an element chains to, where it does.
+// The key that an element chains to, where it does; `own` is what a simple command aims at.
 std::optional<std::string> target(const toolkit::ValueRef<>& element, const std::string& own) {
   const std::string& chain = QZ_PLIST_STATE_PARSER_PROCESS_COMMANDS_FOR_ID;
   if (const auto simple = toolkit::asString(element)) {
@@ -37,9 +37,10 @@ Graph chainsOf(const toolkit::ValueRef<toolkit::Dictionary>& script) {
     const auto name = toolkit::asString(key);
     if (!name) continue;
     Keys& targets = graph[std::string(name->text())];
+    const std::string own = tagKey(key->intValue());  // the list of "07" runs with the id 7
     const auto elements = toolkit::asArray(list);
     for (const auto& element : elements->elements()) {
-      if (auto to = target(element, std::string(name->text()))) targets.push_back(*std::move(to));
+      if (auto to = target(element, own)) targets.push_back(*std::move(to));
     }
   }
   return graph;

@@ -1,7 +1,9 @@
-// qz-walkthrough: plays and tests scripted walk-throughs.
+// qz-walkthrough: plays and tests scripted walk-throughs, prints and converts their files.
 #include <string>
 #include <vector>
 
+#include "tools/convert_command.hpp"
+#include "tools/dump_command.hpp"
 #include "tools/play_command.hpp"
 #include "tools/shell.hpp"
 #include "tools/stack_guard.hpp"
@@ -10,5 +12,6 @@
 int main(int argc, char** argv) {
   tools::installStackGuard();
   const std::vector<std::string> arguments(argv + (argc > 0 ? 1 : 0), argv + argc);
-  return tools::runTool(arguments, {tools::addPlayCommand, tools::addTestCommand});
+  return tools::runTool(arguments, {tools::addPlayCommand, tools::addTestCommand,
+                                    tools::addDumpCommand, tools::addConvertCommand});
 }

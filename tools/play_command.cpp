@@ -6,12 +6,13 @@
 #include <unistd.h>
 
 #include <algorithm>
-#include <cstdlib>
 #include <iostream>
 #include <memory>
 
+#include "tools/drivers.hpp"
 #include "tools/play/play.hpp"
 #include "tools/play/prompt.hpp"
+#include "tools/terminal.hpp"
 #include "tools/text_layout.hpp"
 
 namespace tools {
@@ -24,8 +25,7 @@ constexpr std::size_t widest = 140;    // lines any longer are hard to read
 play::Style outputStyle() {
   play::Style style;
   if (::isatty(STDOUT_FILENO) == 0) return style;
-  const char* noColor = std::getenv("NO_COLOR");
-  style.color = noColor == nullptr || *noColor == '\0';
+  style.color = outputShowsColor();
   winsize size{};
   if (::ioctl(STDOUT_FILENO, TIOCGWINSZ, &size) == 0 && size.ws_col > 0) {
     style.width = std::clamp<std::size_t>(size.ws_col, narrowest, widest);
@@ -63,9 +63,14 @@ void addWindowOptions(CLI::App& command, play::PlayOptions& options) {
                   "The directory of the images; the script's own without it")
       ->type_name("DIR");
   command.add_flag("--sheet", options.sheet, "Show it as a sheet over another window of the host");
+  options.toolkit = playerToolkit();
   command.add_option("--toolkit", options.toolkit, "The toolkit to play it on")
       ->type_name("NAME")
       ->capture_default_str();
+  command
+      .add_option("--screenshots", options.screenshots,
+                  "Write a picture after every step there, and the transcript")
+      ->type_name("DIR");
 }
 
 /// Steps are collected while the command line is read, for their order across both options counts.

@@ -18,7 +18,8 @@ constexpr const char* toolName = "qz-walkthrough";
 constexpr const char* exitStatuses =
     "Exit status:\n"
     "  0  all went well\n"
-    "  1  a test failed, or a walk-through could not start or go on as asked\n"
+    "  1  a test failed, a walk-through could not start or go on as asked, or a file could not be\n"
+    "     dumped or converted\n"
     "  2  bad usage, or a file that is not what it should be\n"
     "  3  a script's lists ran each other without end";
 

@@ -14,7 +14,6 @@
 namespace {
 
 using fakes::FakeView;
-using toolkit::Ref;
 using toolkit::View;
 
 constexpr long target = 7;

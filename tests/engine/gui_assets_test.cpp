@@ -42,13 +42,13 @@ class ObservedApplication final : public toolkit::Application {
   }
   Ref<toolkit::Button> makeButton(const toolkit::Rect& frame) override {
     if (onButton) onButton();
-    const auto button = application_.makeButton(frame);
+    auto button = application_.makeButton(frame);
     button->setHidden(true);
     button->setEnabled(false);
     return button;
   }
   Ref<toolkit::ImageView> makeImageView(const toolkit::Rect& frame) override {
-    const auto imageView = application_.makeImageView(frame);
+    auto imageView = application_.makeImageView(frame);
     imageView->setHidden(true);
     imageView->setImageFrameStyle(toolkit::ImageFrameStyle{3});
     imageView->setImageScaling(toolkit::ImageScaling{1});
@@ -56,7 +56,7 @@ class ObservedApplication final : public toolkit::Application {
     return imageView;
   }
   Ref<toolkit::TextField> makeTextField(const toolkit::Rect& frame) override {
-    const auto textField = application_.makeTextField(frame);
+    auto textField = application_.makeTextField(frame);
     textField->setHidden(true);
     textField->setStringValue("untidy");
     return textField;

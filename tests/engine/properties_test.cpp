@@ -73,6 +73,7 @@ void meanwhile(const std::vector<std::function<void()>>& tasks, Work work) {
   std::atomic<bool> done = false;
   std::atomic<std::size_t> started = 0;
   std::vector<std::thread> threads;
+  threads.reserve(tasks.size());
   for (const auto& task : tasks) {
     threads.emplace_back([&] {
       ++started;
@@ -87,7 +88,7 @@ void meanwhile(const std::vector<std::function<void()>>& tasks, Work work) {
 
 /// A script whose list 1 runs its list 2, where there is nothing to do.
 Engine::Dictionary script() {
-  const auto script = Dictionary::make();
+  auto script = Dictionary::make();
   script->setObject(
       Array::make({Array::make({String::make("PROCESS_COMMANDS_FOR_ID"), Number::withLong(2)})}),
       "1");

@@ -14,7 +14,6 @@
 namespace {
 
 using Engine = QZ_Plist_State_Parser;
-using toolkit::Number;
 
 class Teardown : public testing::Test {
  protected:

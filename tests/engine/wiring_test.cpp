@@ -5,6 +5,7 @@
 
 #include <memory>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "QZ_Plist_State_Parser.hpp"
@@ -24,7 +25,8 @@ class ActiveGradient final : public fakes::FakeRole<toolkit::Gradient> {
 /// A host's own class of button: a view that is a button, with a name of its own.
 class HostButton final : public fakes::FakeRole<toolkit::View> {
  public:
-  explicit HostButton(toolkit::Ref<toolkit::Button> button) : FakeRole(4), button_(button) {}
+  explicit HostButton(toolkit::Ref<toolkit::Button> button)
+      : FakeRole(4), button_(std::move(button)) {}
   std::string className() const override { return "HostButton"; }
   toolkit::Button* asButton() override { return button_.pointer().get(); }
 

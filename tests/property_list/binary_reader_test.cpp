@@ -192,7 +192,7 @@ TEST(BinaryReader, WantsNumbersThatAreLargeEnough) {
 }
 
 TEST(BinaryReader, ChecksTheOffsetTable) {
-  const auto withOffsets = [](std::vector<std::uint64_t> offsets) {
+  const auto withOffsets = [](const std::vector<std::uint64_t>& offsets) {
     return dumpOf(BinaryFile{.objects = {"\xA1\x01", "\x09", "\x08"}, .offsets = offsets}.bytes());
   };
   EXPECT_EQ(withOffsets({8, 10, 11}), "[true]");
@@ -228,10 +228,10 @@ TEST(BinaryReader, TakesDeepNestingUpToALimit) {
   const auto arrays = [](std::size_t depth) {
     BinaryFile file{.objects = {}, .referenceSize = 2};
     for (std::size_t i = 1; i < depth; ++i) {
-      file.objects.push_back("\xA1");
+      file.objects.emplace_back("\xA1");
       binary::appendNumber(file.objects.back(), i, 2);
     }
-    file.objects.push_back("\xA0");
+    file.objects.emplace_back("\xA0");
     return dumpOf(file.bytes());
   };
   EXPECT_EQ(arrays(513), repeated("[", 513) + repeated("]", 513));

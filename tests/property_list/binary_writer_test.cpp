@@ -67,7 +67,8 @@ TEST(BinaryWriter, WritesRandomValuesThatReadBackTheSame) {
 
 TEST(BinaryWriter, WritesManyObjects) {
   std::vector<ValueRef<>> elements;
-  for (int i = 0; i < 70000; ++i) elements.push_back(Number::withLong(i));
+  elements.reserve(70000);
+  for (int i = 0; i < 70000; ++i) elements.emplace_back(Number::withLong(i));
   const auto array = Array::make(elements);
   EXPECT_EQ(dumpOf(writeBinaryPropertyList(array)), canonicalDump(*array));
 }

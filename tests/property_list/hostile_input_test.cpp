@@ -87,11 +87,11 @@ TEST(HostileInput, SharedOverAndOverIsReadOnce) {
   // 2^400 strings, were they not shared.
   BinaryFile file{.objects = {}, .referenceSize = 2};
   for (std::size_t i = 1; i <= 400; ++i) {
-    file.objects.push_back("\xA2");
+    file.objects.emplace_back("\xA2");
     binary::appendNumber(file.objects.back(), i, 2);
     binary::appendNumber(file.objects.back(), i, 2);
   }
-  file.objects.push_back("\x51z");
+  file.objects.emplace_back("\x51z");
   ValueRef<> value = readPropertyList(file.bytes()).value;
   for (int i = 0; i < 400; ++i) {
     ASSERT_TRUE(value->objectAtIndex(0) == value->objectAtIndex(1));

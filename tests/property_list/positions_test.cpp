@@ -67,6 +67,15 @@ TEST(Refusals, SayWhatAndWhere) {
   }
 }
 
+TEST(Positions, OfTheRootOfAStringsFile) {
+  for (const std::string_view file : {"a = b;", "a;", " /* nothing */ "}) {
+    PositionTable positions;
+    const ValueRef<> root = readPropertyList(std::string(file), &positions).value;
+    ASSERT_TRUE(root) << file;
+    EXPECT_EQ(std::get<TextPosition>(positions.of(*root).value()), (TextPosition{1, 1})) << file;
+  }
+}
+
 TEST(Positions, OfXmlValuesAndKeys) {
   PositionTable positions;
   const std::string xml =

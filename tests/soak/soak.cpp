@@ -30,7 +30,7 @@ constexpr long roundsAGuest = 100;  // how often a second walk-through comes and
 // Nothing grows that is not leaked: one small object a round is far above the first of these in the
 // whole run, and above it even in a hundredth.
 constexpr std::int64_t heapBound = 1024;
-constexpr std::int64_t residentBound = 1024 * 1024;
+constexpr std::int64_t residentBound = std::int64_t{1024} * 1024;
 
 // The button 1 starts a chain of timers, one a second, that in turn run the list 70 and press the
 // button 2. 71 is armed twice: its first timer fires for nothing, its second is cancelled by

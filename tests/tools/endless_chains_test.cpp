@@ -56,6 +56,17 @@ TEST(EndlessChains, ASimpleCommandChainsToItsOwnList) {
   EXPECT_EQ(tools::endlessChains(script).loops, std::vector<std::string>{"4 -> 4"});
 }
 
+TEST(EndlessChains, ASimpleCommandOfAnOddKeyChainsToItsNumber) {
+  const auto list = Array::make({String::make("PROCESS_COMMANDS_FOR_ID")});
+  const auto script = Dictionary::make();
+  script->setObject(list, "07");
+  EXPECT_TRUE(tools::endlessChains(script).loops.empty());
+  script->setObject(list, "7");
+  const auto chains = tools::endlessChains(script);
+  EXPECT_EQ(chains.loops, std::vector<std::string>{"7 -> 7"});
+  EXPECT_TRUE(chains.loopOf.contains("07"));
+}
+
 TEST(EndlessChains, SayForEveryListWhereItEndsUp) {
   const auto chains = tools::endlessChains(script({{"1", {2}}, {"2", {2}}, {"3", {1}}, {"4", {}}}));
   ASSERT_EQ(chains.loops, std::vector<std::string>{"2 -> 2"});

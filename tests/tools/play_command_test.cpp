@@ -4,41 +4,15 @@
 #include <gtest/gtest.h>
 
 #include <iostream>
-#include <sstream>
 
 #include "play_files.hpp"
-#include "tools/shell.hpp"
+#include "tool_run.hpp"
 
 namespace tools {
 namespace {
 
-/// What a standard stream is given for as long as this lives.
-class Captured {
- public:
-  explicit Captured(std::ostream& stream) : stream_(stream), before_(stream.rdbuf(text_.rdbuf())) {}
-  ~Captured() { stream_.rdbuf(before_); }
-  Captured(const Captured&) = delete;
-  Captured& operator=(const Captured&) = delete;
-
-  std::string text() const { return text_.str(); }
-
- private:
-  std::ostringstream text_;
-  std::ostream& stream_;
-  std::streambuf* before_;
-};
-
-struct Result {
-  int status;
-  std::string out;
-  std::string err;
-};
-
 Result run(const std::vector<std::string>& arguments) {
-  const Captured out(std::cout);
-  const Captured err(std::cerr);
-  const int status = runTool(arguments, {addPlayCommand});
-  return {status, out.text(), err.text()};
+  return tools::run(addPlayCommand, arguments);
 }
 
 /// A directory with a script whose list 1 does nothing.

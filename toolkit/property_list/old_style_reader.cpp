@@ -35,7 +35,7 @@ class OldStyleReader {
 
 Value* OldStyleReader::root() {
   // A file of nothing but white space and comments is a strings file without strings.
-  if (!tokens_.skipToToken()) return entries(0);
+  if (!tokens_.skipToToken()) return noted(entries(0), 0);
   Value* result = value(0);
   if (!tokens_.skipToToken()) return result;
   if (result->kind() != Value::Kind::string) tokens_.refuseUnexpected("the end of the file");
@@ -43,7 +43,7 @@ Value* OldStyleReader::root() {
   // cannot begin a key is ignored.
   tokens_.startAgain();
   if (offsets_) offsets_->clear();
-  return entries(0);
+  return noted(entries(0), 0);
 }
 
 bool OldStyleReader::isAtValue() const {

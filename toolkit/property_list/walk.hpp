@@ -65,4 +65,10 @@ void walk(const Value& root, Visitor& visitor) {
   }
 }
 
+/// How many values such a walk visits, `root` among them. That may be far more than there are: a
+/// binary property list can hold one collection in many places, and nests such sharing. Counting
+/// takes time in proportion to the values that there are; what is too many to count is the greatest
+/// number. `root` holds no collection that holds itself.
+std::size_t visitsInWalk(const Value& root);
+
 }  // namespace toolkit

@@ -10,30 +10,28 @@
 
 #include "toolkit/property_list/reader.hpp"
 #include "toolkit/property_list/scalars.hpp"
-#include "tools/failure.hpp"
 #include "tools/text_layout.hpp"
 
 namespace tools::play {
 namespace {
 
-[[noreturn]] void refuse(const std::string& message) {
+[[noreturn]] void cannotRead(const std::string& message) {
   throw Failure(ExitStatus::badInput, message);
 }
 
 std::string contentsOf(const std::string& path, const std::string& what) {
-  if (path.empty()) refuse("an empty path; expected that of " + what);
+  if (path.empty()) cannotRead("an empty path; expected that of " + what);
   std::error_code error;
   const auto status = std::filesystem::status(path, error);
-  if (!exists(status)) refuse(path + ": no such file; expected " + what);
-  if (is_directory(status)) refuse(path + ": a directory; expected " + what);
+  if (!exists(status)) cannotRead(path + ": no such file; expected " + what);
+  if (is_directory(status)) cannotRead(path + ": a directory; expected " + what);
   errno = 0;
   std::ifstream file(path, std::ios::binary);
   std::ostringstream contents;
   contents << file.rdbuf();
   if (file.bad() || !file.is_open()) {
-    refuse(path + ": cannot be read (" + std::strerror(errno) + "); expected " + what);
+    cannotRead(path + ": cannot be read (" + std::strerror(errno) + "); expected " + what);
   }
-  if (contents.str().empty()) refuse(path + ": an empty file; expected " + what);
   return contents.str();
 }
 
@@ -48,12 +46,15 @@ std::string where(const std::string& path, const std::optional<toolkit::Position
 
 }  // namespace
 
-InputFile::InputFile(std::string path, std::string_view what)
-    : path_(std::move(path)), what_(what) {
-  const auto result = toolkit::readPropertyList(contentsOf(path_, what_), &positions_);
-  if (const auto& refusal = result.refusal) {
-    refuse(where(path_, refusal->position) + printable(refusal->reason) + " (read as " +
-           std::string(toolkit::description(refusal->format)) + ")");
+InputFile::InputFile(std::string path, std::string_view what, ExitStatus refusal)
+    : path_(std::move(path)), what_(what), refusal_(refusal) {
+  const std::string contents = contentsOf(path_, what_);
+  if (contents.empty()) throw Failure(refusal_, path_ + ": an empty file; expected " + what_);
+  const auto result = toolkit::readPropertyList(contents, &positions_);
+  if (const auto& refused = result.refusal) {
+    throw Failure(refusal_, where(path_, refused->position) + printable(refused->reason) +
+                                " (read as " + std::string(toolkit::description(refused->format)) +
+                                ")");
   }
   root_ = result.value;
 }
@@ -67,7 +68,7 @@ toolkit::ValueRef<toolkit::Dictionary> InputFile::dictionary() const {
 }
 
 void InputFile::fail(const toolkit::ValueRef<>& value, const std::string& message) const {
-  refuse(where(path_, positions_.of(*value)) + message);
+  throw Failure(refusal_, where(path_, positions_.of(*value)) + message);
 }
 
 std::string foundWords(const toolkit::ValueRef<>& value) {

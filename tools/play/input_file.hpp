@@ -8,14 +8,15 @@
 #include "toolkit/property_list/collections.hpp"
 #include "toolkit/property_list/positions.hpp"
 #include "toolkit/property_list/value.hpp"
+#include "tools/failure.hpp"
 
 namespace tools::play {
 
 class InputFile {
  public:
   /// Reads the property list at `path`, in any of the formats. `what` is what the file is to hold,
-  /// such as "a script".
-  InputFile(std::string path, std::string_view what);
+  /// such as "a script"; `refusal` is the Failure's status where it is not that.
+  InputFile(std::string path, std::string_view what, ExitStatus refusal = ExitStatus::badInput);
 
   const std::string& path() const { return path_; }
   const toolkit::ValueRef<>& root() const { return root_; }
@@ -28,6 +29,7 @@ class InputFile {
  private:
   std::string path_;
   std::string what_;
+  ExitStatus refusal_;
   toolkit::ValueRef<> root_;
   toolkit::PositionTable positions_;
 };

@@ -1,10 +1,13 @@
 // Statements that drive the engine: its operations, a user's presses, and time.
 
+#include <filesystem>
 #include <optional>
 
+#include "toolkit/property_list/reader.hpp"
 #include "tools/scenario/statements.hpp"
 #include "tools/scenario/unmet.hpp"
 #include "tools/scenario/values.hpp"
+#include "tools/stack_guard.hpp"
 
 namespace tools::scenario {
 namespace {
@@ -55,7 +58,18 @@ Outcome assets(Stage& stage, const Arguments& a) {
   return stage.engines.held()->loadGuiAssets(description, nullptr);
 }
 
+// The script that the engine would read, for the stack guard, which must know it before it runs.
+Engine::Dictionary scriptNamed(const std::string& name, const toolkit::Files& files) {
+  const auto path = std::filesystem::path(files.resourcePath()) / name;
+  const auto contents = files.contentsAtPath(path.string());
+  return contents ? toolkit::dictionaryFromPropertyList(*contents) : nullptr;
+}
+
 Outcome load(Stage& stage, const Arguments& a) {
+  if (a.has("TEXT")) {
+    guardScript(*stage.engines.held(), stage.placeOf(*stage.current),
+                scriptNamed(a.text("TEXT"), stage.driver.toolkit().files()));
+  }
   return stage.engines.held()->loadPlist(optionalText(a, "TEXT"), optionalText(a, "KEY"),
                                          stage.sheetDelegate, a.has("sheet"));
 }

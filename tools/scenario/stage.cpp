@@ -26,11 +26,12 @@ class Replaced {
   T before_;
 };
 
-/// While it lives, a script that exhausts the stack ends the tool with a line that names the place.
+/// While it lives, a script that exhausts the stack ends the tool with a line that names the place
+/// and the lists.
 class GuardedStack {
  public:
   GuardedStack(const std::shared_ptr<Engine>& engine, const std::string& place) {
-    if (engine) guardScript(*engine, place, {});
+    if (engine) guardScript(*engine, place, engine->plistDictionary());
   }
   ~GuardedStack() { forgetScript(); }
   GuardedStack(const GuardedStack&) = delete;
@@ -94,9 +95,13 @@ Stage::~Stage() { driver.setLogSink({}); }
 
 void Stage::perform(const Statement& statement) {
   // Nothing here keeps the engine for as long as the statement lasts: it may have to end meanwhile.
-  const GuardedStack guarded(engines.current(), file + ":" + std::to_string(statement.at.line));
+  const GuardedStack guarded(engines.current(), placeOf(statement));
   performHere(statement);
   if (auto failed = std::exchange(failedReaction_, std::nullopt)) throw Failed(*failed);
+}
+
+std::string Stage::placeOf(const Statement& statement) const {
+  return file + ":" + std::to_string(statement.at.line);
 }
 
 void Stage::performHere(const Statement& statement) {

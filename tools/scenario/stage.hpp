@@ -65,6 +65,8 @@ class Stage {
   /// What stands at the end: every log line was expected, everything awaited happened. Throws a
   /// Failed about `last`, the scenario's last statement, where no other one is to blame.
   void requireNothingLeft(const Statement& last);
+  /// "FILE:LINE"
+  std::string placeOf(const Statement& statement) const;
 
   toolkit::TestDriver& driver;
   const std::string file;

@@ -1,0 +1,97 @@
+// Ids and numbers that only 64 bits hold: where the engine takes all of them, and where 32.
+
+#include <gtest/gtest.h>
+
+#include <memory>
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "toolkit/memory/memory_driver.hpp"
+
+namespace {
+
+using toolkit::Array;
+using toolkit::Number;
+using toolkit::String;
+using toolkit::ViewKind;
+
+constexpr long near = 7;
+constexpr long far = near + (1L << 32);  // the same in 32 bits
+
+class WideIds : public testing::Test {
+ protected:
+  WideIds() { engine->getGuiAssetsFromWindow(window); }
+  ~WideIds() override { engine->terminateParser(); }
+
+  toolkit::Ref<toolkit::View> view(ViewKind kind, long tag) {
+    return driver.makeView(kind, tag, {20, 20, 100, 30}, window->contentView());
+  }
+  bool showHtml(const toolkit::ValueRef<>& size) {
+    return engine->QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML(
+        String::make("html"), String::make("Times"), size, Number::withLong(far));
+  }
+
+  toolkit::memory::MemoryDriver driver;
+  toolkit::Ref<toolkit::Window> window = driver.makeWindow({0, 0, 300, 200});
+  std::shared_ptr<QZ_Plist_State_Parser> engine =
+      QZ_Plist_State_Parser::initWithWindow(driver.toolkit(), window);
+};
+
+TEST_F(WideIds, ReachTheControlWithAllOfThem) {
+  const auto nearField = view(ViewKind::textField, near);
+  const auto field = view(ViewKind::textField, far);
+  const auto id = Number::withLong(far);
+  EXPECT_TRUE(engine->QZ_Plist_State_Processor_SET_TEXT(String::make("text"), id));
+  EXPECT_EQ(driver.look(field).text.string(), "text");
+  EXPECT_TRUE(
+      engine->QZ_Plist_State_Processor_SET_TOOL_TIP(Array::make({String::make("tip")}), id));
+  EXPECT_EQ(driver.look(field).toolTip, "tip");
+  EXPECT_TRUE(showHtml(Number::withLong(12)));
+  EXPECT_EQ(driver.look(field).text.string(), "html");
+  EXPECT_EQ(driver.look(nearField).text.string(), "");
+  EXPECT_EQ(driver.look(nearField).toolTip, "");
+}
+
+TEST_F(WideIds, StopTheFlashingOfTheirOwnButton) {
+  view(ViewKind::button, near)->highlight(true);
+  const auto button = view(ViewKind::button, far);
+  button->highlight(true);
+  EXPECT_TRUE(engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(far), false));
+  EXPECT_FALSE(driver.look(button).highlighted);
+}
+
+TEST_F(WideIds, OfAFontSizeCountInTheir32LowBits) {
+  const auto field = view(ViewKind::textField, far);
+  EXPECT_TRUE(showHtml(Number::withLong(18 + (1L << 32))));
+  const auto text = driver.look(field).text;
+  ASSERT_EQ(text.runs().size(), 1U);
+  EXPECT_EQ(text.runs()[0].attributes.font->size, 18);
+}
+
+TEST_F(WideIds, OfAnImageViewCountInTheir32LowBits) {
+  view(ViewKind::imageView, near);
+  const auto parameters = Array::make({String::make("none"), Number::withLong(far)});
+  EXPECT_TRUE(engine->QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH(parameters,
+                                                                             Number::withLong(1)));
+}
+
+TEST_F(WideIds, AFlashingEntryIsSoughtBy32BitsAndRewrittenUnderAll) {
+  view(ViewKind::button, near);
+  view(ViewKind::button, far);
+  engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(near), true);
+  EXPECT_TRUE(engine->QZ_Plist_State_Processor_SET_TAG(Number::withLong(9), Number::withLong(far)));
+  const auto flashing = engine->flashingTagIds();
+  EXPECT_TRUE(flashing->objectForKey("7")->boolValue());
+  ASSERT_TRUE(flashing->objectForKey("4294967303"));
+  EXPECT_FALSE(flashing->objectForKey("4294967303")->boolValue());
+}
+
+// A key's text is read as the nearest number of 32 bits.
+TEST_F(WideIds, AFlashingKeyBeyond32BitsIsTheGreatestOfThem) {
+  view(ViewKind::button, 2147483647);
+  engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(99999999999), true);
+  EXPECT_TRUE(
+      engine->QZ_Plist_State_Processor_SET_TAG(Number::withLong(9), Number::withLong(2147483647)));
+  EXPECT_TRUE(engine->flashingTagIds()->objectForKey("2147483647"));
+}
+
+}  // namespace

@@ -1,0 +1,86 @@
+// The command `convert`.
+#include "tools/convert_command.hpp"
+
+#include <CLI/CLI.hpp>
+
+#include <filesystem>
+#include <map>
+#include <memory>
+#include <optional>
+#include <string>
+
+#include "toolkit/exception.hpp"
+#include "toolkit/property_list/binary_writer.hpp"
+#include "toolkit/property_list/reader.hpp"
+#include "toolkit/property_list/xml_writer.hpp"
+#include "tools/failure.hpp"
+#include "tools/play/input_file.hpp"
+#include "tools/replace_file.hpp"
+#include "tools/shared_values.hpp"
+#include "tools/text_layout.hpp"
+
+namespace tools {
+namespace {
+
+using toolkit::Format;
+
+const std::map<std::string, Format> formats = {{"binary", Format::binary}, {"xml", Format::xml}};
+
+struct ConvertOptions {
+  std::string in;
+  std::string out;
+  std::optional<Format> format;
+};
+
+Format formatByExtension(const std::string& path) {
+  const auto extension = std::filesystem::path(path).extension();
+  return extension == ".bplist" || extension == ".bin" ? Format::binary : Format::xml;
+}
+
+std::string written(const play::InputFile& file, Format format) {
+  if (format == Format::binary) return toolkit::writeBinaryPropertyList(file.root());
+  requireWritableInFull(file);
+  return toolkit::writeXmlPropertyList(file.root());
+}
+
+void convert(const ConvertOptions& options) {
+  const play::InputFile file(options.in, "a property list", ExitStatus::failed);
+  const Format format = options.format.value_or(formatByExtension(options.out));
+  try {
+    replaceFile(options.out, written(file, format));
+  } catch (const toolkit::InvalidArgumentException& refusal) {
+    throw Failure(ExitStatus::failed, options.in + ": no " +
+                                          std::string(toolkit::description(format)) +
+                                          " can hold it: " + refusal.reason());
+  }
+}
+
+void setFormat(ConvertOptions& options, const std::string& name) {
+  const auto found = formats.find(name);
+  if (found == formats.end()) {
+    throw CLI::ValidationError("--format: expected xml or binary, found " + quote(name));
+  }
+  options.format = found->second;
+}
+
+}  // namespace
+
+void addConvertCommand(CLI::App& app, int& status) {
+  CLI::App* command = app.add_subcommand("convert", "Write a property list in another format");
+  const auto options = std::make_shared<ConvertOptions>();
+  command->add_option("IN", options->in, "The property list, of any format")
+      ->required()
+      ->type_name("");
+  command->add_option("OUT", options->out, "The file to write")->required()->type_name("");
+  command
+      ->add_option_function<std::string>(
+          "--format", [options](const std::string& name) { setFormat(*options, name); },
+          "xml or binary; without it, binary where OUT ends with .bplist or .bin, else xml")
+      ->type_name("FORMAT");
+  command->callback([options, &status] {
+    convert(*options);
+    status = static_cast<int>(ExitStatus::fine);
+  });
+}
+
+}  // namespace tools

@@ -1,0 +1,52 @@
+// The command `dump`.
+#include "tools/dump_command.hpp"
+
+#include <CLI/CLI.hpp>
+
+#include <iostream>
+#include <memory>
+#include <string>
+
+#include "toolkit/property_list/canonical_dump.hpp"
+#include "tools/failure.hpp"
+#include "tools/play/input_file.hpp"
+#include "tools/readable_dump.hpp"
+#include "tools/shared_values.hpp"
+#include "tools/terminal.hpp"
+
+namespace tools {
+namespace {
+
+struct DumpOptions {
+  std::string file;
+  bool canonical = false;
+  bool dictionary = false;
+};
+
+void dump(const DumpOptions& options) {
+  const play::InputFile file(options.file, "a property list", ExitStatus::failed);
+  if (options.dictionary) file.dictionary();
+  requireWritableInFull(file);
+  if (options.canonical) {
+    std::cout << toolkit::canonicalDump(*file.root()) << '\n';
+  } else {
+    writeReadableDump(*file.root(), std::cout, outputShowsColor());
+  }
+}
+
+}  // namespace
+
+void addDumpCommand(CLI::App& app, int& status) {
+  CLI::App* command = app.add_subcommand("dump", "Print a property list of any format");
+  const auto options = std::make_shared<DumpOptions>();
+  command->add_option("FILE", options->file, "The property list")->required()->type_name("");
+  command->add_flag("--canonical", options->canonical,
+                    "In one line of ASCII, the same for equal values");
+  command->add_flag("--dictionary", options->dictionary, "Only if its root is a dictionary");
+  command->callback([options, &status] {
+    dump(*options);
+    status = static_cast<int>(ExitStatus::fine);
+  });
+}
+
+}  // namespace tools

@@ -1,0 +1,30 @@
+#include "tools/shared_values.hpp"
+
+#include <algorithm>
+#include <cstdint>
+#include <filesystem>
+#include <string>
+#include <system_error>
+
+#include "toolkit/property_list/walk.hpp"
+
+namespace tools {
+namespace {
+
+// What any memory holds, and what files that share values with sense come to.
+constexpr std::uintmax_t alwaysFine = 10'000'000;
+constexpr std::uintmax_t valuesPerByte = 100;
+
+}  // namespace
+
+void requireWritableInFull(const play::InputFile& file) {
+  std::error_code error;
+  const std::uintmax_t bytes = std::filesystem::file_size(file.path(), error);
+  const std::uintmax_t most = error ? alwaysFine : std::max(alwaysFine, valuesPerByte * bytes);
+  if (toolkit::visitsInWalk(*file.root()) <= most) return;
+  throw Failure(ExitStatus::failed, file.path() + ": stands for more than " + std::to_string(most) +
+                                        " values, as its collections are in many places each; "
+                                        "they cannot all be written out");
+}
+
+}  // namespace tools

@@ -1,0 +1,15 @@
+#include "tools/terminal.hpp"
+
+#include <unistd.h>
+
+#include <cstdlib>
+
+namespace tools {
+
+bool outputShowsColor() {
+  if (::isatty(STDOUT_FILENO) == 0) return false;
+  const char* noColor = std::getenv("NO_COLOR");
+  return noColor == nullptr || *noColor == '\0';
+}
+
+}  // namespace tools
