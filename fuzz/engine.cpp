@@ -1,0 +1,177 @@
+// The engine, driven by any script and any presses, on the memory toolkit.
+//
+// An input is a line of what happens, a character a step, and a script in any format behind it. A
+// script whose lists run each other without end exhausts the stack, as is stated; such a script,
+// and one that would run for very long, is left out.
+#include <algorithm>
+#include <cstdint>
+#include <map>
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "engine/tag_key.hpp"
+#include "fuzz/property_list_checks.hpp"
+#include "fuzz/require.hpp"
+#include "toolkit/memory/memory_driver.hpp"
+#include "toolkit/property_list/number_conversion.hpp"
+#include "toolkit/uppercase.hpp"
+
+namespace {
+
+using fuzz::require;
+using Script = toolkit::ValueRef<toolkit::Dictionary>;
+
+constexpr std::size_t mostSteps = 32;
+constexpr std::size_t mostElements = 2'000;  // in the runs of one list, with all that it chains to
+constexpr std::size_t deepestChain = 100;
+
+/// How many elements run when a list does, with the lists that it chains to.
+class RunLengths {
+ public:
+  explicit RunLengths(Script script) : script_(std::move(script)) {}
+
+  /// Whether no list, whichever starts, runs for long or deep.
+  bool areSmall() {
+    for (const auto& [key, list] : script_->entries()) {
+      const auto tag = toolkit::asString(key);
+      if (tag && ofElements(list, toolkit::intValueOf(tag->text()), 0) > mostElements) return false;
+    }
+    return true;
+  }
+
+ private:
+  std::size_t ofList(long tag, std::size_t depth) {
+    if (depth > deepestChain) return mostElements + 1;
+    const auto known = lengths_.find(tag);
+    if (known != lengths_.end()) return known->second;
+    const std::size_t length = ofElements(script_->objectForKey(tagKey(tag)), tag, depth);
+    return lengths_[tag] = length;
+  }
+
+  /// Of a list that runs under a tag. The tag need not be its key: "07" runs under 7.
+  std::size_t ofElements(const toolkit::ValueRef<>& list, long tag, std::size_t depth) {
+    std::size_t length = 1;
+    const auto elements = toolkit::asArray(list);
+    for (const auto& element : elements->elements()) {
+      const auto next = chained(element, tag);
+      length += next ? ofList(*next, depth + 1) : 1;
+      if (length > mostElements) break;
+    }
+    return std::min(length, mostElements + 1);
+  }
+
+  static std::optional<long> chained(const toolkit::ValueRef<>& element, long own) {
+    const std::string& chain = QZ_PLIST_STATE_PARSER_PROCESS_COMMANDS_FOR_ID;
+    if (const auto simple = toolkit::asString(element)) {
+      return simple->text() == chain ? std::optional(own) : std::nullopt;
+    }
+    const auto compound = toolkit::asArray(element);
+    if (compound->count() < 2) return std::nullopt;
+    const auto name = toolkit::asString(compound->elements()[0]);
+    if (!name || toolkit::uppercased(name->text()) != chain) return std::nullopt;
+    try {
+      return compound->elements()[1]->intValue();
+    } catch (const toolkit::Exception&) {
+      return std::nullopt;
+    }
+  }
+
+  Script script_;
+  std::map<long, std::size_t> lengths_;
+};
+
+class Walkthrough {
+ public:
+  explicit Walkthrough(const Script& script) : script_(script) {
+    using toolkit::ViewKind;
+    driver_.setResourcePath("/nonexistent");
+    long tag = 0;
+    for (const ViewKind kind : {ViewKind::button, ViewKind::toggle, ViewKind::mixed,
+                                ViewKind::popUpButton, ViewKind::textField, ViewKind::imageView,
+                                ViewKind::box, ViewKind::plain, ViewKind::button}) {
+      ++tag;
+      views_.push_back(driver_.makeView(kind, tag, {0, 20.0 * static_cast<double>(tag), 90, 18},
+                                        window_->contentView()));
+    }
+    engine_->getGuiAssetsFromWindow(window_);
+    engine_->setPlistDictionary(script);
+  }
+
+  ~Walkthrough() {
+    attempt([&] { engine_->terminateParser(); });
+    const std::weak_ptr<QZ_Plist_State_Parser> ended = engine_;
+    engine_ = nullptr;
+    require(ended.expired(), "nothing keeps an engine that ended");
+  }
+  Walkthrough(const Walkthrough&) = delete;
+  Walkthrough& operator=(const Walkthrough&) = delete;
+
+  void step(char what) {
+    if (what >= '1' && what <= '9') return press(static_cast<std::size_t>(what - '1'));
+    switch (what) {
+      case '+':
+        return attempt([&] { driver_.advance(1); });
+      case '*':
+        return attempt([&] { driver_.advance(20); });
+      case 'r':  // no such file: the script that is there runs on
+        return attempt([&] { engine_->loadPlist("none.plist", "", nullptr, false); });
+      case 's':
+        return attempt([&] { engine_->loadPlist("none.plist", "1", nullptr, true); });
+      case 'b':
+        return attempt([&] { engine_->loadGuiAssets(under("assets"), nullptr); });
+      case 'c':
+        return attempt([&] { engine_->setButtonSates(under("states")); });
+      case 'd':
+        return attempt([&] { engine_->getGuiAssetsFromWindow(window_); });
+      case 't':
+        return attempt([&] { engine_->terminateParser(); });
+      case 'x':
+        return attempt([&] { driver_.removeFromSuperview(views_.front()); });
+      default:
+        return;
+    }
+  }
+
+ private:
+  void press(std::size_t view) {
+    attempt([&] { driver_.click(views_[view]); });
+  }
+
+  /// What a script or a description does wrong may raise; the host's event loop goes on.
+  template <class Act>
+  static void attempt(Act act) {
+    try {
+      act();
+    } catch (const toolkit::Exception& raised) {
+      require(!raised.name().empty(), "an exception has a name");
+    }
+  }
+
+  Script under(std::string_view key) const {
+    return toolkit::asDictionary(script_->objectForKey(key));
+  }
+
+  Script script_;
+  toolkit::memory::MemoryDriver driver_;
+  toolkit::Ref<toolkit::Window> window_ = driver_.makeWindow({0, 0, 400, 300});
+  std::vector<toolkit::Ref<toolkit::View>> views_;
+  std::shared_ptr<QZ_Plist_State_Parser> engine_ =
+      QZ_Plist_State_Parser::initWithWindow(driver_.toolkit(), window_);
+};
+
+}  // namespace
+
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+  const std::string_view input(reinterpret_cast<const char*>(data), size);
+  const std::size_t end = input.find('\n');
+  if (end == std::string_view::npos) return -1;
+  const Script script = toolkit::dictionaryFromPropertyList(input.substr(end + 1));
+  if (!script || !RunLengths(script).areSmall()) return -1;
+  Walkthrough walkthrough(script);
+  for (const char what : input.substr(0, std::min(end, mostSteps))) walkthrough.step(what);
+  return 0;
+}
