@@ -2,6 +2,7 @@
 #pragma once
 
 #include <memory>
+#include <string>
 #include <string_view>
 #include <vector>
 
@@ -11,6 +12,10 @@ namespace tools {
 
 /// The names that `--toolkit` takes.
 std::vector<std::string_view> driverNames();
+
+/// The toolkit to play scripts on where none is asked for: one with windows to see, if this build
+/// has one.
+std::string playerToolkit();
 
 /// A driver with a toolkit of its own; null when this build has none of that name.
 std::unique_ptr<toolkit::TestDriver> makeDriver(std::string_view name);

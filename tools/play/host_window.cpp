@@ -124,6 +124,7 @@ toolkit::Ref<toolkit::Window> makeHostWindow(toolkit::TestDriver& driver, const 
     }
   }
   auto window = driver.makeWindow(host.content);
+  if (!host.title.empty()) driver.setWindowTitle(window, host.title);
   for (const HostControl& control : host.controls) {
     makeControl(driver, control, window->contentView());
   }

@@ -5,6 +5,7 @@
 #include <filesystem>
 #include <istream>
 #include <memory>
+#include <optional>
 #include <ostream>
 
 #include "toolkit/property_list/collections.hpp"
@@ -13,6 +14,7 @@
 #include "tools/play/input_file.hpp"
 #include "tools/play/pressing.hpp"
 #include "tools/play/prompt.hpp"
+#include "tools/play/screenshots.hpp"
 #include "tools/play/session.hpp"
 #include "tools/play/stage.hpp"
 #include "tools/suggestions.hpp"
@@ -98,6 +100,16 @@ void playInteractively(Session& session, const Terminal& terminal) {
   }
 }
 
+/// Whoever sees the window plays in it; else whoever types.
+void leaveToTheUser(const toolkit::TestDriver& driver, Session& session, const Terminal& terminal) {
+  if (driver.hasPerson()) {
+    terminal.out << "\nPress what the window offers; close it to stop.\n" << std::flush;
+    session.handOver();
+  } else if (terminal.interactive) {
+    playInteractively(session, terminal);
+  }
+}
+
 /// Hands the engine's log lines on, each below what the transcript already shows.
 void connectLog(toolkit::TestDriver& driver, const Terminal& terminal) {
   driver.setLogSink([&terminal](std::string_view line) {
@@ -117,12 +129,15 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   const auto driver = requireDriver(options.toolkit);
   driver->setResourcePath(options.resources ? *options.resources : path.parent_path().string());
   connectLog(*driver, terminal);
+  std::optional<Screenshots> screenshots;
+  if (options.screenshots) screenshots.emplace(*driver, *options.screenshots);
   Stage stage(*driver, options, file.dictionary());
-  Session session(*driver, stage, terminal.out, terminal.style);
+  Session session(*driver, stage, terminal.out, terminal.style,
+                  screenshots ? &*screenshots : nullptr);
 
   session.start(path.string(), options.startKey);
   for (const Step& step : options.steps) session.perform(step);
-  if (options.steps.empty() && terminal.interactive) playInteractively(session, terminal);
+  if (options.steps.empty()) leaveToTheUser(*driver, session, terminal);
   session.conclude();
   return session.failed() ? ExitStatus::failed : ExitStatus::fine;
 }

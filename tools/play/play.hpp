@@ -36,6 +36,7 @@ struct PlayOptions {
   std::vector<Step> steps;               ///< what happens after the start, in order
   bool sheet = false;                    ///< shown as a sheet over another window of the host
   std::string toolkit = "memory";
+  std::optional<std::string> screenshots;  ///< directory of a picture for every step
 };
 
 /// Whom the player talks with.
@@ -43,7 +44,8 @@ struct Terminal {
   std::istream& in;
   std::ostream& out;  ///< the transcript
   std::ostream& log;  ///< the engine's log lines
-  bool interactive;   ///< asks for steps when none are given
+  /// Asks for steps when none are given; a person at the toolkit's own screen plays there.
+  bool interactive;
   Style style;
 };
 

@@ -1,20 +1,42 @@
 // A walk-through being played.
 #include "tools/play/session.hpp"
 
-#include "toolkit/exception.hpp"
+#include <algorithm>
+#include <utility>
+
 #include "tools/play/pressing.hpp"
 #include "tools/play/words.hpp"
 #include "tools/text_layout.hpp"
 
 namespace tools::play {
 
-Session::Session(toolkit::TestDriver& driver, Stage& stage, std::ostream& out, const Style& style)
-    : driver_(driver), stage_(stage), transcript_(out, style) {
+namespace {
+
+bool isSame(const TimerPicture& a, const TimerPicture& b) {
+  return !a.identity.owner_before(b.identity) && !b.identity.owner_before(a.identity);
+}
+
+/// The timer that has fired between the two pictures, if one has.
+const TimerPicture* firedBetween(const StepPicture& before, const StepPicture& after) {
+  for (const TimerPicture& timer : before.timers) {
+    const bool pends = std::any_of(after.timers.begin(), after.timers.end(),
+                                   [&](const TimerPicture& other) { return isSame(timer, other); });
+    if (!pends) return &timer;
+  }
+  return nullptr;
+}
+
+}  // namespace
+
+Session::Session(toolkit::TestDriver& driver, Stage& stage, std::ostream& out, const Style& style,
+                 Screenshots* screenshots)
+    : driver_(driver), stage_(stage), transcript_(out, style), screenshots_(screenshots) {
   transcript_.startFrom(look());
+  if (screenshots_) screenshots_->keep(transcript_);
 }
 
 void Session::start(const std::string& script, const std::string& startKey) {
-  run("start", [&] { stage_.load(script, startKey); });
+  run("start", "start", [&] { stage_.load(script, startKey); });
 }
 
 void Session::perform(const Step& step) {
@@ -28,25 +50,91 @@ void Session::perform(const Step& step) {
 void Session::press(long tag) {
   const std::string heading = "press " + pressWords(picture(), tag);
   if (const auto reason = whyNotPress(picture(), tag)) return refuse(heading, *reason);
-  run(heading, [&] { driver_.click(stage_.engine().findObjectWithTag(tag)); });
+  run(heading, "press-" + std::to_string(tag),
+      [&] { driver_.click(stage_.engine().findObjectWithTag(tag)); });
 }
 
 void Session::advance(double seconds) {
   const std::string heading = "let " + numberWords(seconds) + " s pass";
   if (picture().ended) return refuse(heading, "the walk-through has ended");
-  run(heading, [&] { driver_.advance(seconds); });
+  run(heading, "advance-" + numberWords(seconds), [&] { pass(seconds); });
 }
 
-void Session::run(const std::string& heading, const std::function<void()>& action) {
-  transcript_.beginStep(heading);
+// One firing after the other, where a picture of each is wanted.
+void Session::pass(double seconds) {
+  while (screenshots_) {
+    const StepPicture before = look();
+    if (before.timers.empty() || before.timers.front().timeLeft > seconds) break;
+    const double wait = before.timers.front().timeLeft;
+    driver_.advance(wait);
+    seconds -= wait;
+    const StepPicture after = look();
+    const TimerPicture* const fired = firedBetween(before, after);
+    if (!fired) break;
+    takeScreenshot("list-" + fired->key);
+  }
+  driver_.advance(seconds);
+}
+
+void Session::run(const std::string& heading, const std::string& name,
+                  const std::function<void()>& action) {
+  begin(heading, name);
   try {
     action();
   } catch (const toolkit::Exception& exception) {
-    // A host's event loop would report it and go on; so does the transcript.
-    failed_ = true;
-    transcript_.note("Raised " + exception.name() + ": " + printable(exception.reason()));
+    noteRaised(exception);
   }
+  end();
+}
+
+void Session::begin(const std::string& heading, const std::string& name) {
+  if (stepName_) end();
+  stepName_ = name;
+  transcript_.beginStep(heading);
+}
+
+// A host's event loop would report it and go on; so does the transcript.
+void Session::noteRaised(const toolkit::Exception& exception) {
+  failed_ = true;
+  transcript_.note("Raised " + exception.name() + ": " + printable(exception.reason()));
+}
+
+void Session::end() {
   transcript_.endStep(look());
+  takeScreenshot(*std::exchange(stepName_, std::nullopt));
+}
+
+void Session::takeScreenshot(const std::string& name) {
+  if (screenshots_) screenshots_->take(stage_.engine().tutorialWindow(), name);
+}
+
+void Session::handOver() {
+  const auto willAct = [this](const toolkit::Ref<toolkit::View>& view) {
+    const long tag = view->tag();
+    begin("press " + pressWords(look(), tag), "press-" + std::to_string(tag));
+  };
+  while (watch()) {
+    try {
+      driver_.handOver(willAct, [this] { return watch(); });
+    } catch (const toolkit::Exception& exception) {
+      if (!stepName_) begin("a timer fires", "list");
+      noteRaised(exception);
+    }
+  }
+}
+
+/// Writes down what has happened since the last step; whether the walk-through goes on.
+bool Session::watch() {
+  if (!stepName_) {
+    const StepPicture now = look();
+    if (const TimerPicture* const fired = firedBetween(picture(), now)) {
+      begin("list " + fired->key + " runs by its timer", "list-" + fired->key);
+    } else {
+      return !now.ended && now.window && now.window->visible;
+    }
+  }
+  end();
+  return !picture().ended && picture().window && picture().window->visible;
 }
 
 void Session::refuse(const std::string& heading, const std::string& reason) {

@@ -3,10 +3,13 @@
 
 #include <functional>
 #include <iosfwd>
+#include <optional>
 #include <string>
 
+#include "toolkit/exception.hpp"
 #include "toolkit/test_driver.hpp"
 #include "tools/play/play.hpp"
+#include "tools/play/screenshots.hpp"
 #include "tools/play/stage.hpp"
 #include "tools/play/transcript.hpp"
 
@@ -14,14 +17,20 @@ namespace tools::play {
 
 class Session {
  public:
-  /// All outlive the session.
-  Session(toolkit::TestDriver& driver, Stage& stage, std::ostream& out, const Style& style);
+  /// All outlive the session. With `screenshots`, which may be null, there is a picture after each
+  /// step, and after each list that a timer has run within one.
+  Session(toolkit::TestDriver& driver, Stage& stage, std::ostream& out, const Style& style,
+          Screenshots* screenshots = nullptr);
 
   /// Loads the script at an absolute path and runs its list under `startKey`.
   void start(const std::string& script, const std::string& startKey);
 
   /// Makes the step, or says in the transcript why a user could not make it.
   void perform(const Step& step);
+
+  /// Leaves the window to the person at the screen, until the walk-through ends or they close it.
+  /// Each press and each list that a timer runs is a step.
+  void handOver();
 
   /// Says how the walk-through ended or what it waits for, and what it leaves its host.
   void conclude();
@@ -33,7 +42,14 @@ class Session {
  private:
   void press(long tag);
   void advance(double seconds);
-  void run(const std::string& heading, const std::function<void()>& action);
+  void pass(double seconds);
+  void run(const std::string& heading, const std::string& name,
+           const std::function<void()>& action);
+  void begin(const std::string& heading, const std::string& name);
+  void noteRaised(const toolkit::Exception& exception);
+  void end();
+  void takeScreenshot(const std::string& name);
+  bool watch();
   void refuse(const std::string& heading, const std::string& reason);
   StepPicture look() { return takePicture(driver_, stage_.engine(), stage_.title()); }
   std::string recordedStates();
@@ -41,6 +57,8 @@ class Session {
   toolkit::TestDriver& driver_;
   Stage& stage_;
   Transcript transcript_;
+  Screenshots* screenshots_;
+  std::optional<std::string> stepName_;  // of the step that has begun, for its picture
   bool failed_ = false;
 };
 

@@ -9,17 +9,27 @@
 namespace tools::play {
 
 void Transcript::beginStep(std::string_view what) {
-  if (steps_ > 0) out_ << '\n';
-  out_ << renderHeading(++steps_, what, style_) << std::flush;
+  ++steps_;
+  for (const auto& [out, style] : outputs_) {
+    if (steps_ > 1) out << '\n';
+    out << renderHeading(steps_, what, style) << std::flush;
+  }
 }
 
-void Transcript::note(std::string_view words) { out_ << "  " << words << '\n'; }
+void Transcript::note(std::string_view words) {
+  for (const Output& output : outputs_) output.out << "  " << words << '\n';
+}
 
 void Transcript::endStep(StepPicture picture) {
-  out_ << renderPicture(picture, diffPictures(latest_, picture), style_) << std::flush;
+  const PictureChanges changes = diffPictures(latest_, picture);
+  for (const auto& [out, style] : outputs_) {
+    out << renderPicture(picture, changes, style) << std::flush;
+  }
   latest_ = std::move(picture);
 }
 
-void Transcript::paragraph(std::string_view text) { out_ << '\n' << text << std::flush; }
+void Transcript::paragraph(std::string_view text) {
+  for (const Output& output : outputs_) output.out << '\n' << text << std::flush;
+}
 
 }  // namespace tools::play

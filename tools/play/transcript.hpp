@@ -4,6 +4,8 @@
 
 #include <iosfwd>
 #include <string_view>
+#include <utility>
+#include <vector>
 
 #include "tools/play/picture_render.hpp"
 #include "tools/play/step_picture.hpp"
@@ -13,7 +15,10 @@ namespace tools::play {
 class Transcript {
  public:
   /// `out` outlives the transcript.
-  Transcript(std::ostream& out, const Style& style) : out_(out), style_(style) {}
+  Transcript(std::ostream& out, const Style& style) : outputs_{{out, style}} {}
+
+  /// From now on it is also written there. `out` outlives the transcript.
+  void alsoTo(std::ostream& out, const Style& style) { outputs_.push_back({out, style}); }
 
   /// What shows before the first step.
   void startFrom(StepPicture picture) { latest_ = std::move(picture); }
@@ -31,8 +36,12 @@ class Transcript {
   const StepPicture& latest() const { return latest_; }
 
  private:
-  std::ostream& out_;
-  Style style_;
+  struct Output {
+    std::ostream& out;
+    Style style;
+  };
+
+  std::vector<Output> outputs_;
   StepPicture latest_;
   int steps_ = 0;
 };

@@ -1,0 +1,125 @@
+// What assistive technology gets to know: names, descriptions, and that they changed.
+
+#include "toolkit/qt/accessibility.hpp"
+
+#include <gtest/gtest.h>
+
+#include <QAccessible>
+#include <QCheckBox>
+#include <QLabel>
+#include <QPushButton>
+#include <QTemporaryDir>
+#include <QTextEdit>
+#include <vector>
+
+#include "toolkit/qt/button_look.hpp"
+#include "toolkit/qt/image_look.hpp"
+#include "toolkit/qt/images.hpp"
+#include "toolkit/qt/strings.hpp"
+#include "toolkit/qt/text_look.hpp"
+#include "toolkit/system_files.hpp"
+
+namespace {
+
+using namespace toolkit;
+using namespace toolkit::qt;
+
+struct Announcement {
+  QObject* object;
+  QAccessible::Event event;
+};
+std::vector<Announcement> announcements;
+
+}  // namespace
+
+// Takes the place of Qt's own in this program: Qt hands announcements on only while assistive
+// technology is connected, which needs a desktop's message bus.
+void QAccessible::updateAccessibility(QAccessibleEvent* event) {
+  announcements.push_back({event->object(), event->type()});
+}
+
+namespace {
+
+class Accessibility : public ::testing::Test {
+ protected:
+  Accessibility() { announcements.clear(); }
+
+  static bool wasAnnounced(const QObject& object, QAccessible::Event event) {
+    for (const auto& said : announcements)
+      if (said.object == &object && said.event == event) return true;
+    return false;
+  }
+  static std::string textOf(QWidget& widget, QAccessible::Text which) {
+    return utf8(QAccessible::queryAccessibleInterface(&widget)->text(which));
+  }
+};
+
+const AttributedString styled("Styled", {.foregroundColor = colors::red});
+
+TEST_F(Accessibility, TitlesAreNamesAndAnnounced) {
+  QPushButton button("Before");
+  QCheckBox box("Before");
+  for (QAbstractButton* const each :
+       {static_cast<QAbstractButton*>(&button), static_cast<QAbstractButton*>(&box)}) {
+    announcements.clear();
+    showTitle(*each, "A & B");
+    EXPECT_TRUE(wasAnnounced(*each, QAccessible::NameChanged));
+    EXPECT_EQ(textOf(*each, QAccessible::Name), "A & B");
+    announcements.clear();
+    showTitle(*each, styled);
+    EXPECT_TRUE(wasAnnounced(*each, QAccessible::NameChanged));
+    EXPECT_EQ(textOf(*each, QAccessible::Name), "Styled");
+  }
+}
+
+TEST_F(Accessibility, ReplacesANameThatTheHostGave) {
+  QPushButton button("Before");
+  button.setAccessibleName("Go on");
+  showTitle(button, "Close");
+  EXPECT_EQ(textOf(button, QAccessible::Name), "Close");
+}
+
+TEST_F(Accessibility, TextsOfLabelsAreNamesAndAnnounced) {
+  QLabel label("Before");
+  announcements.clear();
+  showText(label, "Plain");
+  EXPECT_TRUE(wasAnnounced(label, QAccessible::NameChanged));
+  EXPECT_EQ(textOf(label, QAccessible::Name), "Plain");
+  announcements.clear();
+  showText(label, styled);
+  EXPECT_TRUE(wasAnnounced(label, QAccessible::NameChanged));
+  EXPECT_EQ(textOf(label, QAccessible::Name), "Styled");
+}
+
+TEST_F(Accessibility, ToolTipsAreDescriptionsAndAnnounced) {
+  QPushButton button("Next");
+  showToolTip(button, "Goes on");
+  EXPECT_TRUE(wasAnnounced(button, QAccessible::DescriptionChanged));
+  EXPECT_EQ(textOf(button, QAccessible::Description), "Goes on");
+  for (const char* text : {"<b>tag</b>", "a & b", "two\nlines", ""}) {
+    showToolTip(button, text);
+    EXPECT_EQ(shownToolTip(button), text);
+    EXPECT_EQ(textOf(button, QAccessible::Description), text);
+  }
+}
+
+TEST_F(Accessibility, ImagesAreNamedByTheirNames) {
+  QTemporaryDir directory;
+  QImage(4, 4, QImage::Format_RGB32).save(directory.filePath("disk.png"));
+  QImage(4, 4, QImage::Format_RGB32).save(directory.filePath("done.png"));
+  SystemFiles files;
+  files.setResourcePath(utf8(directory.path()));
+  QtImages images(files);
+  QLabel label;
+  for (const char* name : {"disk", "done"}) {
+    announcements.clear();
+    showImage(label, images.imageNamed(name));
+    EXPECT_TRUE(wasAnnounced(label, QAccessible::NameChanged));
+    EXPECT_EQ(textOf(label, QAccessible::Name), name);
+    EXPECT_EQ(textOf(label, QAccessible::Description), name);
+  }
+  showImage(label, nullptr);
+  EXPECT_EQ(textOf(label, QAccessible::Name), "");
+}
+
+}  // namespace

@@ -1,0 +1,96 @@
+// The example of a host: its walk-throughs come and go, and the host works on.
+#include <gtest/gtest.h>
+
+#include <QMenu>
+#include <QStatusBar>
+#include <QTest>
+
+#include "examples/qt-host/guided_form.hpp"
+#include "support.hpp"
+
+namespace {
+
+struct HostExample : testing::Test {
+  std::shared_ptr<GuidedForm> form =
+      std::make_shared<GuidedForm>(QZ_SOURCE_DIR "/examples/qt-host");
+
+  HostExample() {
+    form->show();
+    form->activateWindow();
+  }
+
+  void choose(int item) {
+    form->menuBar()->actions()[0]->menu()->actions()[item]->trigger();
+    hosts::settle();
+  }
+
+  static void click(QWidget& widget) {
+    QTest::mouseClick(&widget, Qt::LeftButton);
+    hosts::settle();
+  }
+
+  /// The form's own buttons do what they did before any walk-through, once a press.
+  void expectHostWorks() {
+    form->name.setText("Ada");
+    click(form->order);
+    EXPECT_EQ(form->statusBar()->currentMessage(), "Ordered for Ada: 6 €");
+    click(form->clear);
+    EXPECT_EQ(form->name.text(), "");
+  }
+};
+
+TEST_F(HostExample, worksBeforeAnyWalkThrough) { expectHostWorks(); }
+
+TEST_F(HostExample, isGuidedOverItsOwnWindowAndGoesOnAfterwards) {
+  for (int round = 0; round < 2; ++round) {
+    choose(0);
+    EXPECT_TRUE(form->guide.isVisible());
+    EXPECT_TRUE(form->guide.text().contains("Welcome"));
+    EXPECT_FALSE(form->order.isEnabled());
+
+    click(form->next);
+    EXPECT_EQ(form->express.toolTip(), "Two days instead of five");
+    click(form->next);
+    EXPECT_TRUE(form->order.isEnabled());
+    EXPECT_EQ(form->next.text(), "Done");
+    click(form->next);
+    EXPECT_TRUE(form->isVisible());
+    EXPECT_FALSE(form->guide.isVisible());
+    EXPECT_EQ(form->next.property("qzTag"), 20);
+    expectHostWorks();
+  }
+}
+
+TEST_F(HostExample, closesInTheMiddleOfAWalkThroughWhenTheUserWantsIt) {
+  choose(0);
+  EXPECT_TRUE(form->close());
+  EXPECT_FALSE(form->isVisible());
+}
+
+TEST_F(HostExample, showsTipsInASheet) {
+  choose(1);
+  EXPECT_TRUE(form->tips.isVisible());
+  EXPECT_TRUE(form->tips.isModal());
+  click(form->tips.next);
+  EXPECT_EQ(form->tips.tip.text(), "Fill what is empty with paper, so that nothing moves.");
+  click(form->tips.next);
+  EXPECT_FALSE(form->tips.next.isEnabled());
+  click(form->tips.close);
+  EXPECT_FALSE(form->tips.isVisible());
+  EXPECT_EQ(form->tips.next.property("qzTag"), 10);
+  expectHostWorks();
+}
+
+TEST_F(HostExample, takesEscapeForTheEndOfItsTips) {
+  for (int round = 0; round < 2; ++round) {
+    choose(1);
+    click(form->tips.next);
+    QTest::keyClick(&form->tips, Qt::Key_Escape);
+    hosts::settle();
+    EXPECT_FALSE(form->tips.isVisible());
+    EXPECT_EQ(form->tips.next.property("qzTag"), 10);
+    expectHostWorks();
+  }
+}
+
+}  // namespace

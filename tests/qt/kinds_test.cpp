@@ -1,0 +1,123 @@
+// Which widget is which kind of view, where it lies, and its tag; states; the keyboard's focus.
+
+#include <QCheckBox>
+#include <QComboBox>
+#include <QDialog>
+#include <QLabel>
+#include <QLineEdit>
+#include <QMainWindow>
+#include <QPlainTextEdit>
+#include <QPushButton>
+#include <QRadioButton>
+#include <QTextEdit>
+
+#include "tests/qt/support.hpp"
+#include "toolkit/exception.hpp"
+#include "toolkit/qt/widget_node.hpp"
+
+namespace {
+
+using Kinds = hosts::Host;
+using toolkit::State;
+using toolkit::qt::tagProperty;
+
+std::string kindOf(toolkit::View& view) {
+  if (view.asButton()) return "button";
+  if (view.asTextField()) return "text field";
+  return view.asImageView() ? "image view" : "view";
+}
+
+TEST_F(Kinds, GoByTheClassOfTheWidget) {
+  QPixmap pixmap(4, 4);
+  add<QPushButton>();
+  add<QRadioButton>();
+  add<QComboBox>();
+  add<QLabel>("text");
+  add<QLabel>().setPixmap(pixmap);
+  add<QLabel>().setProperty(toolkit::qt::imageViewProperty, true);
+  add<QLineEdit>();
+  add<QTextEdit>();
+  add<QPlainTextEdit>();
+  add<QWidget>();
+  new QDialog(panel.get());  // a window, no subview
+  const char* const expected[] = {"button",     "button",     "view",       "text field",
+                                  "image view", "image view", "text field", "text field",
+                                  "text field", "view"};
+  const auto& views = window->contentView()->subviews();
+  ASSERT_EQ(views.size(), std::size(expected));
+  for (std::size_t i = 0; i < views.size(); ++i)
+    EXPECT_EQ(kindOf(*views[i]), expected[i]) << views[i]->className();
+  EXPECT_EQ(views[2]->className(), "QComboBox");
+  EXPECT_THROW(views[2]->setEnabled(false), toolkit::InvalidArgumentException);
+}
+
+TEST_F(Kinds, TakeTheCentralWidgetOfAMainWindowForItsContent) {
+  QMainWindow mainWindow;
+  const auto shown = toolkit.application().window(mainWindow);
+  EXPECT_FALSE(shown->contentView());
+  mainWindow.setCentralWidget(new QTextEdit);
+  EXPECT_EQ(shown->contentView()->className(), "QTextEdit");
+}
+
+TEST_F(Kinds, LieWithTheirOriginAtTheLowerLeft) {
+  auto& widget = add<QLabel>("text");
+  const auto view = toolkit.application().view(widget);
+  EXPECT_EQ(view->frame(), (toolkit::Rect{20, 250, 120, 30}));
+  widget.move(7, 0);
+  EXPECT_EQ(view->frame(), (toolkit::Rect{7, 270, 120, 30}));
+}
+
+TEST_F(Kinds, HaveTheirTagsInAPropertyThatComesAndGoes) {
+  auto& plain = add<QLabel>("text");
+  auto& tagged = add<QLabel>("text");
+  tagged.setProperty(tagProperty, 7);
+  const auto plainView = toolkit.application().view(plain);
+  const auto taggedView = toolkit.application().view(tagged);
+  EXPECT_EQ(taggedView->tag(), 7);
+  plainView->setTag(3);
+  EXPECT_EQ(plain.property(tagProperty).toLongLong(), 3);
+  plainView->setTag(0);
+  taggedView->setTag(0);
+  EXPECT_TRUE(plain.dynamicPropertyNames().isEmpty());
+  EXPECT_EQ(tagged.dynamicPropertyNames().size(), 1);
+}
+
+TEST_F(Kinds, KnowMixedStatesOnlyAsTriStateCheckBoxes) {
+  auto& three = add<QCheckBox>("three");
+  three.setTristate(true);
+  auto& two = add<QCheckBox>("two");
+  auto& radio = add<QRadioButton>("radio");
+  auto& push = add<QPushButton>("push");
+  for (QCheckBox* const widget : {&three, &two}) {
+    const auto button = adopt(*widget);
+    button->setState(State::mixed);
+    EXPECT_EQ(button->state(), widget == &three ? State::mixed : State::on);
+  }
+  EXPECT_EQ(three.checkState(), Qt::PartiallyChecked);
+  EXPECT_FALSE(two.isTristate());
+  const auto exclusive = adopt(radio);
+  exclusive->setState(State::on);
+  exclusive->setState(State::off);
+  EXPECT_EQ(exclusive->state(), State::off);
+  EXPECT_TRUE(radio.autoExclusive());
+  const auto pushed = adopt(push);
+  pushed->setState(State::on);
+  EXPECT_EQ(pushed->state(), State::on);
+  EXPECT_TRUE(performer->actions.empty());
+}
+
+TEST_F(Kinds, GiveTheFocusAwayWhenTheyAreHiddenOrDisabled) {
+  auto& first = add<QPushButton>("first");
+  auto& second = add<QPushButton>("second");
+  auto& third = add<QPushButton>("third");
+  show();
+  first.setFocus();
+  toolkit.application().view(first)->setHidden(true);
+  EXPECT_EQ(panel->focusWidget(), &second);
+  toolkit.application().view(second)->setEnabled(false);
+  EXPECT_EQ(panel->focusWidget(), &third);
+  toolkit.application().view(third)->setHidden(true);
+  EXPECT_EQ(panel->focusWidget(), nullptr);
+}
+
+}  // namespace

@@ -1,0 +1,15 @@
+// Tests of widgets need an application; on whichever machine they run, nobody sees its windows.
+
+#include <gtest/gtest.h>
+
+#include <QApplication>
+#include <clocale>
+
+int main(int argc, char** argv) {
+  qputenv("QT_QPA_PLATFORM", "offscreen");
+  const QApplication application(argc, argv);
+  QApplication::setQuitOnLastWindowClosed(false);
+  std::setlocale(LC_ALL, "C");  // Qt sets the user's
+  testing::InitGoogleTest(&argc, argv);
+  return RUN_ALL_TESTS();
+}

@@ -1,0 +1,71 @@
+// Finding views and windows by their widgets. An entry whose widget has gone may stand under the
+// address of a new one until its view ends: what counts is the widget that the view still has.
+
+#include "toolkit/qt/desk.hpp"
+
+#include <algorithm>
+#include <utility>
+
+#include "toolkit/qt/views.hpp"
+#include "toolkit/qt/window.hpp"
+
+namespace toolkit::qt {
+
+Ref<View> Desk::viewOf(QWidget& widget) {
+  const auto found = views_.find(&widget);
+  const auto known = found == views_.end() ? nullptr : found->second.lock();
+  if (known && known->widget() == &widget) return known->view();
+  return makeView(widget, shared_from_this(), Widget::host)->view();
+}
+
+std::shared_ptr<QtWindow> Desk::windowOf(QWidget& widget) {
+  if (auto known = knownWindow(widget)) return known;
+  return QtWindow::make(widget, shared_from_this(), KeptBy::host);
+}
+
+std::shared_ptr<QtWindow> Desk::knownWindow(const QWidget& widget) const {
+  const auto found = windows_.find(&widget);
+  const auto known = found == windows_.end() ? nullptr : found->second.lock();
+  return known && known->widget() == &widget ? known : nullptr;
+}
+
+std::vector<std::shared_ptr<QtWindow>> Desk::windows() const {
+  std::vector<std::shared_ptr<QtWindow>> windows;
+  for (const auto& [key, window] : windows_)
+    if (auto known = window.lock()) windows.push_back(std::move(known));
+  return windows;
+}
+
+void Desk::enter(const QWidget& widget, const std::shared_ptr<WidgetNode>& view) {
+  views_.insert_or_assign(&widget, view);
+}
+
+void Desk::enter(const QWidget& widget, const std::shared_ptr<QtWindow>& window) {
+  windows_.insert_or_assign(&widget, window);
+}
+
+void Desk::forgetView(const QWidget* key) {
+  const auto found = views_.find(key);
+  if (found != views_.end() && found->second.expired()) views_.erase(found);
+}
+
+void Desk::forgetWindow(const QWidget* key) {
+  const auto found = windows_.find(key);
+  if (found != windows_.end() && found->second.expired()) windows_.erase(found);
+}
+
+void Desk::keep(const std::shared_ptr<QtWindow>& window) {
+  if (std::find(kept_.begin(), kept_.end(), window) == kept_.end()) kept_.push_back(window);
+}
+
+void Desk::letGo(const QtWindow& window) {
+  const auto place = std::find_if(kept_.begin(), kept_.end(),
+                                  [&](const auto& kept) { return kept.get() == &window; });
+  if (place == kept_.end()) return;
+  const auto last = std::move(*place);  // it may end, and come back here, when the list is whole
+  kept_.erase(place);
+}
+
+void Desk::letAllGo() { const auto last = std::exchange(kept_, {}); }
+
+}  // namespace toolkit::qt

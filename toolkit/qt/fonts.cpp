@@ -1,0 +1,88 @@
+// Which families stand in for the classic ones. The first of each row is metric-compatible where
+// there is such a family, so that lines break where their writer saw them break.
+
+#include "toolkit/qt/fonts.hpp"
+
+#include <QFontDatabase>
+#include <algorithm>
+#include <array>
+#include <cmath>
+
+#include "toolkit/qt/strings.hpp"
+
+namespace toolkit::qt {
+
+namespace {
+
+struct ClassicFamily {
+  std::string_view name;
+  bool fixedPitch;
+  std::array<const char*, 3> standIns;
+};
+
+constexpr ClassicFamily classicFamilies[] = {
+    {"Times", false, {"Liberation Serif", "Tinos", "DejaVu Serif"}},
+    {"Times New Roman", false, {"Liberation Serif", "Tinos", "DejaVu Serif"}},
+    {"Helvetica", false, {"Liberation Sans", "Arimo", "DejaVu Sans"}},
+    {"Arial", false, {"Liberation Sans", "Arimo", "DejaVu Sans"}},
+    {"Courier", true, {"Liberation Mono", "Cousine", "DejaVu Sans Mono"}},
+    {"Courier New", true, {"Liberation Mono", "Cousine", "DejaVu Sans Mono"}},
+    {"Georgia", false, {"Gelasio", "DejaVu Serif", "Liberation Serif"}},
+    {"Verdana", false, {"DejaVu Sans", "Bitstream Vera Sans", "Liberation Sans"}},
+};
+
+std::vector<FontFamily> familiesOf(const QStringList& desktop) {
+  std::vector<FontFamily> families;
+  for (const ClassicFamily& classic : classicFamilies) {
+    families.push_back({std::string(classic.name), classic.fixedPitch});
+  }
+  for (const QString& name : desktop) {
+    const bool known = std::any_of(families.begin(), families.end(), [&](const FontFamily& family) {
+      return family.name == utf8(name);
+    });
+    if (!known) families.push_back({utf8(name), false});
+  }
+  return families;
+}
+
+/// The family to draw `name` with.
+QString drawnFamily(std::string_view name) {
+  const QString wanted = qString(name);
+  if (QFontDatabase::hasFamily(wanted)) return wanted;
+  for (const ClassicFamily& classic : classicFamilies) {
+    if (classic.name != name) continue;
+    for (const char* standIn : classic.standIns) {
+      if (QFontDatabase::hasFamily(QLatin1String(standIn))) return QLatin1String(standIn);
+    }
+  }
+  return wanted;
+}
+
+}  // namespace
+
+std::optional<Font> QtFonts::fontWithName(std::string_view name, double size) const {
+  // Qt tells nobody but itself reliably when families come and go; counting them is cheap.
+  const QStringList desktop = QFontDatabase::families();
+  if (counted_ != desktop.size()) {
+    families_ = familiesOf(desktop);
+    counted_ = desktop.size();
+  }
+  auto font = fontNamed(name, size, families_);
+  // Asked only of the family that is meant, for Qt opens a family's files to answer.
+  if (font && !font->fixedPitch) {
+    font->fixedPitch = QFontDatabase::isFixedPitch(drawnFamily(font->family));
+  }
+  return font;
+}
+
+QFont qFont(const Font& font) {
+  QFont drawn(drawnFamily(font.family));
+  drawn.setPixelSize(std::max(1, static_cast<int>(std::lround(font.size))));
+  drawn.setBold(font.bold);
+  drawn.setItalic(font.italic);
+  drawn.setFixedPitch(font.fixedPitch);
+  if (font.fixedPitch) drawn.setStyleHint(QFont::TypeWriter);
+  return drawn;
+}
+
+}  // namespace toolkit::qt

@@ -1,0 +1,80 @@
+// Looking images up and drawing them. The file system is asked every time, so that what was found
+// earlier is never older than the directory; only what the files hold is remembered.
+
+#include "toolkit/qt/images.hpp"
+
+#include <QImageReader>
+#include <QPaintDevice>
+#include <QPainter>
+#include <filesystem>
+
+#include "toolkit/image_names.hpp"
+#include "toolkit/qt/strings.hpp"
+
+namespace toolkit::qt {
+
+namespace {
+
+QImage readImage(const std::string& path) {
+  QImageReader reader(qString(path));
+  reader.setDecideFormatFromContent(true);  // a suffix may be wrong
+  reader.setAutoTransform(true);            // photographs say which way up they are
+  return reader.read();
+}
+
+std::filesystem::file_time_type timeOf(const std::string& path) {
+  std::error_code error;
+  return std::filesystem::last_write_time(path, error);
+}
+
+std::string twofoldPath(const std::string& path) {
+  std::filesystem::path file(path);
+  file.replace_filename(file.stem().string() + "@2x" + file.extension().string());
+  return file.string();
+}
+
+}  // namespace
+
+QtImage::QtImage(std::string_view name, std::string path)
+    : name_(name), path_(std::move(path)), written_(timeOf(path_)), plain_(readImage(path_)) {
+  plain_.setDevicePixelRatio(1);
+  twofold_ = readImage(twofoldPath(path_));
+  if (!twofold_.isNull()) twofold_.setDevicePixelRatio(2);
+}
+
+bool QtImage::isOf(const std::string& path) const {
+  return path_ == path && written_ == timeOf(path);
+}
+
+QSizeF QtImage::size() const { return plain_.deviceIndependentSize(); }
+
+const QImage& QtImage::pixels(double ratio) const {
+  return ratio > 1 && !twofold_.isNull() ? twofold_ : plain_;
+}
+
+Ref<Image> QtImages::imageNamed(std::string_view name) {
+  const auto known = found_.find(name);
+  const auto path = imageFileNamed(name, files_.resourcePath());
+  if (known != found_.end() && path && known->second->isOf(*path)) return known->second;
+  if (known != found_.end()) found_.erase(known);
+  if (!path) return {};
+  const auto image = std::make_shared<QtImage>(name, *path);
+  if (image->size().isEmpty()) return {};
+  found_.emplace(name, image);
+  return image;
+}
+
+void drawImage(QPainter& painter, const QRect& place, const QtImage& image) {
+  // Not the device's: a widget that is drawn into a picture goes by the picture's.
+  const double ratio = painter.deviceTransform().m11();
+  const QSize pixels = place.size() * ratio;
+  // Scaled here and not by the painter, which smooths over four pixels however much it shrinks.
+  QImage scaled = image.pixels(ratio);
+  if (scaled.size() != pixels) {
+    scaled = scaled.scaled(pixels, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);
+  }
+  scaled.setDevicePixelRatio(ratio);
+  painter.drawImage(place.topLeft(), scaled);
+}
+
+}  // namespace toolkit::qt

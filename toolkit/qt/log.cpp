@@ -1,0 +1,20 @@
+// Log lines as Qt's messages.
+
+#include "toolkit/qt/log.hpp"
+
+#include <QLoggingCategory>
+
+#include "toolkit/qt/strings.hpp"
+
+namespace toolkit::qt {
+
+void QtLog::write(std::string_view line) {
+  static const QLoggingCategory category("qz.walkthrough");
+  const Sink sink = sink_;  // which may replace itself
+  if (sink)
+    sink(line);
+  else
+    qCInfo(category).noquote() << qString(line);
+}
+
+}  // namespace toolkit::qt

@@ -1,0 +1,25 @@
+// The Qt toolkit's log.
+#pragma once
+
+#include <functional>
+#include <string_view>
+#include <utility>
+
+#include "toolkit/log.hpp"
+
+namespace toolkit::qt {
+
+class QtLog final : public Log {
+ public:
+  using Sink = std::function<void(std::string_view)>;
+
+  /// To the sink; without one, to Qt's message handler as an information of the category
+  /// "qz.walkthrough".
+  void write(std::string_view line) override;
+  void setSink(Sink sink) { sink_ = std::move(sink); }
+
+ private:
+  Sink sink_;
+};
+
+}  // namespace toolkit::qt

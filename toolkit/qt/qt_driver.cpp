@@ -1,0 +1,317 @@
+// Acting as a user through Qt's own events, and looking at what the widgets show.
+
+#include "toolkit/qt/qt_driver.hpp"
+
+#include <QApplication>
+#include <QCheckBox>
+#include <QEventLoop>
+#include <QGroupBox>
+#include <QLabel>
+#include <QMouseEvent>
+#include <QPushButton>
+#include <QStyleOptionButton>
+#include <QTextDocument>
+#include <QTextDocumentFragment>
+#include <QTimer>
+#include <QToolButton>
+#include <QWindow>
+#include <algorithm>
+#include <chrono>
+#include <clocale>
+#include <cmath>
+#include <iterator>
+#include <utility>
+
+#include "toolkit/qt/button_look.hpp"
+#include "toolkit/qt/strings.hpp"
+#include "toolkit/qt/text_look.hpp"
+#include "toolkit/qt/views.hpp"
+#include "toolkit/qt/window.hpp"
+#include "toolkit/qt/window_look.hpp"
+
+namespace toolkit::qt {
+
+namespace {
+
+template <class W>
+QWidget* plain() {
+  return new W;
+}
+
+QWidget* pushButton() { return new QPushButton("Button"); }
+
+QWidget* toggle() {
+  auto* const button = new QPushButton("Button");
+  button->setCheckable(true);
+  return button;
+}
+
+QWidget* threeStates() {
+  auto* const button = new QCheckBox("Button");
+  button->setTristate(true);
+  return button;
+}
+
+QWidget* textField() {
+  auto* const label = new QLabel;
+  layOutAsTextField(*label);
+  return label;
+}
+
+QWidget* imageView() {
+  auto* const label = new QLabel;
+  label->setProperty(imageViewProperty, true);
+  return label;
+}
+
+struct Kind {
+  ViewKind kind;
+  std::string_view className;
+  QWidget* (*make)();
+};
+
+constexpr Kind kinds[] = {
+    {ViewKind::button, "QPushButton", pushButton},
+    {ViewKind::toggle, "QPushButton", toggle},
+    {ViewKind::mixed, "QCheckBox", threeStates},
+    {ViewKind::popUpButton, "QToolButton", plain<QToolButton>},
+    {ViewKind::textField, "QLabel", textField},
+    {ViewKind::imageView, "QLabel", imageView},
+    {ViewKind::box, "QGroupBox", plain<QGroupBox>},
+    {ViewKind::plain, "QWidget", plain<QWidget>},
+};
+
+const Kind& rowOf(ViewKind kind) {
+  return *std::find_if(std::begin(kinds), std::end(kinds),
+                       [&](const Kind& row) { return row.kind == kind; });
+}
+
+ViewKind kindOf(const QAbstractButton& button) {
+  const auto* const box = qobject_cast<const QCheckBox*>(&button);
+  if (box && box->isTristate()) return ViewKind::mixed;
+  if (button.isCheckable()) return ViewKind::toggle;
+  return qobject_cast<const QToolButton*>(&button) ? ViewKind::popUpButton : ViewKind::button;
+}
+
+ViewKind kindOf(View& view, const QWidget& widget) {
+  if (view.asButton()) return kindOf(static_cast<const QAbstractButton&>(widget));
+  if (view.asTextField()) return ViewKind::textField;
+  if (view.asImageView()) return ViewKind::imageView;
+  return qobject_cast<const QGroupBox*>(&widget) ? ViewKind::box : ViewKind::plain;
+}
+
+// Text that looks like markup is shown as markup that looks like the text.
+std::string plainToolTip(const QWidget& widget) {
+  const QString text = widget.toolTip();
+  if (!Qt::mightBeRichText(text)) return utf8(text);
+  return utf8(QTextDocumentFragment::fromHtml(text).toPlainText());
+}
+
+std::optional<std::string> nameOf(const Ref<Image>& image) {
+  return image ? std::optional(image->name()) : std::nullopt;
+}
+
+// Where there is a display, windows are shown on it.
+void drawOffTheScreenWithoutDisplay() {
+  const auto isSet = [](const char* name) { return !qEnvironmentVariableIsEmpty(name); };
+  if (isSet("QT_QPA_PLATFORM") || isSet("DISPLAY") || isSet("WAYLAND_DISPLAY")) return;
+#ifdef Q_OS_LINUX
+  qputenv("QT_QPA_PLATFORM", "offscreen");
+#endif
+}
+
+// Never destroyed: drivers come and go, and Qt allows for one application in a program's life.
+void requireApplication() {
+  if (QCoreApplication::instance()) return;
+  drawOffTheScreenWithoutDisplay();
+  static int argc = 1;
+  static char name[] = "qz-walkthrough";
+  static char* argv[] = {name, nullptr};
+  static QApplication* const application = new QApplication(argc, argv);
+  application->setQuitOnLastWindowClosed(false);
+  std::setlocale(LC_NUMERIC, "C");  // Qt sets the user's: numbers would be written with commas
+}
+
+// Qt keeps input from such windows, but not from events that are sent to their widgets.
+bool isBlocked(const QWidget& window) {
+  const auto all = QGuiApplication::topLevelWindows();
+  return std::any_of(all.begin(), all.end(), [&](const QWindow* modal) {
+    if (!modal->isVisible() || modal->modality() == Qt::NonModal) return false;
+    const QWindow* const own = window.windowHandle();
+    if (modal->modality() == Qt::ApplicationModal) return modal != own;
+    for (const QWindow* above = modal->transientParent(); above; above = above->transientParent())
+      if (above == own) return true;
+    return false;
+  });
+}
+
+// Check boxes and radio buttons take clicks on what they show, not on the room beside it.
+QPoint whereToClick(const QWidget& widget) {
+  QStyleOptionButton option;
+  option.initFrom(&widget);
+  if (qobject_cast<const QCheckBox*>(&widget))
+    return widget.style()->subElementRect(QStyle::SE_CheckBoxIndicator, &option, &widget).center();
+  return widget.rect().center();
+}
+
+void sendMouse(QWidget& widget, QEvent::Type type, Qt::MouseButtons held) {
+  const QPointF local = whereToClick(widget);
+  QMouseEvent event(type, local, widget.mapTo(widget.window(), local), widget.mapToGlobal(local),
+                    Qt::LeftButton, held, Qt::NoModifier);
+  QCoreApplication::sendEvent(&widget, &event);
+}
+
+}  // namespace
+
+QtDriver::QtDriver() {
+  setLogSink({});
+  toolkit_.calls().setHandler([this](const std::exception_ptr& thrown) {
+    if (!thrown_) thrown_ = thrown;
+  });
+}
+
+QtDriver::Sweep::~Sweep() { QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete); }
+
+Ref<Window> QtDriver::makeWindow(const Rect& content) {
+  auto window = QtWindow::make(content, StyleMask::titledAndClosable, toolkit_.application().desk(),
+                               KeptBy::maker);
+  window->makeKeyAndOrderFront();
+  return window;
+}
+
+Ref<View> QtDriver::makeView(ViewKind kind, long tag, const Rect& frame, const Ref<View>& parent) {
+  const auto node = qt::makeView(*rowOf(kind).make(), toolkit_.application().desk(), Widget::view);
+  node->place(frame);
+  Ref<View> view = node->view();
+  view->setTag(tag);
+  parent->addSubview(view);
+  return view;
+}
+
+void QtDriver::removeFromSuperview(const Ref<View>& view) {
+  if (const auto node = WidgetNode::of(view)) node->removeFromSuperview();
+}
+
+void QtDriver::setFrame(const Ref<View>& view, const Rect& frame) {
+  if (const auto node = WidgetNode::of(view)) node->place(frame);
+}
+
+void QtDriver::setCaption(const Ref<View>& view, std::string_view text) {
+  asTextField(view)->setStringValue(text);
+  asButton(view)->setTitle(text);
+  if (const auto imageView = asImageView(view))
+    imageView->setImage(toolkit_.images().imageNamed(text));
+}
+
+void QtDriver::setWindowTitle(const Ref<Window>& window, std::string_view title) {
+  const auto shown = QtWindow::of(window);
+  if (shown && shown->widget()) shown->widget()->setWindowTitle(qString(title));
+}
+
+void QtDriver::setResourcePath(std::string_view path) { toolkit_.files().setResourcePath(path); }
+
+std::string_view QtDriver::className(ViewKind kind) const { return rowOf(kind).className; }
+
+void QtDriver::click(const Ref<View>& view) {
+  settle();
+  const auto node = WidgetNode::of(view);
+  const QPointer<QWidget> widget = node ? node->widget() : nullptr;
+  if (!widget || !widget->isVisible() || isBlocked(*widget->window())) return;
+  sendMouse(*widget, QEvent::MouseButtonPress, Qt::LeftButton);
+  if (widget) sendMouse(*widget, QEvent::MouseButtonRelease, Qt::NoButton);
+  settle();
+  raiseWhatWasThrown();
+}
+
+void QtDriver::advance(double seconds) {
+  PacedClock::Going going(clock_, seconds > 0 ? seconds : 0);
+  toolkit_.runLoop().wake();
+  while (!going.isOver() && !thrown_) {
+    // The loop waits for events; one of them is that the time is up.
+    QTimer end;
+    end.setTimerType(Qt::PreciseTimer);
+    end.callOnTimeout([] {});
+    end.start(std::chrono::milliseconds(std::lround(std::ceil(going.left() * 1000))));
+    QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
+  }
+  if (!thrown_) {
+    toolkit_.runLoop().wake();
+    going.finish();
+  }
+  settle();
+  raiseWhatWasThrown();
+}
+
+// What was posted is done, what changed is painted, and what is to be deleted is gone.
+void QtDriver::settle() {
+  QCoreApplication::processEvents();
+  QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+}
+
+void QtDriver::raiseWhatWasThrown() {
+  if (thrown_) std::rethrow_exception(std::exchange(thrown_, nullptr));
+}
+
+ViewPicture QtDriver::look(const Ref<View>& view) {
+  ViewPicture picture;
+  const auto node = WidgetNode::of(view);
+  if (!node || !node->widget()) return picture;
+  const QWidget& widget = *node->widget();
+  picture.kind = kindOf(*view, widget);
+  picture.className = view->className();
+  picture.tag = view->tag();
+  picture.frame = view->frame();
+  picture.hidden = node->isHidden();
+  picture.enabled = widget.isEnabledTo(widget.parentWidget());
+  picture.state = view->state();
+  picture.toolTip = plainToolTip(widget);
+  if (const auto* control = dynamic_cast<const ControlNode*>(node.get())) {
+    picture.text = control->value();
+    picture.target = control->target();
+    if (!control->action().empty()) picture.action = control->action();
+  }
+  if (const auto* button = qobject_cast<const QAbstractButton*>(&widget)) {
+    picture.highlighted = isHighlighted(*button);
+    picture.title = shownTitle(*button);
+    picture.background = faceColor(*button);
+  }
+  if (const auto* imageView = dynamic_cast<const QtImageView*>(node.get()))
+    picture.image = nameOf(imageView->image());
+  return picture;
+}
+
+WindowPicture QtDriver::look(const Ref<Window>& window) {
+  WindowPicture picture;
+  settle();
+  const auto shown = QtWindow::of(window);
+  if (!shown || !shown->widget()) return picture;
+  const QWidget& widget = *shown->widget();
+  picture.visible = widget.isVisible();
+  picture.key = widget.isActiveWindow();
+  picture.closes = shown->closes();
+  picture.content = shown->content();
+  const auto flags = widget.windowFlags();
+  if (flags & Qt::WindowTitleHint) picture.style |= static_cast<unsigned>(StyleMask::titled);
+  if (flags & Qt::WindowCloseButtonHint)
+    picture.style |= static_cast<unsigned>(StyleMask::closable);
+  picture.background = windowColor(widget);
+  picture.delegate = shown->delegate();
+  if (const auto content = WidgetNode::of(shown->contentView())) {
+    picture.layered = isLayered(*content->widget());
+    picture.layerImage = nameOf(layerContents(*content->widget()));
+  }
+  picture.sheetOf = shown->sheetParent();
+  picture.sheetEnds = shown->sheetEnds();
+  return picture;
+}
+
+void QtDriver::setLogSink(std::function<void(std::string_view)> sink) {
+  toolkit_.log().setSink(sink ? std::move(sink) : [](std::string_view) {});
+}
+
+std::unique_ptr<TestDriver> makeQtDriver() {
+  requireApplication();
+  return std::make_unique<QtDriver>();
+}
+
+}  // namespace toolkit::qt

@@ -1,0 +1,65 @@
+// The driver of the Qt toolkit. Without a display its windows are drawn off the screen.
+#pragma once
+
+#include <exception>
+#include <functional>
+#include <memory>
+
+#include "toolkit/qt/paced_clock.hpp"
+#include "toolkit/qt/qt_toolkit.hpp"
+#include "toolkit/test_driver.hpp"
+
+namespace toolkit::qt {
+
+class QtDriver final : public TestDriver {
+ public:
+  /// Makes the application object where there is none.
+  QtDriver();
+
+  std::string_view name() const override { return "qt"; }
+  QtToolkit& toolkit() override { return toolkit_; }
+
+  Ref<Window> makeWindow(const Rect& content) override;
+  /// With an absent `parent`, a view that is in no window yet.
+  Ref<View> makeView(ViewKind kind, long tag, const Rect& frame, const Ref<View>& parent) override;
+  void removeFromSuperview(const Ref<View>& view) override;
+  void setFrame(const Ref<View>& view, const Rect& frame) override;
+  void setCaption(const Ref<View>& view, std::string_view text) override;
+  void setWindowTitle(const Ref<Window>& window, std::string_view title) override;
+  void setResourcePath(std::string_view path) override;
+  std::string_view className(ViewKind kind) const override;
+
+  /// Presses and releases the mouse button there.
+  void click(const Ref<View>& view) override;
+  /// Waits, while Qt's event loop runs. The clock stands still at other times.
+  void advance(double seconds) override;
+
+  bool hasPerson() const override;
+  void handOver(const std::function<void(const Ref<View>&)>& willAct,
+                const std::function<bool()>& goesOn) override;
+
+  bool draws() const override { return true; }
+  bool savePicture(const Ref<Window>& window, const std::string& path) override;
+  ViewPicture look(const Ref<View>& view) override;
+  WindowPicture look(const Ref<Window>& window) override;
+  void setLogSink(std::function<void(std::string_view)> sink) override;
+
+ private:
+  void settle();
+  void raiseWhatWasThrown();
+
+  // What waits for the event loop to be deleted would wait for the next driver's.
+  struct Sweep {
+    ~Sweep();
+  };
+
+  PacedClock clock_;
+  const Sweep atTheEnd_{};
+  std::exception_ptr thrown_;  // by what the last click or advance led to
+  QtToolkit toolkit_{clock_};
+};
+
+/// A driver with a Qt toolkit of its own.
+std::unique_ptr<TestDriver> makeQtDriver();
+
+}  // namespace toolkit::qt

@@ -1,0 +1,51 @@
+// Setting the one timer of Qt's.
+
+#include "toolkit/qt/run_loop.hpp"
+
+#include <algorithm>
+#include <chrono>
+#include <cmath>
+#include <utility>
+
+namespace toolkit::qt {
+
+namespace {
+
+// Qt counts milliseconds in an int, 24 days. Longer waits are made up of such ones, in seconds.
+constexpr double longestWait = 24 * 60 * 60;
+
+}  // namespace
+
+QtRunLoop::QtRunLoop(Clock& clock, Calls& calls) : clock_(clock), calls_(calls) {
+  alarm_.setSingleShot(true);
+  alarm_.setTimerType(Qt::PreciseTimer);
+  alarm_.callOnTimeout([this] { wake(); });
+}
+
+QtRunLoop::~QtRunLoop() { invalidateAll(); }
+
+Ref<Timer> QtRunLoop::schedule(double interval, bool repeats, TimerAction action) {
+  auto timer = TimedRunLoop::schedule(interval, repeats, std::move(action));
+  setAlarm();
+  return timer;
+}
+
+void QtRunLoop::wake() {
+  calls_.make([this] { fireDue(clock_.horizon()); });
+  setAlarm();
+}
+
+// The firing may run an event loop of its own, in which the others fire.
+void QtRunLoop::reach(double due) {
+  clock_.reach(due);
+  setAlarm();
+}
+
+void QtRunLoop::setAlarm() {
+  const auto due = nextDue();
+  if (!due) return alarm_.stop();
+  const double wait = std::clamp(*due - clock_.horizon(), 0.0, longestWait);
+  alarm_.start(std::chrono::milliseconds(std::llround(std::ceil(wait * 1000))));
+}
+
+}  // namespace toolkit::qt

@@ -1,0 +1,176 @@
+// What labels, line edits and text edits show.
+
+#include "toolkit/qt/text_look.hpp"
+
+#include <QEvent>
+#include <QLabel>
+#include <QLineEdit>
+#include <QPlainTextEdit>
+#include <QSignalBlocker>
+#include <QTextDocument>
+#include <QTextEdit>
+
+#include "toolkit/qt/accessibility.hpp"
+#include "toolkit/qt/decoration.hpp"
+#include "toolkit/qt/mnemonics.hpp"
+#include "toolkit/qt/rich_text.hpp"
+#include "toolkit/qt/strings.hpp"
+
+namespace toolkit::qt {
+
+namespace {
+
+/// The document of a text edit of either kind, or null.
+QTextDocument* documentOf(const QWidget& widget) {
+  if (const auto* const edit = qobject_cast<const QTextEdit*>(&widget)) return edit->document();
+  if (const auto* const edit = qobject_cast<const QPlainTextEdit*>(&widget))
+    return edit->document();
+  return nullptr;
+}
+
+/// What the widget itself says that it shows, to find out whether somebody has changed it.
+QString rawText(const QWidget& widget) {
+  if (const auto* const label = qobject_cast<const QLabel*>(&widget)) return label->text();
+  if (const auto* const edit = qobject_cast<const QLineEdit*>(&widget)) return edit->text();
+  const QTextDocument* const document = documentOf(widget);
+  return document ? document->toPlainText() : QString();
+}
+
+QString plainTextOf(const QLabel& label) {
+  const QString text = label.text();
+  const Qt::TextFormat format = label.textFormat();
+  const bool rich = format == Qt::RichText || (format == Qt::AutoText && Qt::mightBeRichText(text));
+  if (rich || format == Qt::MarkdownText) {
+    QTextDocument document;
+    rich ? document.setHtml(text) : document.setMarkdown(text);
+    return document.toPlainText();
+  }
+  return label.buddy() ? withoutMnemonic(text) : text;
+}
+
+/// Has an edit write what comes next in its own font and colour.
+void forgetFormat(QWidget& widget) {
+  if (auto* const edit = qobject_cast<QTextEdit*>(&widget)) edit->setCurrentCharFormat({});
+  if (auto* const edit = qobject_cast<QPlainTextEdit*>(&widget)) edit->setCurrentCharFormat({});
+}
+
+void showPlain(QLabel& label, const QString& text) {
+  const Qt::TextFormat format = label.textFormat();
+  const bool guesses = format == Qt::AutoText;
+  if (guesses ? Qt::mightBeRichText(text) : format != Qt::PlainText) {
+    label.setTextFormat(Qt::PlainText);
+  }
+  label.setText(label.buddy() ? withoutMeaning(text) : text);
+}
+
+void showRich(QLabel& label, const QString& html) {
+  const Qt::TextFormat format = label.textFormat();
+  if (format != Qt::RichText && format != Qt::AutoText) label.setTextFormat(Qt::RichText);
+  label.setText(html);
+}
+
+/// Remembers the attributed text that a widget shows, and shows it again when the widget's colours
+/// change, for Qt neither greys text that has a colour nor turns it to the other writing direction.
+class TextLook final : public QObject {
+ public:
+  explicit TextLook(QWidget& widget) : QObject(&widget), widget_(widget) {
+    widget.installEventFilter(this);
+  }
+
+  void show(const AttributedString& text) {
+    text_ = text;
+    draw();
+    if (qobject_cast<QLabel*>(&widget_)) announceShownName(widget_, qString(text.string()));
+  }
+  const AttributedString& text() const { return text_; }
+  bool isStale() const { return rawText(widget_) != raw_; }
+
+  bool eventFilter(QObject*, QEvent* event) override {
+    const QEvent::Type type = event->type();
+    if (type != QEvent::EnabledChange && type != QEvent::PaletteChange &&
+        type != QEvent::LayoutDirectionChange)
+      return false;
+    if (isStale()) return false;
+    const QSignalBlocker quiet(documentOf(widget_));  // the text stays the same
+    draw();
+    return false;
+  }
+
+ private:
+  TextSetting setting() const {
+    const QPalette palette = widget_.palette();
+    const bool edited = documentOf(widget_);
+    const auto ground = edited ? QPalette::Base : widget_.backgroundRole();
+    const auto ink = edited ? QPalette::Text : widget_.foregroundRole();
+    TextSetting setting{widget_.font(), palette.color(QPalette::Active, QPalette::Link),
+                        palette.color(ground)};
+    setting.direction = widget_.layoutDirection();
+    setting.greyed = !widget_.isEnabled();
+    if (setting.greyed) setting.ink = palette.color(ink);
+    if (const auto* const label = qobject_cast<QLabel*>(&widget_)) {
+      setting.unasked = label->alignment() & Qt::AlignHorizontal_Mask;
+    }
+    return setting;
+  }
+
+  void draw() {
+    if (auto* const label = qobject_cast<QLabel*>(&widget_)) {
+      showRich(*label, htmlOf(text_, setting()));
+    } else if (auto* const edit = qobject_cast<QLineEdit*>(&widget_)) {
+      edit->setText(qString(text_.string()));
+    } else if (QTextDocument* const document = documentOf(widget_)) {
+      TextSetting whole = setting();
+      whole.dropsLastLineEnd = false;  // it is the user's to edit
+      showIn(*document, text_, whole);
+    }
+    raw_ = rawText(widget_);
+  }
+
+  QWidget& widget_;  // its parent
+  AttributedString text_;
+  QString raw_;
+};
+
+}  // namespace
+
+bool showsText(const QWidget& widget) {
+  return qobject_cast<const QLabel*>(&widget) || qobject_cast<const QLineEdit*>(&widget) ||
+         documentOf(widget);
+}
+
+void showText(QWidget& widget, std::string_view text) {
+  if (auto* const look = decorationOn<TextLook>(widget)) {
+    delete look;
+    forgetFormat(widget);
+  }
+  const QString plain = qString(text);
+  if (auto* const label = qobject_cast<QLabel*>(&widget)) {
+    showPlain(*label, plain);
+    announceShownName(widget, plain);
+  } else if (auto* const line = qobject_cast<QLineEdit*>(&widget)) {
+    line->setText(plain);
+  } else if (auto* const edit = qobject_cast<QTextEdit*>(&widget)) {
+    edit->setPlainText(plain);
+  } else if (auto* const plainEdit = qobject_cast<QPlainTextEdit*>(&widget)) {
+    plainEdit->setPlainText(plain);
+  }
+}
+
+void showText(QWidget& widget, const AttributedString& text) {
+  if (isPlain(text)) return showText(widget, text.string());
+  if (showsText(widget)) decorated<TextLook>(widget).show(text);
+}
+
+AttributedString shownText(const QWidget& widget) {
+  const auto* const look = decorationOn<TextLook>(widget);
+  if (look && !look->isStale()) return look->text();
+  const auto* const label = qobject_cast<const QLabel*>(&widget);
+  return AttributedString(utf8(label ? plainTextOf(*label) : rawText(widget)));
+}
+
+void layOutAsTextField(QLabel& label) {
+  label.setWordWrap(true);
+  label.setAlignment(Qt::AlignTop | Qt::AlignLeading);
+}
+
+}  // namespace toolkit::qt

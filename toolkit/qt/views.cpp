@@ -1,0 +1,134 @@
+// Kinds of view: telling them, sending actions, and what each kind shows.
+
+#include "toolkit/qt/views.hpp"
+
+#include <QCheckBox>
+#include <QVariant>
+
+#include "toolkit/qt/button_look.hpp"
+#include "toolkit/qt/check_state.hpp"
+#include "toolkit/qt/text_look.hpp"
+#include "toolkit/qt/window.hpp"
+
+namespace toolkit::qt {
+
+namespace {
+
+bool isImageView(const QWidget& widget) {
+  const auto* const label = qobject_cast<const QLabel*>(&widget);
+  return label && (widget.property(imageViewProperty).toBool() ||
+                   !label->pixmap(Qt::ReturnByValue).isNull());
+}
+
+template <class V>
+std::shared_ptr<WidgetNode> make(QWidget& widget, const std::shared_ptr<Desk>& desk,
+                                 Widget keptBy) {
+  const auto view = std::make_shared<V>(widget, desk, keptBy);
+  desk->enter(widget, view);
+  return view;
+}
+
+}  // namespace
+
+std::shared_ptr<WidgetNode> makeView(QWidget& widget, const std::shared_ptr<Desk>& desk,
+                                     Widget keptBy) {
+  if (qobject_cast<QAbstractButton*>(&widget)) return make<QtButton>(widget, desk, keptBy);
+  if (isImageView(widget)) return make<QtImageView>(widget, desk, keptBy);
+  if (showsText(widget)) return make<QtTextField>(widget, desk, keptBy);
+  return make<QtView<View>>(widget, desk, keptBy);
+}
+
+bool ControlNode::send(std::string_view action, const std::shared_ptr<Responder>& target) {
+  if (action.empty()) return false;
+  // Whoever performs the action may take the sender away, and all of its window, and change its
+  // action and target: what is needed until the end is held here.
+  const std::string selector(action);
+  const Ref<View> sender = view();
+  // NOLINTNEXTLINE(performance-unnecessary-copy-initialization)
+  if (const auto receiver = target) return receiver->tryToPerform(selector, sender);
+
+  const QPointer<QWidget> top = widget()->window();
+  for (Ref<View> responder = sender; responder; responder = of(responder)->superview())
+    if (responder->tryToPerform(selector, sender)) return true;
+  const auto window = top ? desk_->knownWindow(*top) : nullptr;
+  const auto delegate = window ? window->delegate() : nullptr;
+  return delegate && delegate->tryToPerform(selector, sender);
+}
+
+QtButton::~QtButton() { QObject::disconnect(clicks_); }
+
+// The host's own connections to the click go, and come back no more; those to other signals stay.
+void QtButton::takeClicks() {
+  QAbstractButton* const button = this->button();
+  if (!button) return;
+  QObject::disconnect(button, &QAbstractButton::clicked, nullptr, nullptr);
+  clicks_ = QObject::connect(button, &QAbstractButton::clicked, [this] { clicked(); });
+}
+
+void QtButton::clicked() {
+  const Ref<View> kept = view();  // what is done may let it go
+  qt::setHighlighted(*button(), false);
+  if (desk_->willAct) desk_->willAct(kept);
+  desk_->calls.make([this] { send(action_, target()); });
+}
+
+void QtButton::setTitle(std::string_view title) {
+  if (button()) showTitle(*button(), title);
+  changed();
+}
+
+std::optional<AttributedString> QtButton::attributedTitle() const {
+  if (!button()) return std::nullopt;
+  return shownTitle(*button());
+}
+
+void QtButton::setAttributedTitle(const AttributedString& title) {
+  if (button()) showTitle(*button(), title);
+  changed();
+}
+
+State QtButton::state() const {
+  if (!button()) return State::off;
+  return button()->isCheckable() ? checkState(*button()) : heldState_;
+}
+
+void QtButton::setState(State state) {
+  if (!button()) return;
+  if (button()->isCheckable())
+    setCheckState(*button(), state);
+  else
+    heldState_ = state == State::mixed ? State::on : state;
+  changed();
+}
+
+bool QtButton::isHighlighted() const { return button() && qt::isHighlighted(*button()); }
+
+void QtButton::highlight(bool highlighted) {
+  if (button()) qt::setHighlighted(*button(), highlighted);
+  changed();
+}
+
+void QtButton::setBackgroundColor(const Color& color) {
+  if (button()) setFaceColor(*button(), color);
+  changed();
+}
+
+void QtButton::setBezelStyle(BezelStyle style) {
+  if (button()) setBezel(*button(), style);
+  changed();
+}
+
+AttributedString QtTextField::value() const {
+  return widget() ? shownText(*widget()) : AttributedString();
+}
+
+void QtTextField::setValue(const AttributedString& value) { showText(*widget(), value); }
+
+void QtImageView::setImage(const Ref<Image>& image) {
+  if (label()) showImage(*label(), image);
+  changed();
+}
+
+Ref<Image> QtImageView::image() const { return label() ? shownImage(*label()) : Ref<Image>(); }
+
+}  // namespace toolkit::qt

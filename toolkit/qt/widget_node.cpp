@@ -1,0 +1,190 @@
+// The tree of widgets as a tree of views. Qt owns the widgets; a view that is in none, as a host
+// took it out or a script has not put it in yet, ends its widget itself.
+
+#include "toolkit/qt/widget_node.hpp"
+
+#include <QEvent>
+#include <QVariant>
+#include <algorithm>
+
+#include "toolkit/exception.hpp"
+#include "toolkit/qt/coordinates.hpp"
+#include "toolkit/qt/focus.hpp"
+
+namespace toolkit::qt {
+
+namespace {
+
+// While it lives its widget has not been painted.
+class PaintingAwaited final : public QObject {
+ public:
+  PaintingAwaited(QWidget& widget, std::unique_ptr<QObject>& holder) : holder_(holder) {
+    widget.installEventFilter(this);
+  }
+  bool eventFilter(QObject*, QEvent* event) override {
+    if (event->type() == QEvent::Paint) {
+      holder_.release();
+      deleteLater();
+    }
+    return false;
+  }
+
+ private:
+  std::unique_ptr<QObject>& holder_;  // its own
+};
+
+void refuse(const std::string& receiver, const std::string& what) {
+  throw InvalidArgumentException("-[" + receiver + " addSubview:]: " + what);
+}
+
+bool isSubview(const QObject* child) {
+  return child->isWidgetType() && !static_cast<const QWidget*>(child)->isWindow();
+}
+
+}  // namespace
+
+WidgetNode::WidgetNode(QWidget& widget, const std::shared_ptr<Desk>& desk, Widget keptBy)
+    : widget_(&widget),
+      desk_(desk),
+      key_(&widget),
+      keptBy_(keptBy),
+      hadTag_(widget.property(tagProperty).isValid()) {}
+
+// Not at once: this may come about in an event of the widget's own.
+WidgetNode::~WidgetNode() {
+  desk_->forgetView(key_);
+  if (widget_ && keptBy_ == Widget::view && !widget_->parentWidget()) widget_->deleteLater();
+}
+
+std::shared_ptr<WidgetNode> WidgetNode::of(const Ref<View>& view) {
+  return std::dynamic_pointer_cast<WidgetNode>(view.pointer());
+}
+
+Ref<View> WidgetNode::view() { return std::shared_ptr<View>(shared_from_this(), &role()); }
+
+std::string WidgetNode::nameOfClass() const {
+  return widget_ ? widget_->metaObject()->className() : "";
+}
+
+long WidgetNode::readTag() const {
+  return widget_ ? static_cast<long>(widget_->property(tagProperty).toLongLong()) : 0;
+}
+
+void WidgetNode::writeTag(long tag) {
+  if (!widget_) return;
+  const bool leavesNothing = tag == 0 && !hadTag_;
+  widget_->setProperty(tagProperty,
+                       leavesNothing ? QVariant() : QVariant(static_cast<qlonglong>(tag)));
+}
+
+bool WidgetNode::isWhereItWasPut() const {
+  if (!placement_) return false;
+  const QWidget* const around = widget_->parentWidget();
+  return !around || (placement_->geometry == widget_->geometry() &&
+                     placement_->areaHeight == around->height());
+}
+
+Rect WidgetNode::readFrame() const {
+  if (!widget_) return {};
+  if (isWhereItWasPut()) return placement_->frame;
+  const Rect geometry = exactly(widget_->geometry());
+  if (widget_->isWindow()) return {0, 0, geometry.width, geometry.height};
+  return flipped(geometry, widget_->parentWidget()->height());
+}
+
+void WidgetNode::place(const Rect& frame) {
+  if (!widget_) return;
+  const QWidget* const around = widget_->parentWidget();
+  const int areaHeight = around ? around->height() : 0;
+  widget_->setGeometry(rounded(flipped(frame, areaHeight)));
+  placement_ = Placement{frame, widget_->geometry(), areaHeight};
+  changed();
+}
+
+const Subviews& WidgetNode::readSubviews() {
+  std::vector<QWidget*> children;
+  if (widget_)
+    for (QObject* const child : widget_->children())
+      if (isSubview(child)) children.push_back(static_cast<QWidget*>(child));
+  if (std::equal(children.begin(), children.end(), listed_.begin(), listed_.end()))
+    return subviews_;
+  Subviews fresh;
+  for (QWidget* const child : children) fresh.push_back(desk_->viewOf(*child));
+  subviews_.swap(fresh);
+  listed_.assign(children.begin(), children.end());
+  return subviews_;
+}
+
+void WidgetNode::insert(const Ref<View>& view) {
+  const auto node = of(view);
+  const auto receiver = nameOfClass();
+  if (!view) refuse(receiver, "the view is absent");
+  if (!node) refuse(receiver, "the view, of class " + view->className() + ", is another toolkit's");
+  if (!widget_ || !node->widget_) return;
+  QWidget& added = *node->widget_;
+  if (added.isWindow() && node->keptBy_ == Widget::host)
+    refuse(receiver, "the view is the content view of a window");
+  if (&added == widget_ || added.isAncestorOf(widget_))
+    refuse(receiver, "the view is the superview itself, or lies around it");
+
+  const Ref<View> kept = view;  // the reference may be one of the list that it leaves now
+  const Rect frame = node->readFrame();
+  const bool hidden = node->isHidden();
+  added.setParent(widget_);
+  node->place(frame);
+  added.raise();
+  added.setVisible(!hidden);
+  // At the end, where it belongs, so that it is owned; whatever else has changed is seen later.
+  subviews_.push_back(kept);
+  listed_.push_back(&added);
+  changed();
+}
+
+void WidgetNode::removeFromSuperview() {
+  if (!widget_ || !widget_->parentWidget()) return;
+  const auto around = of(superview());
+  const auto kept = shared_from_this();
+  placement_ = Placement{readFrame(), {}, 0};
+  hiddenOutside_ = widget_->isHidden();
+  giveFocusAway(*widget_);
+  widget_->setParent(nullptr);
+  keptBy_ = Widget::view;
+  around->readSubviews();
+  around->changed();
+}
+
+bool WidgetNode::isOutside() const { return keptBy_ == Widget::view && !widget_->parentWidget(); }
+
+bool WidgetNode::isHidden() const {
+  if (!widget_) return false;
+  return isOutside() ? hiddenOutside_ : widget_->isHidden();
+}
+
+// Outside of any other, Qt would show it as a window of its own.
+void WidgetNode::hide(bool hidden) {
+  if (!widget_) return;
+  if (hidden) giveFocusAway(*widget_);
+  if (isOutside())
+    hiddenOutside_ = hidden;
+  else
+    widget_->setVisible(!hidden);
+  changed();
+}
+
+void WidgetNode::enable(bool enabled) {
+  if (!widget_) return;
+  if (!enabled) giveFocusAway(*widget_);
+  widget_->setEnabled(enabled);
+  changed();
+}
+
+void WidgetNode::changed() {
+  if (widget_ && !redraw_) redraw_ = std::make_unique<PaintingAwaited>(*widget_, redraw_);
+}
+
+Ref<View> WidgetNode::superview() const {
+  if (!widget_ || widget_->isWindow() || !widget_->parentWidget()) return {};
+  return desk_->viewOf(*widget_->parentWidget());
+}
+
+}  // namespace toolkit::qt

@@ -1,0 +1,205 @@
+// Windows as they come and go, and sheets. Whatever hides a sheet but this toolkit itself, such as
+// Escape, the close button, or a dialog's own buttons, ends it with the code 0.
+
+#include "toolkit/qt/window.hpp"
+
+#include <QEvent>
+#include <QGuiApplication>
+#include <QKeyEvent>
+#include <QMainWindow>
+#include <QScreen>
+#include <utility>
+
+#include "toolkit/qt/coordinates.hpp"
+#include "toolkit/qt/sheet_place.hpp"
+#include "toolkit/qt/views.hpp"
+#include "toolkit/qt/window_look.hpp"
+
+namespace toolkit::qt {
+
+namespace {
+
+// What a user's cancelling means (`NSModalResponseCancel`).
+constexpr long cancelled = 0;
+
+Rect onScreen(const QWidget& widget, const Rect& rect) {
+  return flipped(rect, widget.screen()->geometry().height());
+}
+
+QWidget* contentOf(QWidget& window) {
+  const auto* const mainWindow = qobject_cast<const QMainWindow*>(&window);
+  return mainWindow ? mainWindow->centralWidget() : &window;
+}
+
+Qt::WindowFlags flagsOf(StyleMask style) {
+  const auto bits = static_cast<unsigned>(style);
+  Qt::WindowFlags flags = Qt::Window | Qt::CustomizeWindowHint;
+  if (bits & static_cast<unsigned>(StyleMask::titled)) flags |= Qt::WindowTitleHint;
+  if (bits & static_cast<unsigned>(StyleMask::closable))
+    flags |= Qt::WindowSystemMenuHint | Qt::WindowCloseButtonHint;
+  return flags;
+}
+
+}  // namespace
+
+// What happens to the widget without this toolkit's doing.
+class QtWindow::Watch final : public QObject {
+ public:
+  explicit Watch(QtWindow& window) : window_(window) { window.widget_->installEventFilter(this); }
+
+  bool eventFilter(QObject*, QEvent* event) override {
+    switch (event->type()) {
+      case QEvent::Close:
+        ++window_.closes_;
+        break;
+      case QEvent::Hide:
+        // Its consequences may end the window, which Qt is still busy hiding.
+        if (!event->spontaneous())
+          QMetaObject::invokeMethod(
+              this, [this] { window_.wasHidden(); }, Qt::QueuedConnection);
+        break;
+      case QEvent::KeyPress:
+        if (!window_.place_ || static_cast<QKeyEvent*>(event)->key() != Qt::Key_Escape) break;
+        window_.widget_->close();
+        return true;
+      default:
+        break;
+    }
+    return false;
+  }
+
+ private:
+  QtWindow& window_;  // its owner
+};
+
+QtWindow::QtWindow(QWidget& widget, const std::shared_ptr<Desk>& desk, KeptBy keptBy)
+    : widget_(&widget), desk_(desk), key_(&widget), keptBy_(keptBy) {
+  watch_ = std::make_unique<Watch>(*this);
+}
+
+std::shared_ptr<QtWindow> QtWindow::make(QWidget& widget, const std::shared_ptr<Desk>& desk,
+                                         KeptBy keptBy) {
+  const std::shared_ptr<QtWindow> window(new QtWindow(widget, desk, keptBy));
+  desk->enter(widget, window);
+  return window;
+}
+
+std::shared_ptr<QtWindow> QtWindow::make(const Rect& content, StyleMask style,
+                                         const std::shared_ptr<Desk>& desk, KeptBy keptBy) {
+  auto* const widget = new QWidget(nullptr, flagsOf(style));  // ends in our destructor
+  auto window = make(*widget, desk, keptBy);
+  widget->setGeometry(rounded(onScreen(*widget, content)));
+  window->asked_ = content;
+  return window;
+}
+
+// Not at once: this may come about in an event of the widget's own.
+QtWindow::~QtWindow() {
+  watch_.reset();
+  detach();
+  desk_->forgetWindow(key_);
+  if (!widget_ || keptBy_ == KeptBy::host) return;
+  widget_->hide();
+  widget_->deleteLater();
+}
+
+std::shared_ptr<QtWindow> QtWindow::of(const Ref<Window>& window) {
+  return std::dynamic_pointer_cast<QtWindow>(window.pointer());
+}
+
+Ref<View> QtWindow::contentView() const {
+  QWidget* const content = widget_ ? contentOf(*widget_) : nullptr;
+  if (!content) return content_ = nullptr;
+  const auto known = WidgetNode::of(content_);
+  if (!known || known->widget() != content) content_ = desk_->viewOf(*content);
+  return content_;
+}
+
+void QtWindow::setBackgroundColor(const Color& color) {
+  if (widget_) setWindowColor(*widget_, color);
+}
+
+void QtWindow::show() {
+  if (widget_->isMinimized())
+    widget_->showNormal();
+  else
+    widget_->show();
+  // Off the screen windows have no order, and Qt complains of being asked for one.
+  if (QGuiApplication::platformName() != "offscreen") widget_->raise();
+  widget_->activateWindow();
+  if (!settled_) settled_ = widget_->geometry();
+}
+
+void QtWindow::makeKeyAndOrderFront() {
+  if (!widget_) return;
+  if (keptBy_ == KeptBy::application) desk_->keep(shared_from_this());
+  show();
+  for (const auto& other : desk_->windows())
+    if (other->sheetParent().get() == this) other->makeKeyAndOrderFront();
+}
+
+void QtWindow::orderOut() {
+  const auto kept = shared_from_this();
+  const auto parent = sheetParent();
+  detach();
+  if (widget_) widget_->hide();
+  desk_->letGo(*this);
+  if (parent && parent->widget_ && parent->widget_->isVisible()) parent->widget_->activateWindow();
+}
+
+// A window that has never been on the screen is closed all the same, without Qt.
+void QtWindow::close() {
+  const auto kept = shared_from_this();
+  const int before = closes_;
+  if (widget_) widget_->close();
+  if (closes_ == before) ++closes_;
+  if (!widget_ || !widget_->isVisible()) orderOut();
+}
+
+Rect QtWindow::content() const {
+  if (!widget_) return {};
+  const QRect geometry = widget_->geometry();
+  if (asked_ && geometry == settled_.value_or(rounded(onScreen(*widget_, *asked_)))) return *asked_;
+  return onScreen(*widget_, exactly(geometry));
+}
+
+void QtWindow::detach() {
+  sheetParent_.reset();
+  if (widget_ && place_ && widget_->isVisible()) widget_->hide();
+  place_.reset();
+}
+
+void QtWindow::wasHidden() {
+  const auto kept = shared_from_this();
+  if (widget_ && widget_->isVisible()) return;
+  const bool wasSheet = place_ != nullptr;
+  orderOut();
+  if (wasSheet) endAsSheet(cancelled);
+}
+
+void QtWindow::beginAsSheet(const std::shared_ptr<QtWindow>& parent,
+                            const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo) {
+  detach();
+  session_ = Session{delegate, contextInfo};
+  // A window that is attached to itself, in however many steps, could never be used again.
+  bool isItsOwn = false;
+  for (auto above = parent; above; above = above->sheetParent()) isItsOwn |= above.get() == this;
+  if (parent && !isItsOwn) {
+    sheetParent_ = parent;
+    if (widget_ && parent->widget_) {
+      widget_->hide();  // modality is settled when a window is shown
+      place_ = std::make_unique<SheetPlace>(*widget_, *parent->widget_);
+    }
+  }
+  makeKeyAndOrderFront();
+}
+
+void QtWindow::endAsSheet(long returnCode) {
+  sheetEnds_.push_back(returnCode);
+  const auto session = std::exchange(session_, std::nullopt);
+  if (!session) return;
+  if (const auto delegate = session->delegate.lock())
+    delegate->sheetDidEnd(shared_from_this(), returnCode, session->contextInfo);
+}
+
+}  // namespace toolkit::qt

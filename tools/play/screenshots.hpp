@@ -1,0 +1,36 @@
+// Pictures of a walk-through in a directory: one PNG file a step, numbered in their order, and the
+// transcript.
+#pragma once
+
+#include <fstream>
+#include <string>
+#include <string_view>
+
+#include "toolkit/test_driver.hpp"
+#include "tools/play/transcript.hpp"
+
+namespace tools::play {
+
+class Screenshots {
+ public:
+  /// Makes the directory where there is none, and clears away the pictures of an earlier
+  /// walk-through. A Failure when the driver's toolkit draws nothing, or the directory cannot be
+  /// written. The driver outlives it.
+  Screenshots(toolkit::TestDriver& driver, std::string directory);
+
+  /// Writes the transcript, plain, to `transcript.txt` as well. This outlives the transcript.
+  void keep(Transcript& transcript);
+
+  /// Takes a picture of the window, "02-press-5.png" when `what` is "press-5" and there are two
+  /// already. Of a window that is not on the screen there is none. A Failure when the file cannot
+  /// be written.
+  void take(const toolkit::Ref<toolkit::Window>& window, std::string_view what);
+
+ private:
+  toolkit::TestDriver& driver_;
+  std::string directory_;
+  std::ofstream text_;
+  int taken_ = 0;
+};
+
+}  // namespace tools::play
