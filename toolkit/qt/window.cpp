@@ -58,6 +58,14 @@ class QtWindow::Watch final : public QObject {
           QMetaObject::invokeMethod(
               this, [this] { window_.wasHidden(); }, Qt::QueuedConnection);
         break;
+      // Before the window is first seen it is the desktop that moves it.
+      case QEvent::Move:
+      case QEvent::Resize:
+        if (!painted_) window_.settled_ = window_.widget_->geometry();
+        break;
+      case QEvent::Paint:
+        painted_ = true;
+        break;
       case QEvent::KeyPress:
         if (!window_.place_ || static_cast<QKeyEvent*>(event)->key() != Qt::Key_Escape) break;
         window_.widget_->close();
@@ -70,6 +78,7 @@ class QtWindow::Watch final : public QObject {
 
  private:
   QtWindow& window_;  // its owner
+  bool painted_ = false;
 };
 
 QtWindow::QtWindow(QWidget& widget, const std::shared_ptr<Desk>& desk, KeptBy keptBy)
@@ -127,7 +136,6 @@ void QtWindow::show() {
   // Off the screen windows have no order, and Qt complains of being asked for one.
   if (QGuiApplication::platformName() != "offscreen") widget_->raise();
   widget_->activateWindow();
-  if (!settled_) settled_ = widget_->geometry();
 }
 
 void QtWindow::makeKeyAndOrderFront() {
