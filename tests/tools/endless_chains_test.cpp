@@ -18,7 +18,7 @@ ValueRef<> chain(long tag) {
 
 // A script of lists that only chain: to each key, the tags in order.
 ValueRef<Dictionary> script(const std::vector<std::pair<std::string, std::vector<long>>>& lists) {
-  const auto script = Dictionary::make();
+  auto script = Dictionary::make();
   for (const auto& [key, tags] : lists) {
     const auto list = Array::make();
     for (const long tag : tags) list->addObject(chain(tag));

@@ -40,11 +40,7 @@ QWidget* plain() {
 
 QWidget* pushButton() { return new QPushButton("Button"); }
 
-QWidget* toggle() {
-  auto* const button = new QPushButton("Button");
-  button->setCheckable(true);
-  return button;
-}
+QWidget* toggle() { return new QCheckBox("Button"); }
 
 QWidget* threeStates() {
   auto* const button = new QCheckBox("Button");
@@ -72,7 +68,7 @@ struct Kind {
 
 constexpr Kind kinds[] = {
     {ViewKind::button, "QPushButton", pushButton},
-    {ViewKind::toggle, "QPushButton", toggle},
+    {ViewKind::toggle, "QCheckBox", toggle},
     {ViewKind::mixed, "QCheckBox", threeStates},
     {ViewKind::popUpButton, "QToolButton", plain<QToolButton>},
     {ViewKind::textField, "QLabel", textField},
