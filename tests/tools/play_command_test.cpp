@@ -73,7 +73,7 @@ TEST_F(PlayCommand, aBadFileIsOneLine) {
 
 TEST_F(PlayCommand, stepsKeepTheOrderOfTheCommandLine) {
   const Result result = run({"play", "--press", "2", "1", "--advance", "0.5", "script.plist",
-                             "--press", "2", "--advance=1"});
+                             "--press", "2", "--advance=1", "--toolkit", "memory"});
   EXPECT_EQ(result.status, 0);
   std::size_t at = 0;
   for (const char* heading : {"1. start", "2. press 2", "3. press 1", "4. let 0.5 s pass",
@@ -85,9 +85,19 @@ TEST_F(PlayCommand, stepsKeepTheOrderOfTheCommandLine) {
 }
 
 TEST_F(PlayCommand, aRefusedPressIsAStatus) {
-  const Result result = run({"play", "script.plist", "--press", "-2"});
+  const Result result = run({"play", "script.plist", "--toolkit", "memory", "--press", "-2"});
   EXPECT_EQ(result.status, 1);
   EXPECT_NE(result.out.find("no control has the tag -2"), std::string::npos) << result.out;
+}
+
+TEST_F(PlayCommand, screenshotsNeedPixels) {
+  const Result result =
+      run({"play", "script.plist", "--toolkit", "memory", "--screenshots", "pictures"});
+  EXPECT_EQ(result.err,
+            "qz-walkthrough: --screenshots: the toolkit memory has no pixels; expected one that "
+            "draws, such as --toolkit qt\n");
+  EXPECT_EQ(result.status, 2);
+  EXPECT_EQ(result.out, "");
 }
 
 TEST_F(PlayCommand, helpNamesEveryOptionAndTheExitStatuses) {
@@ -95,7 +105,7 @@ TEST_F(PlayCommand, helpNamesEveryOptionAndTheExitStatuses) {
   EXPECT_EQ(help.status, 0);
   EXPECT_EQ(help.err, "");
   for (const char* part : {"SCRIPT", "--window", "--assets", "--start", "--resources", "--press",
-                           "--advance", "--sheet", "--toolkit", "Exit status:"}) {
+                           "--advance", "--sheet", "--toolkit", "--screenshots", "Exit status:"}) {
     EXPECT_NE(help.out.find(part), std::string::npos) << part;
   }
   const Result version = run({"--version"});
@@ -107,7 +117,7 @@ TEST_F(PlayCommand, anOutputThatCannotBeWrittenIsOneLine) {
   const Captured err(std::cerr);
   const Captured out(std::cout);
   std::cout.setstate(std::ios::badbit);
-  const int status = runTool({"play", "script.plist"}, {addPlayCommand});
+  const int status = runTool({"play", "script.plist", "--toolkit", "memory"}, {addPlayCommand});
   std::cout.clear();
   EXPECT_EQ(status, 1);
   EXPECT_TRUE(err.text().ends_with("qz-walkthrough: standard output cannot be written\n"))
