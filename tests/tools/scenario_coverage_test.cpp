@@ -15,6 +15,7 @@ namespace {
 
 std::vector<std::string> namesOf(const std::vector<PropertyInfo>& infos) {
   std::vector<std::string> names;
+  names.reserve(infos.size());
   for (const auto& info : infos) names.emplace_back(info.name);
   return names;
 }

@@ -14,6 +14,7 @@ ScenarioFile parsed(const std::string& text) { return parseScenarios(text, vocab
 
 std::vector<std::string> sources(const std::vector<Statement>& statements) {
   std::vector<std::string> all;
+  all.reserve(statements.size());
   for (const auto& statement : statements) all.push_back(statement.source);
   return all;
 }

@@ -15,7 +15,7 @@ constexpr std::array<std::int8_t, 128> makeValues() {
   std::array<std::int8_t, 128> values{};
   values.fill(-1);
   for (std::size_t i = 0; i < digits.size(); ++i) {
-    values[static_cast<std::size_t>(digits[i])] = static_cast<std::int8_t>(i);
+    values[static_cast<unsigned char>(digits[i])] = static_cast<std::int8_t>(i);
   }
   values['='] = 0;
   return values;

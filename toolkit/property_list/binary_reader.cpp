@@ -24,7 +24,7 @@ constexpr std::size_t largestSize = 16;  // of an offset or a reference
 // honestly needs is its own size; this many times as much is read, and a little more for tiny
 // files.
 constexpr std::size_t mostOverlap = 2;
-constexpr std::size_t overlapForFree = 64 * 1024;
+constexpr std::size_t overlapForFree = std::size_t{64} * 1024;
 
 [[noreturn]] void refuse(std::size_t offset, std::string reason) {
   throw RefusedAt{offset, std::move(reason)};

@@ -97,6 +97,7 @@ std::vector<std::string> paired(const std::vector<std::string>& keysAndValues) {
   }
   std::sort(entries.begin(), entries.end());
   std::vector<std::string> dumps;
+  dumps.reserve(entries.size());
   for (const auto& [key, value] : entries) dumps.push_back("[" + key + "," + value + "]");
   return dumps;
 }

@@ -5,6 +5,7 @@
 #include <cstddef>
 #include <string>
 #include <string_view>
+#include <utility>
 
 #include "toolkit/property_list/refusal.hpp"
 
@@ -35,7 +36,7 @@ class OldStyleTokens {
 
   std::size_t offset() const { return at_; }
   void startAgain() { at_ = 0; }
-  [[noreturn]] void refuse(std::string reason) const { throw RefusedAt{at_, reason}; }
+  [[noreturn]] void refuse(std::string reason) const { throw RefusedAt{at_, std::move(reason)}; }
   /// Refuses what stands here; says what was `expected` in its place.
   [[noreturn]] void refuseUnexpected(std::string_view expected) const;
 
