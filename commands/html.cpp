@@ -24,19 +24,19 @@ static_assert(linkedTwoBlanks.size() == 249 && linkedOneBlank.size() == 248 && p
 
 // Absent when the fragment has characters beyond ASCII, which must be written as references.
 std::optional<toolkit::AttributedString> read(std::string_view documentHead,
-                                              const toolkit::ValueRef<>& fragment,
+                                              const std::string& fragment,
                                               const toolkit::Fonts& fonts) {
   const auto document =
-      toolkit::asciiBytes(std::string(documentHead) + fragment->description() + "</body></html>");
+      toolkit::asciiBytes(std::string(documentHead) + fragment + "</body></html>");
   return document ? toolkit::attributedStringFromHTML(*document, fonts) : std::nullopt;
 }
 
 void setStyle(toolkit::AttributedString& text, toolkit::TextAlignment alignment,
-              const std::optional<toolkit::Font>& font) {
+              const toolkit::Fonts& fonts, const toolkit::ValueRef<>& fontName, float points) {
   const toolkit::TextRange all{0, text.length()};
   text.beginEditing();
   text.addParagraphStyle(toolkit::ParagraphStyle{.alignment = alignment}, all);
-  text.addFont(font, all);
+  text.addFont(fonts.fontWithName(textOf(fontName), static_cast<double>(points)), all);
   text.endEditing();
 }
 
@@ -82,20 +82,18 @@ bool QZ_Plist_State_Parser::showHtml(std::string_view documentHead,
                                      const ObjectId& id) {
   const Control control = findObjectWithTag(id->longValue());
   const auto points = static_cast<float>(size->intValue());  // whole points, also when not used
-  auto text = read(documentHead, html, toolkit_.fonts());
+  // An absent fragment reads as the text that the system's formats print for nothing.
+  const std::string fragment = html ? html->description() : "(null)";
+  auto text = read(documentHead, fragment, toolkit_.fonts());
   if (!text) return false;
   try {
-    if (alignment) {
-      setStyle(*text, *alignment,
-               toolkit_.fonts().fontWithName(textOf(fontName), static_cast<double>(points)));
-    }
+    if (alignment) setStyle(*text, *alignment, toolkit_.fonts(), fontName, points);
     show(*text, control);
     return true;
   } catch (const toolkit::Exception&) {
     // A range exception was to count as success, but what is asked is whether the exception is of
     // the class of that exception's *name*, a string. None is, so every one is reported.
-    toolkit_.log().write("Couldn't set attributed string of HTML:" + html->description() +
-                         " to object.");
+    toolkit_.log().write("Couldn't set attributed string of HTML:" + fragment + " to object.");
     return false;
   }
 }

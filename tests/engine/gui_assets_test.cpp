@@ -272,4 +272,13 @@ TEST(AssetEntries, WithoutAPlaceForThemNothingIsWritten) {
   EXPECT_FALSE(engine->createNextGuiAssetEntry(nullptr, "NSButton", {1, 2, 3, 4}, 12));
 }
 
+TEST_F(GuiAssets, ADescriptionThatChangesMeanwhileIsBuiltAsItWas) {
+  const auto description = toolkit::Dictionary::make();
+  description->setObject(entry("NSButton", {0, 0, 9, 9}), "1");
+  description->setObject(entry("NSTextField", {0, 0, 9, 9}), "2");
+  toolkit.observed.onButton = [&] { description->removeAllObjects(); };
+  EXPECT_TRUE(engine->loadGuiAssets(description, nullptr));
+  EXPECT_EQ(engine->addedObjectToTutorial()->count(), 2U);
+}
+
 }  // namespace

@@ -5,6 +5,7 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <vector>
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "toolkit/memory/memory_driver.hpp"
@@ -236,6 +237,47 @@ TEST_F(LetGo, InATimersOwnListTheListIsDone) {
 TEST_F(LetGo, InATerminationTheWindowIsClosed) {
   EXPECT_TRUE(endsOnlyAfter([](Engine& called) { called.terminateParser(); }));
   EXPECT_EQ(driver->look(window).closes, 1);
+}
+
+/// Notes who asks it what.
+class AskedTimer final : public toolkit::Timer {
+ public:
+  explicit AskedTimer(bool valid) : valid_(valid) {}
+  bool isValid() const override {
+    calls.emplace_back("isValid");
+    return valid_;
+  }
+  void invalidate() override {
+    calls.emplace_back("invalidate");
+    valid_ = false;
+  }
+  double interval() const override { return 1; }
+  double timeLeft() const override { return 0; }
+
+  mutable std::vector<std::string> calls;
+
+ private:
+  bool valid_;
+};
+
+TEST_F(Lifetime, OnlyAnEndingEnginesObjectTimersAreStoppedUnasked) {
+  using Calls = std::vector<std::string>;
+  for (const bool valid : {true, false}) {
+    for (const bool terminated : {true, false}) {
+      const auto flasher = std::make_shared<AskedTimer>(valid);
+      const auto pending = std::make_shared<AskedTimer>(valid);
+      const auto timers = toolkit::Table<Engine::Timer>::make();
+      timers->setObject(Engine::Timer(pending), "1");
+      engine = Engine::init(driver->toolkit());
+      engine->setFlashingTimer(Engine::Timer(flasher));
+      engine->setObjectIdTimers(timers);
+      if (terminated) engine->terminateParser();
+      engine.reset();
+      const Calls asked = valid ? Calls{"isValid", "invalidate"} : Calls{"isValid"};
+      EXPECT_EQ(flasher->calls, asked);
+      EXPECT_EQ(pending->calls, terminated ? asked : Calls{"invalidate"});
+    }
+  }
 }
 
 }  // namespace

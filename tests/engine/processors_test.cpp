@@ -107,4 +107,9 @@ TEST_F(Processors, ATimerValueHas64Bits) {
   EXPECT_EQ(engine->objectIdTimers()->objectForKey("7")->interval(), 8'589'934'592.0);
 }
 
+TEST_F(Processors, NothingEqualsAnAbsentText) {
+  EXPECT_FALSE(engine->QZ_Plist_State_Processor_SET_TEXT(nullptr, Number::withLong(7)));
+  EXPECT_EQ(driver.look(button).text.string(), "");
+}
+
 }  // namespace

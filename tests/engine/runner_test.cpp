@@ -159,4 +159,34 @@ TEST_F(Runner, TheDispatcherTakesNamesToTheLetter) {
   EXPECT_THROW(engine->doCompoundCommand("FLASH_ID", Array::make(), id), toolkit::RangeException);
 }
 
+/// A list that claims any number of elements, each the command that does nothing.
+class ClaimingList final : public toolkit::Value {
+ public:
+  explicit ClaimingList(std::size_t count) : Value(Kind::array), count_(count) {}
+  std::size_t count() const override { return count_; }
+  const ValueRef<>& objectAtIndex(std::size_t) const override {
+    ++asked;
+    return idle_;
+  }
+
+  mutable std::size_t asked = 0;
+
+ private:
+  std::size_t count_;
+  ValueRef<> idle_ = text("IDLE_LOOP");
+};
+
+TEST_F(Runner, TakesAListsCountIn32BitsWithASign) {
+  const struct {
+    std::size_t count;
+    std::size_t asked;
+  } cases[] = {{std::size_t{1} << 31, 0}, {(std::size_t{1} << 32) + 2, 2}};
+  for (const auto& c : cases) {
+    ClaimingList list(c.count);
+    const ValueRef<> shared(toolkit::Counted<toolkit::Value>::share(&list));
+    EXPECT_EQ(engine->processCommandArray(shared, Number::withLong(tag)), c.asked > 0) << c.count;
+    EXPECT_EQ(list.asked, c.asked) << c.count;
+  }
+}
+
 }  // namespace

@@ -3,6 +3,7 @@
 #include <gtest/gtest.h>
 
 #include <memory>
+#include <string>
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "toolkit/memory/memory_driver.hpp"
@@ -92,6 +93,13 @@ TEST_F(WideIds, AFlashingKeyBeyond32BitsIsTheGreatestOfThem) {
   EXPECT_TRUE(
       engine->QZ_Plist_State_Processor_SET_TAG(Number::withLong(9), Number::withLong(2147483647)));
   EXPECT_TRUE(engine->flashingTagIds()->objectForKey("2147483647"));
+}
+
+TEST_F(WideIds, OfANewTagAllNameItsTimer) {
+  view(ViewKind::button, near);
+  EXPECT_TRUE(engine->QZ_Plist_State_Processor_SET_TAG(
+      Number::withLong(far), Number::withLong(near), Number::withLong(3)));
+  EXPECT_TRUE(engine->objectIdTimers()->contains(std::to_string(far)));
 }
 
 }  // namespace

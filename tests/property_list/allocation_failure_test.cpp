@@ -1,68 +1,21 @@
 // What becomes of reading and writing where memory runs out: std::bad_alloc, and nothing leaks.
-//
-// This file replaces the program's operator new, so that any allocation can be made to fail.
 #include <gtest/gtest.h>
 
-#include <cstdlib>
-#include <functional>
-#include <limits>
+#include <cstddef>
 #include <new>
 #include <string>
 
+#include "tests/failing_allocations.hpp"
 #include "tests/property_list/binary_file.hpp"
 #include "tests/property_list/reading.hpp"
 #include "toolkit/property_list/binary_writer.hpp"
 #include "toolkit/property_list/xml_writer.hpp"
 
-namespace {
-
-constexpr std::size_t never = std::numeric_limits<std::size_t>::max();
-
-// Per thread, so that nobody else's allocations count.
-thread_local std::size_t allocationsLeft = never;
-thread_local std::ptrdiff_t allocationsAlive = 0;
-
-}  // namespace
-
-void* operator new(std::size_t size) {
-  if (allocationsLeft == 0) throw std::bad_alloc();
-  if (allocationsLeft != never) --allocationsLeft;
-  void* memory = std::malloc(size == 0 ? 1 : size);
-  if (!memory) throw std::bad_alloc();
-  ++allocationsAlive;
-  return memory;
-}
-
-void operator delete(void* memory) noexcept {
-  if (memory) --allocationsAlive;
-  std::free(memory);
-}
-
-void operator delete(void* memory, std::size_t) noexcept { operator delete(memory); }
-
 namespace toolkit {
 namespace {
 
+using namespace failing_allocations;
 using namespace std::string_literals;
-
-/// Runs `action` with its first allocation failing, then its second, and so on until none fails;
-/// returns how many did.
-int failuresOf(const std::function<void()>& action) {
-  action();  // whatever is made once for the whole program
-  for (int failures = 0;; ++failures) {
-    const std::ptrdiff_t before = allocationsAlive;
-    bool failed = false;
-    allocationsLeft = static_cast<std::size_t>(failures);
-    try {
-      action();
-    } catch (const std::bad_alloc&) {
-      failed = true;
-    }
-    allocationsLeft = never;
-    EXPECT_EQ(allocationsAlive, before) << "with allocation " << failures << " failing";
-    if (!failed) return failures;
-  }
-}
 
 std::string manyKeys() {
   std::string xml;

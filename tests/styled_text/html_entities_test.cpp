@@ -2,6 +2,7 @@
 #include <gtest/gtest.h>
 
 #include <array>
+#include <fstream>
 #include <string>
 
 #include "tests/styled_text/reading.hpp"
@@ -107,6 +108,18 @@ TEST(HtmlBytes, AreReadAsBrowsersReadIso8859) {
                 .string(),
             "a\u00A0 \u00A0b");
   EXPECT_EQ(read(std::string("a\0b", 3)).string(), "ab");
+}
+
+TEST(HtmlReferences, NameAllOfHtml4) {
+  std::ifstream table(std::string(QZ_TEST_DATA) + "/html-entities.tsv");
+  std::string name;
+  std::string number;
+  int rows = 0;
+  for (; table >> name >> number; ++rows) {
+    // Beside the numeric reference to the same character: none of them is among 128 to 159.
+    EXPECT_EQ(read("&" + name + ";").string(), read("&#" + number + ";").string()) << name;
+  }
+  EXPECT_EQ(rows, 252);
 }
 
 }  // namespace

@@ -1,0 +1,49 @@
+// The flasher's tick, of which the toolkit sees the order in which it asks for buttons.
+
+#include <gtest/gtest.h>
+
+#include <functional>
+#include <memory>
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "tests/engine/fakes.hpp"
+#include "toolkit/memory/memory_driver.hpp"
+
+namespace {
+
+using toolkit::Number;
+
+/// Notes how often it is asked whether it is a button; it is none.
+class AskedView final : public fakes::FakeRole<toolkit::View> {
+ public:
+  using FakeRole::FakeRole;
+  toolkit::Button* asButton() override {
+    ++asked;
+    if (onAsked) onAsked();
+    return nullptr;
+  }
+
+  int asked = 0;
+  std::function<void()> onAsked;
+};
+
+TEST(Flasher, WalksTheTagsThatWereMarkedWhenItsTickBegan) {
+  toolkit::memory::MemoryDriver driver;
+  const auto engine = QZ_Plist_State_Parser::init(driver.toolkit());
+  const auto content = std::make_shared<fakes::FakeRole<toolkit::View>>();
+  const auto first = std::make_shared<AskedView>(1);
+  const auto second = std::make_shared<AskedView>(2);
+  for (const auto& view : {first, second}) content->views.emplace_back(view);
+  engine->setTutorialWindow(std::make_shared<fakes::FakeWindow>(content));
+  engine->setFlashingTagIds(toolkit::Dictionary::make());
+  engine->setFlashing(true);
+  engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(1), true);
+  first->onAsked = [&] { engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(2), true); };
+  engine->flasherFired(nullptr);
+  EXPECT_EQ(first->asked, 1);
+  EXPECT_EQ(second->asked, 0);
+  engine->flasherFired(nullptr);
+  EXPECT_EQ(second->asked, 1);
+}
+
+}  // namespace

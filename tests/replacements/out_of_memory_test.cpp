@@ -1,0 +1,62 @@
+// An engine that runs out of memory: std::bad_alloc reaches the host, nothing leaks, and the engine
+// goes on working.
+
+#include <gtest/gtest.h>
+
+#include <memory>
+#include <new>
+#include <optional>
+#include <string>
+
+#include "QZ_Plist_State_Parser.hpp"
+#include "tests/failing_allocations.hpp"
+#include "toolkit/memory/memory_driver.hpp"
+
+namespace {
+
+using namespace failing_allocations;
+using Engine = QZ_Plist_State_Parser;
+
+class OutOfMemory : public testing::Test {
+ protected:
+  toolkit::memory::MemoryDriver driver;
+  toolkit::Ref<toolkit::Window> window = driver.makeWindow({0, 0, 300, 200});
+  toolkit::Ref<toolkit::View> label =
+      driver.makeView(toolkit::ViewKind::textField, 5, {0, 0, 9, 9}, window->contentView());
+  std::shared_ptr<Engine> engine = Engine::init(driver.toolkit());
+};
+
+TEST_F(OutOfMemory, LoadingAScriptEndsAndCanBeTriedAgain) {
+  engine->getGuiAssetsFromWindow(window);
+  const std::optional<std::string> scripts[] = {QZ_TEST_DATA "/mixed-script.plist",
+                                                QZ_TEST_DATA "/mixed-script-binary.plist"};
+  for (const auto& script : scripts) {
+    bool loaded = false;
+    const int failures = failuresOf([&] {
+      loaded = false;
+      engine->setPlistDictionary(nullptr);
+      try {
+        loaded = engine->loadPlist(script, std::nullopt, nullptr, false);
+      } catch (...) {
+        engine->setPlistDictionary(nullptr);  // else what was read at the time before counts
+        throw;
+      }
+      engine->setPlistDictionary(nullptr);
+    });
+    EXPECT_GT(failures, 5) << *script;
+    EXPECT_TRUE(loaded) << *script;
+    EXPECT_TRUE(engine->loadPlist(script, "1", nullptr, false)) << *script;
+    EXPECT_EQ(driver.look(label).text.string(), "a & b") << *script;
+  }
+}
+
+TEST_F(OutOfMemory, BuildingAnEntryEndsAndLeavesTheDescriptionAsItWas) {
+  const std::optional<std::string> name = "NSButton";
+  Engine::Dictionary entries = toolkit::Dictionary::make();
+  allocationsLeft = 0;
+  EXPECT_THROW(engine->createNextGuiAssetEntry(&entries, name, {1, 2, 3, 4}, 12), std::bad_alloc);
+  allocationsLeft = never;
+  EXPECT_EQ(entries->count(), 0U);
+}
+
+}  // namespace
