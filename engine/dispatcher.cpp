@@ -19,9 +19,11 @@ struct Call {
   Engine& engine;
   const Engine::Parameters& parameters;
   const Engine::ObjectId& id;
-  toolkit::Images& images;
+  toolkit::Toolkit& toolkit;
 
-  Engine::Value at(std::size_t position) const { return parameters->objectAtIndex(position); }
+  const Engine::Value& at(std::size_t position) const {
+    return parameters->objectAtIndex(position);
+  }
 };
 
 template <std::size_t position>
@@ -100,7 +102,7 @@ bool hide(const Call& call) {
 }
 
 bool loadBackground(const Call& call) {
-  const auto image = call.images.imageNamed(textOf(call.at(0)));
+  const auto image = call.toolkit.images().imageNamed(textOf(call.at(0)));
   const auto content = call.engine.tutorialWindow()->contentView();
   content->setWantsLayer(true);
   content->setLayerContents(image);
@@ -168,7 +170,7 @@ bool QZ_Plist_State_Parser::doCompoundCommand(std::string_view name,
                                               const ObjectId& usingObject) {
   for (const Command& command : commands) {
     if (name == command.name) {
-      return command.run({*this, withParameters, usingObject, toolkit_.images()});
+      return command.run({*this, withParameters, usingObject, toolkit_});
     }
   }
   return false;

@@ -5,6 +5,7 @@
 // of the expression that reads it, whoever replaces the field at the same moment.
 #pragma once
 
+#include <functional>
 #include <mutex>
 #include <utility>
 
@@ -15,6 +16,13 @@ class Property {
   T get() const {
     const std::lock_guard lock(mutex_);
     return value_;
+  }
+
+  /// What `question` answers of the value, which it must not keep; from any thread.
+  template <class Question>
+  auto ask(Question question) const {
+    const std::lock_guard lock(mutex_);
+    return std::invoke(question, value_);
   }
 
   /// Replaces the value; from any thread. The old one is let go outside of the lock, for its end

@@ -6,7 +6,7 @@
 
 bool QZ_Plist_State_Parser::processCommandArray(const Value& list, const ObjectId& forObject) {
   const auto self = shared_from_this();  // what runs may make the host let go of us
-  Parameters parameters = toolkit::Array::make();
+  const Parameters parameters = toolkit::Array::make();
   lastTagId_.set(forObject);
   // Outside of the guard: of a value that has no elements the caller hears.
   const auto count = static_cast<std::int32_t>(list->count());
@@ -24,12 +24,15 @@ bool QZ_Plist_State_Parser::processCommandArray(const Value& list, const ObjectI
 
 // An array is a compound command, whose name is matched in upper case; anything else is taken for a
 // simple one, whose name is matched as written.
-bool QZ_Plist_State_Parser::runElement(const Value& element, Parameters& parameters,
+bool QZ_Plist_State_Parser::runElement(const Value& element, const Parameters& parameters,
                                        const ObjectId& id) {
-  const auto compound = toolkit::asArray(element);
-  if (!compound) return doSimpleCommand(textOf(element), parameters, id);
-  const std::string name = toolkit::uppercased(textOf(compound->objectAtIndex(0)));
-  const auto& elements = compound->elements();
-  parameters = toolkit::Array::make({elements.begin() + 1, elements.end()});
+  if (element->kind() != toolkit::Value::Kind::array) {
+    const Value held = element;  // a list of the host's may lose it while it runs
+    return doSimpleCommand(textOf(held), parameters, id);
+  }
+  const auto& compound = static_cast<const toolkit::Array&>(*element);
+  std::string raised;
+  const auto name = toolkit::uppercased(textOf(compound.objectAtIndex(0)), raised);
+  parameters->addObjects(compound.elements().subspan(1));
   return doCompoundCommand(name, parameters, id);
 }

@@ -10,11 +10,10 @@
 /// The text of a string, valid as long as the value; empty for an absent one. Anything else raises.
 inline std::string_view textOf(const toolkit::ValueRef<>& value) {
   if (!value) return {};
-  const auto string = toolkit::asString(value);
-  if (!string) {
+  if (value->kind() != toolkit::Value::Kind::string) {
     // Not its description, which a small file can make longer than memory.
     throw toolkit::InvalidArgumentException("expected a string, got " +
                                             std::string(value->className()));
   }
-  return string->text();
+  return static_cast<const toolkit::String&>(*value).text();
 }

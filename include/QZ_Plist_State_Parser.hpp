@@ -234,7 +234,9 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   void setFlashingTagIds(Dictionary ids) { flashingTagIds_.set(std::move(ids)); }
   /// The window whose controls the script drives. One that the engine built or a setter gave is
   /// kept alive, an adopted one is not.
-  Window tutorialWindow() const { return tutorialWindow_.get().get(); }
+  Window tutorialWindow() const {
+    return tutorialWindow_.ask(&toolkit::StoredRef<toolkit::Window>::get);
+  }
   void setTutorialWindow(const Window& window) {
     tutorialWindow_.set(toolkit::StoredRef<toolkit::Window>::own(window));
   }
@@ -262,7 +264,7 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
  private:
   explicit QZ_Plist_State_Parser(toolkit::Toolkit& toolkit) : toolkit_(toolkit) {}
 
-  bool runElement(const Value& element, Parameters& parameters, const ObjectId& id);
+  bool runElement(const Value& element, const Parameters& parameters, const ObjectId& id);
   std::optional<std::string> keyOfTimer(const Timer& timer) const;
   void rewriteFlashingEntry(const ObjectId& id);
   bool setState(const ObjectId& id, toolkit::State state);

@@ -2,7 +2,10 @@
 
 #include <algorithm>
 #include <cstddef>
+#include <cstdint>
 #include <iterator>
+
+#include "toolkit/property_list/words.hpp"
 
 namespace toolkit {
 
@@ -76,7 +79,31 @@ void appendUpper(std::string& out, char32_t c) {
   }
 }
 
+// Sets the high bit of each of eight bytes that is a small letter of ASCII or beyond ASCII.
+std::uint64_t notInUpperCase(std::uint64_t word) {
+  const std::uint64_t ascii = word & ~words::highBits;
+  const auto from = [&](unsigned first) { return ascii + (0x80 - first) * words::ones; };
+  return (word | (from('a') & ~from('z' + 1))) & words::highBits;
+}
+
+// Whether the text is ASCII without a small letter. Of a short one this says nothing: raising it
+// takes no longer.
+bool isInUpperCase(std::string_view text) {
+  if (text.size() < words::size) return false;
+  std::uint64_t found = notInUpperCase(words::load(text.data() + text.size() - words::size));
+  for (std::size_t at = 0; at + words::size < text.size(); at += words::size) {
+    found |= notInUpperCase(words::load(text.data() + at));
+  }
+  return found == 0;
+}
+
 }  // namespace
+
+std::string_view uppercased(std::string_view text, std::string& storage) {
+  if (isInUpperCase(text)) return text;
+  storage = uppercased(text);
+  return storage;
+}
 
 std::string uppercased(std::string_view text) {
   std::string out;

@@ -115,6 +115,27 @@ TEST(Uppercase, UpperCaseIsUpperCaseAlready) {
             1400);  // Unicode has so many letters with another upper case, and more to come
 }
 
+TEST(Uppercase, WhatIsInUpperCaseIsNotCopied) {
+  // Longer than two words of eight, which are looked at as one each.
+  for (std::size_t at = 0; at < 19; ++at) {
+    for (int c = 0; c < 0x100; ++c) {
+      std::string text(19, '_');
+      text[at] = static_cast<char>(c);
+      const bool isRaised = c < 0x80 && (c < 'a' || c > 'z');
+      std::string storage;
+      const std::string_view upper = uppercased(text, storage);
+      ASSERT_EQ(upper, uppercased(text)) << c << " at " << at;
+      ASSERT_EQ(upper.data() == text.data(), isRaised) << c << " at " << at;
+    }
+  }
+}
+
+TEST(Uppercase, ShortTextIsRaisedWithStorageToo) {
+  std::string storage;
+  EXPECT_EQ(uppercased("", storage), "");
+  EXPECT_EQ(uppercased("setTag", storage), "SETTAG");
+}
+
 TEST(Uppercase, EveryCharacterIsOnItsOwn) {
   for (char32_t c = 0x80; c < beyondAllCase; ++c) {
     const std::string text = encoded(c);

@@ -145,6 +145,9 @@ TEST(Arrays, GrowAndEmpty) {
   EXPECT_EQ(array->count(), 100U);
   EXPECT_EQ(array->objectAtIndex(99)->intValue(), 99);
   EXPECT_EQ(array->elements().front()->intValue(), 0);
+  array->addObjects(Array::make({String::make("7"), String::make("8")})->elements());
+  EXPECT_EQ(array->count(), 102U);
+  EXPECT_EQ(array->objectAtIndex(101)->intValue(), 8);
   array->removeAllObjects();
   EXPECT_EQ(array->count(), 0U);
 }

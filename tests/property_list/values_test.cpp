@@ -1,6 +1,7 @@
 // What values answer to messages: their own, others', and when they are absent.
 #include <gtest/gtest.h>
 
+#include <cstdint>
 #include <functional>
 #include <string>
 
@@ -107,6 +108,7 @@ TEST(Values, AbsentCollectionsSwallowChanges) {
   const ValueRef<Dictionary> dictionary;
   array->addObject(String::make("x"));
   array->addObject(nullptr);
+  array->addObjects(Array::make({String::make("x")})->elements());
   array->removeAllObjects();
   dictionary->setObject(String::make("x"), "k");
   dictionary->setObject(nullptr, "k");
@@ -122,6 +124,7 @@ TEST(Values, ImmutableCollectionsRaiseOnChanges) {
       Dictionary::make({{String::make("k"), Null::make()}}, Mutability::immutable);
   const std::string end = "]: mutating message sent to an immutable object";
   EXPECT_EQ(refusal([&] { array->addObject(Null::make()); }), "-[NSArray addObject:" + end);
+  EXPECT_EQ(refusal([&] { array->addObjects({}); }), "-[NSArray addObjects:" + end);
   EXPECT_EQ(refusal([&] { array->removeAllObjects(); }), "-[NSArray removeAllObjects" + end);
   EXPECT_EQ(refusal([&] { dictionary->setObject(Null::make(), "k"); }),
             "-[NSDictionary setObject:forKey:" + end);
@@ -146,6 +149,20 @@ TEST(Values, AreSharedAndKeepTheirIdentity) {
   EXPECT_TRUE(array->objectAtIndex(0) == ValueRef<>(string));
   EXPECT_TRUE(array->objectAtIndex(0) == array->objectAtIndex(1));
   EXPECT_FALSE(ValueRef<>(String::make("shared")) == ValueRef<>(string));
+}
+
+TEST(Values, NumbersAreWhatTheyWereMadeOf) {
+  // The small ones are there only once, and stay when nobody refers to them any more.
+  for (int again = 0; again < 2; ++again) {
+    for (std::int64_t i = -300; i <= 300; ++i) {
+      const auto number = Number::withLong(i);
+      ASSERT_EQ(number->longValue(), i);
+      ASSERT_EQ(number->type(), Number::Type::signedInteger);
+    }
+  }
+  EXPECT_TRUE(Number::withLong(0) == Number::withLong(0));
+  EXPECT_TRUE(Number::withLong(255) == Number::withLong(255));
+  EXPECT_FALSE(Number::withLong(256) == Number::withLong(256));
 }
 
 TEST(Values, AreAskedForByKind) {

@@ -76,9 +76,8 @@ Array* Array::make(Document& document, std::span<Value* const> elements) {
 
 std::size_t Array::count() const { return elements_.size(); }
 
-ValueRef<> Array::objectAtIndex(std::size_t index) const {
-  if (index < elements_.size()) return elements_[index];
-  if (kind() == Kind::nothing) return nullptr;
+const ValueRef<>& Array::objectBeyondEnd(std::size_t index) const {
+  if (kind() == Kind::nothing) return Value::objectAtIndex(index);
   const std::string bounds = elements_.empty()
                                  ? "bounds for empty array"
                                  : "bounds [0 .. " + std::to_string(elements_.size() - 1) + "]";
@@ -90,6 +89,10 @@ void Array::addObject(const ValueRef<>& value) {
   if (!canChange("addObject:")) return;
   requirePresent(value, "addObject:");
   elements_.push_back(value);
+}
+
+void Array::addObjects(std::span<const ValueRef<>> values) {
+  if (canChange("addObjects:")) elements_.insert(elements_.end(), values.begin(), values.end());
 }
 
 void Array::removeAllObjects() {

@@ -42,10 +42,14 @@ class Array final : public Collection {
   /// The elements in order. Valid until the array changes.
   std::span<const ValueRef<>> elements() const { return elements_; }
   std::size_t count() const override;
-  ValueRef<> objectAtIndex(std::size_t index) const override;
+  const ValueRef<>& objectAtIndex(std::size_t index) const override {
+    return index < elements_.size() ? elements_[index] : objectBeyondEnd(index);
+  }
 
   /// Changes raise where `Mutability` says so; adding an absent value raises.
   void addObject(const ValueRef<>& value);
+  /// Adds elements of another array.
+  void addObjects(std::span<const ValueRef<>> values);
   void removeAllObjects();
 
   /// As an immutable part of `document`, like its elements; the caller gets no count.
@@ -56,6 +60,7 @@ class Array final : public Collection {
   explicit Array(Kind kind) : Collection(kind, Mutability::ignored) {}
   Array(std::vector<ValueRef<>>&& elements, Mutability mutability);
   Array(std::span<Value* const> elements, Document* document);
+  const ValueRef<>& objectBeyondEnd(std::size_t index) const;
 
   std::pmr::vector<ValueRef<>> elements_{std::pmr::new_delete_resource()};
 };

@@ -36,10 +36,29 @@ bool String::boolValue() const { return boolValueOf(text()); }
 
 Number& Number::nothing() { return nothingAs<Number>(); }
 
+/// The numbers from 0, which are there to the program's end like the one that is nothing.
+class Number::Small {
+ public:
+  static constexpr std::int64_t count = 256;
+
+  Small() {
+    for (std::int64_t i = 0; i < count; ++i) {
+      ::new (at(i)) Number(Type::signedInteger, static_cast<std::uint64_t>(i));
+    }
+  }
+  Number* at(std::int64_t value) { return reinterpret_cast<Number*>(storage_) + value; }
+
+ private:
+  alignas(Number) std::byte storage_[count * sizeof(Number)];
+};
+
 ValueRef<Number> Number::withBool(bool value) {
   return makeAlone<Number>(0, Type::boolean, std::uint64_t{value});
 }
 ValueRef<Number> Number::withLong(std::int64_t value) {
+  // Every command makes a number of a tag. The small ones, which most tags are, are made once.
+  static Small small;
+  if (value >= 0 && value < Small::count) return Counted<Number>::share(small.at(value));
   return makeAlone<Number>(0, Type::signedInteger, static_cast<std::uint64_t>(value));
 }
 ValueRef<Number> Number::withUnsignedLong(std::uint64_t value) {

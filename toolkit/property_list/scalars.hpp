@@ -68,6 +68,7 @@ class Number final : public Value {
 
  private:
   friend class Value;
+  class Small;
   explicit Number(Kind kind) : Value(kind) {}
   Number(Type type, std::uint64_t bits) : Value(Kind::number), type_(type), bits_(bits) {}
   double real() const { return std::bit_cast<double>(bits_); }

@@ -67,9 +67,10 @@ std::size_t Value::count() const {
   return 0;
 }
 
-ValueRef<> Value::objectAtIndex(std::size_t) const {
+const ValueRef<>& Value::objectAtIndex(std::size_t) const {
   requireUnderstanding("objectAtIndex:");
-  return nullptr;
+  static const ValueRef<> absent;
+  return absent;
 }
 
 void Value::destroy() noexcept { delete this; }

@@ -104,8 +104,9 @@ class Value {
 
   /// How many elements a collection has; anything else raises.
   virtual std::size_t count() const;
-  /// The element of an array; a range exception beyond its end. Anything but an array raises.
-  virtual ValueRef<> objectAtIndex(std::size_t index) const;
+  /// The element of an array, valid until the array changes; a range exception beyond its end.
+  /// Anything but an array raises.
+  virtual const ValueRef<>& objectAtIndex(std::size_t index) const;
 
   /// The value as a person would read it, in one line unless a string in it has more: a string is
   /// itself, a number decimal (a boolean 1 or 0, a real in the fewest digits that read back the
