@@ -47,8 +47,8 @@ void QZ_Plist_State_Parser::terminateParser() {
     killAllTimers();
     objectIdTimers_.set(nullptr);
   }
-  const Window tutorial = tutorialWindow_->get();
-  if (!(tutorial && tutorial == window_->get()) && addedObjectToTutorial_->count() > 0) {
+  const Window tutorial = tutorialWindow();
+  if (!(tutorial && tutorial == window()) && addedObjectToTutorial_->count() > 0) {
     addedObjectToTutorial_->removeAllObjects();
     addedObjectToTutorial_.set(nullptr);
   }
@@ -71,8 +71,8 @@ QZ_Plist_State_Parser::~QZ_Plist_State_Parser() {
   const Timers timers = *objectIdTimers_;
   for (const auto& [key, timer] : timers->entries()) timer->invalidate();
   timers->removeAllObjects();
-  const Window tutorial = tutorialWindow_->get();
-  const Window host = window_->get();
+  const Window tutorial = tutorialWindow();
+  const Window host = window();
   // Unlike at teardown, an absent window on either side leaves the list as it is.
   if (tutorial && host && tutorial != host) addedObjectToTutorial_->removeAllObjects();
   buttonStates_->removeAllObjects();

@@ -5,7 +5,6 @@
 // of the expression that reads it, whoever replaces the field at the same moment.
 #pragma once
 
-#include <functional>
 #include <mutex>
 #include <utility>
 
@@ -18,11 +17,11 @@ class Property {
     return value_;
   }
 
-  /// What `question` answers of the value, which it must not keep; from any thread.
-  template <class Question>
-  auto ask(Question question) const {
+  /// The answer of the value, which is not copied, to a question of its own; from any thread.
+  template <class Answer>
+  Answer ask(Answer (T::*question)() const) const {
     const std::lock_guard lock(mutex_);
-    return std::invoke(question, value_);
+    return (value_.*question)();
   }
 
   /// Replaces the value; from any thread. The old one is let go outside of the lock, for its end
@@ -34,21 +33,10 @@ class Property {
 
   /// The same as `get`, as the engine writes it.
   T operator*() const { return get(); }
-  /// What the value refers to, where it is a reference; else the value.
-  auto operator->() const {
-    if constexpr (requires(const T& value) { value.operator->(); }) {
-      return get();
-    } else {
-      return Held{get()};
-    }
-  }
+  /// What the value, a reference, refers to.
+  T operator->() const { return get(); }
 
  private:
-  struct Held {
-    T value;
-    const T* operator->() const { return &value; }
-  };
-
   mutable std::mutex mutex_;
   T value_{};
 };

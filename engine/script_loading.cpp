@@ -54,8 +54,8 @@ bool QZ_Plist_State_Parser::loadPlist(const std::optional<std::string>& name,
     if (!*plistDictionary_) return false;
   }
   if (runAsSheet) {
-    if (const Window tutorial = tutorialWindow_->get()) {
-      toolkit_.application().beginSheet(tutorial, window_->get(), withDelegate, nullptr);
+    if (const Window tutorial = tutorialWindow()) {
+      toolkit_.application().beginSheet(tutorial, window(), withDelegate, nullptr);
     } else {
       toolkit_.log().write("SERIOUS ERROR WE DON'T HAVE A WINDOW IN WHICH TO SHOW WIDGETS");
     }

@@ -213,7 +213,7 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   void setHasTerminated(bool hasTerminated) { hasTerminated_ = hasTerminated; }
 
   /// The host window. A setter's window is kept alive, the constructor's is not.
-  Window window() const { return window_.get().get(); }
+  Window window() const { return window_.ask(&toolkit::StoredRef<toolkit::Window>::get); }
   void setWindow(const Window& window) {
     window_.set(toolkit::StoredRef<toolkit::Window>::own(window));
   }

@@ -7,7 +7,7 @@ QZ_Plist_State_Parser::Dictionary QZ_Plist_State_Parser::buttonStates() const {
 }
 
 bool QZ_Plist_State_Parser::setButtonSates(const Dictionary& states) {
-  const Control content = tutorialWindow_->get()->contentView();
+  const Control content = tutorialWindow()->contentView();
   if (content->subviews().empty()) return false;
   bool changed = false;
   const Dictionary snapshot = states->copy(toolkit::Mutability::immutable);

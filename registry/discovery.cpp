@@ -33,7 +33,7 @@ unsigned long firstOverflowKey(const toolkit::Subviews& views) {
 bool QZ_Plist_State_Parser::getGuiAssetsFromWindow(const Window& window) {
   if (!window) return false;
   // A window that is the engine's own stays so.
-  if (tutorialWindow_->get() != window) {
+  if (tutorialWindow() != window) {
     tutorialWindow_.set(toolkit::StoredRef<toolkit::Window>::refer(window));
   }
   if (!window->delegate()) window->setDelegate(shared_from_this());

@@ -47,7 +47,7 @@ bool QZ_Plist_State_Parser::loadGuiAssets(const Dictionary& description,
   // Discovery of the window, empty as it is, empties the records of an earlier one.
   if (!windowEntry) getGuiAssetsFromWindow(makeTutorialWindow(defaultContent));
 
-  const Window window = tutorialWindow_->get();
+  const Window window = tutorialWindow();
   if (!window) return false;
   bool added = false;
   for (const auto& [key, entry] : assets->entries()) {
