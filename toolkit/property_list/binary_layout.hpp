@@ -7,11 +7,13 @@
 // content; a length that does not fit stands as an integer object behind the marker.
 #pragma once
 
-#include <bit>
+#include <algorithm>
 #include <cstddef>
 #include <cstdint>
 #include <string>
 #include <string_view>
+
+#include "toolkit/property_list/words.hpp"
 
 namespace toolkit::binary {
 
@@ -46,11 +48,29 @@ struct Trailer {
   std::uint64_t tableOffset;
 };
 
-/// The low 64 bits of a number that takes all of `bytes`.
+/// Numbers of one size, side by side.
+class Numbers {
+ public:
+  /// Each takes so many bytes, one at least.
+  explicit Numbers(std::size_t size)
+      : size_(size),
+        mask_(~std::uint64_t{0} >> (8 * (words::size - std::min(size, words::size)))) {}
+
+  std::size_t size() const { return size_; }
+  /// The low 64 bits of one of those at `first`. They must stand behind a file's header, for what
+  /// is read is the eight bytes up to the number's end.
+  std::uint64_t at(const char* first, std::size_t index) const {
+    return words::bigEndian(words::load(first + (index + 1) * size_ - words::size)) & mask_;
+  }
+
+ private:
+  std::size_t size_;
+  std::uint64_t mask_;
+};
+
+/// The number that takes all of `bytes`, by the same rules.
 inline std::uint64_t number(std::string_view bytes) {
-  std::uint64_t result = 0;
-  for (const char byte : bytes) result = (result << 8) | static_cast<unsigned char>(byte);
-  return result;
+  return Numbers(bytes.size()).at(bytes.data(), 0);
 }
 
 inline void appendNumber(std::string& bytes, std::uint64_t number, std::size_t size) {

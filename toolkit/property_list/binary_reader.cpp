@@ -1,5 +1,4 @@
 // Binary property lists.
-#include <algorithm>
 #include <bit>
 #include <string>
 
@@ -43,7 +42,8 @@ bool reaches(std::size_t size, std::uint64_t greatest) {
   return size >= sizeof greatest || greatest < std::uint64_t{1} << (8 * size);
 }
 
-void checkTrailer(const Trailer& trailer, std::string_view bytes) {
+Trailer checkedTrailer(std::string_view bytes) {
+  const Trailer trailer = readTrailer(bytes);
   const std::size_t start = bytes.size() - Trailer::size;
   const auto check = [&](bool holds, std::size_t field, const char* reason) {
     if (!holds) refuse(start + field, reason);
@@ -64,24 +64,30 @@ void checkTrailer(const Trailer& trailer, std::string_view bytes) {
         "the references are too small for the number of objects");
   check(reaches(trailer.offsetSize, trailer.tableOffset), 6,
         "the offsets are too small for the objects' space");
+  return trailer;
 }
 
 class BinaryReader {
  public:
   BinaryReader(std::string_view bytes, Document& document, ValueOffsets* offsets)
-      : trailer_(readTrailer(bytes)), document_(document), offsets_(offsets), pending_(document) {
-    checkTrailer(trailer_, bytes);
-    objects_ = bytes.substr(0, trailer_.tableOffset);
-    table_ = bytes.substr(trailer_.tableOffset, trailer_.objectCount * trailer_.offsetSize);
-    budget_ = mostOverlap * bytes.size() + overlapForFree;
-  }
+      : trailer_(checkedTrailer(bytes)),
+        table_(trailer_.offsetSize),
+        references_(trailer_.referenceSize),
+        objects_(bytes.substr(0, trailer_.tableOffset)),
+        document_(document),
+        offsets_(offsets),
+        budget_(mostOverlap * bytes.size() + overlapForFree),
+        pending_(document) {}
 
   Value* root();
 
  private:
-  std::uint64_t offsetOf(std::uint64_t index) const;
+  std::uint64_t offsetOf(std::uint64_t index) const {
+    return table_.at(objects_.data() + objects_.size(), index);
+  }
   void checkTable() const;
   Value* object(std::uint64_t index, std::size_t depth);
+  Value* newObject(std::uint64_t index, std::size_t depth);
   Value* content(std::size_t offset, std::size_t depth);
   Value* constant(std::size_t offset);
   Value* integer(std::size_t offset);
@@ -99,22 +105,20 @@ class BinaryReader {
   }
   std::string_view contentOf(std::size_t offset, std::size_t unitSize);
   std::string_view take(std::size_t at, std::uint64_t count, std::size_t unitSize);
-  Value* reference(std::string_view references, std::size_t index, std::size_t depth);
+  Value* reference(const char* references, std::size_t index, std::size_t depth);
 
   Trailer trailer_;
+  binary::Numbers table_;  // of the objects' offsets, right behind the objects
+  binary::Numbers references_;
   std::string_view objects_;  // and the header in front of them
-  std::string_view table_;
   Document& document_;
   ValueOffsets* offsets_;
-  std::size_t budget_;          // how many bytes of content may still be read
-  std::vector<Value*> values_;  // by index, as far as they are read
+  std::size_t budget_;                          // how many bytes of content may still be read
+  std::vector<Value*> values_;                  // by index, as far as they are read
+  Value* const beingRead_ = &Value::nothing();  // in place of one that is read but not to its end
   PendingValues pending_;
   std::string buffer_;  // of strings that do not stand in the file as they are
 };
-
-std::uint64_t BinaryReader::offsetOf(std::uint64_t index) const {
-  return binary::number(table_.substr(index * trailer_.offsetSize, trailer_.offsetSize));
-}
 
 /// Every entry must lead to before the table, whether it is used or not.
 void BinaryReader::checkTable() const {
@@ -132,16 +136,19 @@ Value* BinaryReader::root() {
   return object(trailer_.topObject, 0);
 }
 
-Value* BinaryReader::object(std::uint64_t index, std::size_t depth) {
-  Value* const beingRead = &Value::nothing();
-  if (values_[index] && values_[index] != beingRead) return values_[index];
+inline Value* BinaryReader::object(std::uint64_t index, std::size_t depth) {
+  Value* const value = values_[index];
+  return value && value != beingRead_ ? value : newObject(index, depth);
+}
+
+Value* BinaryReader::newObject(std::uint64_t index, std::size_t depth) {
   const std::size_t offset = offsetOf(index);
-  if (values_[index] == beingRead) refuse(offset, "the object holds itself");
+  if (values_[index] == beingRead_) refuse(offset, "the object holds itself");
   if (offset < binary::headerSize) refuse(offset, "an object cannot lie in the header");
   if (depth > deepestNesting) {
     refuse(offset, "more than " + std::to_string(deepestNesting) + " levels in one another");
   }
-  values_[index] = beingRead;
+  values_[index] = beingRead_;
   Value* value = content(offset, depth);
   if (offsets_) offsets_->emplace_back(value, offset);
   return values_[index] = value;
@@ -178,10 +185,10 @@ Value* BinaryReader::content(std::size_t offset, std::size_t depth) {
 
 /// `count` units of content from `at` on, which must lie before the offset table.
 std::string_view BinaryReader::take(std::size_t at, std::uint64_t count, std::size_t unitSize) {
-  if (count > (objects_.size() - at) / unitSize) {
-    refuse(at, "the object reaches beyond the objects' space");
-  }
+  const std::size_t space = objects_.size() - at;
   const std::size_t size = count * unitSize;
+  // Of a count that is small enough the size does not overflow.
+  if (count > space || size > space) refuse(at, "the object reaches beyond the objects' space");
   if (size > budget_) refuse(at, "the objects overlap too often");
   budget_ -= size;
   return objects_.substr(at, size);
@@ -243,8 +250,7 @@ Value* BinaryReader::uid(std::size_t offset) {
 /// Bytes from 0x80 are not ASCII; they count as Latin-1.
 Value* BinaryReader::ascii(std::size_t offset) {
   const std::string_view bytes = contentOf(offset, 1);
-  const auto isAscii = [](char byte) { return static_cast<unsigned char>(byte) < 0x80; };
-  if (std::all_of(bytes.begin(), bytes.end(), isAscii)) return String::make(document_, bytes);
+  if (isAscii(bytes)) return String::make(document_, bytes);
   buffer_.clear();
   for (const char byte : bytes) appendUtf8(buffer_, static_cast<unsigned char>(byte));
   return String::make(document_, buffer_);
@@ -261,32 +267,31 @@ Value* BinaryReader::utf16(std::size_t offset) {
   return String::make(document_, buffer_);
 }
 
-Value* BinaryReader::reference(std::string_view references, std::size_t index, std::size_t depth) {
-  const std::string_view bytes =
-      references.substr(index * trailer_.referenceSize, trailer_.referenceSize);
-  const std::uint64_t object = binary::number(bytes);
+inline Value* BinaryReader::reference(const char* references, std::size_t index,
+                                      std::size_t depth) {
+  const std::uint64_t object = references_.at(references, index);
   if (object >= trailer_.objectCount) {
-    refuse(static_cast<std::size_t>(bytes.data() - objects_.data()),
-           "the object referred to does not exist");
+    const auto first = static_cast<std::size_t>(references - objects_.data());
+    refuse(first + index * references_.size(), "the object referred to does not exist");
   }
   return this->object(object, depth);
 }
 
 Value* BinaryReader::array(std::size_t offset, std::size_t depth) {
-  const std::string_view references = contentOf(offset, trailer_.referenceSize);
-  const std::size_t count = references.size() / trailer_.referenceSize;
+  const std::string_view references = contentOf(offset, references_.size());
+  const std::size_t count = references.size() / references_.size();
   const auto array = pending_.open();
-  for (std::size_t i = 0; i < count; ++i) pending_.add(reference(references, i, depth + 1));
+  for (std::size_t i = 0; i < count; ++i) pending_.add(reference(references.data(), i, depth + 1));
   return pending_.closeArray(array);
 }
 
 Value* BinaryReader::set(std::size_t offset, std::size_t depth) {
-  const std::string_view references = contentOf(offset, trailer_.referenceSize);
-  const std::size_t count = references.size() / trailer_.referenceSize;
+  const std::string_view references = contentOf(offset, references_.size());
+  const std::size_t count = references.size() / references_.size();
   const auto set = pending_.open();
   KeyIndex index(count, std::pmr::new_delete_resource());
   for (std::size_t i = 0; i < count; ++i) {
-    Value* element = reference(references, i, depth + 1);
+    Value* element = reference(references.data(), i, depth + 1);
     const std::uint64_t hash = hashOfKey(*element);
     const auto isElement = [&](std::size_t at) { return sameKey(*pending_.in(set)[at], *element); };
     if (index.find(hash, isElement) != KeyIndex::none) continue;
@@ -298,14 +303,14 @@ Value* BinaryReader::set(std::size_t offset, std::size_t depth) {
 
 Value* BinaryReader::dictionary(std::size_t offset, std::size_t depth) {
   // All keys stand first, then all values.
-  const std::string_view references = contentOf(offset, 2 * std::size_t{trailer_.referenceSize});
-  const std::size_t count = references.size() / trailer_.referenceSize / 2;
+  const std::string_view references = contentOf(offset, 2 * references_.size());
+  const std::size_t count = references.size() / references_.size() / 2;
   const auto entries = pending_.open();
   for (std::size_t i = 0; i < count; ++i) {
-    Value* key = reference(references, i, depth + 1);
+    Value* key = reference(references.data(), i, depth + 1);
     if (isCollection(*key)) refuse(offset, "a collection as the key of a dictionary");
     pending_.addKey(key, entries);
-    pending_.add(reference(references, count + i, depth + 1));
+    pending_.add(reference(references.data(), count + i, depth + 1));
   }
   return pending_.closeDictionary(entries, Dictionary::Duplicates::firstWins);
 }

@@ -2,14 +2,27 @@
 #pragma once
 
 #include <cstddef>
+#include <cstdint>
 #include <string>
 #include <string_view>
+
+#include "toolkit/property_list/words.hpp"
 
 namespace toolkit {
 
 /// How many bytes at the start of `text` are valid UTF-8 as Unicode defines it: no overlong forms,
 /// no surrogates, nothing above U+10FFFF. All of `text` when that is its size.
 std::size_t validUtf8Length(std::string_view text);
+
+/// Whether all of `text` is ASCII.
+inline bool isAscii(std::string_view text) {
+  std::uint64_t seen = 0;
+  for (; text.size() >= words::size; text.remove_prefix(words::size)) {
+    seen |= words::load(text.data());
+  }
+  for (const char c : text) seen |= static_cast<unsigned char>(c);
+  return (seen & words::highBits) == 0;
+}
 
 /// Appends a code point up to U+10FFFF, surrogates included.
 void appendUtf8(std::string& text, char32_t codePoint);

@@ -19,6 +19,15 @@ inline std::uint64_t load(const char* characters) {
   return word;
 }
 
+/// The number that a word stands for with its most significant byte first.
+inline std::uint64_t bigEndian(std::uint64_t word) {
+  if constexpr (std::endian::native == std::endian::big) return word;
+  // Neighbouring bytes change places, then pairs of them, then halves: one instruction in the end.
+  word = (word & 0x00FF00FF00FF00FF) << 8 | (word >> 8 & 0x00FF00FF00FF00FF);
+  word = (word & 0x0000FFFF0000FFFF) << 16 | (word >> 16 & 0x0000FFFF0000FFFF);
+  return word << 32 | word >> 32;
+}
+
 /// Sets the high bit of each byte that is zero, and nothing else.
 inline std::uint64_t zeroBytes(std::uint64_t word) {
   return ~(((word & ~highBits) + ~highBits) | word | ~highBits);
