@@ -17,6 +17,7 @@
 #include "tools/play/input_file.hpp"
 #include "tools/replace_file.hpp"
 #include "tools/shared_values.hpp"
+#include "tools/shell.hpp"
 #include "tools/text_layout.hpp"
 
 namespace tools {
@@ -71,7 +72,10 @@ void addConvertCommand(CLI::App& app, int& status) {
   command->add_option("IN", options->in, "The property list, of any format")
       ->required()
       ->type_name("");
-  command->add_option("OUT", options->out, "The file to write")->required()->type_name("");
+  command->add_option("OUT", options->out, "The file to write")
+      ->required()
+      ->check(whyNotPath)
+      ->type_name("");
   command
       ->add_option_function<std::string>(
           "--format", [options](const std::string& name) { setFormat(*options, name); },

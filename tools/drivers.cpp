@@ -59,9 +59,10 @@ std::unique_ptr<toolkit::TestDriver> requireDriver(std::string_view name) {
     throw Failure(ExitStatus::badInput,
                   "no toolkit " + std::string(name) + ": " + std::string(way));
   const auto known = driverNames();
-  throw Failure(ExitStatus::badInput, "unknown toolkit " + std::string(name) + "; this build has " +
-                                          enumerate({known.begin(), known.end()}) +
-                                          didYouMean(name, known));
+  throw Failure(ExitStatus::badInput,
+                "unknown toolkit " + (name.empty() ? "\"\"" : std::string(name)) +
+                    "; this build has " + enumerate({known.begin(), known.end()}) +
+                    didYouMean(name, known));
 }
 
 }  // namespace tools

@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <exception>
 #include <iostream>
+#include <new>
 
 #include "tools/suggestions.hpp"
 #include "tools/text_layout.hpp"
@@ -58,6 +59,22 @@ std::string unexpectedArgument(const CLI::App& command) {
   return "unknown option " + name + didYouMean(name, {options.begin(), options.end()});
 }
 
+/// CLI11 says "--start: At Most 1 required but received 2" of an option that stands twice.
+std::string givenTwice(std::string words) {
+  constexpr std::string_view most = ": At Most 1 required but received ";
+  const std::size_t at = words.find(most);
+  if (at == std::string::npos) return words;
+  return words.replace(at, most.size(), ": expected once, found times: ");
+}
+
+/// CLI11 says "list was given a disallowed flag override" of "--list=3".
+std::string flagWithValue(std::string words) {
+  constexpr std::string_view given = " was given a disallowed flag override";
+  if (!words.ends_with(given)) return words;
+  words.resize(words.size() - given.size());
+  return "--" + words + ": expected no value";
+}
+
 /// CLI11 says "--press: 1 required TAG missing" of an option whose value is missing.
 std::string missingValue(std::string words) {
   constexpr std::string_view required = ": 1 required ";
@@ -78,7 +95,7 @@ std::string explain(const CLI::ParseError& error, const CLI::App& app) {
     // Whatever else is wrong, what is not understood comes first: it may be the reason.
     words = unexpectedArgument(command);
   } else if (dynamic_cast<const CLI::ArgumentMismatch*>(&error)) {
-    words = missingValue(words);
+    words = givenTwice(flagWithValue(missingValue(std::move(words))));
   }
   const std::string help = &command == &app ? "" : command.get_name() + " ";
   return words + "; see " + toolName + " " + help + "--help";
@@ -96,12 +113,18 @@ int parse(CLI::App& app, std::vector<std::string> arguments, const int& status) 
     return report(ExitStatus::badInput, explain(error, app));
   } catch (const Failure& failure) {
     return report(failure.status(), failure.what());
+  } catch (const std::bad_alloc&) {
+    return report(ExitStatus::failed, "there is not enough memory for this");
   } catch (const std::exception& error) {
     return report(ExitStatus::failed, error.what());
   }
 }
 
 }  // namespace
+
+std::string whyNotPath(const std::string& argument) {
+  return argument.empty() ? "expected a path, found an empty text" : "";
+}
 
 int runTool(const std::vector<std::string>& arguments, const std::vector<AddCommand>& commands) {
   CLI::App app("Plays and tests scripted walk-throughs over the controls of a window.", toolName);
@@ -111,6 +134,8 @@ int runTool(const std::vector<std::string>& arguments, const std::vector<AddComm
   app.get_formatter()->label("SUBCOMMAND", "COMMAND");
   app.get_formatter()->label("Subcommands", "Commands");
   app.require_subcommand(1);
+  app.option_defaults()
+      ->disable_flag_override();  // else "--list=3" would do, whatever it is to mean
   for (const AddCommand add : commands) add(app, status);
 
   const int result = parse(app, arguments, status);

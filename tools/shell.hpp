@@ -21,4 +21,7 @@ using AddCommand = void (*)(CLI::App& app, int& status);
 /// line on standard error.
 int runTool(const std::vector<std::string>& arguments, const std::vector<AddCommand>& commands);
 
+/// What is wrong with an argument that is to be a path; empty when nothing is. For CLI11's checks.
+std::string whyNotPath(const std::string& argument);
+
 }  // namespace tools

@@ -14,6 +14,7 @@
 #include "tools/scenario/junit.hpp"
 #include "tools/scenario/runner.hpp"
 #include "tools/scenario/scenario_files.hpp"
+#include "tools/shell.hpp"
 #include "tools/text_layout.hpp"
 
 namespace tools {
@@ -127,13 +128,15 @@ void addTestCommand(CLI::App& app, int& status) {
   const auto options = std::make_shared<TestOptions>();
   auto* const command = app.add_subcommand("test", "Run scenarios and say which hold");
   command->add_option("FILE", options->paths, "Scenario files (.walk), or directories of them")
-      ->required();
+      ->required()
+      ->check(whyNotPath);
   command->add_option("--toolkit", options->toolkit, "The toolkit to run on")
       ->capture_default_str();
   command->add_option("--filter", options->filter, "Run only scenarios whose title contains this");
   command->add_flag("--list", options->list, "Name the scenarios instead of running them");
   command->add_flag("--verbose", options->verbose, "Print every statement with its result");
-  command->add_option("--junit", options->junit, "Write a JUnit report to this file");
+  command->add_option("--junit", options->junit, "Write a JUnit report to this file")
+      ->check(whyNotPath);
   command->callback([options, &status] { status = runTests(*options, std::cout, std::cerr); });
 }
 

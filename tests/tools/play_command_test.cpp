@@ -39,6 +39,8 @@ TEST_F(PlayCommand, badUsageIsOneLine) {
       {{"play", "script.plist", "--pres", "1"},
        "unknown option --pres; did you mean \"--press\"?" + help},
       {{"play", "script.plist", "--press"}, "--press: expected TAG" + help},
+      {{"play", "script.plist", "--start", "1", "--start", "2"},
+       "--start: expected once, found times: 2" + help},
       {{"play", "script.plist", "--press", "Next"},
        "--press: expected a tag (a whole number), found “Next”" + help},
       {{"play", "script.plist", "--advance", "-1"},
@@ -84,10 +86,14 @@ TEST_F(PlayCommand, stepsKeepTheOrderOfTheCommandLine) {
   EXPECT_EQ(result.out.find("7. "), std::string::npos);
 }
 
-TEST_F(PlayCommand, aRefusedPressIsAStatus) {
+TEST_F(PlayCommand, aRefusedPressIsAStatusAndALine) {
   const Result result = run({"play", "script.plist", "--toolkit", "memory", "--press", "-2"});
   EXPECT_EQ(result.status, 1);
   EXPECT_NE(result.out.find("no control has the tag -2"), std::string::npos) << result.out;
+  EXPECT_TRUE(
+      result.err.ends_with("qz-walkthrough: script.plist: press -2: no control has the tag "
+                           "-2; press 1 (1) or 2 (2)\n"))
+      << result.err;
 }
 
 TEST_F(PlayCommand, screenshotsNeedPixels) {

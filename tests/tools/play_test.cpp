@@ -110,6 +110,9 @@ TEST(Play, whatAListRaisesIsReportedAndTheWalkThroughGoesOn) {
   const Played played = run(options);
   EXPECT_EQ(played.status, ExitStatus::failed);
   EXPECT_NE(played.transcript.find("  Raised NSInvalidArgumentException: "), std::string::npos);
+  EXPECT_NE(played.log.find("qz-walkthrough: script.plist: press 4 (4): raised NSInvalid"),
+            std::string::npos)
+      << played.log;
   EXPECT_NE(played.transcript.find("\n── 3. press 2 (2) ──"), std::string::npos);
 }
 
@@ -233,6 +236,8 @@ TEST(Play, saysWhatIsWrongWithAFile) {
   options = smallScript(directory);
   options.resources = "images";
   EXPECT_EQ(refusal(options), "images: no such directory; expected one with images");
+  options.resources = options.script;
+  EXPECT_EQ(refusal(options), options.script + ": no directory; expected one with images");
   options = {};
   options.script = "script.plist";
   directory.write("script.plist", "{ 1 = (");

@@ -97,7 +97,7 @@ TEST_F(ScenarioCommand, nothingRunsWhenAFileIsRefused) {
   EXPECT_EQ(result.status, 2);
   EXPECT_EQ(result.out, "");
   EXPECT_EQ(result.err,
-            "none.walk: no such file or directory\n"
+            "none.walk: no such file or directory; expected a scenario file (.walk)\n"
             "refused.walk:3:3: unknown statement \"controll\"; did you mean \"control\"?\n");
 }
 
@@ -164,6 +164,10 @@ TEST_F(ScenarioCommand, badUsageIsOneLine) {
        "no/report.xml: the report cannot be written"},
       {{"test", "--verbos", "a.walk"},
        "unknown option --verbos; did you mean \"--verbose\"?; see qz-walkthrough test --help"},
+      {{"test", "--list=3", "a.walk"}, "--list: expected no value; see qz-walkthrough test --help"},
+      {{"test", ""}, "FILE: expected a path, found an empty text; see qz-walkthrough test --help"},
+      {{"test", "a.walk", "--junit", ""},
+       "--junit: expected a path, found an empty text; see qz-walkthrough test --help"},
       {{"test"}, "FILE is required; see qz-walkthrough test --help"},
   };
   for (const auto& test : cases) {

@@ -4,13 +4,13 @@
 #include <cerrno>
 #include <cstring>
 #include <filesystem>
-#include <fstream>
-#include <sstream>
+#include <new>
 #include <utility>
 
 #include "toolkit/property_list/reader.hpp"
 #include "toolkit/property_list/scalars.hpp"
 #include "tools/text_layout.hpp"
+#include "tools/whole_file.hpp"
 
 namespace tools::play {
 namespace {
@@ -25,14 +25,8 @@ std::string contentsOf(const std::string& path, const std::string& what) {
   const auto status = std::filesystem::status(path, error);
   if (!exists(status)) cannotRead(path + ": no such file; expected " + what);
   if (is_directory(status)) cannotRead(path + ": a directory; expected " + what);
-  errno = 0;
-  std::ifstream file(path, std::ios::binary);
-  std::ostringstream contents;
-  contents << file.rdbuf();
-  if (file.bad() || !file.is_open()) {
-    cannotRead(path + ": cannot be read (" + std::strerror(errno) + "); expected " + what);
-  }
-  return contents.str();
+  if (auto contents = wholeFile(path)) return *std::move(contents);
+  cannotRead(path + ": cannot be read (" + std::strerror(errno) + "); expected " + what);
 }
 
 /// A place as a prefix of messages about it.
@@ -48,6 +42,14 @@ std::string where(const std::string& path, const std::optional<toolkit::Position
 
 InputFile::InputFile(std::string path, std::string_view what, ExitStatus refusal)
     : path_(std::move(path)), what_(what), refusal_(refusal) {
+  try {
+    read();
+  } catch (const std::bad_alloc&) {
+    throw Failure(refusal_, path_ + ": needs more memory than there is; expected " + what_);
+  }
+}
+
+void InputFile::read() {
   const std::string contents = contentsOf(path_, what_);
   if (contents.empty()) throw Failure(refusal_, path_ + ": an empty file; expected " + what_);
   const auto result = toolkit::readPropertyList(contents, &positions_);

@@ -27,6 +27,8 @@ class InputFile {
   [[noreturn]] void fail(const toolkit::ValueRef<>& value, const std::string& message) const;
 
  private:
+  void read();
+
   std::string path_;
   std::string what_;
   ExitStatus refusal_;

@@ -66,7 +66,8 @@ void checkStart(const InputFile& file, std::string key) {
 void checkDirectory(const std::string& path) {
   std::error_code error;
   if (fs::is_directory(path, error)) return;
-  throw Failure(ExitStatus::badInput, path + ": no such directory; expected one with images");
+  const std::string what = fs::exists(path, error) ? ": no directory" : ": no such directory";
+  throw Failure(ExitStatus::badInput, path + what + "; expected one with images");
 }
 
 void pressIfPossible(Session& session, const Press& press, std::ostream& out) {
@@ -139,7 +140,10 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   for (const Step& step : options.steps) session.perform(step);
   if (options.steps.empty()) leaveToTheUser(*driver, session, terminal);
   session.conclude();
-  return session.failed() ? ExitStatus::failed : ExitStatus::fine;
+  for (const std::string& problem : session.problems()) {
+    terminal.log << "qz-walkthrough: " << file.path() << ": " << oneLine(problem) << '\n';
+  }
+  return session.problems().empty() ? ExitStatus::fine : ExitStatus::failed;
 }
 
 }  // namespace tools::play

@@ -43,7 +43,7 @@ struct PlayOptions {
 struct Terminal {
   std::istream& in;
   std::ostream& out;  ///< the transcript
-  std::ostream& log;  ///< the engine's log lines
+  std::ostream& log;  ///< the engine's log lines; at the end, what could not be done
   /// Asks for steps when none are given; a person at the toolkit's own screen plays there.
   bool interactive;
   Style style;

@@ -88,20 +88,21 @@ void Session::run(const std::string& heading, const std::string& name,
 }
 
 void Session::begin(const std::string& heading, const std::string& name) {
-  if (stepName_) end();
-  stepName_ = name;
+  if (begun_) end();
+  begun_ = {heading, name};
   transcript_.beginStep(heading);
 }
 
 // A host's event loop would report it and go on; so does the transcript.
 void Session::noteRaised(const toolkit::Exception& exception) {
-  failed_ = true;
-  transcript_.note("Raised " + exception.name() + ": " + printable(exception.reason()));
+  const std::string what = "aised " + exception.name() + ": " + printable(exception.reason());
+  problems_.push_back(begun_->heading + ": r" + what);
+  transcript_.note("R" + what);
 }
 
 void Session::end() {
   transcript_.endStep(look());
-  takeScreenshot(*std::exchange(stepName_, std::nullopt));
+  takeScreenshot(std::exchange(begun_, std::nullopt)->name);
 }
 
 void Session::takeScreenshot(const std::string& name) {
@@ -117,7 +118,7 @@ void Session::handOver() {
     try {
       driver_.handOver(willAct, [this] { return watch(); });
     } catch (const toolkit::Exception& exception) {
-      if (!stepName_) begin("a timer fires", "list");
+      if (!begun_) begin("a timer fires", "list");
       noteRaised(exception);
     }
   }
@@ -125,7 +126,7 @@ void Session::handOver() {
 
 /// Writes down what has happened since the last step; whether the walk-through goes on.
 bool Session::watch() {
-  if (!stepName_) {
+  if (!begun_) {
     const StepPicture now = look();
     if (const TimerPicture* const fired = firedBetween(picture(), now)) {
       begin("list " + fired->key + " runs by its timer", "list-" + fired->key);
@@ -138,7 +139,7 @@ bool Session::watch() {
 }
 
 void Session::refuse(const std::string& heading, const std::string& reason) {
-  failed_ = true;
+  problems_.push_back(heading + ": " + reason);
   transcript_.beginStep(heading);
   transcript_.note("Not possible: " + reason + ".");
 }

@@ -5,6 +5,7 @@
 #include <iosfwd>
 #include <optional>
 #include <string>
+#include <vector>
 
 #include "toolkit/exception.hpp"
 #include "toolkit/test_driver.hpp"
@@ -36,8 +37,8 @@ class Session {
   void conclude();
 
   const StepPicture& picture() const { return transcript_.latest(); }
-  /// Whether a step could not be made, or a list raised.
-  bool failed() const { return failed_; }
+  /// The steps that could not be made and the lists that raised, a line each.
+  const std::vector<std::string>& problems() const { return problems_; }
 
  private:
   void press(long tag);
@@ -58,8 +59,12 @@ class Session {
   Stage& stage_;
   Transcript transcript_;
   Screenshots* screenshots_;
-  std::optional<std::string> stepName_;  // of the step that has begun, for its picture
-  bool failed_ = false;
+  struct Begun {
+    std::string heading;
+    std::string name;  // for its picture
+  };
+  std::optional<Begun> begun_;  // the step that is not over yet
+  std::vector<std::string> problems_;
 };
 
 }  // namespace tools::play

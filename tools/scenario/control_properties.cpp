@@ -80,9 +80,9 @@ Reading runs(const Stage&, const ViewPicture& picture) { return showRuns(styledT
 using View = Cast::View;
 
 toolkit::Ref<toolkit::Button> button(const View& view) {
-  const auto button = toolkit::asButton(view);
-  if (!button) throw Unmet("a button", view->className());
-  return button;
+  auto found = toolkit::asButton(view);
+  if (!found) throw Unmet("a button", view->className());
+  return found;
 }
 
 std::string textOf(const Wanted& value) {

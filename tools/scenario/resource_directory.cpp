@@ -31,7 +31,7 @@ fs::path makeTemporaryDirectory() {
   const auto parent = fs::canonical(fs::temp_directory_path());
   std::random_device random;
   while (true) {
-    const auto path = parent / ("qz-walkthrough-" + std::to_string(random()));
+    auto path = parent / ("qz-walkthrough-" + std::to_string(random()));
     if (fs::create_directory(path)) return path;
   }
 }

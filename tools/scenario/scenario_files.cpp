@@ -3,12 +3,12 @@
 #include "tools/scenario/scenario_files.hpp"
 
 #include <algorithm>
-#include <fstream>
-#include <optional>
-#include <sstream>
+#include <cerrno>
+#include <cstring>
 #include <system_error>
 
 #include "tools/scenario/statements.hpp"
+#include "tools/whole_file.hpp"
 
 namespace tools::scenario {
 namespace {
@@ -30,19 +30,10 @@ std::vector<std::string> scenariosBelow(const std::string& directory, std::strin
   return found;
 }
 
-std::optional<std::string> contentsOf(const std::string& path) {
-  std::ifstream stream(path, std::ios::binary);
-  std::ostringstream contents;
-  // Reading an empty file out sets the stream's fail bit, which is no error.
-  if (stream.peek() != std::ifstream::traits_type::eof()) contents << stream.rdbuf();
-  if (!stream.is_open() || stream.bad()) return std::nullopt;
-  return contents.str();
-}
-
 void readFile(const std::string& path, ReadFiles& read) {
-  const auto text = contentsOf(path);
+  const auto text = wholeFile(path);
   if (!text) {
-    read.problems.push_back(path + ": cannot be read");
+    read.problems.push_back(path + ": cannot be read (" + std::strerror(errno) + ")");
     return;
   }
   try {
@@ -61,7 +52,8 @@ ReadFiles readScenarios(const std::vector<std::string>& paths) {
   for (const auto& path : paths) {
     std::string problem;
     auto found = fs::is_directory(path) ? scenariosBelow(path, problem) : std::vector{path};
-    if (!fs::exists(path)) problem = path + ": no such file or directory";
+    if (!fs::exists(path))
+      problem = path + ": no such file or directory; expected a scenario file (.walk)";
     if (!problem.empty()) {
       read.problems.push_back(problem);
       continue;

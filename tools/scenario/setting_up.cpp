@@ -65,8 +65,10 @@ Cast::View viewNamed(const Stage& stage, const std::string& place) {
 // Five in a row, so that none lies over another and each can be clicked.
 Rect nextFrame(const Cast::View& parent) {
   const auto index = parent->subviews().size();
-  return {20.0 + 120.0 * static_cast<double>(index % 5),
-          20.0 + 40.0 * static_cast<double>(index / 5), 100, 30};
+  const auto column = index % 5;
+  const auto row = index / 5;
+  return {20.0 + 120.0 * static_cast<double>(column), 20.0 + 40.0 * static_cast<double>(row), 100,
+          30};
 }
 
 Outcome control(Stage& stage, const Arguments& a) {

@@ -140,7 +140,7 @@ std::string showColor(const toolkit::Color& color) {
   char text[10];
   std::snprintf(text, sizeof text, "#%02x%02x%02x%02x", byte(color.red), byte(color.green),
                 byte(color.blue), byte(color.alpha));
-  return std::string(text, color.alpha == 1 ? 7 : 9);
+  return {text, std::size_t{color.alpha == 1 ? 7U : 9U}};
 }
 
 }  // namespace tools::scenario
