@@ -8,7 +8,7 @@
 
 #if defined(__linux__)
 #include <pthread.h>
-#include <signal.h>
+#include <signal.h>  // NOLINT(modernize-deprecated-headers): the standard one has no alternate stacks
 #include <unistd.h>
 #endif
 
