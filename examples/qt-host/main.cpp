@@ -1,12 +1,11 @@
 // A host with windows of its own, and walk-throughs in its Help menu.
 #include <QApplication>
-#include <memory>
 
 #include "guided_form.hpp"
 
 int main(int argc, char** argv) {
   const QApplication application(argc, argv);
-  const auto form = std::make_shared<GuidedForm>(QApplication::applicationDirPath().toStdString());
-  form->show();
+  GuidedForm form(QApplication::applicationDirPath().toStdString());
+  form.show();
   return QApplication::exec();
 }

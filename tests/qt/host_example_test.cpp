@@ -11,8 +11,8 @@
 namespace {
 
 struct HostExample : testing::Test {
-  std::shared_ptr<GuidedForm> form =
-      std::make_shared<GuidedForm>(QZ_SOURCE_DIR "/examples/qt-host");
+  std::unique_ptr<GuidedForm> form =
+      std::make_unique<GuidedForm>(QZ_SOURCE_DIR "/examples/qt-host");
 
   HostExample() {
     form->show();

@@ -5,12 +5,15 @@
 #include <QPointer>
 #include <QPushButton>
 
+#include "QZ_Plist_State_Parser.hpp"
 #include "tests/qt/support.hpp"
+#include "toolkit/property_list/reader.hpp"
 #include "toolkit/qt/widget_node.hpp"
 
 namespace {
 
 using Lifetime = hosts::Host;
+using toolkit::qt::tagProperty;
 
 TEST_F(Lifetime, OfADeletedWidgetEveryMessageDoesNothing) {
   auto* const widget = &add<QCheckBox>("Box");
@@ -44,6 +47,65 @@ TEST_F(Lifetime, AWidgetMayBeDeletedInItsOwnClick) {
   hosts::settle();
   EXPECT_EQ(performer->actions.size(), 1U);
   EXPECT_TRUE(window->contentView()->subviews().empty());
+}
+
+TEST_F(Lifetime, AWidgetMayBeDeletedAtOnceInItsOwnClick) {
+  auto* const widget = &add<QPushButton>("Next");
+  const auto button = adopt(*widget);
+  performer->then = [&] { delete widget; };
+  show();
+  QTest::mouseClick(widget, Qt::LeftButton);
+  EXPECT_EQ(performer->actions.size(), 1U);
+  button->highlight(true);
+  EXPECT_TRUE(window->contentView()->subviews().empty());
+}
+
+/// An engine over the window, whose script is the text.
+std::shared_ptr<QZ_Plist_State_Parser> walkThrough(hosts::Host& host, std::string_view script) {
+  host.toolkit.log().setSink([](std::string_view) {});
+  auto engine = QZ_Plist_State_Parser::initWithWindow(host.toolkit, host.window);
+  engine->getGuiAssetsFromWindow(host.window);
+  engine->setPlistDictionary(toolkit::dictionaryFromPropertyList(script));
+  return engine;
+}
+
+// The list turns a box on, of which the host makes the text go; what comes next finds no text, and
+// the box goes in the middle of the last command of all.
+TEST_F(Lifetime, WidgetsMayBeDeletedWhileAListRuns) {
+  auto* const box = &add<QCheckBox>("Box");
+  QPointer<QLabel> label = &add<QLabel>("Text");
+  auto* const next = &add<QPushButton>("Next");
+  box->setProperty(tagProperty, 1);
+  label->setProperty(tagProperty, 2);
+  next->setProperty(tagProperty, 3);
+  QObject::connect(box, &QCheckBox::toggled, [&](bool on) {
+    if (on)
+      delete label;
+    else
+      delete box;
+  });
+  const auto engine = walkThrough(
+      *this,
+      "{ 3 = ((SET_STATE_ON_FOR_OBJECT_ID, 1), (SET_TEXT_FOR_OBJECT_ID, late, 2),"
+      "       (SET_TITLE_FOR_OBJECT_ID, Done, 3), (SET_STATE_OFF_FOR_OBJECT_ID, 1)); }");
+  show();
+  QTest::mouseClick(next, Qt::LeftButton);
+  EXPECT_FALSE(label);
+  EXPECT_EQ(next->text(), "Done");
+  EXPECT_EQ(window->contentView()->subviews().size(), 1U);
+  engine->terminateParser();
+}
+
+TEST_F(Lifetime, AnEngineMayOutliveItsWindowWithATimerPending) {
+  auto* const next = &add<QPushButton>("Next");
+  next->setProperty(tagProperty, 3);
+  const auto engine = walkThrough(
+      *this, "{ 3 = ((SET_TIMER_FOR_ID, 1, 4)); 4 = ((SET_TITLE_FOR_OBJECT_ID, late, 3)); }");
+  show();
+  QTest::mouseClick(next, Qt::LeftButton);
+  panel.reset();
+  EXPECT_TRUE(QTest::qWaitFor([&] { return engine->currentCommandState() == "4"; }));
+  engine->terminateParser();
 }
 
 TEST_F(Lifetime, ATimerMayOutliveTheWindow) {

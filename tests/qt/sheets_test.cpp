@@ -50,6 +50,22 @@ TEST_F(Sheets, BlockTheirParentUntilTheyAreOrderedOut) {
   EXPECT_EQ(performer->actions.size(), 1U);
 }
 
+TEST_F(Sheets, HangAtTheTopEdgeOfTheirParentWhereverItGoes) {
+  begin();
+  const auto expectHanging = [this] {
+    hosts::settle();
+    const QPoint top = panel->mapToGlobal(QPoint((panel->width() - sheetWidget.width()) / 2, 0));
+    EXPECT_EQ(sheetWidget.pos(), top);
+  };
+  expectHanging();
+  panel->move(30, 60);
+  expectHanging();
+  panel->resize(500, 200);
+  expectHanging();
+  sheetWidget.resize(120, 90);
+  expectHanging();
+}
+
 TEST_F(Sheets, LeaveTheirWindowAsItWas) {
   sheetWidget.move(30, 40);
   begin();

@@ -10,8 +10,6 @@
 #include <QMouseEvent>
 #include <QPushButton>
 #include <QStyleOptionButton>
-#include <QTextDocument>
-#include <QTextDocumentFragment>
 #include <QTimer>
 #include <QToolButton>
 #include <QWindow>
@@ -22,6 +20,7 @@
 #include <iterator>
 #include <utility>
 
+#include "toolkit/qt/accessibility.hpp"
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/strings.hpp"
 #include "toolkit/qt/text_look.hpp"
@@ -96,30 +95,26 @@ ViewKind kindOf(View& view, const QWidget& widget) {
   return qobject_cast<const QGroupBox*>(&widget) ? ViewKind::box : ViewKind::plain;
 }
 
-// Text that looks like markup is shown as markup that looks like the text.
-std::string plainToolTip(const QWidget& widget) {
-  const QString text = widget.toolTip();
-  if (!Qt::mightBeRichText(text)) return utf8(text);
-  return utf8(QTextDocumentFragment::fromHtml(text).toPlainText());
-}
-
 std::optional<std::string> nameOf(const Ref<Image>& image) {
   return image ? std::optional(image->name()) : std::nullopt;
 }
 
-// Where there is a display, windows are shown on it.
-void drawOffTheScreenWithoutDisplay() {
-  const auto isSet = [](const char* name) { return !qEnvironmentVariableIsEmpty(name); };
-  if (isSet("QT_QPA_PLATFORM") || isSet("DISPLAY") || isSet("WAYLAND_DISPLAY")) return;
+// Where there is a display that can be reached, windows are shown on it; else they are drawn off
+// the screen. X11 comes before Wayland, on which a sheet cannot be put to its place.
+void chooseDisplay() {
 #ifdef Q_OS_LINUX
-  qputenv("QT_QPA_PLATFORM", "offscreen");
+  if (!qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM")) return;
+  QByteArray platforms;
+  if (!qEnvironmentVariableIsEmpty("DISPLAY")) platforms += "xcb;";
+  if (!qEnvironmentVariableIsEmpty("WAYLAND_DISPLAY")) platforms += "wayland;";
+  qputenv("QT_QPA_PLATFORM", platforms + "offscreen");
 #endif
 }
 
 // Never destroyed: drivers come and go, and Qt allows for one application in a program's life.
 void requireApplication() {
   if (QCoreApplication::instance()) return;
-  drawOffTheScreenWithoutDisplay();
+  chooseDisplay();
   static int argc = 1;
   static char name[] = "qz-walkthrough";
   static char* argv[] = {name, nullptr};
@@ -260,7 +255,7 @@ ViewPicture QtDriver::look(const Ref<View>& view) {
   picture.hidden = node->isHidden();
   picture.enabled = widget.isEnabledTo(widget.parentWidget());
   picture.state = view->state();
-  picture.toolTip = plainToolTip(widget);
+  picture.toolTip = shownToolTip(widget);
   if (const auto* control = dynamic_cast<const ControlNode*>(node.get())) {
     picture.text = control->value();
     picture.target = control->target();

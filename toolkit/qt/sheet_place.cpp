@@ -3,10 +3,13 @@
 
 #include "toolkit/qt/sheet_place.hpp"
 
+#include <QEvent>
+
 namespace toolkit::qt {
 
 SheetPlace::SheetPlace(QWidget& sheet, QWidget& parent)
     : sheet_(&sheet),
+      parent_(&parent),
       modality_(sheet.windowModality()),
       hadPosition_(sheet.testAttribute(Qt::WA_Moved)),
       position_(sheet.pos()) {
@@ -16,16 +19,29 @@ SheetPlace::SheetPlace(QWidget& sheet, QWidget& parent)
   transientParent_ = sheet.windowHandle()->transientParent();
   sheet.windowHandle()->setTransientParent(parent.windowHandle());
   sheet.setWindowModality(Qt::WindowModal);
-  const QPoint top = parent.mapToGlobal(QPoint((parent.width() - sheet.width()) / 2, 0));
-  sheet.move(top);
+  hang();
+  sheet.installEventFilter(this);
+  parent.installEventFilter(this);
 }
 
 SheetPlace::~SheetPlace() {
   if (!sheet_) return;
+  sheet_->removeEventFilter(this);
   sheet_->setWindowModality(modality_);
   if (sheet_->windowHandle()) sheet_->windowHandle()->setTransientParent(transientParent_);
   sheet_->move(position_);
   sheet_->setAttribute(Qt::WA_Moved, hadPosition_);
+}
+
+void SheetPlace::hang() {
+  if (!sheet_ || !parent_) return;
+  sheet_->move(parent_->mapToGlobal(QPoint((parent_->width() - sheet_->width()) / 2, 0)));
+}
+
+bool SheetPlace::eventFilter(QObject* watched, QEvent* event) {
+  const bool moved = event->type() == QEvent::Move && watched == parent_;
+  if (moved || event->type() == QEvent::Resize) hang();
+  return false;
 }
 
 }  // namespace toolkit::qt

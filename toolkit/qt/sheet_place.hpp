@@ -8,16 +8,20 @@
 namespace toolkit::qt {
 
 /// While it lives `sheet`, which is hidden at its beginning, blocks `parent` and hangs at its top
-/// edge. What the sheet's widget was like before comes back at the end.
-class SheetPlace {
+/// edge, wherever the user moves that. What the sheet's widget was like before comes back at the
+/// end.
+class SheetPlace final : public QObject {
  public:
   SheetPlace(QWidget& sheet, QWidget& parent);
-  ~SheetPlace();
-  SheetPlace(const SheetPlace&) = delete;
-  SheetPlace& operator=(const SheetPlace&) = delete;
+  ~SheetPlace() override;
+
+  bool eventFilter(QObject* watched, QEvent* event) override;
 
  private:
+  void hang();
+
   QPointer<QWidget> sheet_;
+  QPointer<QWidget> parent_;
   QPointer<QWindow> transientParent_;
   Qt::WindowModality modality_;
   bool hadPosition_;
