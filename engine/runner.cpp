@@ -27,8 +27,8 @@ bool QZ_Plist_State_Parser::processCommandArray(const Value& list, const ObjectI
 bool QZ_Plist_State_Parser::runElement(const Value& element, const Parameters& parameters,
                                        const ObjectId& id) {
   if (element->kind() != toolkit::Value::Kind::array) {
-    const Value held = element;  // a list of the host's may lose it while it runs
-    return doSimpleCommand(textOf(held), parameters, id);
+    // A copy keeps it: a list of the host's may lose it while it runs.
+    return doSimpleCommand(textOf(Value(element)), parameters, id);
   }
   const auto& compound = static_cast<const toolkit::Array&>(*element);
   std::string raised;

@@ -8,7 +8,7 @@ void QZ_Plist_State_Parser::startTimerWithValue(std::uint64_t value,
                                                 const std::optional<std::string>& forKey) {
   if (value == 0 || !forKey || forKey->empty()) return;
   // Seconds in single precision: above 16,777,216 the low digits are lost.
-  const double interval = static_cast<double>(static_cast<float>(value));
+  const auto interval = static_cast<double>(static_cast<float>(value));
   const auto self = shared_from_this();
   // A timer that is replaced goes on running; when it fires, no key is found for it.
   objectIdTimers_->setObject(
