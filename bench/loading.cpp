@@ -3,9 +3,10 @@
 #include <plist/plist.h>
 #include <pugixml.hpp>
 
+#include <algorithm>
 #include <cstdio>
 #include <cstdlib>
-#include <cstring>
+#include <limits>
 #include <memory>
 #include <optional>
 #include <string>
@@ -22,6 +23,7 @@ using bench::Contender;
 
 constexpr std::size_t megabyte = 1'000'000;
 constexpr std::size_t loadedSizes[] = {1 * megabyte, 18 * megabyte};
+constexpr std::size_t grownSizes[] = {1 * megabyte, 8 * megabyte, 64 * megabyte, 500 * megabyte};
 
 void require(bool loaded, const char* by) {
   if (loaded) return;
@@ -70,78 +72,88 @@ std::string inMegabytes(std::size_t bytes) {
   return std::to_string((bytes + megabyte / 2) / megabyte) + " MB";
 }
 
+/// One row: how long each contender takes, and the others beside the first, which is this reader.
+void printTimes(const std::string& file, const std::vector<Contender>& contenders, int rounds) {
+  const auto times = bench::leastTimes(contenders, rounds);
+  std::vector<std::string> row{file};
+  for (const char* name : {"this reader", "pugixml", "libplist"}) {
+    std::string cell;
+    for (std::size_t i = 0; i < contenders.size(); ++i) {
+      if (contenders[i].name != name) continue;
+      cell = bench::shownTime(times[i]);
+      if (i > 0) cell += ", " + bench::shownRatio(times[i] / times[0]);
+    }
+    row.push_back(cell);
+  }
+  bench::printRow(row);
+}
+
+/// The same work so many times, each script freed before the next is read.
+Contender repeated(const Contender& one, int count) {
+  return {one.name, [one, count] {
+            for (int i = 0; i < count; ++i) {
+              one.prepare();
+              one.run();
+            }
+          }};
+}
+
 void measureLoads() {
-  bench::printHead("Loading a script", {"file", "this reader", "pugixml", "libplist",
-                                        "pugixml : this", "libplist : this"});
+  bench::printHead("Loading a script", {"file", "this reader", "pugixml", "libplist"});
   for (const std::size_t size : loadedSizes) {
     const int rounds = size > 10 * megabyte ? 9 : 60;
     const std::string xml = bench::xmlScript(size);
-    const auto t =
-        bench::leastTimes({ourLoad(xml), pugixmlLoad(xml), libplistLoad(xml, false)}, rounds);
-    bench::printRow({"XML, " + inMegabytes(xml.size()), bench::shownTime(t[0]),
-                     bench::shownTime(t[1]), bench::shownTime(t[2]), bench::shownRatio(t[1] / t[0]),
-                     bench::shownRatio(t[2] / t[0])});
+    printTimes("XML, " + inMegabytes(xml.size()),
+               {ourLoad(xml), pugixmlLoad(xml), libplistLoad(xml, false)}, rounds);
     const std::string binary = binaryOf(xml);
-    const auto b = bench::leastTimes({ourLoad(binary), libplistLoad(binary, true)}, rounds);
-    bench::printRow({"the same in binary", bench::shownTime(b[0]), "", bench::shownTime(b[1]), "",
-                     bench::shownRatio(b[1] / b[0])});
+    printTimes("the same in binary", {ourLoad(binary), libplistLoad(binary, true)}, rounds);
   }
-}
-
-void measureSmallLoads() {
-  constexpr std::size_t bytes = 2000;
   constexpr int count = 1000;
-  const std::string xml = bench::xmlScript(bytes);
-  const auto repeated = [](Contender one) {
-    return Contender{one.name, [one] {
-                       for (int i = 0; i < count; ++i) {
-                         one.prepare();
-                         one.run();
-                       }
-                     }};
-  };
-  const auto t = bench::leastTimes(
-      {repeated(ourLoad(xml)), repeated(pugixmlLoad(xml)), repeated(libplistLoad(xml, false))}, 20);
-  bench::printRow({"1000 times XML, 2 kB, and freeing it", bench::shownTime(t[0]),
-                   bench::shownTime(t[1]), bench::shownTime(t[2]), bench::shownRatio(t[1] / t[0]),
-                   bench::shownRatio(t[2] / t[0])});
+  const std::string xml = bench::xmlScript(2000);
+  printTimes("1000 times XML, 2 kB, and freeing it",
+             {repeated(ourLoad(xml), count), repeated(pugixmlLoad(xml), count),
+              repeated(libplistLoad(xml, false), count)},
+             20);
 }
 
-/// A program of its own, for the memory it takes: loads a made script, or makes it only.
-int loadOnce(std::size_t size, bool load) {
+/// The first load of a made script in a program: prints how long it took, by how much the memory
+/// that the program holds grew meanwhile at most, and by how much in the end, all per byte.
+void loadOnce(std::size_t size) {
   const std::string xml = bench::xmlScript(size);
-  if (!load) return 0;
-  return toolkit::dictionaryFromPropertyList(xml) ? 0 : 1;
+  const Contender load = ourLoad(xml);
+  const bench::Memory before = bench::memory();
+  const double time = bench::timeOf(load.run);
+  const bench::Memory after = bench::memory();
+  const auto bytes = static_cast<double>(xml.size());
+  std::printf("%g %g %g\n", time / bytes, static_cast<double>(after.most - before.now) / bytes,
+              static_cast<double>(after.now - before.now) / bytes);
 }
 
-void measureGrowth(const std::vector<std::size_t>& sizes) {
-  bench::printHead(
-      "Growth with the size of an XML script",
-      {"size", "time", "a byte", "peak memory beyond the file's bytes", "of the file's size"});
+void measureGrowth() {
+  bench::printHead("The first load of an XML script in a program, per byte of it",
+                   {"file", "time", "most memory meanwhile", "memory of the script"});
   std::vector<std::pair<double, double>> points;
-  for (const std::size_t size : sizes) {
-    const std::string xml = bench::xmlScript(size);
-    const auto bytes = static_cast<double>(xml.size());
-    const double time = bench::leastTimes({ourLoad(xml)}, size > 100 * megabyte ? 3 : 15)[0];
-    points.emplace_back(bytes, time);
-    const auto peak = [size](const char* mode) {
-      return static_cast<double>(bench::peakMemoryOf({mode, std::to_string(size)}));
-    };
-    const double memory = peak("--load") - peak("--make");
-    bench::printRow({inMegabytes(size), bench::shownTime(time), bench::shownTime(time / bytes),
-                     inMegabytes(static_cast<std::size_t>(memory)),
-                     bench::shownRatio(memory / bytes)});
+  for (const std::size_t size : grownSizes) {
+    std::vector<double> least(3, std::numeric_limits<double>::infinity());
+    for (int round = 0; round < 5; ++round) {
+      const auto numbers = bench::numbersOfOwnRun(std::to_string(size));
+      for (std::size_t i = 0; i < least.size(); ++i) least[i] = std::min(least[i], numbers.at(i));
+    }
+    points.emplace_back(size, least[0] * static_cast<double>(size));
+    bench::printRow({inMegabytes(size), bench::shownTime(least[0]), bench::shownBytes(least[1]),
+                     bench::shownBytes(least[2])});
   }
-  std::printf("\nTime grows with the size to the power of %.3f.\n", bench::fittedExponent(points));
+  bench::printExponent("Time grows with the size", points);
 }
 
 }  // namespace
 
 int main(int argc, char** argv) {
-  if (argc == 3)
-    return loadOnce(std::strtoull(argv[2], nullptr, 10), !std::strcmp(argv[1], "--load"));
+  if (argc == 2) {
+    loadOnce(std::strtoull(argv[1], nullptr, 10));
+    return 0;
+  }
+  measureGrowth();
   measureLoads();
-  measureSmallLoads();
-  measureGrowth({megabyte, 8 * megabyte, 64 * megabyte, 500 * megabyte});
   return 0;
 }

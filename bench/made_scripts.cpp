@@ -39,7 +39,8 @@ std::string xmlScript(std::size_t bytes) {
       "<plist version=\"1.0\">\n<dict>\n";
   script.reserve(bytes + 2048);
   for (std::size_t number = 0; script.size() < bytes; ++number) script += list(number);
-  return script + "</dict>\n</plist>\n";
+  script += "</dict>\n</plist>\n";
+  return script;
 }
 
 }  // namespace bench

@@ -1,14 +1,13 @@
 #include "bench/measuring.hpp"
 
-#include <sys/resource.h>
-#include <sys/wait.h>
-#include <unistd.h>
-
 #include <algorithm>
 #include <array>
 #include <cmath>
 #include <cstdio>
+#include <cstdlib>
 #include <ctime>
+#include <filesystem>
+#include <fstream>
 #include <limits>
 
 namespace bench {
@@ -28,14 +27,18 @@ std::string formatted(const char* format, double number) {
 
 }  // namespace
 
+double timeOf(const std::function<void()>& run) {
+  const double start = processorTime();
+  run();
+  return processorTime() - start;
+}
+
 std::vector<double> leastTimes(const std::vector<Contender>& contenders, int rounds) {
   std::vector<double> least(contenders.size(), std::numeric_limits<double>::infinity());
   for (int round = 0; round < rounds; ++round) {
     for (std::size_t i = 0; i < contenders.size(); ++i) {
       contenders[i].prepare();
-      const double start = processorTime();
-      contenders[i].run();
-      least[i] = std::min(least[i], processorTime() - start);
+      least[i] = std::min(least[i], timeOf(contenders[i].run));
     }
   }
   return least;
@@ -54,21 +57,26 @@ double fittedExponent(const std::vector<std::pair<double, double>>& points) {
   return (count * sumXY - sumX * sumY) / (count * sumXX - sumX * sumX);
 }
 
-std::size_t peakMemoryOf(const std::vector<std::string>& arguments) {
-  const pid_t child = ::fork();
-  if (child == 0) {
-    std::vector<std::string> own{"bench"};
-    own.insert(own.end(), arguments.begin(), arguments.end());
-    std::vector<char*> pointers;
-    for (std::string& argument : own) pointers.push_back(argument.data());
-    pointers.push_back(nullptr);
-    ::execv("/proc/self/exe", pointers.data());
-    ::_exit(1);
+Memory memory() {
+  Memory memory{};
+  std::ifstream status("/proc/self/status");
+  for (std::string name; status >> name; status.ignore(256, '\n')) {
+    if (name == "VmRSS:") status >> memory.now;
+    if (name == "VmHWM:") status >> memory.most;
   }
-  int status = 0;
-  rusage usage{};
-  if (child < 0 || ::wait4(child, &status, 0, &usage) != child || status != 0) return 0;
-  return static_cast<std::size_t>(usage.ru_maxrss) * 1024;  // Linux counts it in KiB
+  return {memory.now * 1024, memory.most * 1024};  // Linux counts in KiB
+}
+
+std::vector<double> numbersOfOwnRun(const std::string& arguments) {
+  const std::string program = std::filesystem::read_symlink("/proc/self/exe").string();
+  std::FILE* const output = ::popen(("'" + program + "' " + arguments).c_str(), "r");
+  std::vector<double> numbers;
+  for (double number = 0; output && std::fscanf(output, "%lf", &number) == 1;) {
+    numbers.push_back(number);
+  }
+  if (output && ::pclose(output) == 0) return numbers;
+  std::fprintf(stderr, "%s %s failed\n", program.c_str(), arguments.c_str());
+  std::exit(1);
 }
 
 void printRow(const std::vector<std::string>& cells) {
@@ -86,12 +94,20 @@ void printHead(const std::string& title, const std::vector<std::string>& cells) 
   printRow(rule);
 }
 
+void printExponent(const std::string& growth,
+                   const std::vector<std::pair<double, double>>& points) {
+  std::printf("\n%s to the power of %.3f.\n", growth.c_str(), fittedExponent(points));
+}
+
 std::string shownTime(double seconds) {
+  if (seconds < 1e-8) return formatted("%.2f ns", 1e9 * seconds);
   if (seconds < 1e-6) return formatted("%.0f ns", 1e9 * seconds);
   if (seconds < 1e-3) return formatted("%.2f µs", 1e6 * seconds);
   if (seconds < 1) return formatted("%.2f ms", 1e3 * seconds);
   return formatted("%.2f s", seconds);
 }
+
+std::string shownBytes(double bytes) { return formatted("%.2f B", bytes); }
 
 std::string shownRatio(double ratio) { return formatted("×%.2f", ratio); }
 

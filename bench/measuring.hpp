@@ -21,10 +21,22 @@ std::vector<double> leastTimes(const std::vector<Contender>& contenders, int rou
 
 /// The exponent e of time = c·size^e that fits the points (size, time) best.
 double fittedExponent(const std::vector<std::pair<double, double>>& points);
+/// A line that says what grows, with what, and the fitted exponent.
+void printExponent(const std::string& growth, const std::vector<std::pair<double, double>>& points);
 
-/// The most memory that this program held when run anew with these arguments, in bytes. Zero where
-/// it failed.
-std::size_t peakMemoryOf(const std::vector<std::string>& arguments);
+/// The processor time of one run, in seconds.
+double timeOf(const std::function<void()>& run);
+
+/// The memory that this program holds now, and the most that it has held, in bytes.
+struct Memory {
+  std::size_t now;
+  std::size_t most;
+};
+Memory memory();
+
+/// The numbers that this program prints when it is run anew with the arguments, which no shell
+/// treats specially. Ends the program where that fails.
+std::vector<double> numbersOfOwnRun(const std::string& arguments);
 
 /// One row of a Markdown table.
 void printRow(const std::vector<std::string>& cells);
@@ -33,6 +45,8 @@ void printHead(const std::string& title, const std::vector<std::string>& cells);
 
 /// Seconds in the unit that suits, such as "1.25 ms".
 std::string shownTime(double seconds);
+/// "2.50 B".
+std::string shownBytes(double bytes);
 /// "×2.50".
 std::string shownRatio(double ratio);
 

@@ -12,6 +12,8 @@
 #include "bench/measuring.hpp"
 #include "bench/operations.hpp"
 #include "toolkit/memory/memory_driver.hpp"
+#include "toolkit/property_list/binary_writer.hpp"
+#include "toolkit/property_list/reader.hpp"
 
 namespace {
 
@@ -59,7 +61,7 @@ toolkit::ValueRef<> commandOf(const Operation& operation) {
     std::vector<toolkit::ValueRef<>> elements{String::make(name)};
     if (hasText) elements.emplace_back(String::make(operation.text));
     elements.emplace_back(Number::withLong(operation.tag));
-    return toolkit::Array::make(std::move(elements), toolkit::Mutability::immutable);
+    return toolkit::Array::make(std::move(elements));
   };
   switch (operation.what) {
     case What::text:
@@ -78,10 +80,12 @@ toolkit::ValueRef<> commandOf(const Operation& operation) {
   return nullptr;
 }
 
+/// The operations as a list of a script, read from a file's bytes as scripts are.
 List listOf(const std::vector<Operation>& operations) {
   std::vector<toolkit::ValueRef<>> commands;
   for (const Operation& operation : operations) commands.push_back(commandOf(operation));
-  return toolkit::Array::make(std::move(commands), toolkit::Mutability::immutable);
+  const auto file = toolkit::writeBinaryPropertyList(toolkit::Array::make(std::move(commands)));
+  return toolkit::asArray(toolkit::readPropertyList(file).value);
 }
 
 void require(bool holds, const char* what) {
@@ -100,31 +104,64 @@ std::string captions(Stage& stage) {
   return all;
 }
 
+/// What one of the operations takes: as a command of this engine, made directly, and from Lua.
+struct Times {
+  double engine, direct, lua;
+};
+
+Times timesOf(long controls, const std::vector<Operation>& operations) {
+  Stage engineStage(controls), directStage(controls), luaStage(controls);
+  const List list = listOf(operations);
+  bench::LuaWalkthrough lua(*luaStage.window, operations);
+  const auto id = Number::withLong(1);
+  const auto times =
+      bench::leastTimes({{"engine", [&] { engineStage.engine->processCommandArray(list, id); }},
+                         {"direct", [&] { bench::runDirectly(directStage.window, operations); }},
+                         {"Lua", [&] { lua.run(); }}},
+                        controls > 1000 ? 15 : 150);
+  require(captions(engineStage) == captions(directStage), "direct calls came to something else");
+  require(captions(engineStage) == captions(luaStage), "Lua came to something else");
+  const auto count = static_cast<double>(operations.size());
+  return {times[0] / count, times[1] / count, times[2] / count};
+}
+
+void printTimes(const std::string& what, const Times& times) {
+  bench::printRow({what, bench::shownTime(times.engine), bench::shownTime(times.direct),
+                   bench::shownTime(times.lua), bench::shownRatio(times.engine / times.direct),
+                   bench::shownRatio(times.lua / times.engine)});
+}
+
+void printTimesHead(const std::string& title, const std::string& rows) {
+  bench::printHead(title,
+                   {rows, "this engine", "direct calls", "Lua 5.4", "this : direct", "Lua : this"});
+}
+
+constexpr std::size_t commandsMeasured = 600;
+
 void measureLists() {
-  constexpr std::size_t commands = 600;
-  bench::printHead("A command of a list", {"controls", "this engine", "direct calls", "Lua 5.4",
-                                           "this : direct", "Lua : this"});
+  printTimesHead("A command, of a list of all sorts", "controls");
   std::vector<std::pair<double, double>> points;
   for (const long controls : {10L, 100L, 1000L, 10000L}) {
-    const auto operations = operationsOver(controls, commands);
-    Stage engineStage(controls), directStage(controls), luaStage(controls);
-    const List list = listOf(operations);
-    bench::LuaWalkthrough lua(*luaStage.window, operations);
-    const auto id = Number::withLong(1);
-    const auto t =
-        bench::leastTimes({{"engine", [&] { engineStage.engine->processCommandArray(list, id); }},
-                           {"direct", [&] { bench::runDirectly(directStage.window, operations); }},
-                           {"Lua", [&] { lua.run(); }}},
-                          controls > 1000 ? 15 : 150);
-    require(captions(engineStage) == captions(directStage), "direct calls came to something else");
-    require(captions(engineStage) == captions(luaStage), "Lua came to something else");
-    points.emplace_back(controls, t[0]);
-    const auto one = [](double time) { return bench::shownTime(time / commands); };
-    bench::printRow({std::to_string(controls), one(t[0]), one(t[1]), one(t[2]),
-                     bench::shownRatio(t[0] / t[1]), bench::shownRatio(t[2] / t[0])});
+    const Times times = timesOf(controls, operationsOver(controls, commandsMeasured));
+    printTimes(std::to_string(controls), times);
+    points.emplace_back(controls, times.engine);
   }
-  std::printf("\nTime grows with the number of controls to the power of %.3f.\n",
-              bench::fittedExponent(points));
+  bench::printExponent("Time grows with the number of controls", points);
+}
+
+void measureSorts() {
+  constexpr long controls = 10;
+  printTimesHead("A command, of a list of one sort, at 10 controls", "sort");
+  for (const auto& [sort, name] : {std::pair{What::text, "text"},
+                                   {What::title, "title"},
+                                   {What::toolTip, "tooltip"},
+                                   {What::enable, "enable"},
+                                   {What::disable, "disable"},
+                                   {What::stateOn, "state on"}}) {
+    auto operations = operationsOver(controls, commandsMeasured);
+    for (Operation& operation : operations) operation.what = sort;
+    printTimes(name, timesOf(controls, operations));
+  }
 }
 
 void measureListLength() {
@@ -137,49 +174,43 @@ void measureListLength() {
         {{"engine", [&] { stage.engine->processCommandArray(list, id); }}}, 15)[0];
     points.emplace_back(commands, time);
   }
-  std::printf("It grows with the list's length, from 100 to 100000, to the power of %.3f.\n",
-              bench::fittedExponent(points));
+  bench::printExponent("Time grows with the length of the list, from 100 to 100000 commands,",
+                       points);
 }
 
-double growth(const std::vector<double>& times, const std::vector<long>& controls) {
-  std::vector<std::pair<double, double>> points;
-  for (std::size_t i = 0; i < times.size(); ++i) points.emplace_back(controls[i], times[i]);
-  return bench::fittedExponent(points);
+/// What there is to do besides commands: the last control pressed, and the list of 10 commands
+/// under its tag run; a tick of the flasher, when 10 tags flash; discovery.
+std::vector<double> timesOfEvents(long controls) {
+  Stage stage(controls);
+  const auto script = toolkit::Dictionary::make();
+  script->setObject(listOf(operationsOver(controls, 10)), std::to_string(controls));
+  stage.engine->setPlistDictionary(script);
+  const auto last = stage.window->contentView()->subviews().back();
+  stage.engine->setFlashing(true);
+  for (long tag = 1; tag <= 10; ++tag) {
+    stage.engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(tag), true);
+  }
+  return bench::leastTimes(
+      {{"press", [&] { stage.driver.click(last); }},
+       {"tick", [&] { stage.engine->flasherFired(stage.engine->flashingTimer()); }},
+       {"discovery", [&] { stage.engine->getGuiAssetsFromWindow(stage.window); }}},
+      controls > 1000 ? 15 : 100);
 }
 
 void measureEvents() {
-  const std::vector<long> sizes{10, 100, 1000, 10000};
-  std::vector<double> press, tick, discovery;
-  for (const long controls : sizes) {
-    Stage stage(controls);
-    const auto script = toolkit::Dictionary::make();
-    script->setObject(listOf(operationsOver(controls, 10)), std::to_string(controls));
-    stage.engine->setPlistDictionary(script);
-    const auto last = stage.window->contentView()->subviews().back();
-    stage.engine->setFlashing(true);
-    for (long tag = 1; tag <= 10; ++tag) {
-      stage.engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(tag), true);
-    }
-    const auto t = bench::leastTimes(
-        {{"press", [&] { stage.driver.click(last); }},
-         {"tick", [&] { stage.engine->flasherFired(stage.engine->flashingTimer()); }},
-         {"discovery", [&] { stage.engine->getGuiAssetsFromWindow(stage.window); }}},
-        controls > 1000 ? 15 : 100);
-    press.push_back(t[0]);
-    tick.push_back(t[1]);
-    discovery.push_back(t[2]);
+  constexpr const char* events[] = {"a press, to the end of its list of 10 commands",
+                                    "a tick of the flasher, 10 tags flashing",
+                                    "discovery of the window"};
+  std::vector<std::string> rows[std::size(events)];
+  for (const long controls : {10L, 100L, 1000L, 10000L}) {
+    const auto times = timesOfEvents(controls);
+    for (std::size_t i = 0; i < times.size(); ++i) rows[i].push_back(bench::shownTime(times[i]));
   }
-  bench::printHead("Other work, by the number of controls",
-                   {"", "10", "100", "1000", "10000", "grows to the power of"});
-  const auto row = [&](const char* name, const std::vector<double>& times) {
-    std::vector<std::string> cells{name};
-    for (const double time : times) cells.push_back(bench::shownTime(time));
-    cells.push_back(bench::shownRatio(growth(times, sizes)).substr(std::string("×").size()));
-    bench::printRow(cells);
-  };
-  row("a press, from the click to the end of its list of 10", press);
-  row("a tick of the flasher, 10 tags flashing", tick);
-  row("discovery of a window", discovery);
+  bench::printHead("Other work, by the number of controls", {"", "10", "100", "1000", "10000"});
+  for (std::size_t i = 0; i < std::size(events); ++i) {
+    rows[i].insert(rows[i].begin(), events[i]);
+    bench::printRow(rows[i]);
+  }
 }
 
 }  // namespace
@@ -187,6 +218,7 @@ void measureEvents() {
 int main() {
   measureLists();
   measureListLength();
+  measureSorts();
   measureEvents();
   return 0;
 }
