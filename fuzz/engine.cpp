@@ -7,18 +7,16 @@
 #include <cstdint>
 #include <map>
 #include <memory>
-#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/tag_key.hpp"
-#include "fuzz/property_list_checks.hpp"
 #include "fuzz/require.hpp"
 #include "toolkit/memory/memory_driver.hpp"
-#include "toolkit/property_list/number_conversion.hpp"
-#include "toolkit/uppercase.hpp"
+#include "toolkit/property_list/reader.hpp"
+#include "tools/endless_chains.hpp"
 
 namespace {
 
@@ -38,50 +36,34 @@ class RunLengths {
   bool areSmall() {
     for (const auto& [key, list] : script_->entries()) {
       const auto tag = toolkit::asString(key);
-      if (tag && ofElements(list, toolkit::intValueOf(tag->text()), 0) > mostElements) return false;
+      // A list runs under its key's number, by which it chains to itself: that of "07" under 7.
+      if (tag && ofElements(list, tagKey(tag->intValue()), 0) > mostElements) return false;
     }
     return true;
   }
 
  private:
-  std::size_t ofList(long tag, std::size_t depth) {
+  std::size_t ofList(const std::string& key, std::size_t depth) {
     if (depth > deepestChain) return mostElements + 1;
-    const auto known = lengths_.find(tag);
+    const auto known = lengths_.find(key);
     if (known != lengths_.end()) return known->second;
-    const std::size_t length = ofElements(script_->objectForKey(tagKey(tag)), tag, depth);
-    return lengths_[tag] = length;
+    return lengths_[key] = ofElements(script_->objectForKey(key), key, depth);
   }
 
-  /// Of a list that runs under a tag. The tag need not be its key: "07" runs under 7.
-  std::size_t ofElements(const toolkit::ValueRef<>& list, long tag, std::size_t depth) {
+  std::size_t ofElements(const toolkit::ValueRef<>& list, const std::string& own,
+                         std::size_t depth) {
     std::size_t length = 1;
     const auto elements = toolkit::asArray(list);
     for (const auto& element : elements->elements()) {
-      const auto next = chained(element, tag);
+      const auto next = tools::chainTarget(element, own);
       length += next ? ofList(*next, depth + 1) : 1;
       if (length > mostElements) break;
     }
     return std::min(length, mostElements + 1);
   }
 
-  static std::optional<long> chained(const toolkit::ValueRef<>& element, long own) {
-    const std::string& chain = QZ_PLIST_STATE_PARSER_PROCESS_COMMANDS_FOR_ID;
-    if (const auto simple = toolkit::asString(element)) {
-      return simple->text() == chain ? std::optional(own) : std::nullopt;
-    }
-    const auto compound = toolkit::asArray(element);
-    if (compound->count() < 2) return std::nullopt;
-    const auto name = toolkit::asString(compound->elements()[0]);
-    if (!name || toolkit::uppercased(name->text()) != chain) return std::nullopt;
-    try {
-      return compound->elements()[1]->intValue();
-    } catch (const toolkit::Exception&) {
-      return std::nullopt;
-    }
-  }
-
   Script script_;
-  std::map<long, std::size_t> lengths_;
+  std::map<std::string, std::size_t> lengths_;
 };
 
 class Walkthrough {

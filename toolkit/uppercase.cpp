@@ -5,6 +5,7 @@
 #include <cstdint>
 #include <iterator>
 
+#include "toolkit/property_list/utf8.hpp"
 #include "toolkit/property_list/words.hpp"
 
 namespace toolkit {
@@ -44,23 +45,6 @@ Decoded decode(std::string_view text) {
   return {character, length};
 }
 
-void encode(std::string& out, char32_t c) {
-  const auto put = [&](char32_t bits) { out += static_cast<char>(bits); };
-  if (c < 0x80) return put(c);
-  if (c < 0x800) {
-    put(0xC0 | (c >> 6));
-  } else {
-    if (c < 0x10000) {
-      put(0xE0 | (c >> 12));
-    } else {
-      put(0xF0 | (c >> 18));
-      put(0x80 | ((c >> 12) & 0x3F));
-    }
-    put(0x80 | ((c >> 6) & 0x3F));
-  }
-  put(0x80 | (c & 0x3F));
-}
-
 char32_t simpleUpper(char32_t c) {
   const auto* range = std::lower_bound(std::begin(ranges), std::end(ranges), c,
                                        [](const Range& r, char32_t x) { return r.last < x; });
@@ -75,7 +59,7 @@ void appendUpper(std::string& out, char32_t c) {
   if (found != std::end(expansions) && found->letter == c) {
     out += found->upper;
   } else {
-    encode(out, simpleUpper(c));
+    appendUtf8(out, simpleUpper(c));
   }
 }
 

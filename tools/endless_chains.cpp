@@ -1,7 +1,6 @@
 #include "tools/endless_chains.hpp"
 
 #include <algorithm>
-#include <optional>
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/tag_key.hpp"
@@ -14,23 +13,6 @@ namespace {
 using Keys = std::vector<std::string>;
 using Graph = std::map<std::string, Keys, std::less<>>;
 
-// The key that an element chains to, where it does; `own` is what a simple command aims at.
-std::optional<std::string> target(const toolkit::ValueRef<>& element, const std::string& own) {
-  const std::string& chain = QZ_PLIST_STATE_PARSER_PROCESS_COMMANDS_FOR_ID;
-  if (const auto simple = toolkit::asString(element)) {
-    return simple->text() == chain ? std::optional(own) : std::nullopt;
-  }
-  const auto compound = toolkit::asArray(element);
-  if (compound->count() < 2) return std::nullopt;
-  const auto name = toolkit::asString(compound->elements()[0]);
-  if (!name || toolkit::uppercased(name->text()) != chain) return std::nullopt;
-  try {
-    return tagKey(compound->elements()[1]->intValue());
-  } catch (const toolkit::Exception&) {
-    return std::nullopt;  // no tag: the run goes on with the next element
-  }
-}
-
 Graph chainsOf(const toolkit::ValueRef<toolkit::Dictionary>& script) {
   Graph graph;
   for (const auto& [key, list] : script->entries()) {
@@ -40,7 +22,7 @@ Graph chainsOf(const toolkit::ValueRef<toolkit::Dictionary>& script) {
     const std::string own = tagKey(key->intValue());  // the list of "07" runs with the id 7
     const auto elements = toolkit::asArray(list);
     for (const auto& element : elements->elements()) {
-      if (auto to = target(element, own)) targets.push_back(*std::move(to));
+      if (auto to = chainTarget(element, own)) targets.push_back(*std::move(to));
     }
   }
   return graph;
@@ -70,6 +52,22 @@ void removeEndingLists(Graph& graph) {
 }
 
 }  // namespace
+
+std::optional<std::string> chainTarget(const toolkit::ValueRef<>& element, const std::string& own) {
+  const std::string& chain = QZ_PLIST_STATE_PARSER_PROCESS_COMMANDS_FOR_ID;
+  if (const auto simple = toolkit::asString(element)) {
+    return simple->text() == chain ? std::optional(own) : std::nullopt;
+  }
+  const auto compound = toolkit::asArray(element);
+  if (compound->count() < 2) return std::nullopt;
+  const auto name = toolkit::asString(compound->elements()[0]);
+  if (!name || toolkit::uppercased(name->text()) != chain) return std::nullopt;
+  try {
+    return tagKey(compound->elements()[1]->intValue());
+  } catch (const toolkit::Exception&) {
+    return std::nullopt;  // no tag: the run goes on with the next element
+  }
+}
 
 EndlessChains endlessChains(const toolkit::ValueRef<toolkit::Dictionary>& script) {
   Graph graph = chainsOf(script);

@@ -8,6 +8,7 @@
 
 #include <cstddef>
 #include <map>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -21,6 +22,10 @@ struct EndlessChains {
   /// For every list that never comes to its end, the loop (by its place in `loops`) it ends up in.
   std::map<std::string, std::size_t, std::less<>> loopOf;
 };
+
+/// The key of the list that an element chains to, where it does; `own` is the key under whose id
+/// the element runs, which a simple command aims at.
+std::optional<std::string> chainTarget(const toolkit::ValueRef<>& element, const std::string& own);
 
 /// The endless chains of a script; what in it is no list chains to nothing.
 EndlessChains endlessChains(const toolkit::ValueRef<toolkit::Dictionary>& script);
