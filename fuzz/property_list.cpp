@@ -1,6 +1,8 @@
-// What must hold of any bytes that are read as a property list.
-#pragma once
-
+// Property lists: what must hold of any bytes that are read as one.
+//
+// There is a fuzzer for each of the three formats, all of them this. Their seeds and dictionaries
+// keep the inputs to the format; the reader itself finds out which one it has before it.
+#include <cstdint>
 #include <string>
 #include <string_view>
 
@@ -12,15 +14,15 @@
 #include "toolkit/property_list/walk.hpp"
 #include "toolkit/property_list/xml_writer.hpp"
 
-namespace fuzz {
+namespace {
+
+using fuzz::require;
 
 /// A small binary file can stand for more values, shared over and over, than fit into any memory.
-inline constexpr std::size_t mostVisits = 100'000;
+constexpr std::size_t mostVisits = 100'000;
 
-/// The text, unless a 32-bit real is in it: XML has 64-bit reals only.
-inline bool hasShortReal(const std::string& dump) {
-  return dump.find("\"w\":32}") != std::string::npos;
-}
+/// Whether a 32-bit real is in it, which XML cannot tell from one of 64 bits.
+bool hasShortReal(const std::string& dump) { return dump.find("\"w\":32}") != std::string::npos; }
 
 /// Writes the value, reads it back, and requires an equal one; a refusal to write needs a reason.
 template <class Write>
@@ -38,7 +40,7 @@ void checkRoundTrip(const toolkit::ValueRef<>& value, const std::string& dump, W
 }
 
 /// Reads the bytes, with positions and without, and writes what they are in both formats.
-inline void checkReading(std::string_view bytes) {
+void checkReading(std::string_view bytes) {
   toolkit::PositionTable positions;
   const toolkit::ReadResult result = toolkit::readPropertyList(bytes, &positions);
   const toolkit::ReadResult plain = toolkit::readPropertyList(bytes);
@@ -59,4 +61,9 @@ inline void checkReading(std::string_view bytes) {
   static_cast<void>(result.value->description());
 }
 
-}  // namespace fuzz
+}  // namespace
+
+extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
+  checkReading({reinterpret_cast<const char*>(data), size});
+  return 0;
+}
