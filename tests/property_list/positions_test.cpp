@@ -19,7 +19,8 @@ TEST(Refusals, SayWhatAndWhere) {
   } cases[] = {
       {"", "line 1, column 1: the file is empty (read as old-style property list)"},
       {"<plist>\n<dict>\n  <kay>a</kay>",
-       "line 3, column 3: unknown tag <kay> (read as XML property list)"},
+       "line 3, column 3: unknown tag <kay>; the tags are <plist> <array> <dict> <key> "
+       "<string> <integer> <real> <date> <data> <true> <false> (read as XML property list)"},
       {"<plist>\r\n<array>\r  \xC3\xA9",
        "line 3, column 3: expected a tag, found the byte 0xC3 "
        "(read as XML property list)"},

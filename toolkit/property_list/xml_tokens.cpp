@@ -19,6 +19,12 @@ std::string shown(char c) {
   return std::string("the byte 0x") + digits[byte >> 4] + digits[byte & 15];
 }
 
+std::string knownTags() {
+  std::string list;
+  for (const std::string_view name : xmlTagNames) list.append(" <").append(name).append(">");
+  return list;
+}
+
 }  // namespace
 
 void XmlTokens::skipPast(std::string_view mark, std::size_t start, std::string_view what) {
@@ -74,7 +80,8 @@ XmlTag XmlTokens::openUnusualTag() {
   const std::string_view name(start, static_cast<std::size_t>(nameEnd - start));
   const auto* const found = std::find(xmlTagNames.begin(), xmlTagNames.end(), name);
   if (found == xmlTagNames.end()) {
-    refuse(name.empty() ? "a tag without a name" : "unknown tag <" + std::string(name) + ">");
+    refuse((name.empty() ? "a tag without a name" : "unknown tag <" + std::string(name) + ">") +
+           "; the tags are" + knownTags());
   }
   const XmlTag tag{static_cast<XmlElement>(found - xmlTagNames.begin()), selfClosed, offset()};
   at_ = tagEnd + 1;
