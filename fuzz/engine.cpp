@@ -26,6 +26,7 @@ using Script = toolkit::ValueRef<toolkit::Dictionary>;
 constexpr std::size_t mostSteps = 32;
 constexpr std::size_t mostElements = 2'000;  // in the runs of one list, with all that it chains to
 constexpr std::size_t deepestChain = 100;
+constexpr double beyondAllTimers = 0x1p65;  // seconds; timers are set in 64 bits
 
 /// How many elements run when a list does, with the lists that it chains to.
 class RunLengths {
@@ -85,6 +86,9 @@ class Walkthrough {
 
   ~Walkthrough() {
     attempt([&] { engine_->terminateParser(); });
+    require(!engine_->flashingTimer(), "the end stops the flasher");
+    // Timers that were replaced, or armed after the end, keep the engine until they are due.
+    driver_.advance(beyondAllTimers);
     const std::weak_ptr<QZ_Plist_State_Parser> ended = engine_;
     engine_ = nullptr;
     require(ended.expired(), "nothing keeps an engine that ended");
