@@ -85,6 +85,39 @@ TEST(RichText, GivesEachParagraphItsStyle) {
   }
 }
 
+/// The format of the word's first character.
+QTextCharFormat formatOf(const char* word, const QTextDocument& document) {
+  return formatAt(document, document.find(word).selectionStart());
+}
+
+TEST(RichText, IsTheSameByHtml) {
+  AttributedString text("a <b> & \"c\"  two  blanks\n\n");
+  text.append("bold", {.font = Font{"Times", 24, true, true}, .underline = true});
+  text.append("red\u2028line", {.foregroundColor = Color{1, 0, 0, 0.5}, .strikethrough = true});
+  text.append("\nlast", {.paragraphStyle = ParagraphStyle{TextAlignment::right, 5, 12},
+                         .link = "x:y?a=1&b=2"});
+  for (const auto direction : {Qt::LeftToRight, Qt::RightToLeft}) {
+    TextSetting setting = plainSetting();
+    setting.direction = direction;
+    QTextDocument direct;
+    showIn(direct, text, setting);
+    QTextDocument byHtml;
+    byHtml.setHtml(htmlOf(text, setting));
+    EXPECT_EQ(byHtml.toPlainText(), direct.toPlainText());
+    EXPECT_EQ(byHtml.size(), direct.size());
+    EXPECT_EQ(byHtml.lastBlock().blockFormat().alignment(), Qt::AlignRight | Qt::AlignAbsolute);
+    EXPECT_EQ(byHtml.lastBlock().blockFormat().textIndent(), -7);
+    EXPECT_EQ(formatOf("last", byHtml).anchorHref(), "x:y?a=1&b=2");
+    const QTextCharFormat bold = formatOf("bold", byHtml);
+    EXPECT_EQ(bold.font().pixelSize(), 24);
+    EXPECT_TRUE(bold.font().bold() && bold.font().italic() && bold.fontUnderline());
+    const QTextCharFormat red = formatOf("red", byHtml);
+    EXPECT_TRUE(red.fontStrikeOut());
+    EXPECT_EQ(red.foreground().color().red(), 255);
+    EXPECT_NEAR(red.foreground().color().alpha(), 128, 1);
+  }
+}
+
 TEST(RichText, KeepsTheLastLineEndOnlyForEditing) {
   TextSetting setting = plainSetting();
   QTextDocument document;

@@ -4,9 +4,13 @@
 #include "toolkit/qt/fonts.hpp"
 
 #include <QFontDatabase>
+#include <QGuiApplication>
+#include <QPointer>
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <unordered_map>
+#include <vector>
 
 #include "toolkit/qt/strings.hpp"
 
@@ -58,25 +62,55 @@ QString drawnFamily(std::string_view name) {
   return wanted;
 }
 
+/// What the desktop has answered, for it takes its time: longer than a whole command list.
+class Desktop final : public QObject {
+ public:
+  struct Family {
+    QString drawnWith;
+    bool fixedPitch;
+  };
+
+  /// The application's, with which it ends.
+  static Desktop& ofApplication() {
+    static QPointer<Desktop> desktop;
+    if (!desktop) desktop = new Desktop(*qGuiApp);
+    return *desktop;
+  }
+
+  const std::vector<FontFamily>& families() {
+    if (families_.empty()) families_ = familiesOf(QFontDatabase::families());
+    return families_;
+  }
+  const Family& family(const std::string& name) {
+    const auto known = asked_.find(name);
+    if (known != asked_.end()) return known->second;
+    const QString drawn = drawnFamily(name);
+    return asked_.emplace(name, Family{drawn, QFontDatabase::isFixedPitch(drawn)}).first->second;
+  }
+
+ private:
+  explicit Desktop(QGuiApplication& application) : QObject(&application) {
+    connect(&application, &QGuiApplication::fontDatabaseChanged, this, [this] {
+      families_.clear();
+      asked_.clear();
+    });
+  }
+
+  std::vector<FontFamily> families_;
+  std::unordered_map<std::string, Family> asked_;
+};
+
 }  // namespace
 
 std::optional<Font> QtFonts::fontWithName(std::string_view name, double size) const {
-  // Qt tells nobody but itself reliably when families come and go; counting them is cheap.
-  const QStringList desktop = QFontDatabase::families();
-  if (counted_ != desktop.size()) {
-    families_ = familiesOf(desktop);
-    counted_ = desktop.size();
-  }
-  auto font = fontNamed(name, size, families_);
-  // Asked only of the family that is meant, for Qt opens a family's files to answer.
-  if (font && !font->fixedPitch) {
-    font->fixedPitch = QFontDatabase::isFixedPitch(drawnFamily(font->family));
-  }
+  Desktop& desktop = Desktop::ofApplication();
+  auto font = fontNamed(name, size, desktop.families());
+  if (font && !font->fixedPitch) font->fixedPitch = desktop.family(font->family).fixedPitch;
   return font;
 }
 
 QFont qFont(const Font& font) {
-  QFont drawn(drawnFamily(font.family));
+  QFont drawn(Desktop::ofApplication().family(font.family).drawnWith);
   drawn.setPixelSize(std::max(1, static_cast<int>(std::lround(font.size))));
   drawn.setBold(font.bold);
   drawn.setItalic(font.italic);

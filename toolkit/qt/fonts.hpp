@@ -5,7 +5,6 @@
 #pragma once
 
 #include <QFont>
-#include <vector>
 
 #include "toolkit/font_names.hpp"
 #include "toolkit/styled_text/fonts.hpp"
@@ -18,10 +17,6 @@ class QtFonts final : public Fonts {
   /// Verdana, with which metric-compatible or similar families stand in where they are missing.
   /// Asked while there is an application object.
   std::optional<Font> fontWithName(std::string_view name, double size) const override;
-
- private:
-  mutable std::vector<FontFamily> families_;  // of the desktop when it was last asked
-  mutable qsizetype counted_ = -1;            // how many it had
 };
 
 /// The font to draw with: the family itself, or what stands in for it.

@@ -19,7 +19,10 @@ QImage readImage(const std::string& path) {
   QImageReader reader(qString(path));
   reader.setDecideFormatFromContent(true);  // a suffix may be wrong
   reader.setAutoTransform(true);            // photographs say which way up they are
-  return reader.read();
+  const QImage image = reader.read();
+  // As Qt draws it fastest.
+  return image.hasAlphaChannel() ? image.convertToFormat(QImage::Format_ARGB32_Premultiplied)
+                                 : image;
 }
 
 std::filesystem::file_time_type timeOf(const std::string& path) {

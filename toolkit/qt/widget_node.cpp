@@ -15,24 +15,6 @@ namespace toolkit::qt {
 
 namespace {
 
-// While it lives its widget has not been painted.
-class PaintingAwaited final : public QObject {
- public:
-  PaintingAwaited(QWidget& widget, std::unique_ptr<QObject>& holder) : holder_(holder) {
-    widget.installEventFilter(this);
-  }
-  bool eventFilter(QObject*, QEvent* event) override {
-    if (event->type() == QEvent::Paint) {
-      holder_.release();
-      deleteLater();
-    }
-    return false;
-  }
-
- private:
-  std::unique_ptr<QObject>& holder_;  // its own
-};
-
 void refuse(const std::string& receiver, const std::string& what) {
   throw InvalidArgumentException("-[" + receiver + " addSubview:]: " + what);
 }
@@ -43,12 +25,31 @@ bool isSubview(const QObject* child) {
 
 }  // namespace
 
+// What happens to the widget without this toolkit's doing.
+class WidgetNode::Watch final : public QObject {
+ public:
+  explicit Watch(WidgetNode& node) : node_(node) { beFirst(); }
+
+  /// To be asked before whoever takes over the widget's painting.
+  void beFirst() { node_.widget_->installEventFilter(this); }
+
+  bool eventFilter(QObject*, QEvent* event) override {
+    if (event->type() == QEvent::Paint) node_.isRedrawPending_ = false;
+    if (event->type() == QEvent::DynamicPropertyChange) node_.tag_.reset();
+    return false;
+  }
+
+ private:
+  WidgetNode& node_;  // its owner
+};
+
 WidgetNode::WidgetNode(QWidget& widget, const std::shared_ptr<Desk>& desk, Widget keptBy)
     : widget_(&widget),
       desk_(desk),
       key_(&widget),
       keptBy_(keptBy),
-      hadTag_(widget.property(tagProperty).isValid()) {}
+      hadTag_(widget.property(tagProperty).isValid()),
+      watch_(std::make_unique<Watch>(*this)) {}
 
 // Not at once: this may come about in an event of the widget's own.
 WidgetNode::~WidgetNode() {
@@ -67,7 +68,9 @@ std::string WidgetNode::nameOfClass() const {
 }
 
 long WidgetNode::readTag() const {
-  return widget_ ? static_cast<long>(widget_->property(tagProperty).toLongLong()) : 0;
+  if (!widget_) return 0;
+  if (!tag_) tag_ = static_cast<long>(widget_->property(tagProperty).toLongLong());
+  return *tag_;
 }
 
 void WidgetNode::writeTag(long tag) {
@@ -179,7 +182,9 @@ void WidgetNode::enable(bool enabled) {
 }
 
 void WidgetNode::changed() {
-  if (widget_ && !redraw_) redraw_ = std::make_unique<PaintingAwaited>(*widget_, redraw_);
+  if (!widget_ || isRedrawPending_) return;
+  isRedrawPending_ = true;
+  watch_->beFirst();
 }
 
 Ref<View> WidgetNode::superview() const {

@@ -65,11 +65,12 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   void enable(bool enabled);
   /// Something that shows has changed: a redraw is pending until the next painting.
   void changed();
-  bool isRedrawPending() const { return redraw_ != nullptr; }
+  bool isRedrawPending() const { return widget_ && isRedrawPending_; }
   QPointer<QWidget> widget_;
   std::shared_ptr<Desk> desk_;
 
  private:
+  class Watch;
   struct Placement {
     Rect frame;      // as asked for
     QRect geometry;  // what Qt has made of it
@@ -86,7 +87,9 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   std::optional<Placement> placement_;
   Subviews subviews_;
   std::vector<QPointer<QWidget>> listed_;  // the widgets of `subviews_`; null once they are gone
-  std::unique_ptr<QObject> redraw_;        // while a redraw is pending
+  mutable std::optional<long> tag_;        // as read last, for every search reads them all
+  bool isRedrawPending_ = false;
+  std::unique_ptr<Watch> watch_;
 };
 
 }  // namespace toolkit::qt
