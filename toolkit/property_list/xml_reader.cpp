@@ -30,6 +30,7 @@ class XmlReader {
  private:
   Value* value(const XmlTag& tag);
   Value* content(const XmlTag& tag);
+  Value* filled(const XmlTag& tag);
   Value* string(const XmlTag& tag);
   Value* boolean(const XmlTag& tag);
   Value* integer();
@@ -70,8 +71,12 @@ Value* XmlReader::content(const XmlTag& tag) {
     case XmlElement::no:
       return boolean(tag);
     default:
-      break;
+      return filled(tag);
   }
+}
+
+/// The elements that nothing stands for when they are self-closed.
+Value* XmlReader::filled(const XmlTag& tag) {
   if (tag.selfClosed) {
     throw RefusedAt{tag.offset, "<" + std::string(tagName(tag.element)) + "/> needs a content"};
   }
