@@ -34,6 +34,9 @@ OrderForm::OrderForm() {
   grid->addWidget(&picture, 8, 0);
   grid->addWidget(&guide, 8, 1, 1, 2);
   grid->addWidget(&next, 8, 3, Qt::AlignBottom);
+  // The fields stay where they are when a walk-through shows its picture beside them.
+  grid->setColumnMinimumWidth(0, 64);
+  for (const int column : {1, 2, 3}) grid->setColumnStretch(column, 1);
   auto* const content = new QWidget;
   content->setLayout(grid);
   setCentralWidget(content);

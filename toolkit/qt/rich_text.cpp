@@ -22,19 +22,22 @@ QColor inkOf(const Color& color, const TextSetting& setting) {
   return setting.greyed ? halfway(qColor(color), setting.ground) : qColor(color);
 }
 
+/// Absent where the viewer has the choice.
+std::optional<QColor> inkOf(const TextAttributes& attributes, const TextSetting& setting) {
+  if (attributes.foregroundColor) return inkOf(*attributes.foregroundColor, setting);
+  if (!attributes.link) return setting.ink;
+  return setting.greyed ? halfway(setting.link, setting.ground) : setting.link;
+}
+
 QTextCharFormat formatOf(const TextAttributes& attributes, const TextSetting& setting) {
   QTextCharFormat format;
-  if (setting.ink) format.setForeground(*setting.ink);
   if (attributes.font)
     format.setFont(qFont(*attributes.font), QTextCharFormat::FontPropertiesSpecifiedOnly);
   if (attributes.link) {
     format.setAnchor(true);
     format.setAnchorHref(qString(attributes.link->address()));
-    format.setForeground(setting.greyed ? halfway(setting.link, setting.ground) : setting.link);
   }
-  if (attributes.foregroundColor) {
-    format.setForeground(inkOf(*attributes.foregroundColor, setting));
-  }
+  if (const auto ink = inkOf(attributes, setting)) format.setForeground(*ink);
   if (attributes.backgroundColor) format.setBackground(inkOf(*attributes.backgroundColor, setting));
   if (attributes.underline) format.setFontUnderline(true);
   if (attributes.strikethrough) format.setFontStrikeOut(true);
@@ -115,49 +118,60 @@ std::vector<Paragraph> paragraphsOf(const AttributedString& text, bool dropsLast
   return paragraphs;
 }
 
-QString cssColor(const QBrush& brush) {
-  const QColor color = brush.color();
-  return QString("rgba(%1,%2,%3,%4)")
+// In HTML nothing is written that holds anyway, and tags rather than styles: most of the time that
+// it takes to show some text Qt spends reading styles.
+
+QString cssOf(const char* property, const QColor& color) {
+  return QString("%1:rgba(%2,%3,%4,%5);")
+      .arg(property)
       .arg(color.red())
       .arg(color.green())
       .arg(color.blue())
       .arg(static_cast<double>(color.alphaF()));
 }
 
-QString cssOf(const QTextCharFormat& format) {
-  QString css;
-  if (format.hasProperty(QTextFormat::FontFamilies))
-    css += "font-family:'" + format.fontFamilies().toStringList().value(0) + "';";
-  if (format.hasProperty(QTextFormat::FontPixelSize))
-    css += QString("font-size:%1px;").arg(format.intProperty(QTextFormat::FontPixelSize));
-  if (format.hasProperty(QTextFormat::FontWeight))
-    css += QString("font-weight:%1;").arg(format.fontWeight());
-  if (format.hasProperty(QTextFormat::FontItalic))
-    css += format.fontItalic() ? "font-style:italic;" : "font-style:normal;";
-  if (format.fontUnderline() && format.fontStrikeOut())
-    css += "text-decoration:underline line-through;";
-  else if (format.fontUnderline())
-    css += "text-decoration:underline;";
-  else if (format.fontStrikeOut())
-    css += "text-decoration:line-through;";
-  if (format.hasProperty(QTextFormat::ForegroundBrush))
-    css += "color:" + cssColor(format.foreground()) + ";";
-  if (format.hasProperty(QTextFormat::BackgroundBrush))
-    css += "background-color:" + cssColor(format.background()) + ";";
-  if (format.verticalAlignment() == QTextCharFormat::AlignSuperScript)
-    css += "vertical-align:super;";
-  if (format.verticalAlignment() == QTextCharFormat::AlignSubScript) css += "vertical-align:sub;";
+QString cssOf(const Font& font, const QFont& otherwise) {
+  const QFont drawn = qFont(font);
+  QString css =
+      QString("font-family:'%1';font-size:%2px;").arg(drawn.family()).arg(drawn.pixelSize());
+  if (font.bold || otherwise.bold()) css += font.bold ? "font-weight:700;" : "font-weight:400;";
+  if (font.italic || otherwise.italic())
+    css += font.italic ? "font-style:italic;" : "font-style:normal;";
   return css;
 }
 
+QString cssOf(const TextAttributes& attributes, const TextSetting& setting) {
+  QString css;
+  if (attributes.font) css += cssOf(*attributes.font, setting.font);
+  if (const auto ink = inkOf(attributes, setting)) css += cssOf("color", *ink);
+  if (attributes.backgroundColor)
+    css += cssOf("background-color", inkOf(*attributes.backgroundColor, setting));
+  if (attributes.link && !attributes.underline) css += "text-decoration:none;";
+  return css;
+}
+
+void wrapIn(QString& html, const char* tag, const QString& attributes = {}) {
+  html = QString("<%1%2>%3</%1>").arg(tag, attributes, html);
+}
+
 QString htmlOf(const Piece& piece, const TextSetting& setting) {
-  const QTextCharFormat format = formatOf(*piece.attributes, setting);
+  const TextAttributes& attributes = *piece.attributes;
   QString html = piece.text.toHtmlEscaped().replace(QChar::LineSeparator, "<br/>");
-  if (const QString css = cssOf(format); !css.isEmpty())
-    html = "<span style=\"" + css.toHtmlEscaped() + "\">" + html + "</span>";
-  if (format.isAnchor())
-    html = "<a href=\"" + format.anchorHref().toHtmlEscaped() + "\">" + html + "</a>";
+  if (attributes.underline) wrapIn(html, "u");
+  if (attributes.strikethrough) wrapIn(html, "s");
+  if (attributes.superscript != 0) wrapIn(html, attributes.superscript > 0 ? "sup" : "sub");
+  if (const QString css = cssOf(attributes, setting); !css.isEmpty())
+    wrapIn(html, "span", " style=\"" + css.toHtmlEscaped() + "\"");
+  if (attributes.link)
+    wrapIn(html, "a", " href=\"" + qString(attributes.link->address()).toHtmlEscaped() + "\"");
   return html;
+}
+
+bool hasBlanksToKeep(const Paragraph& paragraph) {
+  return std::any_of(paragraph.pieces.begin(), paragraph.pieces.end(), [](const Piece& piece) {
+    return piece.text.front().isSpace() || piece.text.back().isSpace() ||
+           piece.text.simplified() != piece.text;
+  });
 }
 
 QString attributesOf(const QTextBlockFormat& format) {
@@ -176,17 +190,21 @@ QString attributesOf(const QTextBlockFormat& format) {
 
 QString htmlOf(const Paragraph& paragraph, const TextSetting& setting) {
   const QTextBlockFormat format = blockFormatOf(*paragraph.attributes, setting);
-  QString css = QString("white-space:pre-wrap;margin:0 %1px 0 %2px;text-indent:%3px;")
-                    .arg(format.rightMargin())
-                    .arg(format.leftMargin())
-                    .arg(format.textIndent());
   QString html;
   for (const Piece& piece : paragraph.pieces) html += htmlOf(piece, setting);
+  QString css;
   if (paragraph.pieces.empty()) {  // Qt's own way of writing an empty line, as high as its font
-    css += "-qt-paragraph-type:empty;" + cssOf(formatOf(*paragraph.attributes, setting));
+    css = "-qt-paragraph-type:empty;" + cssOf(*paragraph.attributes, setting);
     html = "<br/>";
   }
-  return "<p" + attributesOf(format) + " style=\"" + css.toHtmlEscaped() + "\">" + html + "</p>";
+  if (hasBlanksToKeep(paragraph)) css += "white-space:pre-wrap;";
+  if (format.leftMargin() != 0) css += QString("margin-left:%1px;").arg(format.leftMargin());
+  if (format.rightMargin() != 0) css += QString("margin-right:%1px;").arg(format.rightMargin());
+  if (format.textIndent() != 0) css += QString("text-indent:%1px;").arg(format.textIndent());
+  QString attributes = attributesOf(format);
+  if (!css.isEmpty()) attributes += " style=\"" + css.toHtmlEscaped() + "\"";
+  wrapIn(html, "div", attributes);
+  return html;
 }
 
 }  // namespace
