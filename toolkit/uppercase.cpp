@@ -37,10 +37,10 @@ Decoded decode(std::string_view text) {
   const auto byte = [&](std::size_t i) { return static_cast<unsigned char>(text[i]); };
   const std::size_t length = byte(0) >= 0xF0 ? 4 : byte(0) >= 0xE0 ? 3 : byte(0) >= 0xC2 ? 2 : 0;
   if (length == 0 || length > text.size()) return {0, 0};
-  char32_t character = byte(0) & (0xFFu >> (length + 1));
+  char32_t character = byte(0) & (0xFFU >> (length + 1));
   for (std::size_t i = 1; i < length; ++i) {
     if ((byte(i) & 0xC0) != 0x80) return {0, 0};
-    character = (character << 6) | (byte(i) & 0x3Fu);
+    character = (character << 6) | (byte(i) & 0x3FU);
   }
   return {character, length};
 }
