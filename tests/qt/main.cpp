@@ -1,4 +1,5 @@
-// Tests of widgets need an application; on whichever machine they run, nobody sees its windows.
+// Tests of widgets need an application. Nobody sees its windows, unless QT_QPA_PLATFORM says where
+// to.
 
 #include <gtest/gtest.h>
 
@@ -6,7 +7,7 @@
 #include <clocale>
 
 int main(int argc, char** argv) {
-  qputenv("QT_QPA_PLATFORM", "offscreen");
+  if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
   const QApplication application(argc, argv);
   QApplication::setQuitOnLastWindowClosed(false);
   std::setlocale(LC_ALL, "C");  // Qt sets the user's

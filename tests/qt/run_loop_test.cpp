@@ -45,7 +45,8 @@ TEST_F(RunLoop, RepeatsUntilItIsInvalidatedInAFiring) {
     fired += 'x';
     if (fired.size() == 3) timer->invalidate();
   });
-  loop.schedule(0.1, false, note('.'));
+  EXPECT_TRUE(QTest::qWaitFor([&] { return fired.size() == 3; }));
+  loop.schedule(0.05, false, note('.'));
   EXPECT_TRUE(QTest::qWaitFor([&] { return fired.ends_with('.'); }));
   EXPECT_EQ(fired, "xxx.");
 }

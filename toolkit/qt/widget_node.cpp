@@ -23,6 +23,17 @@ bool isSubview(const QObject* child) {
   return child->isWidgetType() && !static_cast<const QWidget*>(child)->isWindow();
 }
 
+/// Whether the widgets are the subviews of `parent`, in their order.
+bool areSubviewsOf(const QWidget& parent, const std::vector<QPointer<QWidget>>& widgets) {
+  auto next = widgets.begin();
+  for (const QObject* const child : parent.children()) {
+    if (!isSubview(child)) continue;
+    if (next == widgets.end() || next->data() != child) return false;
+    ++next;
+  }
+  return next == widgets.end();
+}
+
 }  // namespace
 
 // What happens to the widget without this toolkit's doing.
@@ -105,16 +116,15 @@ void WidgetNode::place(const Rect& frame) {
 }
 
 const Subviews& WidgetNode::readSubviews() {
-  std::vector<QWidget*> children;
-  if (widget_)
-    for (QObject* const child : widget_->children())
-      if (isSubview(child)) children.push_back(static_cast<QWidget*>(child));
-  if (std::equal(children.begin(), children.end(), listed_.begin(), listed_.end()))
-    return subviews_;
+  if (widget_ && areSubviewsOf(*widget_, listed_)) return subviews_;
   Subviews fresh;
-  for (QWidget* const child : children) fresh.push_back(desk_->viewOf(*child));
+  listed_.clear();
+  if (widget_) {
+    for (QObject* const child : widget_->children())
+      if (isSubview(child)) listed_.push_back(static_cast<QWidget*>(child));
+    for (const auto& child : listed_) fresh.push_back(desk_->viewOf(*child));
+  }
   subviews_.swap(fresh);
-  listed_.assign(children.begin(), children.end());
   return subviews_;
 }
 
