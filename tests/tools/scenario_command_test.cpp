@@ -11,7 +11,9 @@
 #include <vector>
 
 #include "play_files.hpp"
+#include "tools/drivers.hpp"
 #include "tools/shell.hpp"
+#include "tools/suggestions.hpp"
 #include "tools/test_command.hpp"
 
 namespace tools {
@@ -154,12 +156,14 @@ TEST_F(ScenarioCommand, whatWouldDisturbATerminalIsWrittenOut) {
 
 TEST_F(ScenarioCommand, badUsageIsOneLine) {
   write("a.walk", "engine\n");
+  const auto names = driverNames();
+  const std::string toolkits = enumerate({names.begin(), names.end()});
   const struct {
     std::vector<std::string> arguments;
     std::string line;
   } cases[] = {
       {{"test", "--toolkit", "memry", "a.walk"},
-       "unknown toolkit memry; this build has memory; did you mean \"memory\"?"},
+       "unknown toolkit memry; this build has " + toolkits + "; did you mean \"memory\"?"},
       {{"test", "--junit", "no/report.xml", "a.walk"},
        "no/report.xml: the report cannot be written"},
       {{"test", "--verbos", "a.walk"},
