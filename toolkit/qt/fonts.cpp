@@ -50,7 +50,7 @@ std::vector<FontFamily> familiesOf(const QStringList& desktop) {
 }
 
 /// The family to draw `name` with.
-QString drawnFamily(std::string_view name) {
+QString standInFor(std::string_view name) {
   const QString wanted = qString(name);
   if (QFontDatabase::hasFamily(wanted)) return wanted;
   for (const ClassicFamily& classic : classicFamilies) {
@@ -84,7 +84,7 @@ class Desktop final : public QObject {
   const Family& family(const std::string& name) {
     const auto known = asked_.find(name);
     if (known != asked_.end()) return known->second;
-    const QString drawn = drawnFamily(name);
+    const QString drawn = standInFor(name);
     return asked_.emplace(name, Family{drawn, QFontDatabase::isFixedPitch(drawn)}).first->second;
   }
 
@@ -109,9 +109,15 @@ std::optional<Font> QtFonts::fontWithName(std::string_view name, double size) co
   return font;
 }
 
+QString drawnFamily(const Font& font) {
+  return Desktop::ofApplication().family(font.family).drawnWith;
+}
+
+int pixelSize(const Font& font) { return std::max(1, static_cast<int>(std::lround(font.size))); }
+
 QFont qFont(const Font& font) {
-  QFont drawn(Desktop::ofApplication().family(font.family).drawnWith);
-  drawn.setPixelSize(std::max(1, static_cast<int>(std::lround(font.size))));
+  QFont drawn(drawnFamily(font));
+  drawn.setPixelSize(pixelSize(font));
   drawn.setBold(font.bold);
   drawn.setItalic(font.italic);
   drawn.setFixedPitch(font.fixedPitch);

@@ -5,6 +5,7 @@
 #pragma once
 
 #include <QFont>
+#include <QString>
 
 #include "toolkit/font_names.hpp"
 #include "toolkit/styled_text/fonts.hpp"
@@ -21,5 +22,8 @@ class QtFonts final : public Fonts {
 
 /// The font to draw with: the family itself, or what stands in for it.
 QFont qFont(const Font& font);
+/// The same in words, without making a font.
+QString drawnFamily(const Font& font);
+int pixelSize(const Font& font);
 
 }  // namespace toolkit::qt

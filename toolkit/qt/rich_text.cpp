@@ -131,9 +131,8 @@ QString cssOf(const char* property, const QColor& color) {
 }
 
 QString cssOf(const Font& font, const QFont& otherwise) {
-  const QFont drawn = qFont(font);
-  QString css =
-      QString("font-family:'%1';font-size:%2px;").arg(drawn.family()).arg(drawn.pixelSize());
+  QString css = "font-family:'" + drawnFamily(font) +
+                "';font-size:" + QString::number(pixelSize(font)) + "px;";
   if (font.bold || otherwise.bold()) css += font.bold ? "font-weight:700;" : "font-weight:400;";
   if (font.italic || otherwise.italic())
     css += font.italic ? "font-style:italic;" : "font-style:normal;";
@@ -150,8 +149,8 @@ QString cssOf(const TextAttributes& attributes, const TextSetting& setting) {
   return css;
 }
 
-void wrapIn(QString& html, const char* tag, const QString& attributes = {}) {
-  html = QString("<%1%2>%3</%1>").arg(tag, attributes, html);
+void wrapIn(QString& html, const QString& tag, const QString& attributes = {}) {
+  html = "<" + tag + attributes + ">" + html + "</" + tag + ">";
 }
 
 QString htmlOf(const Piece& piece, const TextSetting& setting) {
@@ -236,6 +235,11 @@ QString htmlOf(const AttributedString& text, const TextSetting& setting) {
   for (const Paragraph& paragraph : paragraphsOf(text, setting.dropsLastLineEnd))
     html += htmlOf(paragraph, setting);
   return html;
+}
+
+bool hasLinks(const AttributedString& text) {
+  return std::any_of(text.runs().begin(), text.runs().end(),
+                     [](const TextRun& run) { return run.attributes.link.has_value(); });
 }
 
 bool isPlain(const AttributedString& text) {

@@ -33,6 +33,9 @@ void showIn(QTextDocument& document, const AttributedString& text, const TextSet
 /// The same as HTML, for widgets that take nothing else.
 QString htmlOf(const AttributedString& text, const TextSetting& setting);
 
+/// Whether any of `text` is a link.
+bool hasLinks(const AttributedString& text);
+
 /// Whether `text` has no attributes at all, so that plain text shows all of it.
 bool isPlain(const AttributedString& text);
 

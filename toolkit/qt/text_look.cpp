@@ -98,19 +98,24 @@ class TextLook final : public QObject {
 
  private:
   TextSetting setting() const {
-    const QPalette palette = widget_.palette();
-    const bool edited = documentOf(widget_);
-    const auto ground = edited ? QPalette::Base : widget_.backgroundRole();
-    const auto ink = edited ? QPalette::Text : widget_.foregroundRole();
-    TextSetting setting{widget_.font(), palette.color(QPalette::Active, QPalette::Link),
-                        palette.color(ground)};
+    TextSetting setting{widget_.font(), {}, {}};
     setting.direction = widget_.layoutDirection();
     setting.greyed = !widget_.isEnabled();
-    if (setting.greyed) setting.ink = palette.color(ink);
+    // Only where they are needed: Qt takes its time to say which palette holds.
+    if (setting.greyed || hasLinks(text_)) setColors(setting);
     if (const auto* const label = qobject_cast<QLabel*>(&widget_)) {
       setting.unasked = label->alignment() & Qt::AlignHorizontal_Mask;
     }
     return setting;
+  }
+
+  void setColors(TextSetting& setting) const {
+    const QPalette palette = widget_.palette();
+    const bool edited = documentOf(widget_);
+    setting.link = palette.color(QPalette::Active, QPalette::Link);
+    setting.ground = palette.color(edited ? QPalette::Base : widget_.backgroundRole());
+    if (setting.greyed)
+      setting.ink = palette.color(edited ? QPalette::Text : widget_.foregroundRole());
   }
 
   void draw() {
