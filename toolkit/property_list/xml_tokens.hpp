@@ -43,7 +43,9 @@ class XmlTokens {
   std::size_t offset() const { return static_cast<std::size_t>(at_ - begin_); }
   /// The offset of a character in something that this has returned from the text.
   std::size_t offsetOf(const char* place) const { return static_cast<std::size_t>(place - begin_); }
-  [[noreturn]] void refuse(std::string reason) const { throw RefusedAt{offset(), std::move(reason)}; }
+  [[noreturn]] void refuse(std::string reason) const {
+    throw RefusedAt{offset(), std::move(reason)};
+  }
 
  private:
   static bool isSpace(char c);
