@@ -40,10 +40,11 @@ TEST(Values, RaiseWhatTheyDoNotUnderstand) {
       {Array::make(), "NSArray"},
       {Dictionary::make(), "NSDictionary"},
   };
-  for (const auto& [value, className] : others) {
-    const std::string start = std::string("-[") + className + " ";
+  for (const auto& other : others) {
+    const auto& value = other.value;
+    const std::string start = std::string("-[") + other.className + " ";
     const std::string end = "]: unrecognized selector sent to instance";
-    EXPECT_EQ(value->className(), className);
+    EXPECT_EQ(value->className(), other.className);
     EXPECT_EQ(refusal([&] { value->intValue(); }), start + "intValue" + end);
     EXPECT_EQ(refusal([&] { value->integerValue(); }), start + "integerValue" + end);
     EXPECT_EQ(refusal([&] { value->longValue(); }), start + "longValue" + end);

@@ -48,6 +48,7 @@ TEST_F(DumpCommand, showsTheTypeOfEveryScalar) {
       {toolkit::String::make("5"), "\"5\""},
       {toolkit::String::make("a\"\\\t\n\r\x1b[2J"), "\"a\\\"\\\\\\t\\n\\u{d}\\u{1b}[2J\""},
       {toolkit::String::make("\0"sv), "\"\\u{0}\""},
+      // NOLINTNEXTLINE(misc-misleading-bidirectional): misleading is what it is to be
       {toolkit::String::make("\u2028\u2029\u202E"), "\"\\u{2028}\\u{2029}\\u{202e}\""},
       {toolkit::String::make("\xED\xA0\x80z"), "\"\\u{d800}z\""},
       {toolkit::Number::withLong(-5), "-5"},
