@@ -30,6 +30,7 @@ bool QZ_Plist_State_Parser::runElement(const Value& element, const Parameters& p
     // A copy keeps it: a list of the host's may lose it while it runs.
     return doSimpleCommand(textOf(Value(element)), parameters, id);
   }
+  // Not by asArray, which counts the reference in and out again: this runs for every command.
   const auto& compound = static_cast<const toolkit::Array&>(*element);
   std::string raised;
   const auto name = toolkit::uppercased(textOf(compound.objectAtIndex(0)), raised);

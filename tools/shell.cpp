@@ -64,7 +64,7 @@ std::string givenTwice(std::string words) {
   constexpr std::string_view most = ": At Most 1 required but received ";
   const std::size_t at = words.find(most);
   if (at == std::string::npos) return words;
-  return words.replace(at, most.size(), ": expected once, found times: ");
+  return words.replace(at, most.size(), ": expected once, found ") + " times";
 }
 
 /// CLI11 says "list was given a disallowed flag override" of "--list=3".

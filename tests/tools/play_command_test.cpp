@@ -40,7 +40,7 @@ TEST_F(PlayCommand, badUsageIsOneLine) {
        "unknown option --pres; did you mean \"--press\"?" + help},
       {{"play", "script.plist", "--press"}, "--press: expected TAG" + help},
       {{"play", "script.plist", "--start", "1", "--start", "2"},
-       "--start: expected once, found times: 2" + help},
+       "--start: expected once, found 2 times" + help},
       {{"play", "script.plist", "--press", "Next"},
        "--press: expected a tag (a whole number), found “Next”" + help},
       {{"play", "script.plist", "--advance", "-1"},

@@ -95,9 +95,9 @@ void Session::begin(const std::string& heading, const std::string& name) {
 
 // A host's event loop would report it and go on; so does the transcript.
 void Session::noteRaised(const toolkit::Exception& exception) {
-  const std::string what = "aised " + exception.name() + ": " + printable(exception.reason());
-  problems_.push_back(begun_->heading + ": r" + what);
-  transcript_.note("R" + what);
+  const std::string what = exception.name() + ": " + printable(exception.reason());
+  problems_.push_back(begun_->heading + ": raised " + what);
+  transcript_.note("Raised " + what);
 }
 
 void Session::end() {
