@@ -129,6 +129,8 @@ bench::Contender click(const char* name, Form& form) {
             QCoreApplication::processEvents();
           },
           [&] {
+            form.window.activateWindow();  // Qt paints other windows' widgets more slowly
+            QCoreApplication::processEvents();
             sendMouse(form.next, QEvent::MouseButtonPress, Qt::LeftButton);
             QCoreApplication::processEvents();
           }};

@@ -85,7 +85,7 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TOOL_TIP(const Paramete
                                                                   const ObjectId& forObject) {
   const std::size_t count = parameters->count();
   if (count == 0) return false;
-  const Value toolTip = parameters->objectAtIndex(0);
+  const Value& toolTip = parameters->objectAtIndex(0);
   const std::string_view text = textOf(toolTip);
   // Only a second parameter that is the last one aims; otherwise it is the list's own control.
   const long tag = count == 2 ? parameters->objectAtIndex(1)->intValue() : forObject->longValue();

@@ -31,7 +31,8 @@ class Ref {
   T& operator*() const { return *operator->(); }
 
   /// The owning pointer itself; null when the reference is absent.
-  const Pointer<T>& pointer() const { return object_; }
+  const Pointer<T>& pointer() const& { return object_; }
+  Pointer<T>&& pointer() && { return std::move(object_); }
 
   friend bool operator==(const Ref& a, const Ref& b) { return a.object_ == b.object_; }
 

@@ -2,6 +2,8 @@
 
 #include "toolkit/view.hpp"
 
+#include <utility>
+
 #include "toolkit/exception.hpp"
 
 namespace toolkit {
@@ -34,17 +36,28 @@ void View::setAttributedTitle(const AttributedString&) {
 
 namespace {
 
-// `kind` is `view` itself seen as a T, or null; the reference shares the view's ownership.
+// `kind` is `view` itself seen as a T, or null; the reference takes over the view's.
 template <class T>
-Ref<T> sharing(const Ref<View>& view, T* kind) {
+Ref<T> sharing(Ref<View>&& view, T* kind) {
   if (!kind) return {};
-  return std::shared_ptr<T>(view.pointer(), kind);
+  return std::shared_ptr<T>(std::move(view).pointer(), kind);
 }
 
 }  // namespace
 
-Ref<Button> asButton(const Ref<View>& view) { return sharing(view, view->asButton()); }
-Ref<TextField> asTextField(const Ref<View>& view) { return sharing(view, view->asTextField()); }
-Ref<ImageView> asImageView(const Ref<View>& view) { return sharing(view, view->asImageView()); }
+Ref<Button> asButton(Ref<View> view) {
+  auto* const button = view->asButton();
+  return sharing(std::move(view), button);
+}
+
+Ref<TextField> asTextField(Ref<View> view) {
+  auto* const field = view->asTextField();
+  return sharing(std::move(view), field);
+}
+
+Ref<ImageView> asImageView(Ref<View> view) {
+  auto* const imageView = view->asImageView();
+  return sharing(std::move(view), imageView);
+}
 
 }  // namespace toolkit

@@ -171,8 +171,8 @@ class Gradient : public View {
 };
 
 /// `view` as the kind asked for, or absent when it is none or of another kind.
-Ref<Button> asButton(const Ref<View>& view);
-Ref<TextField> asTextField(const Ref<View>& view);
-Ref<ImageView> asImageView(const Ref<View>& view);
+Ref<Button> asButton(Ref<View> view);
+Ref<TextField> asTextField(Ref<View> view);
+Ref<ImageView> asImageView(Ref<View> view);
 
 }  // namespace toolkit

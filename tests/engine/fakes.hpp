@@ -25,7 +25,10 @@ class FakeRole : public Role {
   const toolkit::Subviews& subviews() const override { return views; }
   void addSubview(const toolkit::Ref<toolkit::View>& view) override { views.push_back(view); }
   void setHidden(bool hidden) override { note(hidden ? "hide" : "show"); }
-  void setToolTip(std::string_view) override {}
+  void setToolTip(std::string_view text) override {
+    note("tooltip");
+    toolTip = text;
+  }
   bool needsDisplay() const override {
     note("needsDisplay");
     return false;
@@ -35,6 +38,7 @@ class FakeRole : public Role {
   void setEnabled(bool enabled) override { note(enabled ? "enable" : "disable"); }
 
   toolkit::Subviews views;
+  std::string toolTip;
   /// What happened to the view, in order.
   mutable std::vector<std::string> calls;
   /// Called with every call before it is noted.

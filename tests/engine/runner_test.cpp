@@ -13,6 +13,7 @@
 #include "QZ_Plist_State_Parser.hpp"
 #include "tests/engine/fakes.hpp"
 #include "toolkit/memory/memory_driver.hpp"
+#include "toolkit/property_list/reader.hpp"
 
 namespace {
 
@@ -133,6 +134,28 @@ TEST_F(Runner, ACommandsParametersAreItsOwnList) {
   const auto command = Array::make({text("set_tool_tip_for_id"), text("tip")});
   EXPECT_TRUE(run({command, command}));
   EXPECT_EQ(command->count(), 2U);
+}
+
+TEST_F(Runner, ACommandThatLosesItsElementsMeanwhileHasItsParameters) {
+  const auto command = Array::make({text("SET_TOOL_TIP_FOR_ID"), text("the first tooltip")});
+  std::vector<ValueRef<>> others;
+  view->onCall = [&](const std::string&) {
+    command->removeAllObjects();
+    // Where memory that was let go would be used again.
+    for (int i = 0; i < 8; ++i) others.emplace_back(text("another tooltip!!"));
+  };
+  EXPECT_TRUE(run({command}));
+  EXPECT_EQ(view->toolTip, "the first tooltip");
+}
+
+TEST_F(Runner, AListOutOfAFileIsThereAsLongAsItRuns) {
+  auto list =
+      toolkit::readPropertyList("((SET_TOOL_TIP_FOR_ID, \"the first tooltip\"), IDLE_LOOP)").value;
+  view->onCall = [&](const std::string&) { list = nullptr; };
+  EXPECT_TRUE(engine->processCommandArray(list, Number::withLong(tag)));
+  EXPECT_FALSE(list);
+  EXPECT_EQ(view->toolTip, "the first tooltip");
+  EXPECT_TRUE(log.empty());
 }
 
 TEST_F(Runner, TheIdIsHandedOnAsItIs) {

@@ -145,11 +145,35 @@ TEST(Arrays, GrowAndEmpty) {
   EXPECT_EQ(array->count(), 100U);
   EXPECT_EQ(array->objectAtIndex(99)->intValue(), 99);
   EXPECT_EQ(array->elements().front()->intValue(), 0);
-  array->addObjects(Array::make({String::make("7"), String::make("8")})->elements());
-  EXPECT_EQ(array->count(), 102U);
-  EXPECT_EQ(array->objectAtIndex(101)->intValue(), 8);
   array->removeAllObjects();
   EXPECT_EQ(array->count(), 0U);
+  array->addObject(Number::withLong(100));
+  EXPECT_EQ(array->objectAtIndex(0)->intValue(), 100);
+}
+
+TEST(Arrays, TakeOverElements) {
+  auto given = Array::make({String::make("7"), String::make("8")});
+  const auto array = Array::make({String::make("1")});
+  array->setElements(given->elements());
+  given = nullptr;  // the array has counts of its own
+  EXPECT_EQ(array->count(), 2U);
+  EXPECT_EQ(array->objectAtIndex(1)->intValue(), 8);
+}
+
+TEST(Arrays, BorrowElementsUntilTheyHaveOthers) {
+  const auto given = Array::make({String::make("7"), String::make("8")});
+  const auto array = Array::make({String::make("1")});
+  array->borrowElements(given->elements());
+  EXPECT_EQ(array->elements().data(), given->elements().data());
+  EXPECT_EQ(array->objectAtIndex(1)->intValue(), 8);
+  array->addObject(String::make("9"));
+  EXPECT_EQ(array->count(), 3U);
+  EXPECT_EQ(array->objectAtIndex(0)->intValue(), 7);
+  EXPECT_EQ(given->count(), 2U);
+  array->borrowElements(given->elements());
+  array->removeAllObjects();
+  EXPECT_EQ(array->count(), 0U);
+  EXPECT_EQ(given->count(), 2U);
 }
 
 }  // namespace

@@ -109,7 +109,8 @@ TEST(Values, AbsentCollectionsSwallowChanges) {
   const ValueRef<Dictionary> dictionary;
   array->addObject(String::make("x"));
   array->addObject(nullptr);
-  array->addObjects(Array::make({String::make("x")})->elements());
+  array->setElements(Array::make({String::make("x")})->elements());
+  array->borrowElements(Array::make({String::make("x")})->elements());
   array->removeAllObjects();
   dictionary->setObject(String::make("x"), "k");
   dictionary->setObject(nullptr, "k");
@@ -125,7 +126,8 @@ TEST(Values, ImmutableCollectionsRaiseOnChanges) {
       Dictionary::make({{String::make("k"), Null::make()}}, Mutability::immutable);
   const std::string end = "]: mutating message sent to an immutable object";
   EXPECT_EQ(refusal([&] { array->addObject(Null::make()); }), "-[NSArray addObject:" + end);
-  EXPECT_EQ(refusal([&] { array->addObjects({}); }), "-[NSArray addObjects:" + end);
+  EXPECT_EQ(refusal([&] { array->setElements({}); }), "-[NSArray setArray:" + end);
+  EXPECT_EQ(refusal([&] { array->borrowElements({}); }), "-[NSArray setArray:" + end);
   EXPECT_EQ(refusal([&] { array->removeAllObjects(); }), "-[NSArray removeAllObjects" + end);
   EXPECT_EQ(refusal([&] { dictionary->setObject(Null::make(), "k"); }),
             "-[NSDictionary setObject:forKey:" + end);

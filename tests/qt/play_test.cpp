@@ -96,17 +96,27 @@ QPushButton* buttonTitled(const char* title) {
   return nullptr;
 }
 
-TEST(PlayInWindows, writesDownWhatAPersonDoes) {
-  const Directory directory;
-  PlayOptions options;
-  options.script = directory.write("script.plist", script);
-  const InputFile file(options.script, "a script");
-  toolkit::qt::QtDriver driver;
-  Stage stage(driver, options, file.dictionary());
-  std::ostringstream out;
-  Session session(driver, stage, out, {});
-  session.start(options.script, "");
+/// A session over the script's window, begun and left to a person.
+class PlayedByAPerson : public testing::Test {
+ protected:
+  PlayedByAPerson() { session.start(options.script, ""); }
 
+  PlayOptions optionsOfScript() const {
+    PlayOptions made;
+    made.script = directory.write("script.plist", script);
+    return made;
+  }
+
+  const Directory directory;
+  const PlayOptions options = optionsOfScript();
+  const InputFile file{options.script, "a script"};
+  toolkit::qt::QtDriver driver;
+  Stage stage{driver, options, file.dictionary()};
+  std::ostringstream out;
+  Session session{driver, stage, out, {}};
+};
+
+TEST_F(PlayedByAPerson, writesDownWhatAPersonDoes) {
   // The person presses what they see, as soon as they see it.
   QTimer person;
   person.callOnTimeout([] {
@@ -127,17 +137,7 @@ TEST(PlayInWindows, writesDownWhatAPersonDoes) {
   }
 }
 
-TEST(PlayInWindows, endsWhenThePersonClosesTheWindow) {
-  const Directory directory;
-  PlayOptions options;
-  options.script = directory.write("script.plist", script);
-  const InputFile file(options.script, "a script");
-  toolkit::qt::QtDriver driver;
-  Stage stage(driver, options, file.dictionary());
-  std::ostringstream out;
-  Session session(driver, stage, out, {});
-  session.start(options.script, "");
-
+TEST_F(PlayedByAPerson, endsWhenThePersonClosesTheWindow) {
   QTimer::singleShot(20, [] { buttonTitled("2")->window()->close(); });
   session.handOver();
   EXPECT_FALSE(session.picture().ended);

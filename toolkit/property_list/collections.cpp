@@ -1,6 +1,5 @@
 #include "toolkit/property_list/collections.hpp"
 
-#include <iterator>
 #include <utility>
 
 #include "toolkit/exception.hpp"
@@ -17,16 +16,12 @@ bool isText(const Value& key, std::string_view text) {
 /// back.
 ValueRef<> uncounted(Value* value) { return Counted<Value>::adopt(value); }
 
-std::pmr::vector<ValueRef<>> uncounted(std::span<Value* const> values, Document* document) {
-  std::pmr::vector<ValueRef<>> references(document);
-  references.reserve(values.size());
-  for (Value* value : values) references.push_back(uncounted(value));
-  return references;
-}
-
-std::pmr::vector<ValueRef<>> moved(std::vector<ValueRef<>>&& values) {
-  return {std::make_move_iterator(values.begin()), std::make_move_iterator(values.end()),
-          std::pmr::new_delete_resource()};
+std::span<const ValueRef<>> uncounted(std::span<Value* const> values, Document& document) {
+  auto* const references =
+      static_cast<ValueRef<>*>(document.allocate(values.size_bytes(), alignof(ValueRef<>)));
+  auto* next = references;
+  for (Value* value : values) std::construct_at(next++, uncounted(value));
+  return {references, values.size()};
 }
 
 std::string message(const Value& value, std::string_view selector) {
@@ -61,10 +56,13 @@ void Collection::destroy() noexcept {
 Array& Array::nothing() { return nothingAs<Array>(); }
 
 Array::Array(std::vector<ValueRef<>>&& elements, Mutability mutability)
-    : Collection(Kind::array, mutability), elements_(moved(std::move(elements))) {}
+    : Collection(Kind::array, mutability),
+      own_(std::make_unique<std::vector<ValueRef<>>>(std::move(elements))) {
+  elements_ = *own_;
+}
 
 Array::Array(std::span<Value* const> elements, Document* document)
-    : Collection(Kind::array, Mutability::immutable), elements_(uncounted(elements, document)) {}
+    : Collection(Kind::array, Mutability::immutable), elements_(uncounted(elements, *document)) {}
 
 ValueRef<Array> Array::make(std::vector<ValueRef<>> elements, Mutability mutability) {
   return makeAlone<Array>(0, std::move(elements), mutability);
@@ -88,24 +86,38 @@ const ValueRef<>& Array::objectBeyondEnd(std::size_t index) const {
 void Array::addObject(const ValueRef<>& value) {
   if (!canChange("addObject:")) return;
   requirePresent(value, "addObject:");
-  elements_.push_back(value);
-}
-
-void Array::addObjects(std::span<const ValueRef<>> values) {
-  if (canChange("addObjects:")) elements_.insert(elements_.end(), values.begin(), values.end());
+  if (elements_.data() != own_->data()) own_->assign(elements_.begin(), elements_.end());
+  own_->push_back(value);
+  elements_ = *own_;
 }
 
 void Array::removeAllObjects() {
-  if (canChange("removeAllObjects")) elements_.clear();
+  if (!canChange("removeAllObjects")) return;
+  own_->clear();
+  elements_ = {};
+}
+
+void Array::setElements(std::span<const ValueRef<>> elements) {
+  if (!canChange("setArray:")) return;
+  own_->assign(elements.begin(), elements.end());
+  elements_ = *own_;
+}
+
+void Array::borrowElements(std::span<const ValueRef<>> elements) {
+  if (!canChange("setArray:")) return;
+  own_->clear();
+  elements_ = elements;
 }
 
 Set& Set::nothing() { return nothingAs<Set>(); }
 
 Set::Set(std::vector<ValueRef<>>&& elements)
-    : Collection(Kind::set, Mutability::immutable), elements_(moved(std::move(elements))) {}
+    : Collection(Kind::set, Mutability::immutable), own_(std::move(elements)) {
+  elements_ = own_;
+}
 
 Set::Set(std::span<Value* const> elements, Document* document)
-    : Collection(Kind::set, Mutability::immutable), elements_(uncounted(elements, document)) {}
+    : Collection(Kind::set, Mutability::immutable), elements_(uncounted(elements, *document)) {}
 
 ValueRef<Set> Set::make(std::vector<ValueRef<>> elements) {
   return makeAlone<Set>(0, std::move(elements));

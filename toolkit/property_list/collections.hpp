@@ -48,9 +48,12 @@ class Array final : public Collection {
 
   /// Changes raise where `Mutability` says so; adding an absent value raises.
   void addObject(const ValueRef<>& value);
-  /// Adds elements of another array.
-  void addObjects(std::span<const ValueRef<>> values);
   void removeAllObjects();
+  /// Has the elements given instead of its own.
+  void setElements(std::span<const ValueRef<>> elements);
+  /// The same without a count of them, nor a copy: the caller sees to it that they stay where they
+  /// are until the array has others, or ends.
+  void borrowElements(std::span<const ValueRef<>> elements);
 
   /// As an immutable part of `document`, like its elements; the caller gets no count.
   static Array* make(Document& document, std::span<Value* const> elements);
@@ -62,7 +65,8 @@ class Array final : public Collection {
   Array(std::span<Value* const> elements, Document* document);
   const ValueRef<>& objectBeyondEnd(std::size_t index) const;
 
-  std::pmr::vector<ValueRef<>> elements_{std::pmr::new_delete_resource()};
+  std::span<const ValueRef<>> elements_;  // `own_`, or a document's, or borrowed
+  std::unique_ptr<std::vector<ValueRef<>>> own_;
 };
 
 /// Values without an order, from binary property lists; they keep the order of the file.
@@ -82,7 +86,8 @@ class Set final : public Collection {
   explicit Set(std::vector<ValueRef<>>&& elements);
   Set(std::span<Value* const> elements, Document* document);
 
-  std::pmr::vector<ValueRef<>> elements_{std::pmr::new_delete_resource()};
+  std::span<const ValueRef<>> elements_;  // `own_`, or a document's
+  std::vector<ValueRef<>> own_;
 };
 
 /// Values under keys. The keys that scripts and tables use are strings; a binary property list may

@@ -43,7 +43,7 @@ class Number::Small {
 
   Small() {
     for (std::int64_t i = 0; i < count; ++i) {
-      ::new (at(i)) Number(Type::signedInteger, static_cast<std::uint64_t>(i));
+      makeForever<Number>(at(i), Type::signedInteger, static_cast<std::uint64_t>(i));
     }
   }
   Number* at(std::int64_t value) { return reinterpret_cast<Number*>(storage_) + value; }

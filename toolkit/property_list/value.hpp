@@ -108,6 +108,10 @@ class Value {
   /// Anything but an array raises.
   virtual const ValueRef<>& objectAtIndex(std::size_t index) const;
 
+  /// Whether whatever the value holds stays in place as long as the value is there: so it does of
+  /// values read from a file.
+  bool isFixed() const { return keeper_ == Keeper::document; }
+
   /// The value as a person would read it, in one line unless a string in it has more: a string is
   /// itself, a number decimal (a boolean 1 or 0, a real in the fewest digits that read back the
   /// same), a date in ISO 8601, data `<hex>`, null `<null>`. Collections are in the old style,
@@ -115,12 +119,18 @@ class Value {
   std::string description() const;
 
   void retain() {
-    if (inDocument_) return document().retain();
-    count_.fetch_add(1, std::memory_order_relaxed);
+    if (keeper_ == Keeper::references) {
+      count_.fetch_add(1, std::memory_order_relaxed);
+    } else if (keeper_ == Keeper::document) {
+      document().retain();
+    }
   }
   void release() {
-    if (inDocument_) return document().release();
-    if (count_.fetch_sub(1, std::memory_order_acq_rel) == 1) destroy();
+    if (keeper_ == Keeper::references) {
+      if (count_.fetch_sub(1, std::memory_order_acq_rel) == 1) destroy();
+    } else if (keeper_ == Keeper::document) {
+      document().release();
+    }
   }
 
  protected:
@@ -147,8 +157,15 @@ class Value {
   static T* makeIn(Document& document, std::size_t extra, Arguments&&... arguments) {
     const Document::Place place = document.place(sizeof(T) + extra);
     T* value = new (place.memory) T(std::forward<Arguments>(arguments)...);
-    value->inDocument_ = true;
+    value->keeper_ = Keeper::document;
     value->count_.store(place.distance, std::memory_order_relaxed);
+    return value;
+  }
+  /// The same in memory that lasts to the program's end, as the value then does, uncounted.
+  template <class T, class... Arguments>
+  static T* makeForever(void* memory, Arguments&&... arguments) {
+    T* value = new (memory) T(std::forward<Arguments>(arguments)...);
+    value->keeper_ = Keeper::program;
     return value;
   }
 
@@ -158,6 +175,8 @@ class Value {
   void requireUnderstanding(std::string_view selector) const;
 
  private:
+  /// Who keeps the value: the references to it; its document, on which they count; nobody needs to.
+  enum class Keeper : std::uint8_t { references, document, program };
   enum class Extra : std::size_t {};
   static void* operator new(std::size_t size, Extra extra) {
     return ::operator new(size + static_cast<std::size_t>(extra));
@@ -175,7 +194,7 @@ class Value {
   // In a document: how many units the value stands from the start of its block.
   std::atomic<std::uint32_t> count_{1};
   Kind kind_;
-  bool inDocument_ = false;
+  Keeper keeper_ = Keeper::references;
 };
 
 /// Whether arrays and dictionaries can change: `ignored` ones swallow every change (they stand for

@@ -7,6 +7,7 @@
 #include <QTextCursor>
 #include <QTextOption>
 #include <algorithm>
+#include <ranges>
 #include <utility>
 #include <vector>
 
@@ -17,6 +18,8 @@
 namespace toolkit::qt {
 
 namespace {
+
+using namespace Qt::StringLiterals;
 
 QColor inkOf(const Color& color, const TextSetting& setting) {
   return setting.greyed ? halfway(qColor(color), setting.ground) : qColor(color);
@@ -65,18 +68,30 @@ Qt::Alignment alignmentOf(const std::optional<ParagraphStyle>& style, Qt::Alignm
   return Qt::AlignLeading;
 }
 
-QTextBlockFormat blockFormatOf(const TextAttributes& attributes, const TextSetting& setting) {
+/// How a paragraph stands.
+struct BlockSetting {
+  Qt::Alignment alignment;
+  double before;     ///< between the edge at which lines begin and the lines, in points
+  double firstLine;  ///< what the first line stands further in than the others
+};
+
+BlockSetting blockSettingOf(const TextAttributes& attributes, const TextSetting& setting) {
   const ParagraphStyle style = attributes.paragraphStyle.value_or(ParagraphStyle{});
+  return {alignmentOf(attributes.paragraphStyle, setting.unasked), style.headIndent,
+          style.firstLineHeadIndent - style.headIndent};
+}
+
+QTextBlockFormat blockFormatOf(const TextAttributes& attributes, const TextSetting& setting) {
+  const BlockSetting block = blockSettingOf(attributes, setting);
   QTextBlockFormat format;
-  format.setAlignment(alignmentOf(attributes.paragraphStyle, setting.unasked));
+  format.setAlignment(block.alignment);
   format.setLayoutDirection(setting.direction);
   if (setting.direction == Qt::RightToLeft) {
-    format.setRightMargin(style.headIndent);
+    format.setRightMargin(block.before);
   } else {
-    format.setLeftMargin(style.headIndent);
+    format.setLeftMargin(block.before);
   }
-  // Qt counts the first line's indent from the others'.
-  format.setTextIndent(style.firstLineHeadIndent - style.headIndent);
+  format.setTextIndent(block.firstLine);
   return format;
 }
 
@@ -93,13 +108,21 @@ struct Paragraph {
   std::vector<Piece> pieces;
 };
 
-void addTo(std::vector<Paragraph>& paragraphs, QString text, const TextAttributes& attributes) {
-  const QStringList lines = text.replace("\r\n", "\n").replace('\r', '\n').split('\n');
-  for (qsizetype i = 0; i < lines.size(); ++i) {
-    if (i > 0) paragraphs.push_back({&attributes, {}});
-    if (lines[i].isEmpty()) continue;
-    if (paragraphs.back().pieces.empty()) paragraphs.back().attributes = &attributes;
-    paragraphs.back().pieces.push_back({lines[i], &attributes});
+void addTo(Paragraph& paragraph, std::string_view line, const TextAttributes& attributes) {
+  if (line.empty()) return;
+  if (paragraph.pieces.empty()) paragraph.attributes = &attributes;
+  paragraph.pieces.push_back({qString(line), &attributes});
+}
+
+void addTo(std::vector<Paragraph>& paragraphs, std::string_view text,
+           const TextAttributes& attributes) {
+  for (;;) {
+    const std::size_t end = text.find_first_of("\r\n");
+    addTo(paragraphs.back(), text.substr(0, end), attributes);
+    if (end == std::string_view::npos) return;
+    text.remove_prefix(end);
+    text.remove_prefix(text.starts_with("\r\n") ? 2 : 1);
+    paragraphs.push_back({&attributes, {}});
   }
 }
 
@@ -113,7 +136,7 @@ std::vector<Paragraph> paragraphsOf(const AttributedString& text, bool dropsLast
     std::string_view part = whole.substr(run.range.location, run.range.length);
     const bool last = run.range.location + run.range.length == whole.size();
     if (last && dropsLastLineEnd && part.ends_with('\n')) part.remove_suffix(1);
-    addTo(paragraphs, qString(part), run.attributes);
+    addTo(paragraphs, part, run.attributes);
   }
   return paragraphs;
 }
@@ -121,89 +144,148 @@ std::vector<Paragraph> paragraphsOf(const AttributedString& text, bool dropsLast
 // In HTML nothing is written that holds anyway, and tags rather than styles: most of the time that
 // it takes to show some text Qt spends reading styles.
 
-QString cssOf(const char* property, const QColor& color) {
-  return QString("%1:rgba(%2,%3,%4,%5);")
-      .arg(property)
-      .arg(color.red())
-      .arg(color.green())
-      .arg(color.blue())
-      .arg(static_cast<double>(color.alphaF()));
-}
-
-QString cssOf(const Font& font, const QFont& otherwise) {
-  QString css = "font-family:'" + drawnFamily(font) +
-                "';font-size:" + QString::number(pixelSize(font)) + "px;";
-  if (font.bold || otherwise.bold()) css += font.bold ? "font-weight:700;" : "font-weight:400;";
-  if (font.italic || otherwise.italic())
-    css += font.italic ? "font-style:italic;" : "font-style:normal;";
-  return css;
-}
-
-QString cssOf(const TextAttributes& attributes, const TextSetting& setting) {
-  QString css;
-  if (attributes.font) css += cssOf(*attributes.font, setting.font);
-  if (const auto ink = inkOf(attributes, setting)) css += cssOf("color", *ink);
-  if (attributes.backgroundColor)
-    css += cssOf("background-color", inkOf(*attributes.backgroundColor, setting));
-  if (attributes.link && !attributes.underline) css += "text-decoration:none;";
-  return css;
-}
-
-void wrapIn(QString& html, const QString& tag, const QString& attributes = {}) {
-  html = "<" + tag + attributes + ">" + html + "</" + tag + ">";
-}
-
-QString htmlOf(const Piece& piece, const TextSetting& setting) {
-  const TextAttributes& attributes = *piece.attributes;
-  QString html = piece.text.toHtmlEscaped().replace(QChar::LineSeparator, "<br/>");
-  if (attributes.underline) wrapIn(html, "u");
-  if (attributes.strikethrough) wrapIn(html, "s");
-  if (attributes.superscript != 0) wrapIn(html, attributes.superscript > 0 ? "sup" : "sub");
-  if (const QString css = cssOf(attributes, setting); !css.isEmpty())
-    wrapIn(html, "span", " style=\"" + css.toHtmlEscaped() + "\"");
-  if (attributes.link)
-    wrapIn(html, "a", " href=\"" + qString(attributes.link->address()).toHtmlEscaped() + "\"");
-  return html;
-}
-
-bool hasBlanksToKeep(const Paragraph& paragraph) {
-  return std::any_of(paragraph.pieces.begin(), paragraph.pieces.end(), [](const Piece& piece) {
-    return piece.text.front().isSpace() || piece.text.back().isSpace() ||
-           piece.text.simplified() != piece.text;
-  });
-}
-
-QString attributesOf(const QTextBlockFormat& format) {
-  QString html = format.layoutDirection() == Qt::RightToLeft ? " dir=\"rtl\"" : "";
-  const Qt::Alignment alignment = format.alignment();
-  if (alignment & Qt::AlignHCenter)
-    html += " align=\"center\"";
-  else if (alignment & Qt::AlignJustify)
-    html += " align=\"justify\"";
-  else if (alignment & Qt::AlignRight)
-    html += " align=\"right\"";
-  else if (alignment & Qt::AlignAbsolute)
-    html += " align=\"left\"";
-  return html;
-}
-
-QString htmlOf(const Paragraph& paragraph, const TextSetting& setting) {
-  const QTextBlockFormat format = blockFormatOf(*paragraph.attributes, setting);
-  QString html;
-  for (const Piece& piece : paragraph.pieces) html += htmlOf(piece, setting);
-  QString css;
-  if (paragraph.pieces.empty()) {  // Qt's own way of writing an empty line, as high as its font
-    css = "-qt-paragraph-type:empty;" + cssOf(*paragraph.attributes, setting);
-    html = "<br/>";
+void writeEscaped(QString& html, QStringView text) {
+  qsizetype written = 0;
+  for (qsizetype i = 0; i < text.size(); ++i) {
+    QLatin1String entity;
+    if (text[i] == u'&') entity = "&amp;"_L1;
+    if (text[i] == u'<') entity = "&lt;"_L1;
+    if (text[i] == u'>') entity = "&gt;"_L1;
+    if (text[i] == u'"') entity = "&quot;"_L1;
+    if (entity.isEmpty()) continue;
+    html += text.sliced(written, i - written);
+    html += entity;
+    written = i + 1;
   }
-  if (hasBlanksToKeep(paragraph)) css += "white-space:pre-wrap;";
-  if (format.leftMargin() != 0) css += QString("margin-left:%1px;").arg(format.leftMargin());
-  if (format.rightMargin() != 0) css += QString("margin-right:%1px;").arg(format.rightMargin());
-  if (format.textIndent() != 0) css += QString("text-indent:%1px;").arg(format.textIndent());
-  QString attributes = attributesOf(format);
-  if (!css.isEmpty()) attributes += " style=\"" + css.toHtmlEscaped() + "\"";
-  wrapIn(html, "div", attributes);
-  return html;
+  html += text.sliced(written);
+}
+
+void writeText(QString& html, QStringView text) {
+  for (;;) {
+    const qsizetype end = text.indexOf(QChar::LineSeparator);
+    if (end < 0) return writeEscaped(html, text);
+    writeEscaped(html, text.first(end));
+    html += "<br/>"_L1;
+    text = text.sliced(end + 1);
+  }
+}
+
+/// Between `opening` and `closing`, neither of which is written around nothing. Tells whether they
+/// are.
+template <class Writer>
+bool writeBetween(QLatin1String opening, QLatin1String closing, QString& html, Writer write) {
+  const qsizetype start = html.size();
+  html += opening;
+  const qsizetype inside = html.size();
+  write();
+  const bool hasAny = html.size() > inside;
+  if (hasAny) {
+    html += closing;
+  } else {
+    html.resize(start);
+  }
+  return hasAny;
+}
+
+void writeCss(QString& html, QLatin1String property, double points) {
+  if (points != 0) html += property + QString::number(points) + "px;"_L1;
+}
+
+void writeCss(QString& html, QLatin1String property, const QColor& color) {
+  html += property + QString::number(color.red()) + u',' + QString::number(color.green()) + u',' +
+          QString::number(color.blue()) + u',' +
+          QString::number(static_cast<double>(color.alphaF())) + ");"_L1;
+}
+
+void writeCss(QString& html, const Font& font, const QFont& otherwise) {
+  html += "font-family:'"_L1;
+  writeEscaped(html, drawnFamily(font));
+  html += "';"_L1;
+  writeCss(html, "font-size:"_L1, pixelSize(font));
+  if (font.bold || otherwise.bold())
+    html += font.bold ? "font-weight:700;"_L1 : "font-weight:400;"_L1;
+  if (font.italic || otherwise.italic())
+    html += font.italic ? "font-style:italic;"_L1 : "font-style:normal;"_L1;
+}
+
+void writeCss(QString& html, const TextAttributes& attributes, const TextSetting& setting) {
+  if (attributes.font) writeCss(html, *attributes.font, setting.font);
+  if (const auto ink = inkOf(attributes, setting)) writeCss(html, "color:rgba("_L1, *ink);
+  if (const auto& ground = attributes.backgroundColor)
+    writeCss(html, "background-color:rgba("_L1, inkOf(*ground, setting));
+  if (attributes.link && !attributes.underline) html += "text-decoration:none;"_L1;
+}
+
+void writePiece(QString& html, const Piece& piece, const TextSetting& setting) {
+  const TextAttributes& attributes = *piece.attributes;
+  const struct {
+    bool holds;
+    QLatin1String opening, closing;
+  } tags[] = {
+      {attributes.superscript > 0, "<sup>"_L1, "</sup>"_L1},
+      {attributes.superscript < 0, "<sub>"_L1, "</sub>"_L1},
+      {attributes.strikethrough, "<s>"_L1, "</s>"_L1},
+      {attributes.underline, "<u>"_L1, "</u>"_L1},
+  };
+  if (attributes.link) {
+    html += "<a href=\""_L1;
+    writeEscaped(html, qString(attributes.link->address()));
+    html += "\">"_L1;
+  }
+  const bool styled = writeBetween("<span style=\""_L1, "\">"_L1, html,
+                                   [&] { writeCss(html, attributes, setting); });
+  for (const auto& tag : tags)
+    if (tag.holds) html += tag.opening;
+  writeText(html, piece.text);
+  for (const auto& tag : std::ranges::reverse_view(tags))
+    if (tag.holds) html += tag.closing;
+  if (styled) html += "</span>"_L1;
+  if (attributes.link) html += "</a>"_L1;
+}
+
+/// Whether HTML would drop or merge blanks of the text.
+bool hasBlanksToKeep(QStringView text) {
+  bool behindBlank = true;
+  for (const QChar c : text) {
+    const bool blank = c.isSpace();
+    if (blank && (behindBlank || c != u' ')) return true;
+    behindBlank = blank;
+  }
+  return behindBlank;
+}
+
+QLatin1String alignmentIn(const BlockSetting& block) {
+  if (block.alignment & Qt::AlignHCenter) return " align=\"center\""_L1;
+  if (block.alignment & Qt::AlignJustify) return " align=\"justify\""_L1;
+  if (block.alignment & Qt::AlignRight) return " align=\"right\""_L1;
+  if (block.alignment & Qt::AlignAbsolute) return " align=\"left\""_L1;
+  return {};
+}
+
+void writeCss(QString& html, const Paragraph& paragraph, const BlockSetting& block,
+              const TextSetting& setting) {
+  if (paragraph.pieces.empty()) {  // Qt's own way of writing an empty line, as high as its font
+    html += "-qt-paragraph-type:empty;"_L1;
+    writeCss(html, *paragraph.attributes, setting);
+  }
+  if (std::any_of(paragraph.pieces.begin(), paragraph.pieces.end(),
+                  [](const Piece& piece) { return hasBlanksToKeep(piece.text); }))
+    html += "white-space:pre-wrap;"_L1;
+  const bool leftwards = setting.direction == Qt::RightToLeft;
+  writeCss(html, leftwards ? "margin-right:"_L1 : "margin-left:"_L1, block.before);
+  writeCss(html, "text-indent:"_L1, block.firstLine);
+}
+
+void writeParagraph(QString& html, const Paragraph& paragraph, const TextSetting& setting) {
+  const BlockSetting block = blockSettingOf(*paragraph.attributes, setting);
+  html += "<div"_L1;
+  if (setting.direction == Qt::RightToLeft) html += " dir=\"rtl\""_L1;
+  html += alignmentIn(block);
+  writeBetween(" style=\""_L1, "\""_L1, html, [&] { writeCss(html, paragraph, block, setting); });
+  html += u'>';
+  if (paragraph.pieces.empty()) html += "<br/>"_L1;
+  for (const Piece& piece : paragraph.pieces) writePiece(html, piece, setting);
+  html += "</div>"_L1;
 }
 
 }  // namespace
@@ -233,7 +315,7 @@ void showIn(QTextDocument& document, const AttributedString& text, const TextSet
 QString htmlOf(const AttributedString& text, const TextSetting& setting) {
   QString html;
   for (const Paragraph& paragraph : paragraphsOf(text, setting.dropsLastLineEnd))
-    html += htmlOf(paragraph, setting);
+    writeParagraph(html, paragraph, setting);
   return html;
 }
 
