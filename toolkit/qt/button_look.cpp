@@ -5,7 +5,6 @@
 #include <QAbstractButton>
 #include <QApplication>
 #include <QEvent>
-#include <QPointer>
 #include <QTimer>
 
 #include "toolkit/qt/accessibility.hpp"
@@ -125,16 +124,15 @@ bool ButtonLook::eventFilter(QObject*, QEvent* event) {
 
 // Not at once: this may be called from what must not be gone when it returns.
 void ButtonLook::leaveIfIdle() {
-  const QPointer<ButtonLook> look(this);
-  QTimer::singleShot(0, &button_, [look] {
-    if (look && look->isIdle()) delete look;
+  QTimer::singleShot(0, this, [this] {
+    if (isIdle()) delete this;
   });
 }
 
 /// Changes the button's look and redraws it; a look that changes nothing any more goes.
 template <class Change>
 void changeLook(QAbstractButton& button, const Change& change) {
-  ButtonLook& look = decorated<ButtonLook>(button);
+  auto& look = decorated<ButtonLook>(button);
   change(look);
   if (look.isIdle()) delete &look;
   button.update();

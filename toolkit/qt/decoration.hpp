@@ -7,14 +7,15 @@
 
 #include <QObject>
 #include <QWidget>
+#include <typeinfo>
 
 namespace toolkit::qt {
 
-/// The decoration of class D on `widget`; null when there is none.
+/// The decoration of the very class D on `widget`; null when there is none.
 template <class D>
 D* decorationOn(const QWidget& widget) {
   for (QObject* child : widget.children()) {
-    if (auto* const decoration = dynamic_cast<D*>(child)) return decoration;
+    if (typeid(*child) == typeid(D)) return static_cast<D*>(child);
   }
   return nullptr;
 }

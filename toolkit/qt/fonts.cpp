@@ -9,6 +9,7 @@
 #include <algorithm>
 #include <array>
 #include <cmath>
+#include <map>
 #include <unordered_map>
 #include <vector>
 
@@ -51,7 +52,7 @@ std::vector<FontFamily> familiesOf(const QStringList& desktop) {
 
 /// The family to draw `name` with.
 QString standInFor(std::string_view name) {
-  const QString wanted = qString(name);
+  QString wanted = qString(name);
   if (QFontDatabase::hasFamily(wanted)) return wanted;
   for (const ClassicFamily& classic : classicFamilies) {
     if (classic.name != name) continue;
@@ -77,9 +78,15 @@ class Desktop final : public QObject {
     return *desktop;
   }
 
-  const std::vector<FontFamily>& families() {
+  /// The font of that name, in whatever form, at the default size.
+  std::optional<Font> fontNamed(std::string_view name) {
+    const auto known = named_.find(name);
+    if (known != named_.end()) return known->second;
     if (families_.empty()) families_ = familiesOf(QFontDatabase::families());
-    return families_;
+    auto font = toolkit::fontNamed(name, 0, families_);
+    if (!font) return std::nullopt;
+    if (!font->fixedPitch) font->fixedPitch = family(font->family).fixedPitch;
+    return named_.emplace(name, *std::move(font)).first->second;
   }
   const Family& family(const std::string& name) {
     const auto known = asked_.find(name);
@@ -93,19 +100,20 @@ class Desktop final : public QObject {
     connect(&application, &QGuiApplication::fontDatabaseChanged, this, [this] {
       families_.clear();
       asked_.clear();
+      named_.clear();
     });
   }
 
   std::vector<FontFamily> families_;
   std::unordered_map<std::string, Family> asked_;
+  std::map<std::string, Font, std::less<>> named_;
 };
 
 }  // namespace
 
 std::optional<Font> QtFonts::fontWithName(std::string_view name, double size) const {
-  Desktop& desktop = Desktop::ofApplication();
-  auto font = fontNamed(name, size, desktop.families());
-  if (font && !font->fixedPitch) font->fixedPitch = desktop.family(font->family).fixedPitch;
+  auto font = Desktop::ofApplication().fontNamed(name);
+  if (font && size > 0) font->size = size;
   return font;
 }
 

@@ -9,6 +9,7 @@
 
 #include "toolkit/qt/decoration.hpp"
 #include "toolkit/qt/images.hpp"
+#include "toolkit/qt/label_page.hpp"
 #include "toolkit/qt/strings.hpp"
 
 namespace toolkit::qt {
@@ -43,7 +44,7 @@ class ImageLook final : public QObject {
     image_ = image;
     const QtImage* const known = drawable(image);
     // The label has the pixels too, for its size hint and for whoever asks it.
-    label_.setPixmap(known ? QPixmap::fromImage(known->pixels(1)) : QPixmap());
+    label_.setPixmap(known ? known->pixmap() : QPixmap());
     shownKey_ = label_.pixmap(Qt::ReturnByValue).cacheKey();
     describe(formerName, qString(image->name()));
     label_.update();
@@ -55,7 +56,7 @@ class ImageLook final : public QObject {
   bool eventFilter(QObject*, QEvent* event) override {
     if (event->type() != QEvent::Paint || isStale()) return false;
     QPainter painter(&label_);
-    (label_.*&FrameDrawer::drawFrame)(&painter);
+    drawFrame(label_, painter);
     const int margin = label_.margin();
     const QRect frame = label_.contentsRect().adjusted(margin, margin, -margin, -margin);
     if (!label_.isEnabled()) painter.setOpacity(0.5);
@@ -66,10 +67,6 @@ class ImageLook final : public QObject {
   }
 
  private:
-  struct FrameDrawer : QFrame {
-    using QFrame::drawFrame;
-  };
-
   /// An image says nothing by itself: its name is the label's description, and its name too unless
   /// the host has given it one.
   void describe(const QString& formerName, const QString& name) {
@@ -114,7 +111,7 @@ class Layer final : public QObject {
 
 void showImage(QLabel& label, const Ref<Image>& image) {
   if (!image && !decorationOn<ImageLook>(label)) return label.setPixmap({});
-  ImageLook& look = decorated<ImageLook>(label);
+  auto& look = decorated<ImageLook>(label);
   look.show(image);
   if (!image) delete &look;
 }

@@ -41,6 +41,7 @@ std::string twofoldPath(const std::string& path) {
 QtImage::QtImage(std::string_view name, std::string path)
     : name_(name), path_(std::move(path)), written_(timeOf(path_)), plain_(readImage(path_)) {
   plain_.setDevicePixelRatio(1);
+  pixmap_ = QPixmap::fromImage(plain_);
   twofold_ = readImage(twofoldPath(path_));
   if (!twofold_.isNull()) twofold_.setDevicePixelRatio(2);
 }

@@ -2,6 +2,7 @@
 #pragma once
 
 #include <QImage>
+#include <QPixmap>
 #include <QSizeF>
 #include <filesystem>
 #include <map>
@@ -29,6 +30,8 @@ class QtImage final : public Image {
   QSizeF size() const;
   /// The pixels to show at so many pixels a point.
   const QImage& pixels(double ratio) const;
+  /// Those at one pixel a point, for widgets that have images of their own.
+  const QPixmap& pixmap() const { return pixmap_; }
 
  private:
   std::string name_;
@@ -36,6 +39,7 @@ class QtImage final : public Image {
   std::filesystem::file_time_type written_;  // the file, when it was read
   QImage plain_;
   QImage twofold_;  // null when there is none
+  QPixmap pixmap_;
 };
 
 class QtImages final : public Images {

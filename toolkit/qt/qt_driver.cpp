@@ -118,8 +118,8 @@ void requireApplication() {
   static int argc = 1;
   static char name[] = "qz-walkthrough";
   static char* argv[] = {name, nullptr};
-  static QApplication* const application = new QApplication(argc, argv);
-  application->setQuitOnLastWindowClosed(false);
+  [[maybe_unused]] static const auto* const application = new QApplication(argc, argv);
+  QApplication::setQuitOnLastWindowClosed(false);
   std::setlocale(LC_NUMERIC, "C");  // Qt sets the user's: numbers would be written with commas
 }
 

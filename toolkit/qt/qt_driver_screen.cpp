@@ -17,7 +17,7 @@ namespace {
 
 /// What shows of the window and, when it is a sheet, of what it is attached to.
 QPixmap pictureOf(const QtWindow& window) {
-  const QPixmap own = window.widget()->grab();
+  QPixmap own = window.widget()->grab();
   const auto parent = window.sheetParent();
   if (!parent || !parent->widget()) return own;
 

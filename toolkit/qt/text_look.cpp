@@ -12,6 +12,7 @@
 
 #include "toolkit/qt/accessibility.hpp"
 #include "toolkit/qt/decoration.hpp"
+#include "toolkit/qt/label_page.hpp"
 #include "toolkit/qt/mnemonics.hpp"
 #include "toolkit/qt/rich_text.hpp"
 #include "toolkit/qt/strings.hpp"
@@ -86,17 +87,37 @@ class TextLook final : public QObject {
   bool isStale() const { return rawText(widget_) != raw_; }
 
   bool eventFilter(QObject*, QEvent* event) override {
-    const QEvent::Type type = event->type();
-    if (type != QEvent::EnabledChange && type != QEvent::PaletteChange &&
-        type != QEvent::LayoutDirectionChange)
-      return false;
-    if (isStale()) return false;
-    const QSignalBlocker quiet(documentOf(widget_));  // the text stays the same
-    draw();
-    return false;
+    switch (event->type()) {
+      case QEvent::Paint:
+        return paint();
+      case QEvent::EnabledChange:
+      case QEvent::PaletteChange:
+      case QEvent::LayoutDirectionChange:
+        if (!isStale()) redraw();
+        return false;
+      case QEvent::FontChange:
+      case QEvent::StyleChange:
+        page_.forget();
+        return false;
+      default:
+        return false;
+    }
   }
 
  private:
+  void redraw() {
+    const QSignalBlocker quiet(documentOf(widget_));  // the text stays the same
+    draw();
+  }
+
+  /// Whether it was done here and not left to the widget.
+  bool paint() {
+    auto* const label = qobject_cast<QLabel*>(&widget_);
+    if (!label || isStale() || !LabelPage::canDraw(*label)) return false;
+    page_.draw(*label, text_, setting());
+    return true;
+  }
+
   TextSetting setting() const {
     TextSetting setting{widget_.font(), {}, {}};
     setting.direction = widget_.layoutDirection();
@@ -119,6 +140,7 @@ class TextLook final : public QObject {
   }
 
   void draw() {
+    page_.forget();
     if (auto* const label = qobject_cast<QLabel*>(&widget_)) {
       showRich(*label, htmlOf(text_, setting()));
     } else if (auto* const edit = qobject_cast<QLineEdit*>(&widget_)) {
@@ -134,6 +156,7 @@ class TextLook final : public QObject {
   QWidget& widget_;  // its parent
   AttributedString text_;
   QString raw_;
+  LabelPage page_;  // of a label
 };
 
 }  // namespace

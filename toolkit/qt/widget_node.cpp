@@ -6,6 +6,7 @@
 #include <QEvent>
 #include <QVariant>
 #include <algorithm>
+#include <utility>
 
 #include "toolkit/exception.hpp"
 #include "toolkit/qt/coordinates.hpp"
@@ -54,9 +55,9 @@ class WidgetNode::Watch final : public QObject {
   WidgetNode& node_;  // its owner
 };
 
-WidgetNode::WidgetNode(QWidget& widget, const std::shared_ptr<Desk>& desk, Widget keptBy)
+WidgetNode::WidgetNode(QWidget& widget, std::shared_ptr<Desk> desk, Widget keptBy)
     : widget_(&widget),
-      desk_(desk),
+      desk_(std::move(desk)),
       key_(&widget),
       keptBy_(keptBy),
       hadTag_(widget.property(tagProperty).isValid()),
@@ -121,7 +122,7 @@ const Subviews& WidgetNode::readSubviews() {
   listed_.clear();
   if (widget_) {
     for (QObject* const child : widget_->children())
-      if (isSubview(child)) listed_.push_back(static_cast<QWidget*>(child));
+      if (isSubview(child)) listed_.emplace_back(static_cast<QWidget*>(child));
     for (const auto& child : listed_) fresh.push_back(desk_->viewOf(*child));
   }
   subviews_.swap(fresh);
@@ -140,7 +141,9 @@ void WidgetNode::insert(const Ref<View>& view) {
   if (&added == widget_ || added.isAncestorOf(widget_))
     refuse(receiver, "the view is the superview itself, or lies around it");
 
-  const Ref<View> kept = view;  // the reference may be one of the list that it leaves now
+  // The reference may be one of the list that it leaves now.
+  // NOLINTNEXTLINE(performance-unnecessary-copy-initialization)
+  const Ref<View> kept = view;
   const Rect frame = node->readFrame();
   const bool hidden = node->isHidden();
   added.setParent(widget_);
@@ -149,7 +152,7 @@ void WidgetNode::insert(const Ref<View>& view) {
   added.setVisible(!hidden);
   // At the end, where it belongs, so that it is owned; whatever else has changed is seen later.
   subviews_.push_back(kept);
-  listed_.push_back(&added);
+  listed_.emplace_back(&added);
   changed();
 }
 

@@ -30,7 +30,7 @@ enum class Widget { host, view };
 
 class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
  public:
-  WidgetNode(QWidget& widget, const std::shared_ptr<Desk>& desk, Widget keptBy);
+  WidgetNode(QWidget& widget, std::shared_ptr<Desk> desk, Widget keptBy);
   virtual ~WidgetNode();
   WidgetNode(const WidgetNode&) = delete;
   WidgetNode& operator=(const WidgetNode&) = delete;

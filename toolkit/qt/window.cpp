@@ -81,14 +81,14 @@ class QtWindow::Watch final : public QObject {
   bool painted_ = false;
 };
 
-QtWindow::QtWindow(QWidget& widget, const std::shared_ptr<Desk>& desk, KeptBy keptBy)
-    : widget_(&widget), desk_(desk), key_(&widget), keptBy_(keptBy) {
+QtWindow::QtWindow(QWidget& widget, std::shared_ptr<Desk> desk, KeptBy keptBy)
+    : widget_(&widget), desk_(std::move(desk)), key_(&widget), keptBy_(keptBy) {
   watch_ = std::make_unique<Watch>(*this);
 }
 
 std::shared_ptr<QtWindow> QtWindow::make(QWidget& widget, const std::shared_ptr<Desk>& desk,
                                          KeptBy keptBy) {
-  const std::shared_ptr<QtWindow> window(new QtWindow(widget, desk, keptBy));
+  std::shared_ptr<QtWindow> window(new QtWindow(widget, desk, keptBy));
   desk->enter(widget, window);
   return window;
 }
@@ -118,9 +118,10 @@ std::shared_ptr<QtWindow> QtWindow::of(const Ref<Window>& window) {
 
 Ref<View> QtWindow::contentView() const {
   QWidget* const content = widget_ ? contentOf(*widget_) : nullptr;
-  if (!content) return content_ = nullptr;
-  const auto known = WidgetNode::of(content_);
-  if (!known || known->widget() != content) content_ = desk_->viewOf(*content);
+  if (!content || contentWidget_ != content) {
+    content_ = content ? desk_->viewOf(*content) : nullptr;
+    contentWidget_ = content;
+  }
   return content_;
 }
 

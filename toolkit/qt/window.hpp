@@ -77,7 +77,7 @@ class QtWindow final : public Window, public std::enable_shared_from_this<QtWind
     void* contextInfo;
   };
 
-  QtWindow(QWidget& widget, const std::shared_ptr<Desk>& desk, KeptBy keptBy);
+  QtWindow(QWidget& widget, std::shared_ptr<Desk> desk, KeptBy keptBy);
 
   void show();
   void detach();
@@ -88,7 +88,8 @@ class QtWindow final : public Window, public std::enable_shared_from_this<QtWind
   const QWidget* const key_;  // in the desk's table
   KeptBy keptBy_;
   std::unique_ptr<Watch> watch_;
-  mutable Ref<View> content_;          // owned, so that the views last as long as the window
+  mutable Ref<View> content_;  // owned, so that the views last as long as the window
+  mutable QPointer<QWidget> contentWidget_;
   std::weak_ptr<Responder> delegate_;  // its own maker's
   std::optional<Rect> asked_;          // the content rectangle that it was made with
   std::optional<QRect> settled_;       // what the desktop made of it at the first showing

@@ -27,29 +27,49 @@ constexpr Names<static_cast<std::size_t>(Attribute::unknown)> attributeNames = {
     "align", "bgcolor", "color", "face", "href",  "link", "size",
     "start", "style",   "text",  "type", "value", "vlink"};
 
-static_assert(std::is_sorted(tagNames.begin(), tagNames.end()));
-static_assert(std::is_sorted(attributeNames.begin(), attributeNames.end()));
-
 constexpr std::size_t longestName = 10;
 
-/// Where `name`, in whatever case, stands in `names`; at their end, where it does not.
+/// A name as one number, whatever its case, so that names compare at once and in their order. 0 of
+/// what is no name: one that is too long, or has other characters than letters and digits.
+constexpr std::uint64_t packed(std::string_view name) {
+  if (name.size() > longestName) return 0;
+  std::uint64_t number = 0;
+  for (const char c : name) {
+    if (!isLetter(c) && !isDigit(c)) return 0;
+    number = number << 6 | static_cast<unsigned>(isDigit(c) ? c - '0' + 1 : lowered(c) - 'a' + 11);
+  }
+  return number << 6 * (longestName - name.size());
+}
+
 template <std::size_t N>
-std::size_t indexOf(const Names<N>& names, std::string_view name) {
-  if (name.size() > longestName) return N;
-  std::array<char, longestName> letters{};
-  std::transform(name.begin(), name.end(), letters.begin(), [](char c) { return lowered(c); });
-  const std::string_view key(letters.data(), name.size());
-  const auto found = std::lower_bound(names.begin(), names.end(), key);
-  return found != names.end() && *found == key ? static_cast<std::size_t>(found - names.begin())
-                                               : N;
+constexpr std::array<std::uint64_t, N> packed(const Names<N>& names) {
+  std::array<std::uint64_t, N> numbers{};
+  for (std::size_t i = 0; i < N; ++i) numbers[i] = packed(names[i]);
+  return numbers;
+}
+
+constexpr auto tagNumbers = packed(tagNames);
+constexpr auto attributeNumbers = packed(attributeNames);
+static_assert(std::is_sorted(tagNumbers.begin(), tagNumbers.end()) && tagNumbers.front() != 0);
+static_assert(std::is_sorted(attributeNumbers.begin(), attributeNumbers.end()) &&
+              attributeNumbers.front() != 0);
+
+/// Where `name` stands in `numbers`; at their end, where it does not.
+template <std::size_t N>
+std::size_t indexOf(const std::array<std::uint64_t, N>& numbers, std::string_view name) {
+  const std::uint64_t number = packed(name);
+  const auto found = std::lower_bound(numbers.begin(), numbers.end(), number);
+  return found != numbers.end() && *found == number
+             ? static_cast<std::size_t>(found - numbers.begin())
+             : N;
 }
 
 }  // namespace
 
-Tag tagNamed(std::string_view name) { return static_cast<Tag>(indexOf(tagNames, name)); }
+Tag tagNamed(std::string_view name) { return static_cast<Tag>(indexOf(tagNumbers, name)); }
 
 Attribute attributeNamed(std::string_view name) {
-  return static_cast<Attribute>(indexOf(attributeNames, name));
+  return static_cast<Attribute>(indexOf(attributeNumbers, name));
 }
 
 void Attributes::add(Attribute attribute, std::string_view writtenValue) {

@@ -11,13 +11,22 @@ namespace {
 /// Elements whose content is no markup, and no text to show either.
 constexpr TagSet dropped{Tag::script, Tag::style, Tag::title};
 
-bool endsTagName(char c) { return isSpace(c) || c == '/' || c == '>'; }
-bool isTagName(char c) { return !endsTagName(c); }
-bool isAttributeName(char c) { return !endsTagName(c) && c != '='; }
-bool isUnquotedValue(char c) { return !isSpace(c) && c != '>'; }
-bool isBetweenAttributes(char c) { return isSpace(c) || c == '/'; }
+constexpr bool endsTagName(char c) { return isSpace(c) || c == '/' || c == '>'; }
+constexpr bool isTagName(char c) { return !endsTagName(c); }
+constexpr bool isAttributeName(char c) { return !endsTagName(c) && c != '='; }
+constexpr bool isUnquotedValue(char c) { return !isSpace(c) && c != '>'; }
+constexpr bool isBetweenAttributes(char c) { return isSpace(c) || c == '/'; }
 
 }  // namespace
+
+template <bool (*taken)(char)>
+std::string_view Tokenizer::takeWhile(std::size_t from) {
+  std::size_t end = std::min(from, rest_.size());
+  while (end < rest_.size() && taken(rest_[end])) ++end;
+  const std::string_view part = rest_.substr(0, end);
+  rest_.remove_prefix(end);
+  return part;
+}
 
 bool Tokenizer::next(Token& token) {
   while (!rest_.empty()) {
@@ -58,9 +67,9 @@ bool Tokenizer::readTag(Token& token) {
   const bool end = peek(1) == '/';
   rest_.remove_prefix(end ? 2 : 1);
   token.kind = end ? Token::Kind::endTag : Token::Kind::startTag;
-  token.tag = tagNamed(takeWhile(isTagName));
+  token.tag = tagNamed(takeWhile<isTagName>());
   token.attributes.clear();
-  for (takeWhile(isBetweenAttributes); peek() != '>'; takeWhile(isBetweenAttributes)) {
+  for (takeWhile<isBetweenAttributes>(); peek() != '>'; takeWhile<isBetweenAttributes>()) {
     if (rest_.empty()) return false;
     readAttribute(token.attributes);
   }
@@ -70,12 +79,12 @@ bool Tokenizer::readTag(Token& token) {
 
 void Tokenizer::readAttribute(Attributes& attributes) {
   // A "=" in front is part of the name, as it is in browsers: so every call moves forward.
-  const Attribute name = attributeNamed(takeWhile(isAttributeName, 1));
-  takeWhile(isSpace);
+  const Attribute name = attributeNamed(takeWhile<isAttributeName>(1));
+  takeWhile<isSpace>();
   std::string_view value;
   if (peek() == '=') {
     rest_.remove_prefix(1);
-    takeWhile(isSpace);
+    takeWhile<isSpace>();
     value = takeValue();
   }
   attributes.add(name, value);
@@ -83,7 +92,7 @@ void Tokenizer::readAttribute(Attributes& attributes) {
 
 std::string_view Tokenizer::takeValue() {
   const char quote = peek();
-  if (quote != '"' && quote != '\'') return takeWhile(isUnquotedValue);
+  if (quote != '"' && quote != '\'') return takeWhile<isUnquotedValue>();
   rest_.remove_prefix(1);
   return takeUntil(rest_, quote);
 }
@@ -118,14 +127,6 @@ void Tokenizer::skipContent(Tag element) {
     if (tagNamed(name) == element) return rest_.remove_prefix(at);
   }
   rest_ = {};
-}
-
-std::string_view Tokenizer::takeWhile(bool (*taken)(char), std::size_t from) {
-  std::size_t end = std::min(from, rest_.size());
-  while (end < rest_.size() && taken(rest_[end])) ++end;
-  const std::string_view part = rest_.substr(0, end);
-  rest_.remove_prefix(end);
-  return part;
 }
 
 }  // namespace toolkit::html

@@ -39,7 +39,8 @@ class Tokenizer {
   void skipDeclaration();
   void skipComment();
   void skipContent(Tag element);
-  std::string_view takeWhile(bool (*taken)(char), std::size_t from = 0);
+  template <bool (*taken)(char)>
+  std::string_view takeWhile(std::size_t from = 0);
   std::string_view takeValue();
   char peek(std::size_t offset = 0) const { return offset < rest_.size() ? rest_[offset] : '\0'; }
 

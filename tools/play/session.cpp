@@ -88,7 +88,6 @@ void Session::run(const std::string& heading, const std::string& name,
 }
 
 void Session::begin(const std::string& heading, const std::string& name) {
-  if (begun_) end();
   begun_ = {heading, name};
   transcript_.beginStep(heading);
 }
@@ -111,6 +110,7 @@ void Session::takeScreenshot(const std::string& name) {
 
 void Session::handOver() {
   const auto willAct = [this](const toolkit::Ref<toolkit::View>& view) {
+    watch();  // what went before is a step of its own, such as what a timer has just done
     const long tag = view->tag();
     begin("press " + pressWords(look(), tag), "press-" + std::to_string(tag));
   };

@@ -1,0 +1,95 @@
+// What is done here follows QLabel's own painting step by step, so that nobody sees a difference.
+
+#include "toolkit/qt/label_page.hpp"
+
+#include <QAbstractTextDocumentLayout>
+#include <QPainter>
+#include <QStyle>
+#include <QStyleOption>
+#include <QTextOption>
+#include <algorithm>
+#include <typeinfo>
+
+namespace toolkit::qt {
+
+namespace {
+
+struct FrameDrawer : QFrame {
+  using QFrame::drawFrame;
+};
+
+/// Where in a label its text lies: within the margin, and behind the indent from the edge at which
+/// the text is aligned.
+QRect textAreaOf(const QLabel& label) {
+  const int margin = label.margin();
+  QRect area = label.contentsRect().adjusted(margin, margin, -margin, -margin);
+  int indent = label.indent();
+  if (indent < 0 && label.frameWidth() > 0)
+    indent = label.fontMetrics().horizontalAdvance(u'x') / 2 - margin;
+  if (indent <= 0) return area;
+  const auto edges = QStyle::visualAlignment(Qt::LayoutDirectionAuto, label.alignment());
+  if (edges & Qt::AlignLeft) area.setLeft(area.left() + indent);
+  if (edges & Qt::AlignRight) area.setRight(area.right() - indent);
+  if (edges & Qt::AlignTop) area.setTop(area.top() + indent);
+  if (edges & Qt::AlignBottom) area.setBottom(area.bottom() - indent);
+  return area;
+}
+
+/// How far below the area's top text of that height begins.
+qreal topOf(qreal height, const QRect& area, Qt::Alignment alignment) {
+  const qreal free = std::max(area.height() - height, 0.0);
+  if (alignment & Qt::AlignVCenter) return free / 2;
+  return alignment & Qt::AlignBottom ? free : 0;
+}
+
+QAbstractTextDocumentLayout::PaintContext contextOf(const QLabel& label) {
+  QStyleOption option;
+  option.initFrom(&label);
+  QAbstractTextDocumentLayout::PaintContext context;
+  context.palette = option.palette;
+  const QPalette::ColorRole role = label.foregroundRole();
+  if (role != QPalette::Text && label.isEnabled())
+    context.palette.setColor(QPalette::Text, context.palette.color(role));
+  return context;
+}
+
+}  // namespace
+
+bool LabelPage::canDraw(const QLabel& label) {
+  constexpr Qt::TextInteractionFlags drawn = Qt::LinksAccessibleByMouse;
+  return typeid(label) == typeid(QLabel) && (label.textInteractionFlags() & ~drawn) == 0;
+}
+
+void LabelPage::layOut(const QLabel& label, int width, const AttributedString& text,
+                       const TextSetting& setting) {
+  if (document_ && wraps_ == label.wordWrap()) {
+    if (document_->textWidth() != width) document_->setTextWidth(width);  // it lays out anew
+    return;
+  }
+  wraps_ = label.wordWrap();
+  document_.emplace();
+  document_->setLayoutEnabled(false);
+  document_->setDocumentMargin(0);
+  QTextOption option = document_->defaultTextOption();
+  option.setWrapMode(wraps_ ? QTextOption::WordWrap : QTextOption::ManualWrap);
+  document_->setDefaultTextOption(option);
+  showIn(*document_, text, setting);
+  document_->setLayoutEnabled(true);
+  document_->setTextWidth(width);
+}
+
+void LabelPage::draw(QLabel& label, const AttributedString& text, const TextSetting& setting) {
+  const QRect area = textAreaOf(label);
+  layOut(label, area.width(), text, setting);
+  const qreal top = topOf(document_->size().height(), area, label.alignment());
+  const QRect place = QRectF(area).translated(0, top).toAlignedRect();
+  QPainter painter(&label);
+  drawFrame(label, painter);
+  painter.translate(place.topLeft());
+  painter.setClipRect(QRect(QPoint(), place.size()));
+  document_->documentLayout()->draw(&painter, contextOf(label));
+}
+
+void drawFrame(QLabel& label, QPainter& painter) { (label.*&FrameDrawer::drawFrame)(&painter); }
+
+}  // namespace toolkit::qt

@@ -1,0 +1,37 @@
+// A label's styled text, drawn from a document of its own.
+//
+// By itself a label reads its HTML at every change and lays it out four times, which takes longer
+// than everything else that a command list does.
+#pragma once
+
+#include <QLabel>
+#include <QTextDocument>
+#include <optional>
+
+#include "toolkit/qt/rich_text.hpp"
+
+namespace toolkit::qt {
+
+class LabelPage {
+ public:
+  /// Whether the label's class paints as `QLabel` does, and only text is to be drawn: neither a
+  /// selection nor the focus of a link.
+  static bool canDraw(const QLabel& label);
+
+  /// Has the next `draw` set the text anew.
+  void forget() { document_.reset(); }
+  /// Draws what `label` itself would draw of the same text in HTML, in a paint event of it.
+  void draw(QLabel& label, const AttributedString& text, const TextSetting& setting);
+
+ private:
+  void layOut(const QLabel& label, int width, const AttributedString& text,
+              const TextSetting& setting);
+
+  std::optional<QTextDocument> document_;
+  bool wraps_ = false;  // as the label did when the document was laid out
+};
+
+/// Draws the frame around a label, in a paint event of it.
+void drawFrame(QLabel& label, QPainter& painter);
+
+}  // namespace toolkit::qt
