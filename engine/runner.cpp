@@ -7,7 +7,7 @@
 bool QZ_Plist_State_Parser::processCommandArray(const Value& list, const ObjectId& forObject) {
   // What runs may make the host let go of us, and of the list.
   const auto self = shared_from_this();
-  const Value kept = list;
+  const Value kept = list;  // NOLINT(performance-unnecessary-copy-initialization)
   const Parameters parameters = toolkit::Array::make();
   lastTagId_.set(forObject);
   // Outside of the guard: of a value that has no elements the caller hears.

@@ -7,6 +7,7 @@
 
 #include "examples/qt-host/guided_form.hpp"
 #include "support.hpp"
+#include "toolkit/qt/button_look.hpp"
 
 namespace {
 
@@ -50,12 +51,14 @@ TEST_F(HostExample, isGuidedOverItsOwnWindowAndGoesOnAfterwards) {
 
     click(form->next);
     EXPECT_EQ(form->express.toolTip(), "Two days instead of five");
+    EXPECT_TRUE(QTest::qWaitFor([&] { return toolkit::qt::isHighlighted(form->express); }));
     click(form->next);
     EXPECT_TRUE(form->order.isEnabled());
     EXPECT_EQ(form->next.text(), "Done");
     click(form->next);
     EXPECT_TRUE(form->isVisible());
     EXPECT_FALSE(form->guide.isVisible());
+    EXPECT_FALSE(toolkit::qt::isHighlighted(form->express));
     EXPECT_EQ(form->next.property("qzTag"), 20);
     expectHostWorks();
   }

@@ -67,7 +67,7 @@ TEST(PlayInWindows, takesAPictureOfEveryStep) {
   options.script = scripts.write("script.plist", script);
   options.toolkit = "qt";
   options.screenshots = (scripts.path / "made").string();
-  options.steps = {Press{2}, Advance{1.25}, Press{3}};
+  options.steps = {Press{2}, Advance{1.25}, Press{2}, Advance{1}, Press{3}};
   fs::create_directories(*options.screenshots);
   std::ofstream(fs::path(*options.screenshots) / "07-press-9.png") << "old";
   std::ofstream(fs::path(*options.screenshots) / "mine.png") << "kept";
@@ -79,8 +79,8 @@ TEST(PlayInWindows, takesAPictureOfEveryStep) {
 
   const fs::path made = *options.screenshots;
   EXPECT_EQ(namesIn(made),
-            "00-start.png\n01-press-2.png\n02-list-5.png\n03-advance-1.25.png\nmine.png\n"
-            "transcript.txt\n");
+            "00-start.png\n01-press-2.png\n02-list-5.png\n03-advance-1.25.png\n04-press-2.png\n"
+            "05-list-5.png\nmine.png\ntranscript.txt\n");
   EXPECT_EQ(contents(made / "transcript.txt"), out.str());
   const QImage start(QString::fromStdString((made / "00-start.png").string()));
   EXPECT_EQ(start.width(), 640 * start.devicePixelRatio());

@@ -72,6 +72,7 @@ void Session::pass(double seconds) {
     const TimerPicture* const fired = firedBetween(before, after);
     if (!fired) break;
     takeScreenshot("list-" + fired->key);
+    if (seconds <= 0) begun_->name.clear();  // nothing has changed since that picture
   }
   driver_.advance(seconds);
 }
@@ -105,7 +106,7 @@ void Session::end() {
 }
 
 void Session::takeScreenshot(const std::string& name) {
-  if (screenshots_) screenshots_->take(stage_.engine().tutorialWindow(), name);
+  if (screenshots_ && !name.empty()) screenshots_->take(stage_.engine().tutorialWindow(), name);
 }
 
 void Session::handOver() {

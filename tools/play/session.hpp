@@ -61,7 +61,7 @@ class Session {
   Screenshots* screenshots_;
   struct Begun {
     std::string heading;
-    std::string name;  // for its picture
+    std::string name;  // for its picture; empty where it needs none
   };
   std::optional<Begun> begun_;  // the step that is not over yet
   std::vector<std::string> problems_;
