@@ -95,6 +95,18 @@ TEST_F(ScriptLoading, AKeyThatIsANumberCountsForTheSmallestButIsNoKeyOfAList) {
   EXPECT_EQ(engine->plistDictionary()->count(), 1U);
 }
 
+TEST_F(ScriptLoading, ANumberBeyond32BitsCountsForTheSmallestByItsLowBits) {
+  using Entry = toolkit::Dictionary::Entry;
+  const auto list = toolkit::Array::make({toolkit::String::make("IDLE_LOOP")});
+  const Entry two{toolkit::Number::withLong(4'294'967'298), list};
+  const Entry three{toolkit::String::make("3"), list};
+  for (const auto& entries : {std::vector{two, three}, std::vector{three, two}}) {
+    engine->setPlistDictionary(toolkit::Dictionary::make(entries));
+    EXPECT_FALSE(load("missing", ""));
+    EXPECT_EQ(engine->currentCommandState(), "2");
+  }
+}
+
 TEST_F(ScriptLoading, AKeyWithoutANumberRaisesWhenTheSmallestIsSought) {
   write("intro.plist", binaryScript(std::string("\x41\x05")));  // one byte of data
   EXPECT_TRUE(load("intro.plist", std::nullopt));
