@@ -36,28 +36,18 @@ void View::setAttributedTitle(const AttributedString&) {
 
 namespace {
 
-// `kind` is `view` itself seen as a T, or null; the reference takes over the view's.
+// The reference takes over the view's.
 template <class T>
-Ref<T> sharing(Ref<View>&& view, T* kind) {
-  if (!kind) return {};
-  return std::shared_ptr<T>(std::move(view).pointer(), kind);
+Ref<T> seenAs(T* (View::*kind)(), Ref<View>&& view) {
+  T* const seen = ((*view).*kind)();
+  if (!seen) return {};
+  return std::shared_ptr<T>(std::move(view).pointer(), seen);
 }
 
 }  // namespace
 
-Ref<Button> asButton(Ref<View> view) {
-  auto* const button = view->asButton();
-  return sharing(std::move(view), button);
-}
-
-Ref<TextField> asTextField(Ref<View> view) {
-  auto* const field = view->asTextField();
-  return sharing(std::move(view), field);
-}
-
-Ref<ImageView> asImageView(Ref<View> view) {
-  auto* const imageView = view->asImageView();
-  return sharing(std::move(view), imageView);
-}
+Ref<Button> asButton(Ref<View> view) { return seenAs(&View::asButton, std::move(view)); }
+Ref<TextField> asTextField(Ref<View> view) { return seenAs(&View::asTextField, std::move(view)); }
+Ref<ImageView> asImageView(Ref<View> view) { return seenAs(&View::asImageView, std::move(view)); }
 
 }  // namespace toolkit

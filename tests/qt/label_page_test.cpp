@@ -41,6 +41,8 @@ const Case cases[] = {
     {"wrapped afterwards", [](QLabel&) {}, [](QLabel& label) { label.setWordWrap(true); }},
     {"at the top", [](QLabel& label) { label.setAlignment(Qt::AlignTop | Qt::AlignLeading); }},
     {"below", [](QLabel& label) { label.setAlignment(Qt::AlignBottom | Qt::AlignRight); }},
+    {"on the right afterwards", [](QLabel&) {},
+     [](QLabel& label) { label.setAlignment(Qt::AlignTop | Qt::AlignRight); }},
     {"in the middle", [](QLabel& label) { label.setAlignment(Qt::AlignCenter); }},
     {"framed", [](QLabel& label) { label.setFrameStyle(QFrame::Box | QFrame::Sunken); }},
     {"indented", [](QLabel& label) { label.setIndent(25); }},

@@ -62,11 +62,12 @@ bool LabelPage::canDraw(const QLabel& label) {
 
 void LabelPage::layOut(const QLabel& label, int width, const AttributedString& text,
                        const TextSetting& setting) {
-  if (document_ && wraps_ == label.wordWrap()) {
+  if (document_ && wraps_ == label.wordWrap() && alignment_ == label.alignment()) {
     if (document_->textWidth() != width) document_->setTextWidth(width);  // it lays out anew
     return;
   }
   wraps_ = label.wordWrap();
+  alignment_ = label.alignment();
   document_.emplace();
   document_->setLayoutEnabled(false);
   document_->setDocumentMargin(0);

@@ -28,7 +28,9 @@ class LabelPage {
               const TextSetting& setting);
 
   std::optional<QTextDocument> document_;
-  bool wraps_ = false;  // as the label did when the document was laid out
+  // The label's, when the document was laid out.
+  bool wraps_ = false;
+  Qt::Alignment alignment_;
 };
 
 /// Draws the frame around a label, in a paint event of it.
