@@ -4,15 +4,15 @@
 #include <cstdlib>
 #include <filesystem>
 #include <fstream>
-#include <iostream>
 #include <regex>
 #include <sstream>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "play_files.hpp"
+#include "tool_run.hpp"
 #include "tools/drivers.hpp"
-#include "tools/shell.hpp"
 #include "tools/suggestions.hpp"
 #include "tools/test_command.hpp"
 
@@ -23,12 +23,6 @@ namespace fs = std::filesystem;
 
 const std::string data = QZ_TEST_DATA "/scenarios/";
 
-struct Result {
-  int status;
-  std::string out;
-  std::string err;
-};
-
 std::string withoutFolder(std::string text) {
   for (auto at = text.find(data); at != std::string::npos; at = text.find(data)) {
     text.erase(at, data.size());
@@ -38,14 +32,9 @@ std::string withoutFolder(std::string text) {
 
 /// Runs the tool; the folder of the test's files is left out of what it printed.
 Result run(const std::vector<std::string>& arguments) {
-  std::ostringstream out;
-  std::ostringstream err;
-  auto* const outBefore = std::cout.rdbuf(out.rdbuf());
-  auto* const errBefore = std::cerr.rdbuf(err.rdbuf());
-  const int status = runTool(arguments, {addTestCommand});
-  std::cout.rdbuf(outBefore);
-  std::cerr.rdbuf(errBefore);
-  return {status, withoutFolder(out.str()), withoutFolder(err.str())};
+  Result result = tools::run(addTestCommand, arguments);
+  return {result.status, withoutFolder(std::move(result.out)),
+          withoutFolder(std::move(result.err))};
 }
 
 /// Tests in a working directory of their own.
