@@ -5,6 +5,8 @@
 #include <gtest/gtest.h>
 
 #include <QLabel>
+#include <QSignalSpy>
+#include <QTest>
 #include <functional>
 
 #include "tests/qt/rendering.hpp"
@@ -126,6 +128,28 @@ TEST(LabelPage, LeavesLabelsToThemselvesThatShowASelection) {
     label.setTextInteractionFlags(flags | Qt::LinksAccessibleByMouse);
     EXPECT_FALSE(LabelPage::canDraw(label));
   }
+}
+
+// The label itself finds the link, in a layout of its own.
+TEST(LabelPage, LeavesLinksToTheHostWhereTheyAreDrawn) {
+  QLabel label;
+  label.resize(300, 60);
+  AttributedString text("Something before the ", {.font = Font{"Helvetica", 18}});
+  text.append("link",
+              {.font = Font{"Helvetica", 18}, .foregroundColor = colors::red, .link = "x:y"});
+  showText(label, text);
+  const QRect link = boundsOf(pictureOf(label), isReddish);
+  ASSERT_GT(link.left(), 100);
+  label.show();
+  const QSignalSpy activated(&label, &QLabel::linkActivated);
+  QTest::mouseClick(&label, Qt::LeftButton, {}, {link.left() / 2, link.center().y()});
+  EXPECT_EQ(activated.count(), 0);
+  for (const QPoint& at : {link.topLeft() + QPoint(1, 1), link.center(), link.bottomRight()}) {
+    QTest::mouseClick(&label, Qt::LeftButton, {}, at);
+  }
+  ASSERT_EQ(activated.count(), 3);
+  EXPECT_EQ(activated[0][0], "x:y");
+  EXPECT_FALSE(label.openExternalLinks());
 }
 
 TEST(LabelPage, ShowsWhatTheHostShowsInstead) {
