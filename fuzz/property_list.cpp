@@ -24,6 +24,15 @@ constexpr std::size_t mostVisits = 100'000;
 /// Whether a 32-bit real is in it, which XML cannot tell from one of 64 bits.
 bool hasShortReal(const std::string& dump) { return dump.find("\"w\":32}") != std::string::npos; }
 
+/// The dump of what XML tells apart: 0 and -0 seconds are one moment, and one text there.
+std::string inXml(std::string dump) {
+  const std::string minusZero = R"({"date":"-0"})";
+  for (auto at = dump.find(minusZero); at != std::string::npos; at = dump.find(minusZero, at)) {
+    dump.replace(at, minusZero.size(), R"({"date":"0"})");
+  }
+  return dump;
+}
+
 /// Writes the value, reads it back, and requires an equal one; a refusal to write needs a reason.
 template <class Write>
 void checkRoundTrip(const toolkit::ValueRef<>& value, const std::string& dump, Write write) {
@@ -57,7 +66,7 @@ void checkReading(std::string_view bytes) {
   const std::string dump = toolkit::canonicalDump(*result.value);
   require(toolkit::canonicalDump(*plain.value) == dump, "positions change no value");
   checkRoundTrip(result.value, dump, toolkit::writeBinaryPropertyList);
-  if (!hasShortReal(dump)) checkRoundTrip(result.value, dump, toolkit::writeXmlPropertyList);
+  if (!hasShortReal(dump)) checkRoundTrip(result.value, inXml(dump), toolkit::writeXmlPropertyList);
   static_cast<void>(result.value->description());
 }
 

@@ -98,6 +98,10 @@ TEST(XmlWriter, WidensReals) {
             "{\"real\":\"0.10000000149011612\",\"w\":64}");
 }
 
+TEST(XmlWriter, WritesMinusZeroSecondsAsTheSameMoment) {
+  EXPECT_EQ(dumpOf(writeXmlPropertyList(Date::make(-0.0))), canonicalDump(*Date::make(0)));
+}
+
 TEST(XmlWriter, RefusesWhatXmlCannotCarry) {
   const struct {
     ValueRef<> value;

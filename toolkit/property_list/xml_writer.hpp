@@ -8,7 +8,8 @@
 namespace toolkit {
 
 /// The value as a whole XML file, in UTF-8, indented with tabs, that reads back as an equal value:
-/// keys keep their order, a real of 32 bits becomes the same number with 64.
+/// keys keep their order, a real of 32 bits becomes the same number with 64, and a date -0 seconds
+/// from the reference date the same moment at 0.
 ///
 /// Raises an invalid-argument exception, which says what and under which key or at which index, for
 /// what no XML property list can carry: an absent value, null, a set, a key that is no string, half
