@@ -75,10 +75,21 @@ const Case cases[] = {
     {"selectable", [](QLabel& label) { label.setTextInteractionFlags(Qt::TextSelectableByMouse); }},
 };
 
+/// Sees the paint events that nobody has taken over since it was made.
+struct Painted : QObject {
+  explicit Painted(QObject& watched) { watched.installEventFilter(this); }
+  bool eventFilter(QObject*, QEvent* event) override {
+    if (event->type() == QEvent::Paint) ++count;
+    return false;
+  }
+  int count = 0;
+};
+
 class DrawnLabels : public testing::TestWithParam<Case> {};
 
 TEST_P(DrawnLabels, LookAsTheyWouldByThemselves) {
   QLabel drawn;
+  const Painted byLabel(drawn);
   drawn.resize(320, 160);
   GetParam().before(drawn);
   showText(drawn, styledText());
@@ -96,6 +107,7 @@ TEST_P(DrawnLabels, LookAsTheyWouldByThemselves) {
     EXPECT_EQ(picture, pictureOf(plain, ratio)) << "at " << ratio << " pixels a point";
     EXPECT_GT(countPixels(picture, [](const QColor& c) { return c != Qt::white; }), 500);
   }
+  EXPECT_EQ(byLabel.count == 0, LabelPage::canDraw(drawn));
 }
 
 INSTANTIATE_TEST_SUITE_P(Qt, DrawnLabels, testing::ValuesIn(cases), [](const auto& test) {
