@@ -60,28 +60,27 @@ bool LabelPage::canDraw(const QLabel& label) {
   return typeid(label) == typeid(QLabel) && (label.textInteractionFlags() & ~drawn) == 0;
 }
 
-void LabelPage::layOut(const QLabel& label, int width, const AttributedString& text,
-                       const TextSetting& setting) {
-  if (document_ && wraps_ == label.wordWrap() && alignment_ == label.alignment()) {
-    if (document_->textWidth() != width) document_->setTextWidth(width);  // it lays out anew
-    return;
-  }
+bool LabelPage::isFor(const QLabel& label) const {
+  return document_ && wraps_ == label.wordWrap() && alignment_ == label.alignment();
+}
+
+void LabelPage::set(const QLabel& label, const AttributedString& text, const TextSetting& setting) {
   wraps_ = label.wordWrap();
   alignment_ = label.alignment();
   document_.emplace();
-  document_->setLayoutEnabled(false);
+  document_->setLayoutEnabled(false);  // until the width is known
   document_->setDocumentMargin(0);
   QTextOption option = document_->defaultTextOption();
   option.setWrapMode(wraps_ ? QTextOption::WordWrap : QTextOption::ManualWrap);
   document_->setDefaultTextOption(option);
   showIn(*document_, text, setting);
-  document_->setLayoutEnabled(true);
-  document_->setTextWidth(width);
 }
 
-void LabelPage::draw(QLabel& label, const AttributedString& text, const TextSetting& setting) {
+void LabelPage::draw(QLabel& label) {
   const QRect area = textAreaOf(label);
-  layOut(label, area.width(), text, setting);
+  document_->setLayoutEnabled(true);
+  // Even the same width would lay it out anew.
+  if (document_->textWidth() != area.width()) document_->setTextWidth(area.width());
   const qreal top = topOf(document_->size().height(), area, label.alignment());
   const QRect place = QRectF(area).translated(0, top).toAlignedRect();
   QPainter painter(&label);

@@ -18,17 +18,16 @@ class LabelPage {
   /// selection nor the focus of a link.
   static bool canDraw(const QLabel& label);
 
-  /// Has the next `draw` set the text anew.
   void forget() { document_.reset(); }
-  /// Draws what `label` itself would draw of the same text in HTML, in a paint event of it.
-  void draw(QLabel& label, const AttributedString& text, const TextSetting& setting);
+  /// Whether a text is set, for the label as it stands.
+  bool isFor(const QLabel& label) const;
+  void set(const QLabel& label, const AttributedString& text, const TextSetting& setting);
+  /// Draws what `label` itself would draw of the text that is set, in HTML; in its paint event.
+  void draw(QLabel& label);
 
  private:
-  void layOut(const QLabel& label, int width, const AttributedString& text,
-              const TextSetting& setting);
-
   std::optional<QTextDocument> document_;
-  // The label's, when the document was laid out.
+  // The label's, when the text was set.
   bool wraps_ = false;
   Qt::Alignment alignment_;
 };

@@ -114,7 +114,8 @@ class TextLook final : public QObject {
   bool paint() {
     auto* const label = qobject_cast<QLabel*>(&widget_);
     if (!label || isStale() || !LabelPage::canDraw(*label)) return false;
-    page_.draw(*label, text_, setting());
+    if (!page_.isFor(*label)) page_.set(*label, text_, setting());
+    page_.draw(*label);
     return true;
   }
 

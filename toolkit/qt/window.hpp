@@ -88,11 +88,11 @@ class QtWindow final : public Window, public std::enable_shared_from_this<QtWind
   const QWidget* const key_;  // in the desk's table
   KeptBy keptBy_;
   std::unique_ptr<Watch> watch_;
-  mutable Ref<View> content_;  // owned, so that the views last as long as the window
-  mutable QPointer<QWidget> contentWidget_;
-  std::weak_ptr<Responder> delegate_;  // its own maker's
-  std::optional<Rect> asked_;          // the content rectangle that it was made with
-  std::optional<QRect> settled_;       // what the desktop made of it at the first showing
+  mutable Ref<View> content_;                // owned, so that the views last as long as the window
+  mutable QPointer<QWidget> contentWidget_;  // whose view that is
+  std::weak_ptr<Responder> delegate_;        // its own maker's
+  std::optional<Rect> asked_;                // the content rectangle that it was made with
+  std::optional<QRect> settled_;             // what the desktop made of it at the first showing
   int closes_ = 0;
   std::weak_ptr<QtWindow> sheetParent_;  // its own keeper's
   std::unique_ptr<SheetPlace> place_;    // while it is attached
