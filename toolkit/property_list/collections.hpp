@@ -49,7 +49,7 @@ class Array final : public Collection {
   /// Changes raise where `Mutability` says so; adding an absent value raises.
   void addObject(const ValueRef<>& value);
   void removeAllObjects();
-  /// Has the elements given instead of its own.
+  /// Has the elements given instead of its own (`setArray:`).
   void setElements(std::span<const ValueRef<>> elements);
   /// The same without a count of them, nor a copy: the caller sees to it that they stay where they
   /// are until the array has others, or ends.

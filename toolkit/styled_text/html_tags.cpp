@@ -29,8 +29,9 @@ constexpr Names<static_cast<std::size_t>(Attribute::unknown)> attributeNames = {
 
 constexpr std::size_t longestName = 10;
 
-/// A name as one number, whatever its case, so that names compare at once and in their order. 0 of
-/// what is no name: one that is too long, or has other characters than letters and digits.
+/// A name as one number, six bits a character, whatever its case, so that names compare at once and
+/// in their order. 0 of what is no name: one that is too long, or has other characters than letters
+/// and digits.
 constexpr std::uint64_t packed(std::string_view name) {
   if (name.size() > longestName) return 0;
   std::uint64_t number = 0;
