@@ -11,6 +11,7 @@
 #include <QTimer>
 #include <filesystem>
 #include <fstream>
+#include <initializer_list>
 #include <set>
 #include <sstream>
 #include <string>
@@ -107,6 +108,14 @@ class PlayedByAPerson : public testing::Test {
     return made;
   }
 
+  void expectInOrder(std::initializer_list<const char*> headings) const {
+    std::size_t at = 0;
+    for (const char* const heading : headings) {
+      at = out.str().find(heading, at);
+      EXPECT_NE(at, std::string::npos) << heading << "\n" << out.str();
+    }
+  }
+
   const Directory directory;
   const PlayOptions options = optionsOfScript();
   const InputFile file{options.script, "a script"};
@@ -129,12 +138,26 @@ TEST_F(PlayedByAPerson, writesDownWhatAPersonDoes) {
 
   EXPECT_TRUE(session.picture().ended);
   EXPECT_TRUE(session.problems().empty());
-  std::size_t at = 0;
-  for (const char* heading :
-       {"1. start", "2. press 2 (2)", "3. list 5 runs by its timer", "4. press 3 (End)"}) {
-    at = out.str().find(heading, at);
-    EXPECT_NE(at, std::string::npos) << heading << "\n" << out.str();
+  expectInOrder({"1. start", "2. press 2 (2)", "3. list 5 runs by its timer", "4. press 3 (End)"});
+}
+
+/// Presses the button that it watches in the very moment in which it shows.
+struct Eager : QObject {
+  bool eventFilter(QObject* button, QEvent* event) override {
+    if (event->type() == QEvent::Show) static_cast<QPushButton*>(button)->click();
+    return false;
   }
+};
+
+TEST_F(PlayedByAPerson, isNotTakenForTheTimerThatFiredRightBefore) {
+  Eager eager;
+  for (QWidget* const widget : QApplication::allWidgets()) {
+    auto* const button = qobject_cast<QPushButton*>(widget);
+    if (button && button->text() == "3") button->installEventFilter(&eager);
+  }
+  QTimer::singleShot(20, [] { buttonTitled("2")->click(); });
+  session.handOver();
+  expectInOrder({"1. start", "2. press 2 (2)", "3. list 5 runs by its timer", "4. press 3 (3)"});
 }
 
 TEST_F(PlayedByAPerson, endsWhenThePersonClosesTheWindow) {
