@@ -1,7 +1,9 @@
 // The compound commands: one row each, which says how the parameters convert and what runs.
 
 #include <functional>
+#include <iterator>
 #include <tuple>
+#include <utility>
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/text_of.hpp"
@@ -131,7 +133,7 @@ struct Command {
 #define PROCESSOR(name) &Engine::QZ_Plist_State_Processor_##name
 
 // In the order of recognition: where a host gave two commands one name, the first row has it.
-const Command commands[] = {
+constexpr Command commands[] = {
     {NAME(SET_TOOL_TIP_FOR_ID),                  run<PROCESSOR(SET_TOOL_TIP), allParameters, objectId>},
     {NAME(LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID), run<PROCESSOR(LOAD_GRAPHIC_OBJECT_WITH_PATH), allParameters, objectId>},
     {NAME(DISABLE_OBJECT_WITH_ID),               disable},
@@ -168,10 +170,13 @@ const Command commands[] = {
 bool QZ_Plist_State_Parser::doCompoundCommand(std::string_view name,
                                               const Parameters& withParameters,
                                               const ObjectId& usingObject) {
-  for (const Command& command : commands) {
-    if (name == command.name) {
-      return command.run({*this, withParameters, usingObject, toolkit_});
-    }
-  }
-  return false;
+  const Call call{*this, withParameters, usingObject, toolkit_};
+  // A loop over the rows, which the compiler writes out: this is done for every command.
+  const auto runFirstNamed = [&]<std::size_t... row>(std::index_sequence<row...>) {
+    bool result = false;
+    static_cast<void>(
+        ((name == commands[row].name && (result = commands[row].run(call), true)) || ...));
+    return result;
+  };
+  return runFirstNamed(std::make_index_sequence<std::size(commands)>());
 }

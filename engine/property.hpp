@@ -8,26 +8,28 @@
 #include <mutex>
 #include <utility>
 
+#include "engine/spin_lock.hpp"
+
 template <class T>
 class Property {
  public:
   /// The value; from any thread.
   T get() const {
-    const std::lock_guard lock(mutex_);
+    const std::lock_guard guard(lock_);
     return value_;
   }
 
   /// The answer of the value, which is not copied, to a question of its own; from any thread.
   template <class Answer>
   Answer ask(Answer (T::*question)() const) const {
-    const std::lock_guard lock(mutex_);
+    const std::lock_guard guard(lock_);
     return (value_.*question)();
   }
 
   /// Replaces the value; from any thread. The old one is let go outside of the lock, for its end
   /// may run code that comes back here.
   void set(T value) {
-    const std::lock_guard lock(mutex_);
+    const std::lock_guard guard(lock_);
     std::swap(value_, value);
   }
 
@@ -37,6 +39,6 @@ class Property {
   T operator->() const { return get(); }
 
  private:
-  mutable std::mutex mutex_;
+  mutable SpinLock lock_;
   T value_{};
 };

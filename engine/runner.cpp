@@ -4,6 +4,30 @@
 #include "engine/text_of.hpp"
 #include "toolkit/uppercase.hpp"
 
+namespace {
+
+using Engine = QZ_Plist_State_Parser;
+
+// An array is a compound command, whose name is matched in upper case; anything else is taken for a
+// simple one, whose name is matched as written. What is not fixed may change while it runs: it is
+// kept, or copied.
+bool runElement(Engine& engine, const Engine::Value& element, bool isFixed,
+                const Engine::Parameters& parameters, const Engine::ObjectId& id) {
+  if (element->kind() != toolkit::Value::Kind::array) {
+    parameters->removeAllObjects();
+    return engine.doSimpleCommand(textOf(Engine::Value(element)), parameters, id);
+  }
+  // Not by asArray, which counts the reference in and out again: this runs for every command.
+  const auto& compound = static_cast<const toolkit::Array&>(*element);
+  std::string raised;
+  const auto name = toolkit::uppercased(textOf(compound.objectAtIndex(0)), raised);
+  const auto given = compound.elements().subspan(1);
+  isFixed ? parameters->borrowElements(given) : parameters->setElements(given);
+  return engine.doCompoundCommand(name, parameters, id);
+}
+
+}  // namespace
+
 bool QZ_Plist_State_Parser::processCommandArray(const Value& list, const ObjectId& forObject) {
   // What runs may make the host let go of us, and of the list.
   const auto self = shared_from_this();
@@ -16,28 +40,10 @@ bool QZ_Plist_State_Parser::processCommandArray(const Value& list, const ObjectI
   for (std::int32_t i = 0; i < count; ++i) {
     try {
       const Value& element = kept->objectAtIndex(static_cast<std::size_t>(i));
-      result = runElement(element, kept->isFixed(), parameters, forObject);
+      result = runElement(*this, element, kept->isFixed(), parameters, forObject);
     } catch (const toolkit::Exception& exception) {
       toolkit_.log().write("Exception in processCommandArray: " + exception.reason());
     }
   }
   return result;
-}
-
-// An array is a compound command, whose name is matched in upper case; anything else is taken for a
-// simple one, whose name is matched as written. What is not fixed may change while it runs: it is
-// kept, or copied.
-bool QZ_Plist_State_Parser::runElement(const Value& element, bool isFixed,
-                                       const Parameters& parameters, const ObjectId& id) {
-  if (element->kind() != toolkit::Value::Kind::array) {
-    parameters->removeAllObjects();
-    return doSimpleCommand(textOf(Value(element)), parameters, id);
-  }
-  // Not by asArray, which counts the reference in and out again: this runs for every command.
-  const auto& compound = static_cast<const toolkit::Array&>(*element);
-  std::string raised;
-  const auto name = toolkit::uppercased(textOf(compound.objectAtIndex(0)), raised);
-  const auto given = compound.elements().subspan(1);
-  isFixed ? parameters->borrowElements(given) : parameters->setElements(given);
-  return doCompoundCommand(name, parameters, id);
 }

@@ -264,8 +264,6 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
  private:
   explicit QZ_Plist_State_Parser(toolkit::Toolkit& toolkit) : toolkit_(toolkit) {}
 
-  bool runElement(const Value& element, bool isFixed, const Parameters& parameters,
-                  const ObjectId& id);
   std::optional<std::string> keyOfTimer(const Timer& timer) const;
   void rewriteFlashingEntry(const ObjectId& id);
   bool setState(const ObjectId& id, toolkit::State state);

@@ -63,22 +63,19 @@ void appendUpper(std::string& out, char32_t c) {
   }
 }
 
-// Sets the high bit of each of eight bytes that is a small letter of ASCII or beyond ASCII.
-std::uint64_t notInUpperCase(std::uint64_t word) {
-  const std::uint64_t ascii = word & ~words::highBits;
-  const auto from = [&](unsigned first) { return ascii + (0x80 - first) * words::ones; };
-  return (word | (from('a') & ~from('z' + 1))) & words::highBits;
-}
+// Sets one of the two high bits of each of eight bytes that is a small letter of ASCII, one of the
+// six signs around them, or beyond ASCII. The bits below mean nothing.
+std::uint64_t notInUpperCase(std::uint64_t word) { return word & (word << 1 | words::highBits); }
 
-// Whether the text is ASCII without a small letter. Of a short one this says nothing: raising it
-// takes no longer.
+// Whether the text is ASCII without a small letter. Of a short one, and of one with those signs,
+// this says nothing: raising it takes no longer.
 bool isInUpperCase(std::string_view text) {
   if (text.size() < words::size) return false;
   std::uint64_t found = notInUpperCase(words::load(text.data() + text.size() - words::size));
   for (std::size_t at = 0; at + words::size < text.size(); at += words::size) {
     found |= notInUpperCase(words::load(text.data() + at));
   }
-  return found == 0;
+  return (found & (0xC0 * words::ones)) == 0;
 }
 
 }  // namespace

@@ -10,8 +10,8 @@ namespace toolkit {
 /// character may become several: "ß" becomes "SS", the ligature "ﬁ" becomes "FI". What is no UTF-8
 /// stays.
 std::string uppercased(std::string_view text);
-/// The same without a copy of what is in upper case already: `text` itself, or else what is then in
-/// `storage`.
+/// The same without a copy where `text` is in upper case at first sight: then it is `text` itself,
+/// or else what is then in `storage`.
 std::string_view uppercased(std::string_view text, std::string& storage);
 
 }  // namespace toolkit

@@ -30,12 +30,10 @@ std::string message(const Value& value, std::string_view selector) {
 
 }  // namespace
 
-bool Collection::canChange(std::string_view selector) const {
-  if (mutability_ == Mutability::immutable) {
-    throw InvalidArgumentException(message(*this, selector) +
-                                   "mutating message sent to an immutable object");
-  }
-  return mutability_ == Mutability::changeable;
+bool Collection::refuseChange(std::string_view selector) const {
+  if (mutability_ == Mutability::ignored) return false;
+  throw InvalidArgumentException(message(*this, selector) +
+                                 "mutating message sent to an immutable object");
 }
 
 void Collection::requirePresent(const ValueRef<>& value, std::string_view selector) const {
@@ -72,8 +70,6 @@ Array* Array::make(Document& document, std::span<Value* const> elements) {
   return makeIn<Array>(document, 0, elements, &document);
 }
 
-std::size_t Array::count() const { return elements_.size(); }
-
 const ValueRef<>& Array::objectBeyondEnd(std::size_t index) const {
   if (kind() == Kind::nothing) return Value::objectAtIndex(index);
   const std::string bounds = elements_.empty()
@@ -101,12 +97,6 @@ void Array::setElements(std::span<const ValueRef<>> elements) {
   if (!canChange("setArray:")) return;
   own_->assign(elements.begin(), elements.end());
   elements_ = *own_;
-}
-
-void Array::borrowElements(std::span<const ValueRef<>> elements) {
-  if (!canChange("setArray:")) return;
-  own_->clear();
-  elements_ = elements;
 }
 
 Set& Set::nothing() { return nothingAs<Set>(); }

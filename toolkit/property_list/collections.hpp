@@ -22,12 +22,16 @@ class Collection : public Value {
  protected:
   Collection(Kind kind, Mutability mutability) : Value(kind), mutability_(mutability) {}
   /// Raises where the collection is immutable; says whether a change is to be made at all.
-  bool canChange(std::string_view selector) const;
+  bool canChange(std::string_view selector) const {
+    return mutability_ == Mutability::changeable || refuseChange(selector);
+  }
   /// Raises when `value` is absent.
   void requirePresent(const ValueRef<>& value, std::string_view selector) const;
 
  private:
   void destroy() noexcept final;
+  /// Raises, unless changes are ignored.
+  bool refuseChange(std::string_view selector) const;
 
   Mutability mutability_;
   Collection* nextToDestroy_ = nullptr;
@@ -41,7 +45,7 @@ class Array final : public Collection {
 
   /// The elements in order. Valid until the array changes.
   std::span<const ValueRef<>> elements() const { return elements_; }
-  std::size_t count() const override;
+  std::size_t count() const override { return elements_.size(); }
   const ValueRef<>& objectAtIndex(std::size_t index) const override {
     return index < elements_.size() ? elements_[index] : objectBeyondEnd(index);
   }
@@ -53,7 +57,11 @@ class Array final : public Collection {
   void setElements(std::span<const ValueRef<>> elements);
   /// The same without a count of them, nor a copy: the caller sees to it that they stay where they
   /// are until the array has others, or ends.
-  void borrowElements(std::span<const ValueRef<>> elements);
+  void borrowElements(std::span<const ValueRef<>> elements) {
+    if (!canChange("setArray:")) return;
+    own_->clear();
+    elements_ = elements;
+  }
 
   /// As an immutable part of `document`, like its elements; the caller gets no count.
   static Array* make(Document& document, std::span<Value* const> elements);

@@ -58,7 +58,7 @@ ValueRef<Number> Number::withBool(bool value) {
 ValueRef<Number> Number::withLong(std::int64_t value) {
   // Every command makes a number of a tag. The small ones, which most tags are, are made once.
   static Small small;
-  if (value >= 0 && value < Small::count) return Counted<Number>::share(small.at(value));
+  if (value >= 0 && value < Small::count) return Counted<Number>::adopt(small.at(value));
   return makeAlone<Number>(0, Type::signedInteger, static_cast<std::uint64_t>(value));
 }
 ValueRef<Number> Number::withUnsignedLong(std::uint64_t value) {

@@ -1,0 +1,11 @@
+#include "engine/text_of.hpp"
+
+#include <string>
+
+#include "toolkit/exception.hpp"
+
+void raiseNoString(const toolkit::Value& value) {
+  // Not its description, which a small file can make longer than memory.
+  throw toolkit::InvalidArgumentException("expected a string, got " +
+                                          std::string(value.className()));
+}
