@@ -6,7 +6,7 @@
 #include <algorithm>
 #include <cstdio>
 #include <cstdlib>
-#include <limits>
+#include <map>
 #include <memory>
 #include <optional>
 #include <string>
@@ -132,16 +132,19 @@ void loadOnce(std::size_t size) {
 void measureGrowth() {
   bench::printHead("The first load of an XML script in a program, per byte of it",
                    {"file", "time", "most memory meanwhile", "memory of the script"});
-  std::vector<std::pair<double, double>> points;
-  for (const std::size_t size : grownSizes) {
-    std::vector<double> least(3, std::numeric_limits<double>::infinity());
-    for (int round = 0; round < 5; ++round) {
+  std::map<std::size_t, std::vector<double>> least;
+  for (int round = 0; round < 5; ++round) {
+    for (const std::size_t size : grownSizes) {
       const auto numbers = bench::numbersOfOwnRun(std::to_string(size));
-      for (std::size_t i = 0; i < least.size(); ++i) least[i] = std::min(least[i], numbers.at(i));
+      auto& best = least.try_emplace(size, numbers).first->second;
+      for (std::size_t i = 0; i < best.size(); ++i) best[i] = std::min(best[i], numbers.at(i));
     }
-    points.emplace_back(size, least[0] * static_cast<double>(size));
-    bench::printRow({inMegabytes(size), bench::shownTime(least[0]), bench::shownBytes(least[1]),
-                     bench::shownBytes(least[2])});
+  }
+  std::vector<std::pair<double, double>> points;
+  for (const auto& [size, best] : least) {
+    points.emplace_back(size, best.at(0) * static_cast<double>(size));
+    bench::printRow({inMegabytes(size), bench::shownTime(best[0]), bench::shownBytes(best.at(1)),
+                     bench::shownBytes(best.at(2))});
   }
   bench::printExponent("Time grows with the size", points);
 }

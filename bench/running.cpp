@@ -1,5 +1,6 @@
 // Running command lists over few and many controls on the memory toolkit, beside the toolkit calls
 // themselves and beside Lua; a press, a tick of the flasher, discovery.
+#include <algorithm>
 #include <cstdio>
 #include <cstdlib>
 #include <memory>
@@ -109,6 +110,9 @@ struct Times {
   double engine, direct, lua;
 };
 
+/// The fewer controls, the shorter a turn: as many of them as take about a second.
+int roundsOver(long controls) { return static_cast<int>(std::clamp(30000 / controls, 15L, 3000L)); }
+
 Times timesOf(long controls, const std::vector<Operation>& operations) {
   Stage engineStage(controls), directStage(controls), luaStage(controls);
   const List list = listOf(operations);
@@ -118,7 +122,7 @@ Times timesOf(long controls, const std::vector<Operation>& operations) {
       bench::leastTimes({{"engine", [&] { engineStage.engine->processCommandArray(list, id); }},
                          {"direct", [&] { bench::runDirectly(directStage.window, operations); }},
                          {"Lua", [&] { lua.run(); }}},
-                        controls > 1000 ? 15 : 150);
+                        roundsOver(controls));
   require(captions(engineStage) == captions(directStage), "direct calls came to something else");
   require(captions(engineStage) == captions(luaStage), "Lua came to something else");
   const auto count = static_cast<double>(operations.size());
@@ -165,15 +169,19 @@ void measureSorts() {
 }
 
 void measureListLength() {
-  std::vector<std::pair<double, double>> points;
+  constexpr std::size_t lengths[] = {100, 1000, 10000, 100000};
   Stage stage(100);
   const auto id = Number::withLong(1);
-  for (const std::size_t commands : {100U, 1000U, 10000U, 100000U}) {
-    const List list = listOf(operationsOver(100, commands));
-    const double time = bench::leastTimes(
-        {{"engine", [&] { stage.engine->processCommandArray(list, id); }}}, 15)[0];
-    points.emplace_back(commands, time);
+  std::vector<bench::Contender> contenders;
+  for (const std::size_t commands : lengths) {
+    contenders.push_back(
+        {std::to_string(commands), [&stage, &id, list = listOf(operationsOver(100, commands))] {
+           stage.engine->processCommandArray(list, id);
+         }});
   }
+  const auto times = bench::leastTimes(contenders, 60);
+  std::vector<std::pair<double, double>> points;
+  for (std::size_t i = 0; i < times.size(); ++i) points.emplace_back(lengths[i], times[i]);
   bench::printExponent("Time grows with the length of the list, from 100 to 100000 commands,",
                        points);
 }
