@@ -5,7 +5,7 @@
 
 #include "toolkit/property_list/scalars.hpp"
 
-/// Raises: `value` is no string.
+/// Raises: `value` is no string. Out of the way of `textOf`, which is part of every command.
 [[noreturn]] void raiseNoString(const toolkit::Value& value);
 
 /// The text of a string, valid as long as the value; empty for an absent one. Anything else raises.
