@@ -3,7 +3,6 @@
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/text_of.hpp"
 #include "toolkit/styled_text/ascii.hpp"
-#include "toolkit/styled_text/html_reader.hpp"
 
 namespace {
 
@@ -25,10 +24,10 @@ static_assert(linkedTwoBlanks.size() == 249 && linkedOneBlank.size() == 248 && p
 // Absent when the fragment has characters beyond ASCII, which must be written as references.
 std::optional<toolkit::AttributedString> read(std::string_view documentHead,
                                               const std::string& fragment,
-                                              const toolkit::Fonts& fonts) {
+                                              toolkit::Toolkit& toolkit) {
   const auto document =
       toolkit::asciiBytes(std::string(documentHead) + fragment + "</body></html>");
-  return document ? toolkit::attributedStringFromHTML(*document, fonts) : std::nullopt;
+  return document ? toolkit.attributedStringWithHTML(*document) : std::nullopt;
 }
 
 void setStyle(toolkit::AttributedString& text, toolkit::TextAlignment alignment,
@@ -84,7 +83,7 @@ bool QZ_Plist_State_Parser::showHtml(std::string_view documentHead,
   const auto points = static_cast<float>(size->intValue());  // whole points, also when not used
   // An absent fragment reads as the text that the system's formats print for nothing.
   const std::string fragment = html ? html->description() : "(null)";
-  auto text = read(documentHead, fragment, toolkit_.fonts());
+  auto text = read(documentHead, fragment, toolkit_);
   if (!text) return false;
   try {
     if (alignment) setStyle(*text, *alignment, toolkit_.fonts(), fontName, points);

@@ -1,4 +1,4 @@
-// The simple commands: bare names that act on the control whose tag is the list's own id.
+// The simple simpleCommands: bare names that act on the control whose tag is the list's own id.
 
 #include "QZ_Plist_State_Parser.hpp"
 
@@ -6,42 +6,42 @@ namespace {
 
 using Engine = QZ_Plist_State_Parser;
 
-struct Call {
+struct SimpleCall {
   Engine& engine;
   const Engine::Control& control;  // absent when no control has the id
   const Engine::ObjectId& id;
 };
 
-bool terminate(const Call& call) {
+bool terminate(const SimpleCall& call) {
   call.engine.QZ_Plist_State_Processor_TERMINATE_PARSER();
   return true;
 }
 
 template <bool enabled>
-bool setEnabled(const Call& call) {
+bool setEnabled(const SimpleCall& call) {
   call.control->setEnabled(enabled);
   return false;
 }
 
 template <bool hidden>
-bool setHidden(const Call& call) {
+bool setHidden(const SimpleCall& call) {
   call.control->setHidden(hidden);
   return false;
 }
 
-bool idle(const Call&) { return true; }
+bool idle(const SimpleCall&) { return true; }
 
 // Without a limit: a list that holds this runs itself again from its first element.
-bool processCommands(const Call& call) {
+bool processCommands(const SimpleCall& call) {
   return call.engine.QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(call.id);
 }
 
-struct Command {
+struct SimpleCommand {
   const std::string& name;  // the constant itself: a host may rename the command at any time
-  bool (*run)(const Call& call);
+  bool (*run)(const SimpleCall& call);
 };
 
-const Command commands[] = {
+const SimpleCommand simpleCommands[] = {
     {QZ_PLIST_STATE_PARSER_TERMINATE_PARSER, terminate},
     {QZ_PLIST_STATE_PARSER_DISABLE_OBJECT_WITH_ID, setEnabled<false>},
     {QZ_PLIST_STATE_PARSER_ENABLE_OBJECT_WITH_ID, setEnabled<true>},
@@ -56,7 +56,7 @@ const Command commands[] = {
 bool QZ_Plist_State_Parser::doSimpleCommand(std::string_view name, const Parameters&,
                                             const ObjectId& usingObject) {
   const Control control = findObjectWithTag(usingObject->longValue());
-  for (const Command& command : commands) {
+  for (const SimpleCommand& command : simpleCommands) {
     if (name == command.name) return command.run({*this, control, usingObject});
   }
   return false;

@@ -1,7 +1,9 @@
-// Letters of ASCII without regard to case. The locale has no say.
+// Digits and letters of ASCII, whatever the locale.
 #pragma once
 
 namespace toolkit {
+
+constexpr bool isDigit(char c) { return c >= '0' && c <= '9'; }
 
 constexpr char lowered(char c) {
   return c >= 'A' && c <= 'Z' ? static_cast<char>(c - 'A' + 'a') : c;

@@ -82,8 +82,11 @@ class TestDriver {
   /// A click with the primary button where the user sees the view. Hidden or disabled controls, and
   /// those behind a sheet, take none.
   virtual void click(const Ref<View>& view) = 0;
-  /// Lets time pass: at once where the clock is virtual, really elsewhere. 0 or more seconds.
+  /// Lets time pass, at once: the clock jumps from timer to timer. 0 or more seconds.
   virtual void advance(double seconds) = 0;
+  /// From now on `advance` takes as long as it says, so that a person can watch. Nothing changes
+  /// where there are no windows to watch.
+  virtual void useRealTime() {}
 
   // --- with a person at the screen ---
 

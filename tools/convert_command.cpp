@@ -1,8 +1,4 @@
 // The command `convert`.
-#include "tools/convert_command.hpp"
-
-#include <CLI/CLI.hpp>
-
 #include <filesystem>
 #include <map>
 #include <memory>
@@ -13,11 +9,11 @@
 #include "toolkit/property_list/binary_writer.hpp"
 #include "toolkit/property_list/reader.hpp"
 #include "toolkit/property_list/xml_writer.hpp"
+#include "tools/commands.hpp"
 #include "tools/failure.hpp"
 #include "tools/play/input_file.hpp"
 #include "tools/replace_file.hpp"
 #include "tools/shared_values.hpp"
-#include "tools/shell.hpp"
 #include "tools/text_layout.hpp"
 
 namespace tools {
@@ -59,32 +55,29 @@ void convert(const ConvertOptions& options) {
 void setFormat(ConvertOptions& options, const std::string& name) {
   const auto found = formats.find(name);
   if (found == formats.end()) {
-    throw CLI::ValidationError("--format: expected xml or binary, found " + quote(name));
+    throw UsageError("--format: expected xml or binary, found " + quote(name));
   }
   options.format = found->second;
 }
 
-}  // namespace
-
-void addConvertCommand(CLI::App& app, int& status) {
-  CLI::App* command = app.add_subcommand("convert", "Write a property list in another format");
+void describeConvert(Command& command) {
   const auto options = std::make_shared<ConvertOptions>();
-  command->add_option("IN", options->in, "The property list, of any format")
-      ->required()
-      ->type_name("");
-  command->add_option("OUT", options->out, "The file to write")
-      ->required()
-      ->check(whyNotPath)
-      ->type_name("");
+  command.argument("IN", options->in, "The property list, of any format");
+  command.argument("OUT", options->out, "The file to write").path();
   command
-      ->add_option_function<std::string>(
+      .taken(
           "--format", [options](const std::string& name) { setFormat(*options, name); },
           "xml or binary; without it, binary where OUT ends with .bplist or .bin, else xml")
-      ->type_name("FORMAT");
-  command->callback([options, &status] {
+      .valueName("FORMAT");
+  command.action([options] {
     convert(*options);
-    status = static_cast<int>(ExitStatus::fine);
+    return static_cast<int>(ExitStatus::fine);
   });
 }
+
+}  // namespace
+
+constexpr CommandEntry convertCommand{"convert", "Write a property list in another format",
+                                      describeConvert};
 
 }  // namespace tools

@@ -6,7 +6,7 @@
 
 #include "toolkit/memory/memory_driver.hpp"
 #if QZ_QT
-#include "toolkit/qt/qt_driver.hpp"
+#include "toolkit/qt/make_driver.hpp"
 #endif
 #include "tools/failure.hpp"
 #include "tools/suggestions.hpp"

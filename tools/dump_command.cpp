@@ -1,13 +1,10 @@
 // The command `dump`.
-#include "tools/dump_command.hpp"
-
-#include <CLI/CLI.hpp>
-
 #include <iostream>
 #include <memory>
 #include <string>
 
 #include "toolkit/property_list/canonical_dump.hpp"
+#include "tools/commands.hpp"
 #include "tools/failure.hpp"
 #include "tools/play/input_file.hpp"
 #include "tools/readable_dump.hpp"
@@ -34,19 +31,20 @@ void dump(const DumpOptions& options) {
   }
 }
 
-}  // namespace
-
-void addDumpCommand(CLI::App& app, int& status) {
-  CLI::App* command = app.add_subcommand("dump", "Print a property list of any format");
+void describeDump(Command& command) {
   const auto options = std::make_shared<DumpOptions>();
-  command->add_option("FILE", options->file, "The property list")->required()->type_name("");
-  command->add_flag("--canonical", options->canonical,
-                    "In one line of ASCII, the same for equal values");
-  command->add_flag("--dictionary", options->dictionary, "Only if its root is a dictionary");
-  command->callback([options, &status] {
+  command.argument("FILE", options->file, "The property list");
+  command.flag("--canonical", options->canonical,
+               "In one line of ASCII, the same for equal values");
+  command.flag("--dictionary", options->dictionary, "Only if its root is a dictionary");
+  command.action([options] {
     dump(*options);
-    status = static_cast<int>(ExitStatus::fine);
+    return static_cast<int>(ExitStatus::fine);
   });
 }
+
+}  // namespace
+
+constexpr CommandEntry dumpCommand{"dump", "Print a property list of any format", describeDump};
 
 }  // namespace tools

@@ -2,16 +2,13 @@
 #include <string>
 #include <vector>
 
-#include "tools/convert_command.hpp"
-#include "tools/dump_command.hpp"
-#include "tools/play_command.hpp"
+#include "tools/commands.hpp"
 #include "tools/shell.hpp"
 #include "tools/stack_guard.hpp"
-#include "tools/test_command.hpp"
 
 int main(int argc, char** argv) {
   tools::installStackGuard();
   const std::vector<std::string> arguments(argv + (argc > 0 ? 1 : 0), argv + argc);
-  return tools::runTool(arguments, {tools::addPlayCommand, tools::addTestCommand,
-                                    tools::addDumpCommand, tools::addConvertCommand});
+  return tools::runTool(arguments, {tools::playCommand, tools::testCommand, tools::dumpCommand,
+                                    tools::convertCommand});
 }

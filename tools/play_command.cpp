@@ -1,7 +1,4 @@
 // The command `play`: its options.
-#include "tools/play_command.hpp"
-
-#include <CLI/CLI.hpp>
 #include <sys/ioctl.h>
 #include <unistd.h>
 
@@ -9,6 +6,7 @@
 #include <iostream>
 #include <memory>
 
+#include "tools/commands.hpp"
 #include "tools/drivers.hpp"
 #include "tools/play/play.hpp"
 #include "tools/play/prompt.hpp"
@@ -33,81 +31,72 @@ play::Style outputStyle() {
   return style;
 }
 
-void addPresses(play::PlayOptions& options, const std::vector<std::string>& tags) {
-  for (const std::string& text : tags) {
-    const auto tag = play::parseTag(text);
-    if (!tag) {
-      throw CLI::ValidationError("--press: expected a tag (a whole number), found " + quote(text));
-    }
-    options.steps.emplace_back(play::Press{*tag});
-  }
+void addPress(play::PlayOptions& options, const std::string& text) {
+  const auto tag = play::parseTag(text);
+  if (!tag) throw UsageError("--press: expected a tag (a whole number), found " + quote(text));
+  options.steps.emplace_back(play::Press{*tag});
 }
 
 void addAdvance(play::PlayOptions& options, const std::string& text) {
   const auto seconds = play::parseSeconds(text);
   if (!seconds) {
-    throw CLI::ValidationError("--advance: expected seconds from 0 to 86400, found " + quote(text));
+    throw UsageError("--advance: expected seconds from 0 to 86400, found " + quote(text));
   }
   options.steps.emplace_back(play::Advance{*seconds});
 }
 
-void addWindowOptions(CLI::App& command, play::PlayOptions& options) {
-  auto* window = command.add_option("--window", options.window,
-                                    "The host's window, a property list of its controls");
-  auto* assets = command.add_option("--assets", options.assets,
-                                    "A description of which the engine builds the window");
-  window->type_name("HOST.plist")->excludes(assets);
-  assets->type_name("DESCRIPTION.plist")->excludes(window);
+void addWindowOptions(Command& command, play::PlayOptions& options) {
+  auto window = command.option("--window", options.window,
+                               "The host's window, a property list of its controls");
+  auto assets = command.option("--assets", options.assets,
+                               "A description of which the engine builds the window");
+  window.valueName("HOST.plist").excludes(assets);
+  assets.valueName("DESCRIPTION.plist");
   command
-      .add_option("--resources", options.resources,
-                  "The directory of the images; the script's own without it")
-      ->type_name("DIR");
-  command.add_flag("--sheet", options.sheet, "Show it as a sheet over another window of the host");
+      .option("--resources", options.resources,
+              "The directory of the images; the script's own without it")
+      .valueName("DIR");
+  command.flag("--sheet", options.sheet, "Show it as a sheet over another window of the host");
   options.toolkit = playerToolkit();
-  command.add_option("--toolkit", options.toolkit, "The toolkit to play it on")
-      ->type_name("NAME")
-      ->capture_default_str();
+  command.option("--toolkit", options.toolkit, "The toolkit to play it on")
+      .valueName("NAME")
+      .showDefault();
   command
-      .add_option("--screenshots", options.screenshots,
-                  "Write a picture after every step there, and the transcript")
-      ->type_name("DIR");
+      .option("--screenshots", options.screenshots,
+              "Write a picture after every step there, and the transcript")
+      .valueName("DIR");
 }
 
-/// Steps are collected while the command line is read, for their order across both options counts.
-void addStepOptions(CLI::App& command, play::PlayOptions& options) {
-  command.add_option("--start", options.startKey, "The list to start with; else the smallest tag")
-      ->type_name("KEY");
+void addStepOptions(Command& command, play::PlayOptions& options) {
+  command.option("--start", options.startKey, "The list to start with; else the smallest tag")
+      .valueName("KEY");
   command
-      .add_option_function<std::vector<std::string>>(
-          "--press",
-          [&options](const std::vector<std::string>& tags) { addPresses(options, tags); },
+      .repeatedList(
+          "--press", [&options](const std::string& tag) { addPress(options, tag); },
           "Press the buttons with these tags, in turn")
-      ->type_name("TAG")
-      ->trigger_on_parse();
+      .valueName("TAG");
   command
-      .add_option_function<std::string>(
+      .repeated(
           "--advance", [&options](const std::string& text) { addAdvance(options, text); },
           "Let time pass; in turn with --press, as they stand on the command line")
-      ->type_name("SECONDS")
-      ->trigger_on_parse();
+      .valueName("SECONDS");
+}
+
+void describePlay(Command& command) {
+  const auto options = std::make_shared<play::PlayOptions>();
+  command.argument("SCRIPT", options->script, "The script, a property list");
+  addWindowOptions(command, *options);
+  addStepOptions(command, *options);
+  command.action([options] {
+    const bool interactive = ::isatty(STDIN_FILENO) != 0;
+    const play::Terminal terminal{std::cin, std::cout, std::cerr, interactive, outputStyle()};
+    return static_cast<int>(play::play(*options, terminal));
+  });
 }
 
 }  // namespace
 
-void addPlayCommand(CLI::App& app, int& status) {
-  CLI::App* command =
-      app.add_subcommand("play", "Play a script and show, step by step, what its user would see");
-  const auto options = std::make_shared<play::PlayOptions>();
-  command->add_option("SCRIPT", options->script, "The script, a property list")
-      ->required()
-      ->type_name("");
-  addWindowOptions(*command, *options);
-  addStepOptions(*command, *options);
-  command->callback([options, &status] {
-    const bool interactive = ::isatty(STDIN_FILENO) != 0;
-    const play::Terminal terminal{std::cin, std::cout, std::cerr, interactive, outputStyle()};
-    status = static_cast<int>(play::play(*options, terminal));
-  });
-}
+constexpr CommandEntry playCommand{
+    "play", "Play a script and show, step by step, what its user would see", describePlay};
 
 }  // namespace tools

@@ -1,20 +1,19 @@
 // The command `test`.
-#include "tools/test_command.hpp"
-
-#include <CLI/CLI.hpp>
-
 #include <algorithm>
 #include <filesystem>
 #include <fstream>
 #include <iostream>
 #include <memory>
+#include <optional>
+#include <string>
+#include <vector>
 
+#include "tools/commands.hpp"
 #include "tools/drivers.hpp"
 #include "tools/failure.hpp"
 #include "tools/scenario/junit.hpp"
 #include "tools/scenario/runner.hpp"
 #include "tools/scenario/scenario_files.hpp"
-#include "tools/shell.hpp"
 #include "tools/text_layout.hpp"
 
 namespace tools {
@@ -24,6 +23,15 @@ using scenario::LoadedFile;
 using scenario::Report;
 using scenario::Scenario;
 using scenario::Verdict;
+
+struct TestOptions {
+  std::vector<std::string> paths;  // scenario files, and directories that hold some
+  std::string toolkit = "memory";
+  std::string filter;  // run only scenarios whose title contains this
+  bool list = false;   // name the scenarios instead of running them
+  bool verbose = false;
+  std::optional<std::string> junit;  // where to write a report
+};
 
 /// Opened before anything runs, so that a report that cannot be written is no surprise at the end.
 std::ofstream openReport(const std::string& path) {
@@ -99,8 +107,9 @@ std::vector<Report> run(const TestOptions& options, const std::vector<LoadedFile
   return reports;
 }
 
-}  // namespace
-
+/// Runs the scenarios and writes their failures and the counts to `out`, and to `problems` what
+/// makes a file no scenario. Gives the tool's exit status. Throws a Failure when a report cannot be
+/// written or there is no such toolkit.
 int runTests(const TestOptions& options, std::ostream& out, std::ostream& problems) {
   requireDriver(options.toolkit);  // else it would be missed only where something runs
   const auto read = scenario::readScenarios(options.paths);
@@ -124,20 +133,20 @@ int runTests(const TestOptions& options, std::ostream& out, std::ostream& proble
   return static_cast<int>(failed ? ExitStatus::failed : ExitStatus::fine);
 }
 
-void addTestCommand(CLI::App& app, int& status) {
+void describeTest(Command& command) {
   const auto options = std::make_shared<TestOptions>();
-  auto* const command = app.add_subcommand("test", "Run scenarios and say which hold");
-  command->add_option("FILE", options->paths, "Scenario files (.walk), or directories of them")
-      ->required()
-      ->check(whyNotPath);
-  command->add_option("--toolkit", options->toolkit, "The toolkit to run on")
-      ->capture_default_str();
-  command->add_option("--filter", options->filter, "Run only scenarios whose title contains this");
-  command->add_flag("--list", options->list, "Name the scenarios instead of running them");
-  command->add_flag("--verbose", options->verbose, "Print every statement with its result");
-  command->add_option("--junit", options->junit, "Write a JUnit report to this file")
-      ->check(whyNotPath);
-  command->callback([options, &status] { status = runTests(*options, std::cout, std::cerr); });
+  command.arguments("FILE", options->paths, "Scenario files (.walk), or directories of them")
+      .path();
+  command.option("--toolkit", options->toolkit, "The toolkit to run on").showDefault();
+  command.option("--filter", options->filter, "Run only scenarios whose title contains this");
+  command.flag("--list", options->list, "Name the scenarios instead of running them");
+  command.flag("--verbose", options->verbose, "Print every statement with its result");
+  command.option("--junit", options->junit, "Write a JUnit report to this file").path();
+  command.action([options] { return runTests(*options, std::cout, std::cerr); });
 }
+
+}  // namespace
+
+constexpr CommandEntry testCommand{"test", "Run scenarios and say which hold", describeTest};
 
 }  // namespace tools

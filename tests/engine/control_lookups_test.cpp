@@ -66,7 +66,7 @@ bool run(const std::string& command, const std::shared_ptr<ChangingContent>& con
 }
 
 // What each look-up finds: b a button, t a text field, i an image view, v another view, - nothing.
-struct Case {
+struct Lookup {
   const char* name;
   const char* findings;
   bool result;
@@ -75,7 +75,7 @@ struct Case {
   std::size_t queried;  // the look-up whose finding is asked whether it needs a redraw; 0 for none
 };
 
-constexpr Case cases[] = {
+constexpr Lookup lookups[] = {
     {"a button", "bb", true, 2, 2, 2},
     {"a button that is no longer there", "b-", false, 2, 0, 0},
     {"a button that became a text field", "bt", true, 2, 2, 2},
@@ -95,7 +95,7 @@ constexpr Case cases[] = {
     {"nothing at all", "-----", true, 5, 0, 0},
 };
 
-void check(const Case& wanted, const std::string& command, const std::string& change) {
+void check(const Lookup& wanted, const std::string& command, const std::string& change) {
   SCOPED_TRACE(command + ": " + wanted.name);
   const auto content = std::make_shared<ChangingContent>(wanted.findings);
   EXPECT_EQ(run(command, content), wanted.result);
@@ -109,7 +109,7 @@ void check(const Case& wanted, const std::string& command, const std::string& ch
 }
 
 TEST(ControlLookups, HidingAndShowingActOnTheFindingOfTheirStep) {
-  for (const Case& wanted : cases) {
+  for (const Lookup& wanted : lookups) {
     check(wanted, "HIDE_OBJECT_WITH_ID", "hide");
     check(wanted, "SHOW_OBJECT_WITH_ID", "show");
   }

@@ -18,13 +18,13 @@ namespace {
 using toolkit::AttributedString;
 using toolkit::Number;
 
-constexpr long target = 7;
+constexpr long unrulyTag = 7;
 
 /// A control that keeps only the first letter of a plain text, and does with styled text what the
 /// test wants.
 class Unruly final : public fakes::FakeRole<toolkit::View> {
  public:
-  Unruly() : FakeRole(target) {}
+  Unruly() : FakeRole(unrulyTag) {}
 
   std::string stringValue() const override { return text; }
   void setStringValue(std::string_view value) override { text = value.substr(0, 1); }
@@ -45,7 +45,7 @@ class Unruly final : public fakes::FakeRole<toolkit::View> {
 /// An image view that shows nothing.
 class Blank final : public fakes::FakeRole<toolkit::ImageView> {
  public:
-  Blank() : FakeRole(target) {}
+  Blank() : FakeRole(unrulyTag) {}
 
   void setTarget(const std::shared_ptr<toolkit::Responder>&) override {}
   void setAction(std::string_view) override {}
@@ -70,16 +70,16 @@ class MisbehavingControls : public testing::Test {
 
   bool setText(const char* text) {
     return engine->QZ_Plist_State_Processor_SET_TEXT(toolkit::String::make(text),
-                                                     Number::withLong(target));
+                                                     Number::withLong(unrulyTag));
   }
   bool setHtml(const char* html) {
     return engine->QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML(
         toolkit::String::make(html), toolkit::String::make("Times"), Number::withLong(12),
-        Number::withLong(target));
+        Number::withLong(unrulyTag));
   }
   bool setColor() {
     return engine->QZ_Plist_State_Processor_SET_FOREGROUND_COLOR(toolkit::String::make("red"),
-                                                                 Number::withLong(target));
+                                                                 Number::withLong(unrulyTag));
   }
 
   std::vector<std::string> log;
@@ -130,7 +130,7 @@ TEST_F(MisbehavingControls, OnlyTheToolkitsExceptionsAreCaught) {
 // Nothing hangs on the answer; that it is asked for is part of what the commands do.
 TEST_F(MisbehavingControls, SomeCommandsAskWhetherARedrawIsPending) {
   const std::vector<std::string> once = {"needsDisplay"};
-  const auto id = Number::withLong(target);
+  const auto id = Number::withLong(unrulyTag);
   const auto image = std::make_shared<Blank>();
   EXPECT_TRUE(engine->QZ_Plist_State_Processor_SET_TOOL_TIP(
       toolkit::Array::make({toolkit::String::make("tip")}), id));

@@ -11,16 +11,18 @@ namespace {
 
 using toolkit::uppercased;
 
-struct Case {
+struct UppercaseCase {
   const char* name;
   std::string_view text;
   std::string_view upper;
 };
 
-void check(const Case& wanted) { EXPECT_EQ(uppercased(wanted.text), wanted.upper) << wanted.name; }
+void check(const UppercaseCase& wanted) {
+  EXPECT_EQ(uppercased(wanted.text), wanted.upper) << wanted.name;
+}
 
 TEST(Uppercase, SingleLetters) {
-  constexpr Case cases[] = {
+  constexpr UppercaseCase cases[] = {
       {"ASCII", "abcxyz", "ABCXYZ"},
       {"ASCII around the letters", "@[`{/:09AZ_", "@[`{/:09AZ_"},
       {"Latin-1", "àöøþ", "ÀÖØÞ"},
@@ -46,11 +48,11 @@ TEST(Uppercase, SingleLetters) {
       {"letters beyond 16 bits", "𐐨𞤢", "𐐀𞤀"},
       {"the combining iota", "\u0345", "Ι"},
   };
-  for (const Case& wanted : cases) check(wanted);
+  for (const UppercaseCase& wanted : cases) check(wanted);
 }
 
 TEST(Uppercase, LettersThatBecomeSeveral) {
-  constexpr Case cases[] = {
+  constexpr UppercaseCase cases[] = {
       {"the sharp s", "straße", "STRASSE"},
       {"Latin ligatures", "ﬀﬁﬂﬃﬄﬅﬆ", "FFFIFLFFIFFLSTST"},
       {"Armenian ligatures", "ևﬓ", "ԵՒՄՆ"},
@@ -59,12 +61,12 @@ TEST(Uppercase, LettersThatBecomeSeveral) {
       {"Greek with an iota below", "ᾳῃῳᾀ", "ΑΙΗΙΩΙἈΙ"},
       {"Greek with an iota beside", "ᾼῌῼᾈ", "ΑΙΗΙΩΙἈΙ"},
   };
-  for (const Case& wanted : cases) check(wanted);
+  for (const UppercaseCase& wanted : cases) check(wanted);
 }
 
 TEST(Uppercase, WhatHasNoUpperCaseStays) {
   using namespace std::string_view_literals;
-  const Case cases[] = {
+  const UppercaseCase cases[] = {
       {"nothing", "", ""},
       {"capitals", "ABCÄÖΩЖİ", "ABCÄÖΩЖİ"},
       {"signs that look like letters", "K Å ℵ", "K Å ℵ"},
@@ -73,12 +75,12 @@ TEST(Uppercase, WhatHasNoUpperCaseStays) {
       {"a zero byte", "a\0b"sv, "A\0B"sv},
       {"pictures", "🙂é", "🙂É"},
   };
-  for (const Case& wanted : cases) check(wanted);
+  for (const UppercaseCase& wanted : cases) check(wanted);
 }
 
 // A name that is no text matches no command, but must not be lost or read beyond its end either.
 TEST(Uppercase, BytesThatAreNoTextStay) {
-  constexpr Case cases[] = {
+  constexpr UppercaseCase cases[] = {
       {"a lone continuation", "a\x80z", "A\x80Z"},
       {"a lead without continuation", "\xC3z", "\xC3Z"},
       {"a lead at the end", "z\xC3", "Z\xC3"},
@@ -87,7 +89,7 @@ TEST(Uppercase, BytesThatAreNoTextStay) {
       {"bytes that never occur", "a\xFE\xFF\xC0\xC1z", "A\xFE\xFF\xC0\xC1Z"},
       {"a surrogate", "a\xED\xA0\x80z", "A\xED\xA0\x80Z"},
   };
-  for (const Case& wanted : cases) check(wanted);
+  for (const UppercaseCase& wanted : cases) check(wanted);
 }
 
 std::string encoded(char32_t c) {

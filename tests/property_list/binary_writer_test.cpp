@@ -15,7 +15,7 @@ namespace {
 
 using namespace std::string_literals;
 
-std::string refusalOf(const ValueRef<>& value) {
+std::string binaryRefusalOf(const ValueRef<>& value) {
   try {
     writeBinaryPropertyList(value);
   } catch (const InvalidArgumentException& exception) {
@@ -86,17 +86,17 @@ TEST(BinaryWriter, WritesSharedValuesAndEqualStringsOnce) {
 
 TEST(BinaryWriter, RefusesWhatBinaryCannotCarry) {
   const std::string start = "binary property lists cannot carry ";
-  EXPECT_EQ(refusalOf(nullptr), start + "an absent value");
-  EXPECT_EQ(refusalOf(Dictionary::make({{Array::make(), Null::make()}})),
+  EXPECT_EQ(binaryRefusalOf(nullptr), start + "an absent value");
+  EXPECT_EQ(binaryRefusalOf(Dictionary::make({{Array::make(), Null::make()}})),
             start + "a collection as a key");
   const auto endless = Array::make();
   endless->addObject(endless);
-  EXPECT_EQ(refusalOf(endless), start + "a collection that holds itself");
+  EXPECT_EQ(binaryRefusalOf(endless), start + "a collection that holds itself");
   endless->removeAllObjects();
   ValueRef<> deep = Array::make();
   for (int i = 1; i < 513; ++i) deep = Array::make({deep});
   EXPECT_EQ(dumpOf(writeBinaryPropertyList(deep)), canonicalDump(*deep));
-  EXPECT_EQ(refusalOf(Array::make({deep})), start + "more than 512 levels in one another");
+  EXPECT_EQ(binaryRefusalOf(Array::make({deep})), start + "more than 512 levels in one another");
 }
 
 }  // namespace

@@ -9,7 +9,7 @@
 namespace toolkit {
 namespace {
 
-struct Case {
+struct OldStyleCase {
   std::string_view text;
   std::string_view dump;
 };
@@ -18,7 +18,7 @@ constexpr std::string_view empty = "{\"dict\":[]}";
 constexpr std::string_view aIsB = "{\"dict\":[[\"a\",\"b\"]]}";
 
 TEST(OldStyleReader, TakesRoots) {
-  const Case cases[] = {
+  const OldStyleCase cases[] = {
       {"", refused},
       {" ", empty},
       {"\t\n\v\f\r \xE2\x80\xA8\xE2\x80\xA9", empty},
@@ -56,7 +56,7 @@ TEST(OldStyleReader, TakesRoots) {
 }
 
 TEST(OldStyleReader, TakesDictionaries) {
-  const Case cases[] = {
+  const OldStyleCase cases[] = {
       {"{a=b;}", aIsB},
       {"{a=b}", refused},
       {"{a=b;;}", refused},
@@ -87,7 +87,7 @@ TEST(OldStyleReader, TakesDictionaries) {
 }
 
 TEST(OldStyleReader, TakesStringsFiles) {
-  const Case cases[] = {
+  const OldStyleCase cases[] = {
       {"a=b;", aIsB},
       {"a;", "{\"dict\":[[\"a\",\"a\"]]}"},
       {"\"a\" = \"b\";", aIsB},
@@ -110,7 +110,7 @@ TEST(OldStyleReader, TakesStringsFiles) {
 }
 
 TEST(OldStyleReader, TakesArrays) {
-  const Case cases[] = {
+  const OldStyleCase cases[] = {
       {"( )", "[]"},       {"(a)", "[\"a\"]"},
       {"(a,)", "[\"a\"]"}, {"(a , 'b' /* c */ , )", "[\"a\",\"b\"]"},
       {"(,)", refused},    {"(a,,)", refused},
@@ -122,7 +122,7 @@ TEST(OldStyleReader, TakesArrays) {
 }
 
 TEST(OldStyleReader, TakesStrings) {
-  const Case cases[] = {
+  const OldStyleCase cases[] = {
       {"azAZ09_$/:.-", "\"azAZ09_$/:.-\""},
       {"a+b", refused},
       {"a~", refused},
@@ -159,7 +159,7 @@ TEST(OldStyleReader, JoinsHalvesOfCharacters) {
 }
 
 TEST(OldStyleReader, TakesData) {
-  const Case cases[] = {
+  const OldStyleCase cases[] = {
       {"<0aFf>", "{\"data\":\"0aff\"}"},
       {"< 01 02\t03\r\n04 >", "{\"data\":\"01020304\"}"},
       {"<0 1>", refused},

@@ -9,13 +9,13 @@
 namespace toolkit {
 namespace {
 
-struct Case {
+struct XmlCase {
   std::string xml;
   std::string_view dump;
 };
 
 TEST(XmlReader, TakesWhatStandsAroundTheRoot) {
-  const Case cases[] = {
+  const XmlCase cases[] = {
       {"<string>a</string>", "\"a\""},
       {" \t\r\n<string>a</string>", "\"a\""},
       {"\f<string>a</string>", refused},
@@ -53,7 +53,7 @@ TEST(XmlReader, TakesWhatStandsAroundTheRoot) {
 }
 
 TEST(XmlReader, TakesTagsAsThePlatformDoes) {
-  const Case cases[] = {
+  const XmlCase cases[] = {
       {"<string>a</string >", "\"a\""},
       {"<string>a</string\n>", "\"a\""},
       {"<string>a</ string>", refused},
@@ -89,7 +89,7 @@ TEST(XmlReader, TakesTagsAsThePlatformDoes) {
 }
 
 TEST(XmlReader, TakesArraysAndDictionaries) {
-  const Case cases[] = {
+  const XmlCase cases[] = {
       {"<array></array>", "[]"},
       {"<array> <?p?> <!----> <true/>\n<string>a</string></array>", "[true,\"a\"]"},
       {"<array><key>k</key></array>", "[\"k\"]"},
@@ -121,7 +121,7 @@ TEST(XmlReader, TakesArraysAndDictionaries) {
 
 TEST(XmlReader, TakesUids) {
   const std::string uid = "<key>CF$UID</key><integer>7</integer>";
-  const Case cases[] = {
+  const XmlCase cases[] = {
       {"<array><dict>" + uid + "</dict></array>", "[{\"uid\":7}]"},
       {"<dict>" + uid + uid + "</dict>", "{\"uid\":7}"},
       {"<dict><key>CF$UID</key><integer>4294967295</integer></dict>", "{\"uid\":4294967295}"},
@@ -137,7 +137,7 @@ TEST(XmlReader, TakesUids) {
 }
 
 TEST(XmlReader, TakesStrings) {
-  const Case cases[] = {
+  const XmlCase cases[] = {
       {"&lt;&gt;&amp;&apos;&quot;", "\"<>&'\\\"\""},
       {"&LT;", refused},
       {"&nbsp;", refused},
@@ -179,7 +179,7 @@ TEST(XmlReader, TakesStrings) {
 }
 
 TEST(XmlReader, TakesUtf8AndNothingElseInStrings) {
-  const Case cases[] = {
+  const XmlCase cases[] = {
       {"\xC3\xA9\xE2\x98\xBA\xF0\x9F\x98\x80", "\"\\u00e9\\u263a\\ud83d\\ude00\""},
       {"\xEF\xBB\xBF"
        "a\xEF\xBB\xBF",

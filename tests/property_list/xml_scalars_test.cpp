@@ -9,14 +9,14 @@
 namespace toolkit {
 namespace {
 
-struct Case {
+struct ScalarCase {
   std::string_view text;
   std::string_view value;
 };
 
 /// Reads `text` within the tag, and expects the dump to be `start` + value + `end`.
 template <std::size_t count>
-void expect(const Case (&cases)[count], const std::string& tag, const std::string& start,
+void expect(const ScalarCase (&cases)[count], const std::string& tag, const std::string& start,
             const std::string& end) {
   for (const auto& [text, value] : cases) {
     const std::string xml = "<" + tag + ">" + std::string(text) + "</" + tag + ">";
@@ -27,7 +27,7 @@ void expect(const Case (&cases)[count], const std::string& tag, const std::strin
 }
 
 TEST(XmlScalars, Integers) {
-  const Case cases[] = {
+  const ScalarCase cases[] = {
       {"0", "0"},
       {"-0", "0"},
       {"007", "7"},
@@ -76,7 +76,7 @@ TEST(XmlScalars, Integers) {
 }
 
 TEST(XmlScalars, Reals) {
-  const Case cases[] = {
+  const ScalarCase cases[] = {
       {".5", "0.5"},
       {"5.", "5"},
       {"+1.5", "1.5"},
@@ -119,7 +119,7 @@ TEST(XmlScalars, Reals) {
 }
 
 TEST(XmlScalars, Dates) {
-  const Case cases[] = {
+  const ScalarCase cases[] = {
       {"2001-01-01T00:00:00Z", "0"},
       {"2024-02-29T12:34:56Z", "730902896"},
       {"2000-12-31T23:59:59Z", "-1"},
@@ -165,7 +165,7 @@ TEST(XmlScalars, DatesOfAnyYear) {
 }
 
 TEST(XmlScalars, Data) {
-  const Case cases[] = {
+  const ScalarCase cases[] = {
       {"", ""},
       {"AQID", "010203"},
       {"AQI=", "0102"},

@@ -14,7 +14,7 @@
 namespace toolkit {
 namespace {
 
-std::string refusalOf(const ValueRef<>& value) {
+std::string xmlRefusalOf(const ValueRef<>& value) {
   try {
     writeXmlPropertyList(value);
   } catch (const InvalidArgumentException& exception) {
@@ -59,7 +59,6 @@ TEST(XmlWriter, WritesWhatOthersWrite) {
 }
 
 TEST(XmlWriter, WritesWhatReadsBackTheSame) {
-  const double infinity = std::numeric_limits<double>::infinity();
   const ValueRef<> values[] = {
       String::make(""),
       String::make(std::string_view("\0\x01\t\n\r\x1F\x7F", 7)),
@@ -70,8 +69,8 @@ TEST(XmlWriter, WritesWhatReadsBackTheSame) {
       Number::withLong(INT64_MIN),
       Number::withDouble(-0.0),
       Number::withDouble(4.9e-324),
-      Number::withDouble(infinity),
-      Number::withDouble(-infinity),
+      Number::withDouble(HUGE_VAL),
+      Number::withDouble(-HUGE_VAL),
       Number::withDouble(std::nan("")),
       Date::make(-63145612800),
       Date::make(1e15),
@@ -123,7 +122,7 @@ TEST(XmlWriter, RefusesWhatXmlCannotCarry) {
        "a dictionary of nothing but an integer CF$UID, which reads back as a UID (at the root)"},
   };
   for (const auto& [value, reason] : cases) {
-    EXPECT_EQ(refusalOf(value), "XML property lists cannot carry " + std::string(reason));
+    EXPECT_EQ(xmlRefusalOf(value), "XML property lists cannot carry " + std::string(reason));
   }
 }
 
@@ -131,10 +130,10 @@ TEST(XmlWriter, NestsAsDeeplyAsTheReader) {
   ValueRef<> value = Array::make();
   for (int i = 1; i < 512; ++i) value = Array::make({value});
   EXPECT_EQ(dumpOf(writeXmlPropertyList(value)), canonicalDump(*value));
-  EXPECT_NE(refusalOf(Array::make({value})).find("more than 512"), std::string::npos);
+  EXPECT_NE(xmlRefusalOf(Array::make({value})).find("more than 512"), std::string::npos);
   const auto endless = Array::make();
   endless->addObject(endless);
-  EXPECT_NE(refusalOf(endless).find("more than 512"), std::string::npos);
+  EXPECT_NE(xmlRefusalOf(endless).find("more than 512"), std::string::npos);
   endless->removeAllObjects();
 }
 

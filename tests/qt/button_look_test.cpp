@@ -37,7 +37,7 @@ std::unique_ptr<QAbstractButton> sized(QAbstractButton* button) {
   return std::unique_ptr<QAbstractButton>(button);
 }
 
-std::vector<std::unique_ptr<QAbstractButton>> everyKind() {
+std::vector<std::unique_ptr<QAbstractButton>> everyButtonKind() {
   std::vector<std::unique_ptr<QAbstractButton>> buttons;
   buttons.push_back(sized(new QPushButton("Plain")));
   buttons.push_back(sized(new QCheckBox("Plain")));
@@ -47,7 +47,7 @@ std::vector<std::unique_ptr<QAbstractButton>> everyKind() {
 }
 
 TEST(ButtonLook, DrawsTheTitlesColourInEveryKindOfButton) {
-  for (const auto& button : everyKind()) {
+  for (const auto& button : everyButtonKind()) {
     SCOPED_TRACE(button->metaObject()->className());
     EXPECT_EQ(countPixels(pictureOf(*button), isReddish), 0);
     showTitle(*button, redTitle());
@@ -109,7 +109,7 @@ TEST(ButtonLook, GreysTheTitleOfDisabledButtons) {
     });
     return strongest;
   };
-  for (const auto& button : everyKind()) {
+  for (const auto& button : everyButtonKind()) {
     SCOPED_TRACE(button->metaObject()->className());
     showTitle(*button, redTitle());
     const int enabled = strength(pictureOf(*button));
@@ -132,7 +132,7 @@ std::map<std::string, std::string> propertiesOf(const QObject& object) {
 }
 
 TEST(ButtonLook, HighlightingShowsThePressedLookAndChangesNothingElse) {
-  auto buttons = everyKind();
+  auto buttons = everyButtonKind();
   buttons.push_back(sized(new QCommandLinkButton("Link")));
   for (const auto& button : buttons) {
     SCOPED_TRACE(button->metaObject()->className());

@@ -31,13 +31,13 @@ AttributedString styledText() {
 }
 
 /// What a host may set of a label, and what may happen to it after the text was shown.
-struct Case {
+struct PageCase {
   const char* name;
   std::function<void(QLabel&)> before;
   std::function<void(QLabel&)> after = [](QLabel&) {};
 };
 
-const Case cases[] = {
+const PageCase pageCases[] = {
     {"as it is", [](QLabel&) {}},
     {"wrapped", [](QLabel& label) { label.setWordWrap(true); }},
     {"wrapped afterwards", [](QLabel&) {}, [](QLabel& label) { label.setWordWrap(true); }},
@@ -85,7 +85,7 @@ struct Painted : QObject {
   int count = 0;
 };
 
-class DrawnLabels : public testing::TestWithParam<Case> {};
+class DrawnLabels : public testing::TestWithParam<PageCase> {};
 
 TEST_P(DrawnLabels, LookAsTheyWouldByThemselves) {
   QLabel drawn;
@@ -110,7 +110,7 @@ TEST_P(DrawnLabels, LookAsTheyWouldByThemselves) {
   EXPECT_EQ(byLabel.count == 0, LabelPage::canDraw(drawn));
 }
 
-INSTANTIATE_TEST_SUITE_P(Qt, DrawnLabels, testing::ValuesIn(cases), [](const auto& test) {
+INSTANTIATE_TEST_SUITE_P(Qt, DrawnLabels, testing::ValuesIn(pageCases), [](const auto& test) {
   std::string name = test.param.name;
   std::replace(name.begin(), name.end(), ' ', '_');
   return name;

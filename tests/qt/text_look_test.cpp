@@ -24,7 +24,7 @@ AttributedString redText(const std::string& text = "Some text") {
   return AttributedString(text, {.font = Font{"Helvetica", 18}, .foregroundColor = colors::red});
 }
 
-std::vector<std::unique_ptr<QWidget>> everyKind() {
+std::vector<std::unique_ptr<QWidget>> everyTextKind() {
   std::vector<std::unique_ptr<QWidget>> widgets;
   widgets.push_back(std::make_unique<QLabel>());
   widgets.push_back(std::make_unique<QLineEdit>());
@@ -35,7 +35,7 @@ std::vector<std::unique_ptr<QWidget>> everyKind() {
 }
 
 TEST(TextLook, ReadsBackTheVeryTextThatWasShown) {
-  for (const auto& widget : everyKind()) {
+  for (const auto& widget : everyTextKind()) {
     SCOPED_TRACE(widget->metaObject()->className());
     for (const char* plain : {"", "a & b", "<b>no tag</b>", "&amp;", "Größe"}) {
       showText(*widget, plain);
@@ -64,7 +64,7 @@ TEST(TextLook, KnowsWhenTheHostHasChangedTheText) {
 }
 
 TEST(TextLook, DrawsColoursEverywhereButInLineEdits) {
-  for (const auto& widget : everyKind()) {
+  for (const auto& widget : everyTextKind()) {
     SCOPED_TRACE(widget->metaObject()->className());
     showText(*widget, redText());
     const int once = countPixels(pictureOf(*widget), isReddish);
@@ -99,7 +99,7 @@ TEST(TextLook, LeavesTheWayALabelReadsItsTextAloneUnlessItMatters) {
 }
 
 TEST(TextLook, GreysTextOfDisabledWidgetsAndBack) {
-  for (const auto& widget : everyKind()) {
+  for (const auto& widget : everyTextKind()) {
     if (qobject_cast<QLineEdit*>(widget.get())) continue;
     SCOPED_TRACE(widget->metaObject()->className());
     showText(*widget, redText());
@@ -138,7 +138,7 @@ TEST(TextLook, MirrorsNaturalTextOnly) {
 }
 
 TEST(TextLook, LeavesNothingOnTheWidgetWithPlainText) {
-  for (const auto& widget : everyKind()) {
+  for (const auto& widget : everyTextKind()) {
     SCOPED_TRACE(widget->metaObject()->className());
     const auto children = widget->children().size();
     showText(*widget, redText());

@@ -1,7 +1,5 @@
 // The command `convert`: which format it writes, and that a failure leaves no file worse than it
 // was.
-#include "tools/convert_command.hpp"
-
 #include <gtest/gtest.h>
 
 #include <filesystem>
@@ -17,6 +15,7 @@
 #include "toolkit/property_list/collections.hpp"
 #include "toolkit/property_list/reader.hpp"
 #include "toolkit/property_list/scalars.hpp"
+#include "tools/commands.hpp"
 
 namespace tools {
 namespace {
@@ -34,7 +33,7 @@ class ConvertCommand : public testing::Test {
 
   Result convert(std::vector<std::string> arguments) const {
     arguments.insert(arguments.begin(), "convert");
-    return run(addConvertCommand, arguments);
+    return run(convertCommand, arguments);
   }
   /// A binary file with what XML has no way to write.
   void writeUnwritable() const {

@@ -1,6 +1,4 @@
 // The command `dump`: what it prints of every kind of value, and what it refuses.
-#include "tools/dump_command.hpp"
-
 #include <gtest/gtest.h>
 
 #include <sstream>
@@ -12,6 +10,7 @@
 #include "toolkit/property_list/binary_writer.hpp"
 #include "toolkit/property_list/collections.hpp"
 #include "toolkit/property_list/scalars.hpp"
+#include "tools/commands.hpp"
 #include "tools/readable_dump.hpp"
 
 namespace tools {
@@ -31,7 +30,7 @@ class DumpCommand : public testing::Test {
     directory_.write("file.plist", contents);
     std::vector<std::string> arguments{"dump", "file.plist"};
     arguments.insert(arguments.end(), options.begin(), options.end());
-    return run(addDumpCommand, arguments);
+    return run(dumpCommand, arguments);
   }
 
  private:
@@ -130,7 +129,7 @@ TEST_F(DumpCommand, tellsWhyAFileIsRefused) {
     EXPECT_EQ(result.status, 1);
     EXPECT_EQ(result.out, "");
   }
-  EXPECT_EQ(run(addDumpCommand, {"dump", "none.plist"}).status, 2);
+  EXPECT_EQ(run(dumpCommand, {"dump", "none.plist"}).status, 2);
 }
 
 TEST_F(DumpCommand, takesTheDeepestNestingAndRefusesSharingWithoutBound) {

@@ -1,19 +1,16 @@
 // The command line of `qz-walkthrough play`: exit statuses, and one line for whatever is wrong.
-#include "tools/play_command.hpp"
-
 #include <gtest/gtest.h>
 
 #include <iostream>
 
 #include "play_files.hpp"
 #include "tool_run.hpp"
+#include "tools/commands.hpp"
 
 namespace tools {
 namespace {
 
-Result run(const std::vector<std::string>& arguments) {
-  return tools::run(addPlayCommand, arguments);
-}
+Result run(const std::vector<std::string>& arguments) { return tools::run(playCommand, arguments); }
 
 /// A directory with a script whose list 1 does nothing.
 class PlayCommand : public testing::Test {
@@ -123,7 +120,7 @@ TEST_F(PlayCommand, anOutputThatCannotBeWrittenIsOneLine) {
   const Captured err(std::cerr);
   const Captured out(std::cout);
   std::cout.setstate(std::ios::badbit);
-  const int status = runTool({"play", "script.plist", "--toolkit", "memory"}, {addPlayCommand});
+  const int status = runTool({"play", "script.plist", "--toolkit", "memory"}, {playCommand});
   std::cout.clear();
   EXPECT_EQ(status, 1);
   EXPECT_TRUE(err.text().ends_with("qz-walkthrough: standard output cannot be written\n"))

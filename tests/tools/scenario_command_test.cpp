@@ -12,9 +12,9 @@
 
 #include "play_files.hpp"
 #include "tool_run.hpp"
+#include "tools/commands.hpp"
 #include "tools/drivers.hpp"
 #include "tools/suggestions.hpp"
-#include "tools/test_command.hpp"
 
 namespace tools {
 namespace {
@@ -31,8 +31,8 @@ std::string withoutFolder(std::string text) {
 }
 
 /// Runs the tool; the folder of the test's files is left out of what it printed.
-Result run(const std::vector<std::string>& arguments) {
-  Result result = tools::run(addTestCommand, arguments);
+Result runTest(const std::vector<std::string>& arguments) {
+  Result result = run(testCommand, arguments);
   return {result.status, withoutFolder(std::move(result.out)),
           withoutFolder(std::move(result.err))};
 }
@@ -50,7 +50,7 @@ class ScenarioCommand : public testing::Test {
 };
 
 TEST_F(ScenarioCommand, printsFailuresAndCounts) {
-  const auto result = run({"test", data + "failing.walk"});
+  const auto result = runTest({"test", data + "failing.walk"});
   EXPECT_EQ(result.status, 1);
   EXPECT_EQ(result.err, "");
   EXPECT_EQ(result.out,
@@ -68,7 +68,7 @@ TEST_F(ScenarioCommand, printsFailuresAndCounts) {
 }
 
 TEST_F(ScenarioCommand, aFileThatIsOneScenario) {
-  const auto result = run({"test", data + "whole-file.walk"});
+  const auto result = runTest({"test", data + "whole-file.walk"});
   EXPECT_EQ(result.status, 1);
   EXPECT_EQ(result.out,
             "whole-file.walk:3: expected \"7\", got \"0\"\n    expect state 7\n"
@@ -77,14 +77,14 @@ TEST_F(ScenarioCommand, aFileThatIsOneScenario) {
 
 TEST_F(ScenarioCommand, whatPassesIsOnlyCounted) {
   write("a.walk", "engine\nexpect state 0\n");
-  const auto result = run({"test", "a.walk", "a.walk"});
+  const auto result = runTest({"test", "a.walk", "a.walk"});
   EXPECT_EQ(result.status, 0);
   EXPECT_EQ(result.out, "1 passed, 0 failed\n");
 }
 
 TEST_F(ScenarioCommand, nothingRunsWhenAFileIsRefused) {
   const auto result =
-      run({"test", data + "failing.walk", data + "refused.walk", data + "none.walk"});
+      runTest({"test", data + "failing.walk", data + "refused.walk", data + "none.walk"});
   EXPECT_EQ(result.status, 2);
   EXPECT_EQ(result.out, "");
   EXPECT_EQ(result.err,
@@ -96,27 +96,28 @@ TEST_F(ScenarioCommand, directoriesStandForTheScenariosBelow) {
   write("b/two.walk", "engine\nexpect state 1\n");
   write("a.walk", "engine\nexpect state 2\n");
   write("b/notes.txt", "no scenario");
-  const auto result = run({"test", "."});
+  const auto result = runTest({"test", "."});
   EXPECT_EQ(result.status, 1);
   EXPECT_EQ(result.out,
             "./a.walk:2: expected \"2\", got \"0\"\n    expect state 2\n"
             "./b/two.walk:2: expected \"1\", got \"0\"\n    expect state 1\n"
             "0 passed, 2 failed\n");
   fs::create_directories("empty");
-  EXPECT_EQ(run({"test", "empty"}).err, "empty: no .walk file in or below this directory\n");
+  EXPECT_EQ(runTest({"test", "empty"}).err, "empty: no .walk file in or below this directory\n");
 }
 
 TEST_F(ScenarioCommand, listsAndFilters) {
-  const auto list = run({"test", "--list", "--filter", "fails", data + "failing.walk"});
+  const auto list = runTest({"test", "--list", "--filter", "fails", data + "failing.walk"});
   EXPECT_EQ(list.status, 0);
   EXPECT_EQ(list.out,
             "failing.walk:9: this one fails\n"
             "failing.walk:13: this one fails in the common beginning's wake\n");
-  EXPECT_EQ(run({"test", "--filter", "passes", data + "failing.walk"}).out, "1 passed, 0 failed\n");
+  EXPECT_EQ(runTest({"test", "--filter", "passes", data + "failing.walk"}).out,
+            "1 passed, 0 failed\n");
 }
 
 TEST_F(ScenarioCommand, aFilterThatNothingFitsFails) {
-  const auto result = run({"test", "--filter", "nothing", data + "failing.walk"});
+  const auto result = runTest({"test", "--filter", "nothing", data + "failing.walk"});
   EXPECT_EQ(result.status, 2);
   EXPECT_EQ(result.err, "qz-walkthrough: no scenario has \"nothing\" in its title\n");
 }
@@ -125,7 +126,7 @@ TEST_F(ScenarioCommand, verboselyEveryStatementIsPrinted) {
   write("a.walk",
         "window w\nengine\nadopt w => NO\nfind 5 => none\n"
         "compound FLASH_ID [] for 1 => raises\n");
-  EXPECT_EQ(run({"test", "--verbose", "a.walk"}).out,
+  EXPECT_EQ(runTest({"test", "--verbose", "a.walk"}).out,
             "# a.walk\n"
             "a.walk:1: window w  [ok]\n"
             "a.walk:2: engine  [ok]\n"
@@ -138,7 +139,7 @@ TEST_F(ScenarioCommand, verboselyEveryStatementIsPrinted) {
 
 TEST_F(ScenarioCommand, whatWouldDisturbATerminalIsWrittenOut) {
   write("a.walk", "engine\nexpect state \"\u009b\"\nscenario x\nengine\n");
-  EXPECT_EQ(run({"test", "a.walk"}).out,
+  EXPECT_EQ(runTest({"test", "a.walk"}).out,
             "a.walk:2: expected \"\\u{9b}\", got \"0\"\n    expect state \"\\u{9b}\"\n"
             "    in a.walk:3: x\n0 passed, 1 failed\n");
 }
@@ -164,7 +165,7 @@ TEST_F(ScenarioCommand, badUsageIsOneLine) {
       {{"test"}, "FILE is required; see qz-walkthrough test --help"},
   };
   for (const auto& test : cases) {
-    const auto result = run(test.arguments);
+    const auto result = runTest(test.arguments);
     EXPECT_EQ(result.status, 2) << test.line;
     EXPECT_EQ(result.err, "qz-walkthrough: " + test.line + "\n");
     EXPECT_EQ(result.out, "");
@@ -172,7 +173,7 @@ TEST_F(ScenarioCommand, badUsageIsOneLine) {
 }
 
 TEST_F(ScenarioCommand, writesAReport) {
-  EXPECT_EQ(run({"test", "--junit", "report.xml", data + "failing.walk"}).status, 1);
+  EXPECT_EQ(runTest({"test", "--junit", "report.xml", data + "failing.walk"}).status, 1);
   std::stringstream xml;
   xml << std::ifstream("report.xml").rdbuf();
   const std::regex suite(
@@ -190,7 +191,7 @@ TEST_F(ScenarioCommand, resourceDirectoriesAreRemoved) {
   // A directory of our own, for other tests may be running.
   const auto before = fs::temp_directory_path();
   ::setenv("TMPDIR", fs::absolute("temporary").c_str(), 1);
-  const auto result = run({"test", "a.walk"});
+  const auto result = runTest({"test", "a.walk"});
   ::setenv("TMPDIR", before.c_str(), 1);
   EXPECT_NE(result.out.find("1 passed, 1 failed\n"), std::string::npos) << result.out;
   EXPECT_TRUE(fs::is_empty("temporary"));
@@ -200,7 +201,7 @@ TEST_F(ScenarioCommand, withoutADirectoryForTemporaryFilesNothingRuns) {
   write("a.walk", "engine\n");
   const auto before = fs::temp_directory_path();
   ::setenv("TMPDIR", fs::absolute("nowhere").c_str(), 1);
-  const auto result = run({"test", "a.walk"});
+  const auto result = runTest({"test", "a.walk"});
   ::setenv("TMPDIR", before.c_str(), 1);
   EXPECT_EQ(result.status, 1);
   EXPECT_TRUE(

@@ -33,7 +33,7 @@ struct Result {
 };
 
 /// Runs the tool as if it had this one command.
-inline Result run(AddCommand command, const std::vector<std::string>& arguments) {
+inline Result run(const CommandEntry& command, const std::vector<std::string>& arguments) {
   const Captured out(std::cout);
   const Captured err(std::cerr);
   const int status = runTool(arguments, {command});

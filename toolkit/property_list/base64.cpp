@@ -7,15 +7,15 @@
 namespace toolkit {
 namespace {
 
-constexpr std::string_view digits =
+constexpr std::string_view base64Digits =
     "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
 constexpr std::size_t bytesPerLine = 51;  // 68 digits
 
 constexpr std::array<std::int8_t, 128> makeValues() {
   std::array<std::int8_t, 128> values{};
   values.fill(-1);
-  for (std::size_t i = 0; i < digits.size(); ++i) {
-    values[static_cast<unsigned char>(digits[i])] = static_cast<std::int8_t>(i);
+  for (std::size_t i = 0; i < base64Digits.size(); ++i) {
+    values[static_cast<unsigned char>(base64Digits[i])] = static_cast<std::int8_t>(i);
   }
   values['='] = 0;
   return values;
@@ -58,7 +58,7 @@ void encodeBase64(std::string_view bytes, std::string_view lineStart, std::strin
       bits = (bits << 8) | (i < group.size() ? static_cast<unsigned char>(group[i]) : 0U);
     }
     for (std::size_t i = 0; i < 4; ++i) {
-      text += i <= group.size() ? digits[(bits >> (18 - 6 * i)) & 63] : '=';
+      text += i <= group.size() ? base64Digits[(bits >> (18 - 6 * i)) & 63] : '=';
     }
   }
 }

@@ -7,6 +7,8 @@
 #include <cstdint>
 #include <cstdio>
 
+#include "toolkit/ascii.hpp"
+
 namespace toolkit {
 namespace {
 
@@ -16,8 +18,6 @@ constexpr std::int64_t referenceDay = 730791;  // 2001-01-01, counted from 0000-
 // Later years than this are taken for it: there a double tells no days apart any more.
 constexpr std::int64_t latestYear = 1'000'000'000'000;
 constexpr double exactSeconds = 9007199254740992.0;  // 2^53: up to here a double counts by ones
-
-bool isDigit(char c) { return c >= '0' && c <= '9'; }
 
 bool isLeap(std::int64_t year) { return year % 4 == 0 && (year % 100 != 0 || year % 400 == 0); }
 

@@ -1,25 +1,17 @@
 // What `Value::description` answers.
 #include <algorithm>
-#include <array>
-#include <charconv>
 #include <string>
 #include <string_view>
 
 #include "toolkit/property_list/calendar.hpp"
 #include "toolkit/property_list/collections.hpp"
+#include "toolkit/property_list/decimal.hpp"
 #include "toolkit/property_list/old_style_tokens.hpp"
 #include "toolkit/property_list/scalars.hpp"
 #include "toolkit/property_list/walk.hpp"
 
 namespace toolkit {
 namespace {
-
-template <class Numeric>
-std::string decimal(Numeric number) {
-  std::array<char, 32> buffer;
-  const auto [end, error] = std::to_chars(buffer.data(), buffer.data() + buffer.size(), number);
-  return {buffer.data(), end};
-}
 
 std::string describe(const Number& number) {
   switch (number.type()) {
@@ -53,7 +45,7 @@ bool isBare(std::string_view text) {
          std::all_of(text.begin(), text.end(), isBareCharacter);
 }
 
-std::string quoted(std::string_view text) {
+std::string quotedForOldStyle(std::string_view text) {
   if (isBare(text)) return std::string(text);
   std::string result = "\"";
   for (const char c : text) {
@@ -92,7 +84,7 @@ struct Describer {
 
   void scalar(const Value& value) {
     const std::string description = describeScalar(value);
-    text += value.kind() == Value::Kind::string ? quoted(description) : description;
+    text += value.kind() == Value::Kind::string ? quotedForOldStyle(description) : description;
   }
 
   void open(const Value& collection) {

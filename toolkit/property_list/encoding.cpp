@@ -17,7 +17,7 @@ struct Mark {
 };
 
 /// What the first bytes say about the encoding; it wins over any declaration.
-std::optional<Mark> byteOrderMark(std::string_view file) {
+std::optional<Mark> byteOrderMarkOf(std::string_view file) {
   using namespace std::string_view_literals;
   constexpr auto little = std::endian::little;
   constexpr auto big = std::endian::big;
@@ -116,7 +116,7 @@ DecodedText decodeDeclared(std::string_view file, std::string_view name) {
 }  // namespace
 
 DecodedText decodeText(std::string_view file) {
-  if (const auto mark = byteOrderMark(file)) return decodeMarked(file, *mark);
+  if (const auto mark = byteOrderMarkOf(file)) return decodeMarked(file, *mark);
   const auto name = declaredName(file);
   if (name && !isUtf8Name(*name)) return decodeDeclared(file, *name);
   DecodedText decoded;

@@ -54,7 +54,7 @@ bool isBetween(unsigned byte, unsigned first, unsigned last) {
 /// Decodes a text in which bytes below 0x80 are ASCII; `decode` reads a character from its first
 /// byte and those that follow, or finds none.
 template <class Decode>
-std::size_t decodeText(std::string_view bytes, std::string& text, Decode decode) {
+std::size_t decodeWith(std::string_view bytes, std::string& text, Decode decode) {
   Bytes rest(bytes);
   while (!rest.empty()) {
     const std::size_t start = rest.taken();
@@ -67,7 +67,7 @@ std::size_t decodeText(std::string_view bytes, std::string& text, Decode decode)
 }
 
 std::size_t decodeLatin1(std::string_view, std::string_view bytes, std::string& text) {
-  return decodeText(bytes, text, [](unsigned byte, Bytes&) -> char32_t { return byte; });
+  return decodeWith(bytes, text, [](unsigned byte, Bytes&) -> char32_t { return byte; });
 }
 
 /// A name as names are compared: case and punctuation do not count.
@@ -99,7 +99,7 @@ const SingleByteEncoding* singleByteEncoding(std::string_view name) {
 
 std::size_t decodeSingleByte(std::string_view encoding, std::string_view bytes, std::string& text) {
   const std::u16string_view upperHalf = singleByteEncoding(encoding)->upperHalf;
-  return decodeText(bytes, text, [&](unsigned byte, Bytes&) { return at(upperHalf, byte - 0x80); });
+  return decodeWith(bytes, text, [&](unsigned byte, Bytes&) { return at(upperHalf, byte - 0x80); });
 }
 
 /// Four bytes of GB18030 count the code points that two bytes leave out.
@@ -117,7 +117,7 @@ char32_t gb18030CodePoint(std::size_t number) {
 }
 
 std::size_t decodeGb18030(std::string_view, std::string_view bytes, std::string& text) {
-  return decodeText(bytes, text, [](unsigned first, Bytes& rest) -> char32_t {
+  return decodeWith(bytes, text, [](unsigned first, Bytes& rest) -> char32_t {
     if (!isBetween(first, 0x81, 0xFE)) return none;
     const unsigned second = rest.take();
     if (isBetween(second, 0x40, 0x7E)) return at(gb18030, first - 0x81, second - 0x40);
@@ -138,7 +138,7 @@ char32_t halfWidthKatakana(unsigned byte) {
 }
 
 std::size_t decodeShiftJis(std::string_view, std::string_view bytes, std::string& text) {
-  return decodeText(bytes, text, [](unsigned first, Bytes& rest) -> char32_t {
+  return decodeWith(bytes, text, [](unsigned first, Bytes& rest) -> char32_t {
     if (const char32_t katakana = halfWidthKatakana(first); katakana != none) return katakana;
     if (!isBetween(first, 0x81, 0x9F) && !isBetween(first, 0xE0, 0xFC)) return none;
     const unsigned row = first - (first < 0xA0 ? 0x81 : 0xC1);
@@ -149,7 +149,7 @@ std::size_t decodeShiftJis(std::string_view, std::string_view bytes, std::string
 }
 
 std::size_t decodeEucJp(std::string_view, std::string_view bytes, std::string& text) {
-  return decodeText(bytes, text, [](unsigned first, Bytes& rest) -> char32_t {
+  return decodeWith(bytes, text, [](unsigned first, Bytes& rest) -> char32_t {
     const bool isThreeBytes = first == 0x8F;
     if (first == 0x8E) return halfWidthKatakana(rest.take());
     if (isThreeBytes) first = rest.take();
@@ -163,7 +163,7 @@ std::size_t decodeEucJp(std::string_view, std::string_view bytes, std::string& t
 }
 
 std::size_t decodeBig5(std::string_view, std::string_view bytes, std::string& text) {
-  return decodeText(bytes, text, [](unsigned first, Bytes& rest) -> char32_t {
+  return decodeWith(bytes, text, [](unsigned first, Bytes& rest) -> char32_t {
     if (!isBetween(first, 0x81, 0xFE)) return none;
     const unsigned second = rest.take();
     if (isBetween(second, 0x40, 0x7E)) return at(big5, first - 0x81, second - 0x40);
@@ -172,7 +172,7 @@ std::size_t decodeBig5(std::string_view, std::string_view bytes, std::string& te
 }
 
 std::size_t decodeEucKr(std::string_view, std::string_view bytes, std::string& text) {
-  return decodeText(bytes, text, [](unsigned first, Bytes& rest) -> char32_t {
+  return decodeWith(bytes, text, [](unsigned first, Bytes& rest) -> char32_t {
     if (!isBetween(first, 0x81, 0xFE)) return none;
     const unsigned second = rest.take();
     return isBetween(second, 0x41, 0xFE) ? at(eucKr, first - 0x81, second - 0x41) : none;

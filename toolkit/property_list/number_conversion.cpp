@@ -6,12 +6,13 @@
 #include <string>
 #include <system_error>
 
+#include "toolkit/ascii.hpp"
+
 namespace toolkit {
 namespace {
 
 constexpr std::size_t longestRealName = 9;  // "-infinity"
 
-bool isDigit(char c) { return c >= '0' && c <= '9'; }
 bool isSign(char c) { return c == '+' || c == '-'; }
 
 std::size_t digitCount(std::string_view text) {

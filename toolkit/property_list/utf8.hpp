@@ -10,6 +10,9 @@
 
 namespace toolkit {
 
+/// U+FEFF, which at the start of a file says that UTF-8 follows.
+constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
+
 /// How many bytes at the start of `text` are valid UTF-8 as Unicode defines it: no overlong forms,
 /// no surrogates, nothing above U+10FFFF. All of `text` when that is its size.
 std::size_t validUtf8Length(std::string_view text);

@@ -9,7 +9,6 @@
 namespace toolkit {
 namespace {
 
-constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
 constexpr int mostReferenceDigits = 8;
 
 std::string shown(char c) {

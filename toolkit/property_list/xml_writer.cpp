@@ -1,7 +1,5 @@
 #include "toolkit/property_list/xml_writer.hpp"
 
-#include <array>
-#include <charconv>
 #include <cmath>
 #include <string_view>
 #include <vector>
@@ -9,6 +7,7 @@
 #include "toolkit/exception.hpp"
 #include "toolkit/property_list/base64.hpp"
 #include "toolkit/property_list/calendar.hpp"
+#include "toolkit/property_list/decimal.hpp"
 #include "toolkit/property_list/format_readers.hpp"
 #include "toolkit/property_list/scalars.hpp"
 #include "toolkit/property_list/utf8.hpp"
@@ -23,14 +22,6 @@ constexpr std::string_view header =
     "\"http://www.apple.com/DTDs/PropertyList-1.0.dtd\">\n"
     "<plist version=\"1.0\">\n";
 constexpr std::string_view uidKey = "CF$UID";
-constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
-
-template <class Numeric>
-std::string decimal(Numeric number) {
-  std::array<char, 32> buffer;
-  const auto [end, error] = std::to_chars(buffer.data(), buffer.data() + buffer.size(), number);
-  return {buffer.data(), end};
-}
 
 bool isArchiverUid(const Dictionary& dictionary) {
   const ValueRef<Number> number = asNumber(dictionary.objectForKey(uidKey));

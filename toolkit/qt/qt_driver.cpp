@@ -22,6 +22,7 @@
 
 #include "toolkit/qt/accessibility.hpp"
 #include "toolkit/qt/button_look.hpp"
+#include "toolkit/qt/make_driver.hpp"
 #include "toolkit/qt/strings.hpp"
 #include "toolkit/qt/text_look.hpp"
 #include "toolkit/qt/views.hpp"
@@ -215,7 +216,17 @@ void QtDriver::click(const Ref<View>& view) {
 }
 
 void QtDriver::advance(double seconds) {
-  PacedClock::Going going(clock_, seconds > 0 ? seconds : 0);
+  if (realTime_) {
+    wait(std::max(seconds, 0.0));
+  } else {
+    jump(std::max(seconds, 0.0));
+  }
+  settle();
+  raiseWhatWasThrown();
+}
+
+void QtDriver::wait(double seconds) {
+  PacedClock::Going going(clock_, seconds);
   toolkit_.runLoop().wake();
   while (!going.isOver() && !thrown_) {
     // The loop waits for events; one of them is that the time is up.
@@ -225,12 +236,21 @@ void QtDriver::advance(double seconds) {
     end.start(std::chrono::milliseconds(std::lround(std::ceil(going.left() * 1000))));
     QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
   }
-  if (!thrown_) {
+  if (thrown_) return;
+  toolkit_.runLoop().wake();
+  going.finish();
+}
+
+// Between two firings Qt has its turn, as it would while the time passes.
+void QtDriver::jump(double seconds) {
+  const double end = clock_.now() + seconds;
+  double next = 0;
+  do {
+    next = std::min(toolkit_.runLoop().nextDue().value_or(end), end);
+    clock_.reach(next);
     toolkit_.runLoop().wake();
-    going.finish();
-  }
-  settle();
-  raiseWhatWasThrown();
+    settle();
+  } while (next < end && !thrown_);
 }
 
 // What was posted is done, what changed is painted, and what is to be deleted is gone.

@@ -3,7 +3,6 @@
 
 #include <exception>
 #include <functional>
-#include <memory>
 
 #include "toolkit/qt/paced_clock.hpp"
 #include "toolkit/qt/qt_toolkit.hpp"
@@ -31,8 +30,9 @@ class QtDriver final : public TestDriver {
 
   /// Presses and releases the mouse button there.
   void click(const Ref<View>& view) override;
-  /// Waits, while Qt's event loop runs. The clock stands still at other times.
+  /// The clock stands still at other times.
   void advance(double seconds) override;
+  void useRealTime() override { realTime_ = true; }
 
   bool hasPerson() const override;
   void handOver(const std::function<void(const Ref<View>&)>& willAct,
@@ -45,6 +45,8 @@ class QtDriver final : public TestDriver {
   void setLogSink(std::function<void(std::string_view)> sink) override;
 
  private:
+  void wait(double seconds);
+  void jump(double seconds);
   void settle();
   void raiseWhatWasThrown();
 
@@ -53,13 +55,11 @@ class QtDriver final : public TestDriver {
     ~Sweep();
   };
 
+  bool realTime_ = false;
   PacedClock clock_;
   const Sweep atTheEnd_{};
   std::exception_ptr thrown_;  // by what the last click or advance led to
   QtToolkit toolkit_{clock_};
 };
-
-/// A driver with a Qt toolkit of its own.
-std::unique_ptr<TestDriver> makeQtDriver();
 
 }  // namespace toolkit::qt

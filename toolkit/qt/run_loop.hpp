@@ -21,6 +21,7 @@ class QtRunLoop final : public TimedRunLoop {
 
   Ref<Timer> schedule(double interval, bool repeats, TimerAction action) override;
   double now() const override { return clock_.now(); }
+  using TimedRunLoop::nextDue;
 
   /// Fires what is due, and looks at the clock afresh: it may go faster or slower than before.
   void wake();

@@ -27,19 +27,19 @@ constexpr Names<static_cast<std::size_t>(Attribute::unknown)> attributeNames = {
     "align", "bgcolor", "color", "face", "href",  "link", "size",
     "start", "style",   "text",  "type", "value", "vlink"};
 
-constexpr std::size_t longestName = 10;
+constexpr std::size_t longestTag = 10;
 
 /// A name as one number, six bits a character, whatever its case, so that names compare at once and
 /// in their order. 0 of what is no name: one that is too long, or has other characters than letters
 /// and digits.
 constexpr std::uint64_t packed(std::string_view name) {
-  if (name.size() > longestName) return 0;
+  if (name.size() > longestTag) return 0;
   std::uint64_t number = 0;
   for (const char c : name) {
     if (!isLetter(c) && !isDigit(c)) return 0;
     number = number << 6 | static_cast<unsigned>(isDigit(c) ? c - '0' + 1 : lowered(c) - 'a' + 11);
   }
-  return number << 6 * (longestName - name.size());
+  return number << 6 * (longestTag - name.size());
 }
 
 template <std::size_t N>

@@ -17,8 +17,6 @@ constexpr bool isSpace(char c) {
   return c == ' ' || c == '\t' || c == '\n' || c == '\r' || c == '\f';
 }
 
-constexpr bool isDigit(char c) { return c >= '0' && c <= '9'; }
-
 using toolkit::lowered;
 
 constexpr bool isLetter(char c) { return lowered(c) >= 'a' && lowered(c) <= 'z'; }

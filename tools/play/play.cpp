@@ -131,7 +131,11 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   driver->setResourcePath(options.resources ? *options.resources : path.parent_path().string());
   connectLog(*driver, terminal);
   std::optional<Screenshots> screenshots;
-  if (options.screenshots) screenshots.emplace(*driver, *options.screenshots);
+  if (options.screenshots) {
+    screenshots.emplace(*driver, *options.screenshots);
+  } else if (driver->hasPerson()) {
+    driver->useRealTime();
+  }
   Stage stage(*driver, options, file.dictionary());
   Session session(*driver, stage, terminal.out, terminal.style,
                   screenshots ? &*screenshots : nullptr);

@@ -10,7 +10,7 @@
 namespace tools::scenario {
 namespace {
 
-bool isNameCharacter(char c) {
+bool isClassNameCharacter(char c) {
   return c == '_' || std::isalnum(static_cast<unsigned char>(c)) != 0;
 }
 
@@ -32,7 +32,7 @@ ClassNames::ClassNames(const toolkit::TestDriver& driver) {
 std::string ClassNames::unified(std::string_view text) const {
   std::string result;
   while (!text.empty()) {
-    const auto end = std::find_if_not(text.begin(), text.end(), isNameCharacter);
+    const auto end = std::find_if_not(text.begin(), text.end(), isClassNameCharacter);
     const auto length = std::max<std::size_t>(1, static_cast<std::size_t>(end - text.begin()));
     const auto word = text.substr(0, length);
     const auto found = standsFor_.find(word);

@@ -10,6 +10,7 @@
 #include "tools/scenario/unmet.hpp"
 
 namespace tools::scenario {
+namespace control_properties {
 namespace {
 
 using toolkit::ViewKind;
@@ -197,16 +198,17 @@ constexpr Property properties[] = {
 };
 
 }  // namespace
+}  // namespace control_properties
 
-std::vector<PropertyInfo> controlProperties() { return infosOf(properties); }
+std::vector<PropertyInfo> controlProperties() { return infosOf(control_properties::properties); }
 
-Reading readControlProperty(Stage& stage, const View& control, std::string_view name) {
-  return rowNamed(properties, name).read(stage, stage.driver.look(control));
+Reading readControlProperty(Stage& stage, const Cast::View& control, std::string_view name) {
+  return rowNamed(control_properties::properties, name).read(stage, stage.driver.look(control));
 }
 
-void writeControlProperty(Stage& stage, const View& control, std::string_view name,
+void writeControlProperty(Stage& stage, const Cast::View& control, std::string_view name,
                           const Wanted& value) {
-  rowNamed(properties, name).write(stage, control, value);
+  rowNamed(control_properties::properties, name).write(stage, control, value);
 }
 
 Reading showResponder(const Stage& stage, const std::shared_ptr<toolkit::Responder>& responder) {

@@ -10,6 +10,7 @@
 #include "tools/stack_guard.hpp"
 
 namespace tools::scenario {
+namespace driving {
 namespace {
 
 // --- arguments as the engine takes them; what the statement leaves out or calls `none` is absent
@@ -187,7 +188,8 @@ constexpr StatementKind table[] = {
 };
 
 }  // namespace
+}  // namespace driving
 
-std::span<const StatementKind> drivingStatements() { return table; }
+std::span<const StatementKind> drivingStatements() { return driving::table; }
 
 }  // namespace tools::scenario

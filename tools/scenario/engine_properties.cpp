@@ -9,6 +9,7 @@
 #include "tools/scenario/values.hpp"
 
 namespace tools::scenario {
+namespace engine_properties {
 namespace {
 
 // --- what the engine's types show ---
@@ -167,15 +168,16 @@ constexpr Property properties[] = {
 // clang-format on
 
 }  // namespace
+}  // namespace engine_properties
 
-std::vector<PropertyInfo> engineProperties() { return infosOf(properties); }
+std::vector<PropertyInfo> engineProperties() { return infosOf(engine_properties::properties); }
 
 std::function<Reading()> keepEngineProperty(Stage& stage, Engine& engine, std::string_view name) {
-  return rowNamed(properties, name).keep(stage, engine);
+  return rowNamed(engine_properties::properties, name).keep(stage, engine);
 }
 
 void writeEngineProperty(Stage& stage, Engine& engine, std::string_view name, const Wanted& value) {
-  rowNamed(properties, name).write(stage, engine, value);
+  rowNamed(engine_properties::properties, name).write(stage, engine, value);
 }
 
 Reading showTimer(const toolkit::Ref<toolkit::Timer>& timer) {

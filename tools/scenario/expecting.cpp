@@ -8,6 +8,7 @@
 #include "tools/scenario/wildcard.hpp"
 
 namespace tools::scenario {
+namespace expecting {
 namespace {
 
 [[noreturn]] void refuse(const Wanted& wanted, const Reading& reading) {
@@ -164,7 +165,8 @@ constexpr StatementKind table[] = {
 };
 
 }  // namespace
+}  // namespace expecting
 
-std::span<const StatementKind> expectingStatements() { return table; }
+std::span<const StatementKind> expectingStatements() { return expecting::table; }
 
 }  // namespace tools::scenario

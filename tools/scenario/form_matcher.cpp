@@ -100,11 +100,11 @@ class Attempt {
     return takeAlternative(alternatives, false) || takeAlternative(alternatives, true);
   }
 
-  bool takeAlternative(const std::vector<std::string_view>& alternatives, bool slots) {
+  bool takeAlternative(const std::vector<std::string_view>& alternatives, bool wantsSlot) {
     const auto& word = words_[next_];
     for (const auto alternative : alternatives) {
-      if (isSlot(alternative) != slots) continue;
-      if (slots ? !fits(slotNamed(alternative), word) : !word.isBare(alternative)) continue;
+      if (isSlot(alternative) != wantsSlot) continue;
+      if (wantsSlot ? !fits(slotNamed(alternative), word) : !word.isBare(alternative)) continue;
       arguments_.add(alternative, word);
       if (const auto kind = declaredBy(alternative)) declared_.emplace_back(word, *kind);
       ++next_;

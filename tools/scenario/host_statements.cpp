@@ -8,6 +8,7 @@
 #include "tools/scenario/wildcard.hpp"
 
 namespace tools::scenario {
+namespace host_statements {
 namespace {
 
 Outcome setConstant(Stage& stage, const Arguments& a) {
@@ -127,7 +128,8 @@ constexpr StatementKind table[] = {
 };
 
 }  // namespace
+}  // namespace host_statements
 
-std::span<const StatementKind> hostStatements() { return table; }
+std::span<const StatementKind> hostStatements() { return host_statements::table; }
 
 }  // namespace tools::scenario

@@ -7,11 +7,14 @@
 #include <set>
 #include <utility>
 
+#include "toolkit/ascii.hpp"
+
 namespace tools::scenario {
 namespace {
 
+using toolkit::isDigit;
+
 bool isBlank(char c) { return c == ' ' || c == '\t' || c == '\r'; }
-bool isDigit(char c) { return c >= '0' && c <= '9'; }
 bool isHexDigit(char c) { return isDigit(c) || (c >= 'a' && c <= 'f') || (c >= 'A' && c <= 'F'); }
 bool continuesCharacter(char c) { return (static_cast<unsigned char>(c) & 0xC0U) == 0x80U; }
 

@@ -12,6 +12,7 @@
 #include "tools/view_kinds.hpp"
 
 namespace tools::scenario {
+namespace setting_up {
 namespace {
 
 using toolkit::Rect;
@@ -127,7 +128,8 @@ constexpr StatementKind table[] = {
 };
 
 }  // namespace
+}  // namespace setting_up
 
-std::span<const StatementKind> settingUpStatements() { return table; }
+std::span<const StatementKind> settingUpStatements() { return setting_up::table; }
 
 }  // namespace tools::scenario

@@ -5,6 +5,7 @@
 #include "tools/scenario/text_properties.hpp"
 
 namespace tools::scenario {
+namespace window_properties {
 namespace {
 
 using toolkit::WindowPicture;
@@ -80,11 +81,13 @@ constexpr Property properties[] = {
 };
 
 }  // namespace
+}  // namespace window_properties
 
-std::vector<PropertyInfo> windowProperties() { return infosOf(properties); }
+std::vector<PropertyInfo> windowProperties() { return infosOf(window_properties::properties); }
 
-Reading readWindowProperty(Stage& stage, const Window& window, std::string_view name) {
-  return rowNamed(properties, name).read(stage, window, stage.driver.look(window));
+Reading readWindowProperty(Stage& stage, const Cast::Window& window, std::string_view name) {
+  return rowNamed(window_properties::properties, name)
+      .read(stage, window, stage.driver.look(window));
 }
 
 }  // namespace tools::scenario

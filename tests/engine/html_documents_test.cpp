@@ -1,5 +1,4 @@
-// The documents that the HTML commands hand to the toolkit's reader, to the letter. This program
-// brings a reader of its own, which the linker takes in the toolkit's place.
+// The documents that the HTML commands hand to the toolkit's reader, to the letter.
 
 #include <gtest/gtest.h>
 
@@ -8,29 +7,31 @@
 #include <string_view>
 
 #include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_driver.hpp"
-#include "toolkit/styled_text/html_reader.hpp"
-
-namespace {
-
-std::string document;  // what was handed over last
-
-}  // namespace
-
-namespace toolkit {
-
-std::optional<AttributedString> attributedStringFromHTML(std::string_view bytes, const Fonts&) {
-  document = bytes;
-  return AttributedString("read");
-}
-
-}  // namespace toolkit
+#include "toolkit/memory/memory_toolkit.hpp"
 
 namespace {
 
 using Engine = QZ_Plist_State_Parser;
 using toolkit::Number;
 using toolkit::String;
+
+/// The memory toolkit, but for its reader of HTML, which only keeps the document.
+struct DocumentKeeper final : toolkit::Toolkit {
+  toolkit::memory::MemoryToolkit memory;
+  std::string document;
+
+  toolkit::Application& application() override { return memory.application(); }
+  toolkit::RunLoop& runLoop() override { return memory.runLoop(); }
+  toolkit::Images& images() override { return memory.images(); }
+  toolkit::Fonts& fonts() override { return memory.fonts(); }
+  toolkit::Files& files() override { return memory.files(); }
+  toolkit::Log& log() override { return memory.log(); }
+  std::optional<toolkit::AttributedString> attributedStringWithHTML(
+      std::string_view bytes) override {
+    document = bytes;
+    return toolkit::AttributedString("read");
+  }
+};
 
 const std::string head =
     "<!DOCTYPE HTML PUBLIC \"-//W3C//DTD HTML 4.01 Transitional//EN\" "
@@ -44,8 +45,8 @@ const std::string tail = "</body></html>";
 
 class HtmlDocuments : public testing::Test {
  protected:
-  toolkit::memory::MemoryDriver driver;
-  std::shared_ptr<Engine> engine = Engine::init(driver.toolkit());
+  DocumentKeeper keeper;
+  std::shared_ptr<Engine> engine = Engine::init(keeper);
   const Engine::Value b = String::make("b");
   const Engine::Value font = String::make("Times");
   const Engine::ObjectId number = Number::withLong(12);
@@ -54,22 +55,22 @@ class HtmlDocuments : public testing::Test {
 TEST_F(HtmlDocuments, AreTheFragmentBetweenFixedTexts) {
   EXPECT_TRUE(
       engine->QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML(b, font, number, number));
-  EXPECT_EQ(document, plain + "b" + tail);
+  EXPECT_EQ(keeper.document, plain + "b" + tail);
   EXPECT_TRUE(
       engine->QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(false, b, font, number, number));
-  EXPECT_EQ(document, plain + "b" + tail);
+  EXPECT_EQ(keeper.document, plain + "b" + tail);
   EXPECT_TRUE(
       engine->QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(true, b, font, number, number));
-  EXPECT_EQ(document, twoBlanks + "b" + tail);
+  EXPECT_EQ(keeper.document, twoBlanks + "b" + tail);
   EXPECT_TRUE(engine->QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER(
       b, font, number, number));
-  EXPECT_EQ(document, oneBlank + "b" + tail);
+  EXPECT_EQ(keeper.document, oneBlank + "b" + tail);
 }
 
 TEST_F(HtmlDocuments, OfAnAbsentFragmentSayWhatFormatsPrintForNothing) {
   EXPECT_TRUE(
       engine->QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML({}, font, number, number));
-  EXPECT_EQ(document, plain + "(null)" + tail);
+  EXPECT_EQ(keeper.document, plain + "(null)" + tail);
 }
 
 }  // namespace

@@ -1,0 +1,198 @@
+// Reading the command line with CLI11, and saying in the tool's own words what is wrong with it.
+#include "tools/command_line.hpp"
+
+#include <CLI/CLI.hpp>
+
+#include <algorithm>
+#include <utility>
+
+#include "tools/failure.hpp"
+#include "tools/suggestions.hpp"
+
+namespace tools {
+namespace {
+
+/// The command that was given, or the tool itself when there is none.
+const CLI::App& chosen(const CLI::App& app) {
+  const auto commands = app.get_subcommands();
+  return commands.empty() ? app : *commands.front();
+}
+
+/// Why no command was recognised: which there are, and what stands where one should.
+std::string commandExpected(const CLI::App& app) {
+  std::vector<std::string_view> names;
+  for (const CLI::App* command : app.get_subcommands({})) names.push_back(command->get_name());
+  const std::string list = enumerate({names.begin(), names.end()});
+  const auto rest = app.remaining();
+  if (rest.empty()) return "expected a command: " + list;
+  const bool isOption = rest.front().starts_with("-");
+  return (isOption ? "unknown option " : "unknown command ") + rest.front() + "; expected " + list +
+         didYouMean(rest.front(), names);
+}
+
+std::string unexpectedArgument(const CLI::App& command) {
+  const std::string argument = command.remaining(true).front();
+  if (!argument.starts_with("-")) return "unexpected argument " + argument;
+  const std::string name = argument.substr(0, argument.find('='));
+  std::vector<std::string> options;
+  for (const CLI::Option* option : command.get_options()) {
+    options.push_back(option->get_name(false, true));
+  }
+  return "unknown option " + name + didYouMean(name, {options.begin(), options.end()});
+}
+
+/// CLI11 says "--start: At Most 1 required but received 2" of an option that stands twice.
+std::string givenTwice(std::string words) {
+  constexpr std::string_view most = ": At Most 1 required but received ";
+  const std::size_t at = words.find(most);
+  if (at == std::string::npos) return words;
+  return words.replace(at, most.size(), ": expected once, found ") + " times";
+}
+
+/// CLI11 says "list was given a disallowed flag override" of "--list=3".
+std::string flagWithValue(std::string words) {
+  constexpr std::string_view given = " was given a disallowed flag override";
+  if (!words.ends_with(given)) return words;
+  words.resize(words.size() - given.size());
+  return "--" + words + ": expected no value";
+}
+
+/// CLI11 says "--press: 1 required TAG missing" of an option whose value is missing.
+std::string missingValue(std::string words) {
+  constexpr std::string_view required = ": 1 required ";
+  constexpr std::string_view missing = " missing";
+  const std::size_t at = words.find(required);
+  if (at == std::string::npos || !words.ends_with(missing)) return words;
+  words.erase(words.size() - missing.size());
+  return words.replace(at, required.size(), ": expected ");
+}
+
+/// What is wrong with the command line, in one line.
+std::string explain(const CLI::ParseError& error, const CLI::App& app) {
+  const CLI::App& command = chosen(app);
+  std::string words = error.what();
+  if (&command == &app) {
+    words = commandExpected(app);
+  } else if (command.remaining_size(true) > 0) {
+    // Whatever else is wrong, what is not understood comes first: it may be the reason.
+    words = unexpectedArgument(command);
+  } else if (dynamic_cast<const CLI::ArgumentMismatch*>(&error)) {
+    words = givenTwice(flagWithValue(missingValue(std::move(words))));
+  }
+  const std::string help = &command == &app ? "" : command.get_name() + " ";
+  return words + "; see " + app.get_name() + " " + help + "--help";
+}
+
+std::string whyNotPath(const std::string& argument) {
+  return argument.empty() ? "expected a path, found an empty text" : "";
+}
+
+/// Calls `take`; the library knows its own errors only.
+void hand(const Command::Take& take, const std::string& value) {
+  try {
+    take(value);
+  } catch (const UsageError& error) {
+    throw CLI::ValidationError(error.what());
+  }
+}
+
+}  // namespace
+
+Command::Option& Command::Option::valueName(const std::string& name) {
+  option_->type_name(name);
+  return *this;
+}
+
+Command::Option& Command::Option::showDefault() {
+  option_->capture_default_str();
+  return *this;
+}
+
+Command::Option& Command::Option::path() {
+  option_->check(whyNotPath);
+  return *this;
+}
+
+Command::Option& Command::Option::excludes(Option& other) {
+  option_->excludes(other.option_);
+  other.option_->excludes(option_);
+  return *this;
+}
+
+Command::Option Command::argument(const std::string& name, std::string& value,
+                                  const std::string& help) {
+  return Option(app_.add_option(name, value, help)->required()->type_name(""));
+}
+
+Command::Option Command::arguments(const std::string& name, std::vector<std::string>& values,
+                                   const std::string& help) {
+  return Option(app_.add_option(name, values, help)->required());
+}
+
+Command::Option Command::option(const std::string& name, std::string& value,
+                                const std::string& help) {
+  return Option(app_.add_option(name, value, help));
+}
+
+Command::Option Command::option(const std::string& name, std::optional<std::string>& value,
+                                const std::string& help) {
+  return Option(app_.add_option(name, value, help));
+}
+
+Command::Option Command::flag(const std::string& name, bool& value, const std::string& help) {
+  return Option(app_.add_flag(name, value, help));
+}
+
+Command::Option Command::taken(const std::string& name, Take take, const std::string& help) {
+  return Option(app_.add_option_function<std::string>(
+      name, [take](const std::string& value) { hand(take, value); }, help));
+}
+
+Command::Option Command::repeated(const std::string& name, Take take, const std::string& help) {
+  return Option(app_.add_option_function<std::string>(
+                        name, [take](const std::string& value) { hand(take, value); }, help)
+                    ->trigger_on_parse());
+}
+
+Command::Option Command::repeatedList(const std::string& name, Take take, const std::string& help) {
+  return Option(app_.add_option_function<std::vector<std::string>>(
+                        name,
+                        [take](const std::vector<std::string>& values) {
+                          for (const std::string& value : values) hand(take, value);
+                        },
+                        help)
+                    ->trigger_on_parse());
+}
+
+void Command::action(std::function<int()> run) {
+  app_.callback([run = std::move(run), &status = status_] { status = run(); });
+}
+
+int runCommandLine(const ToolHelp& help, const std::vector<CommandEntry>& commands,
+                   std::vector<std::string> arguments) {
+  CLI::App app(help.summary, help.name);
+  int status = static_cast<int>(ExitStatus::fine);
+  app.set_version_flag("--version", help.name + " " + help.version);
+  app.footer(help.exitStatuses);
+  app.get_formatter()->label("SUBCOMMAND", "COMMAND");
+  app.get_formatter()->label("Subcommands", "Commands");
+  app.require_subcommand(1);
+  app.option_defaults()
+      ->disable_flag_override();  // else "--list=3" would do, whatever it is to mean
+  for (const CommandEntry& entry : commands) {
+    Command command(*app.add_subcommand(entry.name, entry.summary), status);
+    entry.describe(command);
+  }
+  try {
+    // CLI11 takes the arguments from the back.
+    std::reverse(arguments.begin(), arguments.end());
+    app.parse(std::move(arguments));
+    return status;
+  } catch (const CLI::Success& success) {
+    return app.exit(success);  // prints the help or the version
+  } catch (const CLI::ParseError& error) {
+    throw Failure(ExitStatus::badInput, explain(error, app));
+  }
+}
+
+}  // namespace tools
