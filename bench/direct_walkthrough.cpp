@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "bench/direct_walkthrough.hpp"
 
 #include "toolkit/view.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The toolkit calls that commands come to, made directly: what running costs at least.
 #pragma once
 

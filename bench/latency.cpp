@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // From a click on a button of a real window until all that it changes is repainted: a
 // walk-through's list, beside a slot of the host's that makes the same changes by hand.
 #include <QApplication>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Loading scripts, from bytes in memory to the script dictionary, beside libplist (which yields the
 // same typed values) and pugixml (which yields text only: what reading XML costs at least).
 #include <plist/plist.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "bench/lua_walkthrough.hpp"
 
 #include <lua.hpp>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The same calls from Lua: the toolkit's operations bound one to one, as lean as a binding can be
 // (views are bare pointers, nothing is checked), and a script that calls them.
 #pragma once

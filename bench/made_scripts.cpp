@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "bench/made_scripts.hpp"
 
 namespace bench {

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Scripts to measure with, in the shape of real ones: lists under tags, of commands with texts,
 // tags and numbers.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Measuring: contenders take turns in one run, so that whatever else the machine does meets all of
 // them, and the shortest time of each counts.
 #pragma once

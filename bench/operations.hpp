@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What the contenders in running do: the same operations on the same controls, one command each.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Running command lists over few and many controls on the memory toolkit, beside the toolkit calls
 // themselves and beside Lua; a press, a tick of the flasher, discovery.
 #include <algorithm>

@@ -1,3 +1,4 @@
+# SPDX-License-Identifier: MIT
 # A compiler cache and a quick linker, where they are installed. Nothing needs them.
 include(CheckLinkerFlag)
 

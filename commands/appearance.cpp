@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The commands that change how one control looks: colours, title, tooltip, image; and its state.
 
 #include "QZ_Plist_State_Parser.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The commands that steer a run: another tag's list, the end, and the idle placeholder.
 
 #include "QZ_Plist_State_Parser.hpp"

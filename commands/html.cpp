@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Styled text from HTML: a script's fragment within one of three fixed documents.
 
 #include "QZ_Plist_State_Parser.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Plain text.
 
 #include "QZ_Plist_State_Parser.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The record that discovery keeps of each control of an adopted window.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The names of the commands, as scripts write them. A host may assign others at any time.
 
 #include "QZ_Plist_State_Parser.hpp"

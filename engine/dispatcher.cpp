@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The compound commands: one row each, which says how the parameters convert and what runs.
 
 #include <functional>

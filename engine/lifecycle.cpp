@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The engine object: construction, teardown, destruction, and what it says of itself.
 
 #include "QZ_Plist_State_Parser.hpp"

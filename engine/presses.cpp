@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Presses: the user's, and those of object timers.
 
 #include "QZ_Plist_State_Parser.hpp"

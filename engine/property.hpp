@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Property: a field of the engine that any thread may get or replace while the engine runs on its
 // own.
 //

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The command-list runner, through which every list runs, whoever starts it.
 
 #include "QZ_Plist_State_Parser.hpp"

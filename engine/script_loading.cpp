@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Loading a script and starting it, on its own or with the walk-through window as a sheet.
 
 #include <algorithm>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The simple simpleCommands: bare names that act on the control whose tag is the list's own id.
 
 #include "QZ_Plist_State_Parser.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Spin lock: for what is held for a few instructions and hardly ever waited for.
 #pragma once
 

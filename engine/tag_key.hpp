@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Tag keys: the decimal form of a tag, under which scripts and tables keep what belongs to it.
 #pragma once
 

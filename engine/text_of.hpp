@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The text of a script value that must be a string.
 #pragma once
 

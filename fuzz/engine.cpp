@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The engine, driven by any script and any presses, on the memory toolkit.
 //
 // An input is a line of what happens, a character a step, and a script in any format behind it. A

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The HTML reader: whatever it reads is a text whose runs cover it from end to end.
 #include <cstdint>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The numbers that texts stand for, beside what the C library makes of the same texts.
 #include "toolkit/property_list/number_conversion.hpp"
 

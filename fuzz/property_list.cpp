@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Property lists: what must hold of any bytes that are read as one.
 //
 // There is a fuzzer for each of the three formats, all of them this. Their seeds and dictionaries

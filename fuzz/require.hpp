@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // How a fuzzer says that something does not hold: it prints what, and ends the program, for which
 // libFuzzer keeps the input.
 #pragma once

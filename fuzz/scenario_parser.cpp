@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The parser of scenario files: scenarios, or a reason with a place in the file.
 #include <algorithm>
 #include <cstdint>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // QZ_Plist_State_Parser: plays scripted walk-throughs over the controls of a window.
 //
 // A host makes one engine, gives it a window to play over, and hands it a script: a property list

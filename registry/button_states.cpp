@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The states of pressed buttons, which a host carries from one walk-through to the next.
 
 #include "QZ_Plist_State_Parser.hpp"

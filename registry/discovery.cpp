@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Discovery: adopting a window, wiring its buttons and recording its controls.
 
 #include <algorithm>

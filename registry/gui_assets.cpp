@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // GUI-asset loading: the walk-through window and its controls, built from a description.
 
 #include "QZ_Plist_State_Parser.hpp"

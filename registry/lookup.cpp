@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Finding a control by the tag that it carries now.
 
 #include "QZ_Plist_State_Parser.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Putting back the tags that controls had when they were found.
 
 #include "QZ_Plist_State_Parser.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Replaces the program's operator new, so that any allocation can be made to fail. One file of a
 // program includes this.
 #pragma once

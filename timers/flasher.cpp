@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Flashing: one half-second timer toggles the pressed-in look of every button whose tag flashes.
 
 #include "QZ_Plist_State_Parser.hpp"

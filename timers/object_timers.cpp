@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Object timers: one-shot countdowns, one for a tag key, that press the tag's button or run its
 // list.
 

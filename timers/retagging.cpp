@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Giving a control another tag, with a timer for the new one or without.
 
 #include "QZ_Plist_State_Parser.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The application: makes windows and controls, and runs sheets.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Digits and letters of ASCII, whatever the locale.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "toolkit/exception.hpp"
 
 namespace toolkit {

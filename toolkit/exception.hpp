@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The toolkit's exceptions: what a misuse raises (a message that is not understood, a position
 // beyond an array's end, an absent argument). Only these are caught by whoever runs commands;
 // anything else, std::bad_alloc among them, passes through.

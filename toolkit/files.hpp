@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Files: the resource directory, and reading.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A name is compared in its folded form: without blanks, in lower case. What cannot be told from
 // the name alone (is "MT" an ending, or part of the family's name?) the families decide: the whole
 // name is tried as a family before anything is taken off it.

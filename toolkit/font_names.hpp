@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Fonts by the names that scripts write: what a name says, whichever fonts a toolkit has.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Rectangles. Lengths are points; the origin is at the lower left, y grows upwards.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Images, and finding them by name.
 #pragma once
 

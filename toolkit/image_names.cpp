@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The rules by which names lead to image files, and to nothing outside of the directory.
 
 #include "toolkit/image_names.hpp"

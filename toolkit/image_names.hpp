@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Finding the file of an image by the name that scripts write, whatever a toolkit makes of the
 // file.
 #pragma once

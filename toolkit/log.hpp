@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The log: where diagnostic lines go (`NSLog` on macOS).
 #pragma once
 

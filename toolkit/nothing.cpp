@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The objects behind absent references: each accepts every message, does nothing and answers zero,
 // NO, empty or absent.
 //

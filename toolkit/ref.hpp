@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Reference that may be absent: the one place where "absent is not an error" lives.
 //
 // Every type T that is referred to this way has a static `T& nothing()`: an object that accepts

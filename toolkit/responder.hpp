@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Responders: objects to which a control sends its action.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Timers and the clock that drives them.
 //
 // Invariants of every run loop: timers fire on the thread that scheduled them, between events, in

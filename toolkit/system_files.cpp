@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Files through the standard library, which reports everything by error codes here: a path that
 // cannot be looked at is a path where nothing is.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Files as the operating system has them, for toolkits that have nothing of their own.
 #pragma once
 

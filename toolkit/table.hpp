@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Tables of things that are no values (controls, timers) under string keys, and lists of them.
 //
 // Both are shared: who asks the engine for one holds the very object that the engine changes. On an

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Driving a toolkit from outside, as its user and its host do: one driver stands beside each
 // backend, so that the same scenarios and the same player run on every toolkit.
 #pragma once

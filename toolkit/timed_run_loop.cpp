@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Times are doubles, so that an interval can be as long as a script asks for (1.8e19 s) and longer.
 // A repeating timer is due at its start plus a whole number of intervals, which does not drift.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A run loop but for its clock: the queue of timers, and firing those that are due.
 //
 // Invariants: the queue holds exactly the valid timers that are not firing at this moment, by the

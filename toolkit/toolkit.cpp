@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What a toolkit does when its platform has nothing of its own for it.
 
 #include "toolkit/toolkit.hpp"

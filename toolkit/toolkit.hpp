@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A toolkit: the roles through which the engine reaches its platform, in one hand.
 #pragma once
 

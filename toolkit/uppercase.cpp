@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "toolkit/uppercase.hpp"
 
 #include <algorithm>

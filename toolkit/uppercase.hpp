@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Upper case of text by Unicode's rules.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What a view answers to messages that only some kinds understand, and references to kinds of view.
 
 #include "toolkit/view.hpp"

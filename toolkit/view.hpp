@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Views and their kinds: what a window shows, and what a script drives by tag.
 //
 // A View is sent messages without being asked first what it is. What every view understands is pure

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Reading the command line with CLI11, and saying in the tool's own words what is wrong with it.
 #include "tools/command_line.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The command line of the tool: what its commands take, and reading it. The library that does the
 // reading is known to command_line.cpp only; its header takes seconds to compile.
 #pragma once

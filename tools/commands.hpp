@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The commands of qz-walkthrough. A new one is declared here and added to the list in main.cpp.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The command `convert`.
 #include <filesystem>
 #include <map>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The toolkits that this build of the tool has.
 #include "tools/drivers.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The command `dump`.
 #include <iostream>
 #include <memory>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "tools/endless_chains.hpp"
 
 #include <algorithm>

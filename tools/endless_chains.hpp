@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Endless chains: lists of a script that run each other without end.
 //
 // The engine sets no limit to chaining, so such a script exhausts the stack. Which lists do is

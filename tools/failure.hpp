@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What ends a command early: one line for the user, and the tool's exit status.
 #pragma once
 

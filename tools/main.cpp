@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // qz-walkthrough: plays and tests scripted walk-throughs, prints and converts their files.
 #include <string>
 #include <vector>

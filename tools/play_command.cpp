@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The command `play`: its options.
 #include <sys/ioctl.h>
 #include <unistd.h>

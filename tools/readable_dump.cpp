@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "tools/readable_dump.hpp"
 
 #include <cstddef>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A property list for people: one value a line, in the style of old-style property lists, with the
 // types visible.
 //

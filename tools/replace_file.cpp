@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "tools/replace_file.hpp"
 
 #include <fcntl.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Writes files so that there is always a whole one.
 #pragma once
 

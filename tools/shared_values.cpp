@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "tools/shared_values.hpp"
 
 #include <algorithm>

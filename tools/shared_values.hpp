@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Guards against binary property lists that are small but stand for more than any memory holds:
 // they may have one collection in many places, and such collections in one another.
 #pragma once

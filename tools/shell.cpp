@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The tool's shell.
 #include "tools/shell.hpp"
 

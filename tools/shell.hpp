@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The tool's shell: runs a command line, and turns whatever goes wrong into one line and an exit
 // status.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "tools/stack_guard.hpp"
 
 #include <map>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The stack guard: instead of a bare crash, one line that says which lists ran each other without
 // end.
 //

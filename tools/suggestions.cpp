@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Words that are known beside one that is not, by the distance between them.
 
 #include "tools/suggestions.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What a message about a word that nobody knows offers instead: the words that are known, and the
 // one that was probably meant.
 #pragma once

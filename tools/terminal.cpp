@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "tools/terminal.hpp"
 
 #include <unistd.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What the tool's standard output is connected to.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The command `test`.
 #include <algorithm>
 #include <filesystem>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Text in the cells of a terminal.
 #include "tools/text_layout.hpp"
 

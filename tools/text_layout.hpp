@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Text in the cells of a terminal: how wide it is, how it breaks into lines, and how to show text
 // that comes from a script without letting it move the cursor.
 //

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The kinds of view by name.
 #include "tools/view_kinds.hpp"
 

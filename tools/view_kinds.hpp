@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The kinds of view by the names that hosts' windows and scenarios write.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "tools/whole_file.hpp"
 
 #include <cerrno>

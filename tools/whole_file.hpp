@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Reading a file as a whole.
 #pragma once
 

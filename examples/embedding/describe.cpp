@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Describes a window in C++, in the form that `loadGuiAssets` reads, and has the engine build it.
 #include <iostream>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A host in one file: a window with a button and a text field, and a script that drives them.
 //
 //   embedding-example DIRECTORY     plays DIRECTORY/script.plist

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A walk-through as a sheet, twice: the second begins with the buttons as the first left them.
 //
 //   sheet-example DIRECTORY     plays DIRECTORY/script.plist

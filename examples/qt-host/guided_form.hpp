@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The form with walk-throughs in its Help menu: one over the form itself, one in a sheet.
 #pragma once
 

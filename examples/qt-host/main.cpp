@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A host with windows of its own, and walk-throughs in its Help menu.
 #include <QApplication>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The form, laid out by hand as Designer would.
 #include "order_form.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The host's own window: a form for an order of parcels. It knows nothing of walk-throughs, but for
 // the tags by which scripts name its controls.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The panel, laid out by hand.
 #include "tips_panel.hpp"
 

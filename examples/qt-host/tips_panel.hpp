@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A panel for tips, which the host shows as a sheet.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Ends come from within the engine or from within an event of the window's, neither of which would
 // survive their objects' going at once: the rest is done when Qt's event loop is back.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Walk-throughs in a Qt application, from their beginning to their end, in one call.
 //
 // It does what every host would: it holds the windows while a walk-through needs them, keeps a form

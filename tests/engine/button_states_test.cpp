@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The record of pressed buttons, as it is handed to the host: a copy that belongs to the host
 // alone.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The exported command names: all of them, and what each holds before a host changes it.
 
 #include <gtest/gtest.h>

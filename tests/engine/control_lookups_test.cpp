@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // How often HIDE, SHOW, ENABLE and DISABLE look their control up, and which finding they act on
 // when the window changes between one look-up and the next.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A window and views of a test's own, which note what they are told and can be made to misbehave.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The flasher's tick, of which the toolkit sees the order in which it asks for buttons.
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Building the walk-through window from a description: what the engine asks of the toolkit, and
 // what of it shows to nobody but the toolkit.
 

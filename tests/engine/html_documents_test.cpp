@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The documents that the HTML commands hand to the toolkit's reader, to the letter.
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The end of an engine that nobody terminated: what it stops, empties and leaves, and who kept it.
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Commands on controls that do not do as they are told: they store another text than they were
 // given, or raise. And which of them the commands ask whether they need a redraw.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The order of a press's steps, and timers that are none of the engine's.
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The command processors called by a host itself, with arguments that no script can give them.
 
 #include <gtest/gtest.h>

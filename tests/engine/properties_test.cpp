@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The engine's properties: what a getter hands out, and that any thread may use them.
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Re-tagging with a timer: the timer's seconds are the identity of the parameter, not its number.
 
 #include <gtest/gtest.h>

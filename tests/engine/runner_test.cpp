@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The runner: which exceptions it catches, and lists that no scenario can write.
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Loading: scripts without a name, with keys that are no strings, and what may be changed in them.
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Putting back tags: which controls are told their tag.
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The order in which a termination takes things down, seen by what is called on the way.
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Upper case by the rules of Unicode: every class of letter, and whatever is no letter.
 
 #include "toolkit/uppercase.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Ids and numbers that only 64 bits hold: where the engine takes all of them, and where 32.
 
 #include <gtest/gtest.h>

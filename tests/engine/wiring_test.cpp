@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Adopting and wiring what no scenario can make: gradients, a host's own class of button, windows
 // without a content view.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Absent references: every message does nothing and answers zero, NO, empty or absent.
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Controls: what they show, and what a click does to them.
 
 #include <vector>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The driver: what a host and an observer get to see through it.
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Files and the log.
 
 #include <sys/stat.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Fonts by name: the catalogue, and the names that are understood.
 
 #include "toolkit/memory/fonts.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Images by name.
 
 #include "toolkit/memory/images.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Target and action, the responder chain, and what an action may do to its sender.
 
 #include <string>

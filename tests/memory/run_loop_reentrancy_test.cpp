@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What a timer's action may do to the run loop that calls it, and how long it lives.
 
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The run loop: when timers fire, in which order, and what the clock says meanwhile.
 
 #include "toolkit/memory/run_loop.hpp"

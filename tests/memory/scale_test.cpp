@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Many views, many timers: what is done often costs little, and nothing piles up. The limits are
 // times of the processor, some ten times what unoptimised and instrumented builds take.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Sheets: attached to a parent, blocking it, and ended with their delegate told.
 
 #include <vector>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What several tests of the memory toolkit need: recorders, and a directory of their own.
 #pragma once
 

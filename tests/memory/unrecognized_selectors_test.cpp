@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Messages that a kind of view does not understand: they raise, naming the class and the selector.
 
 #include <optional>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Views: their place in the tree, and what shows of them.
 
 #include "toolkit/memory/views.hpp"

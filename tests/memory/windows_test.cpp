@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Windows: on and off the screen, their order, the key window, and who keeps them alive.
 
 #include <vector>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What becomes of reading and writing where memory runs out: std::bad_alloc, and nothing leaks.
 #include <gtest/gtest.h>
 

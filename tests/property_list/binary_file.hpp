@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Binary property lists put together object by object, for tests that need them broken.
 #pragma once
 

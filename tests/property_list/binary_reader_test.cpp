@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Binary property lists, rule by rule.
 #include <gtest/gtest.h>
 

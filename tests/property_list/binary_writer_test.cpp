@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Binary property lists as they are written: that they read back, what they refuse.
 #include "toolkit/property_list/binary_writer.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Dictionaries: order, look-up, changes, copies; small ones, and those large enough for an index.
 #include "toolkit/property_list/collections.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What values look like to a person.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The encodings of XML and old-style property lists: marked, guessed, declared.
 #include <gtest/gtest.h>
 

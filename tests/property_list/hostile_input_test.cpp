@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Bytes that mean harm, or nothing: reading them ends, soon, with a value or a refusal.
 #include <gtest/gtest.h>
 

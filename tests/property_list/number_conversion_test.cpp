@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The numbers that texts stand for, and what becomes of numbers in other types.
 #include "toolkit/property_list/number_conversion.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Old-style property lists and strings files, rule by rule.
 #include <gtest/gtest.h>
 

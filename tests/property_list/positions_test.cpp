@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Where refusals and values point.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Values made up at random, the same ones from the same seed.
 #pragma once
 

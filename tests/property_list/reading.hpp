@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What the tests of the readers have in common.
 #pragma once
 

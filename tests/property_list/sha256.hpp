@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // SHA-256, by which tables of expected results name the long ones.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What values answer to messages: their own, others', and when they are absent.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Every file of tests/data/property-lists against what the platform's own reader made of it.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // XML property lists, rule by rule: what is accepted, and what it yields.
 #include <gtest/gtest.h>
 

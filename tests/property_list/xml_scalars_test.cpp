@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Integers, reals, dates and data in XML property lists.
 #include <gtest/gtest.h>
 

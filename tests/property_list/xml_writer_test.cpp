@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // XML property lists as they are written: how they look, that they read back, what they refuse.
 #include "toolkit/property_list/xml_writer.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What assistive technology gets to know: names, descriptions, and that they changed.
 
 #include "toolkit/qt/accessibility.hpp"

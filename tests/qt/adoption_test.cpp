@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A whole walk-through over a host's window leaves the host's widgets as they were, property by
 // property, but for what the script meant to change.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What buttons show, looked at pixel by pixel.
 
 #include "toolkit/qt/button_look.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A form out of Qt Designer, in whose file the tags and the image view are dynamic properties.
 
 #include "tests/qt/support.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Which fonts the Qt toolkit knows, and what it draws them with.
 
 #include "toolkit/qt/fonts.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The example of a host: its walk-throughs come and go, and the host works on.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Images: where they lie, and how sharp they are.
 
 #include "toolkit/qt/image_look.hpp"

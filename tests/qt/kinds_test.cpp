@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Which widget is which kind of view, where it lies, and its tag; states; the keyboard's focus.
 
 #include <QCheckBox>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Labels that draw their styled text themselves look as labels do that read it in HTML.
 
 #include "toolkit/qt/label_page.hpp"

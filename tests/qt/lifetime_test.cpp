@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Widgets that the host deletes: their views are as if they were not there.
 
 #include <QCheckBox>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Tests of widgets need an application. Nobody sees its windows, unless QT_QPA_PLATFORM says where
 // to.
 

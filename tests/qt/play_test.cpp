@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Playing scripts in windows: pictures of the steps, and a person who presses what they see.
 #include "tools/play/play.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Presses by mouse and keyboard, and what adopting a button does to the host's own connections.
 
 #include <QCheckBox>

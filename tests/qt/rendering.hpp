@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Looking at what widgets draw, for tests of the Qt toolkit.
 #pragma once
 

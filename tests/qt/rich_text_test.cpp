@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Attributed strings as documents: every attribute arrives.
 
 #include "toolkit/qt/rich_text.hpp"

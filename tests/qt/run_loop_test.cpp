@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Timers on Qt's event loop.
 
 #include "toolkit/qt/run_loop.hpp"

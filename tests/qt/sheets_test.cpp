@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Sheets: what they block, how users end them, and what is left of them.
 
 #include <QPushButton>

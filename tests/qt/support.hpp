@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A host with a window of its own, for tests of the Qt toolkit.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The host's side of a walk-through: however it ends, the host learns of it and has its window
 // back.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Windows of any colour stay readable, in what is drawn and not only in what palettes say.
 
 #include "toolkit/qt/window_look.hpp"

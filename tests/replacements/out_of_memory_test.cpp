@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // An engine that runs out of memory: std::bad_alloc reaches the host, nothing leaks, and the engine
 // goes on working.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // How much memory this process uses, as the C library or the sanitizer and the kernel tell it.
 
 #include "tests/soak/memory_use.hpp"

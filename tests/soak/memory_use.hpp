@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // How much memory this process uses.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Soak test: a walk-through that goes on for a very long time, virtually, with timers, flashing,
 // presses, re-tagging and reloaded scripts, and must take no more memory for it.
 //

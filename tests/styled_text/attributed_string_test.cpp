@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Attributed strings: their runs, their edits, what they raise.
 #include "toolkit/styled_text/attributed_string.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The HTML reader: lists, tables, alignment and indents.
 #include <gtest/gtest.h>
 

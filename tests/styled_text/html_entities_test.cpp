@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The HTML reader: characters by their references and bytes.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The HTML reader on hostile input: nothing fails, nothing is lost, and time and memory are
 // proportional to the input.
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The HTML reader: links.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The HTML reader: markup that is unclosed, stray, misnested or cut short.
 #include <gtest/gtest.h>
 

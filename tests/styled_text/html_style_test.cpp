@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The HTML reader: fonts, colours and the other attributes of letters.
 #include <gtest/gtest.h>
 

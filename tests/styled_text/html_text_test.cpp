@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The HTML reader: which text a document turns into.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What the tests of styled text share: a small catalogue of fonts, and texts written out with their
 // attributes, so that a case is a line.
 #pragma once

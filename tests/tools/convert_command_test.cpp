@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The command `convert`: which format it writes, and that a failure leaves no file worse than it
 // was.
 #include <gtest/gtest.h>

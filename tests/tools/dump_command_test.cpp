@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The command `dump`: what it prints of every kind of value, and what it refuses.
 #include <gtest/gtest.h>
 

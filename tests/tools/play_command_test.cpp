@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The command line of `qz-walkthrough play`: exit statuses, and one line for whatever is wrong.
 #include <gtest/gtest.h>
 

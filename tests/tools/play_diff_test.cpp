@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What changed from one picture to the next.
 #include <gtest/gtest.h>
 

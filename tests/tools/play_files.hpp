@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Files for the tests of what the player reads, in a directory of their own.
 #pragma once
 

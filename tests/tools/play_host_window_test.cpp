@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Files that describe a host's window.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Pictures of a walk-through as text.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The lines that the user of an interactive walk-through writes.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What a walk-through is played on when no window is given, and how it is looked at.
 #include <gtest/gtest.h>
 

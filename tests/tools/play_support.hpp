@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Pictures of walk-throughs for the tests of what is said about them.
 #pragma once
 

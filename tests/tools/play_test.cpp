@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Playing scripts from the first step to the end of the transcript.
 #include "tools/play/play.hpp"
 

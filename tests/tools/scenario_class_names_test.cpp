@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Class names on a toolkit that has names of its own.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The command line of `qz-walkthrough test`: what it runs, prints and leaves behind.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What counts as the same: JSON values, log lines and patterns, class names, near misses.
 #include <gtest/gtest.h>
 

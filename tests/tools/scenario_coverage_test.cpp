@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Whether the language is whole: every statement and every property is there, works, and can be
 // reached.
 #include <gtest/gtest.h>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Scenarios that must fail: where, and with which words.
 #include <gtest/gtest.h>
 

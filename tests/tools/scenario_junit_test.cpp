@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Reports for continuous-integration services.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Words, comments and JSON in the text of scenarios.
 #include <gtest/gtest.h>
 

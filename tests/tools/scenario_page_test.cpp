@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The page for the writers of scenarios: its examples pass, and it leaves nothing out.
 #include <gtest/gtest.h>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // From the text of a scenario file to its scenarios, and what is refused on the way.
 #include <gtest/gtest.h>
 

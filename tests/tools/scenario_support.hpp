@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Running the text of scenarios, for the tests of the scenario language.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Running the tool's commands in the test's own process.
 #pragma once
 

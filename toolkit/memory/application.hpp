@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The memory toolkit's application: makes windows and controls, and keeps the screen.
 #pragma once
 

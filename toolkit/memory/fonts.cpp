@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The catalogue: the families that walk-throughs written on the Mac ask for.
 
 #include "toolkit/memory/fonts.hpp"

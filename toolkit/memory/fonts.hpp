@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The memory toolkit's fonts: a fixed catalogue, the same on every machine.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Looking images up. The file system is asked every time, so that what was found earlier is never
 // older than the directory; only the identity of the images is remembered.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The memory toolkit's images: named files of the resource directory. It draws nothing, so that an
 // image is its name and the place of its file.
 #pragma once

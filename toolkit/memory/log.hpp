@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The memory toolkit's log: hands each line to whoever asked for them.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Making, moving and looking at things through the classes of this toolkit; what time and clicks do
 // is theirs.
 

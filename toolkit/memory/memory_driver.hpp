@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The driver of the memory toolkit.
 #pragma once
 

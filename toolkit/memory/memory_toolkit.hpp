@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The memory toolkit: a whole toolkit without a display. It keeps windows, views, sheets, the
 // responder chain and the clock as AppKit does, and behaves the same at every run; docs/toolkits.md
 // lists its rules.

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Letting time pass.
 
 #include "toolkit/memory/run_loop.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The memory toolkit's run loop: timers over a clock that moves only when it is told to.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The order of windows. Sheets know their parents and not the other way round, so that whatever a
 // parent needs to know of its sheets is asked of the windows that show.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The screen: which windows of an application show, in which order, and which has the keyboard.
 //
 // Invariants: a window is listed once, from being ordered front to being ordered out or destroyed;

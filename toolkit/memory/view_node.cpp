@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The tree of views: which lies in which, up to the window. Superviews own; every look upwards goes
 // through references that turn absent when a superview or a window ends before its views.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What all views of the memory toolkit have in common, whatever their role: the tree that they make
 // and what shows of them. `MemoryView` joins it to a role.
 //

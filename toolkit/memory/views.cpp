@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Sending actions, and buttons.
 
 #include "toolkit/memory/views.hpp"

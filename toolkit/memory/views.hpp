@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The memory toolkit's views and controls: the roles of toolkit/view.hpp over nodes that remember
 // everything.
 //

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Windows and sheets. A window's screen may be gone, when a host keeps windows longer than their
 // toolkit: then nothing shows, and the rest goes on.
 

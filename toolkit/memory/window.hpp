@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The memory toolkit's windows, which are also its sheets.
 #pragma once
 

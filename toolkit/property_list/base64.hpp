@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Base64, as property lists write data.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The layout of binary property lists: trailer, object markers, numbers. All numbers are
 // big-endian.
 //

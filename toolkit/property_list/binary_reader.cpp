@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Binary property lists.
 #include <bit>
 #include <string>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Writes values as binary property lists.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Dates as the texts of property lists write them.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "toolkit/property_list/canonical_dump.hpp"
 
 #include <algorithm>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A value's whole content in one line of printable ASCII, for comparing values to the letter.
 #pragma once
 

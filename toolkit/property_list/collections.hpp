@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The values that hold other values: arrays, sets, dictionaries.
 //
 // Ending a collection takes no more stack however deeply collections nest in it.

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Numbers as decimal text.
 #pragma once
 

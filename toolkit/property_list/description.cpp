@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What `Value::description` answers.
 #include <algorithm>
 #include <string>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "toolkit/property_list/document.hpp"
 
 #include <cassert>

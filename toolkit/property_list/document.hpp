@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The memory that all values read from one file share.
 //
 // Invariants: values in a document live and die together, and refer to no value outside of it. A

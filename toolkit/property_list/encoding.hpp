@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The encoding of XML and old-style property lists: found out, and turned into UTF-8.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The readers of the three formats, as the one reader in front of them sees them (see reader.hpp).
 //
 // Each makes its values in `document` and returns the root, or throws RefusedAt; a document whose

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Hexadecimal digits, as numbers and data are written with.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Where a dictionary's keys stand among its entries: a hash table of positions, beside the entries.
 //
 // Keys that somebody chose to collide do not slow it down: the hash is keyed by a number that

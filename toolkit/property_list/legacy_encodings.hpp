@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The encodings older than Unicode that an XML property list may declare.
 #pragma once
 

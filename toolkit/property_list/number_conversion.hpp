@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The numbers that texts and reals stand for.
 //
 // Every function takes any input and has one answer for it. White space is what the platform skips

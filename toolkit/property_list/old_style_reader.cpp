@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Old-style property lists, and the strings files that are dictionaries without braces.
 #include <string>
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The tokens of old-style property lists: `{ key = value; }`, `( a, b )`, `<hex>`, strings with and
 // without quotes, comments.
 #pragma once

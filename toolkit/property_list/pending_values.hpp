@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What the open collections of a file hold so far, while a reader is inside of them.
 #pragma once
 

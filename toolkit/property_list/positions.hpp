@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Where in its file each value stands that was read from it, for whoever wants to point there.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Reads property lists in the three formats that the platform has: binary, XML and old-style.
 //
 // What is accepted, and what it yields, is what the platform's own reader does, down to its

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // How the readers of the formats say, among themselves, that a file is not what they read.
 #pragma once
 

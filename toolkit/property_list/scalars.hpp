@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The values that hold no other values: strings, numbers, dates, data, null, UIDs.
 //
 // Invariant: none of them ever changes.

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // UTF-8, strict where files are read, and generalized (surrogates like any code point) in values.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Values: what property lists hold and tables keep.
 //
 // Invariants: a value is shared through counted references and has an identity, its address, for as

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A walk over a value and everything in it, in order. It takes no more stack however deeply
 // collections nest: a host can build values that are far deeper than any file's.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Eight characters at a time, in one 64-bit word.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // XML property lists: what their elements mean.
 #include <bit>
 #include <limits>

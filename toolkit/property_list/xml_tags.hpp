@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The tags of XML property lists, as they are spelled.
 #pragma once
 

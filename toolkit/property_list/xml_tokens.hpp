@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The tokens of XML property lists: tags, character data, and what may stand between them.
 //
 // This is not XML as its standard has it but what the platform's reader takes for it: a tag ends at

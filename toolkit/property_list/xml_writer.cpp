@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 #include "toolkit/property_list/xml_writer.hpp"
 
 #include <cmath>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Names and descriptions.
 
 #include "toolkit/qt/accessibility.hpp"

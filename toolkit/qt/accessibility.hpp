@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What assistive technology is told. Qt speaks for most widgets by itself; here is what it leaves
 // out.
 #pragma once

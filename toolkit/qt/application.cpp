@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Making windows and controls; sheets are passed on to their windows.
 
 #include "toolkit/qt/application.hpp"

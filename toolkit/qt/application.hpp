@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The Qt toolkit's application: makes windows and controls, and knows the host's.
 #pragma once
 

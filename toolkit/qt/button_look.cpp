@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Remembering what buttons show, and taking over their painting while there is something to it.
 
 #include "toolkit/qt/button_look.hpp"

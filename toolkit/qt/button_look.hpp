@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What buttons show: titles with attributes, the pressed-in look, colours, bezels.
 //
 // Push buttons, check boxes, radio buttons and tool buttons are drawn by the widget's own style,

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Drawing follows Qt's own styles step by step: bevel or indicator, then the label, then the focus;
 // only the step that is ours is replaced.
 

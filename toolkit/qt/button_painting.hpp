@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Drawing buttons whose widgets do not know all that they show.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What becomes of an exception that nobody handles.
 
 #include "toolkit/qt/calls.hpp"

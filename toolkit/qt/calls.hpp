@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Calling the application back out of Qt's event handlers, through which no exception may travel.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Check boxes with three states, and buttons of which one is always on.
 
 #include "toolkit/qt/check_state.hpp"

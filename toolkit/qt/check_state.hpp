@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The states of Qt's checkable buttons.
 #pragma once
 

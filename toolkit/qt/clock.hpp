@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The clock of the Qt toolkit's timers.
 #pragma once
 

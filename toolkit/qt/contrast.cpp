@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // WCAG's relative luminance and what it makes of two colours.
 
 #include "toolkit/qt/contrast.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // How well colours read on each other, after WCAG 2.1.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Rectangles of doubles and of whole numbers.
 
 #include "toolkit/qt/coordinates.hpp"

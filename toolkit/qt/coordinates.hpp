@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // From the interface's rectangles, with the origin at the lower left, to Qt's and back.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What the toolkit hangs on a widget to remember and draw what Qt's own widgets cannot.
 //
 // A decoration is a child of its widget, so it lives as long as what a script showed there is to be

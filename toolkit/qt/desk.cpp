@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Finding views and windows by their widgets. An entry whose widget has gone may stand under the
 // address of a new one until its view ends: what counts is the widget that the view still has.
 

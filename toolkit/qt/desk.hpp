@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What the windows and views of one Qt toolkit share: which widget has which view, and how the
 // application is called back.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Qt looks for the next one only in windows that are active, and only when it hides a widget
 // itself.
 

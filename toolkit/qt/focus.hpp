@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The keyboard's focus.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Which families stand in for the classic ones. The first of each row is metric-compatible where
 // there is such a family, so that lines break where their writer saw them break.
 

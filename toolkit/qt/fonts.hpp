@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The Qt toolkit's fonts: the families of the desktop, and the classic names that scripts use.
 //
 // A point of the interface is a pixel of Qt's geometry, for text has to fit into frames that are

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Images in labels, and behind the subviews of a view.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Looking images up and drawing them. The file system is asked every time, so that what was found
 // earlier is never older than the directory; only what the files hold is remembered.
 

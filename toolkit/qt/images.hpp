@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The Qt toolkit's images: named files of the resource directory, and drawing them sharp.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What is done here follows QLabel's own painting step by step, so that nobody sees a difference.
 
 #include "toolkit/qt/label_page.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A label's styled text, drawn from a document of its own.
 //
 // By itself a label reads its HTML at every change and lays it out four times, which takes longer

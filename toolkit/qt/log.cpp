@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Log lines as Qt's messages.
 
 #include "toolkit/qt/log.hpp"

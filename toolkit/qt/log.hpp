@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The Qt toolkit's log.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Making a driver of the Qt toolkit, for programs that know nothing else of Qt.
 #pragma once
 

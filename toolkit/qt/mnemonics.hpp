@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Ampersands in what Qt shows: before a letter they make it a mnemonic, two of them are one.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A clock that goes only while its driver lets time pass, as fast as the computer's own, and stands
 // still in between: so that what a test does meanwhile takes no time, on however slow a machine.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Acting as a user through Qt's own events, and looking at what the widgets show.
 
 #include "toolkit/qt/qt_driver.hpp"

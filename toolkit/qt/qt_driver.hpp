@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The driver of the Qt toolkit. Without a display its windows are drawn off the screen.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What the driver does with a real screen: leaving the windows to the person in front of it, and
 // taking pictures of them.
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The Qt toolkit: real windows, over Qt Widgets. It lives between the making of the host's
 // `QApplication` and its end, and is used on that thread; docs/toolkits.md lists its rules.
 #pragma once

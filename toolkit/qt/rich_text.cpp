@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Pieces become fragments with a character format, paragraphs become blocks with a block format.
 
 #include "toolkit/qt/rich_text.hpp"

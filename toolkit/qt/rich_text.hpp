@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Attributed strings as Qt's documents.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Attributed strings as HTML. Nothing is written that holds anyway, and tags rather than styles:
 // most of the time that it takes to show some HTML Qt spends reading styles.
 

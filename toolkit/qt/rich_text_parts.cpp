@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Runs, which are cut where styles change, become paragraphs, which are cut where lines end.
 
 #include "toolkit/qt/rich_text_parts.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Attributed strings taken apart, in the terms in which Qt's documents and its HTML are written.
 #pragma once
 

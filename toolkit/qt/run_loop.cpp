@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Setting the one timer of Qt's.
 
 #include "toolkit/qt/run_loop.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The Qt toolkit's run loop: timers that fire from Qt's event loop.
 //
 // One timer of Qt's stands for all: it is set to the one that is due first. So the order is the

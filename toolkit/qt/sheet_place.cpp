@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Sheets are attached through their native windows, so that neither widget's parent nor its flags
 // change: Qt would make the window anew.
 

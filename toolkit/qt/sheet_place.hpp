@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Where a sheet hangs.
 #pragma once
 

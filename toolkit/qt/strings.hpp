@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Text and colours between the toolkit interface and Qt.
 #pragma once
 

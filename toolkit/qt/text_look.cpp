@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What labels, line edits and text edits show.
 
 #include "toolkit/qt/text_look.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Kinds of view: telling them, sending actions, and what each kind shows.
 
 #include "toolkit/qt/views.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The Qt toolkit's views and controls: the roles of toolkit/view.hpp over the widgets of a host.
 //
 // A role is joined to a node by inheriting from both: `QtView` answers what every view understands,

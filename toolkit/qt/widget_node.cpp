@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The tree of widgets as a tree of views. Qt owns the widgets; a view that is in none, as a host
 // took it out or a script has not put it in yet, ends its widget itself.
 

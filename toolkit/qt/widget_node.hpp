@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What all views of the Qt toolkit have in common, whatever their role: the widget that each stands
 // for. `QtView` joins it to a role.
 //

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Windows as they come and go, and sheets. Whatever hides a sheet but this toolkit itself, such as
 // Escape, the close button, or a dialog's own buttons, ends it with the code 0.
 

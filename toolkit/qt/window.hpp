@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The Qt toolkit's windows, which are also its sheets.
 //
 // A sheet is a window-modal window in front of its parent, at the top edge of the parent's content.

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A window's palette, from which the widgets in it take what they have no colour of their own for.
 
 #include "toolkit/qt/window_look.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The colours of windows.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Text as ASCII bytes.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Every change goes through `push`, which keeps the invariants of the runs: it drops what is empty
 // and lengthens the last run instead of adding an equal neighbour.
 #include "toolkit/styled_text/attributed_string.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Attributed strings: text with attributes that hold over ranges of it.
 //
 // Invariants: the runs cover the text without gap or overlap, in order; none is empty; two

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Colours, and the standard ones by name.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Fonts by name and size.
 #pragma once
 

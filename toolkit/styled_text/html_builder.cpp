@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The rules by which tags open and close elements are those of browsers, in the main: a paragraph
 // ends where a block begins, an item where the next does, formatting outlives the block it is in.
 #include "toolkit/styled_text/html_builder.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Turns a document's tags and text into styled text: which elements are open, what a tag closes
 // besides, what each writes.
 //

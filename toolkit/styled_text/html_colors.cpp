@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The colour names of CSS, and the reading of colours.
 #include "toolkit/styled_text/html_colors.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Colours as HTML and CSS write them.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The entities of HTML 4, and the reading of references.
 #include "toolkit/styled_text/html_entities.hpp"
 

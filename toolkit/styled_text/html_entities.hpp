@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Characters as documents write them: bytes, and references such as "&eacute;" and "&#233;".
 #pragma once
 

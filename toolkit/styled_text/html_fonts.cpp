@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Faces and sizes.
 #include "toolkit/styled_text/html_fonts.hpp"
 

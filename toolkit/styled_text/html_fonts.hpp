@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Which fonts HTML's faces and sizes mean. Sizes are points; browsers' pixels are 3/4 of one, so
 // that their 16 pixels of common text are 12 points.
 #pragma once

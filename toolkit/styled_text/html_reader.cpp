@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The HTML reader: the tokenizer's tokens go to the builder one by one.
 #include "toolkit/styled_text/html_reader.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The HTML reader: styled text from HTML 4.01.
 #pragma once
 

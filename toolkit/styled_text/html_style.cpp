@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The style of elements: by what they are, by their attributes, within others.
 #include "toolkit/styled_text/html_style.hpp"
 

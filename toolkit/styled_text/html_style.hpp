@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What elements ask of their text, and what that amounts to within others.
 #pragma once
 

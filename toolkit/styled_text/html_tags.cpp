@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The names of elements and attributes.
 #include "toolkit/styled_text/html_tags.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The elements and attributes of HTML 4.01 that the reader heeds, and sets of them. What is not
 // named here (areas, forms' controls, frames, scripts' hosts) has no bearing on styled text: its
 // tags are ignored, its content is read.

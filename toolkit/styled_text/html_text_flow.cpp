@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // White space and lines.
 #include "toolkit/styled_text/html_text_flow.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The text that a document turns into, as it grows: where white space collapses, where new lines
 // stand, which attributes hold. A new line belongs to the paragraph that it ends: it has the
 // paragraph style of its first character.

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Every function only moves forward, whatever it meets: so the whole is linear.
 #include "toolkit/styled_text/html_tokenizer.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Cuts a document into tags and the text between them, in one pass.
 //
 // Dropped on the way, as a browser does: comments, document types, processing instructions, marked

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Small tools for the words of HTML and CSS: ASCII letters without regard to case, numbers without
 // regard to locale.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // One function a property: it reads the value, and leaves the declarations alone if it is not
 // valid.
 #include "toolkit/styled_text/inline_css.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The style sheets in `style` attributes.
 #pragma once
 

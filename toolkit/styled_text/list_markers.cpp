@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The markers of list items.
 #include "toolkit/styled_text/list_markers.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The markers of list items.
 #pragma once
 

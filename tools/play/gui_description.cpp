@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Descriptions of which the engine builds a walk-through window.
 #include "tools/play/gui_description.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The host's window that a walk-through is played over.
 #include "tools/play/host_window.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The host's window that a walk-through is played over, and the file that describes it: an array of
 // controls. docs/host-windows.md has the format.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The property lists that the tool is given.
 #include "tools/play/input_file.hpp"
 

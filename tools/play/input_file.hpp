@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The property lists that the tool is given. Whatever is wrong with one ends the command with a
 // Failure that says where ("FILE:LINE:COLUMN"), what is wrong, and what was expected.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Reading a text as one number.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What changed from one picture of a walk-through to the next.
 //
 // Each thing pictured is put into a list of facts, always the same ones in the same order; two

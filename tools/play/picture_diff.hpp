@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What changed from one picture of a walk-through to the next.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A picture of a walk-through as text for a terminal.
 #include "tools/play/picture_render.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Playing a script, from reading it to the end of the transcript.
 #include "tools/play/play.hpp"
 

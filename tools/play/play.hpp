@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Playing a script: what `qz-walkthrough play` does once its command line is read.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // One entry of a file that describes a window.
 #include "tools/play/plist_entry.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // One entry of a file that describes a window: reading its fields, and saying what is wrong with
 // them.
 #pragma once

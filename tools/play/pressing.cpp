@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What a user can press, and where the walk-through stands.
 #include "tools/play/pressing.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What a user can press in a picture of a walk-through, and where the walk-through stands.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What the user of an interactive walk-through asks for.
 #include "tools/play/prompt.hpp"
 

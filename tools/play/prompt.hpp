@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What the user of an interactive walk-through asks for, a line at a time.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Pictures of a walk-through in a directory.
 #include "tools/play/screenshots.hpp"
 

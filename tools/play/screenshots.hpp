@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Pictures of a walk-through in a directory: one PNG file a step, numbered in their order, and the
 // transcript.
 #pragma once

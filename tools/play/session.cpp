@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A walk-through being played.
 #include "tools/play/session.hpp"
 

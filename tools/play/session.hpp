@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A walk-through being played: makes its steps and keeps the transcript.
 #pragma once
 

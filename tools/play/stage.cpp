@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What a walk-through is played on.
 #include "tools/play/stage.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What a walk-through is played on: the host's windows and the engine.
 #pragma once
 

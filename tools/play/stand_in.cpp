@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A window for a script that is played without one: guesses each tag's kind from what the script
 // does with it.
 #include "tools/play/stand_in.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // A window for a script that is played without one.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Looking at a walk-through from outside.
 #include "tools/play/step_picture.hpp"
 

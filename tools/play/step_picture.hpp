@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What a walk-through shows at one moment: its window, the controls in it, and what the engine has
 // pending. A picture is a copy; nothing that happens later changes it.
 #pragma once

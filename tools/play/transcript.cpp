@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The transcript of a walk-through.
 #include "tools/play/transcript.hpp"
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The transcript of a walk-through: a heading for every step, what happened in it, and a picture of
 // what shows afterwards, compared with the picture before.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // How the transcript puts into words what a control or a window shows.
 #pragma once
 

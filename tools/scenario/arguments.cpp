@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The words of one statement, by the slots of its form.
 
 #include "tools/scenario/arguments.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The windows and controls that a scenario names.
 #pragma once
 

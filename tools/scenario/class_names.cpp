@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The names of the kinds of view.
 
 #include "tools/scenario/class_names.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The names of the kinds of view, on a toolkit that gives them names of its own.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The exported command names.
 
 #include "tools/scenario/command_names.hpp"

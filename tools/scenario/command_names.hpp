@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The exported command names, by the names of their constants.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The properties of controls.
 
 #include <cstdio>

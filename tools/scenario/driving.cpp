@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Statements that drive the engine: its operations, a user's presses, and time.
 
 #include <filesystem>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The engine of a scenario.
 
 #include "tools/scenario/engine_holder.hpp"

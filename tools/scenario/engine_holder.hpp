@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The engine of a scenario, as its host holds it and as an observer sees it.
 #pragma once
 

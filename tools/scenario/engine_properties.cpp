@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The properties of the engine.
 
 #include <type_traits>

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Statements that say what must be true.
 
 #include "tools/scenario/properties.hpp"

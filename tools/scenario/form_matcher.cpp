@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Finding the form that a statement is written in.
 
 #include "tools/scenario/form_matcher.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The host of a scenario.
 
 #include "tools/scenario/host.hpp"

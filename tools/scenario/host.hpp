@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The host of a scenario: the objects of its own, and what it does when something happens.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Statements that say what the host does besides calling the engine: what it changes, keeps, lets
 // go of, and does when something happens.
 

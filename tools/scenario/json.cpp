@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // JSON in scenarios: comparing and showing.
 
 #include "tools/scenario/json.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // JSON in scenarios: how it is compared and how it is shown.
 #pragma once
 

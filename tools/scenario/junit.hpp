@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Reports in the XML that continuous-integration services read (JUnit's).
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // From the text of a scenario file to its statements' words.
 
 #include "tools/scenario/lexer.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // From the text of a scenario file to its statements' words.
 //
 // A word is bare, "quoted", or JSON that begins with a bracket or a brace. A statement ends with

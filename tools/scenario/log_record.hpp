@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The log of a scenario: every line, and how far it has been expected.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // From the text of a scenario file to its scenarios.
 
 #include "tools/scenario/parser.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // From the text of a scenario file to its scenarios.
 //
 // Whatever can be known to be wrong before a scenario runs is refused here: statements that do not

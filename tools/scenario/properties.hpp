@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The properties of the engine, of controls and of windows: what they show, and what they can be
 // set to.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What the tables of properties have in common.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // How statements refer to things.
 
 #include "tools/scenario/references.hpp"

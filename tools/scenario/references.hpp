@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // How statements refer to things: the names that a scenario declares, #TAG and @INDEX for controls,
 // and NAME.PROPERTY.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The resource directory of one scenario.
 
 #include "tools/scenario/resource_directory.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The resource directory of one scenario: a fresh one in the system's directory for temporary
 // files, which is removed with everything in it when the scenario ends, however it ends.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Running scenarios.
 
 #include "tools/scenario/runner.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Running scenarios, each on a stage of its own.
 #pragma once
 

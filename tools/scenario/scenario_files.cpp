@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Finding and reading scenario files.
 
 #include "tools/scenario/scenario_files.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Statements that set a scenario up: files, windows, controls.
 
 #include <cstddef>
@@ -64,8 +65,7 @@ Cast::View viewNamed(const Stage& stage, const std::string& place) {
 }
 
 // Five in a row, so that none lies over another and each can be clicked.
-Rect nextFrame(const Cast::View& parent) {
-  const auto index = parent->subviews().size();
+Rect frameAt(std::size_t index) {
   const auto column = index % 5;
   const auto row = index / 5;
   return {20.0 + 120.0 * static_cast<double>(column), 20.0 + 40.0 * static_cast<double>(row), 100,
@@ -75,7 +75,7 @@ Rect nextFrame(const Cast::View& parent) {
 Outcome control(Stage& stage, const Arguments& a) {
   const auto parent = viewNamed(stage, a.text("PLACE"));
   const auto made = stage.driver.makeView(*viewKindNamed(a.text("CLASS")), a.whole("TAG"),
-                                          rectangle(a, nextFrame(parent)), parent);
+                                          rectangle(a, frameAt(parent->subviews().size())), parent);
   stage.cast.nameControl(a.text("+C"), toolkit::StoredRef<toolkit::View>::refer(made));
   return {};
 }
@@ -83,8 +83,9 @@ Outcome control(Stage& stage, const Arguments& a) {
 Outcome controls(Stage& stage, const Arguments& a) {
   const auto parent = viewNamed(stage, a.text("PLACE"));
   const auto kind = *viewKindNamed(a.text("CLASS"));
+  std::size_t index = parent->subviews().size();
   for (long i = 0; i < a.whole("COUNT"); ++i) {
-    stage.driver.makeView(kind, a.whole("TAG") + i, nextFrame(parent), parent);
+    stage.driver.makeView(kind, a.whole("TAG") + i, frameAt(index++), parent);
   }
   return {};
 }

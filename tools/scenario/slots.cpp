@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The slots of the statements' forms.
 
 #include "tools/scenario/slots.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The slots of the statements' forms: what a word in such a place must be.
 #pragma once
 

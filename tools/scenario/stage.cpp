@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The stage of one scenario: performing statements.
 
 #include "tools/scenario/stage.hpp"

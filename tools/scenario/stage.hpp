@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The stage of one scenario: all that its statements act on, fresh for each.
 #pragma once
 

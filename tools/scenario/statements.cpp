@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The statements of the language, put together.
 
 #include "tools/scenario/statements.hpp"

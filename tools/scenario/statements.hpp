@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The statements of the language: how each is written, and what it does.
 #pragma once
 

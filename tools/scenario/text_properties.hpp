@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What the attributes of a text show.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What ends a scenario early.
 #pragma once
 

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // From JSON to the values that property lists hold, and back.
 
 #include "tools/scenario/values.hpp"

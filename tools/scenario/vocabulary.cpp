@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Values as scenarios write them.
 
 #include "tools/scenario/vocabulary.hpp"

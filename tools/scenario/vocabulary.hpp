@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // What the parser is told about the language: the forms of its statements, the properties that they
 // can name, and what values these take. Nothing here says what a statement does.
 #pragma once

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // Patterns for log lines.
 
 #include "tools/scenario/wildcard.hpp"

@@ -1,3 +1,4 @@
+// SPDX-License-Identifier: MIT
 // The properties of windows.
 
 #include "tools/scenario/properties.hpp"
