@@ -120,48 +120,73 @@ Command::Option& Command::Option::excludes(Option& other) {
   return *this;
 }
 
+// Every option hands its words over as they are: the library's conversions are templates, which
+// cost more to compile than all the rest of this file.
+namespace {
+
+CLI::callback_t storeIn(std::string& value) {
+  return [&value](const CLI::results_t& words) {
+    value = words.front();
+    return true;
+  };
+}
+
+CLI::callback_t eachTo(Command::Take take) {
+  return [take = std::move(take)](const CLI::results_t& words) {
+    for (const std::string& word : words) hand(take, word);
+    return true;
+  };
+}
+
+constexpr int anyNumber = CLI::detail::expected_max_vector_size;
+
+}  // namespace
+
 Command::Option Command::argument(const std::string& name, std::string& value,
                                   const std::string& help) {
-  return Option(app_.add_option(name, value, help)->required()->type_name(""));
+  return Option(app_.add_option(name, storeIn(value), help)->required()->type_name(""));
 }
 
 Command::Option Command::arguments(const std::string& name, std::vector<std::string>& values,
                                    const std::string& help) {
-  return Option(app_.add_option(name, values, help)->required());
+  const auto store = [&values](const CLI::results_t& words) {
+    values = words;
+    return true;
+  };
+  return Option(
+      app_.add_option(name, store, help)->required()->expected(anyNumber)->type_name("TEXT"));
 }
 
 Command::Option Command::option(const std::string& name, std::string& value,
                                 const std::string& help) {
-  return Option(app_.add_option(name, value, help));
+  return Option(app_.add_option(name, storeIn(value), help, false, [&value] { return value; })
+                    ->type_name("TEXT"));
 }
 
 Command::Option Command::option(const std::string& name, std::optional<std::string>& value,
                                 const std::string& help) {
-  return Option(app_.add_option(name, value, help));
+  return taken(
+      name, [&value](const std::string& word) { value = word; }, help);
 }
 
 Command::Option Command::flag(const std::string& name, bool& value, const std::string& help) {
-  return Option(app_.add_flag(name, value, help));
+  return Option(app_.add_flag_callback(
+      name, [&value] { value = true; }, help));
 }
 
 Command::Option Command::taken(const std::string& name, Take take, const std::string& help) {
-  return Option(app_.add_option_function<std::string>(
-      name, [take](const std::string& value) { hand(take, value); }, help));
+  return Option(app_.add_option(name, eachTo(std::move(take)), help)->type_name("TEXT"));
 }
 
 Command::Option Command::repeated(const std::string& name, Take take, const std::string& help) {
-  return Option(app_.add_option_function<std::string>(
-                        name, [take](const std::string& value) { hand(take, value); }, help)
-                    ->trigger_on_parse());
+  return Option(
+      app_.add_option(name, eachTo(std::move(take)), help)->type_name("TEXT")->trigger_on_parse());
 }
 
 Command::Option Command::repeatedList(const std::string& name, Take take, const std::string& help) {
-  return Option(app_.add_option_function<std::vector<std::string>>(
-                        name,
-                        [take](const std::vector<std::string>& values) {
-                          for (const std::string& value : values) hand(take, value);
-                        },
-                        help)
+  return Option(app_.add_option(name, eachTo(std::move(take)), help)
+                    ->type_name("TEXT")
+                    ->expected(anyNumber)
                     ->trigger_on_parse());
 }
 

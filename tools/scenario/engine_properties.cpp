@@ -39,7 +39,9 @@ Reading show(const Stage&, const Engine::Controls& controls) {
 Reading show(const Stage&, const Engine::Timers& timers) {
   if (!timers) return std::nullopt;
   auto intervals = Json::object();
-  for (const auto& [key, timer] : timers->entries()) intervals[key] = timer->interval();
+  for (const auto& [key, timer] : timers->entries()) {
+    addMember(intervals, key, timer->interval());
+  }
   return intervals;
 }
 
@@ -49,7 +51,8 @@ Reading show(const Stage&, const Engine::GuiAssets& assets) {
   auto records = Json::object();
   for (const auto& [key, record] : assets->entries()) {
     const auto control = record.control.get();
-    records[key] = {record.classNames[0], record.frame, control ? Json(control->tag()) : Json()};
+    addMember(records, key,
+              {record.classNames[0], record.frame, control ? Json(control->tag()) : Json()});
   }
   return records;
 }

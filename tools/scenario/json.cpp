@@ -36,6 +36,10 @@ bool sameObject(const Json& a, const Json& b) {
 
 }  // namespace
 
+void addMember(Json& object, const std::string& key, Json value) {
+  object.get_ref<Json::object_t&>().emplace_back(key, std::move(value));
+}
+
 std::optional<Json> numberIn(std::string_view text) {
   auto value = Json::parse(text, nullptr, false);
   if (!value.is_number()) return std::nullopt;

@@ -13,6 +13,10 @@ namespace tools::scenario {
 /// JSON whose objects keep the order in which their keys stand.
 using Json = nlohmann::ordered_json;
 
+/// Adds a member under a key that the object does not have yet: setting one would look through all
+/// the others first.
+void addMember(Json& object, const std::string& key, Json value);
+
 /// The JSON number that `text` is as a whole, or nothing.
 std::optional<Json> numberIn(std::string_view text);
 

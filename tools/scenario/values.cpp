@@ -66,9 +66,18 @@ Json fromElements(std::span<const ValueRef<>> elements) {
   return json;
 }
 
+// Strings first, which differ from one another; another kind of key may read like one of them.
 Json fromDictionary(const toolkit::Dictionary& dictionary) {
+  const auto isString = [](const ValueRef<>& key) {
+    return key->kind() == toolkit::Value::Kind::string;
+  };
   auto json = Json::object();
-  for (const auto& [key, value] : dictionary.entries()) json[key->description()] = toJson(value);
+  for (const auto& [key, value] : dictionary.entries()) {
+    if (isString(key)) addMember(json, key->description(), toJson(value));
+  }
+  for (const auto& [key, value] : dictionary.entries()) {
+    if (!isString(key)) json[key->description()] = toJson(value);
+  }
   return json;
 }
 
