@@ -132,12 +132,13 @@ TEST(NumberConversion, OfStringsToReals) {
 }
 
 TEST(NumberConversion, OfStringsToBooleans) {
-  for (const char* yes : {"Y", "y", "T", "t", "YES", "true", "Tomorrow", "1", "9x", "-1", "+2",
-                          "0007", " y", "\t 3", "-001", "\xC2\xA0Y"}) {
+  for (const char* yes : {"Y",  "y",  "T",  "t",    "YES", "true",   "Tomorrow", "1",
+                          "9x", "-1", "+2", "0007", " y",  "\t 3",   "-001",     "\xC2\xA0Y",
+                          "+y", "+Y", "-t", "0Y",   "0t",  "00true", " +00Yes"}) {
     EXPECT_TRUE(boolValueOf(yes)) << yes;
   }
-  for (const char* no : {"", " ", "0", "N", "no", "x1", "000", "-0", "--1", "- 1", "+y", "0x1",
-                         ".5", "0.5", "\xC3\xA9"}) {
+  for (const char* no : {"",    " ",  "0",   "N",        "no", "x1",  "000", "-0",  "--1", "- 1",
+                         "0x1", ".5", "0.5", "\xC3\xA9", "+",  "+-Y", "- Y", "0 Y", "0+Y", "0N"}) {
     EXPECT_FALSE(boolValueOf(no)) << no;
   }
 }

@@ -92,11 +92,11 @@ double doubleValueOf(std::string_view text) {
 
 bool boolValueOf(std::string_view text) {
   text = withoutLeadingSpace(text);
-  if (text.empty()) return false;
-  if (std::string_view("YyTt").find(text.front()) != std::string_view::npos) return true;
-  if (isSign(text.front())) text.remove_prefix(1);
-  const std::size_t digit = text.find_first_not_of('0');
-  return digit != std::string_view::npos && isDigit(text[digit]);
+  if (!text.empty() && isSign(text.front())) text.remove_prefix(1);
+  const std::size_t first = text.find_first_not_of('0');
+  // A letter too may stand behind a sign and zeros: "+Y" is true.
+  return first != std::string_view::npos &&
+         std::string_view("YyTt123456789").find(text[first]) != std::string_view::npos;
 }
 
 std::int32_t truncatedToInt(double value) { return truncated<std::int32_t>(value); }

@@ -21,7 +21,8 @@ std::int64_t integerValueOf(std::string_view text);
 /// first (so of `nan`, `inf` and hexadecimal numbers).
 double doubleValueOf(std::string_view text);
 
-/// White space, then `Y`, `y`, `T` or `t`; or one sign at most, zeros, and a digit from 1 to 9.
+/// White space, one sign at most, any zeros, and then `Y`, `y`, `T`, `t` or a digit from 1 to 9.
+/// What follows is ignored.
 bool boolValueOf(std::string_view text);
 
 /// A real without its fraction; the nearest bound where that is out of range, 0 for no number.
