@@ -34,6 +34,8 @@ TEST(XmlReader, TakesWhatStandsAroundTheRoot) {
       {"<!----><true/>", refused},
       {"<!-- open <true/>", refused},
       {"<?x <true/>", refused},
+      {"<?><true/>", refused},
+      {"<?><true/>?><false/>", "false"},
       {"<true/>anything", "true"},
       {"<true/><false/>", "true"},
       {"<plist><true/></plist>anything", "true"},
@@ -93,6 +95,10 @@ TEST(XmlReader, TakesArraysAndDictionaries) {
   const XmlCase cases[] = {
       {"<array></array>", "[]"},
       {"<array> <?p?> <!----> <true/>\n<string>a</string></array>", "[true,\"a\"]"},
+      {"<array><?><true/><?></array>", "[true]"},
+      {"<array><?><true/><?p?></array>", "[true]"},
+      {"<array><? <true/></array>", refused},
+      {"<dict><?><key>a</key><?><true/></dict>", "{\"dict\":[[\"a\",true]]}"},
       {"<array><key>k</key></array>", "[\"k\"]"},
       {"<array><plist><true/></plist></array>", "[true]"},
       {"<array><plist></plist></array>", refused},
@@ -128,13 +134,40 @@ TEST(XmlReader, TakesUids) {
       {"<dict><key>CF$UID</key><integer>4294967295</integer></dict>", "{\"uid\":4294967295}"},
       {"<dict><key>CF$UID</key><integer>4294967298</integer></dict>", "{\"uid\":2}"},
       {"<dict><key>CF$UID</key><true/></dict>", "{\"dict\":[[\"CF$UID\",true]]}"},
-      {"<dict><key>CF$UID</key><real>1</real></dict>",
-       "{\"dict\":[[\"CF$UID\",{\"real\":\"1\",\"w\":64}]]}"},
+      {"<dict><key>CF$UID</key><integer>-1</integer></dict>", "{\"uid\":4294967295}"},
       {"<dict>" + uid + "<key>a</key><true/></dict>",
        "{\"dict\":[[\"CF$UID\",{\"int\":\"7\"}],[\"a\",true]]}"},
   };
   for (const auto& [xml, dump] : cases) EXPECT_EQ(dumpOf(plist(xml)), dump) << xml;
   EXPECT_FALSE(dictionaryFromPropertyList(plist("<dict>" + uid + "</dict>")));
+}
+
+TEST(XmlReader, TakesRealUidsAsSignedIntegersOf32Bits) {
+  const struct {
+    std::string_view real;
+    std::string_view number;
+  } cases[] = {
+      {"1", "1"},
+      {"3.14", "3"},
+      {"-3.14", "4294967293"},
+      {"-0.9", "0"},
+      {"2147483647.9", "2147483647"},
+      {"-2147483648.9", "2147483648"},
+      // What does not fit.
+      {"2147483648", "2147483648"},
+      {"4294967297", "2147483648"},
+      {"-2147483649", "2147483648"},
+      {"nan", "2147483648"},
+      {"inf", "2147483648"},
+      {"-inf", "2147483648"},
+  };
+  for (const auto& [real, number] : cases) {
+    const std::string uid = "<dict><key>CF$UID</key><real>" + std::string(real) + "</real></dict>";
+    EXPECT_EQ(dumpOf(plist("<array>" + uid + "</array>")),
+              "[{\"uid\":" + std::string(number) + "}]")
+        << real;
+    EXPECT_FALSE(dictionaryFromPropertyList(plist(uid))) << real;
+  }
 }
 
 TEST(XmlReader, TakesStrings) {

@@ -79,6 +79,9 @@ TEST(XmlWriter, WritesWhatReadsBackTheSame) {
       Data::make(""),
       Uid::make(UINT32_MAX),
       Dictionary::make({{String::make("&\n"), Uid::make(0)}}),
+      Dictionary::make({{String::make("CF$UID"), Number::withBool(true)}}),
+      Dictionary::make({{String::make("CF$UID"), Number::withDouble(1)},
+                        {String::make("k"), Number::withBool(true)}}),
   };
   for (const ValueRef<>& value : values) {
     const std::string xml = writeXmlPropertyList(value);
@@ -120,7 +123,11 @@ TEST(XmlWriter, RefusesWhatXmlCannotCarry) {
       {Date::make(std::nan("")),
        "a date with a fraction of a second, or too far away to count its seconds (at the root)"},
       {Dictionary::make({{String::make("CF$UID"), Number::withLong(1)}}),
-       "a dictionary of nothing but an integer CF$UID, which reads back as a UID (at the root)"},
+       "a dictionary of nothing but a number CF$UID, which reads back as a UID (at the root)"},
+      {Array::make({Dictionary::make({{String::make("CF$UID"), Number::withDouble(0.5)}})}),
+       "a dictionary of nothing but a number CF$UID, which reads back as a UID (at /0)"},
+      {Dictionary::make({{String::make("CF$UID"), Number::withFloat(HUGE_VALF)}}),
+       "a dictionary of nothing but a number CF$UID, which reads back as a UID (at the root)"},
   };
   for (const auto& [value, reason] : cases) {
     EXPECT_EQ(xmlRefusalOf(value), "XML property lists cannot carry " + std::string(reason));

@@ -86,7 +86,7 @@ std::optional<double> secondsOfDate(std::string_view text) {
   }
   text.remove_prefix(digits);
   constexpr std::string_view pattern = "-00-00T00:00:00Z";
-  if (digits == 0 || text.size() != pattern.size()) return std::nullopt;
+  if (text.size() != pattern.size()) return std::nullopt;
   std::array<int, 5> fields{};
   std::size_t seen = 0;
   for (std::size_t i = 0; i < pattern.size(); ++i) {

@@ -14,8 +14,9 @@ namespace toolkit {
 std::string iso8601(double secondsSinceReferenceDate);
 
 /// The moment that an XML property list writes as `[-]Y…-MM-DDThh:mm:ssZ`, in seconds since
-/// 2001-01-01 00:00:00 UTC; nothing for any other text. Each field counts on from the ones before
-/// it: the 30th of February is the 2nd of March, the 13th month the next year's first.
+/// 2001-01-01 00:00:00 UTC; nothing for any other text. A year without digits is 0. Each field
+/// counts on from the ones before it: the 30th of February is the 2nd of March, the 13th month the
+/// next year's first.
 std::optional<double> secondsOfDate(std::string_view text);
 
 }  // namespace toolkit

@@ -21,13 +21,15 @@ std::size_t digitCount(std::string_view text) {
   return static_cast<std::size_t>(end - text.begin());
 }
 
+bool isAsciiSpace(unsigned char c) { return c <= 0x20 || c == 0x7F; }
+
 /// The length in bytes of the white space character that `text` starts with, or 0.
 std::size_t spaceLength(std::string_view text) {
   const auto at = [&](std::size_t i) {
     return i < text.size() ? static_cast<unsigned char>(text[i]) : 0xFFU;
   };
   if (text.empty()) return 0;
-  if (at(0) <= 0x20 || at(0) == 0x7F) return 1;
+  if (isAsciiSpace(static_cast<unsigned char>(text[0]))) return 1;
   if (at(0) == 0xC2 && at(1) >= 0x80 && at(1) <= 0xA0) return 2;
   if (at(0) == 0xE2 && at(1) == 0x80 && at(2) >= 0x80 && at(2) <= 0x8B) return 3;
   if (at(0) == 0xE3 && at(1) == 0x80 && at(2) == 0x80) return 3;
@@ -104,6 +106,11 @@ std::int64_t truncatedToInteger(double value) { return truncated<std::int64_t>(v
 
 std::string_view withoutLeadingSpace(std::string_view text) {
   while (const std::size_t length = spaceLength(text)) text.remove_prefix(length);
+  return text;
+}
+
+std::string_view withoutLeadingAsciiSpace(std::string_view text) {
+  while (!text.empty() && isAsciiSpace(static_cast<unsigned char>(text[0]))) text.remove_prefix(1);
   return text;
 }
 

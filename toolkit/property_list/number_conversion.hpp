@@ -31,6 +31,8 @@ std::int64_t truncatedToInteger(double value);
 
 /// `text` from its first character on that is no white space.
 std::string_view withoutLeadingSpace(std::string_view text);
+/// The same, with white space beyond ASCII taken for other characters.
+std::string_view withoutLeadingAsciiSpace(std::string_view text);
 
 /// How many bytes at the start of `text` make up a decimal real: a sign, digits with or without a
 /// point (one digit at least), an exponent that has digits. 0 when none does.

@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // XML property lists: what their elements mean.
 #include <bit>
+#include <cmath>
 #include <limits>
 #include <string>
 
@@ -135,14 +136,28 @@ Value* XmlReader::array(const XmlTag& tag) {
   return pending_.closeArray(array);
 }
 
-/// What a keyed archive's reference is in XML: a dictionary of nothing but an integer `CF$UID`.
+/// What a keyed archive's reference is in XML: a dictionary of nothing but a number `CF$UID`.
 const Number* archiverUid(const Dictionary& dictionary) {
   if (dictionary.count() != 1) return nullptr;
   const Dictionary::Entry& entry = dictionary.entries().front();
   if (static_cast<const String&>(*entry.key).text() != "CF$UID") return nullptr;
   if (entry.value->kind() != Value::Kind::number) return nullptr;
   const auto& number = static_cast<const Number&>(*entry.value);
-  return number.isReal() || number.type() == Number::Type::boolean ? nullptr : &number;
+  return number.type() == Number::Type::boolean ? nullptr : &number;
+}
+
+/// A real as the platform's processor cuts it to a signed integer of 32 bits: what does not fit, or
+/// is not a number, is the lowest one.
+std::int32_t cutToInt(double real) {
+  constexpr auto lowest = std::numeric_limits<std::int32_t>::min();
+  const double whole = std::trunc(real);
+  const bool fits = whole >= lowest && whole <= std::numeric_limits<std::int32_t>::max();
+  return fits ? static_cast<std::int32_t>(whole) : lowest;
+}
+
+std::uint32_t uidNumber(const Number& number) {
+  if (number.isReal()) return static_cast<std::uint32_t>(cutToInt(number.doubleValue()));
+  return static_cast<std::uint32_t>(number.bits());
 }
 
 Value* XmlReader::dictionary(const XmlTag& tag) {
@@ -168,7 +183,7 @@ Value* XmlReader::dictionary(const XmlTag& tag) {
   Dictionary* result = pending_.closeDictionary(entries, duplicates);
   const Number* uid = archiverUid(*result);
   if (!uid) return result;
-  return Uid::make(document_, static_cast<std::uint32_t>(uid->bits()));
+  return Uid::make(document_, uidNumber(*uid));
 }
 
 Value* XmlReader::onlyValueIn(const XmlTag& plist) {
@@ -184,9 +199,9 @@ Value* XmlReader::onlyValueIn(const XmlTag& plist) {
 }
 
 Value* XmlReader::integer() {
-  std::string_view text = withoutLeadingSpace(tokens_.rawText());
+  std::string_view text = withoutLeadingAsciiSpace(tokens_.rawText());
   const bool negative = text.starts_with('-');
-  if (negative || text.starts_with('+')) text = withoutLeadingSpace(text.substr(1));
+  if (negative || text.starts_with('+')) text = withoutLeadingAsciiSpace(text.substr(1));
   const bool isHexadecimal = text.starts_with("0x") || text.starts_with("0X");
   if (isHexadecimal) text.remove_prefix(2);
   if (text.empty()) refuseAt(text.data(), "an integer without digits");

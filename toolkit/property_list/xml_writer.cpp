@@ -26,8 +26,7 @@ constexpr std::string_view uidKey = "CF$UID";
 
 bool isArchiverUid(const Dictionary& dictionary) {
   const ValueRef<Number> number = asNumber(dictionary.objectForKey(uidKey));
-  return dictionary.count() == 1 && number && !number->isReal() &&
-         number->type() != Number::Type::boolean;
+  return dictionary.count() == 1 && number && number->type() != Number::Type::boolean;
 }
 
 /// Visits the values in order and writes each behind the ones before it.
@@ -199,7 +198,7 @@ void XmlWriter::open(const Value& collection) {
   if (collection.kind() == Value::Kind::set) refuse("a set");
   if (collection.kind() == Value::Kind::dictionary &&
       isArchiverUid(static_cast<const Dictionary&>(collection))) {
-    refuse("a dictionary of nothing but an integer CF$UID, which reads back as a UID");
+    refuse("a dictionary of nothing but a number CF$UID, which reads back as a UID");
   }
   checkNesting(1);
   indent();
