@@ -146,6 +146,8 @@ TEST(HtmlText, DropsWhatIsNotShown) {
       {"<head><title>x</title><meta name=a></head>y", "y"},
       {"<html><head>x<body>y", "y"},
       {"<head><title>x</title><p>y", "y\n"},
+      {" \n<head>x</head>y", "y"},
+      {"<html lang=en> <meta name=a><head>x</head>y", "y"},
       {"a<title>x <b>y</title>b", "ab"},
       {"a<script>if (x < y) { '<p>' }</SCRIPT >b", "ab"},
       {"a<style>b { c: </stylex> </style>b", "ab"},

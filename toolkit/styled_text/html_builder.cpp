@@ -54,10 +54,12 @@ Builder::Builder(const Fonts& fonts) : source_{fonts} {
 void Builder::startTag(Tag tag, const Attributes& attributes) {
   if (tag == Tag::unknown || tag == Tag::html) return;
   dropsNewLine_ = false;
-  inHead_ = tag == Tag::head;  // what may not stand in a head ends it
+  if (tag == Tag::head) {
+    inHead_ = !isPastHead_;
+    return;
+  }
+  endHead();  // what may not stand in a head ends it
   switch (tag) {
-    case Tag::head:
-      break;
     case Tag::br:
       breakLine();
       break;
@@ -78,11 +80,13 @@ void Builder::startTag(Tag tag, const Attributes& attributes) {
 
 void Builder::endTag(Tag tag) {
   dropsNewLine_ = false;
-  if (tag == Tag::head) inHead_ = false;
+  if (tag == Tag::head) endHead();
   if (inHead_) return;
   if (tag == Tag::br) {
+    endHead();
     breakLine();
   } else if (tag == Tag::p) {
+    endHead();
     // Without its start tag it is an empty paragraph.
     if (!closeNearest({tag}, tags::scopes)) flow_.startBlock(style());
   } else if (tags::headings.contains(tag)) {
@@ -99,6 +103,7 @@ void Builder::addText(std::string_view bytes) {
   if (inHead_) return;
   std::string read;
   if (!isPlain(bytes)) bytes = read = decoded(bytes, ReferencePlace::text);
+  if (!isPastHead_ && !isWhiteSpace(bytes)) endHead();
   // Between a table's parts there is no text, only their layout in the document.
   if (tags::tableParts.contains(elements_.back().tag) && isWhiteSpace(bytes)) return;
   if (dropsNewLine) {
@@ -107,6 +112,11 @@ void Builder::addText(std::string_view bytes) {
   }
   resumeFormatting();
   flow_.addText(bytes, style());
+}
+
+void Builder::endHead() {
+  inHead_ = false;
+  isPastHead_ = true;
 }
 
 AttributedString Builder::finish() {

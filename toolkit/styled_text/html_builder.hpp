@@ -59,6 +59,7 @@ class Builder {
   /// The position of an open element. The document itself, at 0, is never looked for: 0 is "none".
   using Position = std::size_t;
 
+  void endHead();
   void colorLinks(const Attributes& body);
   void open(Tag tag, const Attributes& attributes);
   void push(Tag tag, Declarations declarations);
@@ -92,6 +93,7 @@ class Builder {
   std::vector<Element> suspended_;  // formatting, the innermost first
   TextFlow flow_;
   bool inHead_ = false;
+  bool isPastHead_ = false;    // the body has begun: a head is a stray tag from here
   bool linksColored_ = false;  // a body has said which colour links have
   bool dropsNewLine_ = false;  // directly behind <pre>
 };
