@@ -111,7 +111,7 @@ class TestDriver {
 
   virtual ViewPicture look(const Ref<View>& view) = 0;
   virtual WindowPicture look(const Ref<Window>& window) = 0;
-  /// Whom every log line is handed as it comes, besides where the toolkit's log writes anyway.
+  /// Where every log line goes as it comes. Without a sink, as at first, the lines go nowhere.
   virtual void setLogSink(std::function<void(std::string_view)> sink) = 0;
 };
 

@@ -18,6 +18,10 @@ using toolkit::String;
 
 /// The memory toolkit, but for its reader of HTML, which only keeps the document.
 struct DocumentKeeper final : toolkit::Toolkit {
+  DocumentKeeper() {
+    memory.log().setSink([](std::string_view) {});
+  }
+
   toolkit::memory::MemoryToolkit memory;
   std::string document;
 

@@ -81,7 +81,39 @@ TEST_F(FilesTest, NamesAreUtf8) {
   EXPECT_EQ(files.resourcePath(), directory.path("\xC3\xBC"));
 }
 
+TEST(ToolkitsLog, WithoutASinkGoesToStandardError) {
+  MemoryToolkit toolkit;
+  testing::internal::CaptureStderr();
+  toolkit.log().write("one");
+  toolkit.log().write("");
+  toolkit.log().write("t\xC3\xBC");
+  EXPECT_EQ(testing::internal::GetCapturedStderr(), "one\n\nt\xC3\xBC\n");
+}
+
+TEST(ToolkitsLog, WithASinkGoesNowhereElse) {
+  MemoryToolkit toolkit;
+  std::string lines;
+  testing::internal::CaptureStderr();
+  toolkit.log().setSink([&](std::string_view line) { lines += line; });
+  toolkit.log().write("one");
+  EXPECT_EQ(testing::internal::GetCapturedStderr(), "");
+  EXPECT_EQ(lines, "one");
+  testing::internal::CaptureStderr();
+  toolkit.log().setSink(nullptr);
+  toolkit.log().write("two");
+  EXPECT_EQ(testing::internal::GetCapturedStderr(), "two\n");
+}
+
 using LogTest = MemoryTest;
+
+TEST_F(LogTest, ADriverWithoutASinkIsSilent) {
+  testing::internal::CaptureStderr();
+  toolkit.log().write("at first");
+  driver.setLogSink([](std::string_view) {});
+  driver.setLogSink(nullptr);
+  toolkit.log().write("again");
+  EXPECT_EQ(testing::internal::GetCapturedStderr(), "");
+}
 
 TEST_F(LogTest, EveryLineGoesToTheSink) {
   std::vector<std::string> lines;

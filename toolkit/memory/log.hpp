@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: MIT
-// The memory toolkit's log: hands each line to whoever asked for them.
+// The memory toolkit's log: hands each line to the host's sink, or writes it to standard error.
 #pragma once
 
+#include <cstdio>
 #include <functional>
 #include <string_view>
 #include <utility>
@@ -14,14 +15,20 @@ class MemoryLog final : public Log {
  public:
   using Sink = std::function<void(std::string_view)>;
 
-  /// Without a sink the lines go nowhere.
+  /// To the sink; without one, to standard error: a host without a display is a host.
   void write(std::string_view line) override {
     const Sink sink = sink_;  // which may replace itself
-    if (sink) sink(line);
+    sink ? sink(line) : writeToStandardError(line);
   }
+  /// An absent sink is none.
   void setSink(Sink sink) { sink_ = std::move(sink); }
 
  private:
+  static void writeToStandardError(std::string_view line) {
+    std::fwrite(line.data(), 1, line.size(), stderr);
+    std::fputc('\n', stderr);
+  }
+
   Sink sink_;
 };
 

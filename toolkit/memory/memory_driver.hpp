@@ -11,6 +11,8 @@ namespace toolkit::memory {
 
 class MemoryDriver final : public TestDriver {
  public:
+  MemoryDriver() { setLogSink({}); }
+
   std::string_view name() const override { return "memory"; }
   MemoryToolkit& toolkit() override { return toolkit_; }
 
