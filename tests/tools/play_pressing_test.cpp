@@ -69,6 +69,7 @@ TEST(PlayPressing, namesAButtonByTagAndTitle) {
 TEST(PlayPressing, saysWhatTheWalkThroughWaitsFor) {
   StepPicture picture = buttons();
   EXPECT_EQ(standing(picture), "The walk-through waits for a press of 1 (Next).");
+  EXPECT_EQ(whyNoWayOn(picture), std::nullopt);
   picture.controls[3].hasList = true;
   picture.timers = {{newIdentity(), "8", 2}, {newIdentity(), "9", 1e18}};
   EXPECT_EQ(standing(picture),
@@ -79,7 +80,13 @@ TEST(PlayPressing, saysWhatTheWalkThroughWaitsFor) {
   EXPECT_EQ(standing(picture),
             "The walk-through stands still: no timer is pending, and no button that can be "
             "pressed has a list.");
+  EXPECT_EQ(whyNoWayOn(picture),
+            "no timer is pending, and no button that can be pressed has a list");
+  picture.timers = {{newIdentity(), "8", 2}};
+  EXPECT_EQ(whyNoWayOn(picture), std::nullopt);
+  picture.timers.clear();
   picture.ended = true;
+  EXPECT_EQ(whyNoWayOn(picture), std::nullopt);
   EXPECT_EQ(standing(picture), "The walk-through ended.");
 }
 

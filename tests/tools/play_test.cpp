@@ -117,6 +117,28 @@ TEST(Play, whatAListRaisesIsReportedAndTheWalkThroughGoesOn) {
   EXPECT_NE(played.transcript.find("\n── 3. press 2 (2) ──"), std::string::npos);
 }
 
+TEST(Play, aWalkThroughThatStandsStillHasFailed) {
+  const WorkingDirectory directory;
+  PlayOptions options;
+  options.script = "script.plist";
+  const std::string line =
+      "qz-walkthrough: script.plist: the walk-through stands still: no timer is pending, and no "
+      "button that can be pressed has a list\n";
+  directory.write("script.plist", "{ 1 = (DISABLE_OBJECT_WITH_ID); }");
+  const Played stuck = run(options);
+  EXPECT_EQ(stuck.status, ExitStatus::failed);
+  EXPECT_TRUE(stuck.log.ends_with(line)) << stuck.log;
+  EXPECT_NE(stuck.transcript.find("\nThe walk-through stands still: "), std::string::npos);
+  // A timer, or the end, is a way on.
+  directory.write("script.plist", "{ 1 = (DISABLE_OBJECT_WITH_ID, (SET_TIMER_FOR_ID, 2, 1)); }");
+  EXPECT_EQ(run(options).status, ExitStatus::fine);
+  directory.write("script.plist", "{ 1 = (IDLE_LOOP); 2 = (TERMINATE_PARSER); }");
+  options.steps = {Press{2}};
+  const Played ended = run(options);
+  EXPECT_EQ(ended.status, ExitStatus::fine);
+  EXPECT_EQ(ended.log.find("stands still"), std::string::npos);
+}
+
 TEST(Play, aSheetLeavesTheScreenWhenItEnds) {
   const WorkingDirectory directory;
   PlayOptions options = smallScript(directory);

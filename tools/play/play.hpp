@@ -50,8 +50,9 @@ struct Terminal {
   Style style;
 };
 
-/// Plays the script and writes the transcript. `failed` when a step could not be made, or a list
-/// raised. A Failure when the walk-through cannot start.
+/// Plays the script and writes the transcript. `failed` when a step could not be made, a list
+/// raised, or the walk-through stands still at the end. A Failure when the walk-through cannot
+/// start.
 ExitStatus play(const PlayOptions& options, const Terminal& terminal);
 
 }  // namespace tools::play

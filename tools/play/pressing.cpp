@@ -25,6 +25,21 @@ std::string pressableWords(const StepPicture& picture) {
   return buttons.empty() ? "; no button can be pressed" : "; press " + enumerate(buttons);
 }
 
+/// What can happen next: presses that run a list, and timers.
+std::vector<std::string> waysOn(const StepPicture& picture) {
+  std::vector<std::string> ways;
+  std::vector<std::string> buttons;
+  for (const ControlPicture& control : picture.controls) {
+    const bool moves = control.hasList && canBePressed(control);
+    if (moves) buttons.push_back(pressWords(picture, control.view.tag));
+  }
+  if (!buttons.empty()) ways.push_back("a press of " + enumerate(buttons));
+  for (const TimerPicture& timer : picture.timers) {
+    ways.push_back("list " + timer.key + " to run " + whenWords(timer.timeLeft));
+  }
+  return ways;
+}
+
 }  // namespace
 
 const ControlPicture* controlWithTag(const StepPicture& picture, long tag) {
@@ -57,21 +72,17 @@ std::optional<std::string> whyNotPress(const StepPicture& picture, long tag) {
   return is(control->view.hidden ? "hidden" : "disabled");
 }
 
+std::optional<std::string> whyNoWayOn(const StepPicture& picture) {
+  if (picture.ended || !waysOn(picture).empty()) return std::nullopt;
+  return "no timer is pending, and no button that can be pressed has a list";
+}
+
 std::string standing(const StepPicture& picture) {
   if (picture.ended) return "The walk-through ended.";
-  std::vector<std::string> ways;
-  std::vector<std::string> buttons;
-  for (const ControlPicture& control : picture.controls) {
-    const bool moves = control.hasList && canBePressed(control);
-    if (moves) buttons.push_back(pressWords(picture, control.view.tag));
+  if (const auto reason = whyNoWayOn(picture)) {
+    return "The walk-through stands still: " + *reason + ".";
   }
-  if (!buttons.empty()) ways.push_back("a press of " + enumerate(buttons));
-  for (const TimerPicture& timer : picture.timers) {
-    ways.push_back("list " + timer.key + " to run " + whenWords(timer.timeLeft));
-  }
-  if (!ways.empty()) return "The walk-through waits for " + enumerate(ways) + ".";
-  return "The walk-through stands still: no timer is pending, and no button that can be pressed "
-         "has a list.";
+  return "The walk-through waits for " + enumerate(waysOn(picture)) + ".";
 }
 
 }  // namespace tools::play

@@ -18,6 +18,10 @@ std::string pressWords(const StepPicture& picture, long tag);
 /// Why a user cannot press the tag; nothing when they can.
 std::optional<std::string> whyNotPress(const StepPicture& picture, long tag);
 
+/// Why the walk-through stands still: nothing that a user can do, and no timer, runs a list.
+/// Nothing when there is a way on, or the walk-through has ended.
+std::optional<std::string> whyNoWayOn(const StepPicture& picture);
+
 /// Whether the walk-through ended, or what it waits for. A sentence.
 std::string standing(const StepPicture& picture);
 

@@ -147,6 +147,9 @@ void Session::refuse(const std::string& heading, const std::string& reason) {
 }
 
 void Session::conclude() {
+  if (const auto reason = whyNoWayOn(picture())) {
+    problems_.push_back("the walk-through stands still: " + *reason);
+  }
   const std::string states = recordedStates();
   transcript_.paragraph(standing(picture()) + "\n" +
                         (states.empty() ? "" : "Button states recorded: " + states + ".\n"));

@@ -38,7 +38,8 @@ class Session {
   void conclude();
 
   const StepPicture& picture() const { return transcript_.latest(); }
-  /// The steps that could not be made and the lists that raised, a line each.
+  /// The steps that could not be made and the lists that raised, a line each; once concluded, also
+  /// that there is no way on.
   const std::vector<std::string>& problems() const { return problems_; }
 
  private:
