@@ -11,9 +11,11 @@
 #include "toolkit/qt/accessibility.hpp"
 #include "toolkit/qt/button_painting.hpp"
 #include "toolkit/qt/decoration.hpp"
+#include "toolkit/qt/fonts.hpp"
 #include "toolkit/qt/mnemonics.hpp"
 #include "toolkit/qt/rich_text.hpp"
 #include "toolkit/qt/strings.hpp"
+#include "toolkit/qt/widget_colors.hpp"
 
 namespace toolkit::qt {
 
@@ -47,7 +49,7 @@ class ButtonLook final : public QObject {
   void setHighlighted(bool highlighted);
   bool isHighlighted() const { return highlighted_; }
 
-  void setFaceColor(const Color& color) { shown_.face = color; }
+  void setFaceColor(const std::optional<Color>& color) { shown_.face = color; }
   const std::optional<Color>& faceColor() const { return shown_.face; }
   void setBezel(BezelStyle bezel) { shown_.bezel = bezel; }
 
@@ -57,6 +59,7 @@ class ButtonLook final : public QObject {
   bool eventFilter(QObject* watched, QEvent* event) override;
 
  private:
+  void giveToWidget(const TextAttributes& attributes);
   void dropOutline();
   void leaveIfIdle();
 
@@ -64,6 +67,7 @@ class ButtonLook final : public QObject {
   ButtonAppearance shown_;
   QString titleText_;  // what the button was given for the title
   bool hadOwnFont_ = false;
+  std::optional<WidgetColors> colors_;  // of a button that draws its title itself
   bool highlighted_ = false;
   bool isPaintingItself_ = false;
   QTimer outlineEnd_;
@@ -80,11 +84,20 @@ void ButtonLook::setTitle(const AttributedString& title) {
   // Qt measures a button by its font: this makes room for the title in layouts.
   const QFont largest = largestFont(title, own);
   if (QFontMetrics(largest).height() > QFontMetrics(own).height()) button_.setFont(largest);
+  if (!isDrawnByStyle(button_)) giveToWidget(commonAttributes(title));
+}
+
+void ButtonLook::giveToWidget(const TextAttributes& attributes) {
+  if (attributes.font) button_.setFont(qFont(*attributes.font));
+  if (attributes.foregroundColor)
+    colors_.emplace(button_, button_.foregroundRole(), *attributes.foregroundColor);
 }
 
 void ButtonLook::dropTitle() {
   if (!title()) return;
   shown_.title.reset();
+  if (colors_) colors_->restore();
+  colors_.reset();
   button_.setFont(hadOwnFont_ ? shown_.titleFont : QFont());
 }
 
@@ -171,7 +184,7 @@ bool isHighlighted(const QAbstractButton& button) {
   return look && look->isHighlighted();
 }
 
-void setFaceColor(QAbstractButton& button, const Color& color) {
+void setFaceColor(QAbstractButton& button, const std::optional<Color>& color) {
   changeLook(button, [&](ButtonLook& look) { look.setFaceColor(color); });
 }
 

@@ -3,7 +3,9 @@
 //
 // Push buttons, check boxes, radio buttons and tool buttons are drawn by the widget's own style,
 // but for what it does not know: the title's attributes, the colour, the square bezel. Buttons of
-// other classes draw themselves; there the title is plain, and a highlight darkens the whole.
+// other classes draw themselves; there the font and the colour that all of the title has are given
+// to the widget, and the face's colour is laid over what it has drawn. A highlight adds two frames,
+// one dark and one light, as styles and style sheets may draw both looks alike.
 // `QAbstractButton::down` is the user's alone: were it reset by a flash while they hold the button
 // down, Qt would drop their click.
 #pragma once
@@ -31,7 +33,8 @@ void setHighlighted(QAbstractButton& button, bool highlighted);
 bool isHighlighted(const QAbstractButton& button);
 
 /// Colours the button's face; a title without a colour is black or white, what reads better there.
-void setFaceColor(QAbstractButton& button, const Color& color);
+/// An absent colour gives the button its own face back.
+void setFaceColor(QAbstractButton& button, const std::optional<Color>& color);
 /// Absent when it was given none.
 std::optional<Color> faceColor(const QAbstractButton& button);
 

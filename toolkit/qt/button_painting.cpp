@@ -59,20 +59,66 @@ struct Label {
   Qt::Alignment unasked;
 };
 
+/// How wide a frame within `area` is that takes up an eighth of it.
+int widthOfFrame(const QSize& area) {
+  const int wanted = area.width() * area.height() / 8;
+  int width = 1;
+  while (2 * width * (area.width() + area.height() - 2 * width) < wanted) ++width;
+  return width;
+}
+
+QRect paintFrame(QPainter& painter, const QRect& area, const QColor& color) {
+  const int width = widthOfFrame(area.size());
+  const QRect inside = area.adjusted(width, width, -width, -width);
+  for (const QRect& side : QRegion(area) - inside) painter.fillRect(side, color);
+  return inside;
+}
+
+/// The pressed-in look of buttons whose style may draw none. Whatever the ground is like, either
+/// the dark frame or the light one within it stands out: the style's own look is often the same,
+/// or nearly.
+void paintPressedIn(QPainter& painter, const QRect& area) {
+  const QRect inside = paintFrame(painter, area, QColor(0, 0, 0, 180));
+  paintFrame(painter, inside, QColor(255, 255, 255, 180));
+}
+
+/// Colours what is painted already, so that what was dark stays darker than what was light.
+void tint(QPainter& painter, const QRect& area, const QColor& color) {
+  const auto mixed = [&](float strength, float rest) {
+    return QColor::fromRgbF(color.redF() * strength + rest, color.greenF() * strength + rest,
+                            color.blueF() * strength + rest);
+  };
+  painter.setCompositionMode(QPainter::CompositionMode_Multiply);
+  painter.fillRect(area, mixed(0.75F, 0.25F));
+  painter.setCompositionMode(QPainter::CompositionMode_Plus);
+  painter.fillRect(area, mixed(0.4F, 0));
+}
+
 class Painting {
  public:
   Painting(QAbstractButton& button, const ButtonAppearance& appearance)
       : button_(button), appearance_(appearance), painter_(&button) {}
 
   void paint();
-  void paintOutline();
+  /// The colour of a face that the button has painted itself.
+  void paintTint();
+  /// What a highlight looks like, over all else.
+  void paintFlash();
 
  private:
+  void paintOutline();
   void paintPushButton(const QPushButton& button);
+  void paintCommandLink(const QCommandLinkButton& button);
+  void paintDescription(const QCommandLinkButton& button, const QStyleOption& option,
+                        const QRect& place);
   void paintToggle(QStyleOptionButton& option, bool radio);
+  void paintToggleLabel(const QStyleOptionButton& option, const Label& label, bool radio);
   void paintToolButton(const QToolButton& button);
+  void paintToolLabel(QStyleOptionToolButton option, Label label);
+  void paintArrow(const QStyleOption& option, const QRect& place);
+  void paintBevel(const QStyleOptionButton& option);
   void paintSquareBevel(const QStyleOptionButton& option);
-  void paintFocus(const QStyleOptionButton& option);
+  void paintFocus(const QStyleOptionButton& option, QStyle::SubElement place);
   void paintLabel(const Label& label);
   QRect paintIcon(const Label& label);
   void paintTitle(const QRect& place, const Label& label);
@@ -85,7 +131,9 @@ class Painting {
 };
 
 void Painting::paint() {
-  if (const auto* const push = qobject_cast<QPushButton*>(&button_)) {
+  if (const auto* const link = qobject_cast<QCommandLinkButton*>(&button_)) {
+    paintCommandLink(*link);
+  } else if (const auto* const push = qobject_cast<QPushButton*>(&button_)) {
     paintPushButton(*push);
   } else if (const auto* const box = qobject_cast<QCheckBox*>(&button_)) {
     QStyleOptionButton option;
@@ -118,12 +166,7 @@ void Painting::paintPushButton(const QPushButton& button) {
   QStyleOptionButton option;
   (button.*&PushButtonStyle::initStyleOption)(&option);
   adapt(option);
-  if (appearance_.bezel == BezelStyle::texturedSquare) {
-    paintSquareBevel(option);
-  } else {
-    painter_.drawControl(QStyle::CE_PushButtonBevel, option);
-  }
-  if (appearance_.face) paintFace(option);
+  paintBevel(option);
 
   QStyleOptionButton label = option;
   label.rect = button.style()->subElementRect(QStyle::SE_PushButtonContents, &option, &button);
@@ -133,13 +176,61 @@ void Painting::paintPushButton(const QPushButton& button) {
   } else {
     painter_.drawControl(QStyle::CE_PushButtonLabel, label);
   }
-  if (option.state & QStyle::State_HasFocus) paintFocus(option);
+  paintFocus(option, QStyle::SE_PushButtonFocusRect);
 }
 
-void Painting::paintFocus(const QStyleOptionButton& option) {
+void Painting::paintBevel(const QStyleOptionButton& option) {
+  if (appearance_.bezel == BezelStyle::texturedSquare) {
+    paintSquareBevel(option);
+  } else {
+    painter_.drawControl(QStyle::CE_PushButtonBevel, option);
+  }
+  if (appearance_.face) paintFace(option);
+}
+
+// The widget itself places its texts, by the same figures as here.
+void Painting::paintCommandLink(const QCommandLinkButton& button) {
+  QStyleOptionButton option;
+  (button.*&PushButtonStyle::initStyleOption)(&option);
+  adapt(option);
+  option.features |= QStyleOptionButton::CommandLinkButton;
+  paintBevel(option);
+
+  const QSize icon = option.icon.isNull() ? QSize() : option.icon.actualSize(option.iconSize);
+  option.icon.paint(&painter_, QRect(QPoint(7, 10), icon), Qt::AlignCenter,
+                    button.isEnabled() ? QIcon::Normal : QIcon::Disabled);
+  QFont font = button.font();
+  font.setBold(true);
+  font.setPointSizeF(9);
+  const int lineHeight = QFontMetrics(font).height();
+  const bool alone = button.description().isEmpty();
+  QRect place = button.rect().adjusted(icon.width() + 13, 10, -4, 0);
+  if (alone) place.translate(0, std::max(0, (icon.height() - lineHeight) / 2));
+  if (!alone) paintDescription(button, option, place.adjusted(0, lineHeight, 0, -10));
+  if (appearance_.title) {
+    place = alone ? place.adjusted(0, -place.top(), 0, 0)
+                  : QRect(place.topLeft(), QSize(place.width(), lineHeight));
+    paintLabel({place, {}, {}, colorsOf(option.palette), Qt::AlignLeading});
+  } else {
+    painter_.setFont(font);
+    painter_.drawItemText(place, Qt::TextShowMnemonic, option.palette, button.isEnabled(),
+                          button.text(), QPalette::ButtonText);
+  }
+  paintFocus(option, QStyle::SE_PushButtonFocusRect);
+}
+
+void Painting::paintDescription(const QCommandLinkButton& button, const QStyleOption& option,
+                                const QRect& place) {
+  painter_.setFont(button.font());
+  painter_.drawItemText(place, Qt::TextShowMnemonic | Qt::TextWordWrap, option.palette,
+                        button.isEnabled(), button.description(), QPalette::ButtonText);
+}
+
+void Painting::paintFocus(const QStyleOptionButton& option, QStyle::SubElement place) {
+  if (!(option.state & QStyle::State_HasFocus)) return;
   QStyleOptionFocusRect focus;
   focus.QStyleOption::operator=(option);
-  focus.rect = button_.style()->subElementRect(QStyle::SE_PushButtonFocusRect, &option, &button_);
+  focus.rect = button_.style()->subElementRect(place, &option, &button_);
   painter_.drawPrimitive(QStyle::PE_FrameFocusRect, focus);
 }
 
@@ -150,31 +241,72 @@ void Painting::paintToggle(QStyleOptionButton& option, bool radio) {
   Colors colors{option.palette.color(QPalette::WindowText), option.palette.color(QPalette::Window)};
   if (appearance_.face) {
     colors = {option.palette.color(QPalette::ButtonText), qColor(*appearance_.face)};
-    painter_.fillRect(contents.adjusted(-2, 0, 2, 0), colors.ground);
     option.palette.setColor(QPalette::WindowText, colors.ink);
   }
-  const Label label{contents, option.icon, option.iconSize, colors, Qt::AlignLeading};
+  const auto control = radio ? QStyle::CE_RadioButton : QStyle::CE_CheckBox;
+  if (!appearance_.title && !appearance_.face) return painter_.drawControl(control, option);
+  QStyleOptionButton indicator = option;
+  indicator.text.clear();
+  indicator.icon = {};
+  painter_.drawControl(control, indicator);
+  paintToggleLabel(option, {contents, option.icon, option.iconSize, colors, Qt::AlignLeading},
+                   radio);
+}
+
+/// Over what a style sheet may have drawn behind it.
+void Painting::paintToggleLabel(const QStyleOptionButton& option, const Label& label, bool radio) {
+  if (appearance_.face) painter_.fillRect(label.place.adjusted(-2, 0, 2, 0), label.colors.ground);
   if (appearance_.title) {
-    option.text.clear();
-    option.icon = {};
+    paintLabel(label);
+  } else {
+    QStyleOptionButton text = option;
+    text.rect = label.place;
+    painter_.drawControl(radio ? QStyle::CE_RadioButtonLabel : QStyle::CE_CheckBoxLabel, text);
   }
-  painter_.drawControl(radio ? QStyle::CE_RadioButton : QStyle::CE_CheckBox, option);
-  if (appearance_.title) paintLabel(label);
+  if (appearance_.face)
+    paintFocus(option, radio ? QStyle::SE_RadioButtonFocusRect : QStyle::SE_CheckBoxFocusRect);
 }
 
 void Painting::paintToolButton(const QToolButton& button) {
   QStyleOptionToolButton option;
   (button.*&ToolButtonStyle::initStyleOption)(&option);
   adapt(option);
-  const QRect face = button.style()->subControlRect(QStyle::CC_ToolButton, &option,
-                                                    QStyle::SC_ToolButton, &button);
-  const Label label{face, option.icon, option.iconSize, colorsOf(option.palette), Qt::AlignHCenter};
-  if (appearance_.title) {
-    option.text.clear();
-    option.icon = {};
+  if (!appearance_.title && !appearance_.face)
+    return painter_.drawComplexControl(QStyle::CC_ToolButton, option);
+  QStyleOptionToolButton panel = option;
+  panel.text.clear();
+  panel.icon = {};
+  panel.features &= ~QStyleOptionToolButton::Arrow;
+  painter_.drawComplexControl(QStyle::CC_ToolButton, panel);
+  option.rect = button.style()->subControlRect(QStyle::CC_ToolButton, &option,
+                                               QStyle::SC_ToolButton, &button);
+  if (appearance_.face) paintFace(option);
+  paintToolLabel(option, {option.rect, option.icon, option.iconSize, colorsOf(option.palette),
+                          Qt::AlignHCenter});
+}
+
+void Painting::paintToolLabel(QStyleOptionToolButton option, Label label) {
+  const bool opensMenu = option.features & QStyleOptionToolButton::HasMenu;
+  const bool hasPart = option.features & QStyleOptionToolButton::MenuButtonPopup;
+  if (opensMenu && !hasPart)
+    paintArrow(option, QRect(option.rect.bottomRight() - QPoint(9, 9), QSize(7, 7)));
+  if (!appearance_.title) {
+    option.rect.adjust(3, 3, -3, -3);
+    return painter_.drawControl(QStyle::CE_ToolButtonLabel, option);
   }
-  painter_.drawComplexControl(QStyle::CC_ToolButton, option);
-  if (appearance_.title) paintLabel(label);
+  if (option.features & QStyleOptionToolButton::Arrow) {
+    const QRect place = QStyle::alignedRect(option.direction, Qt::AlignLeading | Qt::AlignVCenter,
+                                            QSize(16, 16), label.place.adjusted(4, 0, -4, 0));
+    paintArrow(option, place.adjusted(3, 3, -3, -3));
+    label.place.adjust(20, 0, -20, 0);
+  }
+  paintLabel(label);
+}
+
+void Painting::paintArrow(const QStyleOption& option, const QRect& place) {
+  QStyleOption arrow = option;
+  arrow.rect = place;
+  painter_.drawPrimitive(QStyle::PE_IndicatorArrowDown, arrow);
 }
 
 /// A flat square with a slight sheen, pressed in where the option says so.
@@ -253,10 +385,18 @@ void Painting::paintOutline() {
   painter_.drawRect(QRectF(button_.rect()).adjusted(1, 1, -1, -1));
 }
 
+void Painting::paintFlash() {
+  if (appearance_.pressed) paintPressedIn(painter_, button_.rect());
+  if (appearance_.outlined) paintOutline();
+}
+
+void Painting::paintTint() {
+  if (appearance_.face) tint(painter_, button_.rect(), qColor(*appearance_.face));
+}
+
 }  // namespace
 
 bool isDrawnByStyle(const QAbstractButton& button) {
-  if (qobject_cast<const QCommandLinkButton*>(&button)) return false;
   return qobject_cast<const QPushButton*>(&button) || qobject_cast<const QCheckBox*>(&button) ||
          qobject_cast<const QRadioButton*>(&button) || qobject_cast<const QToolButton*>(&button);
 }
@@ -264,12 +404,13 @@ bool isDrawnByStyle(const QAbstractButton& button) {
 void paintButton(QAbstractButton& button, const ButtonAppearance& appearance) {
   Painting painting(button, appearance);
   painting.paint();
-  if (appearance.outlined) painting.paintOutline();
+  painting.paintFlash();
 }
 
 void paintOver(QAbstractButton& button, const ButtonAppearance& appearance) {
-  if (appearance.pressed) QPainter(&button).fillRect(button.rect(), QColor(0, 0, 0, 80));
-  if (appearance.outlined) Painting(button, appearance).paintOutline();
+  Painting painting(button, appearance);
+  painting.paintTint();
+  painting.paintFlash();
 }
 
 }  // namespace toolkit::qt

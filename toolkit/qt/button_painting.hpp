@@ -28,12 +28,11 @@ struct ButtonAppearance {
 };
 
 /// Whether the button leaves its drawing to the widgets' style, so that it can be drawn here: push
-/// buttons, check boxes, radio buttons and tool buttons.
+/// buttons and command links, check boxes, radio buttons and tool buttons.
 bool isDrawnByStyle(const QAbstractButton& button);
 /// Draws such a button, within a paint event of its own.
 void paintButton(QAbstractButton& button, const ButtonAppearance& appearance);
-/// Adds to any other, which has drawn itself, what can be added: all but the title, the colour and
-/// the bezel.
+/// Adds to any other, which has drawn itself, what can be added: all but the title and the bezel.
 void paintOver(QAbstractButton& button, const ButtonAppearance& appearance);
 
 }  // namespace toolkit::qt

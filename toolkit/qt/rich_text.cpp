@@ -84,6 +84,25 @@ bool isPlain(const AttributedString& text) {
                      [](const TextRun& run) { return run.attributes == TextAttributes{}; });
 }
 
+TextAttributes commonAttributes(const AttributedString& text) {
+  if (text.runs().empty()) return {};
+  TextAttributes common = text.runs().front().attributes;
+  const auto keepEqual = [](auto& mine, const auto& other) {
+    if (mine != other) mine = {};
+  };
+  for (const TextRun& run : text.runs()) {
+    keepEqual(common.font, run.attributes.font);
+    keepEqual(common.foregroundColor, run.attributes.foregroundColor);
+    keepEqual(common.backgroundColor, run.attributes.backgroundColor);
+    keepEqual(common.paragraphStyle, run.attributes.paragraphStyle);
+    keepEqual(common.link, run.attributes.link);
+    keepEqual(common.underline, run.attributes.underline);
+    keepEqual(common.strikethrough, run.attributes.strikethrough);
+    keepEqual(common.superscript, run.attributes.superscript);
+  }
+  return common;
+}
+
 QFont largestFont(const AttributedString& text, const QFont& otherwise) {
   const Font* largest = nullptr;
   for (const TextRun& run : text.runs()) {

@@ -40,6 +40,9 @@ bool hasLinks(const AttributedString& text);
 /// Whether `text` has no attributes at all, so that plain text shows all of it.
 bool isPlain(const AttributedString& text);
 
+/// What all of `text` has in common, of attributes: absent where its parts differ.
+TextAttributes commonAttributes(const AttributedString& text);
+
 /// The largest font in `text`, for whoever has room for one; `otherwise` where it names none.
 QFont largestFont(const AttributedString& text, const QFont& otherwise);
 
