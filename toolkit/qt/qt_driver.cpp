@@ -61,6 +61,14 @@ QWidget* imageView() {
   return label;
 }
 
+// No menu opens here: the arrow tells the button from others.
+QWidget* popUpButton() {
+  auto* const button = new QToolButton;
+  button->setArrowType(Qt::DownArrow);
+  button->setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
+  return button;
+}
+
 struct Kind {
   ViewKind kind;
   std::string_view className;
@@ -71,7 +79,7 @@ constexpr Kind kinds[] = {
     {ViewKind::button, "QPushButton", pushButton},
     {ViewKind::toggle, "QCheckBox", toggle},
     {ViewKind::mixed, "QCheckBox", threeStates},
-    {ViewKind::popUpButton, "QToolButton", plain<QToolButton>},
+    {ViewKind::popUpButton, "QToolButton", popUpButton},
     {ViewKind::textField, "QLabel", textField},
     {ViewKind::imageView, "QLabel", imageView},
     {ViewKind::box, "QGroupBox", plain<QGroupBox>},

@@ -1,0 +1,30 @@
+// SPDX-License-Identifier: MIT
+// What the driver's own views look like.
+
+#include <gtest/gtest.h>
+
+#include <QWidget>
+
+#include "tests/qt/rendering.hpp"
+#include "toolkit/qt/qt_driver.hpp"
+#include "toolkit/qt/widget_node.hpp"
+
+namespace {
+
+using namespace toolkit;
+
+TEST(DriverViews, DrawPopUpButtonsWithAnArrow) {
+  qt::QtDriver driver;
+  const auto window = driver.makeWindow({0, 0, 200, 100});
+  const auto view =
+      driver.makeView(ViewKind::popUpButton, 1, {20, 20, 120, 30}, window->contentView());
+  const auto arrowIn = [&] {
+    const QImage picture = rendering::pictureOf(*qt::WidgetNode::of(view)->widget());
+    return rendering::countPixels(picture, QRect(4, 4, 22, 22), rendering::isDark);
+  };
+  EXPECT_GT(arrowIn(), 8);
+  asButton(view)->setAttributedTitle(AttributedString("Red", {.foregroundColor = colors::red}));
+  EXPECT_GT(arrowIn(), 8) << "beside a title with attributes";
+}
+
+}  // namespace
