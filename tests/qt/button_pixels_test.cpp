@@ -51,9 +51,8 @@ struct ButtonKind {
 };
 
 const ButtonKind buttonKinds[] = {
-    {"push", make<QPushButton>},   {"tool", make<QToolButton>},
-    {"check", make<QCheckBox>},    {"radio", make<QRadioButton>},
-    {"link", make<QCommandLinkButton>}, {"foreign", make<Dial>},
+    {"push", make<QPushButton>},   {"tool", make<QToolButton>},        {"check", make<QCheckBox>},
+    {"radio", make<QRadioButton>}, {"link", make<QCommandLinkButton>}, {"foreign", make<Dial>},
 };
 
 const char* const sheets[] = {
