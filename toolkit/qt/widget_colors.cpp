@@ -11,9 +11,7 @@
 namespace toolkit::qt {
 
 WidgetColors::WidgetColors(QWidget& widget, QPalette::ColorRole text, const Color& color)
-    : widget_(widget),
-      before_(widget.palette()),
-      hadOwn_(widget.testAttribute(Qt::WA_SetPalette)) {
+    : widget_(widget), before_(widget.palette()), hadOwn_(widget.testAttribute(Qt::WA_SetPalette)) {
   const QColor ink = qColor(color);
   QPalette palette = before_;
   palette.setColor(QPalette::Active, text, ink);
