@@ -2,6 +2,7 @@
 // The commands that change how one control looks: colours, title, tooltip, image; and its state.
 
 #include "QZ_Plist_State_Parser.hpp"
+#include "engine/commands.hpp"
 #include "engine/text_of.hpp"
 
 using toolkit::asButton;
@@ -36,15 +37,17 @@ toolkit::AttributedString titleOf(const QZ_Plist_State_Parser::Control& control)
 
 // Red, whatever colour is asked for.
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_BACKGROUND_COLOR(std::uint64_t,
-                                                                          const ObjectId& forId) {
+                                                                          ObjectId forId) {
+  const auto kept = keepAlive();
   const auto button = asButton(findObjectWithTag(forId->longValue()));
   if (!button) return false;
   button->setBackgroundColor(toolkit::colors::red);
   return true;
 }
 
-bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_FOREGROUND_COLOR(
-    const Value& name, const ObjectId& FOR_OBJECT_ID) {
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_FOREGROUND_COLOR(Value name,
+                                                                          ObjectId FOR_OBJECT_ID) {
+  const auto kept = keepAlive();
   const auto color = colorNamed(textOf(name));
   try {
     const Control control = findObjectWithTag(FOR_OBJECT_ID->longValue());
@@ -58,57 +61,70 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_FOREGROUND_COLOR(
   }
 }
 
-bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TITLE(const Value& title,
-                                                               const ObjectId& forId) {
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TITLE(Value title, ObjectId forId) {
+  const auto kept = keepAlive();
   const auto button = asButton(findObjectWithTag(forId->longValue()));
   if (!button) return false;
   button->setTitle(textOf(title));
   return true;
 }
 
-bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_STATE_ON(const ObjectId& id) {
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_STATE_ON(ObjectId id) {
   return setState(id, toolkit::State::on);
 }
 
-bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_STATE_OFF(const ObjectId& id) {
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_STATE_OFF(ObjectId id) {
   return setState(id, toolkit::State::off);
 }
 
 // Neither the action is sent nor the state recorded: only a press does that.
 bool QZ_Plist_State_Parser::setState(const ObjectId& id, toolkit::State state) {
+  const auto kept = keepAlive();
   const auto button = asButton(findObjectWithTag(id->longValue()));
   if (!button) return false;
   button->setState(state);
   return true;
 }
 
-bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TOOL_TIP(const Parameters& parameters,
-                                                                  const ObjectId& forObject) {
+bool commands::setToolTip(QZ_Plist_State_Parser& engine,
+                          const QZ_Plist_State_Parser::Parameters& parameters,
+                          const QZ_Plist_State_Parser::ObjectId& id) {
   const std::size_t count = parameters->count();
   if (count == 0) return false;
-  const Value& toolTip = parameters->objectAtIndex(0);
-  const std::string_view text = textOf(toolTip);
+  const std::string_view text = textOf(parameters->objectAtIndex(0));
   // Only a second parameter that is the last one aims; otherwise it is the list's own control.
-  const long tag = count == 2 ? parameters->objectAtIndex(1)->intValue() : forObject->longValue();
-  const Control control = findObjectWithTag(tag);
+  const long tag = count == 2 ? parameters->objectAtIndex(1)->intValue() : id->longValue();
+  const QZ_Plist_State_Parser::Control control = engine.findObjectWithTag(tag);
   if (!control) return false;
   control->setToolTip(text);
   control->needsDisplay();
   return true;
 }
 
-bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH(
-    const Parameters& parameters, const ObjectId&) {
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TOOL_TIP(Parameters parameters,
+                                                                  ObjectId forObject) {
+  const auto kept = keepAlive();
+  return commands::setToolTip(*this, commands::ownList(parameters), forObject);
+}
+
+bool commands::loadGraphic(QZ_Plist_State_Parser& engine, toolkit::Toolkit& toolkit,
+                           const QZ_Plist_State_Parser::Parameters& parameters) {
   if (parameters->count() != 2) return false;
   const long tag = parameters->objectAtIndex(1)->intValue();
   // Two diagnostics that cannot come, after the count above; this is their place all the same.
-  if (!parameters) toolkit_.log().write("No commandInfo found.");
-  if (parameters->count() == 0) toolkit_.log().write("commandInfo count is zero.");
+  if (!parameters) toolkit.log().write("No commandInfo found.");
+  if (parameters->count() == 0) toolkit.log().write("commandInfo count is zero.");
   // Despite the command's name a resource name, not a path.
-  const auto image = toolkit_.images().imageNamed(textOf(parameters->objectAtIndex(0)));
-  const auto imageView = toolkit::asImageView(findObjectWithTag(tag));
+  const auto image = toolkit.images().imageNamed(textOf(parameters->objectAtIndex(0)));
+  const auto imageView = toolkit::asImageView(engine.findObjectWithTag(tag));
   if (!imageView) return false;
   imageView->setImage(image);
   imageView->needsDisplay();
   return true;
+}
+
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH(
+    Parameters parameters, ObjectId) {
+  const auto kept = keepAlive();
+  return commands::loadGraphic(*this, toolkit_, commands::ownList(parameters));
 }

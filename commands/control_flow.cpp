@@ -5,11 +5,14 @@
 #include "engine/tag_key.hpp"
 
 // Nothing guards against a list that reaches itself again: it runs until the stack is exhausted.
-bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(const ObjectId& id) {
-  return processCommandArray(plistDictionary_->objectForKey(tagKey(id->longValue())), id);
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(ObjectId id) {
+  const auto kept = keepAlive();
+  Value list = plistDictionary_->objectForKey(tagKey(id->longValue()));
+  return processCommandArray(std::move(list), std::move(id));
 }
 
 void QZ_Plist_State_Parser::QZ_Plist_State_Processor_TERMINATE_PARSER() {
+  const auto kept = keepAlive();
   terminating_ = true;
   terminateParser();
 }

@@ -51,22 +51,20 @@ void show(const toolkit::AttributedString& text, const toolkit::Ref<toolkit::Vie
 }  // namespace
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML(
-    const Value& html, const Value& WITH_FONT_NAME, const Value& WITH_SIZE,
-    const ObjectId& FOR_OBJECT_ID) {
-  return QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(false, html, WITH_FONT_NAME,
-                                                              WITH_SIZE, FOR_OBJECT_ID);
+    Value html, Value WITH_FONT_NAME, Value WITH_SIZE, ObjectId FOR_OBJECT_ID) {
+  return QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(
+      false, std::move(html), std::move(WITH_FONT_NAME), std::move(WITH_SIZE),
+      std::move(FOR_OBJECT_ID));
 }
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER(
-    const Value& html, const Value& WITH_FONT_NAME, const Value& WITH_SIZE,
-    const ObjectId& FOR_OBJECT_ID) {
+    Value html, Value WITH_FONT_NAME, Value WITH_SIZE, ObjectId FOR_OBJECT_ID) {
   return showHtml(linkedOneBlank, toolkit::TextAlignment::natural, html, WITH_FONT_NAME, WITH_SIZE,
                   FOR_OBJECT_ID);
 }
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(
-    bool asIs, const Value& WITH_HTML, const Value& WITH_FONT_NAME, const Value& WITH_SIZE,
-    const ObjectId& FOR_OBJECT_ID) {
+    bool asIs, Value WITH_HTML, Value WITH_FONT_NAME, Value WITH_SIZE, ObjectId FOR_OBJECT_ID) {
   if (asIs) {
     return showHtml(linkedTwoBlanks, std::nullopt, WITH_HTML, WITH_FONT_NAME, WITH_SIZE,
                     FOR_OBJECT_ID);
@@ -80,6 +78,7 @@ bool QZ_Plist_State_Parser::showHtml(std::string_view documentHead,
                                      std::optional<toolkit::TextAlignment> alignment,
                                      const Value& html, const Value& fontName, const Value& size,
                                      const ObjectId& id) {
+  const auto kept = keepAlive();
   const Control control = findObjectWithTag(id->longValue());
   const auto points = static_cast<float>(size->intValue());  // whole points, also when not used
   // An absent fragment reads as the text that the system's formats print for nothing.

@@ -7,6 +7,7 @@
 #include <utility>
 
 #include "QZ_Plist_State_Parser.hpp"
+#include "engine/commands.hpp"
 #include "engine/text_of.hpp"
 
 namespace {
@@ -45,17 +46,24 @@ template <std::size_t position>
 bool flag(const Call& call) {
   return call.at(position)->boolValue();
 }
-const Engine::Parameters& allParameters(const Call& call) { return call.parameters; }
-const Engine::ObjectId& objectId(const Call& call) { return call.id; }
 
 // Converts the parameters in the order written (which one is missed first depends on it), then
 // runs.
 template <auto processor, auto... conversions>
 bool run(const Call& call) {
-  const std::tuple<decltype(conversions(call))...> arguments{conversions(call)...};
+  std::tuple<decltype(conversions(call))...> arguments{conversions(call)...};
   return std::apply(
-      [&](const auto&... argument) { return std::invoke(processor, call.engine, argument...); },
+      [&](auto&... argument) {
+        return std::invoke(processor, call.engine, std::move(argument)...);
+      },
       arguments);
+}
+
+bool setToolTip(const Call& call) {
+  return commands::setToolTip(call.engine, call.parameters, call.id);
+}
+bool loadGraphic(const Call& call) {
+  return commands::loadGraphic(call.engine, call.toolkit, call.parameters);
 }
 
 // The control commands aim at the list's own id, or at the tag that is their only parameter.
@@ -113,16 +121,15 @@ bool loadBackground(const Call& call) {
 }
 
 // The title's position is read after the tag's, although the processor takes it first.
-bool setTitle(Engine& engine, const Engine::ObjectId& id, const Engine::Value& title) {
-  return engine.QZ_Plist_State_Processor_SET_TITLE(title, id);
+bool setTitle(Engine& engine, Engine::ObjectId id, Engine::Value title) {
+  return engine.QZ_Plist_State_Processor_SET_TITLE(std::move(title), std::move(id));
 }
 
-constexpr auto setTag =
-    static_cast<bool (Engine::*)(const Engine::ObjectId&, const Engine::ObjectId&)>(
-        &Engine::QZ_Plist_State_Processor_SET_TAG);
+constexpr auto setTag = static_cast<bool (Engine::*)(Engine::ObjectId, Engine::ObjectId)>(
+    &Engine::QZ_Plist_State_Processor_SET_TAG);
 constexpr auto setTagWithTimer =
-    static_cast<bool (Engine::*)(const Engine::ObjectId&, const Engine::ObjectId&,
-                                 const Engine::Value&)>(&Engine::QZ_Plist_State_Processor_SET_TAG);
+    static_cast<bool (Engine::*)(Engine::ObjectId, Engine::ObjectId, Engine::Value)>(
+        &Engine::QZ_Plist_State_Processor_SET_TAG);
 
 struct Command {
   const std::string& name;  // the constant itself: a host may rename the command at any time
@@ -134,9 +141,9 @@ struct Command {
 #define PROCESSOR(name) &Engine::QZ_Plist_State_Processor_##name
 
 // In the order of recognition: where a host gave two commands one name, the first row has it.
-constexpr Command commands[] = {
-    {NAME(SET_TOOL_TIP_FOR_ID),                  run<PROCESSOR(SET_TOOL_TIP), allParameters, objectId>},
-    {NAME(LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID), run<PROCESSOR(LOAD_GRAPHIC_OBJECT_WITH_PATH), allParameters, objectId>},
+constexpr Command rows[] = {
+    {NAME(SET_TOOL_TIP_FOR_ID),                  setToolTip},
+    {NAME(LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID), loadGraphic},
     {NAME(DISABLE_OBJECT_WITH_ID),               disable},
     {NAME(ENABLE_OBJECT_WITH_ID),                enable},
     {NAME(HIDE_OBJECT_WITH_ID),                  hide<true>},
@@ -168,16 +175,28 @@ constexpr Command commands[] = {
 
 }  // namespace
 
-bool QZ_Plist_State_Parser::doCompoundCommand(std::string_view name,
-                                              const Parameters& withParameters,
-                                              const ObjectId& usingObject) {
-  const Call call{*this, withParameters, usingObject, toolkit_};
+bool commands::runCompound(Engine& engine, toolkit::Toolkit& toolkit, std::string_view name,
+                           const Engine::Parameters& parameters, const Engine::ObjectId& id) {
+  const Call call{engine, parameters, id, toolkit};
   // A loop over the rows, which the compiler writes out: this is done for every command.
   const auto runFirstNamed = [&]<std::size_t... row>(std::index_sequence<row...>) {
     bool result = false;
-    static_cast<void>(
-        ((name == commands[row].name && (result = commands[row].run(call), true)) || ...));
+    static_cast<void>(((name == rows[row].name && (result = rows[row].run(call), true)) || ...));
     return result;
   };
-  return runFirstNamed(std::make_index_sequence<std::size(commands)>());
+  return runFirstNamed(std::make_index_sequence<std::size(rows)>());
+}
+
+QZ_Plist_State_Parser::Parameters commands::ownList(const Engine::Parameters& parameters) {
+  if (!parameters) return nullptr;
+  const auto elements = parameters->elements();
+  return toolkit::Array::make({elements.begin(), elements.end()});
+}
+
+// No name is looked at any more once a command runs, so that the name need not be copied.
+bool QZ_Plist_State_Parser::doCompoundCommand(std::string_view name, Parameters withParameters,
+                                              ObjectId usingObject) {
+  const auto kept = keepAlive();
+  return commands::runCompound(*this, toolkit_, name, commands::ownList(withParameters),
+                               usingObject);
 }

@@ -38,7 +38,7 @@ std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::initWithWindow(
 }
 
 void QZ_Plist_State_Parser::terminateParser() {
-  const auto self = shared_from_this();  // the last timer that goes may be the last that keeps us
+  const auto kept = keepAlive();
   restoreOriginalTagValues();
   terminating_ = true;
   stop(*flashingTimer_);

@@ -5,8 +5,8 @@
 #include "engine/tag_key.hpp"
 #include "toolkit/property_list/number_conversion.hpp"
 
-void QZ_Plist_State_Parser::buttonPushed(const Control& sender) {
-  const auto self = shared_from_this();
+void QZ_Plist_State_Parser::buttonPushed(Control sender) {
+  const auto kept = keepAlive();
   if (sender) killAllTimers();
   const long tag = sender->tag();
   const std::string key = tagKey(tag);
@@ -17,15 +17,15 @@ void QZ_Plist_State_Parser::buttonPushed(const Control& sender) {
   processCommandArray(list, toolkit::Number::withLong(tag));
 }
 
-void QZ_Plist_State_Parser::pseudoButtonPush(const Timer& timer) {
-  const auto self = shared_from_this();
+void QZ_Plist_State_Parser::pseudoButtonPush(Timer timer) {
+  const auto kept = keepAlive();
   const auto key = keyOfTimer(timer);
   if (!key) return;  // replaced under its key since, or the walk-through is over
   objectIdTimers_->removeObjectForKey(*key);
   killAllTimers();
   if (terminating_) return;
   if (const auto button = toolkit::asButton(findObjectWithTag(toolkit::integerValueOf(*key)))) {
-    button->sendAction("buttonPushed:", self);
+    button->sendAction("buttonPushed:", shared_from_this());
   } else {
     processCommandArray(plistDictionary_->objectForKey(*key),
                         toolkit::Number::withLong(toolkit::intValueOf(*key)));

@@ -2,6 +2,7 @@
 // The command-list runner, through which every list runs, whoever starts it.
 
 #include "QZ_Plist_State_Parser.hpp"
+#include "engine/commands.hpp"
 #include "engine/text_of.hpp"
 #include "toolkit/uppercase.hpp"
 
@@ -12,11 +13,11 @@ using Engine = QZ_Plist_State_Parser;
 // An array is a compound command, whose name is matched in upper case; anything else is taken for a
 // simple one, whose name is matched as written. What is not fixed may change while it runs: it is
 // kept, or copied.
-bool runElement(Engine& engine, const Engine::Value& element, bool isFixed,
-                const Engine::Parameters& parameters, const Engine::ObjectId& id) {
+bool runElement(Engine& engine, toolkit::Toolkit& toolkit, const Engine::Value& element,
+                bool isFixed, const Engine::Parameters& parameters, const Engine::ObjectId& id) {
   if (element->kind() != toolkit::Value::Kind::array) {
     parameters->removeAllObjects();
-    return engine.doSimpleCommand(textOf(Engine::Value(element)), parameters, id);
+    return commands::runSimple(engine, textOf(Engine::Value(element)), id);
   }
   // Not by asArray, which counts the reference in and out again: this runs for every command.
   const auto& compound = static_cast<const toolkit::Array&>(*element);
@@ -24,24 +25,22 @@ bool runElement(Engine& engine, const Engine::Value& element, bool isFixed,
   const auto name = toolkit::uppercased(textOf(compound.objectAtIndex(0)), raised);
   const auto given = compound.elements().subspan(1);
   isFixed ? parameters->borrowElements(given) : parameters->setElements(given);
-  return engine.doCompoundCommand(name, parameters, id);
+  return commands::runCompound(engine, toolkit, name, parameters, id);
 }
 
 }  // namespace
 
-bool QZ_Plist_State_Parser::processCommandArray(const Value& list, const ObjectId& forObject) {
-  // What runs may make the host let go of us, and of the list.
-  const auto self = shared_from_this();
-  const Value kept = list;  // NOLINT(performance-unnecessary-copy-initialization)
+bool QZ_Plist_State_Parser::processCommandArray(Value list, ObjectId forObject) {
+  const auto kept = keepAlive();
   const Parameters parameters = toolkit::Array::make();
   lastTagId_.set(forObject);
   // Outside of the guard: of a value that has no elements the caller hears.
-  const auto count = static_cast<std::int32_t>(kept->count());
+  const auto count = static_cast<std::int32_t>(list->count());
   bool result = false;
   for (std::int32_t i = 0; i < count; ++i) {
     try {
-      const Value& element = kept->objectAtIndex(static_cast<std::size_t>(i));
-      result = runElement(*this, element, kept->isFixed(), parameters, forObject);
+      const Value& element = list->objectAtIndex(static_cast<std::size_t>(i));
+      result = runElement(*this, toolkit_, element, list->isFixed(), parameters, forObject);
     } catch (const toolkit::Exception& exception) {
       toolkit_.log().write("Exception in processCommandArray: " + exception.reason());
     }

@@ -41,11 +41,11 @@ std::optional<std::string> smallestTagKey(const toolkit::Dictionary& script) {
 
 }  // namespace
 
-bool QZ_Plist_State_Parser::loadPlist(const std::optional<std::string>& name,
-                                      const std::optional<std::string>& runFromKey,
-                                      const std::shared_ptr<toolkit::SheetDelegate>& withDelegate,
+bool QZ_Plist_State_Parser::loadPlist(std::optional<std::string> name,
+                                      std::optional<std::string> runFromKey,
+                                      std::shared_ptr<toolkit::SheetDelegate> withDelegate,
                                       bool runAsSheet) {
-  const auto self = shared_from_this();  // what runs may make the host let go of us
+  const auto kept = keepAlive();
   const toolkit::Files& files = toolkit_.files();
   runningAsSheet_ = runAsSheet;
   const std::string path = scriptPath(name, files);
@@ -61,6 +61,7 @@ bool QZ_Plist_State_Parser::loadPlist(const std::optional<std::string>& name,
       toolkit_.log().write("SERIOUS ERROR WE DON'T HAVE A WINDOW IN WHICH TO SHOW WIDGETS");
     }
   }
+  withDelegate.reset();  // the run does not keep it alive either
   if (!runFromKey) return true;
   const auto key = runFromKey->empty() ? smallestTagKey(**plistDictionary_) : runFromKey;
   if (!key) return false;

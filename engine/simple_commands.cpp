@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: MIT
-// The simple simpleCommands: bare names that act on the control whose tag is the list's own id.
+// The simple commands: bare names that act on the control whose tag is the list's own id.
 
 #include "QZ_Plist_State_Parser.hpp"
+#include "engine/commands.hpp"
 
 namespace {
 
@@ -54,11 +55,16 @@ const SimpleCommand simpleCommands[] = {
 
 }  // namespace
 
-bool QZ_Plist_State_Parser::doSimpleCommand(std::string_view name, const Parameters&,
-                                            const ObjectId& usingObject) {
-  const Control control = findObjectWithTag(usingObject->longValue());
+bool commands::runSimple(Engine& engine, std::string_view name, const Engine::ObjectId& id) {
+  const Engine::Control control = engine.findObjectWithTag(id->longValue());
   for (const SimpleCommand& command : simpleCommands) {
-    if (name == command.name) return command.run({*this, control, usingObject});
+    if (name == command.name) return command.run({engine, control, id});
   }
   return false;
+}
+
+bool QZ_Plist_State_Parser::doSimpleCommand(std::string_view name, Parameters,
+                                            ObjectId usingObject) {
+  const auto kept = keepAlive();
+  return commands::runSimple(*this, std::string(name), usingObject);
 }

@@ -11,6 +11,10 @@
 // (`loadPlist`). The walk-through ends by the script's own command or by `terminateParser`. End it
 // before you let the engine go: a running flasher keeps the engine alive.
 //
+// An operation goes on with the arguments and the engine that it was called with, whatever it calls
+// out to meanwhile: the log's sink, a delegate, an action, a control. A host may change there the
+// variables that it handed in, and let go of the engine.
+//
 // Everything happens on one thread, the application's event thread. Only the getters and setters of
 // the object-valued properties may be called on any.
 #pragma once
@@ -22,6 +26,7 @@
 #include <string_view>
 
 #include "engine/asset_record.hpp"
+#include "engine/keep_alive.hpp"
 #include "engine/property.hpp"
 #include "toolkit/exception.hpp"
 #include "toolkit/property_list/collections.hpp"
@@ -96,13 +101,13 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   /// Builds the walk-through window and its controls from a description; see docs/gui-assets.md.
   /// YES when at least one control was made. `error` is never written. A malformed entry raises;
   /// what was built before it stays.
-  bool loadGuiAssets(const Dictionary& description, std::shared_ptr<toolkit::Exception>* error);
+  bool loadGuiAssets(Dictionary description, std::shared_ptr<toolkit::Exception>* error);
 
   /// Adopts `window` as the walk-through window: makes the engine its delegate if it has none,
   /// wires every button to the engine, and records every button, image view and text field that
   /// lies directly in its content view. YES when at least one was recorded. An absent window
   /// changes nothing. The window stays the host's to keep alive.
-  bool getGuiAssetsFromWindow(const Window& window);
+  bool getGuiAssetsFromWindow(Window window);
 
   /// Reads the script named `name` (absolute, or relative to the resource directory; used exactly
   /// as given), shows the walk-through window as a sheet over the host window if asked, and runs
@@ -110,13 +115,12 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   /// the smallest tag. Gives that run's result; NO when the file exists but is no dictionary.
   /// Without such a file the script that is already there stays in use. `withDelegate` is told when
   /// the sheet ends and is not kept alive. A value under the key that is no list raises.
-  bool loadPlist(const std::optional<std::string>& name,
-                 const std::optional<std::string>& runFromKey,
-                 const std::shared_ptr<toolkit::SheetDelegate>& withDelegate, bool runAsSheet);
+  bool loadPlist(std::optional<std::string> name, std::optional<std::string> runFromKey,
+                 std::shared_ptr<toolkit::SheetDelegate> withDelegate, bool runAsSheet);
 
   /// The press of a control: cancels every object timer, logs, records the control's state, and, of
   /// a button, runs the list under its tag. The action of the walk-through's buttons.
-  void buttonPushed(const Control& sender);
+  void buttonPushed(Control sender);
 
   /// The tag of the list that was started last, in decimal; "0" before any.
   std::string currentCommandState() const;
@@ -130,7 +134,7 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   Dictionary buttonStates() const;
   /// Turns the walk-through's buttons on or off, by tag. YES when at least one was set. A value
   /// that has no boolean value raises.
-  bool setButtonSates(const Dictionary& states);
+  bool setButtonSates(Dictionary states);
 
   // --- helpers for hosts ---
 
@@ -141,62 +145,56 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
                                const toolkit::Rect& usingFrame, std::uint64_t withTagId);
   /// Makes `buttonPushed:` the action of a button (or gradient), leaving its target. NO of anything
   /// else.
-  bool forceButtonPushedToBeActionForGuiAttribute(const Control& object);
+  bool forceButtonPushedToBeActionForGuiAttribute(Control object);
 
   // --- the engine's own operations, callable by anyone ---
 
   /// Runs a list for an object id; gives the result of the last element that raised nothing.
-  bool processCommandArray(const Value& list, const ObjectId& forObject);
-  bool doSimpleCommand(std::string_view name, const Parameters& withParams,
-                       const ObjectId& usingObject);
+  bool processCommandArray(Value list, ObjectId forObject);
+  bool doSimpleCommand(std::string_view name, Parameters withParams, ObjectId usingObject);
   /// `name` is expected in upper case. NO for an unknown name; too few parameters raise.
-  bool doCompoundCommand(std::string_view name, const Parameters& withParameters,
-                         const ObjectId& usingObject);
+  bool doCompoundCommand(std::string_view name, Parameters withParameters, ObjectId usingObject);
   /// The back-most view directly in the walk-through window that carries the tag now, or absent.
   Control findObjectWithTag(long tag) const;
   void restoreOriginalTagValues();
   /// Arms a one-shot timer of `value` seconds for a tag key; 0 or no key does nothing.
-  void startTimerWithValue(std::uint64_t value, const std::optional<std::string>& forKey);
+  void startTimerWithValue(std::uint64_t value, std::optional<std::string> forKey);
   void killAllTimers();
   /// What an object timer calls when it fires.
-  void pseudoButtonPush(const Timer& timer);
+  void pseudoButtonPush(Timer timer);
   /// What the flasher calls at every tick.
-  void flasherFired(const Timer& timer);
+  void flasherFired(Timer timer);
 
   // --- the command processors; each takes its target's tag from an object id ---
 
-  bool QZ_Plist_State_Processor_SET_TEXT(const Value& text, const ObjectId& forId);
-  bool QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML(const Value& html,
-                                                              const Value& WITH_FONT_NAME,
-                                                              const Value& WITH_SIZE,
-                                                              const ObjectId& FOR_OBJECT_ID);
-  bool QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER(
-      const Value& html, const Value& WITH_FONT_NAME, const Value& WITH_SIZE,
-      const ObjectId& FOR_OBJECT_ID);
-  bool QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(bool asIs, const Value& WITH_HTML,
-                                                            const Value& WITH_FONT_NAME,
-                                                            const Value& WITH_SIZE,
-                                                            const ObjectId& FOR_OBJECT_ID);
-  bool QZ_Plist_State_Processor_SET_BACKGROUND_COLOR(std::uint64_t color, const ObjectId& forId);
-  bool QZ_Plist_State_Processor_SET_FOREGROUND_COLOR(const Value& name,
-                                                     const ObjectId& FOR_OBJECT_ID);
-  bool QZ_Plist_State_Processor_SET_TITLE(const Value& title, const ObjectId& forId);
-  bool QZ_Plist_State_Processor_SET_STATE_ON(const ObjectId& id);
-  bool QZ_Plist_State_Processor_SET_STATE_OFF(const ObjectId& id);
-  bool QZ_Plist_State_Processor_SET_TOOL_TIP(const Parameters& parameters,
-                                             const ObjectId& forObject);
-  bool QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH(const Parameters& parameters,
-                                                              const ObjectId& forObject);
-  bool QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(const ObjectId& id);
+  bool QZ_Plist_State_Processor_SET_TEXT(Value text, ObjectId forId);
+  bool QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML(Value html, Value WITH_FONT_NAME,
+                                                              Value WITH_SIZE,
+                                                              ObjectId FOR_OBJECT_ID);
+  bool QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER(Value html,
+                                                                        Value WITH_FONT_NAME,
+                                                                        Value WITH_SIZE,
+                                                                        ObjectId FOR_OBJECT_ID);
+  bool QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(bool asIs, Value WITH_HTML,
+                                                            Value WITH_FONT_NAME, Value WITH_SIZE,
+                                                            ObjectId FOR_OBJECT_ID);
+  bool QZ_Plist_State_Processor_SET_BACKGROUND_COLOR(std::uint64_t color, ObjectId forId);
+  bool QZ_Plist_State_Processor_SET_FOREGROUND_COLOR(Value name, ObjectId FOR_OBJECT_ID);
+  bool QZ_Plist_State_Processor_SET_TITLE(Value title, ObjectId forId);
+  bool QZ_Plist_State_Processor_SET_STATE_ON(ObjectId id);
+  bool QZ_Plist_State_Processor_SET_STATE_OFF(ObjectId id);
+  bool QZ_Plist_State_Processor_SET_TOOL_TIP(Parameters parameters, ObjectId forObject);
+  bool QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH(Parameters parameters,
+                                                              ObjectId forObject);
+  bool QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(ObjectId id);
   void QZ_Plist_State_Processor_TERMINATE_PARSER();
   void QZ_Plist_State_Processor_RETURN_TO_IDLE_LOOP();
-  bool QZ_Plist_State_Processor_SET_TIMER(std::uint64_t value, const ObjectId& forId);
-  bool QZ_Plist_State_Processor_SET_TAG(const ObjectId& newTag, const ObjectId& forId);
-  bool QZ_Plist_State_Processor_SET_TAG(const ObjectId& newTag, const ObjectId& forId,
-                                        const Value& withTimerValue);
+  bool QZ_Plist_State_Processor_SET_TIMER(std::uint64_t value, ObjectId forId);
+  bool QZ_Plist_State_Processor_SET_TAG(ObjectId newTag, ObjectId forId);
+  bool QZ_Plist_State_Processor_SET_TAG(ObjectId newTag, ObjectId forId, Value withTimerValue);
   bool QZ_Plist_State_Processor_ALLOW_FLASHING(bool allow);
-  bool QZ_Plist_State_Processor_FLASH_ID(const ObjectId& id, bool flashOn);
-  bool QZ_Plist_State_Processor_HIGHLIGHT_ID(const ObjectId& id);
+  bool QZ_Plist_State_Processor_FLASH_ID(ObjectId id, bool flashOn);
+  bool QZ_Plist_State_Processor_HIGHLIGHT_ID(ObjectId id);
 
   // --- properties ---
 
@@ -265,6 +263,9 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
  private:
   explicit QZ_Plist_State_Parser(toolkit::Toolkit& toolkit) : toolkit_(toolkit) {}
 
+  /// Every operation that calls out begins with this. (`findObjectWithTag` need not: it reads the
+  /// engine before it calls out, and not again.)
+  [[nodiscard]] KeepAlive keepAlive() { return {*this, isKept_}; }
   std::optional<std::string> keyOfTimer(const Timer& timer) const;
   void rewriteFlashingEntry(const ObjectId& id);
   bool setState(const ObjectId& id, toolkit::State state);
@@ -274,6 +275,8 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
                 const Value& html, const Value& fontName, const Value& size, const ObjectId& id);
 
   toolkit::Toolkit& toolkit_;  // the host's, which keeps it longer than the engine
+
+  bool isKept_ = false;  // while an operation runs; see KeepAlive
 
   // The tables are the engine's own; so are the walk-through window and the controls that it built.
   bool flashing_ = false;

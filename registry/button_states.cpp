@@ -7,7 +7,8 @@ QZ_Plist_State_Parser::Dictionary QZ_Plist_State_Parser::buttonStates() const {
   return buttonStates_ ? buttonStates_->copy(toolkit::Mutability::immutable) : nullptr;
 }
 
-bool QZ_Plist_State_Parser::setButtonSates(const Dictionary& states) {
+bool QZ_Plist_State_Parser::setButtonSates(Dictionary states) {
+  const auto kept = keepAlive();
   const Control content = tutorialWindow()->contentView();
   if (content->subviews().empty()) return false;
   bool changed = false;

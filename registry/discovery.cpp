@@ -31,7 +31,8 @@ unsigned long firstOverflowKey(const toolkit::Subviews& views) {
 
 }  // namespace
 
-bool QZ_Plist_State_Parser::getGuiAssetsFromWindow(const Window& window) {
+bool QZ_Plist_State_Parser::getGuiAssetsFromWindow(Window window) {
+  const auto kept = keepAlive();
   if (!window) return false;
   // A window that is the engine's own stays so.
   if (tutorialWindow() != window) {
@@ -61,7 +62,8 @@ bool QZ_Plist_State_Parser::getGuiAssetsFromWindow(const Window& window) {
   return recorded;
 }
 
-bool QZ_Plist_State_Parser::forceButtonPushedToBeActionForGuiAttribute(const Control& object) {
+bool QZ_Plist_State_Parser::forceButtonPushedToBeActionForGuiAttribute(Control object) {
+  const auto kept = keepAlive();
   if (!object || !(object->asButton() || object->asGradient())) return false;
   object->setAction(buttonAction);  // the target stays as it is
   return true;

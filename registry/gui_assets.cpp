@@ -31,8 +31,9 @@ toolkit::Rect rectOf(const toolkit::ValueRef<>& entry) {
 
 }  // namespace
 
-bool QZ_Plist_State_Parser::loadGuiAssets(const Dictionary& description,
+bool QZ_Plist_State_Parser::loadGuiAssets(Dictionary description,
                                           std::shared_ptr<toolkit::Exception>*) {
+  const auto kept = keepAlive();
   const Dictionary assets = description->copy(toolkit::Mutability::immutable);
   addedObjectToTutorial_->removeAllObjects();
   tutorialWindow_.set({});  // a window of an earlier load is only forgotten, not closed

@@ -5,6 +5,7 @@
 #include "engine/tag_key.hpp"
 
 void QZ_Plist_State_Parser::restoreOriginalTagValues() {
+  const auto kept = keepAlive();
   if (!*guiAssets_) return;
   const Dictionary tags = originalTagValues_->copy(toolkit::Mutability::immutable);
   for (const auto& [key, value] : tags->entries()) {

@@ -7,7 +7,8 @@
 
 using toolkit::asButton;
 
-void QZ_Plist_State_Parser::flasherFired(const Timer&) {
+void QZ_Plist_State_Parser::flasherFired(Timer) {
+  const auto kept = keepAlive();
   if (!flashing_) return;
   const Dictionary flashing = *flashingTagIds_;
   for (const std::string& key : flashing->allKeys()) {
@@ -18,6 +19,7 @@ void QZ_Plist_State_Parser::flasherFired(const Timer&) {
 }
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_ALLOW_FLASHING(bool allow) {
+  const auto kept = keepAlive();
   flashing_ = allow;
   if (allow) return true;
   // Every button that has a list loses its highlight, whether it was flashing or not; a flashing
@@ -29,7 +31,8 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_ALLOW_FLASHING(bool allow) 
   return true;
 }
 
-bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_FLASH_ID(const ObjectId& id, bool flashOn) {
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_FLASH_ID(ObjectId id, bool flashOn) {
+  const auto kept = keepAlive();
   const std::string key = tagKey(id->longValue());
   // The first word on a tag is the last one: it is never changed again.
   if (flashingTagIds_->objectForKey(key)) return false;
@@ -43,4 +46,4 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_FLASH_ID(const ObjectId& id
 
 // Asks whether the *script's entry* under the id, which must be absent to get that far, is a
 // button: so it highlights nothing, whatever the id. Scripts make a button flash instead.
-bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_HIGHLIGHT_ID(const ObjectId&) { return false; }
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_HIGHLIGHT_ID(ObjectId) { return false; }

@@ -6,7 +6,8 @@
 #include "engine/tag_key.hpp"
 
 void QZ_Plist_State_Parser::startTimerWithValue(std::uint64_t value,
-                                                const std::optional<std::string>& forKey) {
+                                                std::optional<std::string> forKey) {
+  const auto kept = keepAlive();
   if (value == 0 || !forKey || forKey->empty()) return;
   // Seconds in single precision: above 16,777,216 the low digits are lost.
   const auto interval = static_cast<double>(static_cast<float>(value));
@@ -19,6 +20,7 @@ void QZ_Plist_State_Parser::startTimerWithValue(std::uint64_t value,
 }
 
 void QZ_Plist_State_Parser::killAllTimers() {
+  const auto kept = keepAlive();
   const Timers timers = *objectIdTimers_;
   for (const auto& [key, timer] : timers->entries()) {
     if (timer->isValid()) timer->invalidate();
@@ -27,7 +29,8 @@ void QZ_Plist_State_Parser::killAllTimers() {
 }
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TIMER(std::uint64_t value,
-                                                               const ObjectId& forId) {
+                                                               ObjectId forId) {
+  const auto kept = keepAlive();
   const std::string key = tagKey(forId->integerValue());
   if (findObjectWithTag(forId->intValue())) {
     if (value != 0) {

@@ -5,14 +5,13 @@
 #include "engine/tag_key.hpp"
 #include "toolkit/property_list/number_conversion.hpp"
 
-bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TAG(const ObjectId& newTag,
-                                                             const ObjectId& forId) {
-  return QZ_Plist_State_Processor_SET_TAG(newTag, forId, nullptr);
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TAG(ObjectId newTag, ObjectId forId) {
+  return QZ_Plist_State_Processor_SET_TAG(std::move(newTag), std::move(forId), nullptr);
 }
 
-bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TAG(const ObjectId& newTag,
-                                                             const ObjectId& forId,
-                                                             const Value& withTimerValue) {
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TAG(ObjectId newTag, ObjectId forId,
+                                                             Value withTimerValue) {
+  const auto kept = keepAlive();
   const Control control = findObjectWithTag(forId->longValue());
   if (!control) return false;
   control->setTag(newTag->integerValue());
