@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// How often HIDE, SHOW, ENABLE and DISABLE look their control up, and which finding they act on
-// when the window changes between one look-up and the next.
+// How often HIDE, SHOW, ENABLE, DISABLE and others look their control up, and which finding they
+// act on when the window changes between one look-up and the next.
 
 #include <gtest/gtest.h>
 
@@ -58,12 +58,12 @@ class ChangingContent final : public fakes::FakeRole<View> {
 };
 
 /// Runs one command for the tag over the content, and gives its result.
-bool run(const std::string& command, const std::shared_ptr<ChangingContent>& content) {
+bool run(const std::string& command, const std::shared_ptr<ChangingContent>& content,
+         const toolkit::ValueRef<toolkit::Array>& parameters = toolkit::Array::make()) {
   toolkit::memory::MemoryDriver driver;
   const auto engine = QZ_Plist_State_Parser::init(driver.toolkit());
   engine->setTutorialWindow(std::make_shared<fakes::FakeWindow>(content));
-  return engine->doCompoundCommand(command, toolkit::Array::make(),
-                                   toolkit::Number::withLong(target));
+  return engine->doCompoundCommand(command, parameters, toolkit::Number::withLong(target));
 }
 
 // What each look-up finds: b a button, t a text field, i an image view, v another view, - nothing.
@@ -140,6 +140,23 @@ TEST(ControlLookups, ASimpleCommandLooksOnceWhateverItsName) {
     engine->setTutorialWindow(std::make_shared<fakes::FakeWindow>(content));
     engine->doSimpleCommand(name, toolkit::Array::make(), toolkit::Number::withLong(target));
     EXPECT_EQ(content->looks(), 1U);
+  }
+}
+
+// Any other count of parameters ends the command before it looks for its control.
+TEST(ControlLookups, LoadingAnImageLooksOnceForTwoParametersOnly) {
+  const toolkit::ValueRef<> name = toolkit::String::make("star");
+  const toolkit::ValueRef<> tag = toolkit::Number::withLong(target);
+  struct {
+    std::vector<toolkit::ValueRef<>> parameters;
+    std::size_t looks;
+  } const rows[] = {{{}, 0}, {{name}, 0}, {{name, tag}, 1}, {{name, tag, tag}, 0}};
+  for (const auto& [parameters, looks] : rows) {
+    const auto content = std::make_shared<ChangingContent>("iiii");
+    EXPECT_EQ(
+        run("LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID", content, toolkit::Array::make(parameters)),
+        looks == 1);
+    EXPECT_EQ(content->looks(), looks);
   }
 }
 

@@ -16,7 +16,8 @@ using Engine = QZ_Plist_State_Parser;
 using toolkit::Number;
 using toolkit::String;
 
-/// The memory toolkit, but for its reader of HTML, which only keeps the document.
+/// The memory toolkit, but for its reader of HTML, which only keeps the document and yields what
+/// the test wants.
 struct DocumentKeeper final : toolkit::Toolkit {
   DocumentKeeper() {
     memory.log().setSink([](std::string_view) {});
@@ -24,6 +25,7 @@ struct DocumentKeeper final : toolkit::Toolkit {
 
   toolkit::memory::MemoryToolkit memory;
   std::string document;
+  std::optional<toolkit::AttributedString> text = toolkit::AttributedString("read");
 
   toolkit::Application& application() override { return memory.application(); }
   toolkit::RunLoop& runLoop() override { return memory.runLoop(); }
@@ -34,7 +36,7 @@ struct DocumentKeeper final : toolkit::Toolkit {
   std::optional<toolkit::AttributedString> attributedStringWithHTML(
       std::string_view bytes) override {
     document = bytes;
-    return toolkit::AttributedString("read");
+    return text;
   }
 };
 
@@ -70,6 +72,22 @@ TEST_F(HtmlDocuments, AreTheFragmentBetweenFixedTexts) {
   EXPECT_TRUE(engine->QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER(
       b, font, number, number));
   EXPECT_EQ(keeper.document, oneBlank + "b" + tail);
+}
+
+// A toolkit's reader may make nothing of a document, although every character of it is ASCII.
+TEST_F(HtmlDocuments, ThatTheReaderMakesNothingOfFailWithoutALogLine) {
+  int lines = 0;
+  keeper.memory.log().setSink([&](std::string_view) { ++lines; });
+  keeper.text = std::nullopt;
+  EXPECT_FALSE(
+      engine->QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML(b, font, number, number));
+  EXPECT_EQ(keeper.document, plain + "b" + tail);
+  EXPECT_FALSE(
+      engine->QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(true, b, font, number, number));
+  EXPECT_FALSE(engine->QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER(
+      b, font, number, number));
+  EXPECT_EQ(keeper.document, oneBlank + "b" + tail);
+  EXPECT_EQ(lines, 0);
 }
 
 TEST_F(HtmlDocuments, OfAnAbsentFragmentSayWhatFormatsPrintForNothing) {
