@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-// The commands as the runner and the dispatcher reach them: by reference, as this is done for every
-// element of a list.
+// The commands as the runner and the dispatcher call them, for every element of a list: by
+// reference, which counts and copies nothing.
 //
-// Whoever calls these keeps the engine, and holds arguments that nobody else can change or let go
-// of meanwhile. The engine's operations of the same names see to that for a host's arguments.
+// The caller keeps the engine alive, and holds arguments that nobody else can change or let go of
+// meanwhile. The engine's operations of the same names do so for a host's arguments.
 #pragma once
 
 #include <string_view>
