@@ -70,7 +70,8 @@ QZ_Plist_State_Parser::~QZ_Plist_State_Parser() {
   stop(*flashingTimer_);
   flashingTimer_.set(nullptr);
   const Timers timers = *objectIdTimers_;
-  for (const auto& [key, timer] : timers->entries()) timer->invalidate();
+  const auto pending = timers->entries();  // a copy: what a timer lets go of may change the table
+  for (const auto& [key, timer] : pending) timer->invalidate();
   timers->removeAllObjects();
   const Window tutorial = tutorialWindow();
   const Window host = window();

@@ -57,7 +57,10 @@ bool QZ_Plist_State_Parser::loadGuiAssets(Dictionary description,
     // What goes into the window is the list's last control. Without a list, as after termination,
     // that is none; the entry counts all the same.
     const Controls controls = *addedObjectToTutorial_;
-    if (controls->count() > 0) window->contentView()->addSubview(controls->elements().back());
+    if (controls->count() > 0) {
+      const Control last = controls->elements().back();  // kept: adding it may change the list
+      window->contentView()->addSubview(last);
+    }
     added = true;
   }
   window->makeKeyAndOrderFront();

@@ -22,7 +22,8 @@ void QZ_Plist_State_Parser::startTimerWithValue(std::uint64_t value,
 void QZ_Plist_State_Parser::killAllTimers() {
   const auto kept = keepAlive();
   const Timers timers = *objectIdTimers_;
-  for (const auto& [key, timer] : timers->entries()) {
+  const auto pending = timers->entries();  // a copy: what a timer lets go of may change the table
+  for (const auto& [key, timer] : pending) {
     if (timer->isValid()) timer->invalidate();
   }
   timers->removeAllObjects();

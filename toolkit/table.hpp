@@ -3,6 +3,9 @@
 //
 // Both are shared: who asks the engine for one holds the very object that the engine changes. On an
 // absent table or list every change does nothing and every question answers zero or absent.
+//
+// A thing that is taken out may end, and its end may use the table: so a change is complete before
+// anything is let go of.
 #pragma once
 
 #include <cstddef>
@@ -39,10 +42,10 @@ class Table {
   bool contains(std::string_view key) const { return entries_.find(key) != entries_.end(); }
 
   void setObject(T object, std::string_view key) {
-    if (exists_) entries_.insert_or_assign(std::string(key), std::move(object));
+    if (exists_) std::swap(entries_[std::string(key)], object);
   }
   void removeObjectForKey(std::string_view key) {
-    if (const auto found = entries_.find(key); found != entries_.end()) entries_.erase(found);
+    if (const auto found = entries_.find(key); found != entries_.end()) entries_.extract(found);
   }
   void removeAllObjects() { Entries().swap(entries_); }
 

@@ -12,6 +12,7 @@
 #include <vector>
 
 #include "QZ_Plist_State_Parser.hpp"
+#include "tests/engine/fakes.hpp"
 #include "toolkit/memory/memory_driver.hpp"
 #include "toolkit/memory/views.hpp"
 
@@ -39,6 +40,7 @@ class ObservedApplication final : public toolkit::Application {
                                   toolkit::BackingStore backing, bool defer) override {
     orders.push_back({content, style, backing, defer});
     if (refuses) return {};
+    if (given) return given;
     return application_.makeWindow(content, style, backing, defer);
   }
   Ref<toolkit::Button> makeButton(const toolkit::Rect& frame) override {
@@ -73,6 +75,7 @@ class ObservedApplication final : public toolkit::Application {
 
   std::vector<WindowOrder> orders;
   bool refuses = false;
+  Ref<toolkit::Window> given;      // instead of a window of the memory toolkit
   std::function<void()> onButton;  // called before a button is made
 
  private:
@@ -271,6 +274,22 @@ TEST(AssetEntries, WithoutAPlaceForThemNothingIsWritten) {
   MemoryDriver driver;
   const auto engine = QZ_Plist_State_Parser::init(driver.toolkit());
   EXPECT_FALSE(engine->createNextGuiAssetEntry(nullptr, "NSButton", {1, 2, 3, 4}, 12));
+}
+
+TEST_F(GuiAssets, AControlIsAddedAlthoughTheListOfControlsIsEmptiedMeanwhile) {
+  struct Content final : fakes::FakeRole<toolkit::View> {
+    void addSubview(const Ref<toolkit::View>& view) override {
+      onAdd();
+      FakeRole::addSubview(view);
+    }
+    std::function<void()> onAdd;
+  };
+  const auto content = std::make_shared<Content>();
+  content->onAdd = [&] { engine->addedObjectToTutorial()->removeAllObjects(); };
+  toolkit.observed.given = std::make_shared<fakes::FakeWindow>(content);
+  EXPECT_TRUE(load({{"1", entry("NSButton", {0, 0, 9, 9})}}));
+  ASSERT_EQ(content->views.size(), 1U);
+  EXPECT_EQ(content->views.front()->tag(), 1);
 }
 
 TEST_F(GuiAssets, ADescriptionThatChangesMeanwhileIsBuiltAsItWas) {
