@@ -6,7 +6,8 @@
 namespace bench {
 namespace {
 
-toolkit::Ref<toolkit::View> viewWithTag(const toolkit::Ref<toolkit::Window>& window, long tag) {
+toolkit::Ref<toolkit::View> viewWithTag(const toolkit::Ref<toolkit::Window>& window,
+                                        toolkit::Tag tag) {
   const toolkit::Ref<toolkit::View> content = window->contentView();
   for (const auto& view : content->subviews()) {
     if (view->tag() == tag) return view;

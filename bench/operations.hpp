@@ -5,6 +5,8 @@
 #include <string>
 #include <vector>
 
+#include "toolkit/tag.hpp"
+
 namespace bench {
 
 enum class What { text, title, toolTip, enable, disable, stateOn };
@@ -12,7 +14,7 @@ enum class What { text, title, toolTip, enable, disable, stateOn };
 /// One command: the operation, on the control with the tag; text only where the operation has one.
 struct Operation {
   What what;
-  long tag;
+  toolkit::Tag tag;
   std::string text;
 };
 

@@ -29,7 +29,7 @@ using List = toolkit::ValueRef<toolkit::Array>;
 struct Stage {
   explicit Stage(long controls) {
     driver.setLogSink([](std::string_view) {});
-    for (long tag = 1; tag <= controls; ++tag) {
+    for (toolkit::Tag tag = 1; tag <= controls; ++tag) {
       driver.makeView(toolkit::ViewKind::toggle, tag, {0, 0, 90, 20}, window->contentView());
     }
     engine->getGuiAssetsFromWindow(window);
@@ -51,7 +51,7 @@ std::vector<Operation> operationsOver(long controls, std::size_t count) {
   constexpr long step = 7919;  // a prime: every control has its turn
   std::vector<Operation> operations;
   for (std::size_t i = 0; i < count; ++i) {
-    const long tag = 1 + static_cast<long>(i) * step % controls;
+    const toolkit::Tag tag = 1 + static_cast<long>(i) * step % controls;
     operations.push_back(
         {sorts[i % std::size(sorts)], tag, "Take the cup off the tray, step " + std::to_string(i)});
   }
@@ -196,7 +196,7 @@ std::vector<double> timesOfEvents(long controls) {
   stage.engine->setPlistDictionary(script);
   const auto last = stage.window->contentView()->subviews().back();
   stage.engine->setFlashing(true);
-  for (long tag = 1; tag <= 10; ++tag) {
+  for (toolkit::Tag tag = 1; tag <= 10; ++tag) {
     stage.engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(tag), true);
   }
   return bench::leastTimes(

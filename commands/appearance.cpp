@@ -93,7 +93,7 @@ bool commands::setToolTip(QZ_Plist_State_Parser& engine,
   if (count == 0) return false;
   const std::string_view text = textOf(parameters->objectAtIndex(0));
   // Only a second parameter that is the last one aims; otherwise it is the list's own control.
-  const long tag = count == 2 ? parameters->objectAtIndex(1)->intValue() : id->longValue();
+  const toolkit::Tag tag = count == 2 ? parameters->objectAtIndex(1)->intValue() : id->longValue();
   const QZ_Plist_State_Parser::Control control = engine.findObjectWithTag(tag);
   if (!control) return false;
   control->setToolTip(text);
@@ -110,7 +110,7 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TOOL_TIP(Parameters par
 bool commands::loadGraphic(QZ_Plist_State_Parser& engine, toolkit::Toolkit& toolkit,
                            const QZ_Plist_State_Parser::Parameters& parameters) {
   if (parameters->count() != 2) return false;
-  const long tag = parameters->objectAtIndex(1)->intValue();
+  const toolkit::Tag tag = parameters->objectAtIndex(1)->intValue();
   // Two diagnostics that cannot come, after the count above; this is their place all the same.
   if (!parameters) toolkit.log().write("No commandInfo found.");
   if (parameters->count() == 0) toolkit.log().write("commandInfo count is zero.");

@@ -67,7 +67,7 @@ bool loadGraphic(const Call& call) {
 }
 
 // The control commands aim at the list's own id, or at the tag that is their only parameter.
-long targetTag(const Call& call) {
+toolkit::Tag targetTag(const Call& call) {
   return call.parameters->count() == 1 ? call.at(0)->intValue() : call.id->longValue();
 }
 
@@ -92,7 +92,7 @@ bool disable(const Call& call) {
 // meanwhile is met as it is then; whatever the class, the control is hidden or shown.
 template <bool hidden>
 bool hide(const Call& call) {
-  const long tag = targetTag(call);
+  const toolkit::Tag tag = targetTag(call);
   const auto find = [&] { return call.engine.findObjectWithTag(tag); };
   const auto change = [](const Engine::Control& control) {
     control->setHidden(hidden);

@@ -8,7 +8,7 @@
 void QZ_Plist_State_Parser::buttonPushed(Control sender) {
   const auto kept = keepAlive();
   if (sender) killAllTimers();
-  const long tag = sender->tag();
+  const toolkit::Tag tag = sender->tag();
   const std::string key = tagKey(tag);
   toolkit_.log().write("Button tag " + key + " pressed.");
   buttonStates_->setObject(toolkit::Number::withBool(sender->state() == toolkit::State::on), key);

@@ -4,4 +4,6 @@
 
 #include <string>
 
-inline std::string tagKey(long tag) { return std::to_string(tag); }
+#include "toolkit/tag.hpp"
+
+inline std::string tagKey(toolkit::Tag tag) { return std::to_string(tag); }

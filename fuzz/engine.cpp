@@ -73,7 +73,7 @@ class Walkthrough {
   explicit Walkthrough(const Script& script) : script_(script) {
     using toolkit::ViewKind;
     driver_.setResourcePath("/nonexistent");
-    long tag = 0;
+    toolkit::Tag tag = 0;
     for (const ViewKind kind : {ViewKind::button, ViewKind::toggle, ViewKind::mixed,
                                 ViewKind::popUpButton, ViewKind::textField, ViewKind::imageView,
                                 ViewKind::box, ViewKind::plain, ViewKind::button}) {

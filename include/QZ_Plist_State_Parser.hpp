@@ -32,6 +32,7 @@
 #include "toolkit/property_list/collections.hpp"
 #include "toolkit/property_list/scalars.hpp"
 #include "toolkit/table.hpp"
+#include "toolkit/tag.hpp"
 #include "toolkit/toolkit.hpp"
 
 // The names of the commands that scripts write. Assigning another string to one renames the command
@@ -155,7 +156,7 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   /// `name` is expected in upper case. NO for an unknown name; too few parameters raise.
   bool doCompoundCommand(std::string_view name, Parameters withParameters, ObjectId usingObject);
   /// The back-most view directly in the walk-through window that carries the tag now, or absent.
-  Control findObjectWithTag(long tag) const;
+  Control findObjectWithTag(toolkit::Tag tag) const;
   void restoreOriginalTagValues();
   /// Arms a one-shot timer of `value` seconds for a tag key; 0 or no key does nothing.
   void startTimerWithValue(std::uint64_t value, std::optional<std::string> forKey);

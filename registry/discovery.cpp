@@ -23,10 +23,10 @@ AssetRecord recordOf(const toolkit::Ref<toolkit::View>& view) {
 }
 
 // The first key that cannot be a tag's own: one more than the largest tag, which is never below 0.
-unsigned long firstOverflowKey(const toolkit::Subviews& views) {
-  long largest = 0;
+std::uint64_t firstOverflowKey(const toolkit::Subviews& views) {
+  toolkit::Tag largest = 0;
   for (const auto& view : views) largest = std::max(largest, view->tag());
-  return static_cast<unsigned long>(largest) + 1;
+  return static_cast<std::uint64_t>(largest) + 1;
 }
 
 }  // namespace
@@ -43,7 +43,7 @@ bool QZ_Plist_State_Parser::getGuiAssetsFromWindow(Window window) {
   originalTagValues_->removeAllObjects();
   const Control content = window->contentView();
   const toolkit::Subviews views = content->subviews();  // a copy: it may change under the walk
-  unsigned long overflowKey = firstOverflowKey(views);
+  std::uint64_t overflowKey = firstOverflowKey(views);
   bool recorded = false;
   for (const Control& view : views) {
     if (!isRecorded(*view)) continue;

@@ -5,7 +5,7 @@
 
 // A scan of the live window at every call, never of the records: a re-tagged control is found under
 // its new tag only, and of several with one tag the back-most.
-QZ_Plist_State_Parser::Control QZ_Plist_State_Parser::findObjectWithTag(long tag) const {
+QZ_Plist_State_Parser::Control QZ_Plist_State_Parser::findObjectWithTag(toolkit::Tag tag) const {
   const Control content = tutorialWindow()->contentView();
   for (const Control& view : content->subviews()) {
     if (view->tag() == tag) return view;

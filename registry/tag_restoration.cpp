@@ -10,7 +10,7 @@ void QZ_Plist_State_Parser::restoreOriginalTagValues() {
   const Dictionary tags = originalTagValues_->copy(toolkit::Mutability::immutable);
   for (const auto& [key, value] : tags->entries()) {
     const std::string name = key->description();
-    const long recorded = value->intValue();
+    const toolkit::Tag recorded = value->intValue();
     const Control control = guiAssets_->objectForKey(name).control.get();
     // Written also where nothing changes; a control that is gone has the tag 0 and no class.
     toolkit_.log().write(

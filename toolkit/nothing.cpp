@@ -31,8 +31,8 @@ class NothingView : public Role {
   TextField* asTextField() override { return nullptr; }
   ImageView* asImageView() override { return nullptr; }
 
-  long tag() const override { return 0; }
-  void setTag(long) override {}
+  Tag tag() const override { return 0; }
+  void setTag(Tag) override {}
   Rect frame() const override { return {}; }
   const Subviews& subviews() const override { return theOnly<Subviews>(); }
   void addSubview(const Ref<View>&) override {}

@@ -22,7 +22,7 @@ enum class ViewKind { button, toggle, mixed, popUpButton, textField, imageView, 
 struct ViewPicture {
   ViewKind kind = ViewKind::plain;  // push, toggle or mixed by the button's behaviour
   std::string className;
-  long tag = 0;
+  Tag tag = 0;
   Rect frame;
   bool hidden = false;
   bool enabled = true;  // YES of a view that cannot be disabled
@@ -65,7 +65,7 @@ class TestDriver {
   /// A host's window, on the screen. The caller owns it: destroying the reference destroys it.
   virtual Ref<Window> makeWindow(const Rect& content) = 0;
   /// A view of the kind, in front of what `parent` holds. `parent` owns it.
-  virtual Ref<View> makeView(ViewKind kind, long tag, const Rect& frame,
+  virtual Ref<View> makeView(ViewKind kind, Tag tag, const Rect& frame,
                              const Ref<View>& parent) = 0;
   virtual void removeFromSuperview(const Ref<View>& view) = 0;
   virtual void setFrame(const Ref<View>& view, const Rect& frame) = 0;

@@ -17,6 +17,7 @@
 #include "toolkit/ref.hpp"
 #include "toolkit/responder.hpp"
 #include "toolkit/styled_text/attributed_string.hpp"
+#include "toolkit/tag.hpp"
 
 namespace toolkit {
 
@@ -47,9 +48,10 @@ class View : public Responder {
   virtual ImageView* asImageView() { return nullptr; }
   virtual Gradient* asGradient() { return nullptr; }
 
-  /// The integer by which scripts find the view; a new view has the toolkit's default.
-  virtual long tag() const = 0;
-  virtual void setTag(long tag) = 0;
+  /// The number by which scripts find the view; a new view has the toolkit's default. Asking calls
+  /// nobody: a search asks it of every view of a live list.
+  virtual Tag tag() const = 0;
+  virtual void setTag(Tag tag) = 0;
 
   /// Position and size in the superview's coordinates.
   virtual Rect frame() const = 0;

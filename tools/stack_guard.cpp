@@ -19,8 +19,9 @@ namespace {
 
 struct Guarded {
   const QZ_Plist_State_Parser* engine = nullptr;
-  std::map<long, std::string> lineOf;  // what to say, by the tag of the list that was started last
-  std::string otherwise;               // what to say of any other
+  std::map<toolkit::Tag, std::string>
+      lineOf;             // what to say, by the tag of the list that was started last
+  std::string otherwise;  // what to say of any other
 };
 
 Guarded guarded;  // the script that runs; the tool has one thread

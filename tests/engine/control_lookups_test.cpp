@@ -17,7 +17,7 @@ namespace {
 using fakes::FakeView;
 using toolkit::View;
 
-constexpr long target = 7;
+constexpr toolkit::Tag target = 7;
 
 /// A content view that shows other views at every look: what a letter of `script` stands for, then
 /// nothing. Each look-up asks it once.

@@ -17,11 +17,11 @@ namespace fakes {
 template <class Role>
 class FakeRole : public Role {
  public:
-  explicit FakeRole(long tag = 0) : tag_(tag) {}
+  explicit FakeRole(toolkit::Tag tag = 0) : tag_(tag) {}
 
   std::string className() const override { return "Fake"; }
-  long tag() const override { return tag_; }
-  void setTag(long tag) override { tag_ = tag; }
+  toolkit::Tag tag() const override { return tag_; }
+  void setTag(toolkit::Tag tag) override { tag_ = tag; }
   toolkit::Rect frame() const override { return {}; }
   const toolkit::Subviews& subviews() const override { return views; }
   void addSubview(const toolkit::Ref<toolkit::View>& view) override { views.push_back(view); }
@@ -51,7 +51,7 @@ class FakeRole : public Role {
     calls.push_back(call);
   }
 
-  long tag_;
+  toolkit::Tag tag_;
 };
 
 /// A view that passes for a kind of control where the kind is only asked for.
@@ -59,7 +59,7 @@ class FakeView : public FakeRole<toolkit::View> {
  public:
   enum class Kind { plain, button, textField, imageView };
 
-  explicit FakeView(long tag = 0, Kind kind = Kind::plain) : FakeRole(tag), kind_(kind) {}
+  explicit FakeView(toolkit::Tag tag = 0, Kind kind = Kind::plain) : FakeRole(tag), kind_(kind) {}
 
   toolkit::Button* asButton() override { return as<toolkit::Button>(Kind::button); }
   toolkit::TextField* asTextField() override { return as<toolkit::TextField>(Kind::textField); }

@@ -19,7 +19,7 @@ namespace {
 using toolkit::AttributedString;
 using toolkit::Number;
 
-constexpr long unrulyTag = 7;
+constexpr toolkit::Tag unrulyTag = 7;
 
 /// A control that keeps only the first letter of a plain text, and does with styled text what the
 /// test wants.

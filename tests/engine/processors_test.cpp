@@ -69,7 +69,7 @@ TEST_F(Processors, AbsentParametersAreNone) {
 
 // The dispatcher hands on 32 bits; the processors read more.
 TEST_F(Processors, TagsBeyond32BitsAreFoundAndGiven) {
-  constexpr long large = 5'000'000'000;
+  constexpr toolkit::Tag large = 5'000'000'000;
   EXPECT_TRUE(
       engine->QZ_Plist_State_Processor_SET_TAG(Number::withLong(large), Number::withLong(7)));
   EXPECT_EQ(button->tag(), large);
@@ -85,7 +85,7 @@ TEST_F(Processors, TagsBeyond32BitsAreFoundAndGiven) {
 // Both look for 32 bits: a tick by the key's text, which is clamped, a timer by the id's number,
 // which keeps its low bits.
 TEST_F(Processors, TicksAndTimersLookFor32Bits) {
-  constexpr long large = 4'294'967'303;  // 7 in its low 32 bits
+  constexpr toolkit::Tag large = 4'294'967'303;  // 7 in its low 32 bits
   EXPECT_TRUE(engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(large), true));
   engine->QZ_Plist_State_Processor_ALLOW_FLASHING(true);
   driver.advance(0.75);

@@ -18,7 +18,8 @@ class Retagging : public testing::Test {
   Retagging() { engine->getGuiAssetsFromWindow(window); }
   ~Retagging() override { engine->terminateParser(); }
 
-  bool retag(long newTag, long tag, const QZ_Plist_State_Parser::Value& timerValue) {
+  bool retag(toolkit::Tag newTag, toolkit::Tag tag,
+             const QZ_Plist_State_Parser::Value& timerValue) {
     return engine->QZ_Plist_State_Processor_SET_TAG(Number::withLong(newTag), Number::withLong(tag),
                                                     timerValue);
   }

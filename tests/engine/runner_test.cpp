@@ -36,7 +36,7 @@ class Runner : public testing::Test {
     return engine->processCommandArray(Array::make(std::move(elements)), Number::withLong(tag));
   }
 
-  static constexpr long tag = 7;
+  static constexpr toolkit::Tag tag = 7;
   std::vector<std::string> log;
   toolkit::memory::MemoryDriver driver;
   std::shared_ptr<fakes::FakeView> view = std::make_shared<fakes::FakeView>(tag);
@@ -105,7 +105,7 @@ TEST_F(Runner, RunsAHundredThousandCompoundElements) {
 
 TEST_F(Runner, ListsMayCallOneAnotherAThousandDeep) {
   const auto script = toolkit::Dictionary::make();
-  for (long key = 1; key <= 1000; ++key) {
+  for (toolkit::Tag key = 1; key <= 1000; ++key) {
     const ValueRef<> call =
         Array::make({text("PROCESS_COMMANDS_FOR_ID"), Number::withLong(key + 1)});
     script->setObject(Array::make({call}), std::to_string(key));

@@ -13,8 +13,8 @@ namespace {
 
 class Retagged final : public fakes::FakeRole<toolkit::View> {
  public:
-  explicit Retagged(long tag) : FakeRole(tag) {}
-  void setTag(long tag) override {
+  explicit Retagged(toolkit::Tag tag) : FakeRole(tag) {}
+  void setTag(toolkit::Tag tag) override {
     ++settings;
     FakeRole::setTag(tag);
   }

@@ -3,11 +3,15 @@
 
 #include <gtest/gtest.h>
 
+#include <limits>
 #include <memory>
 #include <string>
+#include <type_traits>
+#include <utility>
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "toolkit/memory/memory_driver.hpp"
+#include "toolkit/property_list/number_conversion.hpp"
 
 namespace {
 
@@ -16,15 +20,30 @@ using toolkit::Number;
 using toolkit::String;
 using toolkit::ViewKind;
 
-constexpr long near = 7;
-constexpr long far = near + (1L << 32);  // the same in 32 bits
+// Whatever the width of `long`, a tag has 64 bits with a sign on its whole way: from the number or
+// the key that names a control to the control itself.
+static_assert(std::numeric_limits<toolkit::Tag>::is_signed);
+static_assert(std::numeric_limits<toolkit::Tag>::digits == 63);
+using View = toolkit::View;
+using Engine = QZ_Plist_State_Parser;
+static_assert(std::is_same_v<decltype(&View::tag), toolkit::Tag (View::*)() const>);
+static_assert(std::is_same_v<decltype(&View::setTag), void (View::*)(toolkit::Tag)>);
+static_assert(std::is_same_v<decltype(&Engine::findObjectWithTag),
+                             Engine::Control (Engine::*)(toolkit::Tag) const>);
+static_assert(std::is_same_v<decltype(std::declval<Number>().longValue()), toolkit::Tag>);
+static_assert(std::is_same_v<decltype(std::declval<Number>().integerValue()), toolkit::Tag>);
+static_assert(std::is_same_v<decltype(toolkit::integerValueOf("")), toolkit::Tag>);
+
+constexpr toolkit::Tag beyond = toolkit::Tag{1} << 32;
+constexpr toolkit::Tag near = 7;
+constexpr toolkit::Tag far = near + beyond;  // the same in 32 bits
 
 class WideIds : public testing::Test {
  protected:
   WideIds() { engine->getGuiAssetsFromWindow(window); }
   ~WideIds() override { engine->terminateParser(); }
 
-  toolkit::Ref<toolkit::View> view(ViewKind kind, long tag) {
+  toolkit::Ref<toolkit::View> view(ViewKind kind, toolkit::Tag tag) {
     return driver.makeView(kind, tag, {20, 20, 100, 30}, window->contentView());
   }
   bool showHtml(const toolkit::ValueRef<>& size) {
@@ -53,6 +72,42 @@ TEST_F(WideIds, ReachTheControlWithAllOfThem) {
   EXPECT_EQ(driver.look(nearField).toolTip, "");
 }
 
+TEST_F(WideIds, AreTagsFromTheControlToTheKeyAndBack) {
+  constexpr std::pair<toolkit::Tag, const char*> rows[] = {
+      {toolkit::Tag{1} << 40, "1099511627776"},
+      {std::numeric_limits<toolkit::Tag>::max(), "9223372036854775807"},
+      {std::numeric_limits<toolkit::Tag>::min(), "-9223372036854775808"},
+  };
+  for (const auto& [tag, key] : rows) {
+    const auto button = view(ViewKind::toggle, tag);
+    button->setAction("buttonPushed:");
+    EXPECT_EQ(button->tag(), tag);
+    EXPECT_EQ(engine->findObjectWithTag(tag), button);
+    EXPECT_FALSE(engine->findObjectWithTag(static_cast<std::int32_t>(tag)));
+    engine->plistDictionary()->setObject(
+        Array::make({Array::make({String::make("DISABLE_OBJECT_WITH_ID")})}), key);
+    driver.click(button);
+    EXPECT_EQ(engine->lastTagId()->longValue(), tag);
+    EXPECT_EQ(engine->currentCommandState(), key);
+    EXPECT_FALSE(driver.look(button).enabled);
+    EXPECT_TRUE(engine->buttonStates()->objectForKey(key));
+    const auto states = toolkit::Dictionary::make();
+    states->setObject(Number::withBool(true), key);
+    EXPECT_TRUE(engine->setButtonSates(states));
+    EXPECT_EQ(driver.look(button).state, toolkit::State::on);
+  }
+}
+
+TEST_F(WideIds, AfterTheLargestTagOverflowKeysGoOn) {
+  constexpr toolkit::Tag largest = std::numeric_limits<toolkit::Tag>::max();
+  for (int i = 0; i < 3; ++i) view(ViewKind::button, largest);
+  EXPECT_TRUE(engine->getGuiAssetsFromWindow(window));
+  for (const char* key : {"9223372036854775807", "9223372036854775808", "9223372036854775809"}) {
+    EXPECT_TRUE(engine->guiAssets()->contains(key));
+    EXPECT_EQ(engine->originalTagValues()->objectForKey(key)->longValue(), largest);
+  }
+}
+
 TEST_F(WideIds, StopTheFlashingOfTheirOwnButton) {
   view(ViewKind::button, near)->highlight(true);
   const auto button = view(ViewKind::button, far);
@@ -63,7 +118,7 @@ TEST_F(WideIds, StopTheFlashingOfTheirOwnButton) {
 
 TEST_F(WideIds, OfAFontSizeCountInTheir32LowBits) {
   const auto field = view(ViewKind::textField, far);
-  EXPECT_TRUE(showHtml(Number::withLong(18 + (1L << 32))));
+  EXPECT_TRUE(showHtml(Number::withLong(18 + beyond)));
   const auto text = driver.look(field).text;
   ASSERT_EQ(text.runs().size(), 1U);
   EXPECT_EQ(text.runs()[0].attributes.font->size, 18);

@@ -33,13 +33,13 @@ class ResponderChain : public MemoryTest {
 
 TEST_F(ResponderChain, TheTargetPerformsTheAction) {
   driver.click(makeButton(target, ViewKind::button, 7));
-  EXPECT_EQ(target->senders, std::vector<long>{7});
+  EXPECT_EQ(target->senders, std::vector<Tag>{7});
   EXPECT_TRUE(delegate->asked.empty());
 }
 
 TEST_F(ResponderChain, WithoutATargetTheActionReachesTheWindowsDelegate) {
   driver.click(makeButton(nullptr, ViewKind::button, 7));
-  EXPECT_EQ(delegate->senders, std::vector<long>{7});
+  EXPECT_EQ(delegate->senders, std::vector<Tag>{7});
 }
 
 TEST_F(ResponderChain, WithATargetThatIsGoneItDoesToo) {
@@ -128,8 +128,8 @@ TEST_F(ResponderChain, AControlMayRemoveItselfInItsAction) {
     dynamic_cast<MemoryButton*>(button)->click();
     EXPECT_TRUE(watched.expired());
   }
-  EXPECT_EQ(delegate->senders, std::vector<long>{3});
-  EXPECT_EQ(target->senders, std::vector<long>{3});
+  EXPECT_EQ(delegate->senders, std::vector<Tag>{3});
+  EXPECT_EQ(target->senders, std::vector<Tag>{3});
 }
 
 TEST_F(ResponderChain, TheWindowMayEndInAnAction) {
@@ -147,15 +147,15 @@ TEST_F(ResponderChain, TheWindowMayEndInAnAction) {
 TEST_F(ResponderChain, ATargetMayEndInItsAction) {
   const Ref<Button> button = makeButton(nullptr);
   const std::weak_ptr<Recorder> watched = target;
-  long senders = 0;
+  Tag sender = 0;
   std::shared_ptr<Responder> receiver = std::move(target);  // the only one that keeps it
   watched.lock()->perform = [&](const Ref<View>&) {
     receiver = nullptr;
-    senders = watched.lock()->senders.front();
+    sender = watched.lock()->senders.front();
   };
   EXPECT_TRUE(button->sendAction("pressed:", receiver));
   EXPECT_TRUE(watched.expired());
-  EXPECT_EQ(senders, 1);
+  EXPECT_EQ(sender, 1);
 }
 
 TEST_F(ResponderChain, AnActionMayReplaceTheActionThatIsBeingSent) {

@@ -24,11 +24,11 @@ using Scale = MemoryTest;
 TEST_F(Scale, TenThousandSubviews) {
   const Ref<View> content = window->contentView();
   const double seconds = secondsOf([&] {
-    for (long tag = 0; tag < 10'000; ++tag) makeIn(content, ViewKind::button, tag);
-    long sum = 0;
+    for (Tag tag = 0; tag < 10'000; ++tag) makeIn(content, ViewKind::button, tag);
+    Tag sum = 0;
     for (int scan = 0; scan < 100; ++scan)
       for (const Ref<View>& view : content->subviews()) sum += view->tag();
-    EXPECT_EQ(sum, 100L * 10'000 * 9'999 / 2);
+    EXPECT_EQ(sum, Tag{100} * 10'000 * 9'999 / 2);
     for (int click = 0; click < 1'000; ++click) driver.click(content->subviews()[9'999]);
     while (!content->subviews().empty()) driver.removeFromSuperview(content->subviews().back());
   });

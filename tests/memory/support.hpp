@@ -36,7 +36,7 @@ class Recorder : public Responder {
 
   std::vector<std::string> asked;      // all actions it was asked to perform
   std::vector<std::string> performed;  // as their names read when they had been performed
-  std::vector<long> senders;           // the tags of those it performed for
+  std::vector<Tag> senders;            // the tags of those it performed for
   std::function<void(const Ref<View>&)> perform;  // what performing is, besides
 
  private:
@@ -87,13 +87,13 @@ class Directory {
 /// A driver, and a host's window on its screen.
 class MemoryTest : public testing::Test {
  protected:
-  Ref<View> make(ViewKind kind, long tag = 1) { return makeIn(window->contentView(), kind, tag); }
-  Ref<View> makeIn(const Ref<View>& parent, ViewKind kind, long tag) {
+  Ref<View> make(ViewKind kind, Tag tag = 1) { return makeIn(window->contentView(), kind, tag); }
+  Ref<View> makeIn(const Ref<View>& parent, ViewKind kind, Tag tag) {
     return driver.makeView(kind, tag, {10, 20, 30, 40}, parent);
   }
   /// A button with the target and the action given.
   Ref<Button> makeButton(const std::shared_ptr<Responder>& target, ViewKind kind = ViewKind::button,
-                         long tag = 1) {
+                         Tag tag = 1) {
     const Ref<Button> button = asButton(make(kind, tag));
     button->setTarget(target);
     button->setAction("pressed:");

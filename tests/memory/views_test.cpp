@@ -14,8 +14,8 @@ namespace {
 
 class ViewsTest : public MemoryTest {
  protected:
-  static std::vector<long> tagsIn(const Ref<View>& view) {
-    std::vector<long> tags;
+  static std::vector<Tag> tagsIn(const Ref<View>& view) {
+    std::vector<Tag> tags;
     for (const Ref<View>& subview : view->subviews()) tags.push_back(subview->tag());
     return tags;
   }
@@ -33,24 +33,24 @@ class ViewsTest : public MemoryTest {
 };
 
 TEST_F(ViewsTest, SubviewsLieBackToFront) {
-  for (const long tag : {3, 1, 2}) make(ViewKind::button, tag);
-  EXPECT_EQ(tagsIn(content), (std::vector<long>{3, 1, 2}));
+  for (const Tag tag : {3, 1, 2}) make(ViewKind::button, tag);
+  EXPECT_EQ(tagsIn(content), (std::vector<Tag>{3, 1, 2}));
 }
 
 TEST_F(ViewsTest, AddingAViewAgainBringsItToTheFront) {
-  for (const long tag : {1, 2, 3}) make(ViewKind::button, tag);
+  for (const Tag tag : {1, 2, 3}) make(ViewKind::button, tag);
   content->addSubview(content->subviews().front());
-  EXPECT_EQ(tagsIn(content), (std::vector<long>{2, 3, 1}));
+  EXPECT_EQ(tagsIn(content), (std::vector<Tag>{2, 3, 1}));
 }
 
 TEST_F(ViewsTest, AddingAViewTakesItFromWhereItWas) {
   const Ref<View> box = make(ViewKind::box, 9);
   const Ref<View> button = make(ViewKind::button, 5);
   box->addSubview(button);
-  EXPECT_EQ(tagsIn(content), std::vector<long>{9});
-  EXPECT_EQ(tagsIn(box), std::vector<long>{5});
+  EXPECT_EQ(tagsIn(content), std::vector<Tag>{9});
+  EXPECT_EQ(tagsIn(box), std::vector<Tag>{5});
   content->addSubview(box->subviews().front());
-  EXPECT_EQ(tagsIn(content), (std::vector<long>{9, 5}));
+  EXPECT_EQ(tagsIn(content), (std::vector<Tag>{9, 5}));
   EXPECT_TRUE(box->subviews().empty());
 }
 
@@ -74,8 +74,8 @@ TEST_F(ViewsTest, AViewRefusesWhatCannotLieInIt) {
       {inner, foreign, "-[NSBox addSubview:]: the view, of class , is another toolkit's"},
   };
   for (const auto& c : cases) EXPECT_EQ(refusal(c.parent, c.view), c.reason);
-  EXPECT_EQ(tagsIn(content), std::vector<long>{1});
-  EXPECT_EQ(tagsIn(outer), std::vector<long>{2});
+  EXPECT_EQ(tagsIn(content), std::vector<Tag>{1});
+  EXPECT_EQ(tagsIn(outer), std::vector<Tag>{2});
   EXPECT_TRUE(inner->subviews().empty());
 }
 

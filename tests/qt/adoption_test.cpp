@@ -90,7 +90,7 @@ struct Adoption : hosts::Host {
       rest.insert(rest.begin(), text(word));
       return Array::make(std::move(rest));
     };
-    const auto number = [](long value) { return Number::withLong(value); };
+    const auto number = [](toolkit::Tag value) { return Number::withLong(value); };
     const auto engine = Engine::initWithWindow(toolkit, window);
     ASSERT_TRUE(engine->getGuiAssetsFromWindow(window));
     const auto list = Array::make({

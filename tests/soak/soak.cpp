@@ -107,7 +107,7 @@ class Soak {
   long rounds() const { return rounds_; }
 
  private:
-  toolkit::Ref<toolkit::View> add(toolkit::ViewKind kind, long tag) {
+  toolkit::Ref<toolkit::View> add(toolkit::ViewKind kind, toolkit::Tag tag) {
     return driver_.makeView(kind, tag, {20, 20.0 * static_cast<double>(tag), 100, 20},
                             window_->contentView());
   }

@@ -13,16 +13,17 @@ using toolkit::Number;
 using toolkit::String;
 using toolkit::ValueRef;
 
-ValueRef<> chain(long tag) {
+ValueRef<> chain(toolkit::Tag tag) {
   return Array::make({String::make("Process_Commands_For_Id"), Number::withLong(tag)});
 }
 
 // A script of lists that only chain: to each key, the tags in order.
-ValueRef<Dictionary> script(const std::vector<std::pair<std::string, std::vector<long>>>& lists) {
+ValueRef<Dictionary> script(
+    const std::vector<std::pair<std::string, std::vector<toolkit::Tag>>>& lists) {
   auto script = Dictionary::make();
   for (const auto& [key, tags] : lists) {
     const auto list = Array::make();
-    for (const long tag : tags) list->addObject(chain(tag));
+    for (const toolkit::Tag tag : tags) list->addObject(chain(tag));
     script->setObject(list, key);
   }
   return script;
@@ -31,7 +32,7 @@ ValueRef<Dictionary> script(const std::vector<std::pair<std::string, std::vector
 TEST(EndlessChains, AreTheLoopsARunEndsUpIn) {
   const struct {
     const char* what;
-    std::vector<std::pair<std::string, std::vector<long>>> lists;
+    std::vector<std::pair<std::string, std::vector<toolkit::Tag>>> lists;
     std::vector<std::string> loops;
   } cases[] = {
       {"no chains", {{"1", {}}, {"2", {}}}, {}},
@@ -88,8 +89,8 @@ TEST(EndlessChains, WhatIsNoListChainsToNothing) {
 TEST(EndlessChains, OfAHundredThousandListsAreFoundAtOnce) {
   const auto script = Dictionary::make();
   std::vector<Dictionary::Entry> entries;
-  constexpr long count = 100'000;
-  for (long i = 0; i < count; ++i) {
+  constexpr toolkit::Tag count = 100'000;
+  for (toolkit::Tag i = 0; i < count; ++i) {
     entries.push_back({String::make(std::to_string(i)), Array::make({chain((i + 1) % count)})});
   }
   const auto chains = tools::endlessChains(Dictionary::make(std::move(entries)));

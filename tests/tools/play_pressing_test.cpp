@@ -32,7 +32,7 @@ StepPicture buttons() {
 TEST(PlayPressing, saysWhyAControlCannotBePressed) {
   const std::string others = "; press 1 (Next) or 4";
   const struct {
-    long tag;
+    toolkit::Tag tag;
     std::optional<std::string> reason;
   } cases[] = {
       {1, std::nullopt},

@@ -18,7 +18,7 @@ inline std::weak_ptr<const void> newIdentity() {
   return identities.emplace_back(std::make_shared<int>());
 }
 
-inline ControlPicture controlPicture(toolkit::ViewKind kind, long tag,
+inline ControlPicture controlPicture(toolkit::ViewKind kind, toolkit::Tag tag,
                                      const std::string& caption = "") {
   ControlPicture control;
   control.identity = newIdentity();

@@ -22,7 +22,8 @@ class ForeignDriver final : public toolkit::TestDriver {
   std::string_view name() const override { return "foreign"; }
   toolkit::Toolkit& toolkit() override { return driver_->toolkit(); }
   Ref<Window> makeWindow(const Rect& content) override { return driver_->makeWindow(content); }
-  Ref<View> makeView(ViewKind kind, long tag, const Rect& frame, const Ref<View>& in) override {
+  Ref<View> makeView(ViewKind kind, toolkit::Tag tag, const Rect& frame,
+                     const Ref<View>& in) override {
     return driver_->makeView(kind, tag, frame, in);
   }
   void removeFromSuperview(const Ref<View>& view) override { driver_->removeFromSuperview(view); }

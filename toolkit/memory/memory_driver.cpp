@@ -85,7 +85,7 @@ Ref<Window> MemoryDriver::makeWindow(const Rect& content) {
   return window;
 }
 
-Ref<View> MemoryDriver::makeView(ViewKind kind, long tag, const Rect& frame,
+Ref<View> MemoryDriver::makeView(ViewKind kind, Tag tag, const Rect& frame,
                                  const Ref<View>& parent) {
   Ref<View> view = makeNode(rowOf(kind), frame, toolkit_.application().screen())->view();
   view->setTag(tag);

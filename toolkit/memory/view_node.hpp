@@ -77,7 +77,7 @@ class ViewNode : public std::enable_shared_from_this<ViewNode> {
   bool isRedrawPending() const;
 
   std::string className_;
-  long tag_ = 0;  // the default of a new view
+  Tag tag_ = 0;  // the default of a new view
   Rect frame_;
   bool hidden_ = false;
   std::string toolTip_;

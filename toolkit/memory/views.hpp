@@ -44,8 +44,8 @@ class MemoryView : public Role, public Node {
   using Node::Node;
 
   std::string className() const final { return this->className_; }
-  long tag() const final { return this->tag_; }
-  void setTag(long tag) final { this->tag_ = tag; }
+  Tag tag() const final { return this->tag_; }
+  void setTag(Tag tag) final { this->tag_ = tag; }
   Rect frame() const final { return this->frame_; }
   const Subviews& subviews() const final { return this->subviews_; }
   void addSubview(const Ref<View>& view) final { this->insert(view); }

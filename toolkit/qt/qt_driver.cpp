@@ -180,7 +180,7 @@ Ref<Window> QtDriver::makeWindow(const Rect& content) {
   return window;
 }
 
-Ref<View> QtDriver::makeView(ViewKind kind, long tag, const Rect& frame, const Ref<View>& parent) {
+Ref<View> QtDriver::makeView(ViewKind kind, Tag tag, const Rect& frame, const Ref<View>& parent) {
   const auto node = qt::makeView(*rowOf(kind).make(), toolkit_.application().desk(), Widget::view);
   node->place(frame);
   Ref<View> view = node->view();

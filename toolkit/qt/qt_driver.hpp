@@ -21,7 +21,7 @@ class QtDriver final : public TestDriver {
 
   Ref<Window> makeWindow(const Rect& content) override;
   /// With an absent `parent`, a view that is in no window yet.
-  Ref<View> makeView(ViewKind kind, long tag, const Rect& frame, const Ref<View>& parent) override;
+  Ref<View> makeView(ViewKind kind, Tag tag, const Rect& frame, const Ref<View>& parent) override;
   void removeFromSuperview(const Ref<View>& view) override;
   void setFrame(const Ref<View>& view, const Rect& frame) override;
   void setCaption(const Ref<View>& view, std::string_view text) override;

@@ -56,8 +56,8 @@ class QtView : public Role, public Node {
   using Node::Node;
 
   std::string className() const final { return this->nameOfClass(); }
-  long tag() const final { return this->readTag(); }
-  void setTag(long tag) final { this->writeTag(tag); }
+  Tag tag() const final { return this->readTag(); }
+  void setTag(Tag tag) final { this->writeTag(tag); }
   Rect frame() const final { return this->readFrame(); }
   // The list follows the widgets, which nobody tells of.
   const Subviews& subviews() const final { return const_cast<QtView*>(this)->readSubviews(); }

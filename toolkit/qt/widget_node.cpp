@@ -80,13 +80,13 @@ std::string WidgetNode::nameOfClass() const {
   return widget_ ? widget_->metaObject()->className() : "";
 }
 
-long WidgetNode::readTag() const {
+Tag WidgetNode::readTag() const {
   if (!widget_) return 0;
-  if (!tag_) tag_ = static_cast<long>(widget_->property(tagProperty).toLongLong());
+  if (!tag_) tag_ = Tag{widget_->property(tagProperty).toLongLong()};
   return *tag_;
 }
 
-void WidgetNode::writeTag(long tag) {
+void WidgetNode::writeTag(Tag tag) {
   if (!widget_) return;
   const bool leavesNothing = tag == 0 && !hadTag_;
   widget_->setProperty(tagProperty,

@@ -55,8 +55,8 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   virtual View& role() = 0;
 
   std::string nameOfClass() const;
-  long readTag() const;
-  void writeTag(long tag);
+  Tag readTag() const;
+  void writeTag(Tag tag);
   Rect readFrame() const;
   const Subviews& readSubviews();
   /// As `View::addSubview`. Raises an invalid-argument exception, changing nothing, when `view` is
@@ -88,7 +88,7 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   std::optional<Placement> placement_;
   Subviews subviews_;
   std::vector<QPointer<QWidget>> listed_;  // the widgets of `subviews_`; null once they are gone
-  mutable std::optional<long> tag_;        // as read last, for every search reads them all
+  mutable std::optional<Tag> tag_;         // as read last, for every search reads them all
   bool isRedrawPending_ = false;
   std::unique_ptr<Watch> watch_;
 };

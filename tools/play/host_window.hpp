@@ -16,7 +16,7 @@ namespace tools::play {
 
 struct HostControl {
   toolkit::ViewKind kind = toolkit::ViewKind::plain;
-  long tag = 0;
+  toolkit::Tag tag = 0;
   toolkit::Rect frame;
   /// The title of a button, the text of a field, the name of an image; absent: the toolkit's own.
   std::optional<std::string> caption;

@@ -8,6 +8,7 @@
 #include <variant>
 #include <vector>
 
+#include "toolkit/tag.hpp"
 #include "tools/failure.hpp"
 #include "tools/play/picture_render.hpp"
 
@@ -15,7 +16,7 @@ namespace tools::play {
 
 /// The user presses the control with this tag.
 struct Press {
-  long tag = 0;
+  toolkit::Tag tag = 0;
 };
 
 /// Time passes.

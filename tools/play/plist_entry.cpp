@@ -15,11 +15,11 @@
 namespace tools::play {
 namespace {
 
-std::optional<long> integerOf(const toolkit::ValueRef<>& value) {
-  if (const auto text = toolkit::asString(value)) return parseNumber<long>(text->text());
+std::optional<std::int64_t> integerOf(const toolkit::ValueRef<>& value) {
+  if (const auto text = toolkit::asString(value)) return parseNumber<std::int64_t>(text->text());
   const auto number = toolkit::asNumber(value);
   const bool isInteger = number && number->type() == toolkit::Number::Type::signedInteger;
-  return isInteger ? std::optional<long>(number->longValue()) : std::nullopt;
+  return isInteger ? std::optional<std::int64_t>(number->longValue()) : std::nullopt;
 }
 
 /// YES and NO as property lists of all formats write them.
@@ -71,7 +71,7 @@ std::string PlistEntry::text(std::string_view key) const {
   return std::string(toolkit::asString(value)->text());
 }
 
-long PlistEntry::integer(std::string_view key) const {
+std::int64_t PlistEntry::integer(std::string_view key) const {
   if (!has(key)) return 0;
   const auto number = integerOf(valueOf(key));
   if (!number) fail(key, "a whole number");

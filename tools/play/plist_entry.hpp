@@ -31,8 +31,8 @@ class PlistEntry {
   void expectOnly(const std::vector<std::string_view>& keys) const;
 
   std::string requiredText(std::string_view key) const;
-  std::string text(std::string_view key) const;  ///< empty when there is none
-  long integer(std::string_view key) const;      ///< 0 when there is none
+  std::string text(std::string_view key) const;      ///< empty when there is none
+  std::int64_t integer(std::string_view key) const;  ///< 0 when there is none
   bool flag(std::string_view key, bool absent) const;
   toolkit::Rect requiredRect(std::string_view key) const;
 

@@ -42,14 +42,14 @@ std::vector<std::string> waysOn(const StepPicture& picture) {
 
 }  // namespace
 
-const ControlPicture* controlWithTag(const StepPicture& picture, long tag) {
+const ControlPicture* controlWithTag(const StepPicture& picture, toolkit::Tag tag) {
   const auto found =
       std::find_if(picture.controls.begin(), picture.controls.end(),
                    [tag](const ControlPicture& control) { return control.view.tag == tag; });
   return found == picture.controls.end() ? nullptr : &*found;
 }
 
-std::string pressWords(const StepPicture& picture, long tag) {
+std::string pressWords(const StepPicture& picture, toolkit::Tag tag) {
   std::string words = std::to_string(tag);
   const ControlPicture* control = controlWithTag(picture, tag);
   if (!control || !isButton(control->view.kind)) return words;
@@ -58,7 +58,7 @@ std::string pressWords(const StepPicture& picture, long tag) {
   return firstLine.empty() ? words : words + " (" + firstLine + ")";
 }
 
-std::optional<std::string> whyNotPress(const StepPicture& picture, long tag) {
+std::optional<std::string> whyNotPress(const StepPicture& picture, toolkit::Tag tag) {
   if (picture.ended) return "the walk-through has ended";
   if (!picture.window || !picture.window->visible) return "the window is not on the screen";
   const std::string name = std::to_string(tag);

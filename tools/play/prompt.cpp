@@ -38,7 +38,9 @@ Request parseRequest(std::string_view line) {
   return Unclear{"expected a tag, +seconds, ? or q, found " + found};
 }
 
-std::optional<long> parseTag(std::string_view text) { return parseNumber<long>(text); }
+std::optional<toolkit::Tag> parseTag(std::string_view text) {
+  return parseNumber<toolkit::Tag>(text);
+}
 
 std::optional<double> parseSeconds(std::string_view text) {
   const auto seconds = parseNumber<double>(text);

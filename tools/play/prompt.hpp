@@ -29,7 +29,7 @@ inline constexpr std::string_view promptText = "tag, +seconds, ? or q: ";
 extern const std::string_view promptHelp;
 
 /// A tag as a user writes it: a whole number, nothing around it.
-std::optional<long> parseTag(std::string_view text);
+std::optional<toolkit::Tag> parseTag(std::string_view text);
 /// A number of seconds from 0 to `longestAdvance`, nothing around it.
 std::optional<double> parseSeconds(std::string_view text);
 

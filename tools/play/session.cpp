@@ -48,7 +48,7 @@ void Session::perform(const Step& step) {
   }
 }
 
-void Session::press(long tag) {
+void Session::press(toolkit::Tag tag) {
   const std::string heading = "press " + pressWords(picture(), tag);
   if (const auto reason = whyNotPress(picture(), tag)) return refuse(heading, *reason);
   run(heading, "press-" + std::to_string(tag),
@@ -113,7 +113,7 @@ void Session::takeScreenshot(const std::string& name) {
 void Session::handOver() {
   const auto willAct = [this](const toolkit::Ref<toolkit::View>& view) {
     watch();  // what went before is a step of its own, such as what a timer has just done
-    const long tag = view->tag();
+    const toolkit::Tag tag = view->tag();
     begin("press " + pressWords(look(), tag), "press-" + std::to_string(tag));
   };
   while (watch()) {

@@ -43,7 +43,7 @@ class Session {
   const std::vector<std::string>& problems() const { return problems_; }
 
  private:
-  void press(long tag);
+  void press(toolkit::Tag tag);
   void advance(double seconds);
   void pass(double seconds);
   void run(const std::string& heading, const std::string& name,

@@ -56,9 +56,9 @@ int rank(ViewKind kind) {
   return kind == ViewKind::button ? 1 : 0;
 }
 
-using Kinds = std::map<long, ViewKind>;
+using Kinds = std::map<toolkit::Tag, ViewKind>;
 
-void take(Kinds& kinds, long tag, ViewKind kind) {
+void take(Kinds& kinds, toolkit::Tag tag, ViewKind kind) {
   const auto [place, isNew] = kinds.emplace(tag, kind);
   if (!isNew && rank(kind) > rank(place->second)) place->second = kind;
 }
@@ -75,7 +75,7 @@ void takeTargets(Kinds& kinds, const toolkit::ValueRef<toolkit::Array>& command)
 Kinds kindsByTag(const toolkit::ValueRef<toolkit::Dictionary>& script) {
   Kinds kinds;
   for (const std::string& key : script->allKeys()) {
-    if (const auto tag = parseNumber<long>(key)) take(kinds, *tag, ViewKind::button);
+    if (const auto tag = parseNumber<toolkit::Tag>(key)) take(kinds, *tag, ViewKind::button);
     for (const auto& element : toolkit::asArray(script->objectForKey(key))->elements()) {
       const auto command = toolkit::asArray(element);
       if (command->count() > 0) takeTargets(kinds, command);

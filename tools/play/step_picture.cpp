@@ -25,7 +25,7 @@ ControlPicture lookAtControl(toolkit::TestDriver& driver, const QZ_Plist_State_P
 std::vector<ControlPicture> lookAtControls(toolkit::TestDriver& driver,
                                            const QZ_Plist_State_Parser& engine) {
   std::vector<ControlPicture> controls;
-  std::set<long> tags;
+  std::set<toolkit::Tag> tags;
   const auto content = engine.tutorialWindow()->contentView();
   for (const auto& view : content->subviews()) {
     ControlPicture& control = controls.emplace_back(lookAtControl(driver, engine, view));

@@ -92,7 +92,7 @@ std::string textOf(const Wanted& value) {
 }
 
 void setTag(Stage&, const View& view, const Wanted& value) {
-  view->setTag(value.value.get<long>());
+  view->setTag(value.value.get<toolkit::Tag>());
 }
 
 void setFrame(Stage& stage, const View& view, const Wanted& value) {
@@ -114,7 +114,7 @@ void setEnabled(Stage&, const View& view, const Wanted& value) {
 }
 
 void setState(Stage&, const View& view, const Wanted& value) {
-  const auto state = value.value.get<long>();
+  const auto state = value.value.get<std::int64_t>();
   if (state < -1 || state > 1) throw Unmet("-1, 0 or 1", std::to_string(state));
   button(view)->setState(static_cast<toolkit::State>(state));
 }

@@ -40,7 +40,9 @@ bool isName(std::string_view text) {
 
 }  // namespace
 
-std::optional<long> tagIn(std::string_view text) { return integerBehind<long>('#', text); }
+std::optional<toolkit::Tag> tagIn(std::string_view text) {
+  return integerBehind<toolkit::Tag>('#', text);
+}
 
 std::optional<std::size_t> indexIn(std::string_view text) {
   return integerBehind<std::size_t>('@', text);

@@ -10,12 +10,13 @@
 #include <string_view>
 #include <vector>
 
+#include "toolkit/tag.hpp"
 #include "tools/scenario/lexer.hpp"
 
 namespace tools::scenario {
 
 /// The tag in "#TAG"; nothing when `text` is something else.
-std::optional<long> tagIn(std::string_view text);
+std::optional<toolkit::Tag> tagIn(std::string_view text);
 /// The index in "@INDEX"; nothing when `text` is something else.
 std::optional<std::size_t> indexIn(std::string_view text);
 

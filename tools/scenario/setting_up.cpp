@@ -84,7 +84,7 @@ Outcome controls(Stage& stage, const Arguments& a) {
   const auto parent = viewNamed(stage, a.text("PLACE"));
   const auto kind = *viewKindNamed(a.text("CLASS"));
   std::size_t index = parent->subviews().size();
-  for (long i = 0; i < a.whole("COUNT"); ++i) {
+  for (toolkit::Tag i = 0; i < a.whole("COUNT"); ++i) {
     stage.driver.makeView(kind, a.whole("TAG") + i, frameAt(index++), parent);
   }
   return {};
