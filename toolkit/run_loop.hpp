@@ -4,6 +4,11 @@
 // Invariants of every run loop: timers fire on the thread that scheduled them, between events, in
 // the order of their fire times and, among equal ones, of their scheduling. A timer never fires
 // inside its own firing. An invalid timer never fires and never becomes valid again.
+//
+// Timers belong to the default mode. While the user is busy (holds the mouse button down on a
+// control, has a menu open, is in an application-modal session) the run loop is in another mode:
+// time goes on, and timers wait. Those that are due fire as soon as that is over, after what the
+// user did to end it.
 #pragma once
 
 #include <functional>

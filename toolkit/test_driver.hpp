@@ -83,6 +83,13 @@ class TestDriver {
   /// A click with the primary button where the user sees the view. Hidden or disabled controls, and
   /// those behind a sheet, take none.
   virtual void click(const Ref<View>& view) = 0;
+  /// Presses the primary button down on a button that would take the click, and keeps it down:
+  /// timers wait meanwhile, and `click` is a press by the keyboard. What was held before is let go.
+  virtual void hold(const Ref<View>& view) = 0;
+  /// Lets the primary button up over the held button, which takes the click if it still can and no
+  /// key has pressed it meanwhile; then the timers fire that are due. Nothing happens where nothing
+  /// is held.
+  virtual void letGo() = 0;
   /// Lets time pass, at once: the clock jumps from timer to timer. 0 or more seconds.
   virtual void advance(double seconds) = 0;
   /// From now on `advance` takes as long as it says, so that a person can watch. Nothing changes

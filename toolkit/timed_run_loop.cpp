@@ -114,7 +114,8 @@ Ref<Timer> TimedRunLoop::schedule(double interval, bool repeats, TimerAction act
 }
 
 void TimedRunLoop::fireDue(double until) {
-  while (!queue_.empty() && queue_.begin()->first.time <= until + slack) Firing(*this).run();
+  while (isInDefaultMode() && !queue_.empty() && queue_.begin()->first.time <= until + slack)
+    Firing(*this).run();
 }
 
 std::optional<double> TimedRunLoop::nextDue() const {

@@ -28,13 +28,17 @@ class TimedRunLoop : public RunLoop {
   /// Seconds since a fixed moment. Never goes back.
   virtual double now() const = 0;
 
+  /// Whether timers may fire: not while the user is busy.
+  virtual bool isInDefaultMode() const = 0;
+
  protected:
   /// Called with the time at which a timer was due, before each firing; the queue is without it.
   virtual void reach(double due) = 0;
 
-  /// Fires what is due up to `until`, in order; what a firing schedules counts too. A firing may
-  /// let time pass itself: then the others that come due fire inside it, and its own timer does
-  /// not. Of the firings that a repeating timer missed by `now()` none is made up for.
+  /// Fires what is due up to `until`, in order, as long as the run loop is in its default mode;
+  /// what a firing schedules counts too. A firing may let time pass itself: then the others that
+  /// come due fire inside it, and its own timer does not. Of the firings that a repeating timer
+  /// missed by `now()` none is made up for.
   void fireDue(double until);
   /// When the next timer is due; nothing where there is none.
   std::optional<double> nextDue() const;

@@ -35,6 +35,8 @@ class ForeignDriver final : public toolkit::TestDriver {
   }
   void setResourcePath(std::string_view path) override { driver_->setResourcePath(path); }
   void click(const Ref<View>& view) override { driver_->click(view); }
+  void hold(const Ref<View>& view) override { driver_->hold(view); }
+  void letGo() override { driver_->letGo(); }
   void advance(double seconds) override { driver_->advance(seconds); }
   toolkit::ViewPicture look(const Ref<View>& view) override { return driver_->look(view); }
   toolkit::WindowPicture look(const Ref<Window>& window) override { return driver_->look(window); }

@@ -115,11 +115,33 @@ void MemoryDriver::setResourcePath(std::string_view path) {
 std::string_view MemoryDriver::className(ViewKind kind) const { return rowOf(kind).className; }
 
 void MemoryDriver::click(const Ref<View>& view) {
-  if (const auto button = std::dynamic_pointer_cast<MemoryButton>(view.pointer())) button->click();
+  if (const auto button = std::dynamic_pointer_cast<MemoryButton>(view.pointer())) {
+    if (button == held_.lock()) isDown_ = false;
+    button->click();
+  }
   toolkit_.application().screen()->draw();
 }
 
+void MemoryDriver::hold(const Ref<View>& view) {
+  letGo();
+  const auto button = std::dynamic_pointer_cast<MemoryButton>(view.pointer());
+  if (!button || !button->takesClicks()) return;
+  held_ = button;
+  isDown_ = true;
+  toolkit_.runLoop().setUserIsBusy(true);
+}
+
+void MemoryDriver::letGo() {
+  if (toolkit_.runLoop().isInDefaultMode()) return;
+  toolkit_.runLoop().setUserIsBusy(false);
+  const auto button = held_.lock();
+  if (button && isDown_) button->click();
+  advance(0);
+}
+
 void MemoryDriver::advance(double seconds) {
+  const auto held = held_.lock();
+  if (!held || !held->takesInput()) toolkit_.runLoop().setUserIsBusy(false);
   toolkit_.runLoop().advance(seconds);
   toolkit_.application().screen()->draw();
 }

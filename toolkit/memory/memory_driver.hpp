@@ -5,6 +5,7 @@
 #include <memory>
 
 #include "toolkit/memory/memory_toolkit.hpp"
+#include "toolkit/memory/views.hpp"
 #include "toolkit/test_driver.hpp"
 
 namespace toolkit::memory {
@@ -27,6 +28,8 @@ class MemoryDriver final : public TestDriver {
 
   /// Buttons take clicks; nothing else here does anything with one.
   void click(const Ref<View>& view) override;
+  void hold(const Ref<View>& view) override;
+  void letGo() override;
   void advance(double seconds) override;
 
   ViewPicture look(const Ref<View>& view) override;
@@ -35,6 +38,8 @@ class MemoryDriver final : public TestDriver {
 
  private:
   MemoryToolkit toolkit_;
+  std::weak_ptr<MemoryButton> held_;  // the mouse button is down on it while the user is busy
+  bool isDown_ = false;               // the held button: a click by the keyboard lifts it
 };
 
 /// A driver with a memory toolkit of its own.

@@ -51,7 +51,7 @@ State MemoryButton::stateAfterClick() const {
 }
 
 void MemoryButton::click() {
-  if (!isEnabled() || !takesInput()) return;
+  if (!takesClicks()) return;
   highlight(false);  // the mouse button is up again
   setState(stateAfterClick());
   send(action_, target());

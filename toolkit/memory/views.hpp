@@ -110,6 +110,8 @@ class MemoryButton final : public MemoryControl<Button> {
   const std::optional<Color>& backgroundColor() const { return background_; }
   BezelStyle bezelStyle() const { return bezel_; }
 
+  /// Whether a click of the user's does anything: it arrives, and the button is enabled.
+  bool takesClicks() const { return isEnabled() && takesInput(); }
   /// A click of the user's. Nothing happens when the button is disabled or the click does not
   /// arrive; otherwise the pressed-in look ends and the state changes before the action is sent.
   void click();

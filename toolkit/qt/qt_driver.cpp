@@ -155,11 +155,28 @@ QPoint whereToClick(const QWidget& widget) {
   return widget.rect().center();
 }
 
-void sendMouse(QWidget& widget, QEvent::Type type, Qt::MouseButtons held) {
-  const QPointF local = whereToClick(widget);
+constexpr QPoint outside(-1, -1);
+
+void sendMouse(QWidget& widget, QEvent::Type type, Qt::MouseButtons held, QPointF local) {
   QMouseEvent event(type, local, widget.mapTo(widget.window(), local), widget.mapToGlobal(local),
                     Qt::LeftButton, held, Qt::NoModifier);
   QCoreApplication::sendEvent(&widget, &event);
+}
+
+void press(QWidget& widget) {
+  sendMouse(widget, QEvent::MouseButtonPress, Qt::LeftButton, whereToClick(widget));
+}
+
+// Hidden and behind a modal window it comes to nothing.
+void release(QWidget& widget) {
+  const bool arrives = widget.isVisible() && !isBlocked(*widget.window());
+  const QPointF place = arrives ? whereToClick(widget) : outside;
+  sendMouse(widget, QEvent::MouseButtonRelease, Qt::NoButton, place);
+}
+
+// The mouse is elsewhere. Nothing but buttons does anything with it.
+void clickByKeyboard(QWidget& widget) {
+  if (auto* const button = qobject_cast<QAbstractButton*>(&widget)) button->click();
 }
 
 }  // namespace
@@ -218,8 +235,33 @@ void QtDriver::click(const Ref<View>& view) {
   const auto node = WidgetNode::of(view);
   const QPointer<QWidget> widget = node ? node->widget() : nullptr;
   if (!widget || !widget->isVisible() || isBlocked(*widget->window())) return;
-  sendMouse(*widget, QEvent::MouseButtonPress, Qt::LeftButton);
-  if (widget) sendMouse(*widget, QEvent::MouseButtonRelease, Qt::NoButton);
+  if (held_) {
+    clickByKeyboard(*widget);
+  } else {
+    press(*widget);
+    if (widget) release(*widget);
+  }
+  settle();
+  raiseWhatWasThrown();
+}
+
+void QtDriver::hold(const Ref<View>& view) {
+  letGo();
+  settle();
+  const auto node = WidgetNode::of(view);
+  auto* const button = node ? qobject_cast<QAbstractButton*>(node->widget()) : nullptr;
+  if (!button || !button->isVisible() || !button->isEnabled() || isBlocked(*button->window()))
+    return;
+  held_ = button;
+  press(*button);
+  settle();
+  raiseWhatWasThrown();
+}
+
+void QtDriver::letGo() {
+  if (const QPointer<QWidget> held = std::exchange(held_, nullptr)) release(*held);
+  settle();
+  toolkit_.runLoop().wake();
   settle();
   raiseWhatWasThrown();
 }
@@ -255,7 +297,8 @@ void QtDriver::jump(double seconds) {
   const double end = clock_.now() + seconds;
   double next = 0;
   do {
-    next = std::min(toolkit_.runLoop().nextDue().value_or(end), end);
+    const auto due = toolkit_.runLoop().isInDefaultMode() ? toolkit_.runLoop().nextDue() : end;
+    next = std::min(due.value_or(end), end);
     clock_.reach(next);
     toolkit_.runLoop().wake();
     settle();

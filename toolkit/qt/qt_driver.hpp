@@ -2,6 +2,8 @@
 // The driver of the Qt toolkit. Without a display its windows are drawn off the screen.
 #pragma once
 
+#include <QPointer>
+#include <QWidget>
 #include <exception>
 #include <functional>
 
@@ -31,6 +33,8 @@ class QtDriver final : public TestDriver {
 
   /// Presses and releases the mouse button there.
   void click(const Ref<View>& view) override;
+  void hold(const Ref<View>& view) override;
+  void letGo() override;
   /// The clock stands still at other times.
   void advance(double seconds) override;
   void useRealTime() override { realTime_ = true; }
@@ -57,6 +61,7 @@ class QtDriver final : public TestDriver {
   };
 
   bool realTime_ = false;
+  QPointer<QWidget> held_;  // the mouse button is down on it; null while it is up
   PacedClock clock_;
   const Sweep atTheEnd_{};
   std::exception_ptr thrown_;  // by what the last click or advance led to

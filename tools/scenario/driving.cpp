@@ -94,6 +94,16 @@ Outcome press(Stage& stage, const Arguments& a) {
   return {};
 }
 
+Outcome hold(Stage& stage, const Arguments& a) {
+  stage.driver.hold(stage.cast.control(a.text("C")));
+  return {};
+}
+
+Outcome letGo(Stage& stage, const Arguments&) {
+  stage.driver.letGo();
+  return {};
+}
+
 Outcome push(Stage& stage, const Arguments& a) {
   stage.engines.held()->buttonPushed(control(stage, a));
   return {};
@@ -174,6 +184,8 @@ constexpr StatementKind table[] = {
     {"simple TEXT for none|ID", Result::flag, simple},
     {"compound TEXT none|LIST for none|ID", Result::flag, compound},
     {"press C", Result::nothing, press},
+    {"hold C", Result::nothing, hold},
+    {"let go", Result::nothing, letGo},
     {"push none|C", Result::nothing, push},
     {"advance SECONDS", Result::nothing, advance},
     {"states none|OBJECT", Result::flag, states},

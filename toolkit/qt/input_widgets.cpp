@@ -1,0 +1,42 @@
+// SPDX-License-Identifier: MIT
+// Some classes count without the focus, too: the mouse works on them all the same.
+
+#include "toolkit/qt/input_widgets.hpp"
+
+#include <QAbstractButton>
+#include <QAbstractItemView>
+#include <QAbstractSlider>
+#include <QAbstractSpinBox>
+#include <QCalendarWidget>
+#include <QComboBox>
+#include <QGroupBox>
+#include <QKeySequenceEdit>
+#include <QLineEdit>
+#include <QMenuBar>
+#include <QPlainTextEdit>
+#include <QSplitterHandle>
+#include <QTabBar>
+#include <QTabWidget>
+#include <QTextEdit>
+#include <QToolBox>
+
+namespace toolkit::qt {
+
+namespace {
+
+template <class... Classes>
+bool isOneOf(const QWidget& widget) {
+  return (qobject_cast<const Classes*>(&widget) || ...);
+}
+
+}  // namespace
+
+bool takesInput(const QWidget& widget) {
+  if (const auto* const box = qobject_cast<const QGroupBox*>(&widget)) return box->isCheckable();
+  return widget.focusPolicy() != Qt::NoFocus ||
+         isOneOf<QAbstractButton, QAbstractItemView, QAbstractSlider, QAbstractSpinBox,
+                 QCalendarWidget, QComboBox, QKeySequenceEdit, QLineEdit, QMenuBar, QPlainTextEdit,
+                 QSplitterHandle, QTabBar, QTabWidget, QTextEdit, QToolBox>(widget);
+}
+
+}  // namespace toolkit::qt
