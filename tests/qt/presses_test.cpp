@@ -5,6 +5,7 @@
 #include <QLineEdit>
 #include <QPushButton>
 
+#include "QZ_Plist_State_Parser.hpp"
 #include "tests/qt/support.hpp"
 #include "toolkit/exception.hpp"
 
@@ -59,6 +60,28 @@ TEST_F(Presses, ReplaceTheHostsOwnConnectionsToTheClickAndNoOthers) {
   EXPECT_EQ(toggles, 1);
   EXPECT_EQ(releases, 1);
   EXPECT_EQ(performer->actions, Actions{"go:"});
+}
+
+// The action may still find its way to an engine, as the window's delegate.
+TEST_F(Presses, LeaveTheHostsOwnConnectionsWhenOnlyTheActionIsSet) {
+  auto& next = add<QPushButton>("Next");
+  int clicks = 0;
+  QObject::connect(&next, &QPushButton::clicked, [&] { ++clicks; });
+  const auto engine = QZ_Plist_State_Parser::init(toolkit);
+  window->setDelegate(performer);
+  const auto button = toolkit.application().view(next);
+  EXPECT_TRUE(engine->forceButtonPushedToBeActionForGuiAttribute(button));
+  EXPECT_TRUE(engine->forceButtonPushedToBeActionForGuiAttribute(button));
+  toolkit::asButton(button)->setTarget(nullptr);
+  show();
+  next.click();
+  EXPECT_EQ(clicks, 1);
+  EXPECT_EQ(performer->actions, Actions{"buttonPushed:"});
+
+  toolkit::asButton(button)->setTarget(performer);
+  next.click();
+  EXPECT_EQ(clicks, 1);
+  EXPECT_EQ(performer->actions.size(), 2U);
 }
 
 TEST_F(Presses, TravelToTheWindowsDelegateWithoutATarget) {

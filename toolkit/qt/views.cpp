@@ -60,10 +60,12 @@ QtButton::~QtButton() { QObject::disconnect(clicks_); }
 
 // The host's own connections to the click go, and come back no more; those to other signals stay.
 void QtButton::takeClicks() {
-  QAbstractButton* const button = this->button();
-  if (!button) return;
-  QObject::disconnect(button, &QAbstractButton::clicked, nullptr, nullptr);
-  clicks_ = QObject::connect(button, &QAbstractButton::clicked, [this] { clicked(); });
+  if (button()) QObject::disconnect(button(), &QAbstractButton::clicked, nullptr, nullptr);
+}
+
+void QtButton::hearClicks() {
+  if (!button() || clicks_) return;
+  clicks_ = QObject::connect(button(), &QAbstractButton::clicked, [this] { clicked(); });
 }
 
 void QtButton::clicked() {

@@ -89,11 +89,12 @@ class QtControl : public QtView<Role, ControlNode> {
   void setEnabled(bool enabled) final { this->enable(enabled); }
   void setTarget(const std::shared_ptr<Responder>& target) final {
     this->target_ = target;
-    takeClicks();
+    if (target) takeClicks();
+    hearClicks();
   }
   void setAction(std::string_view action) final {
     this->action_ = action;
-    takeClicks();
+    hearClicks();
   }
   bool sendAction(std::string_view action, const std::shared_ptr<Responder>& target) final {
     return this->widget_ && this->send(action, target);
@@ -109,8 +110,10 @@ class QtControl : public QtView<Role, ControlNode> {
   }
 
  protected:
-  // Whoever sets target or action wants to hear of the user.
+  // A target hears of the clicks in place of the host.
   virtual void takeClicks() {}
+  // An action without a target is sent beside what the host does.
+  virtual void hearClicks() {}
 };
 
 class QtButton final : public QtControl<Button> {
@@ -131,6 +134,7 @@ class QtButton final : public QtControl<Button> {
  private:
   QAbstractButton* button() const { return static_cast<QAbstractButton*>(widget()); }
   void takeClicks() override;
+  void hearClicks() override;
   void clicked();
 
   State heldState_ = State::off;  // of a button that cannot be checked: nothing of it shows
