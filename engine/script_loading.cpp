@@ -28,8 +28,8 @@ toolkit::ValueRef<toolkit::Dictionary> readScript(const std::string& path,
   return contents ? toolkit::dictionaryFromPropertyList(*contents) : nullptr;
 }
 
-// The smallest key read as a 32-bit integer: one that is no number counts as 0, and "007" as 7,
-// under which nothing need be stored.
+}  // namespace
+
 std::optional<std::string> smallestTagKey(const toolkit::Dictionary& script) {
   const auto& entries = script.entries();
   if (entries.empty()) return std::nullopt;
@@ -38,8 +38,6 @@ std::optional<std::string> smallestTagKey(const toolkit::Dictionary& script) {
   };
   return tagKey(std::min_element(entries.begin(), entries.end(), smaller)->key->intValue());
 }
-
-}  // namespace
 
 bool QZ_Plist_State_Parser::loadPlist(std::optional<std::string> name,
                                       std::optional<std::string> runFromKey,

@@ -13,11 +13,11 @@
 #include <vector>
 
 #include "QZ_Plist_State_Parser.hpp"
+#include "engine/endless_chains.hpp"
 #include "engine/tag_key.hpp"
 #include "fuzz/require.hpp"
 #include "toolkit/memory/memory_driver.hpp"
 #include "toolkit/property_list/reader.hpp"
-#include "tools/endless_chains.hpp"
 
 namespace {
 
@@ -57,7 +57,7 @@ class RunLengths {
     std::size_t length = 1;
     const auto elements = toolkit::asArray(list);
     for (const auto& element : elements->elements()) {
-      const auto next = tools::chainTarget(element, own);
+      const auto next = chainTarget(element, own);
       length += next ? ofList(*next, depth + 1) : 1;
       if (length > mostElements) break;
     }

@@ -4,8 +4,8 @@
 #include <map>
 #include <string_view>
 
+#include "engine/endless_chains.hpp"
 #include "toolkit/property_list/number_conversion.hpp"
-#include "tools/endless_chains.hpp"
 
 #if defined(__linux__)
 #include <pthread.h>

@@ -5,14 +5,29 @@
 #include "hosts/qt/walk_through.hpp"
 
 #include <QEvent>
+#include <QMainWindow>
+#include <QScopedValueRollback>
+
+#include "engine/script_problem.hpp"
 
 namespace hosts::qt {
 
+namespace {
+
+// Where the controls are.
+QWidget* contentOf(QWidget& window) {
+  const auto* const mainWindow = qobject_cast<const QMainWindow*>(&window);
+  return mainWindow ? mainWindow->centralWidget() : &window;
+}
+
+}  // namespace
+
 class WalkThrough::Watch final : public QObject, public toolkit::SheetDelegate {
  public:
-  Watch(WalkThrough& owner, QWidget& stage) : owner_(owner), stage_(&stage) {
-    stage.installEventFilter(this);
-    connect(&stage, &QObject::destroyed, this, [this] { endSoon(); });
+  Watch(WalkThrough& owner, QWidget& stage)
+      : owner_(owner), stage_(&stage), content_(contentOf(stage)), hasContent_(content_) {
+    watch(stage);
+    if (content_ && content_ != &stage) watch(*content_);
   }
 
   void sheetDidEnd(const toolkit::Ref<toolkit::Window>& sheet, long, void*) override {
@@ -20,27 +35,48 @@ class WalkThrough::Watch final : public QObject, public toolkit::SheetDelegate {
     endSoon();
   }
 
-  bool eventFilter(QObject*, QEvent* event) override {
-    if (event->type() != QEvent::Close) return false;
-    endSoon();
-    if (!isOver()) return false;
+  bool eventFilter(QObject* receiver, QEvent* event) override {
+    const auto type = event->type();
+    const bool isClosing = type == QEvent::Close && receiver == stage_;
+    if (type == QEvent::Hide && receiver == stage_) noteHiding(*event);
+    if (isClosing || type == QEvent::Hide || type == QEvent::ParentChange) endSoon();
+    if (!isClosing || !isOver()) return false;
     event->ignore();  // it is the walk-through that closes the window, not the user
     return true;
   }
 
  private:
+  void watch(QWidget& widget) {
+    widget.installEventFilter(this);
+    connect(&widget, &QObject::destroyed, this, [this] { endSoon(); });
+  }
+
+  // A window that is shown again at once was dismissed all the same. The desktop hides windows that
+  // it minimises; the toolkit hides a panel for a moment to make a sheet of it.
+  void noteHiding(const QEvent& event) {
+    isDismissed_ |= !event.spontaneous() && !owner_.isBeginning_;
+  }
+
   bool isOver() const { return owner_.engine_->terminating(); }
 
-  // Of a window that its host has not let the user close the walk-through goes on.
+  bool stageIsGone() const { return isDismissed_ || !stage_ || !stage_->isVisible(); }
+  bool contentIsGone() const {
+    return hasContent_ && (!content_ || contentOf(*stage_) != content_);
+  }
+
+  // The walk-through goes on where the host has not let the user close the window.
   void endSoon() {
     const auto endIfOver = [this] {
-      if (isOver() || !stage_ || !stage_->isVisible()) owner_.end();
+      if (isOver() || stageIsGone() || contentIsGone()) owner_.end();
     };
     QMetaObject::invokeMethod(this, endIfOver, Qt::QueuedConnection);
   }
 
   WalkThrough& owner_;
   QPointer<QWidget> stage_;
+  QPointer<QWidget> content_;
+  bool hasContent_;  // had, at the beginning
+  bool isDismissed_ = false;
 };
 
 WalkThrough::WalkThrough(toolkit::qt::QtToolkit& toolkit) : toolkit_(toolkit) {}
@@ -58,17 +94,42 @@ bool WalkThrough::playInSheet(std::string_view script, QWidget& panel, QWidget& 
   return begin(script, panel, window);
 }
 
+// Says in the log why there is no walk-through.
+void WalkThrough::refuse(const std::string& script, const std::string& reason) {
+  toolkit_.log().write("The walk-through " + script + " is not played: " + reason);
+}
+
+// An engine that holds the script; null where the script is refused.
+std::shared_ptr<QZ_Plist_State_Parser> WalkThrough::load(
+    const std::string& script, const toolkit::Ref<toolkit::Window>& window) {
+  auto engine = QZ_Plist_State_Parser::initWithWindow(toolkit_, window);
+  const bool isRead = engine->loadPlist(script, std::nullopt, nullptr, false);
+  const auto lists = engine->plistDictionary();
+  std::string problem;
+  if (!isRead)
+    problem = "the file is not a property list with a dictionary";
+  else if (lists->count() == 0)
+    problem = "there is no such file, or no list in it";
+  else
+    problem = problemOf(lists);
+  if (problem.empty()) return engine;
+  refuse(script, problem);
+  engine->terminateParser();  // else its flasher would keep it
+  return nullptr;
+}
+
 bool WalkThrough::begin(std::string_view script, QWidget& stage, QWidget& window) {
-  end();
-  auto& application = toolkit_.application();
   const std::string name(script);
-  const auto over = application.window(window);
-  const auto engine = QZ_Plist_State_Parser::initWithWindow(toolkit_, over);
-  engine->loadPlist(name, std::nullopt, nullptr, false);
-  if (engine->plistDictionary()->count() == 0) {
-    engine->terminateParser();  // else its flasher would keep it
+  if (isBeginning_) {
+    refuse(name, "another walk-through is beginning");
     return false;
   }
+  const QScopedValueRollback<bool> beginning(isBeginning_, true);
+  end();
+  auto& application = toolkit_.application();
+  const auto over = application.window(window);
+  const auto engine = load(name, over);
+  if (!engine) return false;
   engine_ = engine;
   windows_ = {over, application.window(stage)};
   watch_ = std::make_shared<Watch>(*this, stage);

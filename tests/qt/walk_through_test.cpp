@@ -5,6 +5,8 @@
 #include "hosts/qt/walk_through.hpp"
 
 #include <QCloseEvent>
+#include <QDialog>
+#include <QMainWindow>
 #include <QPushButton>
 #include <QTemporaryDir>
 #include <fstream>
@@ -25,10 +27,8 @@ struct WalkThroughs : hosts::Host {
   WalkThroughs() {
     toolkit.log().setSink([this](std::string_view line) { logged = line; });
     toolkit.files().setResourcePath(directory.path().toStdString());
-    std::ofstream(directory.filePath("tour.plist").toStdString())
-        << "{ 0 = ((SET_TITLE_FOR_OBJECT_ID, Begun, 1)); 2 = (TERMINATE_PARSER); }";
-    std::ofstream(directory.filePath("list.plist").toStdString()) << "(no, script)";
-    std::ofstream(directory.filePath("wrong.plist").toStdString()) << "{ 0 = word; }";
+    write("tour.plist", "{ 0 = ((SET_TITLE_FOR_OBJECT_ID, Begun, 1)); 2 = (TERMINATE_PARSER); }");
+    write("list.plist", "(no, script)");
     next.setProperty("qzTag", 1);
     done.setProperty("qzTag", 2);
     QObject::connect(&next, &QPushButton::clicked, [this] { ++clicks; });
@@ -36,11 +36,19 @@ struct WalkThroughs : hosts::Host {
     show();
   }
 
+  void write(const char* name, const char* script) const {
+    std::ofstream(directory.filePath(name).toStdString()) << script;
+  }
+
   static void click(QWidget& widget) {
     QTest::mouseClick(&widget, Qt::LeftButton);
     hosts::settle();
   }
 };
+
+std::string refusal(const std::string& script, const std::string& reason) {
+  return "The walk-through " + script + " is not played: " + reason;
+}
 
 TEST_F(WalkThroughs, EndByTheScriptAndLeaveTheWindowOpen) {
   ASSERT_TRUE(walkThrough.play("tour.plist", *panel));
@@ -102,8 +110,139 @@ TEST_F(WalkThroughs, TouchNothingWithoutAScript) {
   EXPECT_EQ(ends, 0);
 }
 
+TEST_F(WalkThroughs, SayInTheLogWhyAScriptIsNotPlayed) {
+  const struct {
+    const char* script;
+    const char* reason;
+  } cases[] = {
+      {"missing.plist", "there is no such file, or no list in it"},
+      {"list.plist", "the file is not a property list with a dictionary"},
+      {"word.plist", "the value under the smallest tag, 0, is not a list"},
+      {"names.plist", "no key is a tag, a whole number in decimal"},
+      {"loop.plist", "lists run each other without end: 1 -> 2 -> 1"},
+  };
+  write("word.plist", "{ 0 = word; }");
+  write("names.plist", "{ start = (IDLE_LOOP); }");
+  write("loop.plist",
+        "{ 0 = (); 1 = ((PROCESS_COMMANDS_FOR_ID, 2)); 2 = ((PROCESS_COMMANDS_FOR_ID, 1)); }");
+  for (const auto& c : cases) {
+    EXPECT_FALSE(walkThrough.play(c.script, *panel));
+    EXPECT_EQ(logged, refusal(c.script, c.reason));
+    EXPECT_FALSE(walkThrough.engine());
+  }
+  click(next);
+  EXPECT_EQ(clicks, 1);
+  logged.clear();
+  EXPECT_TRUE(walkThrough.play("tour.plist", *panel));
+  EXPECT_FALSE(logged.starts_with("The walk-through")) << logged;
+}
+
+void (*const waysToDismiss[])(QDialog&) = {
+    [](QDialog& dialog) { QTest::keyClick(&dialog, Qt::Key_Escape); },
+    [](QDialog& dialog) { dialog.accept(); },
+    [](QDialog& dialog) { dialog.reject(); },
+    [](QDialog& dialog) { dialog.done(3); },
+    [](QDialog& dialog) { dialog.hide(); },
+};
+
+TEST_F(WalkThroughs, EndWhenTheirDialogIsDismissedEvenIfItIsShownAgainAtOnce) {
+  for (const auto& dismiss : waysToDismiss) {
+    for (const bool showsAgain : {false, true}) {
+      QDialog dialog;
+      ends = 0;
+      dialog.show();
+      ASSERT_TRUE(walkThrough.play("tour.plist", dialog));
+      dismiss(dialog);
+      if (showsAgain) dialog.show();
+      hosts::settle();
+      EXPECT_EQ(ends, 1);
+      EXPECT_FALSE(walkThrough.engine());
+      EXPECT_EQ(dialog.isVisible(), showsAgain);
+    }
+  }
+}
+
+TEST_F(WalkThroughs, InSheetsEndWhenTheDialogIsDismissed) {
+  for (const auto& dismiss : waysToDismiss) {
+    QDialog sheet;
+    sheet.show();
+    ends = 0;
+    ASSERT_TRUE(walkThrough.playInSheet("tour.plist", sheet, *panel));
+    hosts::settle();
+    EXPECT_EQ(ends, 0);
+    dismiss(sheet);
+    hosts::settle();
+    EXPECT_EQ(ends, 1);
+    EXPECT_FALSE(sheet.isVisible());
+  }
+}
+
+// As it comes when the desktop hides a window that it minimises.
+TEST_F(WalkThroughs, GoOnWhenTheDesktopHidesTheWindow) {
+  ASSERT_TRUE(walkThrough.play("tour.plist", *panel));
+  QHideEvent hide;
+  QSpontaneKeyEvent::setSpontaneous(&hide);
+  QCoreApplication::sendEvent(panel.get(), &hide);
+  hosts::settle();
+  EXPECT_EQ(ends, 0);
+}
+
+TEST_F(WalkThroughs, EndWhenTheHostReplacesTheCentralWidget) {
+  for (const bool takes : {false, true}) {
+    QMainWindow mainWindow;
+    mainWindow.setCentralWidget(new QWidget);
+    const std::unique_ptr<QWidget> kept(takes ? mainWindow.centralWidget() : nullptr);
+    mainWindow.show();
+    ends = 0;
+    ASSERT_TRUE(walkThrough.play("tour.plist", mainWindow));
+    hosts::settle();
+    EXPECT_EQ(ends, 0);
+    if (takes) mainWindow.takeCentralWidget();
+    mainWindow.setCentralWidget(new QWidget);
+    hosts::settle();
+    EXPECT_EQ(ends, 1) << takes;
+    EXPECT_FALSE(walkThrough.engine());
+    EXPECT_TRUE(mainWindow.isVisible());
+  }
+}
+
+TEST_F(WalkThroughs, DoNotBeginWhileAnotherIsBeginning) {
+  bool began = true;
+  std::string line;
+  walkThrough.whenOver([&] {
+    ++ends;
+    began = walkThrough.play("tour.plist", *panel);
+    line = logged;
+    walkThrough.whenOver([this] { ++ends; });
+  });
+  ASSERT_TRUE(walkThrough.play("tour.plist", *panel));
+  QWidget other;
+  ASSERT_TRUE(walkThrough.play("tour.plist", other));
+  EXPECT_FALSE(began);
+  EXPECT_EQ(line, refusal("tour.plist", "another walk-through is beginning"));
+  EXPECT_EQ(ends, 1);
+  const std::weak_ptr<QZ_Plist_State_Parser> engine = walkThrough.engine();
+  walkThrough.end();
+  EXPECT_TRUE(engine.expired());
+  EXPECT_EQ(ends, 2);
+}
+
+TEST_F(WalkThroughs, BeginInTheEndOfTheOneBefore) {
+  walkThrough.whenOver([this] {
+    ++ends;
+    EXPECT_TRUE(walkThrough.play("tour.plist", *panel));
+    walkThrough.whenOver({});
+  });
+  ASSERT_TRUE(walkThrough.play("tour.plist", *panel));
+  click(done);
+  EXPECT_EQ(ends, 1);
+  EXPECT_TRUE(walkThrough.engine());
+}
+
 TEST_F(WalkThroughs, CarryNoExceptionOutOfTheScript) {
-  EXPECT_TRUE(walkThrough.play("wrong.plist", *panel));
+  write("wrong.plist", "{ 0 = (IDLE_LOOP); 1 = word; }");
+  ASSERT_TRUE(walkThrough.play("wrong.plist", *panel));
+  click(next);
   EXPECT_TRUE(logged.starts_with("NSInvalidArgumentException")) << logged;
 }
 

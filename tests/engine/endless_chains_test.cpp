@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "tools/endless_chains.hpp"
+#include "engine/endless_chains.hpp"
 
 #include <gtest/gtest.h>
 
@@ -47,30 +47,37 @@ TEST(EndlessChains, AreTheLoopsARunEndsUpIn) {
        {"1 -> 1", "2 -> 2"}},
       {"a key that no tag spells", {{"007", {7}}}, {}},
   };
-  for (const auto& c : cases)
-    EXPECT_EQ(tools::endlessChains(script(c.lists)).loops, c.loops) << c.what;
+  for (const auto& c : cases) EXPECT_EQ(endlessChains(script(c.lists)).loops, c.loops) << c.what;
 }
 
 TEST(EndlessChains, ASimpleCommandChainsToItsOwnList) {
   const auto list = Array::make({String::make("PROCESS_COMMANDS_FOR_ID")});
   const auto script = Dictionary::make();
   script->setObject(list, "4");
-  EXPECT_EQ(tools::endlessChains(script).loops, std::vector<std::string>{"4 -> 4"});
+  EXPECT_EQ(endlessChains(script).loops, std::vector<std::string>{"4 -> 4"});
+}
+
+TEST(EndlessChains, EndWithTheWalkThrough) {
+  const auto script = Dictionary::make();
+  script->setObject(Array::make({String::make("TERMINATE_PARSER"), chain(4)}), "4");
+  EXPECT_TRUE(endlessChains(script).loops.empty());
+  script->setObject(Array::make({chain(5), String::make("TERMINATE_PARSER")}), "5");
+  EXPECT_EQ(endlessChains(script).loops, std::vector<std::string>{"5 -> 5"});
 }
 
 TEST(EndlessChains, ASimpleCommandOfAnOddKeyChainsToItsNumber) {
   const auto list = Array::make({String::make("PROCESS_COMMANDS_FOR_ID")});
   const auto script = Dictionary::make();
   script->setObject(list, "07");
-  EXPECT_TRUE(tools::endlessChains(script).loops.empty());
+  EXPECT_TRUE(endlessChains(script).loops.empty());
   script->setObject(list, "7");
-  const auto chains = tools::endlessChains(script);
+  const auto chains = endlessChains(script);
   EXPECT_EQ(chains.loops, std::vector<std::string>{"7 -> 7"});
   EXPECT_TRUE(chains.loopOf.contains("07"));
 }
 
 TEST(EndlessChains, SayForEveryListWhereItEndsUp) {
-  const auto chains = tools::endlessChains(script({{"1", {2}}, {"2", {2}}, {"3", {1}}, {"4", {}}}));
+  const auto chains = endlessChains(script({{"1", {2}}, {"2", {2}}, {"3", {1}}, {"4", {}}}));
   ASSERT_EQ(chains.loops, std::vector<std::string>{"2 -> 2"});
   EXPECT_EQ(chains.loopOf.size(), 3U);
   EXPECT_FALSE(chains.loopOf.contains("4"));
@@ -83,7 +90,7 @@ TEST(EndlessChains, WhatIsNoListChainsToNothing) {
       Array::make({Array::make(), Array::make({Number::withLong(1), chain(1)}),
                    Array::make({String::make("PROCESS_COMMANDS_FOR_ID"), Array::make()})}),
       "2");
-  EXPECT_TRUE(tools::endlessChains(script).loops.empty());
+  EXPECT_TRUE(endlessChains(script).loops.empty());
 }
 
 TEST(EndlessChains, OfAHundredThousandListsAreFoundAtOnce) {
@@ -93,7 +100,7 @@ TEST(EndlessChains, OfAHundredThousandListsAreFoundAtOnce) {
   for (toolkit::Tag i = 0; i < count; ++i) {
     entries.push_back({String::make(std::to_string(i)), Array::make({chain((i + 1) % count)})});
   }
-  const auto chains = tools::endlessChains(Dictionary::make(std::move(entries)));
+  const auto chains = endlessChains(Dictionary::make(std::move(entries)));
   EXPECT_EQ(chains.loops.size(), 1U);
   EXPECT_EQ(chains.loopOf.size(), static_cast<std::size_t>(count));
 }

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "tools/endless_chains.hpp"
+#include "engine/endless_chains.hpp"
 
 #include <algorithm>
 
@@ -7,12 +7,16 @@
 #include "engine/tag_key.hpp"
 #include "toolkit/uppercase.hpp"
 
-namespace tools {
-
 namespace {
 
 using Keys = std::vector<std::string>;
 using Graph = std::map<std::string, Keys, std::less<>>;
+
+// The engine has no script any more after this command: what follows chains to nothing.
+bool endsTheWalkThrough(const toolkit::ValueRef<>& element) {
+  const auto simple = toolkit::asString(element);
+  return simple && simple->text() == QZ_PLIST_STATE_PARSER_TERMINATE_PARSER;
+}
 
 Graph chainsOf(const toolkit::ValueRef<toolkit::Dictionary>& script) {
   Graph graph;
@@ -23,6 +27,7 @@ Graph chainsOf(const toolkit::ValueRef<toolkit::Dictionary>& script) {
     const std::string own = tagKey(key->intValue());  // the list of "07" runs with the id 7
     const auto elements = toolkit::asArray(list);
     for (const auto& element : elements->elements()) {
+      if (endsTheWalkThrough(element)) break;
       if (auto to = chainTarget(element, own)) targets.push_back(*std::move(to));
     }
   }
@@ -95,5 +100,3 @@ EndlessChains endlessChains(const toolkit::ValueRef<toolkit::Dictionary>& script
   }
   return chains;
 }
-
-}  // namespace tools

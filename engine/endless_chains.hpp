@@ -4,7 +4,7 @@
 // The engine sets no limit to chaining, so such a script exhausts the stack. Which lists do is
 // known beforehand, as a run takes every list from its first element to its last: of a list that
 // chains to some that come back and some that do not, the first that does not is where the run
-// stays.
+// stays. Only the end of the walk-through cuts a list short.
 #pragma once
 
 #include <cstddef>
@@ -14,8 +14,6 @@
 #include <vector>
 
 #include "toolkit/property_list/collections.hpp"
-
-namespace tools {
 
 struct EndlessChains {
   /// Each loop once, as its lists' keys in the order in which they run: "3 -> 7 -> 3".
@@ -30,5 +28,3 @@ std::optional<std::string> chainTarget(const toolkit::ValueRef<>& element, const
 
 /// The endless chains of a script; what in it is no list chains to nothing.
 EndlessChains endlessChains(const toolkit::ValueRef<toolkit::Dictionary>& script);
-
-}  // namespace tools

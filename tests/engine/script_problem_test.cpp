@@ -1,0 +1,31 @@
+// SPDX-License-Identifier: MIT
+// What is said of scripts that a host had better not play.
+#include "engine/script_problem.hpp"
+
+#include <gtest/gtest.h>
+
+#include "toolkit/property_list/reader.hpp"
+
+namespace {
+
+TEST(ScriptProblem, SaysWhatIsWrong) {
+  const struct {
+    const char* script;
+    const char* problem;
+  } cases[] = {
+      {"{ 1 = (IDLE_LOOP); }", ""},
+      {"{ 1 = (IDLE_LOOP); about = text; \"-3\" = (); }", ""},
+      {"{ 1 = (IDLE_LOOP); 2 = text; }", ""},
+      {"{}", "no key is a tag, a whole number in decimal"},
+      {"{ start = (IDLE_LOOP); 007 = (); }", "no key is a tag, a whole number in decimal"},
+      {"{ 1 = (IDLE_LOOP); \"-3\" = text; }",
+       "the value under the smallest tag, -3, is not a list"},
+      {"{ 1 = (); 2 = ((PROCESS_COMMANDS_FOR_ID, 3)); 3 = ((PROCESS_COMMANDS_FOR_ID, 2));"
+       "  4 = (PROCESS_COMMANDS_FOR_ID); }",
+       "lists run each other without end: 2 -> 3 -> 2, 4 -> 4"},
+  };
+  for (const auto& c : cases)
+    EXPECT_EQ(problemOf(toolkit::dictionaryFromPropertyList(c.script)), c.problem) << c.script;
+}
+
+}  // namespace
