@@ -1,17 +1,32 @@
 // SPDX-License-Identifier: MIT
 // Which widget is which kind of view, where it lies, and its tag; states; the keyboard's focus.
 
+#include <QCalendarWidget>
 #include <QCheckBox>
-#include <QComboBox>
+#include <QDateTimeEdit>
+#include <QDial>
 #include <QDialog>
+#include <QFontComboBox>
+#include <QGroupBox>
+#include <QKeySequenceEdit>
 #include <QLabel>
 #include <QLineEdit>
+#include <QListWidget>
 #include <QMainWindow>
 #include <QPlainTextEdit>
+#include <QProgressBar>
 #include <QPushButton>
 #include <QRadioButton>
+#include <QScrollBar>
+#include <QSpinBox>
+#include <QTabBar>
+#include <QTabWidget>
+#include <QTableWidget>
 #include <QTextEdit>
+#include <QToolBox>
+#include <QTreeWidget>
 
+#include "QZ_Plist_State_Parser.hpp"
 #include "tests/qt/support.hpp"
 #include "toolkit/exception.hpp"
 #include "toolkit/qt/widget_node.hpp"
@@ -49,7 +64,53 @@ TEST_F(Kinds, GoByTheClassOfTheWidget) {
   for (std::size_t i = 0; i < views.size(); ++i)
     EXPECT_EQ(kindOf(*views[i]), expected[i]) << views[i]->className();
   EXPECT_EQ(views[2]->className(), "QComboBox");
-  EXPECT_THROW(views[2]->setEnabled(false), toolkit::InvalidArgumentException);
+}
+
+struct FocusTaker : QWidget {
+  explicit FocusTaker(QWidget* around) : QWidget(around) { setFocusPolicy(Qt::StrongFocus); }
+};
+
+TEST_F(Kinds, CanBeEnabledWhereTheyTakeInput) {
+  QWidget* const widgets[] = {
+      &add<QComboBox>(),      &add<QFontComboBox>(),   &add<QSlider>(),
+      &add<QScrollBar>(),     &add<QDial>(),           &add<QSpinBox>(),
+      &add<QDoubleSpinBox>(), &add<QDateTimeEdit>(),   &add<QTabWidget>(),
+      &add<QTabBar>(),        &add<QListWidget>(),     &add<QTreeWidget>(),
+      &add<QTableWidget>(),   &add<QCalendarWidget>(), &add<QKeySequenceEdit>(),
+      &add<QToolBox>(),       &add<FocusTaker>()};
+  for (QWidget* const widget : widgets) {
+    const auto view = toolkit.application().view(*widget);
+    view->setEnabled(false);
+    EXPECT_FALSE(widget->isEnabled()) << view->className();
+    view->setEnabled(true);
+    EXPECT_TRUE(widget->isEnabled()) << view->className();
+  }
+}
+
+TEST_F(Kinds, CannotBeEnabledWhereTheyTakeNone) {
+  auto& box = add<QGroupBox>("box");
+  QWidget* const widgets[] = {&box, &add<QWidget>(), &add<QFrame>(), &add<QProgressBar>()};
+  for (QWidget* const widget : widgets) {
+    const auto view = toolkit.application().view(*widget);
+    EXPECT_THROW(view->setEnabled(false), toolkit::InvalidArgumentException) << view->className();
+  }
+  box.setCheckable(true);
+  toolkit.application().view(box)->setEnabled(false);
+  EXPECT_FALSE(box.isEnabled());
+}
+
+TEST_F(Kinds, AreEnabledByScripts) {
+  auto& combo = add<QComboBox>();
+  combo.setProperty(tagProperty, 5);
+  const auto engine = QZ_Plist_State_Parser::init(toolkit);
+  engine->setTutorialWindow(window);
+  const auto run = [&](const char* command) {
+    engine->processCommandArray(toolkit::Array::make({toolkit::String::make(command)}),
+                                toolkit::Number::withLong(5));
+    return combo.isEnabled();
+  };
+  EXPECT_FALSE(run("DISABLE_OBJECT_WITH_ID"));
+  EXPECT_TRUE(run("ENABLE_OBJECT_WITH_ID"));
 }
 
 TEST_F(Kinds, TakeTheCentralWidgetOfAMainWindowForItsContent) {

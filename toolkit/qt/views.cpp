@@ -8,6 +8,7 @@
 
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/check_state.hpp"
+#include "toolkit/qt/input_widgets.hpp"
 #include "toolkit/qt/text_look.hpp"
 #include "toolkit/qt/window.hpp"
 
@@ -36,7 +37,7 @@ std::shared_ptr<WidgetNode> makeView(QWidget& widget, const std::shared_ptr<Desk
   if (qobject_cast<QAbstractButton*>(&widget)) return make<QtButton>(widget, desk, keptBy);
   if (isImageView(widget)) return make<QtImageView>(widget, desk, keptBy);
   if (showsText(widget)) return make<QtTextField>(widget, desk, keptBy);
-  return make<QtView<View>>(widget, desk, keptBy);
+  return make<QtOtherView>(widget, desk, keptBy);
 }
 
 bool ControlNode::send(std::string_view action, const std::shared_ptr<Responder>& target) {
@@ -126,6 +127,12 @@ AttributedString QtTextField::value() const {
 }
 
 void QtTextField::setValue(const AttributedString& value) { showText(*widget(), value); }
+
+// Asked each time: a host may make a group box checkable later.
+void QtOtherView::setEnabled(bool enabled) {
+  if (widget_ && !takesInput(*widget_)) return View::setEnabled(enabled);
+  enable(enabled);
+}
 
 void QtImageView::setImage(const Ref<Image>& image) {
   if (label()) showImage(*label(), image);

@@ -156,6 +156,14 @@ class QtTextField final : public QtControl<TextField> {
   std::weak_ptr<Responder> delegate_;  // its own maker's
 };
 
+/// Anything else. Whatever takes the user's input can be enabled and disabled.
+class QtOtherView final : public QtView<View> {
+ public:
+  using QtView::QtView;
+
+  void setEnabled(bool enabled) override;
+};
+
 /// Shows its image as scripts ask for, with no frame, in the middle, shrunk to fit; there are no
 /// other frames, scalings and alignments.
 class QtImageView final : public QtControl<ImageView> {
