@@ -13,6 +13,7 @@
 
 #include "toolkit/qt/accessibility.hpp"
 #include "toolkit/qt/decoration.hpp"
+#include "toolkit/qt/edit_dress.hpp"
 #include "toolkit/qt/label_page.hpp"
 #include "toolkit/qt/mnemonics.hpp"
 #include "toolkit/qt/rich_text.hpp"
@@ -30,12 +31,26 @@ QTextDocument* documentOf(const QWidget& widget) {
   return nullptr;
 }
 
+/// Whether Qt ends a line with `c` within a document. The last two stand around tables.
+bool endsLine(QChar c) {
+  return c == QChar::ParagraphSeparator || c == QChar::LineSeparator || c == QChar(0xfdd0) ||
+         c == QChar(0xfdd1);
+}
+
+/// Unlike `toPlainText`, with no-break blanks as they are.
+QString textOf(const QTextDocument& document) {
+  QString text = document.toRawText();
+  for (QChar& c : text)
+    if (endsLine(c)) c = u'\n';
+  return text;
+}
+
 /// What the widget itself says that it shows, to find out whether somebody has changed it.
 QString rawText(const QWidget& widget) {
   if (const auto* const label = qobject_cast<const QLabel*>(&widget)) return label->text();
   if (const auto* const edit = qobject_cast<const QLineEdit*>(&widget)) return edit->text();
   const QTextDocument* const document = documentOf(widget);
-  return document ? document->toPlainText() : QString();
+  return document ? textOf(*document) : QString();
 }
 
 QString plainTextOf(const QLabel& label) {
@@ -80,11 +95,18 @@ class TextLook final : public QObject {
   }
 
   void show(const AttributedString& text) {
+    takeOff();
     text_ = text;
     draw();
+    putOn();
     if (qobject_cast<QLabel*>(&widget_)) announceShownName(widget_, qString(text.string()));
   }
   const AttributedString& text() const { return text_; }
+  /// Gives the widget back what it had before the text was shown.
+  void takeOff() {
+    if (auto* const line = qobject_cast<QLineEdit*>(&widget_)) dress_.takeOff(*line);
+    if (auto* const edit = qobject_cast<QPlainTextEdit*>(&widget_)) dress_.takeOff(*edit);
+  }
   bool isStale() const { return rawText(widget_) != raw_; }
 
   bool eventFilter(QObject*, QEvent* event) override {
@@ -106,7 +128,15 @@ class TextLook final : public QObject {
   }
 
  private:
+  void putOn() {
+    if (auto* const line = qobject_cast<QLineEdit*>(&widget_))
+      dress_.putOn(*line, text_, setting());
+    if (auto* const edit = qobject_cast<QPlainTextEdit*>(&widget_))
+      dress_.putOn(*edit, text_, setting());
+  }
+
   void redraw() {
+    if (qobject_cast<QLineEdit*>(&widget_)) return;   // its palette has it
     const QSignalBlocker quiet(documentOf(widget_));  // the text stays the same
     draw();
   }
@@ -159,6 +189,7 @@ class TextLook final : public QObject {
   AttributedString text_;
   QString raw_;
   LabelPage page_;  // of a label
+  EditDress dress_;
 };
 
 }  // namespace
@@ -170,6 +201,7 @@ bool showsText(const QWidget& widget) {
 
 void showText(QWidget& widget, std::string_view text) {
   if (auto* const look = decorationOn<TextLook>(widget)) {
+    look->takeOff();
     delete look;
     forgetFormat(widget);
   }

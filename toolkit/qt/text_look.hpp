@@ -17,8 +17,9 @@ bool showsText(const QWidget& widget);
 /// Shows plain text, in the widget's own font and colour, as it is: neither tags nor ampersands
 /// mean anything. Nothing happens to a widget that shows no text.
 void showText(QWidget& widget, std::string_view text);
-/// Shows text with its attributes; a line edit shows it plain, and a plain text edit without its
-/// paragraph styles. Links of labels open only through the host (`QLabel::linkActivated`).
+/// Shows text with its attributes; of a line edit, only the font, colour and alignment that all of
+/// it has, and of paragraph styles a plain text edit shows only such an alignment. Links of labels
+/// open only through the host (`QLabel::linkActivated`).
 void showText(QWidget& widget, const AttributedString& text);
 /// The very text that was shown last; without attributes where the host or the user has changed it
 /// since. Empty of a widget that shows none.
