@@ -119,18 +119,20 @@ TEST(TextLook, OpensLinksOnlyThroughTheHost) {
   EXPECT_TRUE(label.text().contains("href=\"x:y\""));
 }
 
-TEST(TextLook, MirrorsNaturalTextOnly) {
-  const auto leftEdge = [](TextAlignment alignment) {
+TEST(TextLook, MirrorsNaturalTextOnlyAndByItsLetters) {
+  const auto leftEdge = [](const char* letters, TextAlignment alignment) {
     QLabel label;
     label.resize(300, 30);
     label.setLayoutDirection(Qt::RightToLeft);
-    AttributedString text = redText();
+    AttributedString text = redText(letters);
     text.addParagraphStyle(ParagraphStyle{.alignment = alignment}, {0, text.length()});
     showText(label, text);
     return boundsOf(pictureOf(label), isReddish).left();
   };
-  EXPECT_GT(leftEdge(TextAlignment::natural), 150);
-  EXPECT_LT(leftEdge(TextAlignment::left), 20);
+  EXPECT_LT(leftEdge("words", TextAlignment::natural), 20);
+  EXPECT_GT(leftEdge("\u05e9\u05dc\u05d5\u05dd", TextAlignment::natural), 150);
+  EXPECT_LT(leftEdge("\u05e9\u05dc\u05d5\u05dd", TextAlignment::left), 20);
+  EXPECT_GT(leftEdge("words", TextAlignment::right), 150);
 }
 
 TEST(TextLook, LeavesNothingOnTheWidgetWithPlainText) {

@@ -124,6 +124,7 @@ class Painting {
   void paintTitle(const QRect& place, const Label& label);
   void paintFace(const QStyleOption& option);
   void adapt(QStyleOption& option) const;
+  Qt::Alignment leadingEdge() const;
 
   QAbstractButton& button_;
   const ButtonAppearance& appearance_;
@@ -160,6 +161,11 @@ void Painting::adapt(QStyleOption& option) const {
   option.palette.setColor(QPalette::Button, face);
   option.palette.setColor(QPalette::ButtonText, ink);
   option.palette.setColor(QPalette::Disabled, QPalette::ButtonText, halfway(ink, face));
+}
+
+/// Where the button's own lines begin, whatever the direction of what is written in them.
+Qt::Alignment Painting::leadingEdge() const {
+  return (button_.isRightToLeft() ? Qt::AlignRight : Qt::AlignLeft) | Qt::AlignAbsolute;
 }
 
 void Painting::paintPushButton(const QPushButton& button) {
@@ -210,7 +216,7 @@ void Painting::paintCommandLink(const QCommandLinkButton& button) {
   if (appearance_.title) {
     place = alone ? place.adjusted(0, -place.top(), 0, 0)
                   : QRect(place.topLeft(), QSize(place.width(), lineHeight));
-    paintLabel({place, {}, {}, colorsOf(option.palette), Qt::AlignLeading});
+    paintLabel({place, {}, {}, colorsOf(option.palette), leadingEdge()});
   } else {
     painter_.setFont(font);
     painter_.drawItemText(place, Qt::TextShowMnemonic, option.palette, button.isEnabled(),
@@ -249,8 +255,7 @@ void Painting::paintToggle(QStyleOptionButton& option, bool radio) {
   indicator.text.clear();
   indicator.icon = {};
   painter_.drawControl(control, indicator);
-  paintToggleLabel(option, {contents, option.icon, option.iconSize, colors, Qt::AlignLeading},
-                   radio);
+  paintToggleLabel(option, {contents, option.icon, option.iconSize, colors, leadingEdge()}, radio);
 }
 
 /// Over what a style sheet may have drawn behind it.
@@ -361,7 +366,8 @@ void Painting::paintTitle(const QRect& place, const Label& label) {
   document.documentLayout()->setPaintDevice(&button_);
   TextSetting setting{appearance_.titleFont,
                       button_.palette().color(QPalette::Active, QPalette::Link),
-                      label.colors.ground, label.unasked, button_.layoutDirection()};
+                      label.colors.ground, label.unasked, leadingEdge()};
+  setting.direction = writingDirectionOf(*appearance_.title);
   setting.greyed = !button_.isEnabled();
   showIn(document, *appearance_.title, setting);
   document.setTextWidth(place.width());

@@ -37,12 +37,12 @@ QTextCharFormat formatOf(const TextAttributes& attributes, const TextSetting& se
   return format;
 }
 
-QTextBlockFormat blockFormatOf(const TextAttributes& attributes, const TextSetting& setting) {
-  const BlockSetting block = blockSettingOf(attributes, setting);
+QTextBlockFormat blockFormatOf(const Paragraph& paragraph, const TextSetting& setting) {
+  const BlockSetting block = blockSettingOf(*paragraph.attributes, setting);
   QTextBlockFormat format;
   format.setAlignment(block.alignment);
   format.setLayoutDirection(setting.direction);
-  if (setting.direction == Qt::RightToLeft) {
+  if (directionOf(paragraph, setting) == Qt::RightToLeft) {
     format.setRightMargin(block.before);
   } else {
     format.setLeftMargin(block.before);
@@ -66,12 +66,16 @@ void showIn(QTextDocument& document, const AttributedString& text, const TextSet
   bool first = true;
   for (const Paragraph& paragraph : paragraphsOf(text, setting.dropsLastLineEnd)) {
     if (!std::exchange(first, false)) cursor.insertBlock();
-    cursor.setBlockFormat(blockFormatOf(*paragraph.attributes, setting));
+    cursor.setBlockFormat(blockFormatOf(paragraph, setting));
     cursor.setBlockCharFormat(formatOf(*paragraph.attributes, setting));
     for (const Piece& piece : paragraph.pieces)
       cursor.insertText(piece.text, formatOf(*piece.attributes, setting));
   }
   document.setUndoRedoEnabled(undo);
+}
+
+Qt::LayoutDirection writingDirectionOf(const AttributedString& text) {
+  return qString(text.string()).isRightToLeft() ? Qt::RightToLeft : Qt::LeftToRight;
 }
 
 bool hasLinks(const AttributedString& text) {

@@ -17,8 +17,11 @@ struct TextSetting {
   QFont font;
   QColor link;    ///< of links that have no colour of their own
   QColor ground;  ///< what the text stands on
-  /// Where paragraphs without a style stand; those of natural alignment begin where lines begin.
+  /// Where paragraphs without a style stand.
   Qt::Alignment unasked = Qt::AlignLeading;
+  /// Where paragraphs of natural alignment stand; leading, where their own writing begins.
+  Qt::Alignment natural = Qt::AlignLeading;
+  /// The writing direction; automatic, each paragraph's own text tells.
   Qt::LayoutDirection direction = Qt::LeftToRight;
   /// How text without a colour is drawn; not set, the document's viewer has the choice.
   std::optional<QColor> ink{};
@@ -33,6 +36,10 @@ void showIn(QTextDocument& document, const AttributedString& text, const TextSet
 
 /// The same as HTML, for widgets that take nothing else.
 QString htmlOf(const AttributedString& text, const TextSetting& setting);
+
+/// The direction in which Qt writes the plain text: that of its first letter that has one, wherever
+/// the text stands.
+Qt::LayoutDirection writingDirectionOf(const AttributedString& text);
 
 /// Whether any of `text` is a link.
 bool hasLinks(const AttributedString& text);

@@ -151,15 +151,24 @@ void writeCss(QString& html, const Paragraph& paragraph, const BlockSetting& blo
   if (std::any_of(paragraph.pieces.begin(), paragraph.pieces.end(),
                   [](const Piece& piece) { return hasBlanksToKeep(piece.text); }))
     html += "white-space:pre-wrap;"_L1;
-  const bool leftwards = setting.direction == Qt::RightToLeft;
+  const bool leftwards = directionOf(paragraph, setting) == Qt::RightToLeft;
   writeCss(html, leftwards ? "margin-right:"_L1 : "margin-left:"_L1, block.before);
   writeCss(html, "text-indent:"_L1, block.firstLine);
+}
+
+/// Whether Qt would take the paragraph to be written from right to left.
+bool isWrittenLeftwards(const Paragraph& paragraph) {
+  TextSetting asItIs;
+  asItIs.direction = Qt::LayoutDirectionAuto;
+  return directionOf(paragraph, asItIs) == Qt::RightToLeft;
 }
 
 void writeParagraph(QString& html, const Paragraph& paragraph, const TextSetting& setting) {
   const BlockSetting block = blockSettingOf(*paragraph.attributes, setting);
   html += "<div"_L1;
-  if (setting.direction == Qt::RightToLeft) html += " dir=\"rtl\""_L1;
+  const bool leftwards = directionOf(paragraph, setting) == Qt::RightToLeft;
+  if (leftwards) html += " dir=\"rtl\""_L1;
+  if (!leftwards && isWrittenLeftwards(paragraph)) html += " dir=\"ltr\""_L1;
   html += alignmentIn(block);
   writeBetween(" style=\""_L1, "\""_L1, html, [&] { writeCss(html, paragraph, block, setting); });
   html += u'>';

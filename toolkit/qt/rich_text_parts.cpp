@@ -28,8 +28,8 @@ void addTo(std::vector<Paragraph>& paragraphs, std::string_view text,
   }
 }
 
-Qt::Alignment alignmentOf(const std::optional<ParagraphStyle>& style, Qt::Alignment otherwise) {
-  if (!style) return otherwise;
+Qt::Alignment alignmentOf(const std::optional<ParagraphStyle>& style, const TextSetting& setting) {
+  if (!style) return setting.unasked;
   switch (style->alignment) {
     case TextAlignment::left:
       return Qt::AlignLeft | Qt::AlignAbsolute;
@@ -42,7 +42,7 @@ Qt::Alignment alignmentOf(const std::optional<ParagraphStyle>& style, Qt::Alignm
     case TextAlignment::natural:
       break;
   }
-  return Qt::AlignLeading;
+  return setting.natural;
 }
 
 }  // namespace
@@ -61,9 +61,16 @@ std::vector<Paragraph> paragraphsOf(const AttributedString& text, bool dropsLast
   return paragraphs;
 }
 
+Qt::LayoutDirection directionOf(const Paragraph& paragraph, const TextSetting& setting) {
+  if (setting.direction != Qt::LayoutDirectionAuto) return setting.direction;
+  QString text;
+  for (const Piece& piece : paragraph.pieces) text += piece.text;
+  return text.isRightToLeft() ? Qt::RightToLeft : Qt::LeftToRight;
+}
+
 BlockSetting blockSettingOf(const TextAttributes& attributes, const TextSetting& setting) {
   const ParagraphStyle style = attributes.paragraphStyle.value_or(ParagraphStyle{});
-  return {alignmentOf(attributes.paragraphStyle, setting.unasked), style.headIndent,
+  return {alignmentOf(attributes.paragraphStyle, setting), style.headIndent,
           style.firstLineHeadIndent - style.headIndent};
 }
 

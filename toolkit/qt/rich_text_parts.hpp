@@ -27,6 +27,9 @@ struct Paragraph {
 /// Takes `text` apart, which outlives the paragraphs.
 std::vector<Paragraph> paragraphsOf(const AttributedString& text, bool dropsLastLineEnd);
 
+/// The direction in which the paragraph is written, left to right or the other way.
+Qt::LayoutDirection directionOf(const Paragraph& paragraph, const TextSetting& setting);
+
 /// How a paragraph stands.
 struct BlockSetting {
   Qt::Alignment alignment;

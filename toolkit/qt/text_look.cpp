@@ -152,7 +152,8 @@ class TextLook final : public QObject {
 
   TextSetting setting() const {
     TextSetting setting{widget_.font(), {}, {}};
-    setting.direction = widget_.layoutDirection();
+    // As Qt has it for plain text: a label's by all of its text, an edit's by each paragraph.
+    setting.direction = documentOf(widget_) ? Qt::LayoutDirectionAuto : writingDirectionOf(text_);
     setting.greyed = !widget_.isEnabled();
     // Only where they are needed: Qt takes its time to say which palette holds.
     if (setting.greyed || hasLinks(text_)) setColors(setting);
