@@ -37,17 +37,28 @@ QTextCharFormat formatOf(const TextAttributes& attributes, const TextSetting& se
   return format;
 }
 
+/// Qt's own tab stops are 80 points apart. Left and right are those of the page.
+QList<QTextOption::Tab> tabsFor(const MarkerStops& stops, Qt::LayoutDirection direction) {
+  const bool leftwards = direction == Qt::RightToLeft;
+  const auto begin = leftwards ? QTextOption::RightTab : QTextOption::LeftTab;
+  const auto end = leftwards ? QTextOption::LeftTab : QTextOption::RightTab;
+  return {QTextOption::Tab(stops.marker, end), QTextOption::Tab(stops.text, begin),
+          QTextOption::Tab(2 * stops.text, begin)};  // behind a wide marker
+}
+
 QTextBlockFormat blockFormatOf(const Paragraph& paragraph, const TextSetting& setting) {
   const BlockSetting block = blockSettingOf(*paragraph.attributes, setting);
   QTextBlockFormat format;
   format.setAlignment(block.alignment);
   format.setLayoutDirection(setting.direction);
-  if (directionOf(paragraph, setting) == Qt::RightToLeft) {
+  const Qt::LayoutDirection direction = directionOf(paragraph, setting);
+  if (direction == Qt::RightToLeft) {
     format.setRightMargin(block.before);
   } else {
     format.setLeftMargin(block.before);
   }
   format.setTextIndent(block.firstLine);
+  if (const auto stops = markerStopsOf(block)) format.setTabPositions(tabsFor(*stops, direction));
   return format;
 }
 

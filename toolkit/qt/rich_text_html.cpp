@@ -3,9 +3,12 @@
 // most of the time that it takes to show some HTML Qt spends reading styles.
 
 #include <QColor>
+#include <QFontMetricsF>
 #include <QString>
 #include <algorithm>
 #include <iterator>
+#include <optional>
+#include <utility>
 
 #include "toolkit/qt/fonts.hpp"
 #include "toolkit/qt/rich_text_parts.hpp"
@@ -96,7 +99,32 @@ void writeCss(QString& html, const TextAttributes& attributes, const TextSetting
   if (attributes.link && !attributes.underline) html += "text-decoration:none;"_L1;
 }
 
-void writePiece(QString& html, const Piece& piece, const TextSetting& setting) {
+void writeGap(QString& html, double width, const QFontMetricsF& metrics) {
+  html += "<span style=\""_L1;
+  writeCss(html, "letter-spacing:"_L1, width - metrics.horizontalAdvance(QChar::Nbsp));
+  html += "\">&nbsp;</span>"_L1;
+}
+
+/// The marker of a list item with the tabs around it, which HTML does not know: blanks of their
+/// widths. Gives the rest of the text.
+QStringView writeMarker(QString& html, const Piece& piece, const MarkerStops& stops,
+                        const TextSetting& setting) {
+  const QStringView text = piece.text;
+  const qsizetype end = text.startsWith(u'\t') ? text.indexOf(u'\t', 1) : -1;
+  if (end < 0) return text;
+  const QStringView marker = text.sliced(1, end - 1);
+  const auto& font = piece.attributes->font;
+  const QFontMetricsF metrics(font ? qFont(*font) : setting.font);
+  const double width = metrics.horizontalAdvance(marker.toString());
+  if (width < stops.marker) writeGap(html, stops.marker - width, metrics);
+  writeEscaped(html, marker);
+  const double at = std::max(width, stops.marker);
+  writeGap(html, (at < stops.text ? stops.text : 2 * stops.text) - at, metrics);
+  return text.sliced(end + 1);
+}
+
+void writePiece(QString& html, const Piece& piece, const std::optional<MarkerStops>& stops,
+                const TextSetting& setting) {
   const TextAttributes& attributes = *piece.attributes;
   const struct {
     bool holds;
@@ -116,7 +144,7 @@ void writePiece(QString& html, const Piece& piece, const TextSetting& setting) {
                                    [&] { writeCss(html, attributes, setting); });
   for (const auto& tag : tags)
     if (tag.holds) html += tag.opening;
-  writeText(html, piece.text);
+  writeText(html, stops ? writeMarker(html, piece, *stops, setting) : QStringView(piece.text));
   for (auto tag = std::rbegin(tags); tag != std::rend(tags); ++tag)
     if (tag->holds) html += tag->closing;
   if (styled) html += "</span>"_L1;
@@ -173,7 +201,9 @@ void writeParagraph(QString& html, const Paragraph& paragraph, const TextSetting
   writeBetween(" style=\""_L1, "\""_L1, html, [&] { writeCss(html, paragraph, block, setting); });
   html += u'>';
   if (paragraph.pieces.empty()) html += "<br/>"_L1;
-  for (const Piece& piece : paragraph.pieces) writePiece(html, piece, setting);
+  auto stops = markerStopsOf(block);
+  for (const Piece& piece : paragraph.pieces)
+    writePiece(html, piece, std::exchange(stops, std::nullopt), setting);
   html += "</div>"_L1;
 }
 

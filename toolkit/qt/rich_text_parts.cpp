@@ -74,6 +74,12 @@ BlockSetting blockSettingOf(const TextAttributes& attributes, const TextSetting&
           style.firstLineHeadIndent - style.headIndent};
 }
 
+std::optional<MarkerStops> markerStopsOf(const BlockSetting& block) {
+  constexpr double gap = 8;  // between marker and text
+  if (-block.firstLine <= gap) return std::nullopt;
+  return MarkerStops{-block.firstLine - gap, -block.firstLine};
+}
+
 QColor inkOf(const Color& color, const TextSetting& setting) {
   return setting.greyed ? halfway(qColor(color), setting.ground) : qColor(color);
 }

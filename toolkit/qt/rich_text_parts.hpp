@@ -39,6 +39,14 @@ struct BlockSetting {
 
 BlockSetting blockSettingOf(const TextAttributes& attributes, const TextSetting& setting);
 
+/// Where the marker of a list item ends and where its text begins, in points from the beginning of
+/// a first line that hangs. Absent where lines do not hang, or too little.
+struct MarkerStops {
+  double marker;
+  double text;
+};
+std::optional<MarkerStops> markerStopsOf(const BlockSetting& block);
+
 /// What the text's own colour is drawn as.
 QColor inkOf(const Color& color, const TextSetting& setting);
 /// What text is drawn in; absent where the viewer has the choice.
