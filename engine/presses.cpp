@@ -22,6 +22,7 @@ void QZ_Plist_State_Parser::pseudoButtonPush(Timer timer) {
   const auto key = keyOfTimer(timer);
   if (!key) return;  // replaced under its key since, or the walk-through is over
   objectIdTimers_->removeObjectForKey(*key);
+  notify(&qz::Observer::timerFired, *key);
   killAllTimers();
   if (terminating_) return;
   if (const auto button = toolkit::asButton(findObjectWithTag(toolkit::integerValueOf(*key)))) {

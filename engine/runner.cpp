@@ -36,14 +36,20 @@ bool QZ_Plist_State_Parser::processCommandArray(Value list, ObjectId forObject) 
   lastTagId_.set(forObject);
   // Outside of the guard: of a value that has no elements the caller hears.
   const auto count = static_cast<std::int32_t>(list->count());
+  notify(&qz::Observer::listWillRun, list, forObject);
   bool result = false;
   for (std::int32_t i = 0; i < count; ++i) {
+    const auto index = static_cast<std::size_t>(i);
     try {
-      const Value& element = list->objectAtIndex(static_cast<std::size_t>(i));
+      const Value& element = list->objectAtIndex(index);
+      notify(&qz::Observer::commandWillRun, list, index);
       result = runElement(*this, toolkit_, element, list->isFixed(), parameters, forObject);
+      notify(&qz::Observer::commandDidRun, list, index, result);
     } catch (const toolkit::Exception& exception) {
       toolkit_.log().write("Exception in processCommandArray: " + exception.reason());
+      notify(&qz::Observer::commandRaised, list, index, exception);
     }
   }
+  notify(&qz::Observer::listDidRun, list, forObject);
   return result;
 }

@@ -8,9 +8,7 @@
 
 namespace {
 
-bool isTag(const toolkit::Value& key) {
-  return key.description() == tagKey(key.integerValue());
-}
+bool isTag(const toolkit::Value& key) { return key.description() == tagKey(key.integerValue()); }
 
 std::string enumeratedLoops(const EndlessChains& chains) {
   std::string text;

@@ -28,6 +28,7 @@
 #include "engine/asset_record.hpp"
 #include "engine/keep_alive.hpp"
 #include "engine/property.hpp"
+#include "qz/observer.hpp"
 #include "toolkit/exception.hpp"
 #include "toolkit/property_list/collections.hpp"
 #include "toolkit/property_list/scalars.hpp"
@@ -258,6 +259,10 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   Dictionary originalTagValues() const { return originalTagValues_.get(); }
   void setOriginalTagValues(Dictionary tags) { originalTagValues_.set(std::move(tags)); }
 
+  /// Who is told what the engine does; absent at first. The engine keeps it alive.
+  const std::shared_ptr<qz::Observer>& observer() const { return observer_; }
+  void setObserver(std::shared_ptr<qz::Observer> observer) { observer_ = std::move(observer); }
+
   /// Understands "buttonPushed:".
   bool tryToPerform(std::string_view action, const Control& sender) override;
 
@@ -267,6 +272,13 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   /// Every operation that calls out begins with this. (`findObjectWithTag` need not: it reads the
   /// engine before it calls out, and not again.)
   [[nodiscard]] KeepAlive keepAlive() { return {*this, isKept_}; }
+  /// Tells the observer, if there is one, which is kept meanwhile: it may be replaced.
+  template <class... Parameters, class... Arguments>
+  void notify(void (qz::Observer::*event)(Parameters...), const Arguments&... arguments) const {
+    if (!observer_) return;
+    const auto observer = observer_;
+    ((*observer).*event)(arguments...);
+  }
   std::optional<std::string> keyOfTimer(const Timer& timer) const;
   void rewriteFlashingEntry(const ObjectId& id);
   bool setState(const ObjectId& id, toolkit::State state);
@@ -276,6 +288,8 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
                 const Value& html, const Value& fontName, const Value& size, const ObjectId& id);
 
   toolkit::Toolkit& toolkit_;  // the host's, which keeps it longer than the engine
+
+  std::shared_ptr<qz::Observer> observer_;
 
   bool isKept_ = false;  // while an operation runs; see KeepAlive
 

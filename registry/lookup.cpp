@@ -8,7 +8,11 @@
 QZ_Plist_State_Parser::Control QZ_Plist_State_Parser::findObjectWithTag(toolkit::Tag tag) const {
   const Control content = tutorialWindow()->contentView();
   for (const Control& view : content->subviews()) {
-    if (view->tag() == tag) return view;
+    if (view->tag() != tag) continue;
+    const Control found = view;
+    notify(&qz::Observer::controlSought, tag, found);
+    return found;
   }
+  notify(&qz::Observer::controlSought, tag, Control());
   return {};
 }

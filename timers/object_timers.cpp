@@ -17,6 +17,7 @@ void QZ_Plist_State_Parser::startTimerWithValue(std::uint64_t value,
       toolkit_.runLoop().schedule(interval, false,
                                   [self](const Timer& timer) { self->pseudoButtonPush(timer); }),
       *forKey);
+  notify(&qz::Observer::timerSet, *forKey, interval);
 }
 
 void QZ_Plist_State_Parser::killAllTimers() {
@@ -25,6 +26,7 @@ void QZ_Plist_State_Parser::killAllTimers() {
   const auto pending = timers->entries();  // a copy: what a timer lets go of may change the table
   for (const auto& [key, timer] : pending) {
     if (timer->isValid()) timer->invalidate();
+    notify(&qz::Observer::timerCancelled, key);
   }
   timers->removeAllObjects();
 }
@@ -37,8 +39,10 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TIMER(std::uint64_t val
     if (value != 0) {
       startTimerWithValue(value, key);
     } else {
-      objectIdTimers_->objectForKey(key)->invalidate();
+      const Timer pending = objectIdTimers_->objectForKey(key);
+      pending->invalidate();
       objectIdTimers_->removeObjectForKey(key);
+      if (pending) notify(&qz::Observer::timerCancelled, key);
     }
   } else if (plistDictionary_->objectForKey(key)) {
     startTimerWithValue(value, key);  // here 0 cancels nothing

@@ -117,6 +117,21 @@ TEST(Play, whatAListRaisesIsReportedAndTheWalkThroughGoesOn) {
   EXPECT_NE(played.transcript.find("\n── 3. press 2 (2) ──"), std::string::npos);
 }
 
+TEST(Play, saysWhereACommandStandsThatRaised) {
+  const WorkingDirectory directory;
+  directory.write("script.plist",
+                  "{ 1 = (IDLE_LOOP,\n  (PROCESS_COMMANDS_FOR_ID, 2));\n"
+                  "  2 = (IDLE_LOOP, IDLE_LOOP,\n    (SET_TITLE_FOR_OBJECT_ID, Go)); }");
+  PlayOptions options;
+  options.script = "script.plist";
+  options.steps = {Press{1}};
+  const std::string raised =
+      "Exception in processCommandArray: -[NSArray objectAtIndex:]: index 1 beyond bounds [0 .. "
+      "0]\n"
+      "  script.plist:4:5: list 2, command 3: SET_TITLE_FOR_OBJECT_ID\n";
+  EXPECT_EQ(run(options).log, raised + "Button tag 1 pressed.\n" + raised);
+}
+
 TEST(Play, aWalkThroughThatStandsStillHasFailed) {
   const WorkingDirectory directory;
   PlayOptions options;

@@ -30,13 +30,12 @@ std::string contentsOf(const std::string& path, const std::string& what) {
   cannotRead(path + ": cannot be read (" + std::strerror(errno) + "); expected " + what);
 }
 
-/// A place as a prefix of messages about it.
-std::string where(const std::string& path, const std::optional<toolkit::Position>& position) {
-  if (!position) return path + ": ";
+std::string placeIn(const std::string& path, const std::optional<toolkit::Position>& position) {
+  if (!position) return path;
   if (const auto* text = std::get_if<toolkit::TextPosition>(&*position)) {
-    return path + ":" + std::to_string(text->line) + ":" + std::to_string(text->column) + ": ";
+    return path + ":" + std::to_string(text->line) + ":" + std::to_string(text->column);
   }
-  return path + ": " + toolkit::description(*position) + ": ";
+  return path + ": " + toolkit::description(*position);
 }
 
 }  // namespace
@@ -55,7 +54,7 @@ void InputFile::read() {
   if (contents.empty()) throw Failure(refusal_, path_ + ": an empty file; expected " + what_);
   const auto result = toolkit::readPropertyList(contents, &positions_);
   if (const auto& refused = result.refusal) {
-    throw Failure(refusal_, where(path_, refused->position) + printable(refused->reason) +
+    throw Failure(refusal_, placeIn(path_, refused->position) + ": " + printable(refused->reason) +
                                 " (read as " + std::string(toolkit::description(refused->format)) +
                                 ")");
   }
@@ -70,8 +69,12 @@ toolkit::ValueRef<toolkit::Dictionary> InputFile::dictionary() const {
   return dictionary;
 }
 
+std::string InputFile::placeOf(const toolkit::ValueRef<>& value) const {
+  return placeIn(path_, positions_.of(*value));
+}
+
 void InputFile::fail(const toolkit::ValueRef<>& value, const std::string& message) const {
-  throw Failure(refusal_, where(path_, positions_.of(*value)) + message);
+  throw Failure(refusal_, placeOf(value) + ": " + message);
 }
 
 std::string foundWords(const toolkit::ValueRef<>& value) {

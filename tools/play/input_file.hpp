@@ -24,6 +24,8 @@ class InputFile {
   /// The root of a file that must be a dictionary.
   toolkit::ValueRef<toolkit::Dictionary> dictionary() const;
 
+  /// Such as "intro.plist:12:5", for a value of this file; the path alone for any other.
+  std::string placeOf(const toolkit::ValueRef<>& value) const;
   /// Ends the command: `message` is about `value`, which stands in this file.
   [[noreturn]] void fail(const toolkit::ValueRef<>& value, const std::string& message) const;
 

@@ -15,6 +15,7 @@
 #include "tools/play/input_file.hpp"
 #include "tools/play/pressing.hpp"
 #include "tools/play/prompt.hpp"
+#include "tools/play/raised_places.hpp"
 #include "tools/play/screenshots.hpp"
 #include "tools/play/session.hpp"
 #include "tools/play/stage.hpp"
@@ -138,6 +139,7 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
     driver->useRealTime();
   }
   Stage stage(*driver, options, file.dictionary());
+  stage.engine().setObserver(std::make_shared<RaisedPlaces>(file, stage.engine(), terminal.log));
   Session session(*driver, stage, terminal.out, terminal.style,
                   screenshots ? &*screenshots : nullptr);
 
