@@ -13,8 +13,11 @@
 #include <QStylePainter>
 #include <QTextDocument>
 #include <QToolButton>
+#include <algorithm>
+#include <optional>
 
 #include "toolkit/qt/contrast.hpp"
+#include "toolkit/qt/mnemonics.hpp"
 #include "toolkit/qt/rich_text.hpp"
 #include "toolkit/qt/strings.hpp"
 
@@ -57,6 +60,8 @@ struct Label {
   QSize iconSize;
   Colors colors;
   Qt::Alignment unasked;
+  QFont font;                // of what the title leaves open
+  std::optional<int> top{};  // where the title begins if that leaves it room; absent: in the middle
 };
 
 /// How wide a frame within `area` is that takes up an eighth of it.
@@ -82,16 +87,23 @@ void paintPressedIn(QPainter& painter, const QRect& area) {
   paintFrame(painter, inside, QColor(255, 255, 255, 180));
 }
 
-/// Colours what is painted already, so that what was dark stays darker than what was light.
-void tint(QPainter& painter, const QRect& area, const QColor& color) {
-  const auto mixed = [&](float strength, float rest) {
-    return QColor::fromRgbF(color.redF() * strength + rest, color.greenF() * strength + rest,
-                            color.blueF() * strength + rest);
-  };
-  painter.setCompositionMode(QPainter::CompositionMode_Multiply);
-  painter.fillRect(area, mixed(0.75F, 0.25F));
-  painter.setCompositionMode(QPainter::CompositionMode_Plus);
-  painter.fillRect(area, mixed(0.4F, 0));
+/// Colours what is painted already. Half of each colour stays, and with it a title of any colour.
+void tint(QPainter& painter, const QRect& area, QColor color) {
+  color.setAlphaF(0.5F);
+  painter.fillRect(area, color);
+}
+
+/// Whether the button is a check box or a radio button. If so, `option` is what it asks its style
+/// to draw.
+bool initToggle(const QAbstractButton& button, QStyleOptionButton& option) {
+  if (const auto* const box = qobject_cast<const QCheckBox*>(&button)) {
+    (box->*&CheckBoxStyle::initStyleOption)(&option);
+  } else if (const auto* const radio = qobject_cast<const QRadioButton*>(&button)) {
+    (radio->*&RadioButtonStyle::initStyleOption)(&option);
+  } else {
+    return false;
+  }
+  return true;
 }
 
 class Painting {
@@ -112,6 +124,7 @@ class Painting {
   void paintDescription(const QCommandLinkButton& button, const QStyleOption& option,
                         const QRect& place);
   void paintToggle(QStyleOptionButton& option, bool radio);
+  void paintIndicatorAgain();
   void paintToggleLabel(const QStyleOptionButton& option, const Label& label, bool radio);
   void paintToolButton(const QToolButton& button);
   void paintToolLabel(QStyleOptionToolButton option, Label label);
@@ -125,6 +138,9 @@ class Painting {
   void paintFace(const QStyleOption& option);
   void adapt(QStyleOption& option) const;
   Qt::Alignment leadingEdge() const;
+  bool drawsTitle() const;
+  AttributedString title() const;
+  QFont titleFont() const;
 
   QAbstractButton& button_;
   const ButtonAppearance& appearance_;
@@ -136,14 +152,8 @@ void Painting::paint() {
     paintCommandLink(*link);
   } else if (const auto* const push = qobject_cast<QPushButton*>(&button_)) {
     paintPushButton(*push);
-  } else if (const auto* const box = qobject_cast<QCheckBox*>(&button_)) {
-    QStyleOptionButton option;
-    (box->*&CheckBoxStyle::initStyleOption)(&option);
-    paintToggle(option, false);
-  } else if (const auto* const radio = qobject_cast<QRadioButton*>(&button_)) {
-    QStyleOptionButton option;
-    (radio->*&RadioButtonStyle::initStyleOption)(&option);
-    paintToggle(option, true);
+  } else if (QStyleOptionButton option; initToggle(button_, option)) {
+    paintToggle(option, qobject_cast<QRadioButton*>(&button_));
   } else if (const auto* const tool = qobject_cast<QToolButton*>(&button_)) {
     paintToolButton(*tool);
   }
@@ -168,6 +178,21 @@ Qt::Alignment Painting::leadingEdge() const {
   return (button_.isRightToLeft() ? Qt::AlignRight : Qt::AlignLeft) | Qt::AlignAbsolute;
 }
 
+/// Whether the title is not left to the style. Style sheets draw those of push buttons, check boxes
+/// and radio buttons in a colour of their own, which may not read on the face.
+bool Painting::drawsTitle() const {
+  return appearance_.title || (appearance_.face && button_.style()->inherits("QStyleSheetStyle") &&
+                               !button_.text().isEmpty());
+}
+
+AttributedString Painting::title() const {
+  return appearance_.title.value_or(AttributedString(utf8(withoutMnemonic(button_.text()))));
+}
+
+QFont Painting::titleFont() const {
+  return appearance_.title ? appearance_.titleFont : button_.font();
+}
+
 void Painting::paintPushButton(const QPushButton& button) {
   QStyleOptionButton option;
   (button.*&PushButtonStyle::initStyleOption)(&option);
@@ -176,9 +201,9 @@ void Painting::paintPushButton(const QPushButton& button) {
 
   QStyleOptionButton label = option;
   label.rect = button.style()->subElementRect(QStyle::SE_PushButtonContents, &option, &button);
-  if (appearance_.title) {
-    paintLabel(
-        {label.rect, option.icon, option.iconSize, colorsOf(option.palette), Qt::AlignHCenter});
+  if (drawsTitle()) {
+    paintLabel({label.rect, option.icon, option.iconSize, colorsOf(option.palette),
+                Qt::AlignHCenter, titleFont()});
   } else {
     painter_.drawControl(QStyle::CE_PushButtonLabel, label);
   }
@@ -205,7 +230,7 @@ void Painting::paintCommandLink(const QCommandLinkButton& button) {
   const QSize icon = option.icon.isNull() ? QSize() : option.icon.actualSize(option.iconSize);
   option.icon.paint(&painter_, QRect(QPoint(7, 10), icon), Qt::AlignCenter,
                     button.isEnabled() ? QIcon::Normal : QIcon::Disabled);
-  QFont font = button.font();
+  QFont font = titleFont();
   font.setBold(true);
   font.setPointSizeF(9);
   const int lineHeight = QFontMetrics(font).height();
@@ -214,9 +239,10 @@ void Painting::paintCommandLink(const QCommandLinkButton& button) {
   if (alone) place.translate(0, std::max(0, (icon.height() - lineHeight) / 2));
   if (!alone) paintDescription(button, option, place.adjusted(0, lineHeight, 0, -10));
   if (appearance_.title) {
+    const auto top = alone ? std::optional(place.top()) : std::nullopt;
     place = alone ? place.adjusted(0, -place.top(), 0, 0)
                   : QRect(place.topLeft(), QSize(place.width(), lineHeight));
-    paintLabel({place, {}, {}, colorsOf(option.palette), leadingEdge()});
+    paintLabel({place, {}, {}, colorsOf(option.palette), leadingEdge(), font, top});
   } else {
     painter_.setFont(font);
     painter_.drawItemText(place, Qt::TextShowMnemonic, option.palette, button.isEnabled(),
@@ -241,6 +267,7 @@ void Painting::paintFocus(const QStyleOptionButton& option, QStyle::SubElement p
 }
 
 void Painting::paintToggle(QStyleOptionButton& option, bool radio) {
+  QStyleOptionButton indicator = option;
   adapt(option);
   const QRect contents = button_.style()->subElementRect(
       radio ? QStyle::SE_RadioButtonContents : QStyle::SE_CheckBoxContents, &option, &button_);
@@ -251,17 +278,32 @@ void Painting::paintToggle(QStyleOptionButton& option, bool radio) {
   }
   const auto control = radio ? QStyle::CE_RadioButton : QStyle::CE_CheckBox;
   if (!appearance_.title && !appearance_.face) return painter_.drawControl(control, option);
-  QStyleOptionButton indicator = option;
+  indicator.state = option.state;  // in its own colours, though: a style may fill it with the face
   indicator.text.clear();
   indicator.icon = {};
   painter_.drawControl(control, indicator);
-  paintToggleLabel(option, {contents, option.icon, option.iconSize, colors, leadingEdge()}, radio);
+  paintToggleLabel(
+      option, {contents, option.icon, option.iconSize, colors, leadingEdge(), titleFont()}, radio);
+}
+
+/// The frame of a flash covers part of the indicator, which lies at the button's edge.
+void Painting::paintIndicatorAgain() {
+  QStyleOptionButton option;
+  if (!initToggle(button_, option)) return;
+  const bool radio = qobject_cast<QRadioButton*>(&button_);
+  option.state |= QStyle::State_Sunken;
+  option.rect = button_.style()->subElementRect(
+      radio ? QStyle::SE_RadioButtonIndicator : QStyle::SE_CheckBoxIndicator, &option, &button_);
+  painter_.drawPrimitive(radio ? QStyle::PE_IndicatorRadioButton : QStyle::PE_IndicatorCheckBox,
+                         option);
 }
 
 /// Over what a style sheet may have drawn behind it.
 void Painting::paintToggleLabel(const QStyleOptionButton& option, const Label& label, bool radio) {
-  if (appearance_.face) painter_.fillRect(label.place.adjusted(-2, 0, 2, 0), label.colors.ground);
-  if (appearance_.title) {
+  const QRect face =
+      label.place.adjusted(button_.isRightToLeft() ? 0 : -2, 0, button_.isRightToLeft() ? 2 : 0, 0);
+  if (appearance_.face) painter_.fillRect(face, label.colors.ground);
+  if (drawsTitle()) {
     paintLabel(label);
   } else {
     QStyleOptionButton text = option;
@@ -287,7 +329,7 @@ void Painting::paintToolButton(const QToolButton& button) {
                                                QStyle::SC_ToolButton, &button);
   if (appearance_.face) paintFace(option);
   paintToolLabel(option, {option.rect, option.icon, option.iconSize, colorsOf(option.palette),
-                          Qt::AlignHCenter});
+                          Qt::AlignHCenter, titleFont()});
 }
 
 void Painting::paintToolLabel(QStyleOptionToolButton option, Label label) {
@@ -364,12 +406,12 @@ void Painting::paintTitle(const QRect& place, const Label& label) {
   QTextDocument document;
   document.setDocumentMargin(0);
   document.documentLayout()->setPaintDevice(&button_);
-  TextSetting setting{appearance_.titleFont,
-                      button_.palette().color(QPalette::Active, QPalette::Link),
+  const AttributedString shown = title();
+  TextSetting setting{label.font, button_.palette().color(QPalette::Active, QPalette::Link),
                       label.colors.ground, label.unasked, leadingEdge()};
-  setting.direction = writingDirectionOf(*appearance_.title);
+  setting.direction = writingDirectionOf(shown);
   setting.greyed = !button_.isEnabled();
-  showIn(document, *appearance_.title, setting);
+  showIn(document, shown, setting);
   document.setTextWidth(place.width());
   if (document.size().height() > place.height()) {
     // Too much to break lines: the beginning of each is better than the upper half of some.
@@ -377,8 +419,9 @@ void Painting::paintTitle(const QRect& place, const Label& label) {
     option.setWrapMode(QTextOption::NoWrap);
     document.setDefaultTextOption(option);
   }
-  const double spare = place.height() - document.size().height();
-  painter_.translate(place.x(), place.y() + std::max(0.0, spare / 2));
+  const double middle = std::max(0.0, (place.height() - document.size().height()) / 2);
+  painter_.translate(place.x(),
+                     place.y() + (label.top ? std::min<double>(middle, *label.top) : middle));
   QAbstractTextDocumentLayout::PaintContext context;
   context.palette = button_.palette();
   context.palette.setColor(QPalette::Text, label.colors.ink);
@@ -392,7 +435,10 @@ void Painting::paintOutline() {
 }
 
 void Painting::paintFlash() {
-  if (appearance_.pressed) paintPressedIn(painter_, button_.rect());
+  if (appearance_.pressed) {
+    paintPressedIn(painter_, button_.rect());
+    paintIndicatorAgain();
+  }
   if (appearance_.outlined) paintOutline();
 }
 
