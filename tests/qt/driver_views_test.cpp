@@ -27,4 +27,19 @@ TEST(DriverViews, DrawPopUpButtonsWithAnArrow) {
   EXPECT_GT(arrowIn(), 8) << "beside a title with attributes";
 }
 
+TEST(DriverViews, PlaceTheTitleOfAPopUpButtonBesideItsArrow) {
+  qt::QtDriver driver;
+  const auto window = driver.makeWindow({0, 0, 200, 100});
+  const auto view =
+      driver.makeView(ViewKind::popUpButton, 1, {20, 20, 120, 30}, window->contentView());
+  const auto titleIn = [&](auto wanted) {
+    const QImage picture = rendering::pictureOf(*qt::WidgetNode::of(view)->widget());
+    return rendering::boundsOf(picture.copy(20, 4, 96, 22), wanted);
+  };
+  asButton(view)->setTitle("Choice");
+  const QRect plain = titleIn(rendering::isDark);
+  asButton(view)->setAttributedTitle(AttributedString("Choice", {.foregroundColor = colors::red}));
+  EXPECT_NEAR(titleIn(rendering::isReddish).left(), plain.left(), 2);
+}
+
 }  // namespace

@@ -346,6 +346,8 @@ void Painting::paintToolLabel(QStyleOptionToolButton option, Label label) {
                                             QSize(16, 16), label.place.adjusted(4, 0, -4, 0));
     paintArrow(option, place.adjusted(3, 3, -3, -3));
     label.place.adjust(20, 0, -20, 0);
+    // As the style has it for plain titles.
+    if (option.toolButtonStyle == Qt::ToolButtonTextBesideIcon) label.unasked = leadingEdge();
   }
   paintLabel(label);
 }
