@@ -42,8 +42,8 @@ double shareOfEqual(const QImage& a, const QImage& b, const QRect& area) {
 TEST(ButtonDetails, FlashesLeaveTheIndicatorToBeSeen) {
   QCheckBox box("Title");
   QRadioButton radio("Title");
-  for (QAbstractButton* const button : {static_cast<QAbstractButton*>(&box),
-                                        static_cast<QAbstractButton*>(&radio)})
+  for (QAbstractButton* const button :
+       {static_cast<QAbstractButton*>(&box), static_cast<QAbstractButton*>(&radio)})
     for (const char* const style : {"Fusion", "Windows"})
       for (const bool on : {false, true}) {
         SCOPED_TRACE(std::string(button->metaObject()->className()) + ", " + style);
