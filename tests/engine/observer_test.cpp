@@ -94,8 +94,8 @@ TEST_F(ObserverTest, IsToldOfTimersThatFire) {
   EXPECT_EQ(noted(), (Lines{"list for 1", "command 0", "no control 5", "timer 5 of seconds: 3",
                             "NO from 0", "list ends"}));
   driver.advance(3);
-  EXPECT_EQ(noted(), (Lines{"fired 5", "no control 5", "list for 5", "command 0", "NO from 0",
-                            "list ends"}));
+  EXPECT_EQ(noted(), (Lines{"fired 5", "no control 5", "list for 5", "command 0", "no control 5",
+                            "YES from 0", "list ends"}));
 }
 
 TEST_F(ObserverTest, IsToldOfTimersThatAreCancelled) {
