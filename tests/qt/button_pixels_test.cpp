@@ -12,6 +12,7 @@
 #include <QToolButton>
 #include <cmath>
 #include <memory>
+#include <ostream>
 #include <string>
 
 #include "tests/qt/rendering.hpp"
@@ -49,6 +50,8 @@ struct ButtonKind {
   const char* name;
   QAbstractButton* (*make)();
 };
+
+void PrintTo(const ButtonKind& kind, std::ostream* out) { *out << kind.name; }
 
 const ButtonKind buttonKinds[] = {
     {"push", make<QPushButton>},   {"tool", make<QToolButton>},        {"check", make<QCheckBox>},

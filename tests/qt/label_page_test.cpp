@@ -9,6 +9,7 @@
 #include <QSignalSpy>
 #include <QTest>
 #include <functional>
+#include <ostream>
 
 #include "tests/qt/rendering.hpp"
 #include "toolkit/qt/text_look.hpp"
@@ -37,6 +38,8 @@ struct PageCase {
   std::function<void(QLabel&)> before;
   std::function<void(QLabel&)> after = [](QLabel&) {};
 };
+
+void PrintTo(const PageCase& page, std::ostream* out) { *out << page.name; }
 
 const PageCase pageCases[] = {
     {"as it is", [](QLabel&) {}},

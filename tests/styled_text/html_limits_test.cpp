@@ -241,7 +241,7 @@ double cpuSeconds(const std::string& html) {
 // would be 256 times. The smaller input is one that the clock can measure, unless that is very
 // long.
 bool takesTimeInProportion(const std::string& piece) {
-  constexpr double measurable = 0.002;
+  constexpr double measurable = 0.0005;
   std::size_t size = 1 << 10;
   double few = cpuSeconds(repeated(piece, size));
   for (; few < measurable && size < 1 << 16; few = cpuSeconds(repeated(piece, size))) size *= 2;
