@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The toolkit calls that commands come to, made directly: what running costs at least.
+// Makes the toolkit calls of commands directly: the least that running them can cost.
 #pragma once
 
 #include <vector>
@@ -9,7 +9,7 @@
 
 namespace bench {
 
-/// Looks each control up by its tag and changes it, call for call as the engine does.
+/// Looks up each control by its tag and changes it, with the same calls as the engine.
 void runDirectly(const toolkit::Ref<toolkit::Window>& window,
                  const std::vector<Operation>& operations);
 

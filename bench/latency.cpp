@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// From a click on a button of a real window until all that it changes is repainted: a
-// walk-through's list, beside a slot of the host's that makes the same changes by hand.
+// Measures the time from a click on a button of a real window until everything that it changes is
+// repainted, for a walk-through's list and for a host's slot that makes the same changes by hand.
 #include <QApplication>
 #include <QCheckBox>
 #include <QLabel>
@@ -47,7 +47,7 @@ struct Form {
   QPushButton skip{"Skip", &window}, back{"Back", &window}, next{"Next", &window};
 };
 
-/// Two steps, to and fro.
+/// Two steps, forth and back.
 constexpr auto script = R"({
   7 = (
     (SET_TAG_FOR_OBJECT_ID, 8, 7),
@@ -73,7 +73,7 @@ constexpr auto script = R"({
   );
 })";
 
-/// The form with a walk-through over it.
+/// The form with a walk-through on it.
 struct Guided : Form {
   Guided() {
     toolkit.log().setSink([](std::string_view) {});
@@ -122,7 +122,8 @@ void sendMouse(QWidget& widget, QEvent::Type type, Qt::MouseButtons held) {
   QCoreApplication::sendEvent(&widget, &event);
 }
 
-/// From the delivery of a click, with the button already held down, until nothing is left to paint.
+/// Measures from the release of the button, which is already held down, until nothing is left to
+/// paint.
 bench::Contender click(const char* name, Form& form) {
   return {name,
           [&] {
@@ -130,14 +131,14 @@ bench::Contender click(const char* name, Form& form) {
             QCoreApplication::processEvents();
           },
           [&] {
-            form.window.activateWindow();  // Qt paints other windows' widgets more slowly
+            form.window.activateWindow();  // Qt paints widgets of inactive windows more slowly
             QCoreApplication::processEvents();
             sendMouse(form.next, QEvent::MouseButtonPress, Qt::LeftButton);
             QCoreApplication::processEvents();
           }};
 }
 
-/// The share of pixels by which the two windows differ.
+/// Returns the share of pixels in which the two windows differ.
 double difference(Form& one, Form& other) {
   const QImage a = one.window.grab().toImage(), b = other.window.grab().toImage();
   int count = 0;
@@ -158,7 +159,7 @@ void requireSame(Guided& guided, ByHand& byHand) {
 
 int main(int argc, char** argv) {
   if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
-  qputenv("QT_SCALE_FACTOR", "1");  // by hand, images are of one density
+  qputenv("QT_SCALE_FACTOR", "1");  // the slot's images have only one resolution
   const QApplication application(argc, argv);
   Guided guided;
   ByHand byHand;
@@ -168,7 +169,7 @@ int main(int argc, char** argv) {
     contender.run();
     if (contender.name == "slot") requireSame(guided, byHand);
   }
-  // Forth and back, each on its own.
+  // Forth and back, measured separately.
   const auto t = bench::leastTimes({engine, slot, engine, slot}, 500);
   bench::printHead("From a click to the last changed widget repainted",
                    {"step", "this engine", "a slot by hand", "this : by hand"});

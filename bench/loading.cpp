@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
-// Loading scripts, from bytes in memory to the script dictionary, beside libplist (which yields the
-// same typed values) and pugixml (which yields text only: what reading XML costs at least).
+// Measures loading scripts, from bytes in memory to the script dictionary, against libplist (which
+// yields the same typed values) and pugixml (which yields only text: the least that reading XML
+// costs).
 #include <plist/plist.h>
 #include <pugixml.hpp>
 
@@ -73,7 +74,8 @@ std::string inMegabytes(std::size_t bytes) {
   return std::to_string((bytes + megabyte / 2) / megabyte) + " MB";
 }
 
-/// One row: how long each contender takes, and the others beside the first, which is this reader.
+/// Prints one row: the time of each contender, and for the others the ratio to the first, this
+/// reader.
 void printTimes(const std::string& file, const std::vector<Contender>& contenders, int rounds) {
   const auto times = bench::leastTimes(contenders, rounds);
   std::vector<std::string> row{file};
@@ -89,7 +91,8 @@ void printTimes(const std::string& file, const std::vector<Contender>& contender
   bench::printRow(row);
 }
 
-/// The same work so many times, each script freed before the next is read.
+/// Returns a contender that does the work `count` times and frees each script before reading the
+/// next.
 Contender repeated(const Contender& one, int count) {
   return {one.name, [one, count] {
             for (int i = 0; i < count; ++i) {
@@ -117,8 +120,8 @@ void measureLoads() {
              20);
 }
 
-/// The first load of a made script in a program: prints how long it took, by how much the memory
-/// that the program holds grew meanwhile at most, and by how much in the end, all per byte.
+/// Prints the time of a program's first load of a generated script, the peak growth of its memory
+/// meanwhile and the growth that remains, each per byte of the script.
 void loadOnce(std::size_t size) {
   const std::string xml = bench::xmlScript(size);
   const Contender load = ourLoad(xml);

@@ -144,7 +144,7 @@ LuaWalkthrough::LuaWalkthrough(toolkit::Window& window, const std::vector<Operat
 LuaWalkthrough::~LuaWalkthrough() { lua_close(lua_); }
 
 void LuaWalkthrough::run() {
-  lua_pushvalue(lua_, -1);  // the script stays for the next run
+  lua_pushvalue(lua_, -1);  // a copy: the script stays for the next run
   require(lua_, lua_pcall(lua_, 0, 0, 0));
 }
 

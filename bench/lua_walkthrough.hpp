@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The same calls from Lua: the toolkit's operations bound one to one, as lean as a binding can be
-// (views are bare pointers, nothing is checked), and a script that calls them.
+// Makes the same calls from Lua: a script that calls the toolkit's operations through the leanest
+// possible binding (one to one, views are bare pointers, nothing is checked).
 #pragma once
 
 #include <memory>
@@ -15,7 +15,7 @@ namespace bench {
 
 class LuaWalkthrough {
  public:
-  /// Compiles a script of the operations, one call a line. The window outlives this.
+  /// Compiles a script of the operations, one call a line. `window` must outlive this object.
   LuaWalkthrough(toolkit::Window& window, const std::vector<Operation>& operations);
   ~LuaWalkthrough();
   LuaWalkthrough(const LuaWalkthrough&) = delete;
@@ -24,7 +24,7 @@ class LuaWalkthrough {
   void run();
 
  private:
-  lua_State* lua_;  // ours
+  lua_State* lua_;  // owned
 };
 
 }  // namespace bench

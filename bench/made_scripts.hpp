@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Scripts to measure with, in the shape of real ones: lists under tags, of commands with texts,
-// tags and numbers.
+// Generates scripts to measure with, shaped like real ones: under each tag a list of commands with
+// texts, tags and numbers.
 #pragma once
 
 #include <cstddef>
@@ -8,7 +8,7 @@
 
 namespace bench {
 
-/// A script as XML, of about `bytes` bytes; the same one for the same size.
+/// Returns a script as XML, about `bytes` bytes long; always the same one for the same size.
 std::string xmlScript(std::size_t bytes);
 
 }  // namespace bench

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What the contenders in running do: the same operations on the same controls, one command each.
+// The operations that all contenders of bench-running perform, one for each command.
 #pragma once
 
 #include <string>
@@ -11,7 +11,8 @@ namespace bench {
 
 enum class What { text, title, toolTip, enable, disable, stateOn };
 
-/// One command: the operation, on the control with the tag; text only where the operation has one.
+/// One command: an operation on the control with the tag. `text` is used only by operations with
+/// text.
 struct Operation {
   What what;
   toolkit::Tag tag;

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Running command lists over few and many controls on the memory toolkit, beside the toolkit calls
-// themselves and beside Lua; a press, a tick of the flasher, discovery.
+// Measures command lists over few and many controls on the memory toolkit, against the direct
+// toolkit calls and Lua; also a press, a tick of the flasher, and discovery.
 #include <algorithm>
 #include <cstdio>
 #include <cstdlib>
@@ -25,7 +25,7 @@ using toolkit::Number;
 using toolkit::String;
 using List = toolkit::ValueRef<toolkit::Array>;
 
-/// A window of buttons with the tags 1 … `controls`, adopted by an engine.
+/// A window of buttons with the tags 1 … `controls`, which an engine has adopted.
 struct Stage {
   explicit Stage(long controls) {
     driver.setLogSink([](std::string_view) {});
@@ -44,11 +44,11 @@ struct Stage {
       QZ_Plist_State_Parser::initWithWindow(driver.toolkit(), window);
 };
 
-/// So many commands, of every sort in turn, spread over the controls.
+/// Returns `count` commands, all sorts in turn, spread over the controls.
 std::vector<Operation> operationsOver(long controls, std::size_t count) {
   constexpr What sorts[] = {What::text,   What::title,   What::toolTip,
                             What::enable, What::disable, What::stateOn};
-  constexpr long step = 7919;  // a prime: every control has its turn
+  constexpr long step = 7919;  // a prime, so that every control gets a turn
   std::vector<Operation> operations;
   for (std::size_t i = 0; i < count; ++i) {
     const toolkit::Tag tag = 1 + static_cast<long>(i) * step % controls;
@@ -82,7 +82,7 @@ toolkit::ValueRef<> commandOf(const Operation& operation) {
   return nullptr;
 }
 
-/// The operations as a list of a script, read from a file's bytes as scripts are.
+/// Returns the operations as a script's list, read from the bytes of a file like a real script.
 List listOf(const std::vector<Operation>& operations) {
   std::vector<toolkit::ValueRef<>> commands;
   for (const Operation& operation : operations) commands.push_back(commandOf(operation));
@@ -96,7 +96,7 @@ void require(bool holds, const char* what) {
   std::exit(1);
 }
 
-/// The contenders run the same operations; what they leave in the window must be the same.
+/// Returns the final state of the window, which must be the same for all contenders.
 std::string captions(Stage& stage) {
   std::string all;
   for (const auto& view : stage.window->contentView()->subviews()) {
@@ -106,12 +106,12 @@ std::string captions(Stage& stage) {
   return all;
 }
 
-/// What one of the operations takes: as a command of this engine, made directly, and from Lua.
+/// The time of one operation: as a command of this engine, called directly, and from Lua.
 struct Times {
   double engine, direct, lua;
 };
 
-/// The fewer controls, the shorter a turn: as many of them as take about a second.
+/// Returns how many rounds take about a second; with fewer controls a round is shorter.
 int roundsOver(long controls) { return static_cast<int>(std::clamp(30000 / controls, 15L, 3000L)); }
 
 Times timesOf(long controls, const std::vector<Operation>& operations) {
@@ -187,8 +187,8 @@ void measureListLength() {
                        points);
 }
 
-/// What there is to do besides commands: the last control pressed, and the list of 10 commands
-/// under its tag run; a tick of the flasher, when 10 tags flash; discovery.
+/// Measures other work: a press of the last control, which runs the list of 10 commands under its
+/// tag; a tick of the flasher with 10 flashing tags; discovery.
 std::vector<double> timesOfEvents(long controls) {
   Stage stage(controls);
   const auto script = toolkit::Dictionary::make();

@@ -1,5 +1,5 @@
 # SPDX-License-Identifier: MIT
-# A compiler cache and a quick linker, where they are installed. Nothing needs them.
+# Uses a compiler cache and a fast linker if they are installed. Both are optional.
 include(CheckLinkerFlag)
 
 if(NOT DEFINED CMAKE_CXX_COMPILER_LAUNCHER)
@@ -9,7 +9,7 @@ if(NOT DEFINED CMAKE_CXX_COMPILER_LAUNCHER)
   endif()
 endif()
 
-foreach(linker mold lld)  # the quicker first
+foreach(linker mold lld)  # the faster one first
   check_linker_flag(CXX -fuse-ld=${linker} QZ_LINKS_WITH_${linker})
   if(QZ_LINKS_WITH_${linker})
     add_link_options(-fuse-ld=${linker})

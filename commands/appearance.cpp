@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The commands that change how one control looks: colours, title, tooltip, image; and its state.
+// The commands that change the appearance of one control (colours, title, tooltip, image) or its
+// state.
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/commands.hpp"
@@ -26,7 +27,7 @@ std::optional<toolkit::Color> colorNamed(std::string_view name) {
   return std::nullopt;
 }
 
-// A title that can be changed; of no title at all there is none to change.
+// Returns a copy of the title; raises if there is none.
 toolkit::AttributedString titleOf(const QZ_Plist_State_Parser::Control& control) {
   auto title = control->attributedTitle();
   if (!title) throw toolkit::InvalidArgumentException("there is no title to copy");
@@ -35,7 +36,7 @@ toolkit::AttributedString titleOf(const QZ_Plist_State_Parser::Control& control)
 
 }  // namespace
 
-// Red, whatever colour is asked for.
+// Always red, whatever colour is given; on purpose.
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_BACKGROUND_COLOR(std::uint64_t,
                                                                           ObjectId forId) {
   const auto kept = keepAlive();
@@ -77,7 +78,7 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_STATE_OFF(ObjectId id) 
   return setState(id, toolkit::State::off);
 }
 
-// Neither the action is sent nor the state recorded: only a press does that.
+// Does not send the action or record the state: only a press does.
 bool QZ_Plist_State_Parser::setState(const ObjectId& id, toolkit::State state) {
   const auto kept = keepAlive();
   const auto button = asButton(findObjectWithTag(id->longValue()));
@@ -92,7 +93,8 @@ bool commands::setToolTip(QZ_Plist_State_Parser& engine,
   const std::size_t count = parameters->count();
   if (count == 0) return false;
   const std::string_view text = textOf(parameters->objectAtIndex(0));
-  // Only a second parameter that is the last one aims; otherwise it is the list's own control.
+  // The second parameter is the target only if it is the last one; otherwise the list's own control
+  // is.
   const toolkit::Tag tag = count == 2 ? parameters->objectAtIndex(1)->intValue() : id->longValue();
   const QZ_Plist_State_Parser::Control control = engine.findObjectWithTag(tag);
   if (!control) return false;
@@ -111,10 +113,11 @@ bool commands::loadGraphic(QZ_Plist_State_Parser& engine, toolkit::Toolkit& tool
                            const QZ_Plist_State_Parser::Parameters& parameters) {
   if (parameters->count() != 2) return false;
   const toolkit::Tag tag = parameters->objectAtIndex(1)->intValue();
-  // Two diagnostics that cannot come, after the count above; this is their place all the same.
+  // Two diagnostics that the test of the count above makes unreachable; their place is kept on
+  // purpose.
   if (!parameters) toolkit.log().write("No commandInfo found.");
   if (parameters->count() == 0) toolkit.log().write("commandInfo count is zero.");
-  // Despite the command's name a resource name, not a path.
+  // A resource name, not a path, despite the command's name.
   const auto image = toolkit.images().imageNamed(textOf(parameters->objectAtIndex(0)));
   const auto imageView = toolkit::asImageView(engine.findObjectWithTag(tag));
   if (!imageView) return false;

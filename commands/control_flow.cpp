@@ -1,10 +1,11 @@
 // SPDX-License-Identifier: MIT
-// The commands that steer a run: another tag's list, the end, and the idle placeholder.
+// The commands that control a run: running another list, ending the walk-through, and the idle
+// placeholder.
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/tag_key.hpp"
 
-// Nothing guards against a list that reaches itself again: it runs until the stack is exhausted.
+// No guard against a list that reaches itself again: it runs until the stack is exhausted.
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(ObjectId id) {
   const auto kept = keepAlive();
   Value list = plistDictionary_->objectForKey(tagKey(id->longValue()));

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Styled text from HTML: a script's fragment within one of three fixed documents.
+// Styled text from HTML: a fragment of the script within one of three fixed documents.
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/text_of.hpp"
@@ -7,7 +7,7 @@
 
 namespace {
 
-// The documents are fixed to the letter. Two differ by one blank in front of `vlink`, on purpose.
+// The exact text of the documents matters. Two differ by one blank before `vlink`, on purpose.
 #define DOCUMENT_HEAD                                                                       \
   "<!DOCTYPE HTML PUBLIC \"-//W3C//DTD HTML 4.01 Transitional//EN\" "                       \
   "\"http://www.w3.org/TR/html4/loose.dtd\"><html><head><meta http-equiv=\"Content-type\" " \
@@ -22,7 +22,8 @@ constexpr std::string_view plain = DOCUMENT_HEAD "<body bgcolor=\"#000000\">";
 
 static_assert(linkedTwoBlanks.size() == 249 && linkedOneBlank.size() == 248 && plain.size() == 217);
 
-// Absent when the fragment has characters beyond ASCII, which must be written as references.
+// Absent if the fragment has characters beyond ASCII (they must be written as references), or if it
+// cannot be read.
 std::optional<toolkit::AttributedString> read(std::string_view documentHead,
                                               const std::string& fragment,
                                               toolkit::Toolkit& toolkit) {
@@ -73,15 +74,15 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS
                   FOR_OBJECT_ID);
 }
 
-// Without an alignment the HTML keeps its own alignment and fonts.
+// Without `alignment` the HTML keeps its own alignment and fonts.
 bool QZ_Plist_State_Parser::showHtml(std::string_view documentHead,
                                      std::optional<toolkit::TextAlignment> alignment,
                                      const Value& html, const Value& fontName, const Value& size,
                                      const ObjectId& id) {
   const auto kept = keepAlive();
   const Control control = findObjectWithTag(id->longValue());
-  const auto points = static_cast<float>(size->intValue());  // whole points, also when not used
-  // An absent fragment reads as the text that the system's formats print for nothing.
+  const auto points = static_cast<float>(size->intValue());  // whole points; read even if not used
+  // An absent fragment reads as the text that the system's formats print for an absent object.
   const std::string fragment = html ? html->description() : "(null)";
   auto text = read(documentHead, fragment, toolkit_);
   if (!text) return false;
@@ -90,8 +91,9 @@ bool QZ_Plist_State_Parser::showHtml(std::string_view documentHead,
     show(*text, control);
     return true;
   } catch (const toolkit::Exception&) {
-    // A range exception was to count as success, but what is asked is whether the exception is of
-    // the class of that exception's *name*, a string. None is, so every one is reported.
+    // Every exception is reported, on purpose. A range exception was meant to count as success, but
+    // the test compares the exception's class with that of the *name* (a string) of the range
+    // exception, and never matches.
     toolkit_.log().write("Couldn't set attributed string of HTML:" + fragment + " to object.");
     return false;
   }

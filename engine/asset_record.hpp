@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The record that discovery keeps of each control of an adopted window.
+// The record that the engine keeps of each control of an adopted window.
 #pragma once
 
 #include <array>
@@ -8,8 +8,8 @@
 #include "toolkit/ref.hpp"
 #include "toolkit/view.hpp"
 
-/// What a control was when it was found, in this order: its class name (a list of one), its frame
-/// (x, y, width, height, each in single precision) and the control itself, which its window owns.
+/// A control at the time of its discovery: its class name (a list of one), its frame (x, y, width,
+/// height, in single precision) and the control itself, which its window owns.
 struct AssetRecord {
   std::array<std::string, 1> classNames;
   std::array<float, 4> frame{};

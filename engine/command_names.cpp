@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The names of the commands, as scripts write them. A host may assign others at any time.
+// The names of the commands in scripts. A host may assign others at any time.
 
 #include "QZ_Plist_State_Parser.hpp"
 

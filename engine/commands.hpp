@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-// The commands as the runner and the dispatcher call them, for every element of a list: by
-// reference, which counts and copies nothing.
+// The commands as the runner and the dispatcher call them for every element of a list: arguments
+// are passed by reference, without counting or copying.
 //
-// The caller keeps the engine alive, and holds arguments that nobody else can change or let go of
-// meanwhile. The engine's operations of the same names do so for a host's arguments.
+// The caller keeps the engine and the arguments alive and makes sure that nothing else changes them
+// meanwhile. The engine's operations of the same names do this for a host's arguments.
 #pragma once
 
 #include <string_view>
@@ -23,7 +23,7 @@ bool setToolTip(QZ_Plist_State_Parser& engine, const QZ_Plist_State_Parser::Para
 bool loadGraphic(QZ_Plist_State_Parser& engine, toolkit::Toolkit& toolkit,
                  const QZ_Plist_State_Parser::Parameters& parameters);
 
-/// A list of the same elements that the caller alone holds; absent for an absent one.
+/// Returns a copy of the list that only the caller holds; absent for an absent list.
 QZ_Plist_State_Parser::Parameters ownList(const QZ_Plist_State_Parser::Parameters& parameters);
 
 }  // namespace commands

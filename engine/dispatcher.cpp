@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The compound commands: one row each, which says how the parameters convert and what runs.
+// The compound commands: one row each, with the conversions of the parameters and the function to
+// run.
 
 #include <functional>
 #include <iterator>
@@ -17,8 +18,8 @@ using toolkit::asButton;
 using toolkit::asImageView;
 using toolkit::asTextField;
 
-// How a parameter, given by its position behind the name, becomes an argument. A position beyond
-// the end raises.
+// The conversions of parameters to arguments. A parameter is given by its position after the name;
+// a position beyond the end raises.
 struct Call {
   Engine& engine;
   const Engine::Parameters& parameters;
@@ -35,7 +36,7 @@ Engine::Value asIs(const Call& call) {
   return call.at(position);
 }
 template <std::size_t position>
-std::uint64_t integer(const Call& call) {  // a negative one arrives as a very large one
+std::uint64_t integer(const Call& call) {  // a negative integer becomes a very large one
   return static_cast<std::uint64_t>(std::int64_t{call.at(position)->intValue()});
 }
 template <std::size_t position>
@@ -47,7 +48,7 @@ bool flag(const Call& call) {
   return call.at(position)->boolValue();
 }
 
-// Converts the parameters in the order written (which one is missed first depends on it), then
+// Converts the parameters in the order written, which decides which missing one raises first, then
 // runs.
 template <auto processor, auto... conversions>
 bool run(const Call& call) {
@@ -66,7 +67,8 @@ bool loadGraphic(const Call& call) {
   return commands::loadGraphic(call.engine, call.toolkit, call.parameters);
 }
 
-// The control commands aim at the list's own id, or at the tag that is their only parameter.
+// Returns the target of a control command: the tag that is its only parameter, or otherwise the
+// list's own id.
 toolkit::Tag targetTag(const Call& call) {
   return call.parameters->count() == 1 ? call.at(0)->intValue() : call.id->longValue();
 }
@@ -81,15 +83,15 @@ bool enable(const Call& call) {
 
 bool disable(const Call& call) {
   const auto control = call.engine.findObjectWithTag(targetTag(call));
-  // Unlike enabling: aimed by parameter at a control that is not there, it counts as done.
+  // Unlike enabling, this succeeds if the control of a parameter does not exist.
   if (!control) return call.parameters->count() == 1;
   control->setEnabled(false);
   control->needsDisplay();
   return true;
 }
 
-// Every test of the class is followed by a look-up of its own, so that a window that changes
-// meanwhile is met as it is then; whatever the class, the control is hidden or shown.
+// Looks the control up again after every test of its class, so that changes of the window meanwhile
+// take effect. A control of any class is hidden or shown.
 template <bool hidden>
 bool hide(const Call& call) {
   const toolkit::Tag tag = targetTag(call);
@@ -120,7 +122,7 @@ bool loadBackground(const Call& call) {
   return true;
 }
 
-// The title's position is read after the tag's, although the processor takes it first.
+// Reads the tag before the title, although the processor takes the title first.
 bool setTitle(Engine& engine, Engine::ObjectId id, Engine::Value title) {
   return engine.QZ_Plist_State_Processor_SET_TITLE(std::move(title), std::move(id));
 }
@@ -132,7 +134,7 @@ constexpr auto setTagWithTimer =
         &Engine::QZ_Plist_State_Processor_SET_TAG);
 
 struct Command {
-  const std::string& name;  // the constant itself: a host may rename the command at any time
+  const std::string& name;  // refers to the constant: a host may rename the command at any time
   bool (*run)(const Call& call);
 };
 
@@ -140,7 +142,7 @@ struct Command {
 #define NAME(name) QZ_PLIST_STATE_PARSER_##name
 #define PROCESSOR(name) &Engine::QZ_Plist_State_Processor_##name
 
-// In the order of recognition: where a host gave two commands one name, the first row has it.
+// In order of recognition: if a host gives two commands the same name, the first row wins.
 constexpr Command rows[] = {
     {NAME(SET_TOOL_TIP_FOR_ID),                  setToolTip},
     {NAME(LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID), loadGraphic},
@@ -178,7 +180,7 @@ constexpr Command rows[] = {
 bool commands::runCompound(Engine& engine, toolkit::Toolkit& toolkit, std::string_view name,
                            const Engine::Parameters& parameters, const Engine::ObjectId& id) {
   const Call call{engine, parameters, id, toolkit};
-  // A loop over the rows, which the compiler writes out: this is done for every command.
+  // A loop over the rows that the compiler unrolls, because this runs for every command.
   const auto runFirstNamed = [&]<std::size_t... row>(std::index_sequence<row...>) {
     bool result = false;
     static_cast<void>(((name == rows[row].name && (result = rows[row].run(call), true)) || ...));
@@ -193,7 +195,7 @@ QZ_Plist_State_Parser::Parameters commands::ownList(const Engine::Parameters& pa
   return toolkit::Array::make({elements.begin(), elements.end()});
 }
 
-// No name is looked at any more once a command runs, so that the name need not be copied.
+// Does not copy the name, because it is not read after the command has started.
 bool QZ_Plist_State_Parser::doCompoundCommand(std::string_view name, Parameters withParameters,
                                               ObjectId usingObject) {
   const auto kept = keepAlive();

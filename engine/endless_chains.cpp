@@ -12,7 +12,7 @@ namespace {
 using Keys = std::vector<std::string>;
 using Graph = std::map<std::string, Keys, std::less<>>;
 
-// The engine has no script any more after this command: what follows chains to nothing.
+// The engine has no script after this command: later elements chain to nothing.
 bool endsTheWalkThrough(const toolkit::ValueRef<>& element) {
   const auto simple = toolkit::asString(element);
   return simple && simple->text() == QZ_PLIST_STATE_PARSER_TERMINATE_PARSER;
@@ -34,7 +34,7 @@ Graph chainsOf(const toolkit::ValueRef<toolkit::Dictionary>& script) {
   return graph;
 }
 
-// Takes out the lists that come to their end: those that chain to none but such lists.
+// Removes the lists that end: those that chain only to such lists.
 void removeEndingLists(Graph& graph) {
   std::map<std::string, Keys, std::less<>> callers;
   std::map<std::string, std::size_t, std::less<>> open;  // chains to lists not yet known to end
@@ -71,7 +71,7 @@ std::optional<std::string> chainTarget(const toolkit::ValueRef<>& element, const
   try {
     return tagKey(compound->elements()[1]->intValue());
   } catch (const toolkit::Exception&) {
-    return std::nullopt;  // no tag: the run goes on with the next element
+    return std::nullopt;  // not a tag: the run continues with the next element
   }
 }
 

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
-// Endless chains: lists of a script that run each other without end.
+// Endless chains: lists of a script that run each other endlessly.
 //
-// The engine sets no limit to chaining, so such a script exhausts the stack. Which lists do is
-// known beforehand, as a run takes every list from its first element to its last: of a list that
-// chains to some that come back and some that do not, the first that does not is where the run
-// stays. Only the end of the walk-through cuts a list short.
+// The engine does not limit chaining, so such a script exhausts the stack. These lists can be found
+// without running the script, because a run executes every list from its first element to its last
+// and only the end of the walk-through cuts it short: a list is endless if it chains to an endless
+// one, and a run stays in the first such list.
 #pragma once
 
 #include <cstddef>
@@ -16,15 +16,15 @@
 #include "toolkit/property_list/collections.hpp"
 
 struct EndlessChains {
-  /// Each loop once, as its lists' keys in the order in which they run: "3 -> 7 -> 3".
+  /// Each loop once, as the keys of its lists in running order: "3 -> 7 -> 3".
   std::vector<std::string> loops;
-  /// For every list that never comes to its end, the loop (by its place in `loops`) it ends up in.
+  /// For every list that never ends, the index in `loops` of the loop that it enters.
   std::map<std::string, std::size_t, std::less<>> loopOf;
 };
 
-/// The key of the list that an element chains to, where it does; `own` is the key under whose id
-/// the element runs, which a simple command aims at.
+/// Returns the key of the list that an element chains to; absent if it does not chain. `own` is the
+/// key of the id under which the element runs, the target of a simple command.
 std::optional<std::string> chainTarget(const toolkit::ValueRef<>& element, const std::string& own);
 
-/// The endless chains of a script; what in it is no list chains to nothing.
+/// Finds the endless chains of a script. A value that is not a list chains to nothing.
 EndlessChains endlessChains(const toolkit::ValueRef<toolkit::Dictionary>& script);

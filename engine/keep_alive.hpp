@@ -1,13 +1,14 @@
 // SPDX-License-Identifier: MIT
-// KeepAlive: what keeps an object to the end of its own operation, whatever that calls out to.
+// KeepAlive: keeps an object alive until the end of its own operation, even if foreign code
+// releases it.
 #pragma once
 
 #include <memory>
 
-/// Keeps `object` as long as the guard is there. Code of others, such as the log's sink, may let go
-/// of the object's last reference in the middle of an operation. Only the outermost operation
-/// counts a reference: `isKept`, a field of the object, tells the ones within it that they need
-/// not, and every command of a list is one of those.
+/// Keeps `object` alive while the guard exists. Foreign code, such as the log's sink, may release
+/// the last reference to the object during an operation. Only the outermost operation counts a
+/// reference: `isKept`, a field of the object, spares the nested ones, such as every command of a
+/// list, the cost.
 class KeepAlive {
  public:
   template <class Object>
@@ -23,5 +24,5 @@ class KeepAlive {
 
  private:
   bool& isKept_;
-  std::shared_ptr<void> object_;  // null in an operation within another
+  std::shared_ptr<void> object_;  // null in a nested operation
 };

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The engine object: construction, teardown, destruction, and what it says of itself.
+// The engine object: construction, termination, destruction, current list and action.
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/tag_key.hpp"
@@ -29,7 +29,7 @@ std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::initWithWindow(
   engine->flashingTagIds_.set(toolkit::Dictionary::make());
   engine->addedObjectToTutorial_.set(toolkit::List<Control>::make());
   engine->objectIdTimers_.set(toolkit::Table<Timer>::make());
-  // The timer keeps the engine alive for as long as it ticks.
+  // The timer keeps the engine alive while it ticks.
   engine->flashingTimer_.set(toolkit.runLoop().schedule(
       flasherPeriod, true, [engine](const Timer& timer) { engine->flasherFired(timer); }));
   engine->guiAssets_.set(toolkit::Table<AssetRecord>::make());
@@ -43,7 +43,7 @@ void QZ_Plist_State_Parser::terminateParser() {
   terminating_ = true;
   stop(*flashingTimer_);
   flashingTimer_.set(nullptr);
-  // Tables are emptied before they are dropped: a host that kept one sees that it is over.
+  // Tables are emptied before they are dropped, so that a host that kept one sees the end.
   if (objectIdTimers_->count() > 0) {
     killAllTimers();
     objectIdTimers_.set(nullptr);
@@ -59,7 +59,7 @@ void QZ_Plist_State_Parser::terminateParser() {
   plistDictionary_.set(nullptr);
   commandArray_.set(nullptr);
   if (runningAsSheet_) {
-    toolkit_.application().endSheet(tutorial, 0);  // at every call, unlike the closing
+    toolkit_.application().endSheet(tutorial, 0);  // at every call, unlike closing the window
   } else if (!hasTerminated_) {
     hasTerminated_ = true;
     tutorial->close();
@@ -70,12 +70,12 @@ QZ_Plist_State_Parser::~QZ_Plist_State_Parser() {
   stop(*flashingTimer_);
   flashingTimer_.set(nullptr);
   const Timers timers = *objectIdTimers_;
-  const auto pending = timers->entries();  // a copy: what a timer lets go of may change the table
+  const auto pending = timers->entries();  // a copy: releasing a timer may change the table
   for (const auto& [key, timer] : pending) timer->invalidate();
   timers->removeAllObjects();
   const Window tutorial = tutorialWindow();
   const Window host = window();
-  // Unlike at teardown, an absent window on either side leaves the list as it is.
+  // Unlike in `terminateParser`, the list stays if either window is absent.
   if (tutorial && host && tutorial != host) addedObjectToTutorial_->removeAllObjects();
   buttonStates_->removeAllObjects();
 }

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Presses: the user's, and those of object timers.
+// Presses by the user and by object timers.
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/tag_key.hpp"
@@ -20,7 +20,7 @@ void QZ_Plist_State_Parser::buttonPushed(Control sender) {
 void QZ_Plist_State_Parser::pseudoButtonPush(Timer timer) {
   const auto kept = keepAlive();
   const auto key = keyOfTimer(timer);
-  if (!key) return;  // replaced under its key since, or the walk-through is over
+  if (!key) return;  // replaced under its key, or the walk-through is over
   objectIdTimers_->removeObjectForKey(*key);
   notify(&qz::Observer::timerFired, *key);
   killAllTimers();
@@ -33,7 +33,7 @@ void QZ_Plist_State_Parser::pseudoButtonPush(Timer timer) {
   }
 }
 
-// A timer carries no tag: it is known by being the very one that the table holds.
+// A timer has no tag; it is found in the table by identity.
 std::optional<std::string> QZ_Plist_State_Parser::keyOfTimer(const Timer& timer) const {
   const Timers timers = *objectIdTimers_;
   for (const auto& [key, pending] : timers->entries()) {

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-// Property: a field of the engine that any thread may get or replace while the engine runs on its
-// own.
+// Property: a field of the engine that any thread may get or set while the engine runs on its own
+// thread.
 //
-// Invariant: whatever is read of a field, by `get` or by the engine itself, stays valid to the end
-// of the expression that reads it, whoever replaces the field at the same moment.
+// Invariant: a value read from a field stays valid until the end of the reading expression, even if
+// another thread replaces the field meanwhile.
 #pragma once
 
 #include <mutex>
@@ -14,29 +14,30 @@
 template <class T>
 class Property {
  public:
-  /// The value; from any thread.
+  /// Returns the value. Any thread.
   T get() const {
     const std::lock_guard guard(lock_);
     return value_;
   }
 
-  /// The answer of the value, which is not copied, to a question of its own; from any thread.
+  /// Returns the result of a const member function of the value, without copying the value. Any
+  /// thread.
   template <class Answer>
   Answer ask(Answer (T::*question)() const) const {
     const std::lock_guard guard(lock_);
     return (value_.*question)();
   }
 
-  /// Replaces the value; from any thread. The old one is let go outside of the lock, for its end
-  /// may run code that comes back here.
+  /// Replaces the value. Any thread. The old value is released outside the lock, because its
+  /// destructor may run code that uses this property.
   void set(T value) {
     const std::lock_guard guard(lock_);
     std::swap(value_, value);
   }
 
-  /// The same as `get`, as the engine writes it.
+  /// The same as `get`, as shorthand for the engine.
   T operator*() const { return get(); }
-  /// What the value, a reference, refers to.
+  /// Gives access to the object to which the value, a reference, refers.
   T operator->() const { return get(); }
 
  private:

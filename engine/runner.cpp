@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The command-list runner, through which every list runs, whoever starts it.
+// The command-list runner: every list runs through it.
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/commands.hpp"
@@ -10,16 +10,16 @@ namespace {
 
 using Engine = QZ_Plist_State_Parser;
 
-// An array is a compound command, whose name is matched in upper case; anything else is taken for a
-// simple one, whose name is matched as written. What is not fixed may change while it runs: it is
-// kept, or copied.
+// Runs an array as a compound command, whose name is compared in upper case, and anything else as a
+// simple command, whose name is compared as written. An element that is not fixed may change while
+// it runs, so it is kept alive or copied.
 bool runElement(Engine& engine, toolkit::Toolkit& toolkit, const Engine::Value& element,
                 bool isFixed, const Engine::Parameters& parameters, const Engine::ObjectId& id) {
   if (element->kind() != toolkit::Value::Kind::array) {
     parameters->removeAllObjects();
     return commands::runSimple(engine, textOf(Engine::Value(element)), id);
   }
-  // Not by asArray, which counts the reference in and out again: this runs for every command.
+  // Not asArray, which would count a reference: this runs for every command.
   const auto& compound = static_cast<const toolkit::Array&>(*element);
   std::string raised;
   const auto name = toolkit::uppercased(textOf(compound.objectAtIndex(0)), raised);
@@ -34,7 +34,7 @@ bool QZ_Plist_State_Parser::processCommandArray(Value list, ObjectId forObject) 
   const auto kept = keepAlive();
   const Parameters parameters = toolkit::Array::make();
   lastTagId_.set(forObject);
-  // Outside of the guard: of a value that has no elements the caller hears.
+  // Outside the try block: a value without elements raises to the caller.
   const auto count = static_cast<std::int32_t>(list->count());
   notify(&qz::Observer::listWillRun, list, forObject);
   bool result = false;

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Loading a script and starting it, on its own or with the walk-through window as a sheet.
+// Loads and starts a script, optionally with the walk-through window as a sheet.
 
 #include <algorithm>
 #include <filesystem>
@@ -15,8 +15,8 @@ bool isAbsolutePath(std::string_view path) {
   return path.starts_with('~') || std::filesystem::path(path).is_absolute();
 }
 
-// A name is used exactly as given: ".plist" is never added to it. (No name at all reads as the text
-// that the system's formats print for nothing.)
+// A name is used exactly as given: ".plist" is never added. (An absent name reads as the text that
+// the system's formats print for an absent object.)
 std::string scriptPath(const std::optional<std::string>& name, const toolkit::Files& files) {
   const std::string given = name.value_or("(null)");
   return isAbsolutePath(given) ? given : files.resourcePath() + "/" + given;
@@ -59,7 +59,7 @@ bool QZ_Plist_State_Parser::loadPlist(std::optional<std::string> name,
       toolkit_.log().write("SERIOUS ERROR WE DON'T HAVE A WINDOW IN WHICH TO SHOW WIDGETS");
     }
   }
-  withDelegate.reset();  // the run does not keep it alive either
+  withDelegate.reset();  // the run must not keep it alive
   if (!runFromKey) return true;
   const auto key = runFromKey->empty() ? smallestTagKey(**plistDictionary_) : runFromKey;
   if (!key) return false;

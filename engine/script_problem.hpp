@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: MIT
-// Scripts that would harm a host. The engine itself plays them, on purpose.
+// Detects scripts that would harm a host. The engine itself plays them, on purpose.
 #pragma once
 
 #include <string>
 
 #include "toolkit/property_list/collections.hpp"
 
-/// Why a host had better not play the script from its list with the smallest tag, as a sentence
-/// without its full stop: no key is a tag, the value under the smallest tag is not a list, or lists
-/// run each other without end. Empty where the script is fine.
+/// Returns why a host should not play the script from the list with its smallest tag, as a sentence
+/// without a full stop: no key is a tag, the value under the smallest tag is not a list, or lists
+/// run each other endlessly. Empty if there is no problem.
 std::string problemOf(const toolkit::ValueRef<toolkit::Dictionary>& script);

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The simple commands: bare names that act on the control whose tag is the list's own id.
+// The simple commands: names without parameters, which act on the control whose tag is the list's
+// own id.
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/commands.hpp"
@@ -10,7 +11,7 @@ using Engine = QZ_Plist_State_Parser;
 
 struct SimpleCall {
   Engine& engine;
-  const Engine::Control& control;  // absent when no control has the id
+  const Engine::Control& control;  // absent if no control has the id
   const Engine::ObjectId& id;
 };
 
@@ -33,13 +34,13 @@ bool setHidden(const SimpleCall& call) {
 
 bool idle(const SimpleCall&) { return true; }
 
-// Without a limit: a list that holds this runs itself again from its first element.
+// No limit, on purpose: a list with this command runs itself again from its first element.
 bool processCommands(const SimpleCall& call) {
   return call.engine.QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(call.id);
 }
 
 struct SimpleCommand {
-  const std::string& name;  // the constant itself: a host may rename the command at any time
+  const std::string& name;  // refers to the constant: a host may rename the command at any time
   bool (*run)(const SimpleCall& call);
 };
 

@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: MIT
-// Spin lock: for what is held for a few instructions and hardly ever waited for.
+// A spin lock, for locks that are held for a few instructions and hardly ever contended.
 #pragma once
 
 #include <atomic>
 #include <thread>
 
-/// Guards what no code of others runs under. A `std::mutex` would do; it takes some sixty
-/// instructions where nobody waits, and the engine reads its properties at every command.
+/// No foreign code may run while it is held. A `std::mutex` would work too, but costs some sixty
+/// instructions even without contention, and the engine reads its properties at every command.
 class SpinLock {
  public:
   void lock() {

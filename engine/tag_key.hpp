@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Tag keys: the decimal form of a tag, under which scripts and tables keep what belongs to it.
+// Tag keys: the decimal form of a tag, used as a key in scripts and tables.
 #pragma once
 
 #include <optional>
@@ -10,7 +10,7 @@
 
 inline std::string tagKey(toolkit::Tag tag) { return std::to_string(tag); }
 
-/// The key of the list with which a script starts by itself: the smallest of its keys, each read as
-/// a 32-bit integer. One that is not a number counts as 0, and "007" as 7, under which nothing need
-/// be stored. Absent for an empty script.
+/// Returns the key of the list with which a script starts by default: its smallest key, with each
+/// key read as a 32-bit integer. A key that is not a number counts as 0, and "007" as 7, so the
+/// result need not be a key of the script. Absent for an empty script.
 std::optional<std::string> smallestTagKey(const toolkit::Dictionary& script);

@@ -6,7 +6,7 @@
 #include "toolkit/exception.hpp"
 
 void raiseNoString(const toolkit::Value& value) {
-  // Not its description, which a small file can make longer than memory.
+  // Not the description: a small file can make that larger than memory.
   throw toolkit::InvalidArgumentException("expected a string, got " +
                                           std::string(value.className()));
 }

@@ -6,10 +6,12 @@
 
 #include "toolkit/property_list/scalars.hpp"
 
-/// Raises: `value` is no string. Out of the way of `textOf`, which is part of every command.
+/// Raises because `value` is not a string. Separate from `textOf`, to keep that small: it is
+/// inlined in every command.
 [[noreturn]] void raiseNoString(const toolkit::Value& value);
 
-/// The text of a string, valid as long as the value; empty for an absent one. Anything else raises.
+/// Returns the text of a string, valid as long as the value; empty for an absent value. Anything
+/// else raises.
 inline std::string_view textOf(const toolkit::ValueRef<>& value) {
   if (!value) return {};
   if (value->kind() != toolkit::Value::Kind::string) raiseNoString(*value);

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-// The engine, driven by any script and any presses, on the memory toolkit.
+// Runs the engine with any script and any presses, on the memory toolkit.
 //
-// An input is a line of what happens, a character a step, and a script in any format behind it. A
-// script whose lists run each other without end exhausts the stack, as is stated; such a script,
-// and one that would run for very long, is left out.
+// An input is a line of steps, one character each, followed by a script in any format. Lists that
+// run each other endlessly exhaust the stack, as documented, so such scripts are skipped, as are
+// those that would run very long.
 #include <algorithm>
 #include <cstdint>
 #include <map>
@@ -25,20 +25,20 @@ using fuzz::require;
 using Script = toolkit::ValueRef<toolkit::Dictionary>;
 
 constexpr std::size_t mostSteps = 32;
-constexpr std::size_t mostElements = 2'000;  // in the runs of one list, with all that it chains to
+constexpr std::size_t mostElements = 2'000;  // executed by one list and the lists that it chains to
 constexpr std::size_t deepestChain = 100;
 constexpr double beyondAllTimers = 0x1p65;  // seconds; timers are set in 64 bits
 
-/// How many elements run when a list does, with the lists that it chains to.
+/// Counts the elements that a list executes, including the lists that it chains to.
 class RunLengths {
  public:
   explicit RunLengths(Script script) : script_(std::move(script)) {}
 
-  /// Whether no list, whichever starts, runs for long or deep.
+  /// True if no list runs long or chains deep.
   bool areSmall() {
     for (const auto& [key, list] : script_->entries()) {
       const auto tag = toolkit::asString(key);
-      // A list runs under its key's number, by which it chains to itself: that of "07" under 7.
+      // A list runs under the number of its key and chains to itself by that number: "07" under 7.
       if (tag && ofElements(list, tagKey(tag->intValue()), 0) > mostElements) return false;
     }
     return true;
@@ -88,7 +88,7 @@ class Walkthrough {
   ~Walkthrough() {
     attempt([&] { engine_->terminateParser(); });
     require(!engine_->flashingTimer(), "the end stops the flasher");
-    // Timers that were replaced, or armed after the end, keep the engine until they are due.
+    // Timers that were replaced, or started after the end, hold the engine until they fire.
     driver_.advance(beyondAllTimers);
     const std::weak_ptr<QZ_Plist_State_Parser> ended = engine_;
     engine_ = nullptr;
@@ -104,7 +104,7 @@ class Walkthrough {
         return attempt([&] { driver_.advance(1); });
       case '*':
         return attempt([&] { driver_.advance(20); });
-      case 'r':  // no such file: the script that is there runs on
+      case 'r':  // no such file: the current script continues
         return attempt([&] { engine_->loadPlist("none.plist", "", nullptr, false); });
       case 's':
         return attempt([&] { engine_->loadPlist("none.plist", "1", nullptr, true); });
@@ -128,7 +128,7 @@ class Walkthrough {
     attempt([&] { driver_.click(views_[view]); });
   }
 
-  /// What a script or a description does wrong may raise; the host's event loop goes on.
+  /// Errors in a script or a description may raise; the host's event loop continues.
   template <class Act>
   static void attempt(Act act) {
     try {

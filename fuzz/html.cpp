@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The HTML reader: whatever it reads is a text whose runs cover it from end to end.
+// Checks that the runs of every text that the HTML reader returns cover it from end to end.
 #include <cstdint>
 
 #include "fuzz/require.hpp"

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The numbers that texts stand for, beside what the C library makes of the same texts.
+// Checks number conversion against the C library's results for the same texts.
 #include "toolkit/property_list/number_conversion.hpp"
 
 #include <algorithm>

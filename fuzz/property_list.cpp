@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
-// Property lists: what must hold of any bytes that are read as one.
+// Checks what must hold when any bytes are read as a property list.
 //
-// There is a fuzzer for each of the three formats, all of them this. Their seeds and dictionaries
-// keep the inputs to the format; the reader itself finds out which one it has before it.
+// This source makes three fuzzers, one for each format. Seeds and dictionaries keep the inputs
+// close to the format; the reader itself detects which format it has.
 #include <cstdint>
 #include <string>
 #include <string_view>
@@ -19,13 +19,14 @@ namespace {
 
 using fuzz::require;
 
-/// A small binary file can stand for more values, shared over and over, than fit into any memory.
+/// A small binary file can represent more values, by sharing, than fit into any memory.
 constexpr std::size_t mostVisits = 100'000;
 
-/// Whether a 32-bit real is in it, which XML cannot tell from one of 64 bits.
+/// True if the dump has a 32-bit real, which XML cannot distinguish from a 64-bit one.
 bool hasShortReal(const std::string& dump) { return dump.find("\"w\":32}") != std::string::npos; }
 
-/// The dump of what XML tells apart: 0 and -0 seconds are one moment, and one text there.
+/// Returns the dump as it is after XML, which writes 0 and -0 seconds, the same moment, as one
+/// text.
 std::string inXml(std::string dump) {
   const std::string minusZero = R"({"date":"-0"})";
   for (auto at = dump.find(minusZero); at != std::string::npos; at = dump.find(minusZero, at)) {
@@ -34,7 +35,8 @@ std::string inXml(std::string dump) {
   return dump;
 }
 
-/// Writes the value, reads it back, and requires an equal one; a refusal to write needs a reason.
+/// Writes the value, reads it back, and requires an equal one; a refusal to write must have a
+/// reason.
 template <class Write>
 void checkRoundTrip(const toolkit::ValueRef<>& value, const std::string& dump, Write write) {
   try {
@@ -49,7 +51,7 @@ void checkRoundTrip(const toolkit::ValueRef<>& value, const std::string& dump, W
   }
 }
 
-/// Reads the bytes, with positions and without, and writes what they are in both formats.
+/// Reads the bytes with and without positions, and writes the value in both formats.
 void checkReading(std::string_view bytes) {
   toolkit::PositionTable positions;
   const toolkit::ReadResult result = toolkit::readPropertyList(bytes, &positions);

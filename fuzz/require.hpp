@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
-// How a fuzzer says that something does not hold: it prints what, and ends the program, for which
-// libFuzzer keeps the input.
+// Reports a failed check: prints it and ends the program, so that libFuzzer keeps the input.
 #pragma once
 
 #include <cstdio>

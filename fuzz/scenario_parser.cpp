@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The parser of scenario files: scenarios, or a reason with a place in the file.
+// Checks that the parser of scenario files returns scenarios, or a reason with a place in the file.
 #include <algorithm>
 #include <cstdint>
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The states of pressed buttons, which a host carries from one walk-through to the next.
+// The states of pressed buttons, which a host can carry over to another walk-through.
 
 #include "QZ_Plist_State_Parser.hpp"
 

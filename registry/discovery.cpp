@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Discovery: adopting a window, wiring its buttons and recording its controls.
+// Discovery: adopts a window, connects its buttons and records its controls.
 
 #include <algorithm>
 
@@ -22,7 +22,8 @@ AssetRecord recordOf(const toolkit::Ref<toolkit::View>& view) {
           toolkit::StoredRef<toolkit::View>::refer(view)};
 }
 
-// The first key that cannot be a tag's own: one more than the largest tag, which is never below 0.
+// Returns the first key that no tag uses: one more than the largest tag, where a negative one
+// counts as 0.
 std::uint64_t firstOverflowKey(const toolkit::Subviews& views) {
   toolkit::Tag largest = 0;
   for (const auto& view : views) largest = std::max(largest, view->tag());
@@ -34,7 +35,7 @@ std::uint64_t firstOverflowKey(const toolkit::Subviews& views) {
 bool QZ_Plist_State_Parser::getGuiAssetsFromWindow(Window window) {
   const auto kept = keepAlive();
   if (!window) return false;
-  // A window that is the engine's own stays so.
+  // A window that the engine already keeps alive stays so.
   if (tutorialWindow() != window) {
     tutorialWindow_.set(toolkit::StoredRef<toolkit::Window>::refer(window));
   }
@@ -42,7 +43,7 @@ bool QZ_Plist_State_Parser::getGuiAssetsFromWindow(Window window) {
   guiAssets_->removeAllObjects();
   originalTagValues_->removeAllObjects();
   const Control content = window->contentView();
-  const toolkit::Subviews views = content->subviews();  // a copy: it may change under the walk
+  const toolkit::Subviews views = content->subviews();  // a copy: it may change during the loop
   std::uint64_t overflowKey = firstOverflowKey(views);
   bool recorded = false;
   for (const Control& view : views) {
@@ -65,6 +66,6 @@ bool QZ_Plist_State_Parser::getGuiAssetsFromWindow(Window window) {
 bool QZ_Plist_State_Parser::forceButtonPushedToBeActionForGuiAttribute(Control object) {
   const auto kept = keepAlive();
   if (!object || !(object->asButton() || object->asGradient())) return false;
-  object->setAction(buttonAction);  // the target stays as it is
+  object->setAction(buttonAction);  // the target stays
   return true;
 }

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// GUI-asset loading: the walk-through window and its controls, built from a description.
+// GUI-asset loading: builds the walk-through window and its controls from a description.
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/text_of.hpp"
@@ -18,7 +18,7 @@ bool isOfClass(const toolkit::ValueRef<>& entry, std::string_view className) {
   return textOf(entry->objectAtIndex(0)) == className;
 }
 
-// Read in single precision: 0.1 becomes 0.100000001490116.
+// Reads lengths in single precision: 0.1 becomes 0.100000001490116.
 toolkit::Rect rectOf(const toolkit::ValueRef<>& entry) {
   const auto length = [&](std::size_t position) {
     return static_cast<double>(entry->objectAtIndex(position)->floatValue());
@@ -36,7 +36,7 @@ bool QZ_Plist_State_Parser::loadGuiAssets(Dictionary description,
   const auto kept = keepAlive();
   const Dictionary assets = description->copy(toolkit::Mutability::immutable);
   addedObjectToTutorial_->removeAllObjects();
-  tutorialWindow_.set({});  // a window of an earlier load is only forgotten, not closed
+  tutorialWindow_.set({});  // a window of an earlier load is not closed
   if (assets->count() == 0) return false;
 
   Value windowEntry;
@@ -46,7 +46,7 @@ bool QZ_Plist_State_Parser::loadGuiAssets(Dictionary description,
     windowEntry = entry;
     makeTutorialWindow(rectOf(entry))->makeKeyAndOrderFront();
   }
-  // Discovery of the window, empty as it is, empties the records of an earlier one.
+  // Discovery of the empty window clears the records of an earlier one.
   if (!windowEntry) getGuiAssetsFromWindow(makeTutorialWindow(defaultContent));
 
   const Window window = tutorialWindow();
@@ -54,11 +54,11 @@ bool QZ_Plist_State_Parser::loadGuiAssets(Dictionary description,
   bool added = false;
   for (const auto& [key, entry] : assets->entries()) {
     if (!makeControl(key, entry)) continue;
-    // What goes into the window is the list's last control. Without a list, as after termination,
-    // that is none; the entry counts all the same.
+    // Adds the last control of the list. Without a list, as after termination, adds nothing, but
+    // the entry still counts.
     const Controls controls = *addedObjectToTutorial_;
     if (controls->count() > 0) {
-      const Control last = controls->elements().back();  // kept: adding it may change the list
+      const Control last = controls->elements().back();  // kept alive: adding may change the list
       window->contentView()->addSubview(last);
     }
     added = true;
@@ -73,16 +73,17 @@ QZ_Plist_State_Parser::Window QZ_Plist_State_Parser::makeTutorialWindow(
                                                     toolkit::BackingStore::buffered, true);
   tutorialWindow_.set(toolkit::StoredRef<toolkit::Window>::own(window));
   window->setBackgroundColor(toolkit::colors::black);
-  // The buttons have no target: their actions reach the engine at the end of the responder chain.
+  // The buttons have no target: their actions reach the engine through the end of the responder
+  // chain.
   window->setDelegate(shared_from_this());
   return window;
 }
 
-// Absent for an entry that makes no control. Only buttons get a tag: scripts reach the others by
-// the toolkit's default tag, or after the host has tagged them.
+// Absent for an entry that makes no control. Only buttons get a tag: scripts reach the other
+// controls by the toolkit's default tag, or by a tag that the host sets.
 QZ_Plist_State_Parser::Control QZ_Plist_State_Parser::makeControl(const Value& key,
                                                                   const Value& entry) {
-  // Everything is read before the class is looked at: a malformed entry raises whatever it is.
+  // Reads everything before the test of the class: a malformed entry raises, whatever its class.
   const std::string_view className = textOf(entry->objectAtIndex(0));
   const toolkit::Rect frame = rectOf(entry);
   toolkit::Application& application = toolkit_.application();

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
-// Finding a control by the tag that it carries now.
+// Finds a control by its current tag.
 
 #include "QZ_Plist_State_Parser.hpp"
 
-// A scan of the live window at every call, never of the records: a re-tagged control is found under
-// its new tag only, and of several with one tag the back-most.
+// Scans the live window at every call, never the records: a re-tagged control is found only under
+// its new tag. If several controls have the tag, the back-most is found.
 QZ_Plist_State_Parser::Control QZ_Plist_State_Parser::findObjectWithTag(toolkit::Tag tag) const {
   const Control content = tutorialWindow()->contentView();
   for (const Control& view : content->subviews()) {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Putting back the tags that controls had when they were found.
+// Restores the tags that controls had at their discovery.
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/tag_key.hpp"
@@ -12,7 +12,7 @@ void QZ_Plist_State_Parser::restoreOriginalTagValues() {
     const std::string name = key->description();
     const toolkit::Tag recorded = value->intValue();
     const Control control = guiAssets_->objectForKey(name).control.get();
-    // Written also where nothing changes; a control that is gone has the tag 0 and no class.
+    // Logged even if nothing changes; a destroyed control has the tag 0 and no class.
     toolkit_.log().write(
         "Restoring tag value from: " + tagKey(control->tag()) + " to " + tagKey(recorded) +
         " for object: " + (control ? control->className() : "(null)") + " with Key: " + name);

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Replaces the program's operator new, so that any allocation can be made to fail. One file of a
-// program includes this.
+// Replaces the program's operator new, so that any allocation can be made to fail. Include it in
+// exactly one file of a program.
 #pragma once
 
 #include <gtest/gtest.h>
@@ -15,14 +15,15 @@ namespace failing_allocations {
 
 constexpr std::size_t never = std::numeric_limits<std::size_t>::max();
 
-// Per thread, so that nobody else's allocations count.
+// Per thread, so that allocations of other threads do not count.
 inline thread_local std::size_t allocationsLeft = never;
 inline thread_local std::ptrdiff_t allocationsAlive = 0;
 
 /// Runs `action` with its first allocation failing, then its second, and so on until none fails;
-/// returns how many did. Whatever `action` makes it has to end, or it counts as leaked.
+/// returns the number of failures. `action` must destroy everything that it makes, or it counts as
+/// leaked.
 inline int failuresOf(const std::function<void()>& action) {
-  action();  // whatever is made once for the whole program
+  action();  // makes everything that is made once for the whole program
   for (int failures = 0;; ++failures) {
     const std::ptrdiff_t before = allocationsAlive;
     bool failed = false;

@@ -22,8 +22,8 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_ALLOW_FLASHING(bool allow) 
   const auto kept = keepAlive();
   flashing_ = allow;
   if (allow) return true;
-  // Every button that has a list loses its highlight, whether it was flashing or not; a flashing
-  // one without a list keeps what it has.
+  // Every button that has a list loses its highlight, even if it was not flashing; a flashing
+  // button without a list keeps its look.
   const Dictionary script = plistDictionary_->copy(toolkit::Mutability::immutable);
   for (const auto& [key, list] : script->entries()) {
     asButton(findObjectWithTag(key->intValue()))->highlight(false);
@@ -34,16 +34,16 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_ALLOW_FLASHING(bool allow) 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_FLASH_ID(ObjectId id, bool flashOn) {
   const auto kept = keepAlive();
   const std::string key = tagKey(id->longValue());
-  // The first word on a tag is the last one: it is never changed again.
+  // The first FLASH_ID for a tag wins; later ones are ignored.
   if (flashingTagIds_->objectForKey(key)) return false;
   flashingTagIds_->setObject(toolkit::Number::withBool(flashOn), key);
   if (flashOn) return true;  // the next tick starts it
   const Control control = findObjectWithTag(id->longValue());
-  control->highlight(false);  // of what is no button this raises
+  control->highlight(false);  // raises if the control is not a button
   control->needsDisplay();
   return true;
 }
 
-// Asks whether the *script's entry* under the id, which must be absent to get that far, is a
-// button: so it highlights nothing, whatever the id. Scripts make a button flash instead.
+// Never highlights anything, on purpose: it tests whether the *script's entry* under the id is a
+// button, and gets that far only if the entry is absent. Scripts make a button flash instead.
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_HIGHLIGHT_ID(ObjectId) { return false; }

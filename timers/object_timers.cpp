@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Object timers: one-shot countdowns, one for a tag key, that press the tag's button or run its
+// Object timers: one-shot timers, one per tag key, that press the button of the tag or run its
 // list.
 
 #include "QZ_Plist_State_Parser.hpp"
@@ -12,7 +12,7 @@ void QZ_Plist_State_Parser::startTimerWithValue(std::uint64_t value,
   // Seconds in single precision: above 16,777,216 the low digits are lost.
   const auto interval = static_cast<double>(static_cast<float>(value));
   const auto self = shared_from_this();
-  // A timer that is replaced goes on running; when it fires, no key is found for it.
+  // A replaced timer keeps running; when it fires, no key is found for it.
   objectIdTimers_->setObject(
       toolkit_.runLoop().schedule(interval, false,
                                   [self](const Timer& timer) { self->pseudoButtonPush(timer); }),
@@ -23,7 +23,7 @@ void QZ_Plist_State_Parser::startTimerWithValue(std::uint64_t value,
 void QZ_Plist_State_Parser::killAllTimers() {
   const auto kept = keepAlive();
   const Timers timers = *objectIdTimers_;
-  const auto pending = timers->entries();  // a copy: what a timer lets go of may change the table
+  const auto pending = timers->entries();  // a copy: releasing a timer may change the table
   for (const auto& [key, timer] : pending) {
     if (timer->isValid()) timer->invalidate();
     notify(&qz::Observer::timerCancelled, key);
@@ -45,7 +45,7 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TIMER(std::uint64_t val
       if (pending) notify(&qz::Observer::timerCancelled, key);
     }
   } else if (plistDictionary_->objectForKey(key)) {
-    startTimerWithValue(value, key);  // here 0 cancels nothing
+    startTimerWithValue(value, key);  // here 0 does not cancel
   }
-  return false;  // whatever happened
+  return false;  // always, on purpose
 }

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Giving a control another tag, with a timer for the new one or without.
+// Gives a control another tag, optionally with a timer for the new tag.
 
 #include "QZ_Plist_State_Parser.hpp"
 #include "engine/tag_key.hpp"
@@ -16,8 +16,8 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TAG(ObjectId newTag, Ob
   if (!control) return false;
   control->setTag(newTag->integerValue());
   if (withTimerValue) {
-    // The parameter itself, not the number it holds, is the count of seconds: a very long time. A
-    // script that wants a real delay sets a timer of its own.
+    // On purpose: the seconds are the address of the parameter, not its number, so the delay is
+    // very long. A script that needs a real delay sets a separate timer.
     startTimerWithValue(reinterpret_cast<std::uintptr_t>(withTimerValue.pointer().get()),
                         tagKey(newTag->longValue()));
   }
@@ -25,8 +25,8 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TAG(ObjectId newTag, Ob
   return true;
 }
 
-// The entry is written anew under the old id, not moved to the new tag: flashing follows the id
-// that it was asked for.
+// Rewrites the entry under the old id instead of moving it to the new tag: flashing follows the id
+// that FLASH_ID named.
 void QZ_Plist_State_Parser::rewriteFlashingEntry(const ObjectId& id) {
   const Dictionary flashing = *flashingTagIds_;
   for (const std::string& key : flashing->allKeys()) {

@@ -11,13 +11,13 @@
 
 namespace toolkit {
 
-/// Who is told that a sheet ended.
+/// Notified when a sheet ends.
 class SheetDelegate {
  public:
   virtual ~SheetDelegate() = default;
 
-  /// `sheet` was ended with `returnCode`; `contextInfo` is what its beginning was given. The sheet
-  /// is still on the screen: ordering it out is the delegate's part.
+  /// `sheet` was ended with `returnCode`; `contextInfo` is the one given to `beginSheet`. The sheet
+  /// is still on the screen: the delegate must order it out.
   virtual void sheetDidEnd(const Ref<Window>& sheet, long returnCode, void* contextInfo) = 0;
 };
 
@@ -25,9 +25,9 @@ class Application {
  public:
   virtual ~Application() = default;
 
-  /// Makes a window, not yet shown, with a content view of the rectangle's size. `content` is in
-  /// screen coordinates. With `defer` it takes up resources of the screen only when shown. Kept
-  /// alive by the caller and, while it is on the screen, by the application. Absent on failure.
+  /// Makes a hidden window whose content view has the size of `content`, a rectangle in screen
+  /// coordinates. With `defer` it takes up screen resources only when shown. The caller and, while
+  /// it is on the screen, the application keep it alive. Absent on failure.
   virtual Ref<Window> makeWindow(const Rect& content, StyleMask style, BackingStore backing,
                                  bool defer) = 0;
 
@@ -42,8 +42,8 @@ class Application {
   virtual void beginSheet(const Ref<Window>& sheet, const Ref<Window>& parent,
                           const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo) = 0;
 
-  /// Ends `sheet`: its delegate is told once, before this returns. Of a window that is no sheet, or
-  /// was ended already, nothing comes.
+  /// Ends `sheet` and notifies its delegate once, before this returns. Does nothing if the window
+  /// is not a sheet or was already ended.
   virtual void endSheet(const Ref<Window>& sheet, long returnCode) = 0;
 };
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
-// The toolkit's exceptions: what a misuse raises (a message that is not understood, a position
-// beyond an array's end, an absent argument). Only these are caught by whoever runs commands;
-// anything else, std::bad_alloc among them, passes through.
+// The toolkit's exceptions, raised on misuse: a message that its receiver does not understand, a
+// position beyond an array's end, an absent argument. The engine catches only these when it runs
+// commands; anything else, such as std::bad_alloc, passes through.
 #pragma once
 
 #include <exception>
@@ -11,7 +11,7 @@
 
 namespace toolkit {
 
-/// A raised exception, after Foundation's `NSException`.
+/// A raised exception, modelled on Foundation's `NSException`.
 class Exception : public std::exception {
  public:
   Exception(std::string name, std::string reason)
@@ -19,7 +19,7 @@ class Exception : public std::exception {
 
   /// The kind, such as "NSRangeException".
   const std::string& name() const { return name_; }
-  /// What happened, in one line; also what a log line shows of the exception.
+  /// What happened, in one line; log lines show this text.
   const std::string& reason() const { return reason_; }
   const char* what() const noexcept override { return reason_.c_str(); }
 
@@ -28,20 +28,21 @@ class Exception : public std::exception {
   std::string reason_;
 };
 
-/// A position or range outside of what there is.
+/// A position or range is out of bounds.
 class RangeException : public Exception {
  public:
   explicit RangeException(std::string reason) : Exception("NSRangeException", std::move(reason)) {}
 };
 
-/// An argument that is absent or of the wrong kind, or a message its receiver does not understand.
+/// An argument is absent or of the wrong kind, or a receiver does not understand a message.
 class InvalidArgumentException : public Exception {
  public:
   explicit InvalidArgumentException(std::string reason)
       : Exception("NSInvalidArgumentException", std::move(reason)) {}
 };
 
-/// Raises: an object of class `className` was sent `selector`, which it does not understand.
+/// Raises an InvalidArgumentException: an object of class `className` does not understand
+/// `selector`.
 [[noreturn]] void raiseUnrecognizedSelector(std::string_view className, std::string_view selector);
 
 }  // namespace toolkit

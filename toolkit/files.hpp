@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Files: the resource directory, and reading.
+// Files: the resource directory and reading.
 #pragma once
 
 #include <optional>
@@ -12,14 +12,14 @@ class Files {
  public:
   virtual ~Files() = default;
 
-  /// Absolute path, without a slash at its end, of the directory against which relative script
-  /// names are resolved and in which named images are looked up (the main bundle's resources).
+  /// Returns the absolute path, without a slash at its end, of the resource directory: relative
+  /// script names start there, and named images are looked up there (the main bundle's resources).
   virtual std::string resourcePath() const = 0;
 
   /// Whether a file or directory exists at `path`.
   virtual bool fileExistsAtPath(std::string_view path) const = 0;
 
-  /// The bytes of the file at `path`; absent when it cannot be read (a directory cannot).
+  /// Returns the bytes of the file at `path`; absent if it cannot be read or is a directory.
   virtual std::optional<std::string> contentsAtPath(std::string_view path) const = 0;
 };
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
-// A name is compared in its folded form: without blanks, in lower case. What cannot be told from
-// the name alone (is "MT" an ending, or part of the family's name?) the families decide: the whole
-// name is tried as a family before anything is taken off it.
+// Names are compared in their folded form: without blanks, in lower case. A name alone may be
+// ambiguous (is "MT" an ending or part of the family's name?). Therefore the whole name is tried as
+// a family before an ending is removed.
 
 #include "toolkit/font_names.hpp"
 
@@ -41,7 +41,8 @@ const FontFamily* familyNamed(std::string_view foldedName, std::span<const FontF
   return nullptr;
 }
 
-// "arial" also of "arialmt", "timesnewroman" also of "timesnewromanpsmt" and "timesnewromanps".
+// Finds "arial" for "arialmt" too, and "timesnewroman" for "timesnewromanpsmt" and
+// "timesnewromanps".
 const FontFamily* familyOfPostScriptName(std::string_view foldedName,
                                          std::span<const FontFamily> families) {
   if (const FontFamily* const family = familyNamed(foldedName, families)) return family;
@@ -55,7 +56,7 @@ const Style* styleNamed(std::string_view foldedName) {
 }
 
 Font font(const FontFamily& family, double size, bool bold, bool italic) {
-  // Not `size <= 0`: a size that is no number is the default too.
+  // Not `size <= 0`: NaN means the default size too.
   return {family.name, size > 0 ? size : defaultFontSize, bold, italic, family.fixedPitch};
 }
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Fonts by the names that scripts write: what a name says, whichever fonts a toolkit has.
+// Finds the font that a script means by a name, among the fonts of any toolkit.
 #pragma once
 
 #include <optional>
@@ -11,17 +11,17 @@
 
 namespace toolkit {
 
-/// A family of fonts that a toolkit can draw, plain, bold, italic and both.
+/// A font family that a toolkit can draw plain, bold, italic and bold italic.
 struct FontFamily {
   std::string name;  ///< such as "Times New Roman"
   bool fixedPitch = false;
 };
 
-/// The font among `families` that `name` means, at `size` points. The name is a family's, or a
-/// PostScript name made from it: behind the family, perhaps without its blanks, may stand "PS" or
-/// "MT", then a hyphen and a style ("-BoldItalic", "-Oblique", "-Roman" and the like), then "MT".
-/// Case does not matter. A size that is not above 0 is the default size. Absent when no family
-/// fits.
+/// Returns the font among `families` that `name` means, at `size` points. The name is a family's
+/// name or a PostScript name: the family, optionally without its blanks, then optionally "PS" or
+/// "MT" (or both), then optionally a hyphen, a style (such as "BoldItalic", "Oblique" or "Roman")
+/// and perhaps "MT". Case does not matter. A size that is not above 0 means the default size.
+/// Absent if no family or style matches.
 std::optional<Font> fontNamed(std::string_view name, double size,
                               std::span<const FontFamily> families);
 

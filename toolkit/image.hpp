@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Images, and finding them by name.
+// Images and their lookup by name.
 #pragma once
 
 #include <string>
@@ -9,13 +9,13 @@
 
 namespace toolkit {
 
-/// An image. Only the toolkit that made it knows what it looks like.
+/// An image. Only the toolkit that made it can draw it.
 class Image {
  public:
   virtual ~Image() = default;
   static Image& nothing();
 
-  /// The name under which it was found.
+  /// The name under which the image was found.
   virtual std::string name() const = 0;
 };
 
@@ -23,8 +23,8 @@ class Images {
  public:
   virtual ~Images() = default;
 
-  /// The image named `name`: a resource name, with or without the suffix of an image format, not a
-  /// path. Absent when the resources hold no such image.
+  /// Returns the image named `name`: a resource name, with or without the suffix of an image
+  /// format, not a path. Absent if there is no such image in the resources.
   virtual Ref<Image> imageNamed(std::string_view name) = 0;
 };
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The rules by which names lead to image files, and to nothing outside of the directory.
+// Maps names to image files, and never to a file outside the directory.
 
 #include "toolkit/image_names.hpp"
 
@@ -23,7 +23,7 @@ bool carriesSuffix(std::string_view name) {
 }
 
 bool isResourceName(std::string_view name) {
-  // Both separators, so that a script means the same on every system.
+  // Both separators on every system, so that a script means the same everywhere.
   return !name.empty() && name != ".." && name.find_first_of("/\\") == std::string_view::npos;
 }
 

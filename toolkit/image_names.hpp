@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Finding the file of an image by the name that scripts write, whatever a toolkit makes of the
-// file.
+// Finds the file of an image by its name in a script, for any toolkit.
 #pragma once
 
 #include <array>
@@ -10,14 +9,14 @@
 
 namespace toolkit {
 
-/// The suffixes of image formats, in the order in which a name without one is tried with them.
+/// The suffixes of image formats, in the order in which they are tried after a name without one.
 inline constexpr std::array<std::string_view, 9> imageSuffixes = {
     "png", "jpg", "jpeg", "gif", "tiff", "tif", "bmp", "icns", "pdf"};
 
-/// The path of the image file in `directory` that `name` means: the file of that very name if it
-/// carries an image suffix, of any case; else the first that is there of the name with a suffix
-/// behind it. A name is no path: one that holds a separator finds nothing, and neither do an empty
-/// one and "..".
+/// Returns the path of the image file in `directory` that `name` means: the file of exactly that
+/// name if it ends in an image suffix, in upper or lower case; otherwise the first existing file of
+/// the name with a suffix appended. Absent if there is none. A name is not a path: an empty name,
+/// ".." and a name with a separator find nothing.
 std::optional<std::string> imageFileNamed(std::string_view name, std::string_view directory);
 
 }  // namespace toolkit

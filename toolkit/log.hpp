@@ -10,7 +10,7 @@ class Log {
  public:
   virtual ~Log() = default;
 
-  /// Writes one line, given without its line end. Lines have no levels.
+  /// Writes one line, passed without its line end. Lines have no levels.
   virtual void write(std::string_view line) = 0;
 };
 

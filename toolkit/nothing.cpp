@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
-// The objects behind absent references: each accepts every message, does nothing and answers zero,
+// The objects behind absent references. Each accepts every message, does nothing and answers zero,
 // NO, empty or absent.
 //
-// Invariant: none of them has state, so that all absent references of a type can share one.
+// Invariant: none of them has state, so that all absent references of a type can share one object.
 
 #include "toolkit/image.hpp"
 #include "toolkit/run_loop.hpp"
@@ -13,16 +13,16 @@ namespace toolkit {
 
 namespace {
 
-// The one T that stands for nothing. Never destroyed: objects that end as the program exits may
-// still send messages to absent references.
+// Returns the one T that represents nothing. Never destroyed: objects that are destroyed at program
+// exit may still send messages to absent references.
 template <class T>
 T& theOnly() {
   static T* const object = new T;
   return *object;
 }
 
-// What every kind of view understands, and what only some do: nothing is no kind of view, so it
-// raises for none of it.
+// The messages that every view understands, and those that only some kinds do. An absent view
+// raises for none of them.
 template <class Role>
 class NothingView : public Role {
  public:

@@ -1,9 +1,10 @@
 // SPDX-License-Identifier: MIT
-// Reference that may be absent: the one place where "absent is not an error" lives.
+// A reference that may be absent: the one place that implements "absent is not an error".
 //
-// Every type T that is referred to this way has a static `T& nothing()`: an object that accepts
-// every message, does nothing and answers zero, NO or absent. `->` on an absent reference reaches
-// it, so callers send messages without asking first. Test for absence only where behaviour asks.
+// Every type T used this way has a static `T& nothing()`: an object that accepts every message,
+// does nothing and answers zero, NO or absent. `->` on an absent reference reaches this object, so
+// callers send messages without a test first. Test for absence only where the behaviour requires
+// it.
 #pragma once
 
 #include <cstddef>
@@ -13,9 +14,9 @@
 
 namespace toolkit {
 
-/// Owning reference to a T, or to nothing. `Pointer` is what owns: `std::shared_ptr` for objects of
-/// the toolkit, `Counted` for values (see value.hpp). Two references are equal when they refer to
-/// the same object, or both to nothing.
+/// An owning reference to a T, or to nothing. `Pointer` is the owning pointer: `std::shared_ptr`
+/// for toolkit objects, `Counted` for values (see value.hpp). Two references are equal if they
+/// refer to the same object or are both absent.
 template <class T, template <class> class Pointer = std::shared_ptr>
 class Ref {
  public:
@@ -31,7 +32,7 @@ class Ref {
   T* operator->() const { return *this ? object_.get() : &T::nothing(); }
   T& operator*() const { return *operator->(); }
 
-  /// The owning pointer itself; null when the reference is absent.
+  /// Returns the owning pointer; null if the reference is absent.
   const Pointer<T>& pointer() const& { return object_; }
   Pointer<T>&& pointer() && { return std::move(object_); }
 
@@ -41,8 +42,8 @@ class Ref {
   Pointer<T> object_;
 };
 
-/// Stored reference that says for each object it is given whether it keeps it alive (`own`) or
-/// leaves that to somebody else (`refer`); in the latter case it turns absent when the object goes.
+/// A stored reference that either keeps its object alive (`own`) or does not (`refer`); the latter
+/// becomes absent when the object is destroyed.
 template <class T>
 class StoredRef {
  public:
@@ -52,15 +53,15 @@ class StoredRef {
   static StoredRef refer(const Ref<T>& object) { return StoredRef(nullptr, object.pointer()); }
   StoredRef() = default;
 
-  /// The object, or absent when there is none or its owner let it go.
+  /// Returns the object; absent if there is none or its owner has released it.
   Ref<T> get() const { return owned_ ? owned_ : referred_.lock(); }
 
  private:
   StoredRef(std::shared_ptr<T> owned, const std::shared_ptr<T>& referred)
       : owned_(std::move(owned)), referred_(referred) {}
 
-  std::shared_ptr<T> owned_;   // ours to keep alive
-  std::weak_ptr<T> referred_;  // its owner's
+  std::shared_ptr<T> owned_;   // kept alive by this reference
+  std::weak_ptr<T> referred_;  // kept alive by its owner
 };
 
 }  // namespace toolkit

@@ -11,14 +11,15 @@ namespace toolkit {
 
 class View;
 
-/// The target of a control, or a link of the chain along which the action of a control without a
-/// target travels: the control, its superviews, their window, the window's delegate.
+/// The target of a control, or a link of the responder chain. The action of a control without a
+/// target travels along this chain: the control, its superviews, their window, the window's
+/// delegate.
 class Responder {
  public:
   virtual ~Responder() = default;
 
-  /// Performs `action` (a selector's text such as "buttonPushed:") on behalf of `sender`. NO when
-  /// this responder does not understand the action; the next one of the chain is asked then.
+  /// Performs `action` (a selector's text such as "buttonPushed:") on behalf of `sender`. NO if
+  /// this responder does not understand the action; the next one in the chain is then asked.
   virtual bool tryToPerform(std::string_view action, const Ref<View>& sender);
 };
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Files through the standard library, which reports everything by error codes here: a path that
-// cannot be looked at is a path where nothing is.
+// Files through the standard library, used with error codes: a path that cannot be examined counts
+// as a path without a file.
 
 #include "toolkit/system_files.hpp"
 
@@ -14,7 +14,7 @@ namespace fs = std::filesystem;
 
 namespace {
 
-// Paths are UTF-8 in the interface, and whatever the system has underneath.
+// Converts from UTF-8, which the interface uses, to the system's encoding.
 fs::path systemPath(std::string_view path) { return std::u8string(path.begin(), path.end()); }
 
 std::string utf8(const fs::path& path) {
@@ -22,8 +22,8 @@ std::string utf8(const fs::path& path) {
   return {text.begin(), text.end()};
 }
 
-// What is at `path`, links followed. A path that holds a NUL would reach the system cut off there,
-// and name another file.
+// Returns the kind of file at `path`, following links. A path with a NUL is not found: the system
+// would cut it off there and find another file.
 fs::file_status statusOf(std::string_view path) {
   if (path.find('\0') != std::string_view::npos) return fs::file_status(fs::file_type::not_found);
   std::error_code error;

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Files as the operating system has them, for toolkits that have nothing of their own.
+// Files of the operating system, for toolkits whose platform has no file access of its own.
 #pragma once
 
 #include <optional>
@@ -12,15 +12,16 @@ namespace toolkit {
 
 class SystemFiles final : public Files {
  public:
-  /// The resource directory is the working directory until another is set.
+  /// Starts with the working directory as the resource directory.
   SystemFiles() { setResourcePath(""); }
 
   std::string resourcePath() const override { return resourcePath_; }
-  /// A relative path, and an empty one, starts at the working directory of this moment.
+  /// Sets the resource directory. A relative or empty path is resolved against the current working
+  /// directory, once.
   void setResourcePath(std::string_view path);
 
   bool fileExistsAtPath(std::string_view path) const override;
-  /// Regular files only: what a device or a pipe would give is not known beforehand, nor its end.
+  /// Reads regular files only: a device or a pipe may never end.
   std::optional<std::string> contentsAtPath(std::string_view path) const override;
 
  private:

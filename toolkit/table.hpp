@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: MIT
-// Tables of things that are no values (controls, timers) under string keys, and lists of them.
+// Tables, with string keys, and lists of objects that are not script values (controls, timers).
 //
-// Both are shared: who asks the engine for one holds the very object that the engine changes. On an
-// absent table or list every change does nothing and every question answers zero or absent.
+// Both are shared: a getter of the engine returns the object that the engine itself changes. On an
+// absent table or list, changes do nothing and queries answer zero or absent.
 //
-// A thing that is taken out may end, and its end may use the table: so a change is complete before
-// anything is let go of.
+// An object that is removed may be destroyed, and its destructor may use the table. Therefore a
+// change is complete before any object is released.
 #pragma once
 
 #include <cstddef>
@@ -32,9 +32,9 @@ class Table {
   static Ref<Table> make() { return std::shared_ptr<Table>(new Table(true)); }
 
   std::size_t count() const { return entries_.size(); }
-  /// The entries by key, in the keys' order.
+  /// The entries, sorted by key.
   const Entries& entries() const { return entries_; }
-  /// The entry under `key`, or a T made of nothing.
+  /// Returns the entry under `key`, or a default T.
   T objectForKey(std::string_view key) const {
     const auto found = entries_.find(key);
     return found == entries_.end() ? T{} : found->second;
@@ -53,7 +53,7 @@ class Table {
   explicit Table(bool exists) : exists_(exists) {}
 
   Entries entries_;
-  bool exists_;  // false only of the one that stands for an absent table
+  bool exists_;  // false only for the object behind absent tables
 };
 
 template <class T>
@@ -77,7 +77,7 @@ class List {
   explicit List(bool exists) : exists_(exists) {}
 
   std::vector<T> elements_;
-  bool exists_;  // false only of the one that stands for an absent list
+  bool exists_;  // false only for the object behind absent lists
 };
 
 }  // namespace toolkit

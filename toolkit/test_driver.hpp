@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Driving a toolkit from outside, as its user and its host do: one driver stands beside each
-// backend, so that the same scenarios and the same player run on every toolkit.
+// Drives a toolkit from outside, as its user and its host do. Each backend has a driver, so that
+// the same scenarios and the same player run on every toolkit.
 #pragma once
 
 #include <functional>
@@ -15,17 +15,17 @@
 
 namespace toolkit {
 
-/// The kinds of view that a host can be asked to make.
+/// The kinds of view that a driver can make.
 enum class ViewKind { button, toggle, mixed, popUpButton, textField, imageView, box, plain };
 
-/// What a view is and shows, read at one moment.
+/// A snapshot of a view.
 struct ViewPicture {
-  ViewKind kind = ViewKind::plain;  // push, toggle or mixed by the button's behaviour
+  ViewKind kind = ViewKind::plain;  // button, toggle or mixed, by the button's behaviour
   std::string className;
   Tag tag = 0;
   Rect frame;
   bool hidden = false;
-  bool enabled = true;  // YES of a view that cannot be disabled
+  bool enabled = true;  // YES for a view that cannot be disabled
   State state = State::off;
   bool highlighted = false;
   AttributedString title;  // buttons
@@ -34,10 +34,10 @@ struct ViewPicture {
   std::optional<std::string> image;  // the name of an image view's image
   std::shared_ptr<Responder> target;
   std::optional<std::string> action;
-  std::optional<Color> background;  // a button's, within its bezel
+  std::optional<Color> background;  // of a button, within its bezel
 };
 
-/// What a window is and shows, read at one moment.
+/// A snapshot of a window.
 struct WindowPicture {
   bool visible = false;
   bool key = false;
@@ -49,76 +49,79 @@ struct WindowPicture {
   bool layered = false;                   // the content view draws through a layer
   std::optional<std::string> layerImage;  // the name of its layer's contents
   Ref<Window> sheetOf;                    // the window it is attached to as a sheet
-  std::vector<long> sheetEnds;            // return codes of the ends asked for, in order
+  std::vector<long> sheetEnds;            // return codes of all requests to end it, in order
 };
 
 class TestDriver {
  public:
   virtual ~TestDriver() = default;
 
-  /// The name that `--toolkit` takes, such as "memory".
+  /// Returns the name for `--toolkit`, such as "memory".
   virtual std::string_view name() const = 0;
   virtual Toolkit& toolkit() = 0;
 
   // --- as the host ---
 
-  /// A host's window, on the screen. The caller owns it: destroying the reference destroys it.
+  /// Makes a host's window and shows it. The caller owns it: it is destroyed with the reference.
   virtual Ref<Window> makeWindow(const Rect& content) = 0;
-  /// A view of the kind, in front of what `parent` holds. `parent` owns it.
+  /// Makes a view of the kind, in front of the other views in `parent`. `parent` owns it.
   virtual Ref<View> makeView(ViewKind kind, Tag tag, const Rect& frame,
                              const Ref<View>& parent) = 0;
   virtual void removeFromSuperview(const Ref<View>& view) = 0;
   virtual void setFrame(const Ref<View>& view, const Rect& frame) = 0;
-  /// The text of a text field, the title of a button, the name of an image view's image.
+  /// Sets the text of a text field, the title of a button, or the image of an image view by its
+  /// name.
   virtual void setCaption(const Ref<View>& view, std::string_view text) = 0;
-  /// What the window's title bar says; nothing where there are no title bars.
+  /// Sets the text in the window's title bar; does nothing if there are no title bars.
   virtual void setWindowTitle(const Ref<Window>& /*window*/, std::string_view /*title*/) {}
-  /// Where the toolkit's resource directory lies from now on.
+  /// Sets the toolkit's resource directory.
   virtual void setResourcePath(std::string_view path) = 0;
-  /// The class name that this toolkit gives a view of the kind.
+  /// Returns this toolkit's class name for a view of the kind.
   virtual std::string_view className(ViewKind kind) const = 0;
 
   // --- as the user ---
 
-  /// A click with the primary button where the user sees the view. Hidden or disabled controls, and
-  /// those behind a sheet, take none.
+  /// Clicks with the primary mouse button where the user sees the view. Hidden and disabled
+  /// controls, and those behind a sheet, ignore the click.
   virtual void click(const Ref<View>& view) = 0;
-  /// Presses the primary button down on a button that would take the click, and keeps it down:
-  /// timers wait meanwhile, and `click` is a press by the keyboard. What was held before is let go.
+  /// Presses the primary mouse button on a button that accepts clicks, and holds it. Until it is
+  /// released, timers wait, and `click` presses buttons by the keyboard. A button that was held
+  /// before is released first.
   virtual void hold(const Ref<View>& view) = 0;
-  /// Lets the primary button up over the held button, which takes the click if it still can and no
-  /// key has pressed it meanwhile; then the timers fire that are due. Nothing happens where nothing
-  /// is held.
+  /// Releases the mouse button over the held button, which is clicked if it still accepts clicks
+  /// and was not pressed by the keyboard meanwhile. Then the timers that are due fire. Does nothing
+  /// if no button is held.
   virtual void letGo() = 0;
-  /// Lets time pass, at once: the clock jumps from timer to timer. 0 or more seconds.
+  /// Lets `seconds` (0 or more) pass at once: the clock jumps from timer to timer.
   virtual void advance(double seconds) = 0;
-  /// From now on `advance` takes as long as it says, so that a person can watch. Nothing changes
-  /// where there are no windows to watch.
+  /// Makes `advance` take real time from now on, so that a person can watch. Does nothing if there
+  /// are no visible windows.
   virtual void useRealTime() {}
 
   // --- with a person at the screen ---
 
   /// Whether a person can see the windows and act on them.
   virtual bool hasPerson() const { return false; }
-  /// Hands the windows over to that person. `willAct` is told of a control before its action is
-  /// sent on their behalf. `goesOn` is asked whenever something may have happened; NO ends it. What
-  /// an action or a timer raises leaves here.
+  /// Lets that person act until `goesOn` answers NO; it is asked whenever something may have
+  /// happened. `willAct` is called with a control before the person's press sends its action.
+  /// Exceptions of actions and timers leave this function.
   virtual void handOver(const std::function<void(const Ref<View>&)>& /*willAct*/,
                         const std::function<bool()>& /*goesOn*/) {}
 
   // --- as an observer ---
 
-  /// Whether windows have pixels, so that there can be pictures of them.
+  /// Whether windows have pixels, so that pictures of them can be saved.
   virtual bool draws() const { return false; }
-  /// Writes the window as it shows, with the window under it when it is a sheet, to a PNG file. NO
-  /// when the window is not on the screen, or the file cannot be written.
+  /// Saves a picture of the window to a PNG file, together with the parent window if it is a sheet.
+  /// NO if the window is not on the screen or the file cannot be written.
   virtual bool savePicture(const Ref<Window>& /*window*/, const std::string& /*path*/) {
     return false;
   }
 
   virtual ViewPicture look(const Ref<View>& view) = 0;
   virtual WindowPicture look(const Ref<Window>& window) = 0;
-  /// Where every log line goes as it comes. Without a sink, as at first, the lines go nowhere.
+  /// Passes every log line to `sink` as it is written. Without a sink, as at first, log lines are
+  /// discarded.
   virtual void setLogSink(std::function<void(std::string_view)> sink) = 0;
 };
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Times are doubles, so that an interval can be as long as a script asks for (1.8e19 s) and longer.
-// A repeating timer is due at its start plus a whole number of intervals, which does not drift.
+// Times are doubles, so that an interval can be as long as a script may ask for (1.8e19 s). A
+// repeating timer is due at its start plus a whole number of intervals, so that it does not drift.
 
 #include "toolkit/timed_run_loop.hpp"
 
@@ -14,11 +14,11 @@ namespace toolkit {
 
 namespace {
 
-// `NSTimer`'s least interval, in seconds.
+// `NSTimer`'s minimum interval, in seconds.
 constexpr double leastInterval = 0.0001;
 
-// A timer that is due this much later, in seconds, is due now: ten times 0.1 s is one second to
-// whoever lets the time pass, whatever the sum of the doubles is.
+// In seconds. A timer that is due this much later counts as due: ten steps of 0.1 s must make one
+// second despite rounding.
 constexpr double slack = 1e-9;
 
 }  // namespace
@@ -42,8 +42,8 @@ class TimedRunLoop::ScheduledTimer final : public Timer {
 
   void invalidate() override {
     if (!loop_) return;
-    // Both may end when this function does: the action's holdings, which may come back here to an
-    // invalid timer, and then the timer.
+    // Destroyed at the end of this function, in this order: the action, whose objects may call the
+    // timer, which is then invalid; then perhaps the timer itself.
     const Queue::node_type place = loop_->queue_.extract(due_);
     const TimerAction action = std::exchange(action_, nullptr);
     loop_ = nullptr;
@@ -53,25 +53,25 @@ class TimedRunLoop::ScheduledTimer final : public Timer {
   friend class TimedRunLoop;
   friend class TimedRunLoop::Firing;
 
-  // Sets when it is due again, of times not before `now`.
+  // Sets the next due time, which is not before `now`.
   void step(double now) {
     firings_ += 1;
-    // What was missed, because a firing let time pass, is not made up for.
+    // Skips firings that were missed because a firing let time pass.
     if (start_ + firings_ * step_ < now) firings_ = std::floor((now - start_) / step_) + 1;
     due_.time = start_ + firings_ * step_;
   }
 
-  TimedRunLoop* loop_;  // outlives the timer's validity; null from the moment it is invalid
-  double interval_;     // as given
-  double step_;         // the interval that counts
-  double start_;        // when it was scheduled
-  double firings_ = 1;  // intervals from `start_` to `due_`; whole
+  TimedRunLoop* loop_;  // outlives the valid timer; null once the timer is invalid
+  double interval_;     // as passed to `schedule`
+  double step_;         // the effective interval
+  double start_;        // time of scheduling
+  double firings_ = 1;  // whole number of intervals from `start_` to `due_`
   Due due_;
   bool repeats_;
-  TimerAction action_;  // empty while it runs, and once the timer is invalid
+  TimerAction action_;  // empty while it runs and once the timer is invalid
 };
 
-// One firing, from taking the timer off the queue to putting it back, also when its action throws.
+// One firing: takes the timer off the queue and puts it back, even if its action throws.
 class TimedRunLoop::Firing {
  public:
   explicit Firing(TimedRunLoop& loop)
@@ -99,7 +99,7 @@ class TimedRunLoop::Firing {
   TimedRunLoop& loop_;
   Queue::node_type place_;
   std::shared_ptr<ScheduledTimer> timer_;
-  TimerAction action_;  // here and not in the timer, which may be invalidated while it runs
+  TimerAction action_;  // not in the timer, which may be invalidated while the action runs
 };
 
 void TimedRunLoop::invalidateAll() {

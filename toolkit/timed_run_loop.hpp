@@ -1,9 +1,8 @@
 // SPDX-License-Identifier: MIT
-// A run loop but for its clock: the queue of timers, and firing those that are due.
+// A run loop without a clock: keeps the queue of timers and fires those that are due.
 //
-// Invariants: the queue holds exactly the valid timers that are not firing at this moment, by the
-// time at which they are due and then by the order of their scheduling; an invalid timer takes up
-// nothing here.
+// Invariants: the queue holds exactly the valid timers that are not firing now, sorted by due time
+// and then by the order of scheduling. Invalid timers take up no space.
 #pragma once
 
 #include <cstdint>
@@ -21,29 +20,31 @@ class TimedRunLoop : public RunLoop {
   TimedRunLoop(const TimedRunLoop&) = delete;
   TimedRunLoop& operator=(const TimedRunLoop&) = delete;
 
-  /// Raises an invalid-argument exception when there is no action. An interval that is no number
-  /// counts as the least one, as does any below it.
+  /// Raises an invalid-argument exception if `action` is empty. An interval that is NaN or below
+  /// the minimum counts as the minimum.
   Ref<Timer> schedule(double interval, bool repeats, TimerAction action) override;
 
-  /// Seconds since a fixed moment. Never goes back.
+  /// Returns the seconds since a fixed moment. Never decreases.
   virtual double now() const = 0;
 
-  /// Whether timers may fire: not while the user is busy.
+  /// Whether timers may fire; NO while the user is busy.
   virtual bool isInDefaultMode() const = 0;
 
  protected:
-  /// Called with the time at which a timer was due, before each firing; the queue is without it.
+  /// Called before each firing with the time at which the timer was due. The timer is already off
+  /// the queue.
   virtual void reach(double due) = 0;
 
-  /// Fires what is due up to `until`, in order, as long as the run loop is in its default mode;
-  /// what a firing schedules counts too. A firing may let time pass itself: then the others that
-  /// come due fire inside it, and its own timer does not. Of the firings that a repeating timer
-  /// missed by `now()` none is made up for.
+  /// Fires the timers that are due up to `until`, in order, while the run loop is in its default
+  /// mode, including timers that a firing schedules. If a firing itself lets time pass, the other
+  /// timers that come due fire inside it; its own timer does not. A repeating timer skips the
+  /// firings that it has missed.
   void fireDue(double until);
-  /// When the next timer is due; nothing where there is none.
+  /// Returns the time at which the next timer is due; absent if there is no timer.
   std::optional<double> nextDue() const;
-  /// Invalidates every timer. What their actions hold ends here and may still use this run loop, so
-  /// that the destructors of the derived classes call it, and none is left for this one's.
+  /// Invalidates every timer. This destroys the objects held by their actions, which may still use
+  /// the run loop. Therefore the destructors of derived classes must call it: this class's
+  /// destructor runs too late.
   void invalidateAll();
 
  private:
@@ -52,14 +53,14 @@ class TimedRunLoop : public RunLoop {
 
   struct Due {
     double time;          // on this clock, in seconds
-    std::uint64_t order;  // of scheduling; unique
+    std::uint64_t order;  // the number of its scheduling; unique
     bool operator<(const Due& other) const {
       return time < other.time || (time == other.time && order < other.order);
     }
   };
   using Queue = std::map<Due, std::shared_ptr<ScheduledTimer>>;
 
-  std::uint64_t scheduled_ = 0;  // how many timers there have been
+  std::uint64_t scheduled_ = 0;  // number of timers scheduled so far
   Queue queue_;
 };
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What a toolkit does when its platform has nothing of its own for it.
+// The defaults of a toolkit.
 
 #include "toolkit/toolkit.hpp"
 

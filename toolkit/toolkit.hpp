@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// A toolkit: the roles through which the engine reaches its platform, in one hand.
+// A toolkit: bundles the interfaces through which the engine reaches its platform.
 #pragma once
 
 #include <optional>
@@ -15,7 +15,7 @@
 
 namespace toolkit {
 
-/// Handed to an engine at its construction; outlives every engine that runs on it. All of it is
+/// Passed to an engine at its construction; must outlive every engine that uses it. All of it is
 /// used on one thread, the application's event thread.
 class Toolkit {
  public:
@@ -28,8 +28,8 @@ class Toolkit {
   virtual Files& files() = 0;
   virtual Log& log() = 0;
 
-  /// The text of an HTML document; absent when it cannot be read. A platform that reads HTML itself
-  /// does so here; others get the reader in styled_text/.
+  /// Converts an HTML document to styled text; absent if it cannot be read. A platform with an HTML
+  /// reader of its own overrides this; the default is the reader in styled_text/.
   virtual std::optional<AttributedString> attributedStringWithHTML(std::string_view document);
 };
 

@@ -13,7 +13,8 @@ namespace toolkit {
 
 namespace {
 
-// Letters first, first + step, … last, whose upper-case form lies `distance` further on.
+// The letters first, first + step, …, last; the upper-case form of each is `distance` code points
+// further on.
 struct Range {
   char32_t first;
   char32_t last;
@@ -21,7 +22,7 @@ struct Range {
   int distance;
 };
 
-// A letter whose upper case is several characters, given in UTF-8.
+// A letter whose upper case consists of several characters, as UTF-8.
 struct Expansion {
   char32_t letter;
   std::string_view upper;
@@ -31,7 +32,7 @@ struct Expansion {
 
 struct Decoded {
   char32_t character;
-  std::size_t length;  // bytes; 0 where there is no UTF-8
+  std::size_t length;  // bytes; 0 if the bytes are not UTF-8
 };
 
 Decoded decode(std::string_view text) {
@@ -64,12 +65,12 @@ void appendUpper(std::string& out, char32_t c) {
   }
 }
 
-// Sets one of the two high bits of each of eight bytes that is a small letter of ASCII, one of the
-// six signs around them, or beyond ASCII. The bits below mean nothing.
+// Sets at least one of the two high bits of each byte that is a lower-case ASCII letter, one of the
+// six signs around those letters, or not ASCII. The lower bits of the result have no meaning.
 std::uint64_t notInUpperCase(std::uint64_t word) { return word & (word << 1 | words::highBits); }
 
-// Whether the text is ASCII without a small letter. Of a short one, and of one with those signs,
-// this says nothing: raising it takes no longer.
+// YES only if the text is ASCII without a lower-case letter. NO also for a short text and for one
+// with those signs: converting them takes no longer than a better test.
 bool isInUpperCase(std::string_view text) {
   if (text.size() < words::size) return false;
   std::uint64_t found = notInUpperCase(words::load(text.data() + text.size() - words::size));

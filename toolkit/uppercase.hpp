@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Upper case of text by Unicode's rules.
+// Conversion of text to upper case by Unicode's rules.
 #pragma once
 
 #include <string>
@@ -7,12 +7,12 @@
 
 namespace toolkit {
 
-/// `text` (UTF-8) in upper case by Unicode's full mappings, in no particular language. One
-/// character may become several: "ß" becomes "SS", the ligature "ﬁ" becomes "FI". What is no UTF-8
-/// stays.
+/// Returns `text` (UTF-8) in upper case by Unicode's full mappings, independent of language. One
+/// character may become several: "ß" becomes "SS", the ligature "ﬁ" becomes "FI". Bytes that are
+/// not UTF-8 stay as they are.
 std::string uppercased(std::string_view text);
-/// The same without a copy where `text` is in upper case at first sight: then it is `text` itself,
-/// or else what is then in `storage`.
+/// The same, but avoids the copy if a quick check shows that `text` is in upper case: then returns
+/// `text` itself. Otherwise the result is in `storage`.
 std::string_view uppercased(std::string_view text, std::string& storage);
 
 }  // namespace toolkit

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What a view answers to messages that only some kinds understand, and references to kinds of view.
+// The default answers of a view to messages that only some kinds understand, and references to
+// kinds of view.
 
 #include "toolkit/view.hpp"
 
@@ -37,7 +38,7 @@ void View::setAttributedTitle(const AttributedString&) {
 
 namespace {
 
-// The reference takes over the view's.
+// The result takes over the ownership of `view`.
 template <class T>
 Ref<T> seenAs(T* (View::*kind)(), Ref<View>&& view) {
   T* const seen = ((*view).*kind)();

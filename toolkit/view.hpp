@@ -1,9 +1,10 @@
 // SPDX-License-Identifier: MIT
-// Views and their kinds: what a window shows, and what a script drives by tag.
+// Views and their kinds: they make up a window, and scripts act on them by tag.
 //
-// A View is sent messages without being asked first what it is. What every view understands is pure
-// here; what only some kinds understand raises here ("unrecognized selector") and is overridden by
-// those that do. A superview owns its subviews; a control does not own its target or delegate.
+// Callers send a View messages without checking its kind first. Functions that every view
+// understands are pure here. Functions that only some kinds understand raise here ("unrecognized
+// selector") and are overridden by those kinds. A superview owns its subviews; a control does not
+// own its target or delegate.
 #pragma once
 
 #include <memory>
@@ -30,7 +31,7 @@ class View;
 /// The direct subviews of a view, back to front.
 using Subviews = std::vector<Ref<View>>;
 
-/// A button's state; `state` of anything that has none is `off`.
+/// A button's state. The `state` of a view without one is `off`.
 enum class State : int { mixed = -1, off = 0, on = 1 };
 
 class View : public Responder {
@@ -39,38 +40,40 @@ class View : public Responder {
 
   // --- what every view understands ---
 
-  /// The toolkit's run-time class name, such as "NSButton"; a subclass reports its own.
+  /// Returns the toolkit's run-time class name, such as "NSButton"; a subclass returns its own
+  /// name.
   virtual std::string className() const = 0;
 
-  /// Itself as the kind named, subclasses included, or null (`isKindOfClass:`).
+  /// Return this view as the named kind or a subclass of it; null if it is of another kind
+  /// (`isKindOfClass:`).
   virtual Button* asButton() { return nullptr; }
   virtual TextField* asTextField() { return nullptr; }
   virtual ImageView* asImageView() { return nullptr; }
   virtual Gradient* asGradient() { return nullptr; }
 
-  /// The number by which scripts find the view; a new view has the toolkit's default. Asking calls
-  /// nobody: a search asks it of every view of a live list.
+  /// Returns the number by which scripts find the view; a new view has the toolkit's default. Must
+  /// not call foreign code: a search reads the tags while it walks a live list of views.
   virtual Tag tag() const = 0;
   virtual void setTag(Tag tag) = 0;
 
-  /// Position and size in the superview's coordinates.
+  /// Returns the position and size in the superview's coordinates.
   virtual Rect frame() const = 0;
 
-  /// The live list of direct subviews; valid until a subview comes or goes.
+  /// Returns the live list of direct subviews; valid until a subview is added or removed.
   virtual const Subviews& subviews() const = 0;
-  /// Puts `view` in front of the subviews already there, taking it from where it was.
+  /// Adds `view` in front of the other subviews and removes it from its previous superview.
   virtual void addSubview(const Ref<View>& view) = 0;
 
   virtual void setHidden(bool hidden) = 0;
-  /// The tooltip's plain text; an empty text removes it.
+  /// Sets the tooltip to plain text; an empty text removes it.
   virtual void setToolTip(std::string_view text) = 0;
-  /// Whether a redraw is pending. Asking changes nothing.
+  /// Whether a redraw is pending. Does not request one.
   virtual bool needsDisplay() const = 0;
 
-  /// Whether the view draws through a layer, which alone can have contents.
+  /// Sets whether the view draws through a layer. Only a layer can have contents.
   virtual void setWantsLayer(bool wants) = 0;
-  /// Shows `image` scaled to the whole of the view's layer, behind the subviews; absent clears it.
-  /// Without a layer nothing happens.
+  /// Shows `image`, scaled to fill the view's layer, behind the subviews; an absent image clears
+  /// the layer. Does nothing without a layer.
   virtual void setLayerContents(const Ref<Image>& image) = 0;
 
   // --- what some kinds understand ---
@@ -81,29 +84,29 @@ class View : public Responder {
   virtual void setStringValue(std::string_view text);              // controls
   virtual void setAttributedStringValue(const AttributedString&);  // controls
   virtual void highlight(bool highlighted);                        // buttons: the pressed-in look
-  /// The title as shown, with its attributes; absent only where there is no view.
+  /// Returns the displayed title with its attributes; absent only if the view itself is absent.
   virtual std::optional<AttributedString> attributedTitle() const;  // buttons
   virtual void setAttributedTitle(const AttributedString& title);   // buttons
-  /// The one of these that does not raise: a view without a state is off.
+  /// The only one of these that does not raise: a view without a state is off.
   virtual State state() const { return State::off; }
 };
 
 /// A view that the user can act on.
 class Control : public View {
  public:
-  /// An enabled control takes the user's input.
+  /// Sets whether the control accepts the user's input.
   void setEnabled(bool enabled) override = 0;
-  /// Whom the action is sent to. The target is not kept alive; with none (absent, or gone) the
-  /// action travels the responder chain.
+  /// Sets the receiver of the action, which is not kept alive. If it is absent or destroyed, the
+  /// action travels along the responder chain.
   virtual void setTarget(const std::shared_ptr<Responder>& target) = 0;
-  /// The selector's text of what is sent when the user acts, such as "buttonPushed:".
+  /// Sets the message sent when the user acts: a selector such as "buttonPushed:".
   void setAction(std::string_view action) override = 0;
-  /// Sends `action` to `target`, or along the responder chain without one, with this control as
-  /// the sender; whether anybody performed it. Asks neither for enabled nor for hidden.
+  /// Sends `action` to `target`, or along the responder chain if it is null, with this control as
+  /// the sender. True if a responder performed it. Works for disabled and hidden controls too.
   virtual bool sendAction(std::string_view action, const std::shared_ptr<Responder>& target) = 0;
 
   std::string stringValue() const override = 0;
-  /// Shows plain text, in the control's own font and colour.
+  /// Shows plain text in the control's own font and colour.
   void setStringValue(std::string_view text) override = 0;
   void setAttributedStringValue(const AttributedString& text) override = 0;
 };
@@ -111,38 +114,39 @@ class Control : public View {
 /// How a button's edge is drawn (`NSBezelStyle`).
 enum class BezelStyle : int { rounded = 1, texturedSquare = 8 };
 
-/// A push, on/off or three-state button.
+/// A push button, on/off button or three-state button.
 class Button : public Control {
  public:
   static Button& nothing();
   Button* asButton() override { return this; }
 
-  /// Its plain title, replacing any attributed one.
+  /// Sets the plain title, which replaces any attributed title.
   virtual void setTitle(std::string_view title) = 0;
   std::optional<AttributedString> attributedTitle() const override = 0;
   void setAttributedTitle(const AttributedString& title) override = 0;
 
   State state() const override = 0;
-  /// Sets the state without sending the action. A button that has no mixed state turns on.
+  /// Sets the state without sending the action. A button without a mixed state turns on instead of
+  /// mixed.
   virtual void setState(State state) = 0;
 
   virtual bool isHighlighted() const = 0;
   void highlight(bool highlighted) override = 0;
 
-  /// The colour behind the title, within the bezel.
+  /// Sets the colour behind the title, within the bezel.
   virtual void setBackgroundColor(const Color& color) = 0;
   virtual void setBezelStyle(BezelStyle style) = 0;
 };
 
-/// A field of text, editable or a label.
+/// A text field, editable or used as a label.
 class TextField : public Control {
  public:
   static TextField& nothing();
   TextField* asTextField() override { return this; }
 
-  /// A text field has no title of its own: this sets its text.
+  /// Sets the text: a text field has no title of its own.
   virtual void setTitle(std::string_view title) = 0;
-  /// Whom the field tells about editing. Not kept alive.
+  /// Sets the object that is notified of editing. Not kept alive.
   virtual void setDelegate(const std::shared_ptr<Responder>& delegate) = 0;
 };
 
@@ -150,7 +154,7 @@ class TextField : public Control {
 enum class ImageFrameStyle : int { none = 0 };
 /// How an image is fitted (`NSImageScaling`): shrunk to fit with its proportions, never enlarged.
 enum class ImageScaling : int { proportionallyDown = 0 };
-/// Where an image lies that does not fill its view (`NSImageAlignment`).
+/// The position of an image that does not fill its view (`NSImageAlignment`).
 enum class ImageAlignment : int { center = 0 };
 
 /// A view that shows one image.
@@ -159,21 +163,21 @@ class ImageView : public Control {
   static ImageView& nothing();
   ImageView* asImageView() override { return this; }
 
-  /// Absent shows nothing.
+  /// Shows `image`; an absent image clears the view.
   virtual void setImage(const Ref<Image>& image) = 0;
   virtual void setImageFrameStyle(ImageFrameStyle style) = 0;
   virtual void setImageScaling(ImageScaling scaling) = 0;
   virtual void setImageAlignment(ImageAlignment alignment) = 0;
 };
 
-/// A painted surface that a host uses like a button (the kind `NSGradient`). Whether it takes an
-/// action is the toolkit's affair: as a plain view it raises.
+/// A painted surface that a host uses like a button (the kind `NSGradient`). `setAction` raises, as
+/// for a plain view, unless the toolkit overrides it.
 class Gradient : public View {
  public:
   Gradient* asGradient() override { return this; }
 };
 
-/// `view` as the kind asked for, or absent when it is none or of another kind.
+/// Return `view` as the named kind; absent if it is absent or of another kind.
 Ref<Button> asButton(Ref<View> view);
 Ref<TextField> asTextField(Ref<View> view);
 Ref<ImageView> asImageView(Ref<View> view);

@@ -12,7 +12,7 @@ namespace toolkit {
 
 /// Bits of a window's style mask (`NSWindowStyleMask`).
 enum class StyleMask : unsigned { titled = 1, closable = 2, titledAndClosable = 3 };
-/// How a window's pixels are kept (`NSBackingStoreType`).
+/// How a window's pixels are stored (`NSBackingStoreType`).
 enum class BackingStore : unsigned { buffered = 2 };
 
 class Window {
@@ -20,21 +20,21 @@ class Window {
   virtual ~Window() = default;
   static Window& nothing();
 
-  /// The view that holds the window's controls; owned by the window.
+  /// Returns the view that holds the window's controls; owned by the window.
   virtual Ref<View> contentView() const = 0;
 
-  /// Whom the window tells of what happens to it, and the end of its responder chain; null when it
-  /// has none or the delegate is gone. The window does not keep it alive.
+  /// Returns the object that is notified of the window's events and ends its responder chain; null
+  /// if there is none or it was destroyed. The window does not keep it alive.
   virtual std::shared_ptr<Responder> delegate() const = 0;
   virtual void setDelegate(const std::shared_ptr<Responder>& delegate) = 0;
 
   virtual void setBackgroundColor(const Color& color) = 0;
 
-  /// Shows the window in front of the others and gives it the keyboard.
+  /// Shows the window in front of the others and gives it the keyboard focus.
   virtual void makeKeyAndOrderFront() = 0;
   /// Takes the window off the screen; it can be shown again. A sheet leaves its parent.
   virtual void orderOut() = 0;
-  /// Closes the window: off the screen, and no longer kept alive by the application.
+  /// Takes the window off the screen; the application no longer keeps it alive.
   virtual void close() = 0;
 };
 

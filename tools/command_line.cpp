@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Reading the command line with CLI11, and saying in the tool's own words what is wrong with it.
+// Reads the command line with CLI11 and reports its errors in the tool's own words.
 #include "tools/command_line.hpp"
 
 #include <CLI/CLI.hpp>
@@ -13,13 +13,13 @@
 namespace tools {
 namespace {
 
-/// The command that was given, or the tool itself when there is none.
+/// Returns the command that was given, or the tool itself if there is none.
 const CLI::App& chosen(const CLI::App& app) {
   const auto commands = app.get_subcommands();
   return commands.empty() ? app : *commands.front();
 }
 
-/// Why no command was recognised: which there are, and what stands where one should.
+/// Says that a command was expected: which there are, and what was found instead.
 std::string commandExpected(const CLI::App& app) {
   std::vector<std::string_view> names;
   for (const CLI::App* command : app.get_subcommands({})) names.push_back(command->get_name());
@@ -42,7 +42,7 @@ std::string unexpectedArgument(const CLI::App& command) {
   return "unknown option " + name + didYouMean(name, {options.begin(), options.end()});
 }
 
-/// CLI11 says "--start: At Most 1 required but received 2" of an option that stands twice.
+/// CLI11 says "--start: At Most 1 required but received 2" of an option that is given twice.
 std::string givenTwice(std::string words) {
   constexpr std::string_view most = ": At Most 1 required but received ";
   const std::size_t at = words.find(most);
@@ -68,14 +68,14 @@ std::string missingValue(std::string words) {
   return words.replace(at, required.size(), ": expected ");
 }
 
-/// What is wrong with the command line, in one line.
+/// Says what is wrong with the command line, in one line.
 std::string explain(const CLI::ParseError& error, const CLI::App& app) {
   const CLI::App& command = chosen(app);
   std::string words = error.what();
   if (&command == &app) {
     words = commandExpected(app);
   } else if (command.remaining_size(true) > 0) {
-    // Whatever else is wrong, what is not understood comes first: it may be the reason.
+    // An argument that is not understood comes first: it may cause the other errors.
     words = unexpectedArgument(command);
   } else if (dynamic_cast<const CLI::ArgumentMismatch*>(&error)) {
     words = givenTwice(flagWithValue(missingValue(std::move(words))));
@@ -88,7 +88,7 @@ std::string whyNotPath(const std::string& argument) {
   return argument.empty() ? "expected a path, found an empty text" : "";
 }
 
-/// Calls `take`; the library knows its own errors only.
+/// Calls `take` and translates its error: CLI11 handles only its own.
 void hand(const Command::Take& take, const std::string& value) {
   try {
     take(value);
@@ -120,8 +120,8 @@ Command::Option& Command::Option::excludes(Option& other) {
   return *this;
 }
 
-// Every option hands its words over as they are: the library's conversions are templates, which
-// cost more to compile than all the rest of this file.
+// Options pass their words on unconverted: CLI11's conversions are templates, which take longer to
+// compile than the rest of this file.
 namespace {
 
 CLI::callback_t storeIn(std::string& value) {
@@ -204,13 +204,13 @@ int runCommandLine(const ToolHelp& help, const std::vector<CommandEntry>& comman
   app.get_formatter()->label("Subcommands", "Commands");
   app.require_subcommand(1);
   app.option_defaults()
-      ->disable_flag_override();  // else "--list=3" would do, whatever it is to mean
+      ->disable_flag_override();  // otherwise "--list=3" would be accepted without an error
   for (const CommandEntry& entry : commands) {
     Command command(*app.add_subcommand(entry.name, entry.summary), status);
     entry.describe(command);
   }
   try {
-    // CLI11 takes the arguments from the back.
+    // CLI11 expects the arguments in reverse order.
     std::reverse(arguments.begin(), arguments.end());
     app.parse(std::move(arguments));
     return status;

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The command line of the tool: what its commands take, and reading it. The library that does the
-// reading is known to command_line.cpp only; its header takes seconds to compile.
+// The command line of the tool: declares what its commands take, and reads it. Only
+// command_line.cpp includes CLI11, the library that reads it: its header takes seconds to compile.
 #pragma once
 
 #include <functional>
@@ -16,27 +16,28 @@ class Option;
 
 namespace tools {
 
-/// Thrown for a value that an option cannot take. The message says what was expected.
+/// Thrown for a value that an option does not accept. The message says what was expected.
 class UsageError : public std::runtime_error {
  public:
   using std::runtime_error::runtime_error;
 };
 
-/// What one command takes. The values that are handed over by reference are set before the action
-/// runs, and outlive the command line's reading; what the user leaves out stays as it is.
+/// Declares the arguments and options of one command. The variables passed by reference must
+/// outlive the reading of the command line. They are set before the action runs; a variable whose
+/// option the user leaves out keeps its value.
 class Command {
  public:
-  /// An option that was added, for what else is to be said about it.
+  /// An option that was added; its functions refine it.
   class Option {
    public:
     explicit Option(CLI::Option* option) : option_(option) {}
-    /// How the help names the option's value.
+    /// Sets how the help names the option's value.
     Option& valueName(const std::string& name);
-    /// The help says what holds when the user leaves the option out: the value as it is now.
+    /// Shows the variable's present value in the help, as the default.
     Option& showDefault();
-    /// An empty text is refused.
+    /// Refuses an empty text.
     Option& path();
-    /// The user can give only one of the two.
+    /// Lets the user give only one of the two.
     Option& excludes(Option& other);
 
    private:
@@ -45,9 +46,9 @@ class Command {
 
   explicit Command(CLI::App& app, int& status) : app_(app), status_(status) {}
 
-  /// An argument without a name, which must be given.
+  /// Adds a required positional argument.
   Option argument(const std::string& name, std::string& value, const std::string& help);
-  /// One argument or more without a name.
+  /// Adds a positional argument that takes one or more values.
   Option arguments(const std::string& name, std::vector<std::string>& values,
                    const std::string& help);
   Option option(const std::string& name, std::string& value, const std::string& help);
@@ -55,17 +56,17 @@ class Command {
                 const std::string& help);
   Option flag(const std::string& name, bool& value, const std::string& help);
 
-  /// What is done with a value or with several; may throw a UsageError.
+  /// Called with each value; may throw a UsageError.
   using Take = std::function<void(const std::string& value)>;
-  /// An option whose value is handed to `take` once the whole line is read.
+  /// Adds an option whose value is passed to `take` once the whole line is read.
   Option taken(const std::string& name, Take take, const std::string& help);
-  /// An option that can be given again and again. `take` is called while the line is read, so that
-  /// calls come in the order of the line, across options.
+  /// Adds an option that can be given any number of times. `take` is called while the line is read,
+  /// so that the calls of all such options come in the order of the line.
   Option repeated(const std::string& name, Take take, const std::string& help);
   /// The same for an option that takes all values up to the next option.
   Option repeatedList(const std::string& name, Take take, const std::string& help);
 
-  /// Runs once the line is read. Gives the tool's exit status, or throws a Failure.
+  /// Sets what runs once the line is read; `run` returns the exit status or throws a Failure.
   void action(std::function<int()> run);
 
  private:
@@ -88,9 +89,9 @@ struct ToolHelp {
   std::string exitStatuses;
 };
 
-/// Reads the arguments behind the tool's name and runs the command that they name. Gives its exit
-/// status; 0 where help or the version was asked for, which are printed. Throws a Failure where the
-/// arguments make no sense, and hands on what the command throws.
+/// Reads the arguments that follow the tool's name and runs the command that they name. Returns the
+/// command's exit status, or 0 after printing the help or the version. Throws a Failure if the
+/// arguments make no sense, and passes on what the command throws.
 int runCommandLine(const ToolHelp& help, const std::vector<CommandEntry>& commands,
                    std::vector<std::string> arguments);
 

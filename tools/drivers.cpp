@@ -27,7 +27,7 @@ constexpr NamedDriver drivers[] = {
 #endif
 };
 
-// What to do about a toolkit that other builds have; nothing for any other name.
+// Says how to get a toolkit that other builds have; empty for any other name.
 std::string_view howToGet(std::string_view name) {
   if (name != "qt") return {};
   return "this build is without Qt; install Qt 6.4 Widgets or later (scripts/setup qt, on Debian), "

@@ -11,17 +11,16 @@
 
 namespace tools {
 
-/// The names that `--toolkit` takes.
+/// Returns the names that `--toolkit` accepts.
 std::vector<std::string_view> driverNames();
 
-/// The toolkit to play scripts on where none is asked for: one with windows to see, if this build
-/// has one.
+/// Returns the default toolkit for playing scripts: one that shows windows, if the build has one.
 std::string playerToolkit();
 
-/// A driver with a toolkit of its own; null when this build has none of that name.
+/// Makes a driver with its own toolkit; null if this build has no toolkit of that name.
 std::unique_ptr<toolkit::TestDriver> makeDriver(std::string_view name);
 
-/// The same, but a Failure where that gives null.
+/// The same, but throws a Failure instead of returning null.
 std::unique_ptr<toolkit::TestDriver> requireDriver(std::string_view name);
 
 }  // namespace tools

@@ -17,10 +17,10 @@
 namespace tools {
 namespace {
 
-constexpr std::size_t narrowest = 72;  // columns; a picture needs them
-constexpr std::size_t widest = 140;    // lines any longer are hard to read
+constexpr std::size_t narrowest = 72;  // columns; a picture needs this many
+constexpr std::size_t widest = 140;    // longer lines are hard to read
 
-/// How to write to standard output: in colour to a terminal whose user has nothing against it.
+/// The style for standard output: the width of its terminal, and colour if that shows it.
 play::Style outputStyle() {
   play::Style style;
   if (::isatty(STDOUT_FILENO) == 0) return style;

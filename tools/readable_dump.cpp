@@ -19,14 +19,14 @@ using toolkit::Value;
 constexpr std::size_t bytesInGroup = 4;
 constexpr std::size_t bytesInLine = 32;
 
-/// The paints of a terminal, by what they stand for.
+/// The terminal's colour codes, by kind of value.
 constexpr std::string_view keyPaint = "1";
 constexpr std::string_view stringPaint = "32";
 constexpr std::string_view numberPaint = "36";
 constexpr std::string_view otherPaint = "35";
 
-/// What stands for a character that quotation marks cannot hold; empty for any other. A terminal's
-/// own layout of text would lose which of these it was.
+/// Returns the escape of a character that cannot appear as it is between quotation marks; empty for
+/// any other. A tab and the separators are here because `oneLine` would not tell them from others.
 std::string_view escapeFor(char32_t c) {
   switch (c) {
     case '"':
@@ -44,7 +44,7 @@ std::string_view escapeFor(char32_t c) {
   }
 }
 
-/// Half of a surrogate pair, which no terminal can show.
+/// Returns the escape of half a surrogate pair, which no terminal can show.
 std::string surrogateEscape(char32_t c) {
   constexpr std::string_view digits = "0123456789abcdef";
   std::string text = "\\u{";
@@ -54,7 +54,7 @@ std::string surrogateEscape(char32_t c) {
 
 std::string quoted(std::string_view text) {
   std::string result = "\"";
-  std::size_t plain = 0;  // where what is not yet in the result begins
+  std::size_t plain = 0;  // where the text that is not yet in the result begins
   for (std::size_t at = 0; at < text.size();) {
     const std::size_t start = at;
     const char32_t c = toolkit::nextCodePoint(text, at);
@@ -78,7 +78,8 @@ std::string showNumber(const toolkit::Number& number) {
 
 std::string lineStart(std::size_t level) { return "\n" + std::string(4 * level, ' '); }
 
-/// In groups; more than one line of them stands below, each line indented to `level`.
+/// Shows bytes in groups. More than one line of them begins on a new line, indented one level
+/// deeper than `level`.
 std::string showData(std::string_view bytes, std::size_t level) {
   constexpr std::string_view digits = "0123456789abcdef";
   const bool isLong = bytes.size() > bytesInLine;

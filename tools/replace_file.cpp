@@ -22,7 +22,7 @@ namespace fs = std::filesystem;
   throw Failure(ExitStatus::failed, path + ": cannot be written (" + std::strerror(error) + ")");
 }
 
-/// An open file; `path` is how messages call it.
+/// An open file; messages name it `path`.
 class Output {
  public:
   Output(int descriptor, std::string path) : descriptor_(descriptor), path_(std::move(path)) {
@@ -42,7 +42,7 @@ class Output {
     }
   }
   void setPermissions(mode_t mode) { require(::fchmod(descriptor_, mode)); }
-  /// Waits until the file is on the disk, where a full one shows at the latest.
+  /// Waits until the file is on the disk. A full disk is reported here at the latest.
   void finish() {
     require(::fsync(descriptor_));
     require(::close(std::exchange(descriptor_, -1)));
@@ -57,7 +57,7 @@ class Output {
   std::string path_;
 };
 
-/// A file that is gone when this ends, unless it has got another name before.
+/// Deletes its file on destruction, unless the file was renamed before.
 class TemporaryFile {
  public:
   explicit TemporaryFile(std::string path) : path_(std::move(path)) {}
@@ -69,7 +69,7 @@ class TemporaryFile {
   std::string path_;
 };
 
-/// The permissions of the file that is replaced, or those that any new file gets.
+/// Returns the permissions of the file that is replaced, or those of any new file.
 mode_t permissionsFor(const fs::path& target) {
   struct stat found {};
   if (::stat(target.c_str(), &found) == 0) return found.st_mode & 07777;

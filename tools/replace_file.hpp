@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Writes files so that there is always a whole one.
+// Replaces files so that a complete one always exists.
 #pragma once
 
 #include <string>
@@ -7,9 +7,10 @@
 
 namespace tools {
 
-/// Makes `contents` what the file at `path` holds. The file that is there stays as it is until the
-/// new one is complete on the disk, and keeps its permissions; a symbolic link keeps leading to it.
-/// What is no regular file, such as a pipe, is written to. A Failure when that cannot be done.
+/// Replaces the contents of the file at `path`. The old file stays in place until the new one is
+/// complete on the disk. Permissions stay; a symbolic link still leads to the file. Anything but a
+/// regular file, such as a pipe, is written to directly. Throws a Failure if the file cannot be
+/// written.
 void replaceFile(const std::string& path, std::string_view contents);
 
 }  // namespace tools

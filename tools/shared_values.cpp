@@ -12,7 +12,7 @@
 namespace tools {
 namespace {
 
-// What any memory holds, and what files that share values with sense come to.
+// How many values any memory holds, and how many per byte files with reasonable sharing reach.
 constexpr std::uintmax_t alwaysFine = 10'000'000;
 constexpr std::uintmax_t valuesPerByte = 100;
 

@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: MIT
-// Guards against binary property lists that are small but stand for more than any memory holds:
-// they may have one collection in many places, and such collections in one another.
+// Guards against small binary property lists that no memory could hold when written out: one
+// collection may appear in many places, and such collections may be nested.
 #pragma once
 
 #include "tools/play/input_file.hpp"
 
 namespace tools {
 
-/// A Failure when what the file stands for, written out in full, is out of all proportion to it.
+/// Throws a Failure if the file, written out in full, would be out of all proportion to its size.
 void requireWritableInFull(const play::InputFile& file);
 
 }  // namespace tools

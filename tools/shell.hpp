@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The tool's shell: runs a command line, and turns whatever goes wrong into one line and an exit
-// status.
+// The tool's shell: runs a command line, and turns every error into one line and an exit status.
 #pragma once
 
 #include <string>
@@ -10,8 +9,8 @@
 
 namespace tools {
 
-/// Runs the tool with the arguments behind its name. Gives its exit status. What goes wrong is one
-/// line on standard error.
+/// Runs the tool with the arguments that follow its name. Returns its exit status. Reports an error
+/// as one line on standard error.
 int runTool(const std::vector<std::string>& arguments, const std::vector<CommandEntry>& commands);
 
 }  // namespace tools

@@ -20,8 +20,8 @@ namespace {
 struct Guarded {
   const QZ_Plist_State_Parser* engine = nullptr;
   std::map<toolkit::Tag, std::string>
-      lineOf;             // what to say, by the tag of the list that was started last
-  std::string otherwise;  // what to say of any other
+      lineOf;             // messages, by the tag of the list that was started last
+  std::string otherwise;  // the message for any other list
 };
 
 Guarded guarded;  // the script that runs; the tool has one thread
@@ -50,26 +50,26 @@ void forgetScript() { guarded = {}; }
 
 namespace {
 
-// How far from the end of the stack an access counts as one that ran over it, in bytes.
+// A bad access this close to the end of the stack, in bytes, counts as a stack overflow.
 constexpr std::uintptr_t reach = 1 << 20;
-constexpr unsigned patience = 2;  // seconds
+constexpr unsigned patience = 2;  // seconds to wait for the engine's lock
 
 std::uintptr_t stackEnd = 0;  // its lowest address
 alignas(16) char signalStack[1 << 16];
 
 [[noreturn]] void endWith(std::string_view line) {
-  // Nobody is left to tell when this fails.
+  // If this fails, nobody is left to tell.
   [[maybe_unused]] const auto written = ::write(STDERR_FILENO, line.data(), line.size());
   ::_exit(static_cast<int>(stackExhausted));
 }
 
-// Asking the engine takes a lock that the list may have died holding.
+// `onBadAccess` waits for a lock of the engine, which the list that crashed may hold for ever.
 void onTooLong(int) { endWith(guarded.otherwise); }
 
 void onBadAccess(int signal, siginfo_t* info, void*) {
   const auto address = reinterpret_cast<std::uintptr_t>(info->si_addr);
   if (!guarded.engine || address + reach < stackEnd || address > stackEnd + reach) {
-    ::signal(signal, SIG_DFL);  // something else: the access is made again, and crashes
+    ::signal(signal, SIG_DFL);  // not the stack: the access is repeated, and crashes
     return;
   }
   ::alarm(patience);

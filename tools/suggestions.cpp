@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Words that are known beside one that is not, by the distance between them.
+// Finds the known word that is nearest to an unknown one, by their edit distance.
 
 #include "tools/suggestions.hpp"
 
@@ -10,8 +10,8 @@
 namespace tools {
 namespace {
 
-// Row by row of the usual table of distances between prefixes; `before` is the row before the
-// last, which a swap of neighbours goes back to.
+// Computes the usual table of distances between prefixes row by row. `before` is the row before
+// the last one; a swap of neighbours needs it.
 std::size_t distance(std::string_view a, std::string_view b) {
   std::vector<std::size_t> before;
   std::vector<std::size_t> last(b.size() + 1);
@@ -30,7 +30,7 @@ std::size_t distance(std::string_view a, std::string_view b) {
   return last[b.size()];
 }
 
-// A word much longer than any candidate is none of them; measuring it would take long.
+// A word this long is much longer than any candidate, and measuring it would take long.
 constexpr std::size_t longestWord = 100;
 
 }  // namespace
@@ -51,7 +51,7 @@ std::optional<std::string> nearest(std::string_view word,
   std::size_t least = std::max<std::size_t>(1, word.size() / 3) + 1;
   for (const auto candidate : candidates) {
     const auto found = distance(word, candidate);
-    if (found >= least || found >= word.size()) continue;  // of one letter nothing would be left
+    if (found >= least || found >= word.size()) continue;  // every letter would differ
     least = found;
     nearest = std::string(candidate);
   }

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What a message about a word that nobody knows offers instead: the words that are known, and the
-// one that was probably meant.
+// Suggestions for messages about an unknown word: the known words, and the one that was probably
+// meant.
 #pragma once
 
 #include <optional>
@@ -10,15 +10,16 @@
 
 namespace tools {
 
-/// `a, b or c`.
+/// Returns `a, b or c`.
 std::string enumerate(const std::vector<std::string>& words);
 
-/// The candidate that differs from `word` in the fewest letters (left out, added, replaced, or two
-/// neighbours swapped), the first of equals; nothing when more than a third of it would differ.
+/// Returns the candidate that differs from `word` in the fewest letters (left out, added, replaced,
+/// or two neighbours swapped), the first of equals. Absent if more than a third of the letters, and
+/// more than one, or all of them would differ.
 std::optional<std::string> nearest(std::string_view word,
                                    const std::vector<std::string_view>& candidates);
 
-/// `; did you mean "candidate"?`, or an empty text.
+/// Returns `; did you mean "candidate"?` with the nearest candidate, or an empty text.
 std::string didYouMean(std::string_view word, const std::vector<std::string_view>& candidates);
 
 }  // namespace tools

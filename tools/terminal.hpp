@@ -4,8 +4,8 @@
 
 namespace tools {
 
-/// Whether to write in colour: to a terminal whose user has nothing against it (`NO_COLOR` in the
-/// environment, when it is not empty).
+/// Whether to write in colour: if standard output is a terminal, and `NO_COLOR` is unset or empty
+/// in the environment.
 bool outputShowsColor();
 
 }  // namespace tools

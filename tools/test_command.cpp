@@ -26,7 +26,7 @@ using scenario::Scenario;
 using scenario::Verdict;
 
 struct TestOptions {
-  std::vector<std::string> paths;  // scenario files, and directories that hold some
+  std::vector<std::string> paths;  // scenario files, and directories of them
   std::string toolkit = "memory";
   std::string filter;  // run only scenarios whose title contains this
   bool list = false;   // name the scenarios instead of running them
@@ -34,7 +34,7 @@ struct TestOptions {
   std::optional<std::string> junit;  // where to write a report
 };
 
-/// Opened before anything runs, so that a report that cannot be written is no surprise at the end.
+/// Opens the report. Called before anything runs, so that a bad path is reported at once.
 std::ofstream openReport(const std::string& path) {
   std::ofstream stream(path, std::ios::binary);
   if (!stream) throw Failure(ExitStatus::badInput, path + ": the report cannot be written");
@@ -75,7 +75,7 @@ void forEachChosen(const std::vector<LoadedFile>& files, const std::string& filt
   }
 }
 
-/// A run of nothing would look like one in which all went well.
+/// Throws a Failure if the filter matches no scenario: a run of none would look like a success.
 void requireAny(const std::vector<LoadedFile>& files, const std::string& filter) {
   bool any = false;
   forEachChosen(files, filter, [&](const LoadedFile&, const Scenario&) { any = true; });
@@ -108,11 +108,11 @@ std::vector<Report> run(const TestOptions& options, const std::vector<LoadedFile
   return reports;
 }
 
-/// Runs the scenarios and writes their failures and the counts to `out`, and to `problems` what
-/// makes a file no scenario. Gives the tool's exit status. Throws a Failure when a report cannot be
-/// written or there is no such toolkit.
+/// Runs the scenarios. Writes their failures and the counts to `out`, and the errors in scenario
+/// files to `problems`. Returns the tool's exit status. Throws a Failure if there is no such
+/// toolkit, no scenario matches the filter, or the report cannot be written.
 int runTests(const TestOptions& options, std::ostream& out, std::ostream& problems) {
-  requireDriver(options.toolkit);  // else it would be missed only where something runs
+  requireDriver(options.toolkit);  // reports an unknown toolkit even if nothing runs
   const auto read = scenario::readScenarios(options.paths);
   for (const auto& problem : read.problems) problems << oneLine(problem) << '\n';
   if (!read.problems.empty()) return static_cast<int>(ExitStatus::badInput);

@@ -23,8 +23,8 @@ struct Range {
   char32_t last;
 };
 
-/// The character at the start of `text`, which is not empty. What is no UTF-8 is one replacement
-/// character a byte; so is a surrogate, which no terminal can show.
+/// Returns the first character of `text`, which must not be empty. Each byte of invalid UTF-8, or
+/// of a surrogate (which no terminal can show), counts as one replacement character.
 Character firstCharacter(std::string_view text) {
   constexpr std::size_t longest = 4;
   if (toolkit::validUtf8Length(text.substr(0, longest)) == 0) return {};
@@ -59,7 +59,7 @@ std::size_t characterWidth(char32_t code) {
   return isIn(wide, code) ? 2 : 1;
 }
 
-/// Whether a terminal would act on the character, or turn the direction of what follows.
+/// Whether a terminal would act on the character or change the direction of the text that follows.
 bool disturbs(char32_t code) {
   static constexpr std::array<Range, 5> disturbing = {
       {{0x00, 0x1F}, {0x7F, 0x9F}, {0x200E, 0x200F}, {0x202A, 0x202E}, {0x2066, 0x2069}}};
@@ -74,7 +74,7 @@ std::string escaped(char32_t code) {
   return text.data();
 }
 
-/// Where to cut `line` so that at most `width` columns, and at least one character, come before.
+/// Returns where to cut `line`: after at most `width` columns, and after at least one character.
 std::size_t cutOff(std::string_view line, std::size_t width) {
   std::size_t bytes = 0;
   std::size_t columns = 0;
@@ -91,7 +91,7 @@ void wrapLine(std::string_view line, std::size_t width, std::vector<std::string>
   while (cutOff(line, width) < line.size()) {
     std::size_t end = cutOff(line, width);
     std::size_t next = end;
-    // A space that stands just behind the last column still breaks the line there.
+    // A space just after the last column still breaks the line there.
     if (const auto space = line.rfind(' ', end); space != std::string_view::npos && space > 0) {
       end = space;
       next = space + 1;

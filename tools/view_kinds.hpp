@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The kinds of view by the names that hosts' windows and scenarios write.
+// The kinds of view, by their names in host windows and scenarios.
 #pragma once
 
 #include <optional>
@@ -10,10 +10,10 @@
 
 namespace tools {
 
-/// The kind named, such as "NSButton:toggle"; nothing for any other name.
+/// Returns the kind with that name, such as "NSButton:toggle"; absent for any other name.
 std::optional<toolkit::ViewKind> viewKindNamed(std::string_view name);
 
-/// Every name, in the order in which they are documented.
+/// Returns every name, in the order of the documentation.
 std::vector<std::string_view> viewKindNames();
 
 }  // namespace tools

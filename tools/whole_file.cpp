@@ -10,7 +10,7 @@ std::optional<std::string> wholeFile(const std::string& path) {
   errno = 0;
   std::ifstream file(path, std::ios::binary);
   if (!file.is_open()) return std::nullopt;
-  // In blocks: inserting the stream's buffer into another would pass an error over in silence.
+  // In blocks: inserting the stream's buffer into another stream would hide a read error.
   std::string contents;
   char block[1 << 16];
   while (file.read(block, sizeof block) || file.gcount() > 0) {

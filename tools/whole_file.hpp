@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Reading a file as a whole.
+// Reads a whole file.
 #pragma once
 
 #include <optional>
@@ -7,7 +7,7 @@
 
 namespace tools {
 
-/// The contents of a file, or of a pipe up to its end. Absent when it cannot be opened, or not be
+/// Returns the contents of a file, or of a pipe up to its end. Absent if it cannot be opened or
 /// read to its end; `errno` then says why.
 std::optional<std::string> wholeFile(const std::string& path);
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// A host with windows of its own, and walk-throughs in its Help menu.
+// A host with its own windows, and walk-throughs in its Help menu.
 #include <QApplication>
 
 #include "guided_form.hpp"

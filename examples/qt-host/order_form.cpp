@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The form, laid out by hand as Designer would.
+// Lays out the form by hand, as Designer would.
 #include "order_form.hpp"
 
 #include <QGridLayout>
@@ -35,7 +35,7 @@ OrderForm::OrderForm() {
   grid->addWidget(&picture, 8, 0);
   grid->addWidget(&guide, 8, 1, 1, 2);
   grid->addWidget(&next, 8, 3, Qt::AlignBottom);
-  // The fields stay where they are when a walk-through shows its picture beside them.
+  // Keeps the fields in place when a walk-through shows its picture next to them.
   grid->setColumnMinimumWidth(0, 64);
   for (const int column : {1, 2, 3}) grid->setColumnStretch(column, 1);
   auto* const content = new QWidget;

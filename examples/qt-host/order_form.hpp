@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The host's own window: a form for an order of parcels. It knows nothing of walk-throughs, but for
-// the tags by which scripts name its controls.
+// The host's own window: an order form for parcels. It knows nothing of walk-throughs except the
+// tags by which scripts name its controls.
 #pragma once
 
 #include <QCheckBox>
@@ -16,8 +16,8 @@ class OrderForm : public QMainWindow {
  public:
   OrderForm();
 
-  /// Connects the buttons to what they do. A walk-through takes their clicks, so a host connects
-  /// them again when it is over.
+  /// Connects the buttons to their actions. A walk-through takes over their clicks, so a host
+  /// connects them again when it ends.
   void connectButtons();
 
   QLineEdit name;
@@ -31,7 +31,7 @@ class OrderForm : public QMainWindow {
   QLabel price;
   QPushButton order{"&Order"};
   QPushButton clear{"&Clear"};
-  // At the lower edge, hidden unless a walk-through shows them.
+  // At the lower edge; hidden unless a walk-through shows them.
   QLabel guide;
   QLabel picture;
   QPushButton next{"&Next"};

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The panel, laid out by hand.
+// Lays out the panel by hand.
 #include "tips_panel.hpp"
 
 #include <QGridLayout>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// A panel for tips, which the host shows as a sheet.
+// A panel with tips, which the host shows as a sheet.
 #pragma once
 
 #include <QLabel>

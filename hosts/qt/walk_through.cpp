@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Ends come from within the engine or from within an event of the window's, neither of which would
-// survive their objects' going at once: the rest is done when Qt's event loop is back.
+// The end of a walk-through is noticed inside the engine or inside an event of the window.
+// Destroying these objects there would be unsafe, so the clean-up runs later, from Qt's event loop.
 
 #include "hosts/qt/walk_through.hpp"
 
@@ -14,7 +14,7 @@ namespace hosts::qt {
 
 namespace {
 
-// Where the controls are.
+// Returns the widget that holds the controls.
 QWidget* contentOf(QWidget& window) {
   const auto* const mainWindow = qobject_cast<const QMainWindow*>(&window);
   return mainWindow ? mainWindow->centralWidget() : &window;
@@ -41,7 +41,7 @@ class WalkThrough::Watch final : public QObject, public toolkit::SheetDelegate {
     if (type == QEvent::Hide && receiver == stage_) noteHiding(*event);
     if (isClosing || type == QEvent::Hide || type == QEvent::ParentChange) endSoon();
     if (!isClosing || !isOver()) return false;
-    event->ignore();  // it is the walk-through that closes the window, not the user
+    event->ignore();  // the walk-through closes the window, not the user
     return true;
   }
 
@@ -51,8 +51,8 @@ class WalkThrough::Watch final : public QObject, public toolkit::SheetDelegate {
     connect(&widget, &QObject::destroyed, this, [this] { endSoon(); });
   }
 
-  // A window that is shown again at once was dismissed all the same. The desktop hides windows that
-  // it minimises; the toolkit hides a panel for a moment to make a sheet of it.
+  // Remembers a dismissal, even if the window is shown again at once. Ignores windows that the
+  // desktop minimises, and a panel that the toolkit hides briefly to make it a sheet.
   void noteHiding(const QEvent& event) {
     isDismissed_ |= !event.spontaneous() && !owner_.isBeginning_;
   }
@@ -64,7 +64,7 @@ class WalkThrough::Watch final : public QObject, public toolkit::SheetDelegate {
     return hasContent_ && (!content_ || contentOf(*stage_) != content_);
   }
 
-  // The walk-through goes on where the host has not let the user close the window.
+  // If the host refuses the close, the walk-through continues.
   void endSoon() {
     const auto endIfOver = [this] {
       if (isOver() || stageIsGone() || contentIsGone()) owner_.end();
@@ -75,14 +75,14 @@ class WalkThrough::Watch final : public QObject, public toolkit::SheetDelegate {
   WalkThrough& owner_;
   QPointer<QWidget> stage_;
   QPointer<QWidget> content_;
-  bool hasContent_;  // had, at the beginning
+  bool hasContent_;  // whether it had content at the beginning
   bool isDismissed_ = false;
 };
 
 WalkThrough::WalkThrough(toolkit::qt::QtToolkit& toolkit) : toolkit_(toolkit) {}
 
 WalkThrough::~WalkThrough() {
-  over_ = nullptr;  // whoever would be told may be half gone
+  over_ = nullptr;  // the callback's object may be half destroyed
   end();
 }
 
@@ -94,12 +94,12 @@ bool WalkThrough::playInSheet(std::string_view script, QWidget& panel, QWidget& 
   return begin(script, panel, window);
 }
 
-// Says in the log why there is no walk-through.
+// Logs why the walk-through is not played.
 void WalkThrough::refuse(const std::string& script, const std::string& reason) {
   toolkit_.log().write("The walk-through " + script + " is not played: " + reason);
 }
 
-// An engine that holds the script; null where the script is refused.
+// Returns an engine with the script; null if the script is refused.
 std::shared_ptr<QZ_Plist_State_Parser> WalkThrough::load(
     const std::string& script, const toolkit::Ref<toolkit::Window>& window) {
   auto engine = QZ_Plist_State_Parser::initWithWindow(toolkit_, window);
@@ -114,7 +114,7 @@ std::shared_ptr<QZ_Plist_State_Parser> WalkThrough::load(
     problem = problemOf(lists);
   if (problem.empty()) return engine;
   refuse(script, problem);
-  engine->terminateParser();  // else its flasher would keep it
+  engine->terminateParser();  // otherwise its flasher would keep it alive
   return nullptr;
 }
 

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-// Walk-throughs in a Qt application, from their beginning to their end, in one call.
+// Plays a walk-through in a Qt application, from beginning to end, with one call.
 //
-// It does what every host would: it holds the windows while a walk-through needs them, keeps a form
-// open that the end of its walk-through would close, takes a sheet off the screen, and ends the
-// walk-through when its user closes the window or sends the sheet away.
+// Does the work common to all hosts: keeps the windows alive while a walk-through needs them, keeps
+// a form open when the end of its walk-through would close it, takes a sheet off the screen, and
+// ends the walk-through when the user closes the window or dismisses the sheet.
 #pragma once
 
 #include <QPointer>
@@ -19,33 +19,33 @@
 
 namespace hosts::qt {
 
-/// At most one walk-through at a time: beginning another ends the one before.
+/// Plays one walk-through at a time: beginning another ends the previous one.
 class WalkThrough {
  public:
-  /// `toolkit` outlives it.
+  /// `toolkit` must outlive this object.
   explicit WalkThrough(toolkit::qt::QtToolkit& toolkit);
   ~WalkThrough();
   WalkThrough(const WalkThrough&) = delete;
   WalkThrough& operator=(const WalkThrough&) = delete;
 
-  /// Plays a script (an absolute path, or one relative to the toolkit's resource directory) over a
-  /// top-level widget, from its list with the smallest tag. NO, a line in the log that says why,
-  /// and nothing played, when the file is missing or is not a script, when no key is a tag, when
-  /// the value under the smallest tag is not a list, when lists run each other without end, and
-  /// while another walk-through is beginning, as in `whenOver` of the one before.
+  /// Plays a script (an absolute path, or one relative to the toolkit's resource directory) in a
+  /// top-level widget, starting with the list of its smallest tag. Plays nothing, logs the reason
+  /// and gives NO if the file is missing or not a script, no key is a tag, the value under the
+  /// smallest tag is not a list, lists run each other endlessly, or another walk-through is
+  /// beginning (as in `whenOver` of the previous one).
   bool play(std::string_view script, QWidget& window);
-  /// The same in `panel`, a top-level widget that is shown as a sheet over `window`.
+  /// The same in `panel`, a top-level widget, which is shown as a sheet over `window`.
   bool playInSheet(std::string_view script, QWidget& panel, QWidget& window);
-  /// Ends the walk-through, if there is one. It also ends with its window: when that is closed,
-  /// hidden (as a dialog is by its buttons and Escape), also if it is shown again at once, or
-  /// destroyed, and when a main window is given another central widget.
+  /// Ends the walk-through, if one is running. A walk-through also ends when its window is closed,
+  /// hidden (as a dialog is by its buttons and Escape, even if it is shown again at once) or
+  /// destroyed, or when its main window gets another central widget.
   void end();
 
-  /// Told after the end of each, however it came, when nothing of it is left in the widgets: the
-  /// time to connect the clicks again that it took.
+  /// Sets a function that is called after the end of every walk-through, when it no longer uses the
+  /// widgets: the host can then reconnect the clicks that the walk-through took over.
   void whenOver(std::function<void()> told) { over_ = std::move(told); }
 
-  /// Null while none goes on.
+  /// Returns the engine; null if no walk-through is running.
   const std::shared_ptr<QZ_Plist_State_Parser>& engine() const { return engine_; }
 
  private:
@@ -57,7 +57,7 @@ class WalkThrough {
   void refuse(const std::string& script, const std::string& reason);
 
   toolkit::qt::QtToolkit& toolkit_;
-  std::vector<toolkit::Ref<toolkit::Window>> windows_;  // held as long as the engine goes on
+  std::vector<toolkit::Ref<toolkit::Window>> windows_;  // kept alive while the engine runs
   std::shared_ptr<QZ_Plist_State_Parser> engine_;
   std::shared_ptr<Watch> watch_;
   std::function<void()> over_;

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Observer: watches an engine at work, for hosts that log or measure and for tools.
+// Observer: lets hosts and tools follow what an engine does, for example to log or measure it.
 #pragma once
 
 #include <cstddef>
@@ -14,9 +14,9 @@
 
 namespace qz {
 
-/// Is told what an engine does, while the engine does it. Every function does nothing by default: a
-/// subclass overrides those that it needs. They are called on the engine's thread, and must neither
-/// raise nor call the engine's operations; its getters are allowed.
+/// The engine calls these functions while it works. By default they do nothing; a subclass
+/// overrides the ones it needs. They run on the engine's thread. They must not raise, nor call the
+/// engine's operations; the engine's getters are allowed.
 class Observer {
  public:
   using Value = toolkit::ValueRef<>;
@@ -24,29 +24,31 @@ class Observer {
 
   virtual ~Observer() = default;
 
-  /// A list begins to run for an object id, which may be absent. Lists nest: a command may run
+  /// A list is about to run for an object id, which may be absent. Lists nest: a command may run
   /// another list.
   virtual void listWillRun(const Value& /*list*/, const ObjectId& /*id*/) {}
-  /// The list that began last has run to its end.
+  /// The innermost running list has ended.
   virtual void listDidRun(const Value& /*list*/, const ObjectId& /*id*/) {}
 
   /// The list's element at `index`, counted from 0, is about to run.
   virtual void commandWillRun(const Value& /*list*/, std::size_t /*index*/) {}
-  /// The command has run with this result.
+  /// The command has returned this result.
   virtual void commandDidRun(const Value& /*list*/, std::size_t /*index*/, bool /*result*/) {}
-  /// The command has raised, and the engine's log line says so; the list goes on behind it.
+  /// The command has raised, and the engine has logged the exception. The list continues with the
+  /// next element.
   virtual void commandRaised(const Value& /*list*/, std::size_t /*index*/,
                              const toolkit::Exception& /*exception*/) {}
 
-  /// The engine has looked for a control by its tag; absent when there is none.
+  /// The engine has looked up a control by its tag; `control` is absent if there is none.
   virtual void controlSought(toolkit::Tag /*tag*/, const toolkit::Ref<toolkit::View>& /*control*/) {
   }
 
-  /// An object timer of `seconds` begins under a tag key. A pending one under that key is replaced.
+  /// An object timer of `seconds` has started under a tag key. It replaces a pending timer under
+  /// that key.
   virtual void timerSet(std::string_view /*key*/, double /*seconds*/) {}
-  /// The object timer under a tag key has fired; its press or list comes next.
+  /// The object timer under a tag key has fired; its press or list follows.
   virtual void timerFired(std::string_view /*key*/) {}
-  /// The pending object timer under a tag key will not fire.
+  /// The pending object timer under a tag key has been cancelled.
   virtual void timerCancelled(std::string_view /*key*/) {}
 };
 

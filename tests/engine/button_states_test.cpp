@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The record of pressed buttons, as it is handed to the host: a copy that belongs to the host
-// alone.
+// The record of pressed buttons that a host receives: a copy of the engine's own.
 
 #include <gtest/gtest.h>
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
-// What an operation works on once it has called out: the arguments and the engine that it was
-// called with, although the host changes every variable it handed in, and lets go of the engine, at
-// the first thing that the engine asks of its toolkit or its window.
+// Operations that call out to the host keep their arguments and their engine. Here the host changes
+// every variable that it passed in, and releases the engine, at the first call that the engine
+// makes to its toolkit or its window.
 
 #include <gtest/gtest.h>
 
@@ -26,7 +26,7 @@ using toolkit::Number;
 using toolkit::String;
 using toolkit::ViewKind;
 
-/// Another toolkit, which calls the host at whatever it is asked for.
+/// A toolkit that calls the host whenever it is used, and forwards to another toolkit.
 struct CallingToolkit final : toolkit::Toolkit {
   CallingToolkit(toolkit::Toolkit& other, const std::function<void()>& host)
       : real(other), call(host) {}
@@ -43,7 +43,7 @@ struct CallingToolkit final : toolkit::Toolkit {
   std::function<void()> call;
 };
 
-/// A content view that calls the host at every look.
+/// A content view that calls the host whenever its subviews are read.
 struct CallingContent final : fakes::FakeRole<toolkit::View> {
   const toolkit::Subviews& subviews() const override { return call(), views; }
 
@@ -86,7 +86,7 @@ class CallingOut : public testing::Test {
     engine->plistDictionary()->setObject(list, "7");
   }
 
-  /// Calls the engine, and the host at the first opportunity. Whether it was called.
+  /// Runs `call` with the host armed. True if the engine called the host.
   template <class Call>
   bool isCalledOut(Call call) {
     Engine& called = *engine;
@@ -94,8 +94,8 @@ class CallingOut : public testing::Test {
     call(called);
     return !armed;
   }
-  /// The same; whether the engine, which nothing but the host kept, has ended. That it ended only
-  /// after the operation, the address sanitizer sees, and the operation's effect shows.
+  /// As above; true if the engine, which only the host kept, has ended as well. The operation's
+  /// effect and the address sanitizer show that it did not end before the operation.
   template <class Call>
   bool endsOnlyAfter(Call call) {
     const std::weak_ptr<Engine> watched = engine;
@@ -134,13 +134,13 @@ class CallingOut : public testing::Test {
       driver.makeView(ViewKind::toggle, 8, {20, 60, 100, 30}, screen->contentView());
   std::shared_ptr<CallingContent> content = std::make_shared<CallingContent>();
 
-  // The host's variables.
+  // The variables that the host passes in and changes.
   Engine::ObjectId id = Number::withLong(7);
   Engine::ObjectId newTag = Number::withLong(9);
   Engine::Value text = String::make("done, and long enough to be let go of");
   Engine::Value font = String::make("Helvetica");
   Engine::Value size = Number::withLong(12);
-  // Logs, then hides the control of the list's id.
+  // Its first element raises and is logged, its second hides the control of the list's id.
   Engine::Value list = Array::make({Array::make(), String::make("HIDE_OBJECT_WITH_ID")});
   Engine::Parameters parameters;
   Engine::Dictionary table = Dictionary::make();
@@ -169,7 +169,7 @@ TEST_F(CallingOut, ACompoundCommandHasItsParameters) {
   command = "DISABLE_OBJECT_WITH_ID";
   parameters = Array::make({Number::withLong(99)});
   EXPECT_TRUE(endsOnlyAfter([&](Engine& called) {
-    EXPECT_TRUE(called.doCompoundCommand(command, parameters, id));  // as aimed by parameter
+    EXPECT_TRUE(called.doCompoundCommand(command, parameters, id));  // aimed by its parameter
   }));
 }
 
@@ -295,7 +295,7 @@ TEST_F(CallingOut, ATimerIsForItsKey) {
   const std::weak_ptr<Engine> watched = engine;
   EXPECT_TRUE(isCalledOut([&](Engine& called) { called.startTimerWithValue(3, key); }));
   EXPECT_TRUE(timers->contains("7"));
-  timers->objectForKey("7")->invalidate();  // which kept the engine
+  timers->objectForKey("7")->invalidate();  // the timer kept the engine
   EXPECT_TRUE(watched.expired());
 }
 
@@ -447,7 +447,7 @@ TEST_F(CallingOut, ColoursAndStatesAreOfTheControlGiven) {
   }
 }
 
-// The next operation is kept as the first was, which ended by an exception.
+// After an operation that raised, the next one keeps and releases the engine as usual.
 TEST_F(CallingOut, AnOperationThatRaisedDoesNotKeepTheEngine) {
   EXPECT_THROW(engine->processCommandArray(text, id), toolkit::Exception);
   EXPECT_TRUE(endsOnlyAfter([&](Engine& called) { called.processCommandArray(list, id); }));

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The table of object timers while the engine works on it: what a timer holds is let go of with the
-// timer, and code that runs then may change the table.
+// The table of object timers while the engine works on it: cancelling or releasing a timer can run
+// code that changes the table.
 
 #include <gtest/gtest.h>
 
@@ -15,7 +15,7 @@ namespace {
 
 using Engine = QZ_Plist_State_Parser;
 
-/// A timer that calls the test when it is cancelled, and when it ends.
+/// A timer that calls the test when it is cancelled and when it is destroyed.
 struct NotifyingTimer final : toolkit::Timer {
   ~NotifyingTimer() override {
     if (onEnd) onEnd();

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The exported command names: all of them, and what each holds before a host changes it.
+// The exported command names: all of them, and their values before a host changes them.
 
 #include <gtest/gtest.h>
 
@@ -11,7 +11,7 @@
 namespace {
 
 struct Name {
-  const char* constant;  // behind the common prefix
+  const char* constant;  // without the common prefix
   const std::string& value;
 };
 

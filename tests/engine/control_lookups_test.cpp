@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// How often HIDE, SHOW, ENABLE, DISABLE and others look their control up, and which finding they
-// act on when the window changes between one look-up and the next.
+// How often HIDE, SHOW, ENABLE, DISABLE and others look up their control, and which result they act
+// on when the window changes between two look-ups.
 
 #include <gtest/gtest.h>
 
@@ -19,8 +19,8 @@ using toolkit::View;
 
 constexpr toolkit::Tag target = 7;
 
-/// A content view that shows other views at every look: what a letter of `script` stands for, then
-/// nothing. Each look-up asks it once.
+/// A content view that shows another view at every look: the kinds that the letters of `script`
+/// name, then nothing. Each look-up reads it once.
 class ChangingContent final : public fakes::FakeRole<View> {
  public:
   explicit ChangingContent(const std::string& script) {
@@ -37,7 +37,7 @@ class ChangingContent final : public fakes::FakeRole<View> {
   }
 
   std::size_t looks() const { return looks_; }
-  /// What the n-th look found was told, counted from 1.
+  /// Returns the calls that the view found by the n-th look received. Counts looks from 1.
   std::vector<std::string> calls(std::size_t look) const {
     return findings_[look - 1] ? findings_[look - 1]->calls : std::vector<std::string>();
   }
@@ -57,7 +57,7 @@ class ChangingContent final : public fakes::FakeRole<View> {
   mutable toolkit::Subviews shown_;
 };
 
-/// Runs one command for the tag over the content, and gives its result.
+/// Runs one command for the tag in a window over the content, and returns its result.
 bool run(const std::string& command, const std::shared_ptr<ChangingContent>& content,
          const toolkit::ValueRef<toolkit::Array>& parameters = toolkit::Array::make()) {
   toolkit::memory::MemoryDriver driver;
@@ -66,14 +66,14 @@ bool run(const std::string& command, const std::shared_ptr<ChangingContent>& con
   return engine->doCompoundCommand(command, parameters, toolkit::Number::withLong(target));
 }
 
-// What each look-up finds: b a button, t a text field, i an image view, v another view, - nothing.
+// The result of each look-up: b button, t text field, i image view, v other view, - nothing.
 struct Lookup {
   const char* name;
   const char* findings;
   bool result;
   std::size_t looks;
-  std::size_t hidden;   // the look-up whose finding is hidden; 0 for none
-  std::size_t queried;  // the look-up whose finding is asked whether it needs a redraw; 0 for none
+  std::size_t hidden;   // the look-up whose result is hidden; 0 for none
+  std::size_t queried;  // the look-up whose result is asked whether it needs a redraw; 0 for none
 };
 
 constexpr Lookup lookups[] = {
@@ -130,7 +130,7 @@ TEST(ControlLookups, EnablingAndDisablingLookOnce) {
   }
 }
 
-// The simple commands look before they know their name.
+// Simple commands look up their control before they compare their name.
 TEST(ControlLookups, ASimpleCommandLooksOnceWhateverItsName) {
   for (const char* name : {"HIDE_OBJECT_WITH_ID", "IDLE_LOOP", "NO_SUCH_COMMAND", ""}) {
     SCOPED_TRACE(name);
@@ -143,7 +143,7 @@ TEST(ControlLookups, ASimpleCommandLooksOnceWhateverItsName) {
   }
 }
 
-// Any other count of parameters ends the command before it looks for its control.
+// With any other count of parameters, the command ends before it looks up its control.
 TEST(ControlLookups, LoadingAnImageLooksOnceForTwoParametersOnly) {
   const toolkit::ValueRef<> name = toolkit::String::make("star");
   const toolkit::ValueRef<> tag = toolkit::Number::withLong(target);

@@ -17,7 +17,7 @@ ValueRef<> chain(toolkit::Tag tag) {
   return Array::make({String::make("Process_Commands_For_Id"), Number::withLong(tag)});
 }
 
-// A script of lists that only chain: to each key, the tags in order.
+// Returns a script of lists that only chain: each key's list runs its tags in order.
 ValueRef<Dictionary> script(
     const std::vector<std::pair<std::string, std::vector<toolkit::Tag>>>& lists) {
   auto script = Dictionary::make();

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// A window and views of a test's own, which note what they are told and can be made to misbehave.
+// Fake windows and views for tests, which record the calls they receive and can misbehave.
 #pragma once
 
 #include <functional>
@@ -12,8 +12,8 @@
 
 namespace fakes {
 
-/// A view of the role given that understands what every view does, and notes the calls that change
-/// or ask how it is drawn.
+/// Supports the operations that every view has, and records the calls that change how the view is
+/// drawn or ask about it.
 template <class Role>
 class FakeRole : public Role {
  public:
@@ -40,9 +40,9 @@ class FakeRole : public Role {
 
   toolkit::Subviews views;
   std::string toolTip;
-  /// What happened to the view, in order.
+  /// The recorded calls, in order.
   mutable std::vector<std::string> calls;
-  /// Called with every call before it is noted.
+  /// Called with every call before it is recorded.
   std::function<void(const std::string&)> onCall;
 
  private:
@@ -54,7 +54,7 @@ class FakeRole : public Role {
   toolkit::Tag tag_;
 };
 
-/// A view that passes for a kind of control where the kind is only asked for.
+/// A view that reports a kind of control, whose operations do nothing.
 class FakeView : public FakeRole<toolkit::View> {
  public:
   enum class Kind { plain, button, textField, imageView };
@@ -99,7 +99,7 @@ class FakeWindow final : public toolkit::Window {
   std::weak_ptr<toolkit::Responder> delegate_;
 };
 
-/// A window over one view of the test's own.
+/// Returns a window whose content view contains only `view`.
 inline std::shared_ptr<FakeWindow> windowWith(const std::shared_ptr<toolkit::View>& view) {
   const auto content = std::make_shared<FakeRole<toolkit::View>>();
   content->views.emplace_back(view);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The flasher's tick, of which the toolkit sees the order in which it asks for buttons.
+// The flasher's tick: the order in which it looks at controls, seen from the toolkit's side.
 
 #include <gtest/gtest.h>
 
@@ -14,7 +14,7 @@ namespace {
 
 using toolkit::Number;
 
-/// Notes how often it is asked whether it is a button; it is none.
+/// A view that is not a button, and counts how often it is asked.
 class AskedView final : public fakes::FakeRole<toolkit::View> {
  public:
   using FakeRole::FakeRole;

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Building the walk-through window from a description: what the engine asks of the toolkit, and
-// what of it shows to nobody but the toolkit.
+// Building the walk-through window from a description: the engine's requests to the toolkit, and
+// effects that only the toolkit sees.
 
 #include <gtest/gtest.h>
 
@@ -22,7 +22,7 @@ using toolkit::Ref;
 using toolkit::ValueRef;
 using toolkit::memory::MemoryDriver;
 
-/// A window as it was asked for.
+/// The arguments of a request for a window.
 struct WindowOrder {
   toolkit::Rect content;
   toolkit::StyleMask style;
@@ -30,8 +30,8 @@ struct WindowOrder {
   bool defer;
 };
 
-/// The memory toolkit's application, which notes what windows it is asked for and can refuse them.
-/// Its controls come hidden, disabled and untidy, so that whatever is not set up shows.
+/// The memory toolkit's application. It records the windows requested and can refuse them. Its
+/// controls start hidden, disabled and untidy, so that every property left unset shows.
 class ObservedApplication final : public toolkit::Application {
  public:
   explicit ObservedApplication(toolkit::Application& application) : application_(application) {}
@@ -75,14 +75,14 @@ class ObservedApplication final : public toolkit::Application {
 
   std::vector<WindowOrder> orders;
   bool refuses = false;
-  Ref<toolkit::Window> given;      // instead of a window of the memory toolkit
+  Ref<toolkit::Window> given;      // returned in place of a window of the memory toolkit
   std::function<void()> onButton;  // called before a button is made
 
  private:
   toolkit::Application& application_;
 };
 
-/// The memory toolkit with the application above.
+/// The memory toolkit with the observed application.
 class ObservedToolkit final : public toolkit::Toolkit {
  public:
   toolkit::Application& application() override { return observed; }
@@ -112,7 +112,7 @@ class GuiAssets : public testing::Test {
     return engine->loadGuiAssets(description, nullptr);
   }
 
-  /// The control that the load made as the `index`th, as the memory toolkit knows it.
+  /// Returns the memory toolkit's object for control `index` of those that the load made.
   template <class Kind>
   const Kind& made(std::size_t index) const {
     return dynamic_cast<const Kind&>(*engine->addedObjectToTutorial()->elements().at(index));
@@ -163,7 +163,7 @@ TEST_F(GuiAssets, WithoutAWindowNoControlIsMade) {
   EXPECT_EQ(engine->addedObjectToTutorial()->count(), 0U);
 }
 
-// Without a window there is nothing to discover, which is what would empty the records.
+// Only a discovery empties the records, and without a window there is no discovery.
 TEST_F(GuiAssets, WithoutAWindowTheRecordsOfADiscoveryStay) {
   const auto window = toolkit.driver.makeWindow({0, 0, 300, 200});
   toolkit.driver.makeView(toolkit::ViewKind::button, 7, {0, 0, 9, 9}, window->contentView());
@@ -174,7 +174,7 @@ TEST_F(GuiAssets, WithoutAWindowTheRecordsOfADiscoveryStay) {
   EXPECT_EQ(engine->originalTagValues()->count(), 1U);
 }
 
-// Another window takes the front while the controls are made.
+// Another window comes to the front while the controls are made.
 TEST_F(GuiAssets, DescribedWindowShowsBeforeItsControlsAndAgainAfterThem) {
   const auto other = toolkit.driver.makeWindow({0, 0, 300, 200});
   bool shown = false;
@@ -245,7 +245,7 @@ TEST_F(GuiAssets, ErrorIsNeverWritten) {
 
 TEST_F(GuiAssets, EngineKeepsTheWindowThatItBuilt) {
   ASSERT_TRUE(load({{"1", entry("NSButton", {0, 0, 9, 9})}}));
-  engine->tutorialWindow()->orderOut();  // off the screen nobody else keeps it
+  engine->tutorialWindow()->orderOut();  // off the screen, only the engine keeps it
   EXPECT_TRUE(engine->tutorialWindow());
 }
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The documents that the HTML commands hand to the toolkit's reader, to the letter.
+// The exact documents that the HTML commands pass to the toolkit's reader.
 
 #include <gtest/gtest.h>
 
@@ -16,8 +16,7 @@ using Engine = QZ_Plist_State_Parser;
 using toolkit::Number;
 using toolkit::String;
 
-/// The memory toolkit, but for its reader of HTML, which only keeps the document and yields what
-/// the test wants.
+/// The memory toolkit with another reader of HTML, which stores the document and returns `text`.
 struct DocumentKeeper final : toolkit::Toolkit {
   DocumentKeeper() {
     memory.log().setSink([](std::string_view) {});
@@ -74,7 +73,7 @@ TEST_F(HtmlDocuments, AreTheFragmentBetweenFixedTexts) {
   EXPECT_EQ(keeper.document, oneBlank + "b" + tail);
 }
 
-// A toolkit's reader may make nothing of a document, although every character of it is ASCII.
+// A toolkit's reader may fail to read a document, even one of ASCII characters only.
 TEST_F(HtmlDocuments, ThatTheReaderMakesNothingOfFailWithoutALogLine) {
   int lines = 0;
   keeper.memory.log().setSink([&](std::string_view) { ++lines; });

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The end of an engine that nobody terminated: what it stops, empties and leaves, and who kept it.
+// The end of an engine that was not terminated: what it stops and empties, and what kept it alive.
 
 #include <gtest/gtest.h>
 
@@ -65,7 +65,7 @@ TEST_F(Lifetime, AnEndingEngineLeavesTheOtherTablesAsTheyAre) {
   EXPECT_EQ(assets->count(), 1U);
 }
 
-// Other than termination does: that takes an absent window for a different one.
+// Unlike termination, which treats an absent window as a different one.
 TEST_F(Lifetime, AddedControlsAreLetGoOfOnlyBetweenTwoWindows) {
   const struct {
     const char* name;
@@ -172,7 +172,7 @@ TEST_F(Lifetime, AnEngineMayEndAfterItsToolkit) {
   EXPECT_EQ(timers->count(), 0U);
 }
 
-/// A host that lets go of its engine from within a call, at the first line that is logged.
+/// A host that releases its engine during a call, at the first line that is logged.
 class LetGo : public Lifetime {
  protected:
   LetGo() {
@@ -187,8 +187,8 @@ class LetGo : public Lifetime {
     driver->setLogSink([this](std::string_view) { engine.reset(); });
   }
 
-  /// Calls the engine, which nothing but the host keeps, and says whether it did all there was to
-  /// do and then ended.
+  /// Calls the engine, which only the host keeps. True if the host released the engine and it then
+  /// ended.
   template <class Call>
   bool endsOnlyAfter(Call call) {
     engine->flashingTimer()->invalidate();
@@ -240,7 +240,7 @@ TEST_F(LetGo, InATerminationTheWindowIsClosed) {
   EXPECT_EQ(driver->look(window).closes, 1);
 }
 
-/// Notes who asks it what.
+/// Records the calls it receives.
 class AskedTimer final : public toolkit::Timer {
  public:
   explicit AskedTimer(bool valid) : valid_(valid) {}

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Commands on controls that do not do as they are told: they store another text than they were
-// given, or raise. And which of them the commands ask whether they need a redraw.
+// Commands on controls that misbehave: that store another text than the one given, or raise. Also
+// which controls the commands ask whether they need a redraw.
 
 #include <gtest/gtest.h>
 
@@ -21,8 +21,7 @@ using toolkit::Number;
 
 constexpr toolkit::Tag unrulyTag = 7;
 
-/// A control that keeps only the first letter of a plain text, and does with styled text what the
-/// test wants.
+/// A control that keeps only the first letter of a plain text, and calls the test for styled text.
 class Unruly final : public fakes::FakeRole<toolkit::View> {
  public:
   Unruly() : FakeRole(unrulyTag) {}
@@ -43,7 +42,7 @@ class Unruly final : public fakes::FakeRole<toolkit::View> {
   std::function<void()> onStyled = [] {};
 };
 
-/// An image view that shows nothing.
+/// An image view that ignores its image.
 class Blank final : public fakes::FakeRole<toolkit::ImageView> {
  public:
   Blank() : FakeRole(unrulyTag) {}
@@ -96,7 +95,7 @@ TEST_F(MisbehavingControls, ATextThatReadsBackDifferentlyIsSetButNoSuccess) {
   EXPECT_TRUE(log.empty());
 }
 
-// Range exceptions among them, although those were once meant to count as success.
+// Including range exceptions, although they were once meant to count as success.
 TEST_F(MisbehavingControls, WhatAControlRaisesOverStyledTextIsLogged) {
   const std::vector<std::function<void()>> raises = {
       [] { throw toolkit::RangeException("beyond"); },
@@ -128,7 +127,7 @@ TEST_F(MisbehavingControls, OnlyTheToolkitsExceptionsAreCaught) {
   EXPECT_TRUE(log.empty());
 }
 
-// Nothing hangs on the answer; that it is asked for is part of what the commands do.
+// The answer changes nothing; that the commands ask is part of their behaviour.
 TEST_F(MisbehavingControls, SomeCommandsAskWhetherARedrawIsPending) {
   const std::vector<std::string> once = {"needsDisplay"};
   const auto id = Number::withLong(unrulyTag);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What an observer is told of lists, commands, looked-up controls and timers.
+// What an observer is told about lists, commands, looked-up controls and timers.
 #include "qz/observer.hpp"
 
 #include <gtest/gtest.h>
@@ -15,7 +15,7 @@
 
 namespace {
 
-/// Notes every event as a line.
+/// Records every event as a line.
 struct Notes final : qz::Observer {
   void listWillRun(const Value&, const ObjectId& id) override {
     lines.push_back("list for " + (id ? id->description() : "nothing"));
@@ -61,7 +61,7 @@ class ObserverTest : public testing::Test {
   void use(std::string_view script) {
     engine->setPlistDictionary(toolkit::dictionaryFromPropertyList(script));
   }
-  /// What was noted since it was asked for last.
+  /// Returns the lines recorded since the last call.
   Lines noted() { return std::exchange(notes->lines, {}); }
 
   toolkit::memory::MemoryDriver driver;
@@ -109,7 +109,7 @@ TEST_F(ObserverTest, IsToldOfTimersThatAreCancelled) {
   EXPECT_EQ(noted(), Lines{"found 1"}) << "nothing was pending";
 }
 
-/// Lets itself go at the first event.
+/// Removes itself from the engine at the first event.
 struct Leaving final : qz::Observer {
   explicit Leaving(QZ_Plist_State_Parser& engine) : engine_(engine) {}
   void listWillRun(const Value&, const ObjectId&) override {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The order of a press's steps, and timers that are none of the engine's.
+// The order of a press's steps, and timers that are not the engine's.
 
 #include <gtest/gtest.h>
 
@@ -32,7 +32,7 @@ class Presses : public testing::Test {
     engine->terminateParser();
   }
 
-  /// Puts a list that does nothing into the script.
+  /// Puts a list that does nothing into the script under `key`.
   void giveListTo(std::string_view key) {
     engine->plistDictionary()->setObject(Array::make({String::make("IDLE_LOOP")}), key);
   }

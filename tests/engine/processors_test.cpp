@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The command processors called by a host itself, with arguments that no script can give them.
+// The command processors, called directly by a host with arguments that no script can give them.
 
 #include <gtest/gtest.h>
 
@@ -52,7 +52,7 @@ TEST_F(Processors, IdlingDoesNothing) {
   EXPECT_TRUE(log.empty());
 }
 
-// One that no script parameter converts to.
+// A colour number that no script parameter converts to.
 TEST_F(Processors, TheLargestColourIsRedToo) {
   EXPECT_TRUE(engine->QZ_Plist_State_Processor_SET_BACKGROUND_COLOR(
       std::numeric_limits<std::uint64_t>::max(), Number::withLong(7)));
@@ -67,7 +67,7 @@ TEST_F(Processors, AbsentParametersAreNone) {
   EXPECT_EQ(driver.look(button).toolTip, "");
 }
 
-// The dispatcher hands on 32 bits; the processors read more.
+// The dispatcher passes 32 bits of a tag; the processors read 64.
 TEST_F(Processors, TagsBeyond32BitsAreFoundAndGiven) {
   constexpr toolkit::Tag large = 5'000'000'000;
   EXPECT_TRUE(
@@ -82,8 +82,8 @@ TEST_F(Processors, TagsBeyond32BitsAreFoundAndGiven) {
   EXPECT_TRUE(engine->flashingTagIds()->objectForKey("5000000000")->boolValue());
 }
 
-// Both look for 32 bits: a tick by the key's text, which is clamped, a timer by the id's number,
-// which keeps its low bits.
+// Both use 32 bits: a tick converts the key's text, which is clamped, and a timer converts the id,
+// whose low bits are kept.
 TEST_F(Processors, TicksAndTimersLookFor32Bits) {
   constexpr toolkit::Tag large = 4'294'967'303;  // 7 in its low 32 bits
   EXPECT_TRUE(engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(large), true));

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The engine's properties: what a getter hands out, and that any thread may use them.
+// The engine's properties: what a getter returns, and that any thread may use them.
 
 #include <gtest/gtest.h>
 
@@ -68,7 +68,7 @@ TEST_F(Properties, ATableThatWasKeptOutlivesItsEngine) {
   EXPECT_EQ(flashing->count(), 1U);
 }
 
-/// Runs each of the tasks on a thread of its own, again and again until `work` is done.
+/// Runs each task on its own thread, again and again until `work` is done.
 template <class Work>
 void meanwhile(const std::vector<std::function<void()>>& tasks, Work work) {
   std::atomic<bool> done = false;
@@ -87,7 +87,7 @@ void meanwhile(const std::vector<std::function<void()>>& tasks, Work work) {
   for (auto& thread : threads) thread.join();
 }
 
-/// A script whose list 1 runs its list 2, where there is nothing to do.
+/// Returns a script whose list 1 runs list 2, which does nothing.
 Engine::Dictionary script() {
   auto script = Dictionary::make();
   script->setObject(

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Re-tagging with a timer: the timer's seconds are the identity of the parameter, not its number.
+// Re-tagging with a timer: the timer's seconds are the parameter's address, not its number.
 
 #include <gtest/gtest.h>
 

@@ -100,7 +100,7 @@ TEST_F(Runner, RunsAMillionElements) {
 TEST_F(Runner, RunsAHundredThousandCompoundElements) {
   const ValueRef<> hide = Array::make({text("hide_object_with_id"), Number::withLong(tag)});
   EXPECT_TRUE(run(std::vector<ValueRef<>>(100'000, hide)));
-  EXPECT_EQ(view->calls.size(), 200'000U);  // each is hidden, and asked about a redraw
+  EXPECT_EQ(view->calls.size(), 200'000U);  // for each: hide, and ask whether a redraw is needed
 }
 
 TEST_F(Runner, ListsMayCallOneAnotherAThousandDeep) {
@@ -142,7 +142,7 @@ TEST_F(Runner, ACommandThatLosesItsElementsMeanwhileHasItsParameters) {
   std::vector<ValueRef<>> others;
   view->onCall = [&](const std::string&) {
     command->removeAllObjects();
-    // Where memory that was let go would be used again.
+    // These would reuse memory that was released.
     for (int i = 0; i < 8; ++i) others.emplace_back(text("another tooltip!!"));
   };
   EXPECT_TRUE(run({command}));
@@ -175,7 +175,7 @@ TEST_F(Runner, WithoutAnIdARunIsForTheTag0) {
   EXPECT_EQ(view->calls, std::vector<std::string>{"hide"});
 }
 
-// The dispatcher itself expects upper case: the runner sees to that.
+// The dispatcher expects upper case; only the runner converts names.
 TEST_F(Runner, TheDispatcherTakesNamesToTheLetter) {
   const auto id = Number::withLong(tag);
   EXPECT_FALSE(engine->doCompoundCommand("hide_object_with_id", Array::make(), id));
@@ -183,7 +183,7 @@ TEST_F(Runner, TheDispatcherTakesNamesToTheLetter) {
   EXPECT_THROW(engine->doCompoundCommand("FLASH_ID", Array::make(), id), toolkit::RangeException);
 }
 
-/// A list that claims any number of elements, each the command that does nothing.
+/// A list that reports any count of elements; each element is the command that does nothing.
 class ClaimingList final : public toolkit::Value {
  public:
   explicit ClaimingList(std::size_t count) : Value(Kind::array), count_(count) {}

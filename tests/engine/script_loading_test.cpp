@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Loading: scripts without a name, with keys that are no strings, and what may be changed in them.
+// Loading scripts: without a name, with keys that are not strings, and which parts can be changed.
 
 #include <gtest/gtest.h>
 
@@ -43,7 +43,7 @@ class ScriptLoading : public testing::Test {
   std::shared_ptr<Engine> engine = Engine::initWithWindow(driver.toolkit(), nullptr);
 };
 
-// What the system's formats print for nothing.
+// An absent name is formatted as "(null)".
 TEST_F(ScriptLoading, NoNameIsTheNameOfNothing) {
   EXPECT_FALSE(load(std::nullopt, "1"));
   EXPECT_EQ(engine->plistDictionary()->count(), 0U);
@@ -72,8 +72,8 @@ TEST_F(ScriptLoading, EveryLoadMakesAScriptOfItsOwn) {
   EXPECT_EQ(first->count(), 0U);
 }
 
-/// A binary property list: a dictionary of one entry, whose value is the list of the idle command.
-/// `key` is the key's object.
+/// Returns a binary property list: a dictionary with one entry, whose value is a list of the idle
+/// command. `key` is the encoded object of the key.
 std::string binaryScript(const std::string& key) {
   std::string bytes("bplist00");
   std::string offsets;
@@ -84,8 +84,8 @@ std::string binaryScript(const std::string& key) {
   }
   const auto table = static_cast<char>(bytes.size());
   bytes += offsets + std::string(6, '\0') + "\x01\x01";
-  bytes += std::string(7, '\0') + '\x04';  // objects
-  bytes += std::string(8, '\0');           // the root's number
+  bytes += std::string(7, '\0') + '\x04';  // the count of objects
+  bytes += std::string(8, '\0');           // the index of the root
   return bytes + std::string(7, '\0') + table;
 }
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What is said of scripts that a host had better not play.
+// The problems reported for scripts that a host should not play.
 #include "engine/script_problem.hpp"
 
 #include <gtest/gtest.h>

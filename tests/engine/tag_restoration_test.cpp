@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Putting back tags: which controls are told their tag.
+// Restoring tags: which controls have their tag set.
 
 #include <gtest/gtest.h>
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The order in which a termination takes things down, seen by what is called on the way.
+// The order in which a termination tears things down, seen from the calls it makes.
 
 #include <gtest/gtest.h>
 
@@ -121,10 +121,10 @@ TEST_F(Teardown, ASheetEndsWhenEverythingIsGone) {
   EXPECT_TRUE(engine->loadPlist("no such script", std::nullopt, watcher, true));
   engine->terminateParser();
   EXPECT_TRUE(watcher->ended == panel);
-  EXPECT_TRUE(driver.look(panel).visible);  // ordering it out is the delegate's part
+  EXPECT_TRUE(driver.look(panel).visible);  // ordering it out is the delegate's job
 }
 
-// The delegate is the host's: the engine does not keep it.
+// The delegate belongs to the host: the engine does not keep it.
 TEST_F(Teardown, ASheetMayEndWithoutADelegate) {
   const auto panel = driver.makeWindow({0, 0, 100, 100});
   engine->setTutorialWindow(panel);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Upper case by the rules of Unicode: every class of letter, and whatever is no letter.
+// Upper case by the rules of Unicode: every class of letter, and everything that is not a letter.
 
 #include "toolkit/uppercase.hpp"
 
@@ -79,7 +79,8 @@ TEST(Uppercase, WhatHasNoUpperCaseStays) {
   for (const UppercaseCase& wanted : cases) check(wanted);
 }
 
-// A name that is no text matches no command, but must not be lost or read beyond its end either.
+// A name that is not valid text matches no command. Its bytes must stay, and nothing is read past
+// them.
 TEST(Uppercase, BytesThatAreNoTextStay) {
   constexpr UppercaseCase cases[] = {
       {"a lone continuation", "a\x80z", "A\x80Z"},
@@ -104,7 +105,7 @@ std::string encoded(char32_t c) {
           byte(0x80 | (c & 0x3F))};
 }
 
-constexpr char32_t beyondAllCase = 0x20000;  // from here on scripts have no case
+constexpr char32_t beyondAllCase = 0x20000;  // scripts from here on have no case
 
 TEST(Uppercase, UpperCaseIsUpperCaseAlready) {
   int changed = 0;
@@ -114,17 +115,16 @@ TEST(Uppercase, UpperCaseIsUpperCaseAlready) {
     ASSERT_EQ(uppercased(upper), upper) << std::hex << static_cast<unsigned>(c);
     if (upper != text) ++changed;
   }
-  EXPECT_GT(changed,
-            1400);  // Unicode has so many letters with another upper case, and more to come
+  EXPECT_GT(changed, 1400);  // each new version of Unicode may add letters with an upper case
 }
 
 TEST(Uppercase, WhatIsInUpperCaseIsNotCopied) {
-  // Longer than two words of eight, which are looked at as one each.
+  // Longer than two words of eight bytes, which are examined a word at a time.
   for (std::size_t at = 0; at < 19; ++at) {
     for (int c = 0; c < 0x100; ++c) {
       std::string text(19, '_');
       text[at] = static_cast<char>(c);
-      const bool isLeft = c < 0x60;  // neither a small letter nor one of the signs around them
+      const bool isLeft = c < 0x60;  // neither a small letter nor a sign next to them
       std::string storage;
       const std::string_view upper = uppercased(text, storage);
       ASSERT_EQ(upper, uppercased(text)) << c << " at " << at;

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Ids and numbers that only 64 bits hold: where the engine takes all of them, and where 32.
+// Ids and numbers that need 64 bits: where the engine uses all bits, and where only 32.
 
 #include <gtest/gtest.h>
 
@@ -20,8 +20,8 @@ using toolkit::Number;
 using toolkit::String;
 using toolkit::ViewKind;
 
-// Whatever the width of `long`, a tag has 64 bits with a sign on its whole way: from the number or
-// the key that names a control to the control itself.
+// Whatever the width of `long`, a tag has 64 bits with a sign all the way from the number or key
+// that names a control to the control itself.
 static_assert(std::numeric_limits<toolkit::Tag>::is_signed);
 static_assert(std::numeric_limits<toolkit::Tag>::digits == 63);
 using View = toolkit::View;
@@ -36,7 +36,7 @@ static_assert(std::is_same_v<decltype(toolkit::integerValueOf("")), toolkit::Tag
 
 constexpr toolkit::Tag beyond = toolkit::Tag{1} << 32;
 constexpr toolkit::Tag near = 7;
-constexpr toolkit::Tag far = near + beyond;  // the same in 32 bits
+constexpr toolkit::Tag far = near + beyond;  // equals `near` in 32 bits
 
 class WideIds : public testing::Test {
  protected:
@@ -142,7 +142,7 @@ TEST_F(WideIds, AFlashingEntryIsSoughtBy32BitsAndRewrittenUnderAll) {
   EXPECT_FALSE(flashing->objectForKey("4294967303")->boolValue());
 }
 
-// A key's text is read as the nearest number of 32 bits.
+// A key's text beyond 32 bits is clamped to the nearest 32-bit number.
 TEST_F(WideIds, AFlashingKeyBeyond32BitsIsTheGreatestOfThem) {
   view(ViewKind::button, 2147483647);
   engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(99999999999), true);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Adopting and wiring what no scenario can make: gradients, a host's own class of button, windows
+// Adopting and wiring what no scenario can make: gradients, a host's own button class, windows
 // without a content view.
 
 #include <gtest/gtest.h>
@@ -23,7 +23,7 @@ class ActiveGradient final : public fakes::FakeRole<toolkit::Gradient> {
   std::string action;
 };
 
-/// A host's own class of button: a view that is a button, with a name of its own.
+/// A host's own button class: a view that is a button, with its own class name.
 class HostButton final : public fakes::FakeRole<toolkit::View> {
  public:
   explicit HostButton(toolkit::Ref<toolkit::Button> button)
@@ -93,7 +93,7 @@ TEST_F(Wiring, AWindowWithoutAContentViewIsAdoptedWithoutControls) {
   EXPECT_FALSE(engine->findObjectWithTag(0));
 }
 
-// The action reaches the engine at the end of the responder chain, and nothing else does.
+// Only this action reaches the engine at the end of the responder chain.
 TEST_F(Wiring, TheEngineUnderstandsItsOwnActionOnly) {
   EXPECT_TRUE(engine->tryToPerform("buttonPushed:", nullptr));
   EXPECT_EQ(log, std::vector<std::string>{"Button tag 0 pressed."});

@@ -11,7 +11,7 @@
 namespace toolkit {
 namespace {
 
-// Whatever an absent view of any kind is told, it answers the same before and after.
+// An absent view of any kind answers the same before and after every message.
 template <class Kind>
 class AbsentView : public testing::Test {};
 using Kinds = testing::Types<View, Button, TextField, ImageView>;

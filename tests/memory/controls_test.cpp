@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Controls: what they show, and what a click does to them.
+// Controls: what they show, and how a click changes them.
 
 #include <vector>
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The driver: what a host and an observer get to see through it.
+// The driver: what a host and an observer can see through it.
 
 #include <gtest/gtest.h>
 
@@ -110,7 +110,7 @@ TEST(MemoryDriverFactory, MakesADriverThatIsItsOwnWorld) {
   EXPECT_TRUE(two->look(other).key);
 }
 
-/// Stands for an engine: held by a timer's action, it uses the toolkit to its very end.
+/// Stands for an engine: a timer's action keeps it, and its destructor still uses the toolkit.
 struct Engine : Responder {
   explicit Engine(Toolkit& used) : toolkit(used) {}
   ~Engine() override {

@@ -65,7 +65,7 @@ TEST(MemoryFonts, ASizeNotAboveZeroIsTheDefaultSize) {
   for (const auto& c : cases) EXPECT_EQ(fonts.fontWithName("Times", c.asked)->size, c.given);
 }
 
-// A family may be called like another one's PostScript name.
+// A family name may look like the PostScript name of another family.
 TEST(FontNames, TheWholeNameOfAFamilyComesFirst) {
   const FontFamily families[] = {{"Gill Sans", false}, {"Gill Sans MT", false}, {"A-Bold", true}};
   const struct {

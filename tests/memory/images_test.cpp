@@ -13,7 +13,7 @@ class ImagesTest : public MemoryTest {
  protected:
   ImagesTest() { driver.setResourcePath(directory.path()); }
   Ref<Image> find(std::string_view name) { return toolkit.images().imageNamed(name); }
-  /// The file, within the directory, to which `name` leads; empty when it leads to none.
+  /// Returns the name of the file that `name` finds; empty when it finds none.
   std::string fileOf(std::string_view name) {
     const auto image = std::dynamic_pointer_cast<MemoryImage>(find(name).pointer());
     return image ? std::filesystem::path(image->path()).filename().string() : "";
@@ -48,7 +48,7 @@ TEST_F(ImagesTest, OnlyImageFilesAreFoundByNamesThatFit) {
   directory.write("folder.png/inside.png", "");
   const struct {
     const char* name;
-    const char* file;  // empty: none
+    const char* file;  // empty: not found
   } cases[] = {
       {"notes.txt", ""},          {"notes", ""}, {"v1.2", "v1.2.png"}, {"bare", ""},
       {"Photo.PNG", "Photo.PNG"}, {"photo", ""}, {"folder", ""},       {"folder.png", ""},

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Target and action, the responder chain, and what an action may do to its sender.
+// Target and action, the responder chain, and how an action may affect its sender.
 
 #include <string>
 #include <vector>
@@ -10,7 +10,7 @@
 namespace toolkit::memory::test {
 namespace {
 
-/// A view of a host's own that takes part in the responder chain.
+/// A host's own view that takes part in the responder chain.
 class HostView : public MemoryView<View> {
  public:
   HostView(const std::shared_ptr<Screen>& screen, std::shared_ptr<Recorder> recorder)
@@ -113,7 +113,7 @@ TEST_F(ResponderChain, AWindowDoesNotKeepItsDelegate) {
   EXPECT_FALSE(makeButton(nullptr)->sendAction("pressed:", nullptr));
 }
 
-// --- what an action does to its sender ---
+// --- how an action may affect its sender ---
 
 TEST_F(ResponderChain, AControlMayRemoveItselfInItsAction) {
   const std::shared_ptr<Responder> receivers[] = {nullptr, target};
@@ -123,7 +123,7 @@ TEST_F(ResponderChain, AControlMayRemoveItselfInItsAction) {
   };
   for (const auto& receiver : receivers) {
     const std::weak_ptr<View> watched = makeButton(receiver, ViewKind::button, 3).pointer();
-    // As a plain pointer: nothing but the superview keeps the button.
+    // A plain pointer, so that only the superview keeps the button.
     View* const button = watched.lock().get();
     dynamic_cast<MemoryButton*>(button)->click();
     EXPECT_TRUE(watched.expired());
@@ -148,7 +148,7 @@ TEST_F(ResponderChain, ATargetMayEndInItsAction) {
   const Ref<Button> button = makeButton(nullptr);
   const std::weak_ptr<Recorder> watched = target;
   Tag sender = 0;
-  std::shared_ptr<Responder> receiver = std::move(target);  // the only one that keeps it
+  std::shared_ptr<Responder> receiver = std::move(target);  // the only reference
   watched.lock()->perform = [&](const Ref<View>&) {
     receiver = nullptr;
     sender = watched.lock()->senders.front();

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What a timer's action may do to the run loop that calls it, and how long it lives.
+// How a timer's action may affect the run loop that calls it, and how long the action lives.
 
 #include <gtest/gtest.h>
 
@@ -54,10 +54,10 @@ TEST_F(RunLoopReentrancy, TheOthersFireInsideAFiringThatLetsTimePass) {
   note("a", 2, true);
   note("b", 3);
   loop.advance(1);
-  EXPECT_EQ(fired, "(ab)");  // its own firings at 2 and 3 did not happen
+  EXPECT_EQ(fired, "(ab)");  // its own firings at 2 and 3 are skipped
   EXPECT_EQ(times, std::vector{3.25});
   EXPECT_EQ(loop.now(), 3.25);
-  EXPECT_EQ(outer->timeLeft(), 0.75);  // it fires on at whole seconds
+  EXPECT_EQ(outer->timeLeft(), 0.75);  // it still fires at whole seconds
 }
 
 TEST_F(RunLoopReentrancy, TimeDoesNotGoBackAfterAFiringThatLetTimePass) {
@@ -76,7 +76,7 @@ TEST_F(RunLoopReentrancy, ATimerWhoseFiringTookTooLongFiresLate) {
     if (times.size() == 1) loop.advance(3);
   });
   loop.advance(5);
-  EXPECT_EQ(times, (std::vector<double>{1, 5}));  // 2 and 3 were missed, and 4 just passed
+  EXPECT_EQ(times, (std::vector<double>{1, 5}));  // 2 and 3 are skipped, and 4 has just passed
   EXPECT_EQ(slow->timeLeft(), 1);
 }
 
@@ -137,7 +137,7 @@ TEST_F(RunLoopReentrancy, AnActionLivesUntilItsCallReturns) {
   EXPECT_TRUE(watched.expired());
 }
 
-/// Holds a timer and invalidates it at its end, as an engine does, and may schedule another.
+/// Holds a timer, invalidates it on destruction, as an engine does, and may schedule another.
 struct Holder {
   ~Holder() {
     timer->invalidate();

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The run loop: when timers fire, in which order, and what the clock says meanwhile.
+// The run loop: when timers fire, in which order, and the clock's time during a firing.
 
 #include "toolkit/memory/run_loop.hpp"
 

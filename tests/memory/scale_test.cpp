@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Many views, many timers: what is done often costs little, and nothing piles up. The limits are
-// times of the processor, some ten times what unoptimised and instrumented builds take.
+// Many views, many timers: frequent operations are cheap, and nothing accumulates. The limits are
+// processor times, about ten times those of unoptimised and instrumented builds.
 
 #include <ctime>
 #include <memory>
@@ -11,7 +11,7 @@
 namespace toolkit::memory::test {
 namespace {
 
-/// Seconds of processor time that `work` takes.
+/// Returns the processor time of `work`, in seconds.
 template <class Work>
 double secondsOf(const Work& work) {
   const std::clock_t start = std::clock();

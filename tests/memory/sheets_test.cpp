@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Sheets: attached to a parent, blocking it, and ended with their delegate told.
+// Sheets: attached to a parent, blocking it, and ended with a message to their delegate.
 
 #include <vector>
 
@@ -16,7 +16,7 @@ class SheetsTest : public MemoryTest {
                                   true);
   }
   void begin() { application.beginSheet(sheet, window, delegate, &context); }
-  /// Whether a click on a button of `of` arrives.
+  /// True if a click on a button in `of` reaches its target.
   bool takesClicks(const Ref<Window>& of) {
     const auto target = std::make_shared<Recorder>();
     const Ref<Button> button = makeButton(target);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What several tests of the memory toolkit need: recorders, and a directory of their own.
+// Shared by the tests of the memory toolkit: recorders, and a temporary directory.
 #pragma once
 
 #include <gtest/gtest.h>
@@ -20,7 +20,7 @@
 
 namespace toolkit::memory::test {
 
-/// Understands the actions it is told to, and remembers whose senders asked for which.
+/// Performs one action, and records the actions asked for and their senders.
 class Recorder : public Responder {
  public:
   explicit Recorder(std::string understood = "pressed:") : understood_(std::move(understood)) {}
@@ -35,15 +35,15 @@ class Recorder : public Responder {
   }
 
   std::vector<std::string> asked;      // all actions it was asked to perform
-  std::vector<std::string> performed;  // as their names read when they had been performed
-  std::vector<Tag> senders;            // the tags of those it performed for
-  std::function<void(const Ref<View>&)> perform;  // what performing is, besides
+  std::vector<std::string> performed;  // the actions performed, each read after performing it
+  std::vector<Tag> senders;            // the tags of the senders of those performed
+  std::function<void(const Ref<View>&)> perform;  // called when an action is performed
 
  private:
   std::string understood_;
 };
 
-/// Remembers the ends of sheets that it is told of.
+/// Records the ends of sheets.
 class SheetRecorder : public SheetDelegate {
  public:
   void sheetDidEnd(const Ref<Window>& sheet, long returnCode, void* contextInfo) override {
@@ -59,7 +59,7 @@ class SheetRecorder : public SheetDelegate {
   bool orderOut = false;
 };
 
-/// A fresh directory that goes with all it holds when the test ends.
+/// A new directory, removed with its contents on destruction.
 class Directory {
  public:
   Directory() {
@@ -84,14 +84,14 @@ class Directory {
   std::filesystem::path path_;
 };
 
-/// A driver, and a host's window on its screen.
+/// Provides a driver, with a host's window on its screen.
 class MemoryTest : public testing::Test {
  protected:
   Ref<View> make(ViewKind kind, Tag tag = 1) { return makeIn(window->contentView(), kind, tag); }
   Ref<View> makeIn(const Ref<View>& parent, ViewKind kind, Tag tag) {
     return driver.makeView(kind, tag, {10, 20, 30, 40}, parent);
   }
-  /// A button with the target and the action given.
+  /// Returns a new button with this target and the action "pressed:".
   Ref<Button> makeButton(const std::shared_ptr<Responder>& target, ViewKind kind = ViewKind::button,
                          Tag tag = 1) {
     const Ref<Button> button = asButton(make(kind, tag));

@@ -13,7 +13,7 @@ namespace {
 struct Message {
   std::string_view selector;
   void (*send)(View&);
-  bool controlsUnderstand;  // besides buttons, which understand them all
+  bool controlsUnderstand;  // in addition to buttons, which understand them all
 };
 
 constexpr Message messages[] = {
@@ -29,7 +29,7 @@ constexpr Message messages[] = {
      false},
 };
 
-/// The reason of what `message` raised, if it raised.
+/// Returns the reason of the exception that `message` raises, if any.
 std::optional<std::string> reasonOf(const Message& message, View& view) {
   try {
     message.send(view);

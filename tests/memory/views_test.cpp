@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Views: their place in the tree, and what shows of them.
+// Views: their place in the tree, and their properties.
 
 #include "toolkit/memory/views.hpp"
 
@@ -19,7 +19,7 @@ class ViewsTest : public MemoryTest {
     for (const Ref<View>& subview : view->subviews()) tags.push_back(subview->tag());
     return tags;
   }
-  /// The reason with which `parent` refuses `view`; empty when it does not.
+  /// Returns the reason why `parent` refuses `view`; empty when it accepts it.
   static std::string refusal(const Ref<View>& parent, const Ref<View>& view) {
     try {
       parent->addSubview(view);
@@ -57,7 +57,7 @@ TEST_F(ViewsTest, AddingAViewTakesItFromWhereItWas) {
 TEST_F(ViewsTest, AViewRefusesWhatCannotLieInIt) {
   const Ref<View> outer = make(ViewKind::box, 1);
   const Ref<View> inner = makeIn(outer, ViewKind::box, 2);
-  // Stands for another toolkit's view: it is no node of this one.
+  // Stands for another toolkit's view: it is not a node of this one.
   const Ref<View> foreign = std::shared_ptr<View>(std::shared_ptr<void>(), &View::nothing());
   const Ref<Window> other = driver.makeWindow({});
   const struct {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Windows: on and off the screen, their order, the key window, and who keeps them alive.
+// Windows: on and off the screen, their order, the key window, and what keeps them alive.
 
 #include <vector>
 
@@ -15,7 +15,7 @@ class WindowsTest : public MemoryTest {
     return application.makeWindow({200, 300, 800, 600}, StyleMask::titledAndClosable,
                                   BackingStore::buffered, true);
   }
-  /// Whether the windows on the screen are these, back to front, the last of them key.
+  /// Expects these windows on the screen, back to front, with only the last one key.
   void expectShown(const std::vector<Ref<Window>>& expected) {
     std::vector<Ref<Window>> shown;
     for (MemoryWindow* const each : toolkit.application().screen()->windows())

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What becomes of reading and writing where memory runs out: std::bad_alloc, and nothing leaks.
+// Reading and writing when memory runs out: std::bad_alloc is thrown, and nothing leaks.
 #include <gtest/gtest.h>
 
 #include <cstddef>

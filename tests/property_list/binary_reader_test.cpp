@@ -117,7 +117,7 @@ TEST(BinaryReader, TakesCollections) {
       {{"\xA0"}, "[]"},
       {{"\xA2\x01\x01", k}, "[\"k\",\"k\"]"},
       {{"\xAF\x10\x02\x01\x02", k, v}, "[\"k\",\"v\"]"},
-      {{"\xA2\x01", k}, refused},  // the second reference is the next object's marker
+      {{"\xA2\x01", k}, refused},  // the second reference would be the next object's marker
       {{"\xA1\x02", k}, refused},
       {{"\xA1"}, refused},
       {{"\xC0"}, "{\"set\":[]}"},
@@ -162,7 +162,7 @@ TEST(BinaryReader, SharesObjects) {
 TEST(BinaryReader, TakesSizesFromOneToSixteen) {
   const std::string value = "\x51v";
   for (std::size_t size = 1; size <= 16; ++size) {
-    // What does not fit into 64 bits does not count.
+    // Bytes above the low 64 bits are ignored.
     const std::size_t ignored = size > 8 ? size - 8 : 0;
     const std::string reference =
         "\xA1" + std::string(ignored, '\x77') + std::string(size - ignored - 1, '\0') + "\x01";
@@ -200,7 +200,7 @@ TEST(BinaryReader, ChecksTheOffsetTable) {
   EXPECT_EQ(withOffsets({8, 11, 10}), "[false]");
   EXPECT_EQ(withOffsets({8, 10, 7}), "[true]");  // below the objects, but unused
   EXPECT_EQ(withOffsets({8, 7, 10}), refused);
-  EXPECT_EQ(withOffsets({8, 10, 12}), refused);  // at the table's start, though unused
+  EXPECT_EQ(withOffsets({8, 10, 12}), refused);  // at the table's start, refused though unused
   EXPECT_EQ(withOffsets({8, 10, 0xFFFF}), refused);
   EXPECT_EQ(withOffsets({0, 10, 11}), refused);
 }
@@ -219,7 +219,7 @@ TEST(BinaryReader, ChecksHeaderAndTrailer) {
   EXPECT_EQ(dumpOf(BinaryFile{.objects = {"\x09"}, .moreObjects = 1}.bytes()), refused);
   EXPECT_EQ(dumpOf(BinaryFile{.objects = {}}.bytes()), refused);
   EXPECT_EQ(dumpOf(bytes + "\0"s), refused);
-  // (The header and the object's byte, a tab, are an old-style string.)
+  // (Nine bytes, the header and the object's byte, a tab, are a valid old-style string.)
   for (std::size_t size = 10; size < bytes.size(); ++size) {
     EXPECT_EQ(dumpOf(bytes.substr(0, size)), refused) << size;
   }

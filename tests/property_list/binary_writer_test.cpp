@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Binary property lists as they are written: that they read back, what they refuse.
+// Writing binary property lists: they read back, and some values are refused.
 #include "toolkit/property_list/binary_writer.hpp"
 
 #include <gtest/gtest.h>
@@ -35,7 +35,7 @@ TEST(BinaryWriter, WritesWhatOthersWrite) {
 TEST(BinaryWriter, WritesWhatReadsBackTheSame) {
   const ValueRef<> values[] = {
       String::make(""),
-      String::make("\xED\xB8\x80\xED\xA0\xBD"),  // halves of a pair, the wrong way round
+      String::make("\xED\xB8\x80\xED\xA0\xBD"),  // halves of a pair, in the wrong order
       String::make("\xEF\xBB\xBF"
                    "a\xF0\x9F\x98\x80"),
       String::make(std::string(70000, 'x')),

@@ -156,7 +156,7 @@ TEST(Arrays, TakeOverElements) {
   auto given = Array::make({String::make("7"), String::make("8")});
   const auto array = Array::make({String::make("1")});
   array->setElements(given->elements());
-  given = nullptr;  // the array has counts of its own
+  given = nullptr;  // the array has its own references
   EXPECT_EQ(array->count(), 2U);
   EXPECT_EQ(array->objectAtIndex(1)->intValue(), 8);
 }

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What values look like to a person.
+// Values as text for people.
 #include <gtest/gtest.h>
 
 #include <cstdint>

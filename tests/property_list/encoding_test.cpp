@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The encodings of XML and old-style property lists: marked, guessed, declared.
+// The encodings of XML and old-style property lists: by mark, by guess, by declaration.
 #include <gtest/gtest.h>
 
 #include <bit>
@@ -16,7 +16,7 @@ using namespace std::string_literals;
 constexpr std::u32string_view smiling = U"<string>caf\u00E9 \u263A \U0001F600</string>";
 constexpr std::string_view smilingDump = "\"caf\\u00e9 \\u263a \\ud83d\\ude00\"";
 
-/// `text` in units of `size` bytes.
+/// Returns `text` in units of `size` bytes.
 std::string encoded(std::u32string_view text, std::size_t size, std::endian order) {
   std::string bytes;
   const auto unit = [&](char32_t value) {
@@ -62,7 +62,7 @@ TEST(Encodings, MarkedOnesMustHoldCharacters) {
   EXPECT_EQ(dumpOf("\xFF\xFE" + encoded(U"'a", 2, little) + "\x3D\xD8"), refused);
   EXPECT_EQ(dumpOf("\xFF\xFE\0\0"s + encoded(U"'a\xD800'", 4, little)), refused);
   EXPECT_EQ(dumpOf("\xFF\xFE\0\0"s + encoded(U"'a'", 4, little) + "\xFF\xFF\xFF\xFF"), refused);
-  // Bytes that make up no unit at the end do not count.
+  // Bytes at the end that do not fill a unit are ignored.
   EXPECT_EQ(dumpOf("\xFF\xFE" + encoded(U"'a'", 2, little) + "x"), "\"a\"");
 }
 
@@ -126,7 +126,7 @@ TEST(Encodings, OlderThanUnicodeAreRead) {
   } cases[] = {
       {"ISO-8859-15", "\xA4\xE9", "\"\\u20ac\\u00e9\""},
       {"ISO-8859-2", "\xB1", "\"\\u0105\""},
-      {"ISO-8859-7", "\xE1\xD2", refused},  // D2 is free
+      {"ISO-8859-7", "\xE1\xD2", refused},  // D2 is unassigned
       {"windows-1251", "\xCF\xF0", "\"\\u041f\\u0440\""},
       {"IBM850", "\x82", "\"\\u00e9\""},
       {"GB18030", "\xC3\xA9\x81\x40", "\"\\u8305\\u4e02\""},

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Bytes that mean harm, or nothing: reading them ends, soon, with a value or a refusal.
+// Malicious or meaningless bytes: reading them ends soon, with a value or a refusal.
 #include <gtest/gtest.h>
 
 #include <filesystem>
@@ -22,7 +22,7 @@ std::string reasonFor(std::string_view bytes) {
   return result.refusal ? result.refusal->reason : "";
 }
 
-/// The contents of the files in tests/data/property-lists that are no longer than `most` bytes.
+/// Returns the contents of the files in tests/data/property-lists of at most `most` bytes.
 std::vector<std::string> samples(std::size_t most) {
   std::vector<std::string> samples;
   const std::string folder = std::string(QZ_TEST_DATA) + "/property-lists";
@@ -34,7 +34,7 @@ std::vector<std::string> samples(std::size_t most) {
   return samples;
 }
 
-/// Reads bytes that nobody knows the meaning of; what comes of it is whole.
+/// Reads arbitrary bytes, and expects either a sound value or a refusal with a description.
 void expectValueOrRefusal(const std::string& bytes) {
   const ReadResult result = readPropertyList(bytes);
   ASSERT_NE(result.value.pointer() == nullptr, !result.refusal) << testing::PrintToString(bytes);
@@ -85,7 +85,7 @@ TEST(HostileInput, CountsOfWhatIsNotThere) {
 }
 
 TEST(HostileInput, SharedOverAndOverIsReadOnce) {
-  // 2^400 strings, were they not shared.
+  // These would be 2^400 strings if they were not shared.
   BinaryFile file{.objects = {}, .referenceSize = 2};
   for (std::size_t i = 1; i <= 400; ++i) {
     file.objects.emplace_back("\xA2");
@@ -102,7 +102,7 @@ TEST(HostileInput, SharedOverAndOverIsReadOnce) {
 }
 
 TEST(HostileInput, OverlappingObjectsMayNotAddUp) {
-  // Two hundred strings, each of a hundred thousand characters that are mostly the same bytes.
+  // Two hundred strings of a hundred thousand characters each, which share most of their bytes.
   constexpr std::size_t strings = 200;
   const std::string count = "\x5F\x12\x00\x01\x86\xA0"s;
   const std::string root = "\xAF\x10\xC8";

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The numbers that texts stand for, and what becomes of numbers in other types.
+// The numbers that texts convert to, and numbers converted to other types.
 #include "toolkit/property_list/number_conversion.hpp"
 
 #include <gtest/gtest.h>
@@ -20,7 +20,7 @@ namespace {
 constexpr double infinity = std::numeric_limits<double>::infinity();
 const double notANumber = std::numeric_limits<double>::quiet_NaN();
 
-/// `\uXXXX` resolved.
+/// Returns `text` with every `\uXXXX` resolved.
 std::string unescaped(const std::string& text) {
   std::string result;
   for (std::size_t at = 0; at < text.size(); ++at) {
@@ -37,10 +37,10 @@ std::string unescaped(const std::string& text) {
 TEST(NumberConversion, AgreesWithThePlatform) {
   std::ifstream file(std::string(QZ_TEST_DATA) + "/number-strings.tsv");
   std::string line;
-  std::getline(file, line);  // the columns' names
+  std::getline(file, line);  // the names of the columns
   int rows = 0;
   for (; std::getline(file, line); ++rows) {
-    // The first column may hold tabs; the last three are numbers.
+    // The first column may contain tabs; the last three are numbers.
     std::string columns[3];
     for (int i = 2; i >= 0; --i) {
       columns[i] = line.substr(line.rfind('\t') + 1);
@@ -69,7 +69,7 @@ TEST(NumberConversion, OfStringsToIntegers) {
        5, 5},
       {"\xC2\xA1"
        "5",
-       0, 0},  // U+00A1 is the first that is none
+       0, 0},  // U+00A1 is the first that is not skipped
       {"\xE2\x80\x80\xE2\x80\x8B"
        "5",
        5, 5},  // U+2000, U+200B
@@ -125,7 +125,7 @@ TEST(NumberConversion, OfStringsToReals) {
   };
   for (const auto& [text, value] : cases) EXPECT_EQ(doubleValueOf(text), value) << text;
   EXPECT_TRUE(std::signbit(doubleValueOf("-0")));
-  // More digits before the point than the exponent takes away.
+  // More digits before the point than the exponent removes.
   EXPECT_EQ(doubleValueOf("1" + std::string(400, '0') + "e-10"), infinity);
   EXPECT_EQ(doubleValueOf("1" + std::string(400, '0') + "e-400"), 1);
   EXPECT_EQ(doubleValueOf("0." + std::string(400, '0') + "1e10"), 0);

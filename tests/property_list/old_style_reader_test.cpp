@@ -29,7 +29,7 @@ TEST(OldStyleReader, TakesRoots) {
       {"/", "\"/\""},
       {"/a", "\"/a\""},
       {"a//b", "\"a//b\""},
-      {"a/*b", refused},  // the strings file `a/` needs something behind it
+      {"a/*b", refused},  // `a/` is a key of a strings file; its entry is incomplete
       {"a /*b*/", "\"a\""},
       {"'a'", "\"a\""},
       {"{}", empty},
@@ -70,7 +70,7 @@ TEST(OldStyleReader, TakesDictionaries) {
       {"{=b;}", refused},
       {"{a=b;a=c;}", "{\"dict\":[[\"a\",\"c\"]]}"},
       {"{a=b;/*c*/}", aIsB},
-      {"{a/**/=/**/b/**/;}", refused},  // `a/` is the key, and * none of its characters
+      {"{a/**/=/**/b/**/;}", refused},  // the key is `a/`; it cannot contain * unquoted
       {"{a /**/=/**/ b /**/;}", aIsB},
       {"{a=b /* ; }", refused},
       {"{a=//x\n b;}", aIsB},
@@ -154,7 +154,7 @@ TEST(OldStyleReader, TakesStrings) {
 }
 
 TEST(OldStyleReader, JoinsHalvesOfCharacters) {
-  // Written as one character and as its two halves, a key is the same key.
+  // A key written as one character and the same key written as its two halves are equal.
   EXPECT_EQ(dumpOf("{\"\xF0\x9F\x98\x80\" = a; \"\\Ud83d\\Ude00\" = b;}"),
             "{\"dict\":[[\"\\ud83d\\ude00\",\"b\"]]}");
 }

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Where refusals and values point.
+// The positions of refusals and of values.
 #include <gtest/gtest.h>
 
 #include <string>

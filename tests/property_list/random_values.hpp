@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Values made up at random, the same ones from the same seed.
+// Random values; the same seed gives the same values.
 #pragma once
 
 #include <bit>
@@ -16,7 +16,7 @@ namespace toolkit {
 
 class RandomValues {
  public:
-  /// `isForXml`: only what an XML property list can carry.
+  /// `isForXml` restricts the values to those that an XML property list can hold.
   RandomValues(std::uint32_t seed, bool isForXml) : random_(seed), isForXml_(isForXml) {}
 
   ValueRef<> value(int depth) {
@@ -101,7 +101,8 @@ class RandomValues {
     return isForXml_ ? text : joined(text);
   }
 
-  /// With halves of pairs that happened to meet as the one character that they are.
+  /// Returns `text` with adjacent halves of a surrogate pair joined to the character that they
+  /// form.
   static std::string joined(const std::string& text) {
     std::string result;
     Utf16Appender appender(result);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What the tests of the readers have in common.
+// Shared by the tests of the readers.
 #pragma once
 
 #include <string>
@@ -11,23 +11,23 @@
 
 namespace toolkit {
 
-/// In the tables of what is read: the bytes are to be refused.
+/// In tables of expected results: the bytes are refused.
 constexpr std::string_view refused = "refused";
 
-/// What bytes are read as, in canonical form; or "refused".
+/// Returns the canonical form of the value that is read, or "refused".
 inline std::string dumpOf(std::string_view bytes) {
   const ReadResult result = readPropertyList(bytes);
   return result.value ? canonicalDump(*result.value) : std::string(refused);
 }
 
-/// `text` so often after itself.
+/// Returns `text` repeated `times` times.
 inline std::string repeated(std::string_view text, std::size_t times) {
   std::string result;
   for (std::size_t i = 0; i < times; ++i) result += text;
   return result;
 }
 
-/// An XML property list whose root is the element in `xml`.
+/// Returns an XML property list whose root is the element `xml`.
 inline std::string plist(std::string_view xml) {
   return "<plist version=\"1.0\">" + std::string(xml) + "</plist>";
 }

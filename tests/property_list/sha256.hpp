@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// SHA-256, by which tables of expected results name the long ones.
+// SHA-256, which stands for long results in tables of expected results.
 #pragma once
 
 #include <array>
@@ -10,7 +10,7 @@
 
 namespace toolkit {
 
-/// The digest in hexadecimal.
+/// Returns the digest in hexadecimal.
 inline std::string sha256(std::string_view text) {
   constexpr std::array<std::uint32_t, 64> constants = {
       0x428a2f98, 0x71374491, 0xb5c0fbcf, 0xe9b5dba5, 0x3956c25b, 0x59f111f1, 0x923f82a4,

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What values answer to messages: their own, others', and when they are absent.
+// How values answer messages: those of their kind, those of other kinds, and when absent.
 #include <gtest/gtest.h>
 
 #include <cstdint>
@@ -13,7 +13,7 @@
 namespace toolkit {
 namespace {
 
-/// The reason of the exception that `action` raises, or "" when it raises none.
+/// Returns the reason of the exception that `action` raises, or "" when it raises none.
 template <class Raised>
 std::string reasonOf(const std::function<void()>& action) {
   try {
@@ -156,7 +156,7 @@ TEST(Values, AreSharedAndKeepTheirIdentity) {
 }
 
 TEST(Values, NumbersAreWhatTheyWereMadeOf) {
-  // The small ones are there only once, and stay when nobody refers to them any more.
+  // Small numbers exist only once, and remain when nothing refers to them any more.
   for (int again = 0; again < 2; ++again) {
     for (std::int64_t i = -300; i <= 300; ++i) {
       const auto number = Number::withLong(i);

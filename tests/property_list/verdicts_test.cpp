@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Every file of tests/data/property-lists against what the platform's own reader made of it.
+// Compares every file of tests/data/property-lists with the result of the platform's own reader.
 #include <gtest/gtest.h>
 
 #include <filesystem>
@@ -18,7 +18,7 @@ namespace toolkit {
 namespace {
 
 const std::filesystem::path folder = std::filesystem::path(QZ_TEST_DATA) / "property-lists";
-constexpr std::size_t longestDump = 20000;  // a longer one stands in the table as its digest
+constexpr std::size_t longestDump = 20000;  // the table holds the digest of a longer one
 
 std::string contentsOf(const std::filesystem::path& path) {
   std::ifstream file(path, std::ios::binary);
@@ -34,7 +34,7 @@ std::vector<Row> rows() {
   std::ifstream file(folder / "verdicts.tsv");
   std::vector<Row> rows;
   std::string line;
-  std::getline(file, line);  // the columns' names
+  std::getline(file, line);  // the names of the columns
   while (std::getline(file, line)) {
     std::istringstream columns(line);
     Row row;

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// XML property lists, rule by rule: what is accepted, and what it yields.
+// XML property lists, rule by rule: which are accepted, and their values.
 #include <gtest/gtest.h>
 
 #include <string>
@@ -153,7 +153,7 @@ TEST(XmlReader, TakesRealUidsAsSignedIntegersOf32Bits) {
       {"-0.9", "0"},
       {"2147483647.9", "2147483647"},
       {"-2147483648.9", "2147483648"},
-      // What does not fit.
+      // Numbers that do not fit.
       {"2147483648", "2147483648"},
       {"4294967297", "2147483648"},
       {"-2147483649", "2147483648"},
@@ -222,7 +222,7 @@ TEST(XmlReader, TakesUtf8AndNothingElseInStrings) {
       {"\xEF\xBB\xBF\xEF\xBB\xBF", "\"\\ufeff\""},
       {"&#xFEFF;a", "\"a\""},
       {"<![CDATA[\xEF\xBB\xBF]]>a", "\"a\""},
-      {"\xC3<![CDATA[\xA9]]>", "\"\\u00e9\""},  // checked once it is put together
+      {"\xC3<![CDATA[\xA9]]>", "\"\\u00e9\""},  // checked after the parts are joined
       {"\x80", refused},
       {"a\xC3", refused},
       {"a\xC3&amp;", refused},

@@ -15,7 +15,7 @@ struct ScalarCase {
   std::string_view value;
 };
 
-/// Reads `text` within the tag, and expects the dump to be `start` + value + `end`.
+/// Reads `text` within the tag, and expects the dump `start` + value + `end`.
 template <std::size_t count>
 void expect(const ScalarCase (&cases)[count], const std::string& tag, const std::string& start,
             const std::string& end) {
@@ -138,7 +138,7 @@ TEST(XmlScalars, Dates) {
       {"--12-31T23:59:59Z", "-63113904001"},
       {"02001-01-01T00:00:00Z", "0"},
       {"10000-01-01T00:00:00Z", "252423993600"},
-      {"2001-02-29T00:00:00Z", "5097600"},  // the 1st of March
+      {"2001-02-29T00:00:00Z", "5097600"},  // 1 March
       {"2001-01-00T00:00:00Z", "-86400"},   // the day before
       {"2001-01-99T00:00:00Z", "8467200"},
       {"2000-13-01T00:00:00Z", "0"},
@@ -147,7 +147,7 @@ TEST(XmlScalars, Dates) {
       {"2001-01-01T00:00:61Z", "61"},
       {"", refused},
       {"-", refused},
-      {"-01-01T00:00:00Z", refused},  // the year -1, and no day
+      {"-01-01T00:00:00Z", refused},  // the year is -1, and the day is missing
       {"---01-01T00:00:00Z", refused},
       {" 2001-01-01T00:00:00Z", refused},
       {"2001-01-01T00:00:00Z ", refused},
@@ -169,7 +169,7 @@ TEST(XmlScalars, DatesOfAnyYear) {
   const auto dateIn = [](const std::string& year) {
     return dumpOf(plist("<date>" + year + "-01-01T00:00:00Z</date>"));
   };
-  // Beyond a trillion years it is always the same one.
+  // Years beyond a trillion all give the same date.
   EXPECT_EQ(dateIn(std::string(400, '9')), dateIn("1000000000000"));
   EXPECT_EQ(dateIn("-" + std::string(400, '9')), dateIn("-1000000000000"));
   EXPECT_EQ(dateIn("1000000000000").substr(0, 13), "{\"date\":\"3.15");
@@ -187,7 +187,7 @@ TEST(XmlScalars, Data) {
       {"====", "00"},
       {"AQ=I", "010008"},
       {"AQ==AQID", "01010203"},
-      {"AQ=!=", "0100"},  // junk between them: only the last = counts
+      {"AQ=!=", "0100"},  // ! is junk, and only the last = counts
       {"AQIDA", "010203"},
       {"AQIDAQI", "010203"},
       {"A-Q_I*D", "010203"},
@@ -195,7 +195,7 @@ TEST(XmlScalars, Data) {
       {"AQID>", "010203"},
       {"A\vQ\fID", "010203"},
       {std::string_view("A\0QID", 5), "010203"},
-      {"&#65;QID", "eb9408"},  // no entity: & # ; are junk, 65QI is a group, D is left over
+      {"&#65;QID", "eb9408"},  // not an entity: & # ; are junk, 65QI is a group, D is left over
       {"\x80"
        "AQID",
        refused},

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// XML property lists as they are written: how they look, that they read back, what they refuse.
+// Writing XML property lists: their layout, that they read back, and which values are refused.
 #include "toolkit/property_list/xml_writer.hpp"
 
 #include <gtest/gtest.h>

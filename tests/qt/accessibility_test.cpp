@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What assistive technology gets to know: names, descriptions, and that they changed.
+// What assistive technology learns: names, descriptions, and their changes.
 
 #include "toolkit/qt/accessibility.hpp"
 
@@ -33,7 +33,7 @@ std::vector<Announcement> announcements;
 
 }  // namespace
 
-// Takes the place of Qt's own in this program: Qt hands announcements on only while assistive
+// Replaces Qt's own function in this program. Qt passes announcements on only while assistive
 // technology is connected, which needs a desktop's message bus.
 void QAccessible::updateAccessibility(QAccessibleEvent* event) {
   announcements.push_back({event->object(), event->type()});

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// A whole walk-through over a host's window leaves the host's widgets as they were, property by
-// property, but for what the script meant to change.
+// A whole walk-through over a host's window leaves every property of the host's widgets as it was,
+// except for those that the script changes on purpose.
 
 #include <QComboBox>
 #include <QLabel>
@@ -24,7 +24,7 @@ using toolkit::String;
 using Engine = QZ_Plist_State_Parser;
 using Snapshot = std::map<QString, QVariant>;
 
-// `QObject::receivers` is for derived classes.
+// `QObject::receivers` is protected.
 struct Receivers : QObject {
   static int of(const QObject& object, const QMetaMethod& signal) {
     const QByteArray signature = '2' + signal.methodSignature();
@@ -83,7 +83,7 @@ struct Adoption : hosts::Host {
     widget.setProperty(toolkit::qt::tagProperty, tag);
   }
 
-  // Retags, flashes, starts a timer, and hides and shows; what it means to change is one title.
+  // Re-tags, lets the flasher tick, starts a timer, hides and shows; only one title stays changed.
   void walkThrough() {
     const auto text = [](const char* word) { return String::make(word); };
     const auto command = [&](const char* word, std::vector<toolkit::ValueRef<>> rest) {
@@ -111,12 +111,12 @@ struct Adoption : hosts::Host {
 TEST_F(Adoption, LeavesEveryPropertyAsItWas) {
   toolkit.log().setSink([](std::string_view) {});
   show();
-  panel->findChild<QPushButton*>("other")->setFocus();  // which it will get by the press
+  panel->findChild<QPushButton*>("other")->setFocus();  // the press would focus it anyway
   const Snapshot before = snapshotOf(*panel);
   const std::set<QString> incomparable = differences(before, snapshotOf(*panel));
   for (const QString& name : incomparable)
     EXPECT_TRUE(name.endsWith("Icon") || name.endsWith(".icon") || name.endsWith(".pixmap"))
-        << name.toStdString();  // which Qt never finds equal
+        << name.toStdString();  // Qt never finds these equal
 
   walkThrough();
   window = {};

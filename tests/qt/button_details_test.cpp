@@ -99,7 +99,7 @@ TEST(ButtonDetails, BackgroundsOfCheckBoxesLeaveTheBorderOfAStyleSheet) {
   }
 }
 
-/// The best contrast that any pixel of the button has to its ground.
+/// Returns the best contrast of any pixel of the button to its background.
 double contrastOfTitle(QWidget& widget) {
   const QImage picture = pictureOf(widget);
   const QColor ground = picture.pixelColor(widget.width() - 12, 12);

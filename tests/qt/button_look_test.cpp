@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What buttons show, looked at pixel by pixel.
+// What buttons show, checked pixel by pixel.
 
 #include "toolkit/qt/button_look.hpp"
 
@@ -54,7 +54,7 @@ TEST(ButtonLook, DrawsTheTitlesColourInEveryKindOfButton) {
     showTitle(*button, redTitle());
     const int once = countPixels(pictureOf(*button), isReddish);
     EXPECT_GT(once, 50);
-    // At two pixels a point there is about four times as much of it, not the same enlarged.
+    // At two pixels a point, about four times as many pixels are red.
     EXPECT_NEAR(countPixels(pictureOf(*button, 2), isReddish), 4 * once, 1.5 * once);
   }
 }
@@ -120,7 +120,7 @@ TEST(ButtonLook, GreysTheTitleOfDisabledButtons) {
   }
 }
 
-/// In words, for not every kind of value can be compared.
+/// Returns the properties as text, because some kinds of value cannot be compared.
 std::map<std::string, std::string> propertiesOf(const QObject& object) {
   std::map<std::string, std::string> values;
   for (int i = 0; i < object.metaObject()->propertyCount(); ++i) {

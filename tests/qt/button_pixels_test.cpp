@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Whatever a button is, and however its host has dressed it: what a script does to it is seen.
+// Script changes are visible on every kind of button, however its host styles it.
 
 #include <gtest/gtest.h>
 
@@ -24,7 +24,7 @@ using namespace toolkit;
 using namespace toolkit::qt;
 using namespace rendering;
 
-/// As a host may have one, that paints itself.
+/// A host's own button, which paints itself.
 struct Dial : QAbstractButton {
   explicit Dial(const QString& text) { setText(text); }
   void paintEvent(QPaintEvent*) override {
@@ -103,14 +103,14 @@ void setPress(QAbstractButton& button, Press press) {
   button.setChecked(press != Press::off);
 }
 
-/// WCAG's.
+/// Approximates WCAG's relative luminance.
 double luminance(QRgb pixel) {
   const auto linear = [](int channel) { return std::pow(channel / 255.0, 2.2); };
   return 0.2126 * linear(qRed(pixel)) + 0.7152 * linear(qGreen(pixel)) +
          0.0722 * linear(qBlue(pixel));
 }
 
-/// The share of the pixels whose lightness changes by at least a seventh of its range.
+/// Returns the share of pixels whose luminance changes by at least a seventh of its range.
 double shareOfNoticed(const QImage& before, const QImage& after) {
   int noticed = 0;
   for (int y = 0; y < before.height(); ++y)
@@ -139,7 +139,7 @@ void expectEachShows(QAbstractButton& button) {
 
   showTitle(button, AttributedString("Title", {.foregroundColor = colors::red}));
   EXPECT_NE(pictureOf(button), before) << "title";
-  // Halfway to the ground, it is another colour.
+  // A disabled title is mixed with its background and may not be red any more.
   const int seen = button.isEnabled() ? reddish + 20 : -1;
   EXPECT_GT(countPixels(pictureOf(button), isReddish), seen) << "title";
   showTitle(button, "Title");

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// A form out of Qt Designer, in whose file the tags and the image view are dynamic properties.
+// A form from Qt Designer, whose file sets the tags and the image view as dynamic properties.
 
 #include "tests/qt/support.hpp"
 #include "ui_designer_form.h"

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What the driver's own views look like.
+// The look of the driver's own views.
 
 #include <gtest/gtest.h>
 

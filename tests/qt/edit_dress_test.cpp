@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Edits of one style show what all of their text has in common.
+// Edits with a single style show the attributes that all of their text shares.
 
 #include "toolkit/qt/edit_dress.hpp"
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Which fonts the Qt toolkit knows, and what it draws them with.
+// The fonts that the Qt toolkit knows, and the fonts that it draws them with.
 
 #include "toolkit/qt/fonts.hpp"
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The example of a host: its walk-throughs come and go, and the host works on.
+// The example host: walk-throughs begin and end, and the host keeps working.
 #include <gtest/gtest.h>
 
 #include <QMenu>
@@ -31,7 +31,7 @@ struct HostExample : testing::Test {
     hosts::settle();
   }
 
-  /// The form's own buttons do what they did before any walk-through, once a press.
+  /// Expects the form's own buttons to work as before any walk-through, once per press.
   void expectHostWorks() {
     form->name.setText("Ada");
     click(form->order);

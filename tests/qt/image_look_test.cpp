@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Images: where they lie, and how sharp they are.
+// Images: their place and their sharpness.
 
 #include "toolkit/qt/image_look.hpp"
 
@@ -47,7 +47,7 @@ TEST_F(ImageLook, ShrinksProportionallyAndNeverEnlarges) {
     QRect shown;
   };
   const Case cases[] = {
-      {{40, 20}, {100, 60}, {30, 20, 40, 20}},   // fits: its own size, in the middle
+      {{40, 20}, {100, 60}, {30, 20, 40, 20}},   // fits: original size, centred
       {{200, 100}, {100, 60}, {0, 5, 100, 50}},  // too wide
       {{50, 120}, {100, 60}, {38, 0, 25, 60}},   // too high
   };

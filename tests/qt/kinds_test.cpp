@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Which widget is which kind of view, where it lies, and its tag; states; the keyboard's focus.
+// The views of widgets: their kind, frame and tag; states; keyboard focus.
 
 #include <QCalendarWidget>
 #include <QCheckBox>
@@ -55,7 +55,7 @@ TEST_F(Kinds, GoByTheClassOfTheWidget) {
   add<QTextEdit>();
   add<QPlainTextEdit>();
   add<QWidget>();
-  new QDialog(panel.get());  // a window, no subview
+  new QDialog(panel.get());  // a window, not a subview
   const char* const expected[] = {"button",     "button",     "view",       "text field",
                                   "image view", "image view", "text field", "text field",
                                   "text field", "view"};

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Labels that draw their styled text themselves look as labels do that read it in HTML.
+// A label whose styled text a LabelPage draws looks like a label that shows the same HTML itself.
 
 #include "toolkit/qt/label_page.hpp"
 
@@ -32,7 +32,7 @@ AttributedString styledText() {
   return text;
 }
 
-/// What a host may set of a label, and what may happen to it after the text was shown.
+/// The settings of a label before the text is shown, and changes afterwards.
 struct PageCase {
   const char* name;
   std::function<void(QLabel&)> before;
@@ -79,7 +79,7 @@ const PageCase pageCases[] = {
     {"selectable", [](QLabel& label) { label.setTextInteractionFlags(Qt::TextSelectableByMouse); }},
 };
 
-/// Sees the paint events that nobody has taken over since it was made.
+/// Counts the paint events that no event filter installed later intercepts.
 struct Painted : QObject {
   explicit Painted(QObject& watched) { watched.installEventFilter(this); }
   bool eventFilter(QObject*, QEvent* event) override {
@@ -97,7 +97,7 @@ TEST_P(DrawnLabels, LookAsTheyWouldByThemselves) {
   drawn.resize(320, 160);
   GetParam().before(drawn);
   showText(drawn, styledText());
-  pictureOf(drawn);  // laid out before what comes afterwards
+  pictureOf(drawn);  // lays the text out before the changes below
   GetParam().after(drawn);
 
   QLabel plain;
@@ -146,7 +146,7 @@ TEST(LabelPage, LeavesLabelsToThemselvesThatShowASelection) {
   }
 }
 
-// The label itself finds the link, in a layout of its own.
+// The label finds the link itself, in its own layout.
 TEST(LabelPage, LeavesLinksToTheHostWhereTheyAreDrawn) {
   QLabel label;
   label.resize(300, 60);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Widgets that the host deletes: their views are as if they were not there.
+// Widgets that the host deletes: their views then behave as absent ones.
 
 #include <QCheckBox>
 #include <QLabel>
@@ -61,7 +61,7 @@ TEST_F(Lifetime, AWidgetMayBeDeletedAtOnceInItsOwnClick) {
   EXPECT_TRUE(window->contentView()->subviews().empty());
 }
 
-/// An engine over the window, whose script is the text.
+/// Returns an engine over the host's window, with this script.
 std::shared_ptr<QZ_Plist_State_Parser> walkThrough(hosts::Host& host, std::string_view script) {
   host.toolkit.log().setSink([](std::string_view) {});
   auto engine = QZ_Plist_State_Parser::initWithWindow(host.toolkit, host.window);
@@ -70,8 +70,8 @@ std::shared_ptr<QZ_Plist_State_Parser> walkThrough(hosts::Host& host, std::strin
   return engine;
 }
 
-// The list turns a box on, of which the host makes the text go; what comes next finds no text, and
-// the box goes in the middle of the last command of all.
+// The list checks the box, and the host then deletes the label, so the next command finds none. The
+// last command unchecks the box, and the host deletes the box while the command runs.
 TEST_F(Lifetime, WidgetsMayBeDeletedWhileAListRuns) {
   auto* const box = &add<QCheckBox>("Box");
   QPointer<QLabel> label = &add<QLabel>("Text");

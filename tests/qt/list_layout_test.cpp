@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Lists of styled text: each level stands further in, and its lines hang.
+// Lists of styled text: each level is indented further, and its lines hang.
 
 #include <gtest/gtest.h>
 
@@ -35,10 +35,10 @@ AttributedString itemsOfTwoLevels(const std::string& words) {
   return text;
 }
 
-/// Even that of a small circle, which is all edge.
+/// True for faint ink too, as in a small circle, which is all edge.
 bool isInked(const QColor& color) { return color.lightness() < 210; }
 
-/// A line of text as it is drawn: where it begins, and where what follows the first gap does.
+/// The start of a drawn line, and the start of the text behind its first gap.
 struct DrawnLine {
   int left;
   int behindGap;
@@ -51,7 +51,7 @@ int firstDark(const QImage& band, int from) {
 }
 
 DrawnLine lineIn(const QImage& band) {
-  constexpr int gap = 5;  // is wider than those between letters
+  constexpr int gap = 5;  // wider than the gaps between letters
   const int left = firstDark(band, 0);
   int last = left;
   for (int x = firstDark(band, left); x <= last + gap && x < band.width();
@@ -96,7 +96,7 @@ TEST(ListLayout, IndentsEachLevelAndHangsItsLines) {
     QLabel label;
     label.setWordWrap(true);
     expectHangingLines(label, 0, words);
-    QLabel selectable;  // draws the text by itself
+    QLabel selectable;  // draws the text itself
     selectable.setWordWrap(true);
     selectable.setTextInteractionFlags(Qt::TextSelectableByMouse);
     expectHangingLines(selectable, 0, words);

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Tests of widgets need an application. Nobody sees its windows, unless QT_QPA_PLATFORM says where
-// to.
+// Runs the widget tests in an application. Its windows are invisible, unless QT_QPA_PLATFORM names
+// a platform that shows them.
 
 #include <gtest/gtest.h>
 
@@ -11,7 +11,7 @@ int main(int argc, char** argv) {
   if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
   const QApplication application(argc, argv);
   QApplication::setQuitOnLastWindowClosed(false);
-  std::setlocale(LC_ALL, "C");  // Qt sets the user's
+  std::setlocale(LC_ALL, "C");  // Qt sets the user's locale
   testing::InitGoogleTest(&argc, argv);
   return RUN_ALL_TESTS();
 }

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Playing scripts in windows: pictures of the steps, and a person who presses what they see.
+// Playing scripts in windows: pictures of the steps, and a person who presses visible buttons.
 #include "tools/play/play.hpp"
 
 #include <gtest/gtest.h>
@@ -26,7 +26,7 @@ namespace {
 
 namespace fs = std::filesystem;
 
-/// A directory for one test, gone afterwards.
+/// A directory for one test, removed on destruction.
 struct Directory {
   fs::path path = fs::temp_directory_path() / ("qz-play-" + std::to_string(::getpid()));
 
@@ -41,7 +41,7 @@ struct Directory {
   }
 };
 
-/// The names of the files there, in order.
+/// Returns the names of the files in `path`, sorted.
 std::string namesIn(const fs::path& path) {
   std::set<std::string> names;
   for (const auto& entry : fs::directory_iterator(path)) names.insert(entry.path().filename());
@@ -56,7 +56,7 @@ std::string contents(const fs::path& path) {
   return text.str();
 }
 
-/// A push starts a timer of a second, whose list shows a second button, which ends it all.
+/// Button 2 starts a timer of a second, whose list shows button 3, which ends the walk-through.
 constexpr const char* script =
     "{ 1 = ((HIDE_OBJECT_WITH_ID, 3));"
     "  2 = ((SET_TITLE_FOR_OBJECT_ID, Pushed, 2), (SET_TIMER_FOR_ID, 1, 5));"
@@ -98,7 +98,7 @@ QPushButton* buttonTitled(const char* title) {
   return nullptr;
 }
 
-/// A session over the script's window, begun and left to a person.
+/// A started session over the script's window, for a person to play.
 class PlayedByAPerson : public testing::Test {
  protected:
   PlayedByAPerson() { session.start(options.script, ""); }
@@ -127,7 +127,7 @@ class PlayedByAPerson : public testing::Test {
 };
 
 TEST_F(PlayedByAPerson, writesDownWhatAPersonDoes) {
-  // The person presses what they see, as soon as they see it.
+  // The person presses each button as soon as it is visible.
   QTimer person;
   person.callOnTimeout([] {
     for (const char* title : {"2", "End"})
@@ -142,7 +142,7 @@ TEST_F(PlayedByAPerson, writesDownWhatAPersonDoes) {
   expectInOrder({"1. start", "2. press 2 (2)", "3. list 5 runs by its timer", "4. press 3 (End)"});
 }
 
-/// Presses the button that it watches in the very moment in which it shows.
+/// Presses the watched button at the moment when it is shown.
 struct Eager : QObject {
   bool eventFilter(QObject* button, QEvent* event) override {
     if (event->type() == QEvent::Show) static_cast<QPushButton*>(button)->click();

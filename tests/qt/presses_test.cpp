@@ -53,7 +53,7 @@ TEST_F(Presses, ReplaceTheHostsOwnConnectionsToTheClickAndNoOthers) {
   QObject::connect(&box, &QCheckBox::toggled, [&] { ++toggles; });
   QObject::connect(&box, &QCheckBox::released, [&] { ++releases; });
   const auto button = adopt(box);
-  adopt(box);  // again: one action a press all the same
+  adopt(box);  // adopted again, it still sends one action a press
   show();
   box.click();
   EXPECT_EQ(clicks, 0);
@@ -62,7 +62,7 @@ TEST_F(Presses, ReplaceTheHostsOwnConnectionsToTheClickAndNoOthers) {
   EXPECT_EQ(performer->actions, Actions{"go:"});
 }
 
-// The action may still find its way to an engine, as the window's delegate.
+// The action may still reach an engine that is the window's delegate.
 TEST_F(Presses, LeaveTheHostsOwnConnectionsWhenOnlyTheActionIsSet) {
   auto& next = add<QPushButton>("Next");
   int clicks = 0;

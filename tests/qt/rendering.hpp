@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Looking at what widgets draw, for tests of the Qt toolkit.
+// Pictures of widgets, and their pixels, for tests of the Qt toolkit.
 #pragma once
 
 #include <QColor>
@@ -11,7 +11,7 @@
 
 namespace rendering {
 
-/// What `widget` draws, at so many pixels a point, on white.
+/// Returns a picture of `widget` on white, at `ratio` pixels a point.
 inline QImage pictureOf(QWidget& widget, double ratio = 1) {
   QImage picture(widget.size() * ratio, QImage::Format_RGB32);
   picture.setDevicePixelRatio(ratio);
@@ -20,7 +20,7 @@ inline QImage pictureOf(QWidget& widget, double ratio = 1) {
   return picture;
 }
 
-/// How many pixels of `area`, in pixels, are as `wanted` says.
+/// Counts the pixels of `area`, which is in pixels, for which `wanted` is true.
 inline int countPixels(const QImage& picture, const QRect& area,
                        const std::function<bool(const QColor&)>& wanted) {
   int count = 0;
@@ -40,7 +40,7 @@ inline bool isReddish(const QColor& color) {
 
 inline bool isDark(const QColor& color) { return color.lightness() < 100; }
 
-/// The smallest rectangle around the pixels that are as `wanted` says; empty where there are none.
+/// Returns the smallest rectangle around the pixels for which `wanted` is true, or an empty one.
 inline QRect boundsOf(const QImage& picture, const std::function<bool(const QColor&)>& wanted) {
   QRect bounds;
   for (int y = 0; y < picture.height(); ++y)

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Attributed strings as documents: every attribute arrives.
+// Attributed strings as documents: every attribute is kept.
 
 #include "toolkit/qt/rich_text.hpp"
 
@@ -20,7 +20,7 @@ TextSetting plainSetting() { return {QFont(), Qt::blue, Qt::white}; }
 
 QTextCharFormat formatAt(const QTextDocument& document, int position) {
   QTextCursor cursor(const_cast<QTextDocument*>(&document));
-  cursor.setPosition(position + 1);  // the format of the character before
+  cursor.setPosition(position + 1);  // a cursor has the format of the character before it
   return cursor.charFormat();
 }
 
@@ -86,7 +86,7 @@ TEST(RichText, GivesEachParagraphItsStyle) {
   }
 }
 
-/// The format of the word's first character.
+/// Returns the format of the word's first character.
 QTextCharFormat formatOf(const char* word, const QTextDocument& document) {
   return formatAt(document, document.find(word).selectionStart());
 }

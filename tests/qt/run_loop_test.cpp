@@ -52,7 +52,7 @@ TEST_F(RunLoop, RepeatsUntilItIsInvalidatedInAFiring) {
   EXPECT_EQ(fired, "xxx.");
 }
 
-// What Qt's own timers cannot be set to, or would take for zero.
+// Intervals that Qt's own timers do not allow, or would treat as zero.
 TEST_F(RunLoop, TakesIntervalsOfAnyLength) {
   for (const double interval :
        {2147483.648, 25.0 * 24 * 60 * 60, 1.8e19, std::numeric_limits<double>::infinity()}) {

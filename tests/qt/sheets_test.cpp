@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Sheets: what they block, how users end them, and what is left of them.
+// Sheets: what they block, how users end them, and what they leave behind.
 
 #include <QPushButton>
 #include <QWindow>
@@ -29,7 +29,7 @@ struct Sheets : hosts::Host {
   }
 };
 
-// Through the native window, where Qt decides whether input arrives.
+// Clicks through the native window, where Qt decides whether input arrives.
 void clickInWindow(QWidget& widget) {
   QTest::mouseClick(widget.window()->windowHandle(), Qt::LeftButton, {},
                     widget.mapTo(widget.window(), widget.rect().center()));

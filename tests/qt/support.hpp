@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// A host with a window of its own, for tests of the Qt toolkit.
+// A host with its own window, for tests of the Qt toolkit.
 #pragma once
 
 #include <gtest/gtest.h>
@@ -17,7 +17,7 @@
 
 namespace hosts {
 
-/// Performs every action, and notes who sent which.
+/// Performs every action, and records the actions and their senders.
 struct Performer : toolkit::Responder {
   std::vector<std::string> actions;
   std::vector<toolkit::Ref<toolkit::View>> senders;
@@ -31,7 +31,7 @@ struct Performer : toolkit::Responder {
   }
 };
 
-/// Waits for what was posted, deletions too.
+/// Handles all posted events, including deferred deletions.
 inline void settle() {
   QCoreApplication::processEvents();
   QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
@@ -48,7 +48,7 @@ struct Host : testing::Test {
     panel->setObjectName("panel");
   }
 
-  /// A widget in the panel, at a place of its own.
+  /// Adds a widget to the panel, below those added before.
   template <class W, class... Arguments>
   W& add(Arguments... arguments) {
     auto* const widget = new W(arguments..., panel.get());
@@ -62,7 +62,7 @@ struct Host : testing::Test {
     ASSERT_TRUE(QTest::qWaitForWindowActive(panel.get()));
   }
 
-  /// The button's action goes to the performer.
+  /// Makes the button send "go:" to the performer.
   toolkit::Ref<toolkit::Button> adopt(QAbstractButton& widget) {
     const auto button = toolkit::asButton(toolkit.application().view(widget));
     button->setTarget(performer);

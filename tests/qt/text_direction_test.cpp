@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Styled text stands where plain text does, in either layout direction.
+// Styled text is placed like plain text, in both layout directions.
 
 #include <gtest/gtest.h>
 
@@ -35,7 +35,7 @@ QImage pictureWith(QWidget& widget, const Text& text) {
   return pictureOf(widget);
 }
 
-/// Both, in black letters of the widget's own font.
+/// Expects `text` to look the same plain and styled, in black and the widget's own font.
 void expectSamePicture(QWidget& widget, const std::string& text,
                        const std::optional<ParagraphStyle>& style = {}) {
   SCOPED_TRACE(std::string(widget.metaObject()->className()) + ", " + text +

@@ -28,7 +28,7 @@ namespace {
 using toolkit::Ref;
 using toolkit::Timer;
 
-/// Notes in their order what fires ("a") and the presses of the button ("p").
+/// Records firings of the timer ("a") and presses of the button ("p"), in order.
 struct WaitingTimers : testing::Test {
   toolkit::qt::QtLog log;
   toolkit::qt::Calls calls{log};
@@ -51,15 +51,15 @@ struct WaitingTimers : testing::Test {
     return loop.schedule(0.01, false, [this](const Ref<Timer>&) { noted += 'a'; });
   }
 
-  /// Schedules a timer, and says whether it has still not fired after it was due.
+  /// Schedules a timer. True if it has not fired after it was due.
   bool waits() {
     schedule();
     QTest::qWait(40);
-    QCoreApplication::processEvents();  // a busy machine may have taken the time for itself
+    QCoreApplication::processEvents();  // a busy machine may not have handled the timer yet
     return noted.empty();
   }
 
-  /// Whether the timer that waited fires, without anything more that the user does.
+  /// True if the waiting timer fires without further input from the user.
   bool fires() {
     return QTest::qWaitFor([&] { return noted.ends_with('a'); });
   }
@@ -70,7 +70,7 @@ struct WaitingTimers : testing::Test {
     return noted.ends_with('a');
   }
 
-  /// As the window system does: Qt counts these, other than events that are sent to a widget.
+  /// Presses through the window system. Qt tracks this press, unlike events sent to a widget.
   void pressForQt() { QTest::mousePress(window.windowHandle(), Qt::LeftButton, {}, place()); }
   void releaseForQt() { QTest::mouseRelease(window.windowHandle(), Qt::LeftButton, {}, place()); }
   QPoint place() const { return button.geometry().center(); }
@@ -171,7 +171,7 @@ TEST_F(WaitingTimers, FireWhenAnotherWindowTakesTheFocus) {
   EXPECT_TRUE(fires());
 }
 
-/// Keeps what the mouse does from all others, as dragging does.
+/// Intercepts mouse moves and releases, as dragging does.
 struct MouseGrab : QObject {
   MouseGrab() { QCoreApplication::instance()->installEventFilter(this); }
   bool eventFilter(QObject*, QEvent* event) override {

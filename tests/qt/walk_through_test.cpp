@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The host's side of a walk-through: however it ends, the host learns of it and has its window
-// back.
+// The host's side of a walk-through: however it ends, the host is told and gets its window back.
 
 #include "hosts/qt/walk_through.hpp"
 
@@ -21,7 +20,7 @@ struct WalkThroughs : hosts::Host {
   QPushButton& done = add<QPushButton>("Done");
   int clicks = 0;
   int ends = 0;
-  std::string logged;  // last
+  std::string logged;  // the last line
   hosts::qt::WalkThrough walkThrough{toolkit};
 
   WalkThroughs() {
@@ -177,12 +176,12 @@ TEST_F(WalkThroughs, InSheetsEndWhenTheDialogIsDismissed) {
   }
 }
 
-// As it comes when the desktop hides a window that it minimises.
+// Sends the event that arrives when the desktop hides a window that it minimises.
 TEST_F(WalkThroughs, GoOnWhenTheDesktopHidesTheWindow) {
   ASSERT_TRUE(walkThrough.play("tour.plist", *panel));
   QHideEvent hide;
   QSpontaneKeyEvent::setSpontaneous(&hide);
-  qApp->notify(panel.get(), &hide);  // `sendEvent` would take the mark away
+  qApp->notify(panel.get(), &hide);  // `sendEvent` would clear the spontaneous flag
   hosts::settle();
   EXPECT_EQ(ends, 0);
 }

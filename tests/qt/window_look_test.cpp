@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Windows of any colour stay readable, in what is drawn and not only in what palettes say.
+// Windows of any colour stay readable as drawn, not only by their palettes.
 
 #include "toolkit/qt/window_look.hpp"
 
@@ -24,7 +24,7 @@ using namespace rendering;
 
 double bestContrast(QWidget& widget, const QColor& ground) {
   double best = 1;
-  // What the check box itself looks like is the style's affair: the text begins at the right.
+  // The style decides the look of the box itself, so only the text to its right counts.
   const QImage picture = pictureOf(*widget.window());
   const QRect area(widget.mapTo(widget.window(), QPoint(30, 0)), widget.size() - QSize(30, 0));
   countPixels(picture, area, [&](const QColor& color) {

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // An engine that runs out of memory: std::bad_alloc reaches the host, nothing leaks, and the engine
-// goes on working.
+// still works afterwards.
 
 #include <gtest/gtest.h>
 
@@ -39,12 +39,12 @@ TEST_F(OutOfMemory, LoadingAScriptEndsAndCanBeTriedAgain) {
       try {
         loaded = engine->loadPlist(script, std::nullopt, nullptr, false);
       } catch (...) {
-        engine->setPlistDictionary(nullptr);  // else what was read at the time before counts
+        engine->setPlistDictionary(nullptr);  // else a script left behind counts as leaked
         throw;
       }
       engine->setPlistDictionary(nullptr);
     });
-    // NOLINTNEXTLINE(clang-analyzer-unix.Malloc): whatever operator new above gives, delete frees
+    // NOLINTNEXTLINE(clang-analyzer-unix.Malloc): delete frees what operator new above allocates
     EXPECT_GT(failures, 5) << *script;
     EXPECT_TRUE(loaded) << *script;
     EXPECT_TRUE(engine->loadPlist(script, "1", nullptr, false)) << *script;

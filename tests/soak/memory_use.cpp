@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// How much memory this process uses, as the C library or the sanitizer and the kernel tell it.
+// The memory that this process uses, as reported by the C library or the sanitizer and the kernel.
 
 #include "tests/soak/memory_use.hpp"
 
@@ -15,7 +15,7 @@
 #endif
 
 #if defined(QZ_SOAK_SANITIZED)
-// Every sanitizer has it; not every compiler brings the header along.
+// Every sanitizer has this function; not every compiler provides the header.
 extern "C" std::size_t __sanitizer_get_current_allocated_bytes();
 #elif defined(__GLIBC__)
 #include <malloc.h>

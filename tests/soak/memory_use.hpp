@@ -1,10 +1,11 @@
 // SPDX-License-Identifier: MIT
-// How much memory this process uses.
+// The memory that this process uses.
 #pragma once
 
 #include <cstdint>
 
-/// Bytes, at one moment. On a system that does not tell, or not exactly enough, a figure is 0.
+/// The memory in use at one moment, in bytes. A figure that the system does not report exactly
+/// enough is 0.
 struct MemoryUse {
   std::int64_t heap = 0;      ///< allocated and not freed
   std::int64_t resident = 0;  ///< in physical memory; a sanitizer keeps freed memory there for long
@@ -12,7 +13,7 @@ struct MemoryUse {
 
 MemoryUse memoryUse();
 
-/// Whether the memory in use is known on this system.
+/// True if this system reports the heap memory in use.
 bool knowsHeap();
-/// Whether resident memory says something about the program, rather than about a sanitizer.
+/// True if resident memory tells something about the program, rather than about a sanitizer.
 bool knowsResident();

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
-// Soak test: a walk-through that goes on for a very long time, virtually, with timers, flashing,
-// presses, re-tagging and reloaded scripts, and must take no more memory for it.
+// Soak test: plays a walk-through for a very long virtual time, with timers, flashing, presses,
+// re-tagging and reloaded scripts. Its memory use must not grow.
 //
 // `soak [SCALE]` plays SCALE times the full length (1). It prints the memory in use at every
-// quarter and fails when the last quarter's growth is above the bound, or when anything did not
-// happen as often as it should have.
+// quarter. It fails if the last quarter's growth is above the bound, or if anything happened less
+// or more often than expected.
 
 #include <algorithm>
 #include <chrono>
@@ -26,16 +26,16 @@ namespace {
 
 constexpr long fullRounds = 100'000;
 constexpr long secondsARound = 100;
-constexpr long roundsAGuest = 100;  // how often a second walk-through comes and goes
+constexpr long roundsAGuest = 100;  // how often a second walk-through is played
 
-// Nothing grows that is not leaked: one small object a round is far above the first of these in the
-// whole run, and above it even in a hundredth.
+// Only leaks make the memory grow. A leak of one small object a round exceeds the heap's bound far
+// in a full run, and still in a hundredth of one.
 constexpr std::int64_t heapBound = 1024;
 constexpr std::int64_t residentBound = std::int64_t{1024} * 1024;
 
-// The button 1 starts a chain of timers, one a second, that in turn run the list 70 and press the
-// button 2. 71 is armed twice: its first timer fires for nothing, its second is cancelled by
-// another. 80 touches everything else that a script can change.
+// Button 1 starts a chain of timers, one a second, that run list 70 and press button 2 in turn.
+// List 71 is armed twice: the first timer is replaced and fires without effect, the second is
+// cancelled when list 70's timer fires. List 80 touches everything else that a script can change.
 constexpr std::string_view script = R"({
   1 = ((SET_TIMER_FOR_ID, 3, 71), (SET_TIMER_FOR_ID, 4, 71), (SET_TIMER_FOR_ID, 1, 70));
   2 = ((SET_TIMER_FOR_ID, 1, 70), (SET_TITLE_FOR_OBJECT_ID, "pressed", 2));
@@ -53,7 +53,7 @@ constexpr std::string_view script = R"({
   );
 })";
 
-/// A directory of scripts and images that is removed in the end.
+/// A directory of scripts and images, removed on destruction.
 class Resources {
  public:
   Resources() {
@@ -112,7 +112,7 @@ class Soak {
                             window_->contentView());
   }
 
-  // Another walk-through, in a window of its own, from its beginning to its end.
+  // Plays another walk-through in its own window, from beginning to end.
   void playGuest() {
     auto description = toolkit::Dictionary::make();
     auto guest = QZ_Plist_State_Parser::initWithWindow(driver_.toolkit(), window_);
@@ -140,7 +140,7 @@ class Soak {
     require(exceptions_ == firings / 2, "expected " + std::to_string(firings / 2) +
                                             " logged exceptions, got " +
                                             std::to_string(exceptions_));
-    // A round has an even number of ticks, so that one more must change the look.
+    // A round has an even number of ticks, so one more must change the look.
     const bool before = driver_.look(flashing_).highlighted;
     engine_->flasherFired(engine_->flashingTimer());
     require(driver_.look(flashing_).highlighted != before, "the button does not flash");
@@ -157,7 +157,7 @@ class Soak {
   std::shared_ptr<QZ_Plist_State_Parser> engine_ =
       QZ_Plist_State_Parser::initWithWindow(driver_.toolkit(), window_);
   long rounds_ = 0;
-  long presses_ = 0;       // the user's
+  long presses_ = 0;       // by the user
   long timedPresses_ = 0;  // by firing timers
   long exceptions_ = 0;
 };

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Attributed strings: their runs, their edits, what they raise.
+// Attributed strings: their runs, their edits, the exceptions they raise.
 #include "toolkit/styled_text/attributed_string.hpp"
 
 #include <gtest/gtest.h>
@@ -136,7 +136,7 @@ TEST(AttributedString, ComparesTextAndAttributesAndNotOpenEdits) {
   EXPECT_NE(text, AttributedString("abd", {.font = times}));
 }
 
-// A text beside its model, which keeps the attributes of every single byte.
+// A text together with its model, which keeps the attributes of every single byte.
 struct Modelled {
   AttributedString text;
   std::vector<TextAttributes> model;

@@ -128,7 +128,7 @@ TEST(HtmlIndents, AddUp) {
   }));
 }
 
-// What shows the text may ask any character of a paragraph for its layout.
+// Code that shows the text may ask any character of a paragraph for its layout.
 TEST(HtmlAlignment, OfANewLineIsThatOfTheParagraphItEnds) {
   expectRuns(std::to_array<Case>({
       {"<table><tr><td align=center>x<td>y</table>", "x{center}|\ty|\n{center}"},

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The HTML reader: characters by their references and bytes.
+// The HTML reader: characters written as references and as bytes.
 #include <gtest/gtest.h>
 
 #include <array>
@@ -95,7 +95,7 @@ TEST(HtmlReferences, From128To159AreWindows1252) {
 TEST(HtmlReferences, AreReadInAttributes) {
   EXPECT_EQ(runsText(read("<a href='?a=1&amp;b=2&copy;'>x</a>")),
             "x{#0000ee link=?a=1&b=2\u00A9 underline}");
-  // A name within an address is none's reference.
+  // In an attribute, a name followed by a letter or "=" is not a reference.
   EXPECT_EQ(runsText(read("<a href='?a&copy=1&copyx=2&lt'>x</a>")),
             "x{#0000ee link=?a&copy=1&copyx=2< underline}");
   EXPECT_EQ(runsText(read("<font face=&quot;Arial&quot; color=&#114;ed>x</font>")),
@@ -117,7 +117,7 @@ TEST(HtmlReferences, NameAllOfHtml4) {
   std::string number;
   int rows = 0;
   for (; table >> name >> number; ++rows) {
-    // Beside the numeric reference to the same character: none of them is among 128 to 159.
+    // Compares with the numeric reference to the same character; none is among 128 to 159.
     EXPECT_EQ(read("&" + name + ";").string(), read("&#" + number + ";").string()) << name;
   }
   EXPECT_EQ(rows, 252);

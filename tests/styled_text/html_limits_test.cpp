@@ -22,7 +22,7 @@ std::string repeated(const std::string& piece, std::size_t size) {
   return text;
 }
 
-/// Whether every character is well-formed UTF-8, and none a surrogate.
+/// True if `text` is well-formed UTF-8 without surrogates.
 bool isUtf8(std::string_view text) {
   while (!text.empty()) {
     const auto lead = static_cast<unsigned char>(text.front());
@@ -161,7 +161,7 @@ TEST(HtmlLimits, ReadEveryBeginningOfADocument) {
   for (std::size_t length = 0; length <= html.size(); ++length) expectSound(html.substr(0, length));
 }
 
-// Whatever inline elements are opened and closed in whichever order, the words between them stay.
+// However inline elements are opened and closed, the words between them stay.
 TEST(HtmlLimits, LoseNoText) {
   constexpr std::array names = {"b", "i", "u", "font", "a", "span", "big", "sup", "cite", "tt"};
   std::mt19937 random(1998);
@@ -237,9 +237,9 @@ double cpuSeconds(const std::string& html) {
   return best;
 }
 
-// Sixteen times the input may take sixteen times as long, and some; with a quadratic reader it
-// would be 256 times. The smaller input is one that the clock can measure, unless that is very
-// long.
+// Allows sixteen times the input a little more than sixteen times the time; a quadratic reader
+// would take 256 times as long. Grows the smaller input until the clock can measure it, or to 64 Ki
+// pieces.
 bool takesTimeInProportion(const std::string& piece) {
   constexpr double measurable = 0.0005;
   std::size_t size = 1 << 10;

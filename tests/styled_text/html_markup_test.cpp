@@ -154,7 +154,7 @@ TEST(HtmlMarkup, ReadsTheDocumentsOfScripts) {
               "See |this{#00e5ff link=http://x.org/ underline}|.\n");
     EXPECT_EQ(runsText(read(joined({head, body, tail}))), "");
     EXPECT_EQ(runsText(read(joined({head, body, "b", tail}))), "b");
-    // A script may bring a document of its own.
+    // A script may contain a whole document.
     const std::string document = joined({head, "<body text=white>b", tail});
     EXPECT_EQ(runsText(read(joined({head, body, document, "\n", tail}))), "b {#ffffff}");
   }

@@ -217,7 +217,7 @@ TEST(HtmlStyle, PassesOverColorsThatAreNone) {
   }
 }
 
-// Unlike CSS, the attributes make a colour of anything.
+// Unlike CSS, the attributes turn almost any text into a colour.
 TEST(HtmlStyle, ReadsColorsOfAttributes) {
   const struct {
     const char* color;

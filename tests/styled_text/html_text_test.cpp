@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The HTML reader: which text a document turns into.
+// The HTML reader: the text that a document turns into.
 #include <gtest/gtest.h>
 
 #include <array>

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What the tests of styled text share: a small catalogue of fonts, and texts written out with their
-// attributes, so that a case is a line.
+// Shared by the tests of styled text: a small catalogue of fonts, and texts written out with their
+// attributes, so that a case is one line.
 #pragma once
 
 #include <gtest/gtest.h>
@@ -28,7 +28,7 @@ inline std::string lowercase(std::string text) {
   return text;
 }
 
-/// Knows a few families, by their names in any case, and one bold font of its own.
+/// Knows a few families, by their names in any case, and one bold font by its own name.
 class Catalogue final : public toolkit::Fonts {
  public:
   std::optional<toolkit::Font> fontWithName(std::string_view name, double size) const override {
@@ -43,7 +43,7 @@ class Catalogue final : public toolkit::Fonts {
     return std::nullopt;
   }
 
-  mutable std::size_t lookUps = 0;  ///< how often it was asked
+  mutable std::size_t lookUps = 0;  ///< how often `fontWithName` was called
 };
 
 inline toolkit::AttributedString read(std::string_view html) {
@@ -58,7 +58,7 @@ inline std::string number(double value) {
   return text.data();
 }
 
-/// "#rrggbb", and the alpha behind it where it is not 1.
+/// Returns "#rrggbb", followed by the alpha where it is not 1.
 inline std::string colorText(const toolkit::Color& color) {
   const auto part = [](double value) { return static_cast<unsigned>(std::lround(value * 255)); };
   std::array<char, 16> text{};
@@ -87,7 +87,7 @@ inline std::string paragraphText(const toolkit::ParagraphStyle& style) {
   return text;
 }
 
-/// The attributes in words; nothing of what text has that nothing was asked for: Times 12.
+/// Returns the attributes in words. The default, Times 12, is left out.
 inline std::string attributesText(const toolkit::TextAttributes& attributes) {
   std::string text = attributes.font ? fontText(*attributes.font) : "no font ";
   if (attributes.foregroundColor) text += colorText(*attributes.foregroundColor) + ' ';
@@ -101,7 +101,7 @@ inline std::string attributesText(const toolkit::TextAttributes& attributes) {
   return text;
 }
 
-/// The runs, parted by "|", each with its attributes in braces behind it: "a|b{bold}|\n".
+/// Returns the runs, separated by "|", each followed by its attributes in braces: "a|b{bold}|\n".
 inline std::string runsText(const toolkit::AttributedString& styled) {
   std::string text;
   for (const toolkit::TextRun& run : styled.runs()) {
@@ -113,7 +113,7 @@ inline std::string runsText(const toolkit::AttributedString& styled) {
   return text;
 }
 
-/// The runs cover the text in order, none is empty, neighbours differ.
+/// Expects the runs to cover the text in order, none empty, and neighbours to differ.
 inline void expectSoundRuns(const toolkit::AttributedString& styled) {
   std::size_t at = 0;
   const toolkit::TextAttributes* before = nullptr;
@@ -129,7 +129,7 @@ inline void expectSoundRuns(const toolkit::AttributedString& styled) {
 
 struct Case {
   const char* html;
-  const char* runs;  ///< as `runsText` writes them
+  const char* runs;  ///< in the form of `runsText`
 };
 
 template <std::size_t N>

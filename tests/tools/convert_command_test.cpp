@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The command `convert`: which format it writes, and that a failure leaves no file worse than it
-// was.
+// The command `convert`: the format it writes, and that a failure damages no file.
 #include <gtest/gtest.h>
 
 #include <filesystem>
@@ -36,7 +35,7 @@ class ConvertCommand : public testing::Test {
     arguments.insert(arguments.begin(), "convert");
     return run(convertCommand, arguments);
   }
-  /// A binary file with what XML has no way to write.
+  /// Writes a binary file with a value that XML cannot express.
   void writeUnwritable() const {
     const auto value = toolkit::Dictionary::make(
         {{toolkit::String::make("k"), toolkit::Array::make({toolkit::Null::make()})}});

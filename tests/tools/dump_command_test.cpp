@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The command `dump`: what it prints of every kind of value, and what it refuses.
+// The command `dump`: its output for every kind of value, and what it refuses.
 #include <gtest/gtest.h>
 
 #include <sstream>
@@ -48,7 +48,7 @@ TEST_F(DumpCommand, showsTheTypeOfEveryScalar) {
       {toolkit::String::make("5"), "\"5\""},
       {toolkit::String::make("a\"\\\t\n\r\x1b[2J"), "\"a\\\"\\\\\\t\\n\\u{d}\\u{1b}[2J\""},
       {toolkit::String::make("\0"sv), "\"\\u{0}\""},
-      // NOLINTNEXTLINE(misc-misleading-bidirectional): misleading is what it is to be
+      // NOLINTNEXTLINE(misc-misleading-bidirectional): misleading on purpose
       {toolkit::String::make("\u2028\u2029\u202E"), "\"\\u{2028}\\u{2029}\\u{202e}\""},
       {toolkit::String::make("\xED\xA0\x80z"), "\"\\u{d800}z\""},
       {toolkit::Number::withLong(-5), "-5"},

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The command line of `qz-walkthrough play`: exit statuses, and one line for whatever is wrong.
+// The command line of `qz-walkthrough play`: exit statuses, and one line for each error.
 #include <gtest/gtest.h>
 
 #include <iostream>

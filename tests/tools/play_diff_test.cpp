@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What changed from one picture to the next.
+// The changes from one picture to the next.
 #include <gtest/gtest.h>
 
 #include <functional>
@@ -33,7 +33,7 @@ TextAttributes indented(double firstLine) {
   return attributes;
 }
 
-/// Two runs, the second of them bold.
+/// Returns a text of two runs, the second bold.
 AttributedString halfBold(const std::string& first, const std::string& second) {
   AttributedString text(first);
   text.append(second, bold());
@@ -102,7 +102,7 @@ TEST(PlayDiff, namesEveryChangeOfTheWindow) {
   }
 }
 
-/// What is said of a text field that shows `now` after `before`.
+/// Returns the changes reported for a text field that shows `now` after `before`.
 Changes textChanges(const AttributedString& before, const AttributedString& now) {
   StepPicture first = oneControl(ViewKind::textField);
   first.controls[0].view.text = before;
@@ -179,9 +179,9 @@ TEST(PlayDiff, timersCountWhenArmedAndWhenGone) {
   StepPicture before = windowPicture();
   before.timers = {{newIdentity(), "3", 1}, {newIdentity(), "5", 2}, {newIdentity(), "7", 3}};
   StepPicture now = before;
-  now.timers[0].timeLeft = 0.5;                   // only runs on
-  now.timers[1] = {newIdentity(), "5", 2};        // armed anew
-  now.timers[2] = {newIdentity(), "-1", 1.8e19};  // another one
+  now.timers[0].timeLeft = 0.5;                   // only its time passes
+  now.timers[1] = {newIdentity(), "5", 2};        // armed again
+  now.timers[2] = {newIdentity(), "-1", 1.8e19};  // another timer
   const Changes expected = {{"timer of list -1", "none", "fires practically never"},
                             {"timer of list 5", "fires in 2 s", "armed anew, fires in 2 s"},
                             {"timer of list 7", "fires in 3 s", "none"}};

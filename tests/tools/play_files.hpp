@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Files for the tests of what the player reads, in a directory of their own.
+// A temporary working directory for the tests of files that the player reads.
 #pragma once
 
 #include <unistd.h>
@@ -11,7 +11,7 @@
 
 namespace tools::play {
 
-/// A directory that is the working directory for as long as this lives, and is gone afterwards.
+/// Makes a temporary directory the working directory; the destructor undoes both.
 class WorkingDirectory {
  public:
   WorkingDirectory() : before_(std::filesystem::current_path()) {

@@ -19,7 +19,7 @@ HostWindow read(std::string_view text) {
   return parseHostWindow(InputFile("host.plist", "a host's window"));
 }
 
-/// What a bad file's message is.
+/// Returns the error message for a file of this text, or "accepted".
 std::string refusal(std::string_view text) {
   try {
     read(text);

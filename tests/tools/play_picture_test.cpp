@@ -24,7 +24,7 @@ TextAttributes styled() {
   return attributes;
 }
 
-/// One control for everything that can be said of one.
+/// Returns a picture in which every property of a control occurs.
 StepPicture everything() {
   StepPicture picture = windowPicture();
   picture.window->layerImage = "paper";

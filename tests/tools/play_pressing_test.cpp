@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What a user can press, and where the walk-through stands.
+// Which controls a user can press, and what the walk-through waits for.
 #include <gtest/gtest.h>
 
 #include "play_support.hpp"

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The lines that the user of an interactive walk-through writes.
+// The lines that the user of an interactive walk-through types.
 #include <gtest/gtest.h>
 
 #include "tools/play/prompt.hpp"

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What a walk-through is played on when no window is given, and how it is looked at.
+// The stand-in for a window that is not given, and the pictures of a stage.
 #include <gtest/gtest.h>
 
 #include "play_files.hpp"
@@ -19,7 +19,7 @@ toolkit::ValueRef<toolkit::Dictionary> script(std::string_view text) {
   return InputFile("script.plist", "a script").dictionary();
 }
 
-/// The stand-in's controls, from top to bottom: "1 button, 7 image".
+/// Returns the stand-in's controls, from top to bottom: "1 button, 7 image".
 std::string standIn(std::string_view text) {
   std::string words;
   for (const HostControl& control : standInWindow(script(text)).controls) {

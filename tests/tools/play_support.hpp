@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Pictures of walk-throughs for the tests of what is said about them.
+// Example pictures of walk-throughs, for tests.
 #pragma once
 
 #include <deque>
@@ -12,7 +12,7 @@
 
 namespace tools::play {
 
-/// Something that pictures can be told apart by, kept to the end of the program.
+/// Returns a new identity for the picture of a control or timer, valid until the program ends.
 inline std::weak_ptr<const void> newIdentity() {
   static std::deque<std::shared_ptr<int>> identities;
   return identities.emplace_back(std::make_shared<int>());
@@ -41,7 +41,7 @@ inline StepPicture windowPicture() {
   return picture;
 }
 
-/// The whole text of a file in tests/data/play.
+/// Returns the whole text of a file in tests/data/play.
 inline std::string playData(const std::string& name) {
   std::ifstream file(std::string(QZ_TEST_DATA) + "/play/" + name, std::ios::binary);
   std::ostringstream text;

@@ -36,7 +36,7 @@ std::string refusal(const PlayOptions& options, ExitStatus status = ExitStatus::
   return "accepted";
 }
 
-/// The lines of a transcript that are headings, without the rule that fills them.
+/// Returns the headings of a transcript, without the rules that fill their lines.
 std::string headings(const std::string& transcript) {
   std::istringstream lines(transcript);
   std::string found;
@@ -55,7 +55,8 @@ PlayOptions firstSteps() {
   return options;
 }
 
-/// A script of four lists in the working directory: a chain, a timer, an end, and one that raises.
+/// Writes a script into the working directory: list 1 sets a title, 2 starts a timer, 3 ends the
+/// walk-through, and 4 is not a list, so that it raises.
 PlayOptions smallScript(const WorkingDirectory& directory) {
   directory.write("script.plist",
                   "{ 1 = (IDLE_LOOP, (SET_TITLE_FOR_OBJECT_ID, Go, 1));"
@@ -145,7 +146,7 @@ TEST(Play, aWalkThroughThatStandsStillHasFailed) {
   EXPECT_EQ(stuck.status, ExitStatus::failed);
   EXPECT_TRUE(stuck.log.ends_with(line)) << stuck.log;
   EXPECT_NE(stuck.transcript.find("\nThe walk-through stands still: "), std::string::npos);
-  // A timer, or the end, is a way on.
+  // With a timer pending, or after its end, a walk-through has not failed.
   directory.write("script.plist", "{ 1 = (DISABLE_OBJECT_WITH_ID, (SET_TIMER_FOR_ID, 2, 1)); }");
   EXPECT_EQ(run(options).status, ExitStatus::fine);
   directory.write("script.plist", "{ 1 = (IDLE_LOOP); 2 = (TERMINATE_PARSER); }");

@@ -42,7 +42,7 @@ TEST(PlayTextLayout, whatDisturbsATerminalIsWrittenOut) {
       {"a carriage return", "a\r\nb", "a\\u{d}\nb"},
       {"the last control character", "\x7f", "\\u{7f}"},
       {"a control character beyond ASCII", "\u0085", "\\u{85}"},
-      // NOLINTNEXTLINE(misc-misleading-bidirectional): misleading is what it is to be
+      // NOLINTNEXTLINE(misc-misleading-bidirectional): misleading on purpose
       {"a change of direction", "\u202Eabc", "\\u{202e}abc"},
       {"a tab", "a\tb", "a b"},
       {"the separators end a line", "a\u2028b\u2029c\nd", "a\nb\nc\nd"},

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Class names on a toolkit that has names of its own.
+// Class names on a toolkit with its own names.
 #include <gtest/gtest.h>
 
 #include <string>
@@ -16,7 +16,7 @@ using toolkit::View;
 using toolkit::ViewKind;
 using toolkit::Window;
 
-/// A driver of the memory toolkit, but for the names of the kinds.
+/// A driver of the memory toolkit with other class names.
 class ForeignDriver final : public toolkit::TestDriver {
  public:
   std::string_view name() const override { return "foreign"; }
@@ -43,7 +43,7 @@ class ForeignDriver final : public toolkit::TestDriver {
   void setLogSink(std::function<void(std::string_view)> sink) override {
     driver_->setLogSink(std::move(sink));
   }
-  // On and off buttons have a class of their own; texts and images share one.
+  // On-off buttons have their own class; texts and images share one.
   std::string_view className(ViewKind kind) const override {
     switch (kind) {
       case ViewKind::button:

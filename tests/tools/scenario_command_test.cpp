@@ -31,14 +31,14 @@ std::string withoutFolder(std::string text) {
   return text;
 }
 
-/// Runs the tool; the folder of the test's files is left out of what it printed.
+/// Runs the tool, and removes the folder of the test's files from its output.
 Result runTest(const std::vector<std::string>& arguments) {
   Result result = run(testCommand, arguments);
   return {result.status, withoutFolder(std::move(result.out)),
           withoutFolder(std::move(result.err))};
 }
 
-/// Tests in a working directory of their own.
+/// Provides a temporary working directory.
 class ScenarioCommand : public testing::Test {
  protected:
   void write(const std::string& name, const std::string& text) const {
@@ -189,7 +189,7 @@ TEST_F(ScenarioCommand, resourceDirectoriesAreRemoved) {
         "scenario passes\nload deep/er/intro.plist => YES\n"
         "scenario fails\nexpect state 1\n");
   fs::create_directories("temporary");
-  // A directory of our own, for other tests may be running.
+  // A separate directory, because other tests may be running at the same time.
   const auto before = fs::temp_directory_path();
   ::setenv("TMPDIR", fs::absolute("temporary").c_str(), 1);
   const auto result = runTest({"test", "a.walk"});

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What counts as the same: JSON values, log lines and patterns, class names, near misses.
+// What counts as equal: JSON values, log lines and patterns, class names, near misses.
 #include <gtest/gtest.h>
 
 #include <string>
@@ -120,7 +120,7 @@ TEST(ScenarioComparing, wordsAsValues) {
     Word::Kind kind;
     const char* text;
     Takes takes;
-    const char* shown;  // nullptr: it is none of these
+    const char* shown;  // nullptr: not a value that `takes` allows
   } cases[] = {
       {Word::Kind::bare, "YES", Takes::flag, "YES"},
       {Word::Kind::bare, "false", Takes::flag, "NO"},

@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Whether the language is whole: every statement and every property is there, works, and can be
-// reached.
+// The language is complete: every statement and every property exists, works, and can be reached.
 #include <gtest/gtest.h>
 
 #include <set>
@@ -51,7 +50,7 @@ TEST(ScenarioCoverage, controlsAndWindowsShowAllThatTheyAre) {
 
 TEST(ScenarioCoverage, everyCommandCanBeRenamed) { EXPECT_EQ(vocabulary().constants.size(), 27U); }
 
-/// The statements that a file used, by their forms, and the properties that they named.
+/// The forms of the statements that a file used, and the properties that they named.
 struct Used {
   std::set<std::size_t> forms;
   std::set<std::string> read;  // such as "window.visible"
@@ -73,7 +72,7 @@ struct Used {
     return std::string(kind) + "." + path.property.value_or("");
   }
 
-  /// What of the properties was not used.
+  /// Returns the properties that were not read, or can be set and were not set.
   std::set<std::string> missing(const std::string& kind,
                                 const std::vector<PropertyInfo>& infos) const {
     std::set<std::string> missing;

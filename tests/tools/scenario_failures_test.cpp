@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Scenarios that must fail: where, and with which words.
+// Scenarios that must fail: the line and the message of the failure.
 #include <gtest/gtest.h>
 
 #include <string>
@@ -19,8 +19,8 @@ const std::string beginning =
     "ignore log\n";
 
 struct Case {
-  const char* text;     ///< behind the beginning
-  const char* failure;  ///< "LINE: problem"; lines count from the beginning's first
+  const char* text;     ///< appended to `beginning`
+  const char* failure;  ///< "LINE: problem"; counts lines from the first of `beginning`
 };
 
 void expectFailures(std::initializer_list<Case> cases) {

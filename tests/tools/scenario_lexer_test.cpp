@@ -10,7 +10,7 @@
 namespace tools::scenario {
 namespace {
 
-/// The words of each statement, marked: bare, 'quoted', <JSON>.
+/// Returns the words of each statement, marked: bare, 'quoted', <JSON>.
 std::vector<std::vector<std::string>> marked(const std::string& text) {
   std::vector<std::vector<std::string>> all;
   for (const auto& line : readWords(text)) {

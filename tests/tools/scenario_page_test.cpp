@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The page for the writers of scenarios: its examples pass, and it leaves nothing out.
+// The page for authors of scenarios: its examples pass, and it leaves nothing out.
 #include <gtest/gtest.h>
 
 #include <fstream>
@@ -19,7 +19,7 @@ std::string page() {
   return text.str();
 }
 
-/// The examples, which stand in blocks marked "walk".
+/// Returns the examples, which are the blocks marked "walk".
 std::vector<std::string> examples() {
   const auto text = page();
   const std::string opening = "```walk\n";

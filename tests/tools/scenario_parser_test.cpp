@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// From the text of a scenario file to its scenarios, and what is refused on the way.
+// Parsing scenario files: their scenarios, and which texts are refused.
 #include <gtest/gtest.h>
 
 #include <string>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Running the text of scenarios, for the tests of the scenario language.
+// Runs scenarios from text, for the tests of the scenario language.
 #pragma once
 
 #include <string>
@@ -13,7 +13,7 @@
 
 namespace tools::scenario {
 
-/// "LINE:COLUMN: what is wrong", or an empty text when `text` is a scenario file.
+/// Returns "LINE:COLUMN: problem", or an empty text when `text` is a valid scenario file.
 inline std::string refusal(const std::string& text) {
   try {
     parseScenarios(text, vocabulary());
@@ -24,7 +24,7 @@ inline std::string refusal(const std::string& text) {
   return "";
 }
 
-/// A runner on memory toolkits that tells nobody of what it performs.
+/// Returns a runner on memory toolkits that does not report what it performs.
 inline Runner quietRunner() {
   return {[] { return makeDriver("memory"); }, "memory",
           [](const std::string&, const Statement&, const std::string&) {}};
@@ -39,7 +39,7 @@ inline std::vector<Report> runAll(const std::string& text, const Runner& runner 
   return reports;
 }
 
-/// Of a text that is one scenario: "LINE: problem", or an empty text when it passes.
+/// Returns "LINE: problem" for a text of one scenario, or an empty text when it passes.
 inline std::string failure(const std::string& text) {
   const auto report = runAll(text).at(0);
   if (report.verdict != Verdict::failed) return "";

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Running the tool's commands in the test's own process.
+// Runs the tool's commands in the test's own process.
 #pragma once
 
 #include <iostream>
@@ -11,7 +11,7 @@
 
 namespace tools {
 
-/// What a standard stream is given for as long as this lives.
+/// Captures the output to a standard stream while this object lives.
 class Captured {
  public:
   explicit Captured(std::ostream& stream) : stream_(stream), before_(stream.rdbuf(text_.rdbuf())) {}
@@ -33,7 +33,7 @@ struct Result {
   std::string err;
 };
 
-/// Runs the tool as if it had this one command.
+/// Runs the tool with only this command.
 inline Result run(const CommandEntry& command, const std::vector<std::string>& arguments) {
   const Captured out(std::cout);
   const Captured err(std::cerr);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Making windows and controls; sheets are passed on to their windows.
+// Makes windows and controls. Windows handle their own sheets.
 
 #include "toolkit/memory/application.hpp"
 
@@ -8,7 +8,7 @@
 
 namespace toolkit::memory {
 
-// There is no backing store here, and nothing that could be deferred.
+// This toolkit has no backing store and nothing to defer.
 Ref<Window> MemoryApplication::makeWindow(const Rect& content, StyleMask style, BackingStore,
                                           bool) {
   return MemoryWindow::make(screen_, content, style, KeptBy::application);

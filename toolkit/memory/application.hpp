@@ -24,11 +24,12 @@ class MemoryApplication final : public Application {
                   const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo) override;
   void endSheet(const Ref<Window>& sheet, long returnCode) override;
 
-  /// The screen of this application's windows, for whoever makes windows and views of its own.
+  /// Returns the screen of this application's windows, for code that makes windows and views
+  /// itself.
   const std::shared_ptr<Screen>& screen() const { return screen_; }
 
  private:
-  std::shared_ptr<Screen> screen_;  // views and windows only refer to it, so it ends with this
+  std::shared_ptr<Screen> screen_;  // views and windows hold only weak references to it
 };
 
 }  // namespace toolkit::memory

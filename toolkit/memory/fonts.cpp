@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The catalogue: the families that walk-throughs written on the Mac ask for.
+// The catalogue: the font families that walk-throughs written on the Mac use.
 
 #include "toolkit/memory/fonts.hpp"
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Looking images up. The file system is asked every time, so that what was found earlier is never
-// older than the directory; only the identity of the images is remembered.
+// Looks up images. Every look-up reads the directory, so that its result is never out of date; only
+// the identity of the images is cached.
 
 #include "toolkit/memory/images.hpp"
 

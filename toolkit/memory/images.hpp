@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The memory toolkit's images: named files of the resource directory. It draws nothing, so that an
-// image is its name and the place of its file.
+// The memory toolkit's images: named files in the resource directory. The toolkit draws nothing, so
+// an image consists of its name and the path of its file.
 #pragma once
 
 #include <map>
@@ -17,7 +17,7 @@ class MemoryImage final : public Image {
  public:
   MemoryImage(std::string_view name, std::string path) : name_(name), path_(std::move(path)) {}
   std::string name() const override { return name_; }
-  /// Where the file was when it was found.
+  /// The path of the file at the time of the look-up.
   const std::string& path() const { return path_; }
 
  private:
@@ -27,14 +27,14 @@ class MemoryImage final : public Image {
 
 class MemoryImages final : public Images {
  public:
-  /// `files` says where the resource directory is.
+  /// `files` provides the resource directory.
   explicit MemoryImages(const Files& files) : files_(files) {}
 
-  /// The same image whenever the same name leads to the same file.
+  /// Returns the same image each time the same name leads to the same file.
   Ref<Image> imageNamed(std::string_view name) override;
 
  private:
-  const Files& files_;  // the toolkit's, as this is
+  const Files& files_;  // owned by the toolkit, like this object
   std::map<std::string, std::shared_ptr<MemoryImage>, std::less<>> found_;
 };
 

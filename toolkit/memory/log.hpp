@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The memory toolkit's log: hands each line to the host's sink, or writes it to standard error.
+// The memory toolkit's log: passes each line to the host's sink, or writes it to standard error.
 #pragma once
 
 #include <cstdio>
@@ -15,12 +15,12 @@ class MemoryLog final : public Log {
  public:
   using Sink = std::function<void(std::string_view)>;
 
-  /// To the sink; without one, to standard error: a host without a display is a host.
+  /// Writes to the sink or, without one, to standard error, as a host without a display expects.
   void write(std::string_view line) override {
-    const Sink sink = sink_;  // which may replace itself
+    const Sink sink = sink_;  // a copy: the sink may replace itself
     sink ? sink(line) : writeToStandardError(line);
   }
-  /// An absent sink is none.
+  /// An empty function removes the sink.
   void setSink(Sink sink) { sink_ = std::move(sink); }
 
  private:

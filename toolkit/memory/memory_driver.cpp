@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Making, moving and looking at things through the classes of this toolkit; what time and clicks do
-// is theirs.
+// Makes, moves and reads views and windows through this toolkit's classes, which also implement
+// time and clicks.
 
 #include "toolkit/memory/memory_driver.hpp"
 
@@ -15,7 +15,7 @@ namespace toolkit::memory {
 
 namespace {
 
-// A kind of view is told by its class and, of a button, by what a click does to it.
+// A kind of view is identified by its class and, for a button, by the effect of a click.
 struct Kind {
   ViewKind kind;
   std::string_view className;
@@ -42,7 +42,7 @@ bool behavesAs(const Kind& row, const MemoryButton* button) {
   return button ? row.behavior && *row.behavior == button->behavior() : !row.behavior;
 }
 
-// A view of a class that is not in the table, a host's own, is a plain one.
+// A view whose class is not in the table (a host's own class) counts as plain.
 ViewKind kindOf(View& view) {
   const auto* const button = dynamic_cast<const MemoryButton*>(&view);
   const auto* const row = std::find_if(std::begin(kinds), std::end(kinds), [&](const Kind& known) {
@@ -186,7 +186,7 @@ WindowPicture MemoryDriver::look(const Ref<Window>& window) {
 }
 
 void MemoryDriver::setLogSink(std::function<void(std::string_view)> sink) {
-  // A test hears of the lines that it asks for, and of no others.
+  // Without a sink, lines are discarded rather than written to standard error.
   toolkit_.log().setSink(sink ? std::move(sink) : [](std::string_view) {});
 }
 

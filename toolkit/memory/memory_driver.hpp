@@ -18,7 +18,7 @@ class MemoryDriver final : public TestDriver {
   MemoryToolkit& toolkit() override { return toolkit_; }
 
   Ref<Window> makeWindow(const Rect& content) override;
-  /// With an absent `parent`, a view that is in no window yet.
+  /// With an absent `parent`, makes a view that is not yet in a window.
   Ref<View> makeView(ViewKind kind, Tag tag, const Rect& frame, const Ref<View>& parent) override;
   void removeFromSuperview(const Ref<View>& view) override;
   void setFrame(const Ref<View>& view, const Rect& frame) override;
@@ -26,7 +26,7 @@ class MemoryDriver final : public TestDriver {
   void setResourcePath(std::string_view path) override;
   std::string_view className(ViewKind kind) const override;
 
-  /// Buttons take clicks; nothing else here does anything with one.
+  /// Only buttons react to clicks in this toolkit.
   void click(const Ref<View>& view) override;
   void hold(const Ref<View>& view) override;
   void letGo() override;
@@ -38,11 +38,11 @@ class MemoryDriver final : public TestDriver {
 
  private:
   MemoryToolkit toolkit_;
-  std::weak_ptr<MemoryButton> held_;  // the mouse button is down on it while the user is busy
-  bool isDown_ = false;               // the held button: a click by the keyboard lifts it
+  std::weak_ptr<MemoryButton> held_;  // holds the mouse button while the user is busy
+  bool isDown_ = false;               // the held button is pressed in, until a keyboard click
 };
 
-/// A driver with a memory toolkit of its own.
+/// Makes a driver with its own memory toolkit.
 std::unique_ptr<TestDriver> makeMemoryDriver();
 
 }  // namespace toolkit::memory

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
-// The memory toolkit: a whole toolkit without a display. It keeps windows, views, sheets, the
-// responder chain and the clock as AppKit does, and behaves the same at every run; docs/toolkits.md
-// lists its rules.
+// The memory toolkit: a complete toolkit without a display. Its windows, views, sheets, responder
+// chain and clock work as in AppKit, and every run gives the same result; docs/toolkits.md lists
+// its rules.
 #pragma once
 
 #include "toolkit/memory/application.hpp"
@@ -33,8 +33,8 @@ class MemoryToolkit final : public Toolkit {
   MemoryImages images_{files_};
   MemoryFonts fonts_;
   MemoryApplication application_;
-  // The last, so that it ends first: the actions of its timers hold engines, whose ends still use
-  // the other roles.
+  // Last, so that it is destroyed first: the actions of its timers hold engines, whose destructors
+  // still use the other members.
   MemoryRunLoop runLoop_;
 };
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Letting time pass.
+// Lets time pass.
 
 #include "toolkit/memory/run_loop.hpp"
 
@@ -8,7 +8,8 @@
 namespace toolkit::memory {
 
 void MemoryRunLoop::advance(double seconds) {
-  // A never-ending advance would leave a clock on which nothing is ever due again.
+  // After an infinite advance, the clock would stand at infinity and no timer would ever be due
+  // again.
   const double end = std::numeric_limits<double>::max();
   const double target = std::min(now_ + (seconds > 0 ? seconds : 0), end);
   fireDue(target);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The memory toolkit's run loop: timers over a clock that moves only when it is told to.
+// The memory toolkit's run loop: timers on a clock that moves only on request.
 #pragma once
 
 #include <algorithm>
@@ -11,20 +11,22 @@ namespace toolkit::memory {
 class MemoryRunLoop final : public TimedRunLoop {
  public:
   MemoryRunLoop() = default;
-  /// Invalidates every timer. What their actions hold ends here and may still use this run loop.
+  /// Invalidates every timer. The objects held by their actions are destroyed here and may still
+  /// use this run loop.
   ~MemoryRunLoop() override { invalidateAll(); }
 
-  /// Seconds since the run loop was made; during a firing, when that timer was due, or when it
-  /// ceased to wait for the user.
+  /// Returns the seconds since the run loop was made. During a firing this is the time at which the
+  /// timer was due, or at which it stopped waiting for the user if that is later.
   double now() const override { return now_; }
 
-  /// Lets `seconds` pass, firing whatever comes due on the way; nothing below 0. A firing may let
-  /// time pass itself: then the others that come due fire inside it, and its own timer does not.
+  /// Lets `seconds` pass and fires the timers that come due on the way; a negative value counts as
+  /// 0. If a firing itself lets time pass, the other timers that come due fire inside it; its own
+  /// timer does not.
   void advance(double seconds);
 
   bool isInDefaultMode() const override { return !userIsBusy_; }
-  /// While the user is busy timers wait. Those that are due by the end of that fire in the next
-  /// `advance`, be it of 0 seconds.
+  /// Sets whether the user is busy; timers wait meanwhile. The timers that are then due fire in the
+  /// next `advance`, even one of 0 seconds.
   void setUserIsBusy(bool busy) { userIsBusy_ = busy; }
 
  private:

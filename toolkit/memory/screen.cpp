@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The order of windows. Sheets know their parents and not the other way round, so that whatever a
-// parent needs to know of its sheets is asked of the windows that show.
+// The order of windows. Sheets know their parents but parents do not know their sheets: the visible
+// windows are searched for the sheets of a parent.
 
 #include "toolkit/memory/screen.hpp"
 
@@ -32,7 +32,7 @@ void Screen::orderFront(const std::shared_ptr<MemoryWindow>& window) {
   orderOut(*window);
   shown_.push_back({window.get(), window->isKeptOnScreen() ? window : nullptr});
   key_ = window.get();
-  // Over a copy: the sheets change their places.
+  // A copy: bringing the sheets to the front changes the list.
   for (MemoryWindow* const other : windows())
     if (other->sheetParent() == window) orderFront(other->shared_from_this());
 }

@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: MIT
-// The screen: which windows of an application show, in which order, and which has the keyboard.
+// The screen: the visible windows of an application, their order, and the one that has the
+// keyboard.
 //
-// Invariants: a window is listed once, from being ordered front to being ordered out or destroyed;
-// the key window is on the screen; a sheet lies in front of the window it is attached to.
+// Invariants: a window is listed once, from when it is ordered front until it is ordered out or
+// destroyed; the key window is on the screen; a sheet lies in front of the window to which it is
+// attached.
 #pragma once
 
 #include <cstdint>
@@ -19,31 +21,32 @@ class Screen {
   Screen(const Screen&) = delete;
   Screen& operator=(const Screen&) = delete;
 
-  /// The windows on the screen, back to front.
+  /// Returns the windows on the screen, back to front.
   std::vector<MemoryWindow*> windows() const;
   bool shows(const MemoryWindow& window) const;
   /// Whether a sheet on the screen is attached to `window`.
   bool hasSheetOver(const MemoryWindow& window) const;
-  /// The window that has the keyboard, or null. There is none only where no window shows.
+  /// Returns the window that has the keyboard; null only if no window is visible.
   const MemoryWindow* keyWindow() const { return key_; }
 
-  /// Puts `window` in front of the others and makes it key. Its sheets come along, in front of it,
-  /// and the front-most of them is key instead.
+  /// Puts `window` in front of the others and makes it key. If it has sheets, they move in front of
+  /// it, and the front-most becomes key instead.
   void orderFront(const std::shared_ptr<MemoryWindow>& window);
-  /// Takes `window` off, if it is on. The key goes to the window that it was a sheet over, or else
-  /// to the front-most. Gives back what kept the window alive here, which may be the last that did.
+  /// Takes `window` off the screen, if it is there. If it was key, its parent becomes key, or the
+  /// front-most window if there is no visible parent. Returns the reference that kept the window
+  /// alive here, which may be the last one.
   std::shared_ptr<MemoryWindow> orderOut(const MemoryWindow& window);
 
-  /// Redraws whatever needs it, on the screen and off it: what is ordered front later is drawn
-  /// then.
+  /// Redraws every view that needs it, also in windows that are not on the screen.
   void draw() { ++drawings_; }
-  /// How often that happened: a change made since the last time is a redraw pending.
+  /// Returns the number of redraws so far. A view that changed after the last one has a redraw
+  /// pending.
   std::uint64_t drawings() const { return drawings_; }
 
  private:
   struct Shown {
-    MemoryWindow* window;                // takes itself off before it ends
-    std::shared_ptr<MemoryWindow> kept;  // the window itself, where the application keeps it alive
+    MemoryWindow* window;                // removes itself before it is destroyed
+    std::shared_ptr<MemoryWindow> kept;  // the window itself, if the application keeps it alive
   };
 
   const MemoryWindow* heirOf(const MemoryWindow& window) const;

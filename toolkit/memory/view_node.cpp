@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The tree of views: which lies in which, up to the window. Superviews own; every look upwards goes
-// through references that turn absent when a superview or a window ends before its views.
+// The tree of views, up to the window. Superviews own their subviews. The references upwards are
+// weak: a superview or a window may be destroyed before its views.
 
 #include "toolkit/memory/view_node.hpp"
 
@@ -53,7 +53,7 @@ void ViewNode::insert(const Ref<View>& view) {
   if (isWithin(*node)) refuse("the view is the superview itself, or lies around it");
 
   node->removeFromSuperview();
-  subviews_.push_back(node->view());  // `view` may have been a reference into the list just left
+  subviews_.push_back(node->view());  // `view` may refer into the list that the view has just left
   node->superview_ = weak_from_this();
   changed();
 }
@@ -63,7 +63,7 @@ void ViewNode::removeFromSuperview() {
   if (!superview) return;
   superview_.reset();
   Subviews& list = superview->subviews_;
-  list.erase(std::find(list.begin(), list.end(), view()));  // which may be the end of this view
+  list.erase(std::find(list.begin(), list.end(), view()));  // this may destroy this view
   superview->changed();
 }
 
@@ -71,7 +71,7 @@ void ViewNode::changed() {
   if (const auto screen = screen_.lock()) changedAt_ = screen->drawings();
 }
 
-// Counting the drawings spares every drawing the walk over all views to mark them drawn.
+// Compares counts, so that a redraw need not visit every view to mark it as drawn.
 bool ViewNode::isRedrawPending() const {
   const auto screen = screen_.lock();
   return screen && changedAt_ == screen->drawings();

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-// What all views of the memory toolkit have in common, whatever their role: the tree that they make
-// and what shows of them. `MemoryView` joins it to a role.
+// The base of all views of the memory toolkit: the view tree, and the visible properties that all
+// views share. `MemoryView` combines it with a role.
 //
-// Invariants: a view lies in at most one superview, which owns it, and never within itself; a
-// content view lies in none.
+// Invariants: a view has at most one superview, which owns it, and never lies within itself; a
+// content view has no superview.
 #pragma once
 
 #include <cstdint>
@@ -37,42 +37,42 @@ class ViewNode : public std::enable_shared_from_this<ViewNode> {
   ViewNode(const ViewNode&) = delete;
   ViewNode& operator=(const ViewNode&) = delete;
 
-  /// The node of `view`; null when it is absent or another toolkit's.
+  /// Returns the node of `view`; null if it is absent or belongs to another toolkit.
   static std::shared_ptr<ViewNode> of(const Ref<View>& view);
-  /// The view that this is the node of.
+  /// Returns the view of this node.
   Ref<View> view();
 
   bool isHidden() const { return hidden_; }
   const std::string& toolTip() const { return toolTip_; }
   bool wantsLayer() const { return wantsLayer_; }
-  /// What its layer shows; absent without a layer.
+  /// Returns the image that the layer shows; absent without a layer.
   const Ref<Image>& layerContents() const { return layerContents_; }
   void setFrame(const Rect& frame) { change(frame_, frame); }
 
   std::shared_ptr<ViewNode> superview() const { return superview_.lock(); }
-  /// The window in which it lies, however deep, or null.
+  /// Returns the window that contains the view at any depth, or null.
   std::shared_ptr<MemoryWindow> window() const;
   void becomeContentViewOf(const std::shared_ptr<MemoryWindow>& window) { window_ = window; }
-  /// Takes it out of its superview, if it is in one; that may be its end.
+  /// Removes the view from its superview, if it has one; this may destroy the view.
   void removeFromSuperview();
-  /// Whether a click on it arrives: neither it nor anything around it is hidden, and its window
-  /// takes input.
+  /// Whether a click reaches the view: neither it nor a view around it is hidden, and its window
+  /// accepts input.
   bool takesInput() const;
 
  protected:
   virtual View& role() = 0;
 
-  /// Puts `view` in front of the subviews, taking it from where it was. Raises an invalid-argument
-  /// exception, changing nothing, when it is absent, another toolkit's, a window's content view, or
-  /// this view or one around it.
+  /// Adds `view` in front of the subviews and removes it from its previous superview. Raises an
+  /// invalid-argument exception and changes nothing if `view` is absent, belongs to another
+  /// toolkit, is a window's content view, or is this view or one around it.
   void insert(const Ref<View>& view);
-  /// Sets one of the fields that show.
+  /// Sets a visible field.
   template <class Field, class Value>
   void change(Field& field, const Value& value) {
     field = value;
     changed();
   }
-  /// Something that shows has changed.
+  /// Records that a visible property has changed.
   void changed();
   bool isRedrawPending() const;
 
@@ -88,10 +88,10 @@ class ViewNode : public std::enable_shared_from_this<ViewNode> {
  private:
   bool isWithin(const ViewNode& view) const;
 
-  std::weak_ptr<ViewNode> superview_;   // its own superview's, or maker's
-  std::weak_ptr<MemoryWindow> window_;  // of a content view only; its owner
-  std::weak_ptr<const Screen> screen_;  // the application's
-  std::uint64_t changedAt_ = 0;         // how many drawings there had been
+  std::weak_ptr<ViewNode> superview_;   // owns this view, unless its maker does
+  std::weak_ptr<MemoryWindow> window_;  // of a content view only; owns it
+  std::weak_ptr<const Screen> screen_;  // owned by the application
+  std::uint64_t changedAt_ = 0;         // the number of redraws at the last change
 };
 
 }  // namespace toolkit::memory

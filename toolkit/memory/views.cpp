@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Sending actions, and buttons.
+// Actions and buttons.
 
 #include "toolkit/memory/views.hpp"
 
@@ -9,8 +9,8 @@ namespace toolkit::memory {
 
 bool ControlNode::send(std::string_view action, const std::shared_ptr<Responder>& target) {
   if (action.empty()) return false;
-  // Whoever performs the action may take the sender away, and all of its window, and change its
-  // action and target: what is needed until the end is held here.
+  // The responder may destroy the sender and its window, or change its action and target. Therefore
+  // everything needed until the end is held here.
   const std::string selector(action);
   const Ref<View> sender = view();
   // NOLINTNEXTLINE(performance-unnecessary-copy-initialization)

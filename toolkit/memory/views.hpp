@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-// The memory toolkit's views and controls: the roles of toolkit/view.hpp over nodes that remember
-// everything.
+// The memory toolkit's views and controls: the roles of toolkit/view.hpp on top of nodes that
+// record everything.
 //
-// A role is joined to a node by inheriting from both: `MemoryView` answers what every view
-// understands, `MemoryControl` what every control does, and a kind adds only what is its own.
+// Classes inherit from both a role and a node: `MemoryView` implements the messages that every view
+// understands, `MemoryControl` those of every control, and each kind adds only its own.
 #pragma once
 
 #include <memory>
@@ -16,24 +16,24 @@
 
 namespace toolkit::memory {
 
-/// What all controls have in common, whatever their role.
+/// The base of all controls, independent of their role.
 class ControlNode : public ViewNode {
  public:
   using ViewNode::ViewNode;
 
   bool isEnabled() const { return enabled_; }
-  /// Null when there is none or it is gone.
+  /// Returns the target; null if there is none or it was destroyed.
   std::shared_ptr<Responder> target() const { return target_.lock(); }
-  /// Empty when there is none.
+  /// Returns the action; empty if there is none.
   const std::string& action() const { return action_; }
   const AttributedString& attributedStringValue() const { return text_; }
 
  protected:
-  /// As `Control::sendAction`; nobody performs an empty action.
+  /// Like `Control::sendAction`; an empty action is not sent.
   bool send(std::string_view action, const std::shared_ptr<Responder>& target);
 
   bool enabled_ = true;
-  std::weak_ptr<Responder> target_;  // its own maker's
+  std::weak_ptr<Responder> target_;  // kept alive by its owner
   std::string action_;
   AttributedString text_;
 };
@@ -85,13 +85,13 @@ class MemoryControl : public MemoryView<Role, ControlNode> {
   }
 };
 
-/// What a click does to a button's state: nothing (`push`, and `popUp`, which is a class of its
-/// own), on and off in turns, or mixed, on and off in turns.
+/// The effect of a click on a button's state: none (`push`, and `popUp`, which has its own class),
+/// alternating on and off (`toggle`), or cycling through mixed, on and off (`mixed`).
 enum class ButtonBehavior { push, toggle, mixed, popUp };
 
 class MemoryButton final : public MemoryControl<Button> {
  public:
-  /// A button titled as AppKit titles new ones: "Button"; a pop-up button has no title.
+  /// Makes a button with the title "Button", as in AppKit; a pop-up button has no title.
   MemoryButton(ButtonBehavior behavior, const Rect& frame, const std::shared_ptr<Screen>& screen);
 
   void setTitle(std::string_view title) override {
@@ -110,10 +110,10 @@ class MemoryButton final : public MemoryControl<Button> {
   const std::optional<Color>& backgroundColor() const { return background_; }
   BezelStyle bezelStyle() const { return bezel_; }
 
-  /// Whether a click of the user's does anything: it arrives, and the button is enabled.
+  /// Whether the button reacts to the user's clicks: they reach it and it is enabled.
   bool takesClicks() const { return isEnabled() && takesInput(); }
-  /// A click of the user's. Nothing happens when the button is disabled or the click does not
-  /// arrive; otherwise the pressed-in look ends and the state changes before the action is sent.
+  /// Handles a click of the user. Does nothing if the button is disabled or the click does not
+  /// reach it. Otherwise ends the pressed-in look and changes the state, then sends the action.
   void click();
 
  private:
@@ -137,7 +137,7 @@ class MemoryTextField final : public MemoryControl<TextField> {
   std::shared_ptr<Responder> delegate() const { return delegate_.lock(); }
 
  private:
-  std::weak_ptr<Responder> delegate_;  // its own maker's
+  std::weak_ptr<Responder> delegate_;  // kept alive by its owner
 };
 
 class MemoryImageView final : public MemoryControl<ImageView> {

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Windows and sheets. A window's screen may be gone, when a host keeps windows longer than their
-// toolkit: then nothing shows, and the rest goes on.
+// Windows and sheets. The screen may be destroyed before a window that the host still keeps. The
+// window is then never visible; everything else still works.
 
 #include "toolkit/memory/window.hpp"
 
@@ -39,7 +39,7 @@ void MemoryWindow::makeKeyAndOrderFront() {
 
 void MemoryWindow::orderOut() {
   const auto screen = screen_.lock();
-  // What kept the window on the screen may be all that keeps it.
+  // The screen's reference may be the last one to this window.
   const auto kept = screen ? screen->orderOut(*this) : nullptr;
   sheetParent_.reset();
 }
@@ -68,7 +68,8 @@ void MemoryWindow::beginAsSheet(const std::shared_ptr<MemoryWindow>& parent,
                                 const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo) {
   session_ = Session{delegate, contextInfo};
   sheetParent_ = parent;
-  // A window that is attached to itself, in however many steps, could never be used again.
+  // A window that is attached to itself, directly or through others, could never accept input
+  // again.
   for (auto above = parent; above; above = above->sheetParent())
     if (above.get() == this) sheetParent_.reset();
   makeKeyAndOrderFront();

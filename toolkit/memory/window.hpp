@@ -13,19 +13,21 @@
 
 namespace toolkit::memory {
 
-/// The background of a window that was given none (`windowBackgroundColor` in AppKit's light look).
+/// The default background of a window (`windowBackgroundColor` in AppKit's light appearance).
 inline constexpr Color windowBackground{236 / 255.0, 236 / 255.0, 236 / 255.0};
 
-/// Who keeps a window alive: its makers always can; the application does while it is on the screen.
+/// Who keeps a window alive: only its maker, or also the application while it is on the screen.
 enum class KeptBy { maker, application };
 
 class MemoryWindow final : public Window, public std::enable_shared_from_this<MemoryWindow> {
  public:
-  /// A window, not yet shown, with an empty content view. Without its screen it cannot be shown.
+  /// Makes a hidden window with an empty content view. It cannot be shown once `screen` is
+  /// destroyed.
   static std::shared_ptr<MemoryWindow> make(const std::shared_ptr<Screen>& screen,
                                             const Rect& content, StyleMask style, KeptBy keptBy);
   ~MemoryWindow() override;
-  /// `window` as a window of this toolkit; null when it is absent or another toolkit's.
+  /// Returns `window` as a window of this toolkit; null if it is absent or belongs to another
+  /// toolkit.
   static std::shared_ptr<MemoryWindow> of(const Ref<Window>& window);
 
   Ref<View> contentView() const override { return contentView_; }
@@ -43,22 +45,23 @@ class MemoryWindow final : public Window, public std::enable_shared_from_this<Me
   bool isKeptOnScreen() const { return keptBy_ == KeptBy::application; }
   bool isVisible() const;
   bool isKey() const;
-  /// How often it was closed.
+  /// Returns how often the window was closed.
   int closes() const { return closes_; }
-  /// Whether clicks reach its views: it is on the screen and no sheet is attached to it.
+  /// Whether clicks reach the window's views: it is on the screen and no visible sheet is attached
+  /// to it.
   bool takesInput() const;
 
-  /// Shows it attached to `parent`, which may be null. A window is never its own sheet's sheet:
-  /// then it is shown on its own. Begun again before it was ended, only the latest delegate is
-  /// told.
+  /// Shows the window attached to `parent`, which may be null. If `parent` is this window or
+  /// attached to it, the window is shown on its own. If the sheet is begun again before its end,
+  /// only the latest delegate is told of the end.
   void beginAsSheet(const std::shared_ptr<MemoryWindow>& parent,
                     const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo);
-  /// Tells the delegate if its showing as a sheet was not ended before, also when it is off the
-  /// screen by now. It stays where it is.
+  /// Tells the delegate unless the sheet was already ended, even if the window is no longer on the
+  /// screen. Does not order the window out.
   void endAsSheet(long returnCode);
-  /// The window that it is attached to as a sheet, or null.
+  /// Returns the window to which this one is attached as a sheet, or null.
   std::shared_ptr<MemoryWindow> sheetParent() const { return sheetParent_.lock(); }
-  /// The return codes of all ends asked for, in order.
+  /// Returns the return codes of all requests to end the sheet, in order.
   const std::vector<long>& sheetEnds() const { return sheetEnds_; }
 
  private:
@@ -66,19 +69,19 @@ class MemoryWindow final : public Window, public std::enable_shared_from_this<Me
                KeptBy keptBy);
 
   struct Session {
-    std::weak_ptr<SheetDelegate> delegate;  // its own maker's
+    std::weak_ptr<SheetDelegate> delegate;  // kept alive by its owner
     void* contextInfo;
   };
 
-  std::weak_ptr<Screen> screen_;  // the application's
+  std::weak_ptr<Screen> screen_;  // owned by the application
   Rect content_;
   StyleMask style_;
   KeptBy keptBy_;
   std::shared_ptr<View> contentView_;
-  std::weak_ptr<Responder> delegate_;  // its own maker's
+  std::weak_ptr<Responder> delegate_;  // kept alive by its owner
   Color background_ = windowBackground;
   int closes_ = 0;
-  std::weak_ptr<MemoryWindow> sheetParent_;  // its own keeper's
+  std::weak_ptr<MemoryWindow> sheetParent_;  // kept alive by its owner
   std::optional<Session> session_;           // from the beginning of a sheet to its end
   std::vector<long> sheetEnds_;
 };

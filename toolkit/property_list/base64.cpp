@@ -30,7 +30,7 @@ std::size_t decodeBase64(std::string_view text, std::string& bytes) {
   static constexpr std::array<std::int8_t, 128> values = makeValues();
   std::uint32_t group = 0;
   std::size_t count = 0;
-  std::size_t padding = 0;  // how many `=` stand last, spaces aside
+  std::size_t padding = 0;  // number of `=` at the end, ignoring spaces
   for (std::size_t at = 0; at < text.size(); ++at) {
     const char c = text[at];
     const auto byte = static_cast<unsigned char>(c);

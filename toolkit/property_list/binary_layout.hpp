@@ -2,10 +2,10 @@
 // The layout of binary property lists: trailer, object markers, numbers. All numbers are
 // big-endian.
 //
-//   "bplist0?"  objects …  offset table (one offset an object)  trailer (32 bytes)
+//   "bplist0?"  objects …  offset table (one offset per object)  trailer (32 bytes)
 //
-// An object is a marker byte, whose high half says what it is and whose low half how long, and its
-// content; a length that does not fit stands as an integer object behind the marker.
+// An object consists of a marker byte and its content. The high half of the marker gives the kind,
+// the low half the length; a length that does not fit follows the marker as an integer object.
 #pragma once
 
 #include <algorithm>
@@ -37,11 +37,11 @@ enum class Marker : std::uint8_t {
   dictionary = 0xD0
 };
 
-/// In the low half of a marker: the length stands behind.
+/// In the low half of a marker: the length follows the marker.
 constexpr unsigned longLength = 15;
 
 struct Trailer {
-  static constexpr std::size_t size = 32;  // the first six bytes mean nothing
+  static constexpr std::size_t size = 32;  // the first six bytes have no meaning
   std::uint8_t offsetSize;
   std::uint8_t referenceSize;
   std::uint64_t objectCount;
@@ -49,17 +49,17 @@ struct Trailer {
   std::uint64_t tableOffset;
 };
 
-/// Numbers of one size, side by side.
+/// An array of numbers of one size.
 class Numbers {
  public:
-  /// Each takes so many bytes, one at least.
+  /// `size` is in bytes per number, at least 1.
   explicit Numbers(std::size_t size)
       : size_(size),
         mask_(~std::uint64_t{0} >> (8 * (words::size - std::min(size, words::size)))) {}
 
   std::size_t size() const { return size_; }
-  /// The low 64 bits of one of those at `first`. They must stand behind a file's header, for what
-  /// is read is the eight bytes up to the number's end.
+  /// Returns the low 64 bits of the number at `index` in the array at `first`. The array must
+  /// follow a file's header, because the function reads the eight bytes up to the number's end.
   std::uint64_t at(const char* first, std::size_t index) const {
     return words::bigEndian(words::load(first + (index + 1) * size_ - words::size)) & mask_;
   }
@@ -69,7 +69,7 @@ class Numbers {
   std::uint64_t mask_;
 };
 
-/// The number that takes all of `bytes`, by the same rules.
+/// Returns the number that fills all of `bytes`, by the same rules.
 inline std::uint64_t number(std::string_view bytes) {
   return Numbers(bytes.size()).at(bytes.data(), 0);
 }

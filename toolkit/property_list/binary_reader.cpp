@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Binary property lists.
+// Reads binary property lists.
 #include <bit>
 #include <string>
 
@@ -20,8 +20,8 @@ using binary::Trailer;
 
 constexpr std::size_t largestSize = 16;  // of an offset or a reference
 
-// Objects may overlap, and a small file can so hold objects that are huge all together. What a file
-// honestly needs is its own size; this many times as much is read, and a little more for tiny
+// Objects may overlap, so the objects of a small file can be huge in total. A regular file needs no
+// more than its own size. The reader accepts this multiple of it, plus a fixed amount for tiny
 // files.
 constexpr std::size_t mostOverlap = 2;
 constexpr std::size_t overlapForFree = std::size_t{64} * 1024;
@@ -38,7 +38,7 @@ Trailer readTrailer(std::string_view bytes) {
           binary::number(trailer.substr(24, 8))};
 }
 
-/// Whether a number of `size` bytes can count up to `greatest` and one beyond.
+/// Whether `greatest` fits in `size` bytes.
 bool reaches(std::size_t size, std::uint64_t greatest) {
   return size >= sizeof greatest || greatest < std::uint64_t{1} << (8 * size);
 }
@@ -109,19 +109,19 @@ class BinaryReader {
   Value* reference(const char* references, std::size_t index, std::size_t depth);
 
   Trailer trailer_;
-  binary::Numbers table_;  // of the objects' offsets, right behind the objects
+  binary::Numbers table_;  // of the objects' offsets; directly follows the objects
   binary::Numbers references_;
-  std::string_view objects_;  // and the header in front of them
+  std::string_view objects_;  // with the header in front of them
   Document& document_;
   ValueOffsets* offsets_;
-  std::size_t budget_;                          // how many bytes of content may still be read
-  std::vector<Value*> values_;                  // by index, as far as they are read
-  Value* const beingRead_ = &Value::nothing();  // in place of one that is read but not to its end
+  std::size_t budget_;                          // bytes of content that may still be read
+  std::vector<Value*> values_;                  // by index; null until read
+  Value* const beingRead_ = &Value::nothing();  // placeholder for an object that is being read
   PendingValues pending_;
-  std::string buffer_;  // of strings that do not stand in the file as they are
+  std::string buffer_;  // for strings that need decoding
 };
 
-/// Every entry must lead to before the table, whether it is used or not.
+/// Every offset must lie before the table, even if it is not used.
 void BinaryReader::checkTable() const {
   for (std::uint64_t index = 0; index < trailer_.objectCount; ++index) {
     if (offsetOf(index) >= objects_.size()) {
@@ -184,18 +184,18 @@ Value* BinaryReader::content(std::size_t offset, std::size_t depth) {
   }
 }
 
-/// `count` units of content from `at` on, which must lie before the offset table.
+/// Returns `count` units of content from `at` on, which must lie before the offset table.
 std::string_view BinaryReader::take(std::size_t at, std::uint64_t count, std::size_t unitSize) {
   const std::size_t space = objects_.size() - at;
   const std::size_t size = count * unitSize;
-  // Of a count that is small enough the size does not overflow.
+  // If count ≤ space, count × unitSize cannot overflow.
   if (count > space || size > space) refuse(at, "the object reaches beyond the objects' space");
   if (size > budget_) refuse(at, "the objects overlap too often");
   budget_ -= size;
   return objects_.substr(at, size);
 }
 
-/// The content of an object whose marker counts it in units.
+/// Returns the content of an object whose marker gives its length in units.
 std::string_view BinaryReader::contentOf(std::size_t offset, std::size_t unitSize) {
   if (low(offset) != binary::longLength) return take(offset + 1, low(offset), unitSize);
   const std::size_t length = offset + 1;
@@ -223,7 +223,7 @@ Value* BinaryReader::integer(std::size_t offset) {
   const std::size_t size = std::size_t{1} << low(offset);
   if (size > 16) refuse(offset, "an integer of more than 16 bytes");
   const std::uint64_t bits = binary::number(take(offset + 1, size, 1));
-  // Eight bytes have a sign; sixteen are how integers are written that need the highest bit.
+  // Eight bytes are signed; integers that need the highest bit are written in sixteen bytes.
   const bool isUnsigned = size == 16 && bits > std::uint64_t{INT64_MAX};
   return Number::make(
       document_, isUnsigned ? Number::Type::unsignedInteger : Number::Type::signedInteger, bits);
@@ -248,7 +248,7 @@ Value* BinaryReader::uid(std::size_t offset) {
   return Uid::make(document_, static_cast<std::uint32_t>(number));
 }
 
-/// Bytes from 0x80 are not ASCII; they count as Latin-1.
+/// Bytes from 0x80 are not ASCII; they are read as Latin-1.
 Value* BinaryReader::ascii(std::size_t offset) {
   const std::string_view bytes = contentOf(offset, 1);
   if (isAscii(bytes)) return String::make(document_, bytes);
@@ -303,7 +303,7 @@ Value* BinaryReader::set(std::size_t offset, std::size_t depth) {
 }
 
 Value* BinaryReader::dictionary(std::size_t offset, std::size_t depth) {
-  // All keys stand first, then all values.
+  // All keys come first, then all values.
   const std::string_view references = contentOf(offset, 2 * references_.size());
   const std::size_t count = references.size() / references_.size() / 2;
   const auto entries = pending_.open();

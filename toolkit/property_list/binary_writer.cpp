@@ -23,15 +23,15 @@ using binary::Marker;
   throw InvalidArgumentException("binary property lists cannot carry " + what);
 }
 
-/// How many bytes a number takes: 1, 2, 4 or 8.
+/// Returns the number of bytes that a number needs: 1, 2, 4 or 8.
 std::size_t sizeOf(std::uint64_t number) {
   if (number <= UINT8_MAX) return 1;
   if (number <= UINT16_MAX) return 2;
   return number <= UINT32_MAX ? 4 : 8;
 }
 
-/// Numbers the objects of the file in the order in which they are written: the root first, and what
-/// a collection holds behind it.
+/// Numbers the objects of the file in the order of writing: the root first, and the content of a
+/// collection after the collection.
 class Objects {
  public:
   explicit Objects(const Value& root) { add(root); }
@@ -43,7 +43,7 @@ class Objects {
   void add(const Value& value);
   void addChildren(const Value& collection);
 
-  std::vector<const Value*> open_;  // the collections around what is being added
+  std::vector<const Value*> open_;  // the collections around the object that is being added
   std::vector<const Value*> all_;
   std::unordered_map<const Value*, std::size_t> indexes_;
   std::unordered_map<std::string_view, std::size_t> strings_;
@@ -116,7 +116,7 @@ void BinaryWriter::markLong(Marker marker, std::size_t length) {
 }
 
 void BinaryWriter::integer(std::uint64_t bits, bool isNegative) {
-  // Shorter integers than eight bytes have no sign; eight bytes have one.
+  // Integers of fewer than eight bytes are unsigned; those of eight bytes are signed.
   std::size_t size = isNegative ? 8 : sizeOf(bits);
   if (!isNegative && bits > std::uint64_t{INT64_MAX}) size = 16;
   mark(Marker::integer, static_cast<std::size_t>(std::countr_zero(size)));

@@ -8,11 +8,12 @@
 
 namespace toolkit {
 
-/// The value as a whole binary file, version 00, that reads back as an equal value. Values that are
-/// the same object are written once, and so are equal strings.
+/// Returns the value as a complete binary file, version 00, that reads back as an equal value. The
+/// same object is written only once, and so are equal strings.
 ///
-/// Raises an invalid-argument exception for what no binary property list can carry: an absent
-/// value, a collection as a key or within itself, and more than 512 levels in one another.
+/// Raises an invalid-argument exception for a value that no binary property list can hold: an
+/// absent value, a collection as a key, a collection within itself, and more than 512 nested
+/// levels.
 std::string writeBinaryPropertyList(const ValueRef<>& value);
 
 }  // namespace toolkit

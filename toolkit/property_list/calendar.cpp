@@ -16,23 +16,23 @@ namespace {
 constexpr double secondsPerDay = 86400;
 constexpr std::int64_t daysPerEra = 146097;    // 400 years
 constexpr std::int64_t referenceDay = 730791;  // 2001-01-01, counted from 0000-03-01
-// Later years than this are taken for it: there a double tells no days apart any more.
+// Later years count as this one: a double of seconds cannot distinguish days that far away.
 constexpr std::int64_t latestYear = 1'000'000'000'000;
-constexpr double exactSeconds = 9007199254740992.0;  // 2^53: up to here a double counts by ones
+constexpr double exactSeconds = 9007199254740992.0;  // 2^53: a double holds all integers to here
 
 bool isLeap(std::int64_t year) { return year % 4 == 0 && (year % 100 != 0 || year % 400 == 0); }
 
 std::int64_t floorDivide(std::int64_t a, std::int64_t b) { return (a >= 0 ? a : a - (b - 1)) / b; }
 
-/// From 2001-01-01 to the first day of `year`.
+/// Returns the number of days from 2001-01-01 to the first day of `year`.
 std::int64_t daysBeforeYear(std::int64_t year) {
   const std::int64_t past = year - 1;
   return 365 * (year - 2001) + floorDivide(past, 4) - floorDivide(past, 100) +
          floorDivide(past, 400) - 485;
 }
 
-/// The platform reads this from a table of sixteen months, the first and the last two of which are
-/// empty; a month beyond the table counts as 65535 days.
+/// The platform uses a table of sixteen months, the first and the last two of which are empty; a
+/// month beyond the table counts as 65535 days.
 std::int64_t daysBeforeMonth(int month, bool leap) {
   constexpr std::array<int, 16> days = {0,   0,   31,  59,  90,  120, 151, 181,
                                         212, 243, 273, 304, 334, 365, 0,   0};

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Dates as the texts of property lists write them.
+// Dates as text, in the form that property lists use.
 #pragma once
 
 #include <optional>
@@ -8,15 +8,15 @@
 
 namespace toolkit {
 
-/// A moment in ISO 8601, such as "2001-01-01T00:00:00Z", with a fraction where it has one; of a
-/// moment that is infinite, no number or beyond the years that a double counts exactly, its number
-/// of seconds.
+/// Returns a date in ISO 8601, such as "2001-01-01T00:00:00Z", with a fraction of a second if it
+/// has one. For infinity, NaN and dates so far away that a double does not hold every second,
+/// returns the number of seconds.
 std::string iso8601(double secondsSinceReferenceDate);
 
-/// The moment that an XML property list writes as `[-]Y…-MM-DDThh:mm:ssZ`, in seconds since
-/// 2001-01-01 00:00:00 UTC; nothing for any other text. A year without digits is 0. Each field
-/// counts on from the ones before it: the 30th of February is the 2nd of March, the 13th month the
-/// next year's first.
+/// Converts a date of an XML property list, `[-]Y…-MM-DDThh:mm:ssZ`, to seconds since 2001-01-01
+/// 00:00:00 UTC; absent for any other text. A year without digits is 0. Fields may overflow into
+/// the next larger one: 30 February is 2 March (1 March in a leap year), and month 13 is the next
+/// January.
 std::optional<double> secondsOfDate(std::string_view text);
 
 }  // namespace toolkit

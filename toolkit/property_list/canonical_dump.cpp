@@ -24,7 +24,7 @@ std::string formatted(const char* format, Arguments... arguments) {
 }
 
 std::string dumpReal(double real) {
-  // Not left to printf: it shows the sign of what is no number.
+  // printf would show the sign of a NaN.
   return std::isnan(real) ? "nan" : formatted("%.17g", real);
 }
 
@@ -90,7 +90,7 @@ std::string joined(const std::vector<std::string>& parts) {
   return text + "]";
 }
 
-/// Two parts after one another, as an entry: sorting entries sorts them by their keys.
+/// Joins each key and its value to an entry; the entries are sorted by key.
 std::vector<std::string> paired(const std::vector<std::string>& keysAndValues) {
   std::vector<std::pair<std::string, std::string>> entries;
   for (std::size_t i = 0; i < keysAndValues.size(); i += 2) {
@@ -115,7 +115,7 @@ std::string dumpCollection(const Value& collection, std::vector<std::string> par
   }
 }
 
-/// Puts a collection's dump together once all that it holds is dumped.
+/// Composes the dump of a collection after its content has been dumped.
 class Dumper {
  public:
   void scalar(const Value& value) { parts_.back().push_back(dumpScalar(value)); }
@@ -129,7 +129,7 @@ class Dumper {
   std::string result() { return std::move(parts_.front().front()); }
 
  private:
-  std::vector<std::vector<std::string>> parts_{1};  // of the open collections, after the root's
+  std::vector<std::vector<std::string>> parts_{1};  // the root, then the open collections
 };
 
 }  // namespace

@@ -13,8 +13,8 @@ bool isText(const Value& key, std::string_view text) {
   return key.kind() == Value::Kind::string && static_cast<const String&>(key).text() == text;
 }
 
-/// A reference from one value of a document to another: it takes no count, since none is given
-/// back.
+/// Returns a reference from one value of a document to another. Does not count, because the
+/// reference is never released.
 ValueRef<> uncounted(Value* value) { return Counted<Value>::adopt(value); }
 
 std::span<const ValueRef<>> uncounted(std::span<Value* const> values, Document& document) {
@@ -42,7 +42,8 @@ void Collection::requirePresent(const ValueRef<>& value, std::string_view select
 }
 
 void Collection::destroy() noexcept {
-  // A collection whose last reference goes while another is being destroyed waits for its turn.
+  // A collection that loses its last reference while another is being destroyed waits its turn, so
+  // that nesting uses no stack.
   thread_local bool destroying = false;
   thread_local Collection* waiting = nullptr;
   nextToDestroy_ = waiting;
@@ -140,7 +141,8 @@ Dictionary::Dictionary(std::span<Value* const> keysAndValues,
                        std::span<const std::uint64_t> laterHashes, Duplicates duplicates,
                        Document* document)
     : Collection(Kind::dictionary, Mutability::immutable), entries_(document) {
-  // All memory is asked for before the first reference is there, which no destructor may see.
+  // All memory is allocated before the first reference exists, because no destructor may run on an
+  // uncounted reference.
   const std::size_t count = keysAndValues.size() / 2;
   entries_.reserve(count);
   if (count > mostWithoutIndex) {
@@ -156,7 +158,7 @@ Dictionary::Dictionary(std::span<Value* const> keysAndValues,
     if (at == KeyIndex::none) {
       append({uncounted(key), uncounted(value)}, hash);
     } else if (duplicates == Duplicates::lastWins) {
-      // Not assigned: that would give back a count that the earlier value never took.
+      // Not assigned: an assignment would release the earlier value, which was never counted.
       std::construct_at(&entries_[at].value, uncounted(value));
     }
   }
@@ -185,7 +187,7 @@ ValueRef<Dictionary> Dictionary::copy(Mutability mutability) const {
 
 std::size_t Dictionary::count() const { return entries_.size(); }
 
-/// `hash` counts only where there is an index.
+/// `hash` is used only if there is an index.
 template <class IsKey>
 std::size_t Dictionary::positionWhere(std::uint64_t hash, IsKey isKey) const {
   const auto isKeyAt = [&](std::size_t at) { return isKey(*entries_[at].key); };

@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: MIT
-// The values that hold other values: arrays, sets, dictionaries.
+// Values that hold other values: arrays, sets, dictionaries.
 //
-// Ending a collection takes no more stack however deeply collections nest in it.
+// The destruction of a collection uses a fixed amount of stack, however deeply collections nest in
+// it.
 #pragma once
 
 #include <cstddef>
@@ -18,15 +19,15 @@
 
 namespace toolkit {
 
-/// What arrays, sets and dictionaries have in common.
+/// The base of arrays, sets and dictionaries.
 class Collection : public Value {
  protected:
   Collection(Kind kind, Mutability mutability) : Value(kind), mutability_(mutability) {}
-  /// Raises where the collection is immutable; says whether a change is to be made at all.
+  /// Raises if the collection is immutable. False if changes are ignored.
   bool canChange(std::string_view selector) const {
     return mutability_ == Mutability::changeable || refuseChange(selector);
   }
-  /// Raises when `value` is absent.
+  /// Raises if `value` is absent.
   void requirePresent(const ValueRef<>& value, std::string_view selector) const;
 
  private:
@@ -44,27 +45,27 @@ class Array final : public Collection {
   static ValueRef<Array> make(std::vector<ValueRef<>> elements = {},
                               Mutability mutability = Mutability::changeable);
 
-  /// The elements in order. Valid until the array changes.
+  /// Returns the elements in order; valid until the array changes.
   std::span<const ValueRef<>> elements() const { return elements_; }
   std::size_t count() const override { return elements_.size(); }
   const ValueRef<>& objectAtIndex(std::size_t index) const override {
     return index < elements_.size() ? elements_[index] : objectBeyondEnd(index);
   }
 
-  /// Changes raise where `Mutability` says so; adding an absent value raises.
+  /// Changes raise if the array is immutable; adding an absent value raises.
   void addObject(const ValueRef<>& value);
   void removeAllObjects();
-  /// Has the elements given instead of its own (`setArray:`).
+  /// Replaces the elements (`setArray:`).
   void setElements(std::span<const ValueRef<>> elements);
-  /// The same without a count of them, nor a copy: the caller sees to it that they stay where they
-  /// are until the array has others, or ends. It takes hardly longer than a call would.
+  /// The same without counting or copying: the caller keeps the elements in place until the array
+  /// gets others or is destroyed. Costs hardly more than a function call.
   void borrowElements(std::span<const ValueRef<>> elements) {
     if (!canChange("setArray:")) return;
     own_->clear();
     elements_ = elements;
   }
 
-  /// As an immutable part of `document`, like its elements; the caller gets no count.
+  /// Makes an immutable array in `document`, as its elements must be; the caller gets no count.
   static Array* make(Document& document, std::span<Value* const> elements);
 
  private:
@@ -74,18 +75,18 @@ class Array final : public Collection {
   Array(std::span<Value* const> elements, Document* document);
   const ValueRef<>& objectBeyondEnd(std::size_t index) const;
 
-  std::span<const ValueRef<>> elements_;  // `own_`, or a document's, or borrowed
+  std::span<const ValueRef<>> elements_;  // those of `own_`, in a document, or borrowed
   std::unique_ptr<std::vector<ValueRef<>>> own_;
 };
 
-/// Values without an order, from binary property lists; they keep the order of the file.
+/// An unordered set of values, from a binary property list; it keeps the order of the file.
 class Set final : public Collection {
  public:
   static Set& nothing();
   static ValueRef<Set> make(std::vector<ValueRef<>> elements);
-  /// As a part of `document`, like its elements; the caller gets no count.
+  /// Makes a set in `document`, as its elements must be; the caller gets no count.
   static Set* make(Document& document, std::span<Value* const> elements);
-  /// The elements in the order of the file. Valid as long as the set is.
+  /// Returns the elements in the order of the file; valid as long as the set.
   std::span<const ValueRef<>> elements() const { return elements_; }
   std::size_t count() const override;
 
@@ -95,12 +96,13 @@ class Set final : public Collection {
   explicit Set(std::vector<ValueRef<>>&& elements);
   Set(std::span<Value* const> elements, Document* document);
 
-  std::span<const ValueRef<>> elements_;  // `own_`, or a document's
+  std::span<const ValueRef<>> elements_;  // those of `own_`, or in a document
   std::vector<ValueRef<>> own_;
 };
 
-/// Values under keys. The keys that scripts and tables use are strings; a binary property list may
-/// hold others, which no look-up by string finds. Keys keep the order in which they first came.
+/// Values under keys. Scripts and tables use string keys; a binary property list may hold other
+/// keys, which no look-up by string finds. Entries keep the order in which their keys were first
+/// added.
 class Dictionary final : public Collection {
  public:
   struct Entry {
@@ -108,32 +110,34 @@ class Dictionary final : public Collection {
     ValueRef<> value;
   };
 
-  /// Which value a key has that comes more than once.
+  /// Which value counts if a key occurs more than once.
   enum class Duplicates : std::uint8_t { firstWins, lastWins };
 
   static Dictionary& nothing();
-  /// Of a key that comes more than once the last value counts.
+  /// If a key occurs more than once, the last value counts.
   static ValueRef<Dictionary> make(std::vector<Entry> entries = {},
                                    Mutability mutability = Mutability::changeable);
-  /// Up to here looking at every key is faster than hashing the one that is looked up.
+  /// Up to this count, comparing every key is faster than hashing the wanted one.
   static constexpr std::size_t mostWithoutIndex = 8;
-  /// As an immutable part of `document`, like its keys and values, which alternate in
-  /// `keysAndValues`; the caller gets no count. `laterHashes` are those of the keys after the first
-  /// `mostWithoutIndex` of them, taken while each was at hand: later a large file's keys are cold.
+  /// Makes an immutable dictionary in `document`, as its keys and values must be; these alternate
+  /// in `keysAndValues`. The caller gets no count. `laterHashes` are the hashes of the keys after
+  /// the first `mostWithoutIndex`, computed when each key was read: later the keys of a large file
+  /// are no longer in the cache.
   static Dictionary* make(Document& document, std::span<Value* const> keysAndValues,
                           std::span<const std::uint64_t> laterHashes, Duplicates duplicates);
 
-  /// The entries in order. Valid until the dictionary changes.
+  /// Returns the entries in order; valid until the dictionary changes.
   std::span<const Entry> entries() const { return entries_; }
   std::size_t count() const override;
-  /// The value under a string key, or absent.
+  /// Returns the value under a string key, or absent.
   ValueRef<> objectForKey(std::string_view key) const;
-  /// The string keys in order, copied: a walk over them survives changes.
+  /// Returns a copy of the string keys in order, so that the dictionary may change during a loop
+  /// over them.
   std::vector<std::string> allKeys() const;
-  /// A new dictionary with the same keys and values (the values are shared).
+  /// Returns a new dictionary with the same keys and values (the values are shared).
   ValueRef<Dictionary> copy(Mutability mutability) const;
 
-  /// Changes raise where `Mutability` says so; an absent value raises. An entry that is there keeps
+  /// Changes raise if the dictionary is immutable; an absent value raises. An existing entry keeps
   /// its place when its value is replaced.
   void setObject(const ValueRef<>& value, std::string_view key);
   void removeObjectForKey(std::string_view key);
@@ -156,12 +160,12 @@ class Dictionary final : public Collection {
   void growIndex();
 
   std::pmr::vector<Entry> entries_{std::pmr::new_delete_resource()};
-  // Only where there are many entries. In a document it lies in the document's memory: it is safe
-  // in this pointer because no destructor runs there.
+  // Null if there are few entries. In a document, the index lies in the document's memory; the
+  // pointer never deletes it, because no destructor runs there.
   std::unique_ptr<KeyIndex> index_;
 };
 
-/// `value` as the kind named, or absent when it is absent or of another kind.
+/// Return `value` as the named kind; absent if it is absent or of another kind.
 ValueRef<Array> asArray(const ValueRef<>& value);
 ValueRef<Dictionary> asDictionary(const ValueRef<>& value);
 

@@ -8,7 +8,7 @@
 
 namespace toolkit {
 
-/// The shortest decimal text that reads back as the same number.
+/// Returns the shortest decimal text that reads back as the same number.
 template <class Numeric>
 std::string decimal(Numeric number) {
   std::array<char, 32> buffer;

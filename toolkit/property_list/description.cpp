@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What `Value::description` answers.
+// Implements `Value::description`.
 #include <algorithm>
 #include <string>
 #include <string_view>

@@ -7,8 +7,9 @@
 namespace toolkit {
 namespace {
 
-// Blocks grow with the document, so that neither small files waste memory nor large ones need many
-// allocations; an eighth of what is there already bounds what can lie idle at the end.
+// Blocks grow with the document, so that small files waste no memory and large ones need few
+// allocations. A new block is an eighth of the present size, which limits the unused rest at the
+// end.
 constexpr std::size_t smallestBlock = 2048;
 constexpr std::size_t largestBlock = 1U << 20;
 
@@ -32,7 +33,8 @@ Document::Place Document::placeInNewBlock(std::size_t bytes) {
   constexpr auto distance = static_cast<std::uint32_t>(sizeof(Block) / unit);
   const std::size_t blockSize = std::clamp(total_ / 8, smallestBlock, largestBlock);
   if (current_ && bytes > blockSize / 4) {
-    // A large value gets a block of its own behind the current one, which keeps its free rest.
+    // A large value gets its own block; the current block stays in use, so that its free rest is
+    // not lost.
     Block* own = addBlock(sizeof(Block) + bytes, current_->previous);
     return {own + 1, distance};
   }

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-// The memory that all values read from one file share.
+// The memory shared by all values read from one file.
 //
-// Invariants: values in a document live and die together, and refer to no value outside of it. A
-// reference to any of them counts on the document; the references between them do not count at all,
-// and no destructor of theirs ever runs.
+// Invariants: the values in a document are freed together and refer to no value outside it. A
+// reference to any of them counts on the document. References between them are not counted, and
+// their destructors never run.
 #pragma once
 
 #include <algorithm>
@@ -16,17 +16,17 @@ namespace toolkit {
 
 class Document final : public std::pmr::memory_resource {
  public:
-  /// What values are aligned to, and what distances within a block are counted in.
+  /// The alignment of values, in bytes, and the unit of distances within a block.
   static constexpr std::size_t unit = 8;
 
-  /// Memory that starts with a pointer to its document, so that a value finds its document by its
-  /// own distance from the start.
+  /// Memory that starts with a pointer to its document, so that a value can find its document by
+  /// its distance from the start.
   struct Block {
     Document* document;
     Block* previous;
   };
 
-  /// Memory for a value, and how many units it stands from the start of its block.
+  /// Memory for a value, and its distance in units from the start of its block.
   struct Place {
     void* memory;
     std::uint32_t distance;
@@ -35,14 +35,14 @@ class Document final : public std::pmr::memory_resource {
   Document(const Document&) = delete;
   Document& operator=(const Document&) = delete;
 
-  /// An empty document with one count, which the caller holds.
+  /// Makes an empty document with one count, which the caller owns.
   static Document* make() { return new Document; }
   void retain() { count_.fetch_add(1, std::memory_order_relaxed); }
   void release() {
     if (count_.fetch_sub(1, std::memory_order_acq_rel) == 1) delete this;
   }
 
-  /// Memory for a value of so many bytes.
+  /// Returns memory for a value of `bytes` bytes.
   Place place(std::size_t bytes) {
     bytes = (bytes + unit - 1) & ~(unit - 1);
     if (bytes > static_cast<std::size_t>(end_ - next_)) return placeInNewBlock(bytes);
@@ -63,7 +63,7 @@ class Document final : public std::pmr::memory_resource {
   bool do_is_equal(const memory_resource& other) const noexcept override { return this == &other; }
 
   std::atomic<std::size_t> count_{1};
-  Block* current_ = nullptr;  // the block that is being filled, and those before it
+  Block* current_ = nullptr;  // the block that is being filled; links to the earlier ones
   std::byte* next_ = nullptr;
   std::byte* end_ = nullptr;
   std::size_t total_ = 0;  // bytes in all blocks

@@ -17,25 +17,25 @@ struct Mark {
   std::size_t size;
 };
 
-/// What the first bytes say about the encoding; it wins over any declaration.
+/// Returns the encoding shown by the first bytes; it overrides any declaration.
 std::optional<Mark> byteOrderMarkOf(std::string_view file) {
   using namespace std::string_view_literals;
   constexpr auto little = std::endian::little;
   constexpr auto big = std::endian::big;
-  // A mark with nothing behind it is none, as the platform has it.
+  // As on the platform, a mark at the very end of the file does not count.
   if (file.size() > 4 && file.starts_with("\0\0\xFE\xFF"sv)) return Mark{Scheme::utf32, big, 4};
   if (file.size() > 4 && file.starts_with("\xFF\xFE\0\0"sv)) return Mark{Scheme::utf32, little, 4};
   if (file.size() > 3 && file.starts_with("\xEF\xBB\xBF"sv)) return Mark{Scheme::utf8, big, 3};
   if (file.size() <= 2) return std::nullopt;
   if (file.starts_with("\xFF\xFE"sv)) return Mark{Scheme::utf16, little, 2};
   if (file.starts_with("\xFE\xFF"sv)) return Mark{Scheme::utf16, big, 2};
-  // UTF-16 without a mark. The platform skips here what a mark would take, odd as that is: the
-  // first character is lost.
+  // UTF-16 without a mark. Like the platform, skip two bytes as if there were a mark: the first
+  // character is lost.
   if (file[0] == '\0' || file[1] == '\0') return Mark{Scheme::utf16, std::endian::native, 2};
   return std::nullopt;
 }
 
-/// What stands in quotes behind `encoding=` in a declaration at the very start.
+/// Returns the quoted value of `encoding=` in a declaration at the very start.
 std::optional<std::string_view> declaredName(std::string_view file) {
   constexpr std::string_view declaration = "<?xml";
   constexpr std::string_view attribute = "encoding=";
@@ -51,7 +51,7 @@ std::optional<std::string_view> declaredName(std::string_view file) {
   return value.substr(1, end - 1);
 }
 
-/// One unit of UTF-16 or UTF-32.
+/// Returns one unit of UTF-16 or UTF-32.
 char32_t unitAt(std::string_view bytes, std::size_t at, std::size_t size, std::endian order) {
   char32_t unit = 0;
   for (std::size_t i = 0; i < size; ++i) {
@@ -61,8 +61,8 @@ char32_t unitAt(std::string_view bytes, std::size_t at, std::size_t size, std::e
   return unit;
 }
 
-/// Appends what UTF-16 or UTF-32 says; false at a unit that is no character. Bytes at the end that
-/// make up no unit are left out.
+/// Appends the text of UTF-16 or UTF-32; false at a unit that is not a character. Bytes at the end
+/// that do not form a unit are ignored.
 bool convertUnits(std::string_view bytes, std::size_t size, std::endian order, std::string& text) {
   text.reserve(bytes.size() / size);
   for (std::size_t at = 0; at + size <= bytes.size(); at += size) {

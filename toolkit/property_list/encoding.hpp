@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The encoding of XML and old-style property lists: found out, and turned into UTF-8.
+// Detects the encoding of XML and old-style property lists, and converts it to UTF-8.
 #pragma once
 
 #include <optional>
@@ -10,18 +10,18 @@
 
 namespace toolkit {
 
-/// A file's text as UTF-8. UTF-8 is not copied and not checked: readers check what they use.
+/// A file's text as UTF-8. UTF-8 files are not copied or checked: readers check the parts they use.
 struct DecodedText {
-  std::string converted;   ///< the text, of files in another encoding
-  std::string_view bytes;  ///< what follows the byte order mark, of files in UTF-8
+  std::string converted;   ///< the text of a file in another encoding
+  std::string_view bytes;  ///< the text of a file in UTF-8, after the byte order mark
   bool isConverted = false;
-  /// Why the file has no text; the offset is one in what was converted up to there.
+  /// Why the file has no text; the offset counts in the text converted so far.
   std::optional<RefusedAt> refusal;
 
   std::string_view text() const { return isConverted ? std::string_view(converted) : bytes; }
 };
 
-/// `file` must outlive what this returns.
+/// Decodes a whole file. `file` must outlive the result.
 DecodedText decodeText(std::string_view file);
 
 }  // namespace toolkit

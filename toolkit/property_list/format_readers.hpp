@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
-// The readers of the three formats, as the one reader in front of them sees them (see reader.hpp).
+// The readers of the three formats, for use by reader.hpp.
 //
-// Each makes its values in `document` and returns the root, or throws RefusedAt; a document whose
-// reader has thrown holds nothing of use. `offsets`, unless null, receives where each value starts.
+// Each makes its values in `document` and returns the root, or throws RefusedAt; after that the
+// document is of no use. `offsets`, unless null, receives the position at which each value starts.
 #pragma once
 
 #include <cstddef>
@@ -16,10 +16,10 @@
 
 namespace toolkit {
 
-/// Values, keys among them, and the byte that each starts at.
+/// Values, including keys, and the byte at which each starts.
 using ValueOffsets = std::vector<std::pair<const Value*, std::size_t>>;
 
-/// How deeply collections may nest, so that no file exhausts the stack: the platform's own limit.
+/// The limit of nesting, so that no file exhausts the stack: the platform's own limit.
 constexpr std::size_t deepestNesting = 512;
 
 /// `bytes` is the whole file.

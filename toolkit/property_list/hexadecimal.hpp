@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
-// Hexadecimal digits, as numbers and data are written with.
+// Hexadecimal digits of numbers and data.
 #pragma once
 
 namespace toolkit {
 
-/// What an ASCII character counts as a hexadecimal digit, or -1.
+/// Returns the value of a hexadecimal digit; -1 for any other character.
 constexpr int hexadecimalDigit(char c) {
   if (c >= '0' && c <= '9') return c - '0';
   if (c >= 'a' && c <= 'f') return c - 'a' + 10;

@@ -12,7 +12,7 @@
 namespace toolkit {
 namespace {
 
-/// SipHash-1-3: short keys hash fast, and nobody without the key can make them collide.
+/// SipHash-1-3: fast for short keys, and an attacker without the key cannot make keys collide.
 class SipHash {
  public:
   SipHash() {
@@ -74,7 +74,7 @@ std::uint64_t hashOfBits(const Bits& bits) {
 
 bool isBoolean(const Number& number) { return number.type() == Number::Type::boolean; }
 
-/// Whether a real is an integer that 64 bits hold, with or without sign.
+/// Whether a real is an integer that fits in 64 bits, signed or unsigned.
 bool isInteger(double real) { return real >= -0x1p63 && real < 0x1p64 && real == std::trunc(real); }
 
 std::uint64_t bitsOfInteger(double real) {
@@ -82,7 +82,7 @@ std::uint64_t bitsOfInteger(double real) {
                   : static_cast<std::uint64_t>(real);
 }
 
-/// Equal for numbers that count to the same, whatever their types.
+/// Returns the same hash for equal numbers, whatever their types.
 std::uint64_t hashOfNumber(const Number& number) {
   if (!number.isReal()) return hashOfBits(number.bits());
   const double real = number.doubleValue();
@@ -95,7 +95,7 @@ bool isNegative(const Number& integer) {
 }
 
 bool sameInteger(const Number& integer, double real) {
-  // Compared as integers: beyond 2^53 a double cannot tell neighbours apart.
+  // Compared as integers: beyond 2^53 a double cannot represent every integer.
   return isInteger(real) && isNegative(integer) == (real < 0) &&
          integer.bits() == bitsOfInteger(real);
 }
@@ -130,7 +130,7 @@ std::uint64_t hashOfKey(const Value& key) {
       return hashOfBits(static_cast<const Uid&>(key).number());
     case Value::Kind::date: {
       const double seconds = static_cast<const Date&>(key).secondsSinceReferenceDate();
-      return hashOfBits(seconds == 0 ? 0 : seconds);  // the two zeros are the same moment
+      return hashOfBits(seconds == 0 ? 0 : seconds);  // both zeros are the same moment
     }
     default:
       return 0;

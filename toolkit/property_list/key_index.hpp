@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: MIT
-// Where a dictionary's keys stand among its entries: a hash table of positions, beside the entries.
+// A hash table of the positions of a dictionary's keys; the entries themselves are stored
+// elsewhere.
 //
-// Keys that somebody chose to collide do not slow it down: the hash is keyed by a number that
-// differs from run to run. (No order depends on it.)
+// Keys chosen to collide do not slow it down: the hash uses a random key that differs in each run.
+// (No order depends on the hash.)
 #pragma once
 
 #include <cstddef>
@@ -17,26 +18,27 @@
 namespace toolkit {
 
 std::uint64_t hashOf(std::string_view text);
-/// The same for keys that are the same.
+/// Returns the same hash for keys that are the same (see `sameKey`).
 std::uint64_t hashOfKey(const Value& key);
 
-/// Whether two keys are the same: strings by their text, numbers by what they count to (a boolean
-/// is none), data by their bytes, dates and UIDs by their number. Values that hold others are the
-/// same only as themselves.
+/// Whether two keys are the same. Strings are compared by text, numbers by value (a boolean equals
+/// only a boolean), data by bytes, dates and UIDs by number. A collection is the same only as
+/// itself.
 bool sameKey(const Value& a, const Value& b);
 
-/// An open-addressing table of positions. It does not see the entries: whoever looks something up
-/// says how the key at a position compares.
+/// An open-addressing table of positions. It does not know the entries: the caller compares the key
+/// at a position.
 class KeyIndex {
  public:
   static constexpr std::size_t none = std::numeric_limits<std::size_t>::max();
 
-  /// Has room for `count` keys.
+  /// Makes an index with room for `count` keys.
   KeyIndex(std::size_t count, std::pmr::memory_resource* memory);
   KeyIndex(const KeyIndex& other, std::pmr::memory_resource* memory)
       : slots_(other.slots_, memory), used_(other.used_) {}
 
-  /// The position of the key with that hash for which `isKeyAt(position)` holds, or `none`.
+  /// Returns the position of the key with that hash for which `isKeyAt(position)` is true, or
+  /// `none`.
   template <class IsKeyAt>
   std::size_t find(std::uint64_t hash, IsKeyAt isKeyAt) const {
     for (std::size_t at = home(hash); slots_[at].position != free; at = next(at)) {
@@ -48,10 +50,10 @@ class KeyIndex {
   }
 
   bool isFull() const { return used_ >= slots_.size() / 4 * 3; }
-  /// Takes in a key that is not there yet, whose position is one after the last. Not when full.
+  /// Adds a new key, whose position is one after the last. The index must not be full.
   void append(std::uint64_t hash);
-  /// Takes a key out; the positions after it move down by one. `hashAt(position)` is the hash of a
-  /// key's, by its position before that.
+  /// Removes a key; later positions move down by one. `hashAt(position)` returns the hash of the
+  /// key that had this position before the removal.
   template <class HashAt>
   void remove(std::size_t position, HashAt hashAt);
 
@@ -61,14 +63,14 @@ class KeyIndex {
 
   struct Slot {
     Position position = free;
-    std::uint32_t tag = 0;  // other bits of the hash, so that few keys need to be looked at
+    std::uint32_t tag = 0;  // other bits of the hash, so that few keys need comparing
   };
 
   static std::uint32_t tagOf(std::uint64_t hash) { return static_cast<std::uint32_t>(hash >> 32); }
   std::size_t home(std::uint64_t hash) const { return hash & (slots_.size() - 1); }
   std::size_t next(std::size_t at) const { return (at + 1) & (slots_.size() - 1); }
 
-  std::pmr::vector<Slot> slots_;  // a power of two of them, some always free
+  std::pmr::vector<Slot> slots_;  // the size is a power of two; some slots are always free
   std::size_t used_ = 0;
 };
 
@@ -76,7 +78,8 @@ template <class HashAt>
 void KeyIndex::remove(std::size_t position, HashAt hashAt) {
   std::size_t gap = home(hashAt(position));
   while (slots_[gap].position != position) gap = next(gap);
-  // A key that a look-up would reach only across the gap moves into it, which leaves the next gap.
+  // A key that a look-up would reach only across the gap moves into the gap, which leaves a new
+  // gap.
   for (std::size_t at = next(gap); slots_[at].position != free; at = next(at)) {
     const std::size_t mask = slots_.size() - 1;
     const std::size_t wanted = home(hashAt(std::size_t{slots_[at].position}));

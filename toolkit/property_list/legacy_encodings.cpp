@@ -26,13 +26,13 @@ struct Gb18030Range {
 constexpr char16_t undefined = u' ';
 constexpr char32_t none = 0xFFFFFFFF;
 
-/// What a decoder reads one character from: the bytes that are left, of which it takes some.
+/// The remaining bytes, from which a decoder takes those of one character.
 class Bytes {
  public:
   explicit Bytes(std::string_view bytes) : bytes_(bytes) {}
   bool empty() const { return at_ == bytes_.size(); }
   std::size_t taken() const { return at_; }
-  /// The next byte; one that no encoding continues a character with when there is none.
+  /// Returns the next byte; at the end 0, which continues a character in no encoding.
   unsigned take() { return empty() ? 0 : static_cast<unsigned char>(bytes_[at_++]); }
 
  private:
@@ -52,8 +52,8 @@ bool isBetween(unsigned byte, unsigned first, unsigned last) {
   return byte >= first && byte <= last;
 }
 
-/// Decodes a text in which bytes below 0x80 are ASCII; `decode` reads a character from its first
-/// byte and those that follow, or finds none.
+/// Decodes a text in which bytes below 0x80 are ASCII. `decode` returns the character of a first
+/// byte and those that follow, or `none`.
 template <class Decode>
 std::size_t decodeWith(std::string_view bytes, std::string& text, Decode decode) {
   Bytes rest(bytes);
@@ -71,7 +71,7 @@ std::size_t decodeLatin1(std::string_view, std::string_view bytes, std::string& 
   return decodeWith(bytes, text, [](unsigned byte, Bytes&) -> char32_t { return byte; });
 }
 
-/// A name as names are compared: case and punctuation do not count.
+/// Returns a name in the form used for comparison, without case and punctuation.
 std::string normalized(std::string_view name) {
   std::string result;
   for (const char c : name) {
@@ -103,7 +103,8 @@ std::size_t decodeSingleByte(std::string_view encoding, std::string_view bytes, 
   return decodeWith(bytes, text, [&](unsigned byte, Bytes&) { return at(upperHalf, byte - 0x80); });
 }
 
-/// Four bytes of GB18030 count the code points that two bytes leave out.
+/// Returns the code point of a four-byte sequence of GB18030. These sequences number the code
+/// points that have no two-byte form.
 char32_t gb18030CodePoint(std::size_t number) {
   constexpr std::size_t supplementary = 189000;  // 90 30 81 30
   if (number >= supplementary && number <= supplementary + 0xFFFFF) {
@@ -158,7 +159,7 @@ std::size_t decodeEucJp(std::string_view, std::string_view bytes, std::string& t
     if (!isBetween(first, 0xA1, 0xFE) || !isBetween(second, 0xA1, 0xFE)) return none;
     const unsigned row = first - 0xA1;
     if (isThreeBytes) return at(jisX0212, row, second - 0xA1);
-    // The same characters as Shift_JIS has, of which a row there holds two from here.
+    // The same characters as in Shift_JIS, where one row holds two rows of this encoding.
     return at(shiftJis, row / 2, row % 2 * 94 + second - 0xA1);
   });
 }

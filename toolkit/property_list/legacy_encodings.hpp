@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The encodings older than Unicode that an XML property list may declare.
+// The pre-Unicode encodings that an XML property list may declare.
 #pragma once
 
 #include <cstddef>
@@ -8,16 +8,16 @@
 
 namespace toolkit {
 
-/// Appends as UTF-8 what `bytes` say in an encoding, and returns how many of them it understood:
-/// all of them, or as many as stand before the first that mean nothing there.
+/// Converts `bytes` from an encoding to UTF-8 and appends the text. Returns the number of bytes
+/// converted; it is less than all if a byte sequence is invalid.
 using LegacyDecoder = std::size_t (*)(std::string_view encoding, std::string_view bytes,
                                       std::string& text);
 
-// Names are compared without regard to case and punctuation.
+// Names are compared ignoring case and punctuation.
 
 bool isUtf8Name(std::string_view name);
-/// What decodes the encoding of that name, as the IANA registers it or as it is commonly called;
-/// null when none is known. The decoder is to be given the same name.
+/// Returns the decoder for an encoding by its IANA name or a common alias; null if the name is
+/// unknown. Pass the same name to the decoder.
 LegacyDecoder legacyDecoder(std::string_view name);
 
 }  // namespace toolkit

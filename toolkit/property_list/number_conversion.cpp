@@ -23,7 +23,7 @@ std::size_t digitCount(std::string_view text) {
 
 bool isAsciiSpace(unsigned char c) { return c <= 0x20 || c == 0x7F; }
 
-/// The length in bytes of the white space character that `text` starts with, or 0.
+/// Returns the length in bytes of the white space character at the start of `text`, or 0.
 std::size_t spaceLength(std::string_view text) {
   const auto at = [&](std::size_t i) {
     return i < text.size() ? static_cast<unsigned char>(text[i]) : 0xFFU;
@@ -36,14 +36,14 @@ std::size_t spaceLength(std::string_view text) {
   return 0;
 }
 
-/// The sign and the digits that `text` starts with, clamped to the range of Integer.
+/// Returns the integer at the start of `text`, clamped to the range of Integer.
 template <class Integer>
 Integer leadingInteger(std::string_view text) {
   text = withoutLeadingSpace(text);
   const bool negative = text.starts_with('-');
   if (!text.empty() && isSign(text.front())) text.remove_prefix(1);
   const std::string_view digits = text.substr(0, digitCount(text));
-  // Read below zero, where the range reaches one further than above it.
+  // Accumulated as a negative number, because the negative range is larger by one.
   constexpr Integer lowest = std::numeric_limits<Integer>::min();
   Integer below = 0;
   for (const char c : digits) {
@@ -60,19 +60,19 @@ Integer leadingInteger(std::string_view text) {
 template <class Integer>
 Integer truncated(double value) {
   constexpr auto lowest = std::numeric_limits<Integer>::min();
-  constexpr auto bound = -static_cast<double>(lowest);  // one above the highest: exact as a double
+  constexpr auto bound = -static_cast<double>(lowest);  // one above the maximum; exact as a double
   if (!(value > -bound - 1)) return value == value ? lowest : 0;
   return value < bound ? static_cast<Integer>(value) : std::numeric_limits<Integer>::max();
 }
 
-/// Of a decimal real that no double can hold: whether it is too large, rather than too small.
+/// Whether a decimal real that does not fit in a double is too large rather than too small.
 bool isHuge(std::string_view unsignedDecimal) {
   const std::size_t mantissa = unsignedDecimal.find_first_of("eE");
   const bool negativeExponent =
       mantissa != std::string_view::npos && unsignedDecimal.substr(mantissa + 1).starts_with('-');
   std::int64_t exponent =
       mantissa == std::string_view::npos ? 0 : integerValueOf(unsignedDecimal.substr(mantissa + 1));
-  // An exponent that was clamped outweighs any number of digits that memory can hold.
+  // A clamped exponent outweighs any number of digits that fits in memory.
   if (exponent > INT64_MAX / 2 || exponent < INT64_MIN / 2) return !negativeExponent;
   const std::string_view digits = unsignedDecimal.substr(0, mantissa);
   const std::size_t point = std::min(digits.find('.'), digits.size());
@@ -96,7 +96,7 @@ bool boolValueOf(std::string_view text) {
   text = withoutLeadingSpace(text);
   if (!text.empty() && isSign(text.front())) text.remove_prefix(1);
   const std::size_t first = text.find_first_not_of('0');
-  // A letter too may stand behind a sign and zeros: "+Y" is true.
+  // A letter, too, may follow a sign and zeros: "+Y" is true.
   return first != std::string_view::npos &&
          std::string_view("YyTt123456789").find(text[first]) != std::string_view::npos;
 }

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Old-style property lists, and the strings files that are dictionaries without braces.
+// Reads old-style property lists, and strings files, which are dictionaries without braces.
 #include <string>
 
 #include "toolkit/property_list/collections.hpp"
@@ -35,13 +35,13 @@ class OldStyleReader {
 };
 
 Value* OldStyleReader::root() {
-  // A file of nothing but white space and comments is a strings file without strings.
+  // A file with only white space and comments is a strings file without strings.
   if (!tokens_.skipToToken()) return noted(entries(0), 0);
   Value* result = value(0);
   if (!tokens_.skipToToken()) return result;
   if (result->kind() != Value::Kind::string) tokens_.refuseUnexpected("the end of the file");
-  // More than one string: the keys and values of a strings file. What follows its last pair and
-  // cannot begin a key is ignored.
+  // More than one string: a strings file. Text after its last pair that cannot begin a key is
+  // ignored.
   tokens_.startAgain();
   if (offsets_) offsets_->clear();
   return noted(entries(0), 0);
@@ -81,7 +81,7 @@ Value* OldStyleReader::string() { return String::make(document_, tokens_.string(
 Value* OldStyleReader::array(std::size_t depth) {
   const auto array = pending_.open();
   do {
-    // Nothing needs to follow a comma.
+    // A comma may be the last token.
     if (!tokens_.skipToToken() || !isAtValue()) break;
     pending_.add(value(depth + 1));
   } while (tokens_.take(','));
@@ -89,7 +89,7 @@ Value* OldStyleReader::array(std::size_t depth) {
   return pending_.closeArray(array);
 }
 
-/// `key = value;` and `key;`, which is its own value, as long as keys follow.
+/// Reads `key = value;` and `key;` (whose value is the key itself) while keys follow.
 Value* OldStyleReader::entries(std::size_t depth) {
   const auto dictionary = pending_.open();
   while (tokens_.skipToToken() && tokens_.isAtString()) {

@@ -10,8 +10,8 @@
 namespace toolkit {
 namespace {
 
-// The upper half of the NeXTSTEP character set, in which octal escapes count. Its last two places
-// are free; the platform reads U+0000 there.
+// The upper half of the NeXTSTEP character set, which octal escapes use. Its last two places are
+// undefined; the platform reads them as U+0000.
 constexpr std::array<char16_t, 128> nextStep = {
     0x00A0, 0x00C0, 0x00C1, 0x00C2, 0x00C3, 0x00C4, 0x00C5, 0x00C7, 0x00C8, 0x00C9, 0x00CA, 0x00CB,
     0x00CC, 0x00CD, 0x00CE, 0x00CF, 0x00D0, 0x00D1, 0x00D2, 0x00D3, 0x00D4, 0x00D5, 0x00D6, 0x00D9,
@@ -54,7 +54,7 @@ void OldStyleTokens::skipLineComment() {
   }
 }
 
-/// A comment that is not closed reaches to the end.
+/// An unclosed comment extends to the end.
 void OldStyleTokens::skipBlockComment() {
   const std::size_t end = text_.find("*/", at_ + 2);
   at_ = end == std::string_view::npos ? text_.size() : end + 2;
@@ -120,14 +120,14 @@ std::string_view OldStyleTokens::quotedString() {
     appender.append(text_.substr(at_, stop - at_));
     at_ = stop + 1;
     if (text_[stop] != '\\') return buffer_;
-    if (at_ == text_.size()) continue;  // the string is not closed either
+    if (at_ == text_.size()) continue;  // the next search refuses: the string is not closed
     if (static_cast<unsigned char>(peek()) < 0x80) {
       appender.append(escapedUnit());
     }
   }
 }
 
-/// The number in the digits that follow, `most` of them at most.
+/// Reads a number of at most `most` digits.
 unsigned OldStyleTokens::digits(unsigned base, std::size_t most) {
   unsigned number = 0;
   for (std::size_t count = 0; count < most && at_ < text_.size(); ++count, ++at_) {

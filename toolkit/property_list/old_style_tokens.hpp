@@ -15,30 +15,29 @@ namespace toolkit {
 /// Whether a string without quotes may hold this character.
 bool isBareCharacter(char c);
 
-/// Reads from the start of a text to its end.
+/// Reads a text from its start to its end.
 class OldStyleTokens {
  public:
   /// `text` is valid UTF-8 and must outlive this.
   explicit OldStyleTokens(std::string_view text) : text_(text) {}
 
-  /// Skips white space and comments; whether anything is left.
+  /// Skips white space and comments. True if anything is left.
   bool skipToToken();
-  /// The same, and whether it is `c`, which it takes.
+  /// The same; then reads `c`, if it comes next. True if it does.
   bool take(char c);
-  /// The character that the next token starts with; '\0' at the end.
+  /// Returns the character at the current position; '\0' at the end.
   char peek() const { return at_ < text_.size() ? text_[at_] : '\0'; }
   /// Whether a string starts here.
   bool isAtString() const;
-  /// The string that starts here, as generalized UTF-8. It holds until the next call.
+  /// Reads the string that starts here, as generalised UTF-8. Valid until the next call.
   std::string_view string();
-  /// The bytes written in hexadecimal between < and >, the first of which was taken already. They
-  /// hold until the next call.
+  /// Reads bytes in hexadecimal up to >; the < has been read already. Valid until the next call.
   std::string_view data();
 
   std::size_t offset() const { return at_; }
   void startAgain() { at_ = 0; }
   [[noreturn]] void refuse(std::string reason) const { throw RefusedAt{at_, std::move(reason)}; }
-  /// Refuses what stands here; says what was `expected` in its place.
+  /// Refuses the character here; the reason names what was `expected` instead.
   [[noreturn]] void refuseUnexpected(std::string_view expected) const;
 
  private:
@@ -52,7 +51,7 @@ class OldStyleTokens {
 
   std::string_view text_;
   std::size_t at_ = 0;
-  std::string buffer_;  // of strings that do not stand in the file as they are, and of data
+  std::string buffer_;  // for strings that need decoding, and for data
 };
 
 }  // namespace toolkit

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What the open collections of a file hold so far, while a reader is inside of them.
+// The content so far of the collections that a reader has not finished reading.
 #pragma once
 
 #include <cstddef>
@@ -13,13 +13,12 @@
 
 namespace toolkit {
 
-/// A stack: collections are opened and closed in turn, and what is added goes to the one opened
-/// last.
+/// A stack: values are added to the collection that was opened last, which is also closed first.
 class PendingValues {
  public:
   explicit PendingValues(Document& document) : document_(document) {}
 
-  /// A collection that is open: where the stack stood when it began.
+  /// An open collection: the sizes of the stacks when it was opened.
   struct Collecting {
     std::size_t firstValue;
     std::size_t firstHash;
@@ -27,14 +26,14 @@ class PendingValues {
   Collecting open() const { return {values_.size(), hashes_.size()}; }
 
   void add(Value* value) { values_.push_back(value); }
-  /// The key of the value that is added next.
+  /// Adds the key of the value that is added next.
   void addKey(Value* key, const Collecting& dictionary) {
     if ((values_.size() - dictionary.firstValue) / 2 >= Dictionary::mostWithoutIndex) {
       hashes_.push_back(hashOfKey(*key));
     }
     values_.push_back(key);
   }
-  /// What a collection holds so far; in a dictionary, keys and values alternate.
+  /// Returns the content of a collection so far; in a dictionary, keys and values alternate.
   std::span<Value* const> in(const Collecting& collection) const {
     return std::span(values_).subspan(collection.firstValue);
   }
@@ -57,8 +56,8 @@ class PendingValues {
   }
 
   Document& document_;
-  std::vector<Value*> values_;         // of the collections that are open, the outermost's first
-  std::vector<std::uint64_t> hashes_;  // of their keys, but for the first few of each
+  std::vector<Value*> values_;         // of the open collections, the outermost first
+  std::vector<std::uint64_t> hashes_;  // of their keys, except the first few of each dictionary
 };
 
 }  // namespace toolkit

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Where in its file each value stands that was read from it, for whoever wants to point there.
+// The positions of values in the file from which they were read, for example for messages.
 #pragma once
 
 #include <cstddef>
@@ -14,14 +14,14 @@
 
 namespace toolkit {
 
-/// A place in a text. Both count from 1; a column is a character, wherever it is shown.
+/// A position in a text. Both count from 1; a column is one character, whatever its display width.
 struct TextPosition {
   std::size_t line;
   std::size_t column;
   friend bool operator==(const TextPosition&, const TextPosition&) = default;
 };
 
-/// A place in a binary file, counted from 0.
+/// A position in a binary file, counted from 0.
 struct BytePosition {
   std::size_t offset;
   friend bool operator==(const BytePosition&, const BytePosition&) = default;
@@ -29,16 +29,16 @@ struct BytePosition {
 
 using Position = std::variant<TextPosition, BytePosition>;
 
-/// Such as "line 3, column 7" or "byte 42".
+/// Returns text such as "line 3, column 7" or "byte 42".
 std::string description(const Position& position);
 
-/// Walks forward through a text and says where it is.
+/// Converts offsets in a text to positions, moving forward only.
 class TextCursor {
  public:
   /// `text` is UTF-8, valid or not, and must outlive this.
   explicit TextCursor(std::string_view text) : text_(text) {}
-  /// The position of the byte `offset`, which is not before the one asked for last. A line ends
-  /// with LF, CR or both.
+  /// Returns the position of the byte `offset`, which must not be before that of the previous call.
+  /// A line ends with LF, CR or CR LF.
   TextPosition at(std::size_t offset);
 
  private:
@@ -47,16 +47,16 @@ class TextCursor {
   TextPosition position_{1, 1};
 };
 
-/// The positions of the values of one file, dictionaries' keys among them. Values do not know where
-/// they stand; this is kept beside them, and only where somebody asks for it.
+/// The positions of the values of one file, including dictionary keys. Values do not store their
+/// positions; this table does, and it is built only on request.
 class PositionTable {
  public:
   PositionTable() = default;
-  /// `text` is what the offsets count in, or absent for those of a binary file.
+  /// `text` is the text in which the offsets count; absent for a binary file.
   PositionTable(ValueOffsets offsets, std::optional<std::string_view> text);
 
-  /// Where a value starts: its tag or first character, or its marker byte; absent for a value that
-  /// is not of this file.
+  /// Returns the start of a value: its tag, first character or marker byte. Absent for a value that
+  /// is not from this file.
   std::optional<Position> of(const Value& value) const;
 
  private:

@@ -34,7 +34,8 @@ Attempt attempt(FormatReader read, std::string_view text, bool wantsOffsets) {
   return attempt;
 }
 
-/// Whether a text that neither reader takes was meant as XML rather than as old-style data in < >.
+/// Whether a text that neither reader accepts was meant as XML rather than as old-style data in <
+/// >.
 bool looksLikeXml(std::string_view text) {
   const std::size_t start = text.find_first_not_of(" \t\r\n");
   if (start == std::string_view::npos || text[start] != '<') return false;

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-// Reads property lists in the three formats that the platform has: binary, XML and old-style.
+// Reads property lists in the three formats of the platform: binary, XML and old-style.
 //
-// What is accepted, and what it yields, is what the platform's own reader does, down to its
-// oddities. Any bytes may be read: time and memory stay in proportion to their number, and
-// collections nest to 512 levels.
+// Accepts the same files as the platform's own reader, with the same results, down to its oddities.
+// Any bytes are safe to read: time and memory are proportional to their number, and collections
+// nest at most 512 levels deep.
 #pragma once
 
 #include <cstdint>
@@ -19,31 +19,31 @@ namespace toolkit {
 
 enum class Format : std::uint8_t { binary, xml, oldStyle };
 
-/// Such as "XML property list".
+/// Returns the name of the format, such as "XML property list".
 std::string_view description(Format format);
 
-/// Why bytes are no property list.
+/// Why bytes are not a property list.
 struct Refusal {
-  Format format;  ///< what the bytes look like most; only that reader's reason is told
+  Format format;  ///< the most likely format; `reason` is that reader's
   Position position;
   std::string reason;
 
-  /// Such as "line 3, column 7: expected </dict> (read as XML property list)".
+  /// Returns text such as "line 3, column 7: expected </dict> (read as XML property list)".
   std::string description() const;
 };
 
 struct ReadResult {
-  ValueRef<> value;  ///< the root, of any kind; absent when there is a refusal
-  Format format;     ///< what was read, or what was refused
+  ValueRef<> value;  ///< the root, of any kind; absent if there is a refusal
+  Format format;     ///< the format that was read or refused
   std::optional<Refusal> refusal;
 };
 
-/// Reads a whole file. `bytes` need not outlive the call. Where `positions` is given it receives
-/// the place of every value, unless there is a refusal.
+/// Reads a whole file. `bytes` need not outlive the call. `positions`, if given, receives the
+/// position of every value, unless the file is refused.
 ReadResult readPropertyList(std::string_view bytes, PositionTable* positions = nullptr);
 
-/// Reads a whole file as a dictionary that can be changed, whose values cannot: absent when the
-/// bytes are no property list, or their root is no dictionary.
+/// Reads a whole file as a mutable dictionary with immutable values; absent if the bytes are not a
+/// property list or the root is not a dictionary.
 ValueRef<Dictionary> dictionaryFromPropertyList(std::string_view bytes);
 
 }  // namespace toolkit

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// How the readers of the formats say, among themselves, that a file is not what they read.
+// The exception by which the format readers refuse a file; it stays within the readers.
 #pragma once
 
 #include <cstddef>
@@ -7,7 +7,8 @@
 
 namespace toolkit {
 
-/// Thrown by a reader: what it could not accept, and at which byte of the text that it was given.
+/// Thrown by a reader: the reason for refusal, and the offset in bytes in the text that it was
+/// given.
 struct RefusedAt {
   std::size_t offset;
   std::string reason;

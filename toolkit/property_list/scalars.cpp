@@ -37,7 +37,8 @@ bool String::boolValue() const { return boolValueOf(text()); }
 
 Number& Number::nothing() { return nothingAs<Number>(); }
 
-/// The numbers from 0, which are there to the program's end like the one that is nothing.
+/// The numbers from 0 to 255, which live until the end of the program, like the object behind
+/// absent numbers.
 class Number::Small {
  public:
   static constexpr std::int64_t count = 256;
@@ -57,7 +58,8 @@ ValueRef<Number> Number::withBool(bool value) {
   return makeAlone<Number>(0, Type::boolean, std::uint64_t{value});
 }
 ValueRef<Number> Number::withLong(std::int64_t value) {
-  // Every command makes a number of a tag. The small ones, which most tags are, are made once.
+  // Every command makes a number from a tag. Small numbers, which most tags are, are made only
+  // once.
   static Small small;
   if (value >= 0 && value < Small::count) return Counted<Number>::adopt(small.at(value));
   return makeAlone<Number>(0, Type::signedInteger, static_cast<std::uint64_t>(value));

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
-// The values that hold no other values: strings, numbers, dates, data, null, UIDs.
+// Values that hold no other values: strings, numbers, dates, data, null, UIDs.
 //
-// Invariant: none of them ever changes.
+// Invariant: scalars never change.
 #pragma once
 
 #include <bit>
@@ -13,16 +13,16 @@
 
 namespace toolkit {
 
-/// Text: UTF-8, in which a surrogate that lacks its partner is encoded like any other code point
-/// (generalized UTF-8), so that every string of UTF-16 units has exactly one encoding.
+/// Text in generalised UTF-8: an unpaired surrogate is encoded like any other code point, so that
+/// every string of UTF-16 units has exactly one encoding.
 class String final : public Value {
  public:
   static String& nothing();
   static ValueRef<String> make(std::string_view text);
-  /// As a part of `document`; the caller gets no count.
+  /// Makes a string in `document`; the caller gets no count.
   static String* make(Document& document, std::string_view text);
 
-  /// The UTF-8; valid as long as the string is.
+  /// Returns the text in UTF-8; valid as long as the string.
   std::string_view text() const { return {reinterpret_cast<const char*>(this + 1), size_}; }
 
   std::int32_t intValue() const override;
@@ -37,10 +37,10 @@ class String final : public Value {
   explicit String(Kind kind) : Value(kind) {}
   explicit String(std::string_view text);
 
-  std::size_t size_ = 0;  // of the text, which stands right behind
+  std::size_t size_ = 0;  // of the text, which directly follows this object
 };
 
-/// A boolean, a 64-bit integer with or without sign, or a real.
+/// A boolean, a signed or unsigned 64-bit integer, or a real.
 class Number final : public Value {
  public:
   enum class Type : std::uint8_t { boolean, signedInteger, unsignedInteger, real32, real64 };
@@ -51,13 +51,13 @@ class Number final : public Value {
   static ValueRef<Number> withUnsignedLong(std::uint64_t value);
   static ValueRef<Number> withFloat(float value);
   static ValueRef<Number> withDouble(double value);
-  /// As a part of `document`; the caller gets no count. `bits` are the integer's, or those of a
-  /// double for a real of either width.
+  /// Makes a number in `document`; the caller gets no count. `bits` are those of the integer, or of
+  /// a double for a real of either width.
   static Number* make(Document& document, Type type, std::uint64_t bits);
 
   Type type() const { return type_; }
   bool isReal() const { return type_ == Type::real32 || type_ == Type::real64; }
-  /// The integer's bits; 0 or 1 of a boolean. Of a real: as `integerValue`.
+  /// Returns the bits of the integer; 0 or 1 for a boolean; the bits of `integerValue` for a real.
   std::uint64_t bits() const;
 
   std::int32_t intValue() const override;
@@ -75,10 +75,10 @@ class Number final : public Value {
   double real() const { return std::bit_cast<double>(bits_); }
 
   Type type_ = Type::signedInteger;
-  std::uint64_t bits_ = 0;  // of a real of either width: the bits of the double
+  std::uint64_t bits_ = 0;  // for a real of either width, the bits of the double
 };
 
-/// A moment: seconds since 2001-01-01 00:00:00 UTC.
+/// A point in time, in seconds since 2001-01-01 00:00:00 UTC.
 class Date final : public Value {
  public:
   static Date& nothing();
@@ -94,13 +94,13 @@ class Date final : public Value {
   double seconds_ = 0;
 };
 
-/// Bytes.
+/// Binary data.
 class Data final : public Value {
  public:
   static Data& nothing();
   static ValueRef<Data> make(std::string_view bytes);
   static Data* make(Document& document, std::string_view bytes);
-  /// The bytes; valid as long as the data is.
+  /// Returns the bytes; valid as long as this object.
   std::string_view bytes() const { return {reinterpret_cast<const char*>(this + 1), size_}; }
 
  private:
@@ -108,7 +108,7 @@ class Data final : public Value {
   explicit Data(Kind kind) : Value(kind) {}
   explicit Data(std::string_view bytes);
 
-  std::size_t size_ = 0;  // of the bytes, which stand right behind
+  std::size_t size_ = 0;  // of the bytes, which directly follow this object
 };
 
 /// The null of binary property lists.
@@ -139,7 +139,7 @@ class Uid final : public Value {
   std::uint32_t number_ = 0;
 };
 
-/// `value` as the kind named, or absent when it is absent or of another kind.
+/// Return `value` as the named kind; absent if it is absent or of another kind.
 ValueRef<String> asString(const ValueRef<>& value);
 ValueRef<Number> asNumber(const ValueRef<>& value);
 

@@ -13,10 +13,11 @@ unsigned byteAt(std::string_view text, std::size_t position) {
   return static_cast<unsigned char>(text[position]);
 }
 
-/// The length of the valid sequence, of two bytes or more, that starts at `at`, or 0.
+/// Returns the length of the valid multi-byte sequence that starts at `at`, or 0.
 std::size_t sequenceLength(std::string_view text, std::size_t at) {
   const unsigned lead = byteAt(text, at);
-  // What the second byte may be rules out overlong forms, surrogates and too high code points.
+  // The range of the second byte excludes overlong forms, surrogates and code points above
+  // U+10FFFF.
   unsigned lowest = 0x80;
   unsigned highest = 0xBF;
   std::size_t length = 0;

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// UTF-8, strict where files are read, and generalized (surrogates like any code point) in values.
+// UTF-8: strict in files, generalised (surrogates encoded like any code point) in values.
 #pragma once
 
 #include <cstddef>
@@ -11,11 +11,11 @@
 
 namespace toolkit {
 
-/// U+FEFF, which at the start of a file says that UTF-8 follows.
+/// U+FEFF in UTF-8, which at the start of a file shows that UTF-8 follows.
 constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
 
-/// How many bytes at the start of `text` are valid UTF-8 as Unicode defines it: no overlong forms,
-/// no surrogates, nothing above U+10FFFF. All of `text` when that is its size.
+/// Returns the number of bytes at the start of `text` that are strictly valid UTF-8: no overlong
+/// forms, no surrogates, nothing above U+10FFFF.
 std::size_t validUtf8Length(std::string_view text);
 
 /// Whether all of `text` is ASCII.
@@ -31,10 +31,10 @@ inline bool isAscii(std::string_view text) {
 /// Appends a code point up to U+10FFFF, surrogates included.
 void appendUtf8(std::string& text, char32_t codePoint);
 
-/// Appends a code point as one UTF-16 unit or two.
+/// Appends a code point as one or two UTF-16 units.
 void appendUtf16(std::u16string& text, char32_t codePoint);
 
-/// The code point that starts at `position` in generalized UTF-8; moves `position` behind it.
+/// Returns the code point at `position` in generalised UTF-8 and moves `position` past it.
 char32_t nextCodePoint(std::string_view text, std::size_t& position);
 
 inline bool isSurrogate(char32_t codePoint) { return codePoint >= 0xD800 && codePoint <= 0xDFFF; }
@@ -44,13 +44,13 @@ inline char32_t combineSurrogates(char32_t high, char32_t low) {
   return 0x10000 + ((high - 0xD800) << 10) + (low - 0xDC00);
 }
 
-/// Builds text from UTF-16 units that come one by one; halves of a pair that meet become one code
-/// point, a half that stays alone is kept as it is.
+/// Builds text from single UTF-16 units. Two adjacent halves of a surrogate pair become one code
+/// point; an unpaired half is kept.
 class Utf16Appender {
  public:
   explicit Utf16Appender(std::string& text) : text_(text) {}
   void append(char16_t unit);
-  /// Text that is whole code points already: a half that waits stays alone.
+  /// Appends text of complete code points; a pending half stays unpaired.
   void append(std::string_view utf8) {
     if (utf8.empty()) return;
     waitingHigh_ = false;
@@ -59,7 +59,7 @@ class Utf16Appender {
 
  private:
   std::string& text_;
-  bool waitingHigh_ = false;  // whether the text ends with a half that can still be joined
+  bool waitingHigh_ = false;  // the text ends with a half that can still be joined
 };
 
 }  // namespace toolkit

@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: MIT
-// Values: what property lists hold and tables keep.
+// Values: the content of property lists and of the engine's tables.
 //
-// Invariants: a value is shared through counted references and has an identity, its address, for as
-// long as it is referred to. Values read from a file never change; a reference to one of them keeps
-// all of that file's values (see document.hpp). Only arrays and dictionaries can be mutable, and
-// only those made so. The counting is safe on any thread, nothing else is.
+// Invariants: a value is shared through counted references. Its address is its identity while a
+// reference exists. Values read from a file never change; a reference to one of them keeps all
+// values of that file alive (see document.hpp). Only arrays and dictionaries can be mutable, and
+// only if made so. Only the counting is thread-safe.
 //
-// A value is sent messages without being asked first what it is: what its kind does not understand
-// raises. `->` on an absent reference answers zero, NO or absent.
+// Callers send messages to a value without checking its kind first: a message that its kind does
+// not understand raises. `->` on an absent reference answers zero, NO or absent.
 #pragma once
 
 #include <atomic>
@@ -23,18 +23,18 @@
 
 namespace toolkit {
 
-/// Pointer that shares ownership of a value by the count within the value.
+/// A pointer that shares ownership of a value through the count within the value.
 template <class T>
 class Counted {
  public:
   Counted() = default;
-  /// Takes over one count that the caller holds already.
+  /// Takes over a count that the caller owns.
   static Counted adopt(T* value) {
     Counted counted;
     counted.value_ = value;
     return counted;
   }
-  /// Adds a count of its own.
+  /// Adds a count.
   static Counted share(T* value) {
     if (value) value->retain();
     return adopt(value);
@@ -63,14 +63,14 @@ class Counted {
 
 class Value;
 
-/// Counted reference to a value of the kind named, or to nothing.
+/// A counted reference to a value of the named kind, or to nothing.
 template <class T = Value>
 using ValueRef = Ref<T, Counted>;
 
 class Value {
  public:
   enum class Kind : std::uint8_t {
-    nothing,  ///< only of the object that stands for an absent value
+    nothing,  ///< only for the object behind absent values
     string,
     number,
     date,
@@ -82,41 +82,42 @@ class Value {
     dictionary
   };
 
-  /// Stands for an absent value: answers zero, NO, absent or empty text to everything.
+  /// Returns the object behind absent values: it answers zero, NO, absent or empty text to every
+  /// message.
   static Value& nothing();
   Value(const Value&) = delete;
   Value& operator=(const Value&) = delete;
 
   Kind kind() const { return kind_; }
-  /// The name of the kind in messages, such as "NSString"; empty for the object that is nothing.
+  /// Returns the name of the kind for messages, such as "NSString"; empty for an absent value.
   std::string_view className() const;
 
-  // Conversions, of strings and numbers; any other kind raises. Strings convert by the rules of
-  // number_conversion.hpp. An integer out of the result's range keeps its low bits; a real is
-  // truncated, and one that is out of range or no number gives the nearest bound, or 0.
+  // Conversions of strings and numbers; any other kind raises. Strings convert by the rules of
+  // number_conversion.hpp. An integer out of range keeps its low bits. A real is truncated; out of
+  // range it gives the nearest bound, and NaN gives 0.
   virtual std::int32_t intValue() const;
   virtual std::int64_t integerValue() const;
   /// The same as `integerValue`.
   virtual std::int64_t longValue() const;
   virtual float floatValue() const;
   virtual double doubleValue() const;
-  /// Of a number: whether it is other than zero.
+  /// For a number, whether it is not zero.
   virtual bool boolValue() const;
 
-  /// How many elements a collection has; anything else raises.
+  /// Returns the number of elements of a collection; anything else raises.
   virtual std::size_t count() const;
-  /// The element of an array, valid until the array changes; a range exception beyond its end.
-  /// Anything but an array raises.
+  /// Returns an element of an array, valid until the array changes. Raises a range exception beyond
+  /// its end. Anything else than an array raises.
   virtual const ValueRef<>& objectAtIndex(std::size_t index) const;
 
-  /// Whether whatever the value holds stays in place as long as the value is there: so it does of
-  /// values read from a file.
+  /// True if the contents never change or move while the value lives, as for values read from a
+  /// file.
   bool isFixed() const { return keeper_ == Keeper::document; }
 
-  /// The value as a person would read it, in one line unless a string in it has more: a string is
-  /// itself, a number decimal (a boolean 1 or 0, a real in the fewest digits that read back the
-  /// same), a date in ISO 8601, data `<hex>`, null `<null>`. Collections are in the old style,
-  /// `( a, b )` and `{ k = v; }`, and the strings in them quoted where that style asks for it.
+  /// Returns the value as readable text, on one line unless a string contains line breaks: a string
+  /// as it is, a number in decimal (a boolean as 1 or 0, a real in the fewest digits that read back
+  /// the same), a date in ISO 8601, data as `<hex>`, null as `<null>`. Collections are in the old
+  /// style, `( a, b )` and `{ k = v; }`, with strings quoted where that style requires it.
   std::string description() const;
 
   void retain() {
@@ -139,8 +140,8 @@ class Value {
   virtual ~Value() = default;
   static void operator delete(void* memory) { ::operator delete(memory); }
 
-  /// The one object of class T that is nothing. It is never destroyed: it is used until the very
-  /// end of the program, where other objects' destructors still run.
+  /// Returns the one object of class T behind absent references. Never destroyed: destructors at
+  /// program exit may still use it.
   template <class T>
   static T& nothingAs() {
     alignas(T) static std::byte storage[sizeof(T)];
@@ -148,12 +149,12 @@ class Value {
     return object;
   }
 
-  /// A value of its own that keeps `extra` bytes right behind itself.
+  /// Makes a separate value, with `extra` bytes directly after the object.
   template <class T, class... Arguments>
   static Counted<T> makeAlone(std::size_t extra, Arguments&&... arguments) {
     return Counted<T>::adopt(new (Extra{extra}) T(std::forward<Arguments>(arguments)...));
   }
-  /// The same as a part of a document; it has no count of its own.
+  /// The same in a document, without its own count.
   template <class T, class... Arguments>
   static T* makeIn(Document& document, std::size_t extra, Arguments&&... arguments) {
     const Document::Place place = document.place(sizeof(T) + extra);
@@ -162,7 +163,7 @@ class Value {
     value->count_.store(place.distance, std::memory_order_relaxed);
     return value;
   }
-  /// The same in memory that lasts to the program's end, as the value then does, uncounted.
+  /// The same in memory that lasts until the end of the program; the value is not counted.
   template <class T, class... Arguments>
   static T* makeForever(void* memory, Arguments&&... arguments) {
     T* value = new (memory) T(std::forward<Arguments>(arguments)...);
@@ -170,13 +171,14 @@ class Value {
     return value;
   }
 
-  /// Ends the value, whose last reference is gone.
+  /// Destroys the value after its last reference is gone.
   virtual void destroy() noexcept;
-  /// Raises, unless the value is nothing: that understands every message.
+  /// Raises unless the value is absent: absent values understand every message.
   void requireUnderstanding(std::string_view selector) const;
 
  private:
-  /// Who keeps the value: the references to it; its document, on which they count; nobody needs to.
+  /// What keeps the value alive: references to it, references to its document, or nothing (it lives
+  /// until the end of the program).
   enum class Keeper : std::uint8_t { references, document, program };
   enum class Extra : std::size_t {};
   static void* operator new(std::size_t size, Extra extra) {
@@ -192,14 +194,14 @@ class Value {
     return *reinterpret_cast<const Document::Block*>(block)->document;
   }
 
-  // In a document: how many units the value stands from the start of its block.
+  // The number of references; in a document, the distance from the start of its block, in units.
   std::atomic<std::uint32_t> count_{1};
   Kind kind_;
   Keeper keeper_ = Keeper::references;
 };
 
-/// Whether arrays and dictionaries can change: `ignored` ones swallow every change (they stand for
-/// an absent collection), `immutable` ones raise an invalid-argument exception.
+/// Whether arrays and dictionaries can change. `ignored` ones, which stand for an absent
+/// collection, ignore every change; `immutable` ones raise an invalid-argument exception.
 enum class Mutability : std::uint8_t { ignored, immutable, changeable };
 
 }  // namespace toolkit

@@ -22,7 +22,7 @@ std::size_t visitsInWalk(const Value& root) {
   };
   std::unordered_map<const Value*, std::size_t> counted;  // collections only
   std::vector<Level> levels;
-  std::size_t visits = 1;  // to what was counted last
+  std::size_t visits = 1;  // of the value counted last
   const auto count = [&](const Value& value) {
     visits = 1;
     if (!isCollection(value)) return true;

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// A walk over a value and everything in it, in order. It takes no more stack however deeply
-// collections nest: a host can build values that are far deeper than any file's.
+// A walk over a value and its whole content, in order. It uses a fixed amount of stack, because a
+// host can build values that nest far deeper than in any file.
 #pragma once
 
 #include <cstddef>
@@ -15,13 +15,13 @@ inline bool isCollection(const Value& value) {
          value.kind() == Value::Kind::set;
 }
 
-/// How many values a collection holds directly: keys count too.
+/// Returns the number of values directly in a collection, including keys.
 inline std::size_t childCount(const Value& collection) {
   const std::size_t count = collection.count();
   return collection.kind() == Value::Kind::dictionary ? 2 * count : count;
 }
 
-/// The values in a collection; in a dictionary, key and value alternate.
+/// Returns a value in a collection; in a dictionary, keys and values alternate.
 inline const Value& childAt(const Value& collection, std::size_t index) {
   switch (collection.kind()) {
     case Value::Kind::array:
@@ -35,9 +35,9 @@ inline const Value& childAt(const Value& collection, std::size_t index) {
   return index % 2 == 0 ? *entry.key : *entry.value;
 }
 
-/// Calls, for `root` and all that it holds: `visitor.scalar(value)` for what holds nothing, and for
-/// a collection `open(collection)`, for each child `beforeChild(collection, index)` and the child,
-/// then `close(collection)`.
+/// Visits `root` and its whole content. Calls `visitor.scalar(value)` for a scalar. For a
+/// collection, calls `open(collection)`; then, for each child, `beforeChild(collection, index)`
+/// before visiting the child; then `close(collection)`.
 template <class Visitor>
 void walk(const Value& root, Visitor& visitor) {
   struct Level {
@@ -66,10 +66,10 @@ void walk(const Value& root, Visitor& visitor) {
   }
 }
 
-/// How many values such a walk visits, `root` among them. That may be far more than there are: a
-/// binary property list can hold one collection in many places, and nests such sharing. Counting
-/// takes time in proportion to the values that there are; what is too many to count is the greatest
-/// number. `root` holds no collection that holds itself.
+/// Returns the number of values that a walk visits, including `root`; the largest std::size_t if
+/// there are more. The number may far exceed the number of distinct values, because a binary
+/// property list can share a collection at many nested places. The time is proportional to the
+/// distinct values. No collection in `root` may contain itself.
 std::size_t visitsInWalk(const Value& root);
 
 }  // namespace toolkit

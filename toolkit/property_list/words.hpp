@@ -13,33 +13,35 @@ constexpr std::size_t size = sizeof(std::uint64_t);
 constexpr std::uint64_t ones = 0x0101010101010101;
 constexpr std::uint64_t highBits = 0x80 * ones;
 
-/// The word that starts at `characters`, eight of which there must be.
+/// Returns the word that starts at `characters`, which must have at least eight characters.
 inline std::uint64_t load(const char* characters) {
   std::uint64_t word = 0;
   std::memcpy(&word, characters, sizeof word);
   return word;
 }
 
-/// The number that a word stands for with its most significant byte first.
+/// Returns the number that a word represents in big-endian order.
 inline std::uint64_t bigEndian(std::uint64_t word) {
   if constexpr (std::endian::native == std::endian::big) return word;
-  // Neighbouring bytes change places, then pairs of them, then halves: one instruction in the end.
+  // Swaps neighbouring bytes, then pairs, then halves; compiles to one instruction.
   word = (word & 0x00FF00FF00FF00FF) << 8 | (word >> 8 & 0x00FF00FF00FF00FF);
   word = (word & 0x0000FFFF0000FFFF) << 16 | (word >> 16 & 0x0000FFFF0000FFFF);
   return word << 32 | word >> 32;
 }
 
-/// Sets the high bit of each byte that is zero, and nothing else.
+/// Returns a word with the high bit set in each byte that is zero in `word`, and all other bits
+/// clear.
 inline std::uint64_t zeroBytes(std::uint64_t word) {
   return ~(((word & ~highBits) + ~highBits) | word | ~highBits);
 }
 
-/// Sets the high bit of each byte that is `c`, and nothing else.
+/// The same for each byte that equals `c`.
 inline std::uint64_t bytesThatAre(char c, std::uint64_t word) {
   return zeroBytes(word ^ (ones * static_cast<unsigned char>(c)));
 }
 
-/// How many characters stand before the first whose high bit is set.
+/// Returns the number of characters before the first marked one. `marks` has no bits other than
+/// high bits.
 inline std::size_t charactersBefore(std::uint64_t marks) {
   const bool firstIsLowest = std::endian::native == std::endian::little;
   return static_cast<std::size_t>(firstIsLowest ? std::countr_zero(marks)

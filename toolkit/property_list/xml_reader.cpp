@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// XML property lists: what their elements mean.
+// Reads XML property lists: the meaning of their elements.
 #include <bit>
 #include <cmath>
 #include <limits>
@@ -25,7 +25,7 @@ class XmlReader {
 
   Value* root() {
     const XmlTag tag = tokens_.openRoot();
-    // Whatever follows the root is ignored.
+    // Everything after the root is ignored.
     return tag.element == XmlElement::plist ? onlyValueIn(tag) : value(tag);
   }
 
@@ -77,7 +77,7 @@ Value* XmlReader::content(const XmlTag& tag) {
   }
 }
 
-/// The elements that nothing stands for when they are self-closed.
+/// Reads the elements that must not be self-closed.
 Value* XmlReader::filled(const XmlTag& tag) {
   if (tag.selfClosed) {
     throw RefusedAt{tag.offset, "<" + std::string(tagName(tag.element)) + "/> needs a content"};
@@ -136,7 +136,8 @@ Value* XmlReader::array(const XmlTag& tag) {
   return pending_.closeArray(array);
 }
 
-/// What a keyed archive's reference is in XML: a dictionary of nothing but a number `CF$UID`.
+/// Returns the number of a keyed archive's reference, which in XML is a dictionary with only a
+/// number `CF$UID`; null otherwise.
 const Number* archiverUid(const Dictionary& dictionary) {
   if (dictionary.count() != 1) return nullptr;
   const Dictionary::Entry& entry = dictionary.entries().front();
@@ -146,8 +147,8 @@ const Number* archiverUid(const Dictionary& dictionary) {
   return number.type() == Number::Type::boolean ? nullptr : &number;
 }
 
-/// A real as the platform's processor cuts it to a signed integer of 32 bits: what does not fit, or
-/// is not a number, is the lowest one.
+/// Truncates a real to a signed 32-bit integer as the platform's processor does: a value that does
+/// not fit, or NaN, becomes the lowest integer.
 std::int32_t cutToInt(double real) {
   constexpr auto lowest = std::numeric_limits<std::int32_t>::min();
   const double whole = std::trunc(real);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The tags of XML property lists, as they are spelled.
+// The spelling of the tags of XML property lists.
 #pragma once
 
 #include <array>
@@ -29,13 +29,13 @@ enum class XmlElement : std::uint8_t {
 constexpr std::array<std::string_view, 11> xmlTagNames = {
     "plist", "array", "dict", "key", "string", "integer", "real", "date", "data", "true", "false"};
 
-/// The name in tags, such as "dict".
+/// Returns the tag name of an element, such as "dict".
 constexpr std::string_view tagName(XmlElement element) {
   return xmlTagNames[static_cast<std::size_t>(element)];
 }
 
-/// A tag without attributes or spaces, from its name to its `>`. It fits in one word, so that one
-/// comparison recognizes it; nearly all tags in files are spelled so.
+/// A tag without attributes or spaces, from its name to its `>`. It fits in one word, so one
+/// comparison recognises it; nearly all tags in files have this form.
 struct PlainTag {
   XmlElement element = XmlElement::plist;
   bool selfClosed = false;
@@ -62,7 +62,7 @@ struct PlainTag {
   bool matches(std::uint64_t text) const { return (text & mask) == word; }
 };
 
-/// The tags that open elements, the most frequent first.
+/// The opening tags, the most frequent first.
 constexpr std::array plainTags = {
     PlainTag(XmlElement::string, false),     PlainTag(XmlElement::integer, false),
     PlainTag(XmlElement::array, false),      PlainTag(XmlElement::key, false),
@@ -72,7 +72,7 @@ constexpr std::array plainTags = {
     PlainTag(XmlElement::string, true),      PlainTag(XmlElement::array, true),
     PlainTag(XmlElement::dictionary, true),  PlainTag(XmlElement::plist, false)};
 
-/// The tags that close elements, without their `</`, by element.
+/// The closing tags without their `</`, by element.
 constexpr std::array<PlainTag, xmlTagNames.size()> plainClosingTags = [] {
   std::array<PlainTag, xmlTagNames.size()> tags{};
   for (std::size_t i = 0; i < tags.size(); ++i) {

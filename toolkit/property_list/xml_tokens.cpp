@@ -51,7 +51,7 @@ XmlTag XmlTokens::openRoot() {
   while (true) {
     if (!skipToMarkup()) refuseNoMarkup("an element");
     if (isAt("<!--")) {
-      // Here, unlike between elements, the platform takes no empty comment.
+      // Here, unlike between elements, the platform does not accept an empty comment.
       skipPast("-->", 5, "the comment");
     } else if (isAt("<!")) {
       skipDoctype();
@@ -64,7 +64,7 @@ XmlTag XmlTokens::openRoot() {
 }
 
 void XmlTokens::skipBetweenElements() {
-  // The platform takes `<?>` for a whole instruction here, but not before the root.
+  // The platform accepts `<?>` as a complete instruction here, but not before the root.
   if (isAt("<?")) return skipPast("?>", 1, "the processing instruction");
   if (!isAt("<!--")) refuse("only comments may start with <! between elements");
   skipPast("-->", 4, "the comment");
@@ -106,8 +106,8 @@ std::string_view XmlTokens::rawText() {
   return raw;
 }
 
-/// The text from `start` on, up to a place that it may hold entities, CDATA or other than ASCII
-/// before or at.
+/// Returns the text from `start` on. There may be non-ASCII characters before the current position,
+/// and entities or CDATA at it.
 std::string_view XmlTokens::unusualText(const char* start) {
   const bool isPlain = at_ < end_ && *at_ == '<' && !isAt("<!");
   std::string_view text = isPlain ? std::string_view(start, static_cast<std::size_t>(at_ - start))

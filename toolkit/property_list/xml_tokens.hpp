@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: MIT
-// The tokens of XML property lists: tags, character data, and what may stand between them.
+// The tokens of XML property lists: tags, character data, and comments and instructions between
+// them.
 //
-// This is not XML as its standard has it but what the platform's reader takes for it: a tag ends at
-// the first `>`, attributes are skipped, and nothing is checked that is not used.
+// This is not standard XML but the dialect of the platform's reader: a tag ends at the first `>`,
+// attributes are skipped, and unused parts are not checked.
 #pragma once
 
 #include <cstddef>
@@ -22,27 +23,28 @@ struct XmlTag {
   std::size_t offset;  ///< of its `<`
 };
 
-/// Reads from the start of a text to its end; what is none of the tokens asked for is refused.
+/// Reads a text from its start to its end. Refuses anything but the requested token.
 class XmlTokens {
  public:
-  /// `text` is UTF-8 but for what nobody looks at, such as comments; it must outlive this.
+  /// `text` must outlive this. Its used parts must be UTF-8; unused parts, such as comments, need
+  /// not.
   explicit XmlTokens(std::string_view text)
       : begin_(text.data()), at_(text.data()), end_(text.data() + text.size()) {}
 
-  /// Skips declaration, DOCTYPE, comments; the tag that opens the root.
+  /// Skips the declaration, DOCTYPE and comments, and reads the opening tag of the root.
   XmlTag openRoot();
-  /// The tag that opens the next element, or false before a closing tag.
+  /// Reads the opening tag of the next element; false before a closing tag.
   bool open(XmlTag& tag);
-  /// The tag that closes `element`.
+  /// Reads the closing tag of `element`.
   void close(XmlElement element);
-  /// Character data up to the next tag, entities and CDATA resolved, valid UTF-8, without a byte
-  /// order mark at its start. It holds until the next call.
+  /// Reads character data up to the next tag, with entities and CDATA resolved, as valid UTF-8
+  /// without a byte order mark at its start. Valid until the next call.
   std::string_view text();
-  /// The bytes up to the next `<`, as they stand.
+  /// Reads the bytes up to the next `<`, unchanged.
   std::string_view rawText();
 
   std::size_t offset() const { return static_cast<std::size_t>(at_ - begin_); }
-  /// The offset of a character in something that this has returned from the text.
+  /// Returns the offset of a character in a returned part of the text, such as that of `rawText`.
   std::size_t offsetOf(const char* place) const { return static_cast<std::size_t>(place - begin_); }
   [[noreturn]] void refuse(std::string reason) const {
     throw RefusedAt{offset(), std::move(reason)};
@@ -72,10 +74,10 @@ class XmlTokens {
   const char* begin_;
   const char* at_;
   const char* end_;
-  std::string buffer_;  // of text that does not stand in the file as it is
+  std::string buffer_;  // for text that needs decoding
 };
 
-// What runs once for each element of a file is defined here, to become part of its caller's loop.
+// The functions that run for each element of a file are defined here, so that they can be inlined.
 
 inline bool XmlTokens::isSpace(char c) {
   constexpr std::uint64_t spaces = 1ULL << ' ' | 1ULL << '\t' | 1ULL << '\n' | 1ULL << '\r';
@@ -83,7 +85,7 @@ inline bool XmlTokens::isSpace(char c) {
   return byte <= ' ' && (spaces >> byte & 1) != 0;
 }
 
-/// Skips white space; whether a `<` with something behind it follows.
+/// Skips white space. True if a `<` follows that is not the last character.
 inline bool XmlTokens::skipToMarkup() {
   while (at_ < end_ && isSpace(*at_)) ++at_;
   return left() > 1 && *at_ == '<';
@@ -123,7 +125,7 @@ inline void XmlTokens::close(XmlElement element) {
   }
 }
 
-/// Moves on to a `<`, a `&` or the end; whether all that it passed is ASCII for certain.
+/// Moves to the next `<`, `&` or the end. True only if everything skipped is certainly ASCII.
 inline bool XmlTokens::skipPlainText() {
   std::uint64_t seen = 0;
   while (left() >= words::size) {

@@ -29,7 +29,7 @@ bool isArchiverUid(const Dictionary& dictionary) {
   return dictionary.count() == 1 && number && number->type() != Number::Type::boolean;
 }
 
-/// Visits the values in order and writes each behind the ones before it.
+/// Visits the values in order and appends each.
 class XmlWriter {
  public:
   XmlWriter() : text_(header) {}
@@ -114,7 +114,7 @@ void XmlWriter::character(char32_t c) {
 
 void XmlWriter::string(std::string_view name, std::string_view text) {
   text_.append("<").append(name).append(">");
-  // Readers drop a byte order mark at the start: they get one to drop.
+  // Readers drop a byte order mark at the start, so write an extra one.
   if (text.starts_with(byteOrderMark)) text_ += byteOrderMark;
   for (std::size_t at = 0; at < text.size();) {
     const char32_t c = nextCodePoint(text, at);

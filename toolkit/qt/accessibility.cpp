@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Names and descriptions.
+// Announces names and descriptions.
 
 #include "toolkit/qt/accessibility.hpp"
 
@@ -23,12 +23,12 @@ void announce(QWidget& widget, QAccessible::Event what) {
 void showToolTip(QWidget& widget, std::string_view text) {
   const QString plain = qString(text);
   const bool looksRich = Qt::mightBeRichText(plain);
-  // Qt guesses from a tooltip's text whether it is HTML; a script's never is.
+  // Qt guesses whether a tooltip's text is HTML; a script's text never is.
   const QString shown = looksRich ? Qt::convertFromPlainText(plain, Qt::WhiteSpaceNormal) : plain;
   if (widget.toolTip() == shown) return;
   widget.setToolTip(shown);
   if (looksRich || !widget.accessibleDescription().isEmpty()) {
-    widget.setAccessibleDescription(plain);  // which announces it
+    widget.setAccessibleDescription(plain);  // also announces it
   } else {
     announce(widget, QAccessible::DescriptionChanged);
   }
@@ -41,7 +41,7 @@ std::string shownToolTip(const QWidget& widget) {
 }
 
 void announceShownName(QWidget& widget, const QString& name) {
-  if (!widget.accessibleName().isEmpty()) widget.setAccessibleName(name);  // which announces it
+  if (!widget.accessibleName().isEmpty()) widget.setAccessibleName(name);  // also announces it
 }
 
 }  // namespace toolkit::qt

@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What assistive technology is told. Qt speaks for most widgets by itself; here is what it leaves
-// out.
+// Tells assistive technology what Qt leaves out: descriptions of tooltips, and changed names.
 #pragma once
 
 #include <string>
@@ -11,14 +10,14 @@ class QWidget;
 
 namespace toolkit::qt {
 
-/// Sets the tooltip, plain text, which is also the widget's description where it has no other, and
-/// announces it. An empty text removes it.
+/// Sets the tooltip, as plain text, and announces it. The tooltip is also the widget's description
+/// if it has no other. An empty text removes the tooltip.
 void showToolTip(QWidget& widget, std::string_view text);
-/// The tooltip as it reads.
+/// Returns the tooltip as plain text.
 std::string shownToolTip(const QWidget& widget);
 
-/// Announces that `widget` is called `name` from now on, by what it shows. A name that its host
-/// once gave it would be wrong now and is replaced.
+/// Announces the widget's new name `name`, which its content gives it. Replaces an accessible name
+/// that the host has set, because that name would now be wrong.
 void announceShownName(QWidget& widget, const QString& name);
 
 }  // namespace toolkit::qt

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Making windows and controls; sheets are passed on to their windows.
+// Makes windows and controls, and passes sheet calls on to their windows.
 
 #include "toolkit/qt/application.hpp"
 
@@ -14,7 +14,7 @@ namespace toolkit::qt {
 
 namespace {
 
-// AppKit's title of a new button.
+// The title that AppKit gives a new button.
 constexpr auto newButtonTitle = "Button";
 
 Ref<View> placed(QWidget& widget, const Rect& frame, const std::shared_ptr<Desk>& desk) {
@@ -25,7 +25,8 @@ Ref<View> placed(QWidget& widget, const Rect& frame, const std::shared_ptr<Desk>
 
 }  // namespace
 
-// Qt takes up resources of the screen at the first showing in any case, and chooses how.
+// Ignores `defer` and `backing`: Qt creates the native window at the first showing and chooses its
+// buffering.
 Ref<Window> QtApplication::makeWindow(const Rect& content, StyleMask style, BackingStore, bool) {
   return QtWindow::make(content, style, desk_, KeptBy::application);
 }

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The Qt toolkit's application: makes windows and controls, and knows the host's.
+// The Qt toolkit's application: makes windows and controls, and wraps those of the host.
 #pragma once
 
 #include <memory>
@@ -14,7 +14,7 @@ namespace toolkit::qt {
 class QtApplication final : public Application {
  public:
   explicit QtApplication(Log& log) : desk_(std::make_shared<Desk>(log)) {}
-  /// Windows that only the application kept alive end.
+  /// Ends the windows that only the application keeps alive.
   ~QtApplication() override { desk_->letAllGo(); }
   QtApplication(const QtApplication&) = delete;
   QtApplication& operator=(const QtApplication&) = delete;
@@ -24,20 +24,21 @@ class QtApplication final : public Application {
   Ref<Button> makeButton(const Rect& frame) override;
   Ref<ImageView> makeImageView(const Rect& frame) override;
   Ref<TextField> makeTextField(const Rect& frame) override;
-  /// The sheet's geometry and modality are as they were once it is ordered out. When the user sends
-  /// it away, by Escape or its close button, it ends with the code 0, off the screen already, and
-  /// nothing else happens: whether the walk-through is over then is for the delegate to say.
+  /// Shows the sheet until it is ordered out, which restores its position, transient parent and
+  /// modality. If the user dismisses the sheet, by Escape or its close button, it ends with code 0
+  /// and is already off the screen. Nothing else happens: the delegate decides whether the
+  /// walk-through ends.
   void beginSheet(const Ref<Window>& sheet, const Ref<Window>& parent,
                   const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo) override;
   void endSheet(const Ref<Window>& sheet, long returnCode) override;
 
-  /// The window of a host's top-level widget. What the engine needs of it lives as long as somebody
-  /// keeps the reference, which a host therefore does for the length of a walk-through.
+  /// Returns the window of a host's top-level widget. The wrapper lives as long as somebody holds
+  /// the reference, so a host must hold it during a walk-through.
   Ref<Window> window(QWidget& widget);
-  /// The view of a host's widget.
+  /// Returns the view of a host's widget.
   Ref<View> view(QWidget& widget);
 
-  /// Shared by this application's windows and views, for whoever makes some of its own.
+  /// The desk that this application's windows and views share, for code that makes more of them.
   const std::shared_ptr<Desk>& desk() const { return desk_; }
 
  private:

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Remembering what buttons show, and taking over their painting while there is something to it.
+// Remembers what buttons show, and takes over their painting while there is something to add.
 
 #include "toolkit/qt/button_look.hpp"
 
@@ -21,8 +21,8 @@ namespace toolkit::qt {
 
 namespace {
 
-/// How long an outline outlasts a highlight, in milliseconds: longer than the half second between
-/// two flashes, so that it is steady.
+/// How long an outline outlasts a highlight, in milliseconds. Longer than the half second between
+/// two flashes, so that the outline does not blink.
 constexpr int outlineRest = 1200;
 
 bool isSet(const QByteArray& value) { return !value.isEmpty() && value != "0"; }
@@ -41,7 +41,7 @@ class ButtonLook final : public QObject {
   }
 
   void setTitle(const AttributedString& title);
-  /// The button's own text and font count again.
+  /// Restores the button's own text and font.
   void dropTitle();
   const std::optional<AttributedString>& title() const { return shown_.title; }
   bool isTitleStale() const { return title() && button_.text() != titleText_; }
@@ -53,7 +53,7 @@ class ButtonLook final : public QObject {
   const std::optional<Color>& faceColor() const { return shown_.face; }
   void setBezel(BezelStyle bezel) { shown_.bezel = bezel; }
 
-  /// Whether the button looks, and can be read, as it would without this.
+  /// True if the button looks and reads as it would without this object.
   bool isIdle() const { return shown_.isNothing() && !highlighted_; }
 
   bool eventFilter(QObject* watched, QEvent* event) override;
@@ -65,9 +65,9 @@ class ButtonLook final : public QObject {
 
   QAbstractButton& button_;  // its parent
   ButtonAppearance shown_;
-  QString titleText_;  // what the button was given for the title
+  QString titleText_;  // the text that the button was given
   bool hadOwnFont_ = false;
-  std::optional<WidgetColors> colors_;  // of a button that draws its title itself
+  std::optional<WidgetColors> colors_;  // for a button that draws its title itself
   bool highlighted_ = false;
   bool isPaintingItself_ = false;
   QTimer outlineEnd_;
@@ -81,7 +81,7 @@ void ButtonLook::setTitle(const AttributedString& title) {
   shown_.titleFont = own;
   titleText_ = withoutMeaning(qString(title.string()));
   button_.setText(titleText_);
-  // Qt measures a button by its font: this makes room for the title in layouts.
+  // Qt measures a button by its font, so the largest font makes room for the title in layouts.
   const QFont largest = largestFont(title, own);
   if (QFontMetrics(largest).height() > QFontMetrics(own).height()) button_.setFont(largest);
   if (!isDrawnByStyle(button_)) giveToWidget(commonAttributes(title));
@@ -136,14 +136,14 @@ bool ButtonLook::eventFilter(QObject*, QEvent* event) {
   return true;
 }
 
-// Not at once: this may be called from what must not be gone when it returns.
+// Waits for the event loop: a caller may still be using this object.
 void ButtonLook::leaveIfIdle() {
   QTimer::singleShot(0, this, [this] {
     if (isIdle()) delete this;
   });
 }
 
-/// Changes the button's look and redraws it; a look that changes nothing any more goes.
+/// Changes the button's look and redraws the button; a look that adds nothing any more is deleted.
 template <class Change>
 void changeLook(QAbstractButton& button, const Change& change) {
   auto& look = decorated<ButtonLook>(button);

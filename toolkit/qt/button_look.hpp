@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: MIT
-// What buttons show: titles with attributes, the pressed-in look, colours, bezels.
+// What buttons show: titles with attributes, the pressed-in look, colours and bezels.
 //
-// Push buttons, check boxes, radio buttons and tool buttons are drawn by the widget's own style,
-// but for what it does not know: the title's attributes, the colour, the square bezel. Buttons of
-// other classes draw themselves; there the font and the colour that all of the title has are given
-// to the widget, and the face's colour is laid over what it has drawn. A highlight adds two frames,
-// one dark and one light, as styles and style sheets may draw both looks alike.
-// `QAbstractButton::down` is the user's alone: were it reset by a flash while they hold the button
-// down, Qt would drop their click.
+// The widget's own style draws push buttons, check boxes, radio buttons and tool buttons; this code
+// draws only what the style does not support: the title's attributes, the colour, the square bezel.
+// Buttons of other classes draw themselves: the widget gets the font and the colour that the whole
+// title shares, and the face colour is laid over its drawing. A highlight adds a dark frame and a
+// light frame, because styles and style sheets may draw both states alike. `QAbstractButton::down`
+// is left to the user: if a flash reset it while they hold the button down, Qt would drop their
+// click.
 #pragma once
 
 #include <optional>
@@ -20,28 +20,29 @@ class QAbstractButton;
 
 namespace toolkit::qt {
 
-/// Shows a plain title in the button's own font and colour. An ampersand is one, no mnemonic.
+/// Shows a plain title in the button's own font and colour. Ampersands show as they are; they make
+/// no mnemonics.
 void showTitle(QAbstractButton& button, std::string_view title);
 void showTitle(QAbstractButton& button, const AttributedString& title);
-/// The very title that was shown last; without attributes where the host has set another since. A
-/// host's mnemonic is no part of the title.
+/// Returns the title that was shown last, with its attributes; if the host has set another since,
+/// that one without attributes. Mnemonic markers of a host's title are left out.
 AttributedString shownTitle(const QAbstractButton& button);
 
-/// The pressed-in look; where the user wants no motion, an outline that stays while it comes and
-/// goes. Nothing else about the button changes.
+/// Shows or removes the pressed-in look. If the user wants reduced motion, shows an outline
+/// instead, which stays while the button flashes. Nothing else about the button changes.
 void setHighlighted(QAbstractButton& button, bool highlighted);
 bool isHighlighted(const QAbstractButton& button);
 
-/// Colours the button's face; a title without a colour is black or white, what reads better there.
-/// An absent colour gives the button its own face back.
+/// Colours the button's face. A title without a colour turns black or white if its usual colour is
+/// not readable there. An absent colour restores the button's own face.
 void setFaceColor(QAbstractButton& button, const std::optional<Color>& color);
-/// Absent when it was given none.
+/// The colour of the face; absent if none was set.
 std::optional<Color> faceColor(const QAbstractButton& button);
 
 void setBezel(QAbstractButton& button, BezelStyle style);
 
-/// The dynamic property of the application, and the environment variable, that ask for no motion
-/// when they are set to anything but "0": Qt 6.4 does not hand on the desktop's own setting.
+/// The application's dynamic property and the environment variable that ask for reduced motion when
+/// set to anything but "0". They exist because Qt 6.4 does not report the desktop's own setting.
 inline constexpr const char* reducedMotionProperty = "qzReducedMotion";
 inline constexpr const char* reducedMotionVariable = "QZ_REDUCED_MOTION";
 

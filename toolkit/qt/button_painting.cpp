@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Drawing follows Qt's own styles step by step: bevel or indicator, then the label, then the focus;
-// only the step that is ours is replaced.
+// Follows the drawing steps of Qt's own styles: bevel or indicator, then the label, then the focus.
+// Replaces only the steps that the style cannot do.
 
 #include "toolkit/qt/button_painting.hpp"
 
@@ -25,7 +25,8 @@ namespace toolkit::qt {
 
 namespace {
 
-// The way to operations that Qt keeps for subclasses: subclasses of the host's are asked as well.
+// Give access to protected operations of Qt's classes; overrides in the host's subclasses are
+// called too.
 struct PushButtonStyle : QPushButton {
   using QPushButton::initStyleOption;
 };
@@ -39,7 +40,7 @@ struct ToolButtonStyle : QToolButton {
   using QToolButton::initStyleOption;
 };
 
-/// Those of text, and of what it stands on.
+/// The colours of text and of its background.
 struct Colors {
   QColor ink;
   QColor ground;
@@ -53,18 +54,18 @@ bool isSunken(const QStyleOption& option) {
   return option.state & (QStyle::State_Sunken | QStyle::State_On);
 }
 
-/// What is drawn in place of the style's own label.
+/// A label that is drawn in place of the style's own.
 struct Label {
   QRect place;
   QIcon icon;
   QSize iconSize;
   Colors colors;
   Qt::Alignment unasked;
-  QFont font;                // of what the title leaves open
-  std::optional<int> top{};  // where the title begins if that leaves it room; absent: in the middle
+  QFont font;                // for text without a font of its own
+  std::optional<int> top{};  // the title begins here if it fits; absent: in the middle
 };
 
-/// How wide a frame within `area` is that takes up an eighth of it.
+/// Returns the width of a frame that covers an eighth of `area`.
 int widthOfFrame(const QSize& area) {
   const int wanted = area.width() * area.height() / 8;
   int width = 1;
@@ -79,22 +80,22 @@ QRect paintFrame(QPainter& painter, const QRect& area, const QColor& color) {
   return inside;
 }
 
-/// The pressed-in look of buttons whose style may draw none. Whatever the ground is like, either
-/// the dark frame or the light one within it stands out: the style's own look is often the same,
-/// or nearly.
+/// Paints the pressed-in look, since the style's own often looks the same or nearly so. On every
+/// background either the dark frame or the light frame inside it is visible.
 void paintPressedIn(QPainter& painter, const QRect& area) {
   const QRect inside = paintFrame(painter, area, QColor(0, 0, 0, 180));
   paintFrame(painter, inside, QColor(255, 255, 255, 180));
 }
 
-/// Colours what is painted already. Half of each colour stays, and with it a title of any colour.
+/// Tints what is already painted. Half of each colour stays, so a title of any colour stays
+/// visible.
 void tint(QPainter& painter, const QRect& area, QColor color) {
   color.setAlphaF(0.5F);
   painter.fillRect(area, color);
 }
 
-/// Whether the button is a check box or a radio button. If so, `option` is what it asks its style
-/// to draw.
+/// True if the button is a check box or a radio button. Then fills `option` as the button does for
+/// its style.
 bool initToggle(const QAbstractButton& button, QStyleOptionButton& option) {
   if (const auto* const box = qobject_cast<const QCheckBox*>(&button)) {
     (box->*&CheckBoxStyle::initStyleOption)(&option);
@@ -112,9 +113,9 @@ class Painting {
       : button_(button), appearance_(appearance), painter_(&button) {}
 
   void paint();
-  /// The colour of a face that the button has painted itself.
+  /// Tints the face of a button that has painted itself.
   void paintTint();
-  /// What a highlight looks like, over all else.
+  /// Paints the highlight over everything else.
   void paintFlash();
 
  private:
@@ -173,13 +174,13 @@ void Painting::adapt(QStyleOption& option) const {
   option.palette.setColor(QPalette::Disabled, QPalette::ButtonText, halfway(ink, face));
 }
 
-/// Where the button's own lines begin, whatever the direction of what is written in them.
+/// The edge at which the button's lines begin, whatever the direction of their text.
 Qt::Alignment Painting::leadingEdge() const {
   return (button_.isRightToLeft() ? Qt::AlignRight : Qt::AlignLeft) | Qt::AlignAbsolute;
 }
 
-/// Whether the title is not left to the style. Style sheets draw those of push buttons, check boxes
-/// and radio buttons in a colour of their own, which may not read on the face.
+/// True if the title is drawn here and not by the style. Style sheets draw titles in a colour of
+/// their own, which may be unreadable on the face.
 bool Painting::drawsTitle() const {
   return appearance_.title || (appearance_.face && button_.style()->inherits("QStyleSheetStyle") &&
                                !button_.text().isEmpty());
@@ -219,7 +220,7 @@ void Painting::paintBevel(const QStyleOptionButton& option) {
   if (appearance_.face) paintFace(option);
 }
 
-// The widget itself places its texts, by the same figures as here.
+// The widget places its texts by itself, without the style; the numbers here are the widget's.
 void Painting::paintCommandLink(const QCommandLinkButton& button) {
   QStyleOptionButton option;
   (button.*&PushButtonStyle::initStyleOption)(&option);
@@ -278,7 +279,7 @@ void Painting::paintToggle(QStyleOptionButton& option, bool radio) {
   }
   const auto control = radio ? QStyle::CE_RadioButton : QStyle::CE_CheckBox;
   if (!appearance_.title && !appearance_.face) return painter_.drawControl(control, option);
-  indicator.state = option.state;  // in its own colours, though: a style may fill it with the face
+  indicator.state = option.state;  // keeps its own colours: a style may fill it with the face
   indicator.text.clear();
   indicator.icon = {};
   painter_.drawControl(control, indicator);
@@ -286,7 +287,7 @@ void Painting::paintToggle(QStyleOptionButton& option, bool radio) {
       option, {contents, option.icon, option.iconSize, colors, leadingEdge(), titleFont()}, radio);
 }
 
-/// The frame of a flash covers part of the indicator, which lies at the button's edge.
+/// Repaints the indicator at the button's edge, part of which the frame of a flash covers.
 void Painting::paintIndicatorAgain() {
   QStyleOptionButton option;
   if (!initToggle(button_, option)) return;
@@ -298,7 +299,7 @@ void Painting::paintIndicatorAgain() {
                          option);
 }
 
-/// Over what a style sheet may have drawn behind it.
+/// Paints the label over anything that a style sheet has drawn behind it.
 void Painting::paintToggleLabel(const QStyleOptionButton& option, const Label& label, bool radio) {
   const QRect face =
       label.place.adjusted(button_.isRightToLeft() ? 0 : -2, 0, button_.isRightToLeft() ? 2 : 0, 0);
@@ -346,7 +347,7 @@ void Painting::paintToolLabel(QStyleOptionToolButton option, Label label) {
                                             QSize(16, 16), label.place.adjusted(4, 0, -4, 0));
     paintArrow(option, place.adjusted(3, 3, -3, -3));
     label.place.adjust(20, 0, -20, 0);
-    // As the style has it for plain titles.
+    // The style places plain titles like this.
     if (option.toolButtonStyle == Qt::ToolButtonTextBesideIcon) label.unasked = leadingEdge();
   }
   paintLabel(label);
@@ -358,13 +359,13 @@ void Painting::paintArrow(const QStyleOption& option, const QRect& place) {
   painter_.drawPrimitive(QStyle::PE_IndicatorArrowDown, arrow);
 }
 
-/// A flat square with a slight sheen, pressed in where the option says so.
+/// Paints a flat square with a slight sheen, pressed in if the option says so.
 void Painting::paintSquareBevel(const QStyleOptionButton& option) {
   const QColor face = option.palette.color(QPalette::Button);
   const bool sunken = isSunken(option);
   const QRectF square = QRectF(option.rect).adjusted(0.5, 0.5, -0.5, -0.5);
   QLinearGradient sheen(square.topLeft(), square.bottomLeft());
-  // Less deep where the title is grey, which would drown in it.
+  // Less dark in a disabled button, whose grey title would be hard to see.
   const int depth = button_.isEnabled() ? 130 : 110;
   sheen.setColorAt(0, sunken ? face.darker(depth) : face.lighter(106));
   sheen.setColorAt(1, sunken ? face.darker(depth - 10) : face.darker(106));
@@ -374,7 +375,7 @@ void Painting::paintSquareBevel(const QStyleOptionButton& option) {
   painter_.drawRect(square);
 }
 
-/// The colour itself, within the bezel: styles make lighter and darker shades of it.
+/// Paints the exact colour within the bezel; styles paint lighter and darker shades of it.
 void Painting::paintFace(const QStyleOption& option) {
   painter_.save();
   painter_.setRenderHint(QPainter::Antialiasing);
@@ -391,7 +392,7 @@ void Painting::paintLabel(const Label& label) {
   painter_.restore();
 }
 
-/// Gives the room that the icon leaves.
+/// Returns the area that the icon leaves free.
 QRect Painting::paintIcon(const Label& label) {
   QRect left = label.place;
   if (label.icon.isNull()) return left;
@@ -416,7 +417,7 @@ void Painting::paintTitle(const QRect& place, const Label& label) {
   showIn(document, shown, setting);
   document.setTextWidth(place.width());
   if (document.size().height() > place.height()) {
-    // Too much to break lines: the beginning of each is better than the upper half of some.
+    // The lines do not fit: the beginning of each is better than the upper half of some.
     QTextOption option = document.defaultTextOption();
     option.setWrapMode(QTextOption::NoWrap);
     document.setDefaultTextOption(option);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Drawing buttons whose widgets do not know all that they show.
+// Paints buttons that show more than their Qt widget supports.
 #pragma once
 
 #include <QFont>
@@ -12,27 +12,27 @@ class QAbstractButton;
 
 namespace toolkit::qt {
 
-/// What a button shows besides what its widget knows.
+/// What a button shows that its widget does not support.
 struct ButtonAppearance {
   std::optional<AttributedString> title{};
-  QFont titleFont{};  ///< of what the title leaves open
+  QFont titleFont{};  ///< for text without a font of its own
   std::optional<Color> face{};
   BezelStyle bezel = BezelStyle::rounded;
-  bool pressed = false;   ///< as if it were held down
-  bool outlined = false;  ///< what shows in place of that where no motion is wanted
+  bool pressed = false;   ///< looks held down
+  bool outlined = false;  ///< shown instead of `pressed` if the user wants reduced motion
 
-  /// Whether the widget itself would look the same.
+  /// True if the widget itself would look the same.
   bool isNothing() const {
     return !title && !face && bezel == BezelStyle::rounded && !pressed && !outlined;
   }
 };
 
-/// Whether the button leaves its drawing to the widgets' style, so that it can be drawn here: push
+/// True if the button leaves its drawing to the widget style, so that it can be drawn here: push
 /// buttons and command links, check boxes, radio buttons and tool buttons.
 bool isDrawnByStyle(const QAbstractButton& button);
-/// Draws such a button, within a paint event of its own.
+/// Draws such a button. Call it in the button's paint event.
 void paintButton(QAbstractButton& button, const ButtonAppearance& appearance);
-/// Adds to any other, which has drawn itself, what can be added: all but the title and the bezel.
+/// Draws over a button that has painted itself: everything but the title and the bezel.
 void paintOver(QAbstractButton& button, const ButtonAppearance& appearance);
 
 }  // namespace toolkit::qt

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What becomes of an exception that nobody handles.
+// The default handling of exceptions.
 
 #include "toolkit/qt/calls.hpp"
 

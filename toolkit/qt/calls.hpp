@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Calling the application back out of Qt's event handlers, through which no exception may travel.
+// Calls back into the application from Qt's event handlers, which must not let exceptions through.
 #pragma once
 
 #include <exception>
@@ -12,11 +12,11 @@ namespace toolkit::qt {
 
 class Calls {
  public:
-  /// Is handed what a call back threw. What it throws itself ends the program.
+  /// Receives the exception that a callback threw. An exception from the handler ends the program.
   using Handler = std::function<void(std::exception_ptr)>;
 
-  /// Until another handler is set, a toolkit exception is logged and the application goes on, as
-  /// AppKit's does; anything else ends the program with its own message.
+  /// By default a toolkit exception is logged and the application continues, as AppKit's does; any
+  /// other exception ends the program with its own message.
   explicit Calls(Log& log);
   void setHandler(Handler handler) { handler_ = std::move(handler); }
 
@@ -25,7 +25,7 @@ class Calls {
     try {
       call();
     } catch (...) {
-      const Handler handler = handler_;  // which may replace itself
+      const Handler handler = handler_;  // a copy: the handler may replace itself
       handler(std::current_exception());
     }
   }

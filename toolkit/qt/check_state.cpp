@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Check boxes with three states, and buttons of which one is always on.
+// Reads and sets the states of check boxes with three states and of exclusive buttons.
 
 #include "toolkit/qt/check_state.hpp"
 
@@ -16,8 +16,9 @@ QCheckBox* threeStates(const QAbstractButton& button) {
   return box && box->isTristate() ? box : nullptr;
 }
 
-// While it lives the button can be turned off, and other buttons of its group stay as they are. Who
-// is told of that may delete them.
+// Suspends exclusiveness while it lives: the button can be turned off, and other buttons of its
+// group keep their state. Button and group are held weakly, because a slot of the host may delete
+// them.
 class NotExclusive {
  public:
   explicit NotExclusive(QAbstractButton& button)

@@ -10,8 +10,8 @@ namespace toolkit::qt {
 
 State checkState(const QAbstractButton& button);
 
-/// Sets the state without a click. A button that has no mixed state turns on. One that is exclusive
-/// among others turns off too, though Qt lets only a click on another do that.
+/// Sets the state without a click. A button without a mixed state turns on instead. An exclusive
+/// button turns off too, though Qt allows that only by a click on another button.
 void setCheckState(QAbstractButton& button, State state);
 
 }  // namespace toolkit::qt

@@ -6,20 +6,21 @@
 
 namespace toolkit::qt {
 
-/// Time in seconds. Neither of the two readings ever goes back.
+/// Time in seconds. Neither `now()` nor `horizon()` ever goes back.
 class Clock {
  public:
   virtual ~Clock() = default;
 
-  /// What time it is for the application.
+  /// Returns the application's time.
   virtual double now() const = 0;
-  /// Up to when timers may fire. Above `now()` on a clock that stands still between firings.
+  /// Returns the time up to which timers may fire. Later than `now()` on a clock that stops between
+  /// firings.
   virtual double horizon() const = 0;
-  /// A timer that was due then is about to fire.
+  /// Tells the clock that a timer due at `due` is about to fire.
   virtual void reach(double due) = 0;
 };
 
-/// The computer's own clock, which nobody can set.
+/// The computer's monotonic clock, which cannot be set.
 class SteadyClock final : public Clock {
  public:
   double now() const override {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// WCAG's relative luminance and what it makes of two colours.
+// Computes WCAG's relative luminance and contrast.
 
 #include "toolkit/qt/contrast.hpp"
 

@@ -1,21 +1,23 @@
 // SPDX-License-Identifier: MIT
-// How well colours read on each other, after WCAG 2.1.
+// How readable colours are on each other, by WCAG 2.1.
 #pragma once
 
 #include <QColor>
 
 namespace toolkit::qt {
 
-/// What WCAG's level AA asks of common text.
+/// The contrast that WCAG level AA requires for normal text.
 inline constexpr double readableContrast = 4.5;
 
-/// From 1 (the same colour) to 21 (black and white). Opacity does not count.
+/// Returns the contrast of two colours, from 1 (the same colour) to 21 (black and white). Ignores
+/// opacity.
 double contrast(const QColor& a, const QColor& b);
 
-/// `preferred` where it reads on `ground`; else white or black, one of which always does.
+/// Returns `preferred` if it is readable on `ground`; otherwise white or black, one of which always
+/// is.
 QColor readableOn(const QColor& ground, const QColor& preferred);
 
-/// The colour between two: what is disabled stands back without being gone.
+/// Returns the colour halfway between two: disabled text becomes fainter but stays visible.
 QColor halfway(const QColor& a, const QColor& b);
 
 }  // namespace toolkit::qt

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Rectangles of doubles and of whole numbers.
+// Converts rectangles of doubles and of whole numbers.
 
 #include "toolkit/qt/coordinates.hpp"
 
@@ -10,7 +10,7 @@ namespace toolkit::qt {
 
 namespace {
 
-// As far as Qt's own geometry goes (`QWIDGETSIZE_MAX`).
+// The limit of Qt's own geometry (`QWIDGETSIZE_MAX`).
 constexpr double farthest = (1 << 24) - 1;
 
 int whole(double length) {

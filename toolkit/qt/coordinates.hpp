@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// From the interface's rectangles, with the origin at the lower left, to Qt's and back.
+// Converts between the interface's rectangles, with the origin at the lower left, and Qt's.
 #pragma once
 
 #include <QRect>
@@ -8,10 +8,11 @@
 
 namespace toolkit::qt {
 
-/// The one place where y is turned over: `rect` in an area of that height, to and fro.
+/// Flips y for `rect` in an area of that height; works in both directions. The only place that
+/// does.
 Rect flipped(const Rect& rect, double areaHeight);
 
-/// The nearest whole rectangle that Qt takes.
+/// Returns the nearest rectangle of whole numbers that Qt accepts.
 QRect rounded(const Rect& rect);
 Rect exactly(const QRect& rect);
 

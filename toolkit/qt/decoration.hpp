@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-// What the toolkit hangs on a widget to remember and draw what Qt's own widgets cannot.
+// Objects that the toolkit attaches to a widget to remember and draw what Qt's own widgets cannot.
 //
-// A decoration is a child of its widget, so it lives as long as what a script showed there is to be
-// seen, with or without an engine, and goes when the widget goes or the host shows something else.
-// There is at most one of a class on a widget.
+// A decoration is a child of its widget. It lives while the content that a script has set is
+// visible, with or without an engine, and ends with the widget or when the host shows something
+// else. A widget has at most one decoration of each class.
 #pragma once
 
 #include <QObject>
@@ -12,7 +12,7 @@
 
 namespace toolkit::qt {
 
-/// The decoration of the very class D on `widget`; null when there is none.
+/// Returns the widget's decoration of exactly class D; null if there is none.
 template <class D>
 D* decorationOn(const QWidget& widget) {
   for (QObject* child : widget.children()) {
@@ -21,7 +21,8 @@ D* decorationOn(const QWidget& widget) {
   return nullptr;
 }
 
-/// The same, made where there is none. D's constructor takes the widget.
+/// Like `decorationOn`, but makes the decoration if there is none. D's constructor takes the
+/// widget.
 template <class D, class W>
 D& decorated(W& widget) {
   if (auto* const decoration = decorationOn<D>(widget)) return *decoration;

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Finding views and windows by their widgets. An entry whose widget has gone may stand under the
-// address of a new one until its view ends: what counts is the widget that the view still has.
+// Finds views and windows by their widgets. The entry of a deleted widget may stay under the
+// address of a new widget until the old view ends, so look-ups compare the view's current widget.
 
 #include "toolkit/qt/desk.hpp"
 
@@ -63,7 +63,7 @@ void Desk::letGo(const QtWindow& window) {
   const auto place = std::find_if(kept_.begin(), kept_.end(),
                                   [&](const auto& kept) { return kept.get() == &window; });
   if (place == kept_.end()) return;
-  const auto last = std::move(*place);  // it may end, and come back here, when the list is whole
+  const auto last = std::move(*place);  // its end may call this again, so the list must be whole
   kept_.erase(place);
 }
 

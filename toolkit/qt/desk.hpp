@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What the windows and views of one Qt toolkit share: which widget has which view, and how the
-// application is called back.
+// State that the windows and views of one Qt toolkit share: the view of each widget, and how to
+// call the application back.
 #pragma once
 
 #include <QWidget>
@@ -24,17 +24,19 @@ class Desk : public std::enable_shared_from_this<Desk> {
   Desk(const Desk&) = delete;
   Desk& operator=(const Desk&) = delete;
 
-  /// The view of `widget`, the same one as long as anybody has it; made where there is none.
+  /// Returns the view of `widget`; makes one if there is none. It stays the same while anybody
+  /// holds it.
   Ref<View> viewOf(QWidget& widget);
-  /// The window of a top-level widget, the same one as long as anybody has it.
+  /// Returns the window of a top-level widget; makes one if there is none. It stays the same while
+  /// anybody holds it.
   std::shared_ptr<QtWindow> windowOf(QWidget& widget);
-  /// The window that `widget` is, if anybody has it; else null.
+  /// Returns the window of `widget` if anybody holds it; otherwise null.
   std::shared_ptr<QtWindow> knownWindow(const QWidget& widget) const;
   std::vector<std::shared_ptr<QtWindow>> windows() const;
 
   void enter(const QWidget& widget, const std::shared_ptr<WidgetNode>& view);
   void enter(const QWidget& widget, const std::shared_ptr<QtWindow>& window);
-  /// Forgets what has ended under the key.
+  /// Removes the key's entry if its view or window has ended.
   void forgetView(const QWidget* key);
   void forgetWindow(const QWidget* key);
 
@@ -44,7 +46,7 @@ class Desk : public std::enable_shared_from_this<Desk> {
   void letAllGo();
 
   Calls calls;
-  /// Told of each button before its action is sent because the user acted; may be empty.
+  /// Called with each button that the user presses, before its action is sent; may be empty.
   std::function<void(const Ref<View>&)> willAct;
 
  private:

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Attributes that a whole text has in common become properties of the widget.
+// Turns the attributes that a whole text shares into properties of the widget.
 
 #include "toolkit/qt/edit_dress.hpp"
 
@@ -15,7 +15,8 @@ namespace toolkit::qt {
 
 namespace {
 
-/// A line edit takes justified text to the left, even where text begins on the right.
+/// Aligns justified text to the leading edge: a line edit would put it to the left even in
+/// right-to-left text.
 Qt::Alignment inOneLine(Qt::Alignment alignment) {
   return alignment & Qt::AlignJustify ? Qt::AlignLeading : alignment;
 }

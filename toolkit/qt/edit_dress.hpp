@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What edits of one style show of a text with attributes.
+// How edits that support only one style show text with attributes.
 #pragma once
 
 #include <QFont>
@@ -13,8 +13,8 @@ class QPlainTextEdit;
 
 namespace toolkit::qt {
 
-/// Gives an edit what all of its text has in common: a line edit the font, the colour and the
-/// alignment, a plain text edit the alignment. What it had comes back by `takeOff`.
+/// Gives an edit the attributes that its whole text shares: font, colour and alignment for a line
+/// edit, alignment for a plain text edit. `takeOff` restores the edit's own.
 class EditDress {
  public:
   void putOn(QLineEdit& edit, const AttributedString& text, const TextSetting& setting);
@@ -23,7 +23,7 @@ class EditDress {
   void takeOff(QPlainTextEdit& edit);
 
  private:
-  std::optional<QFont> font_;  // the edit's own; the default where it had none
+  std::optional<QFont> font_;  // the edit's own; default-constructed if it had none
   std::optional<WidgetColors> colors_;
   std::optional<Qt::Alignment> alignment_;
 };

@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Qt looks for the next one only in windows that are active, and only when it hides a widget
-// itself.
+// Qt looks for the next widget only in active windows, and only when it hides a widget itself.
 
 #include "toolkit/qt/focus.hpp"
 

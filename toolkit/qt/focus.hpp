@@ -6,9 +6,9 @@ class QWidget;
 
 namespace toolkit::qt {
 
-/// Takes the focus from `widget` and what lies in it, which is about to be hidden or disabled, and
-/// gives it to the next one in the window's order that can take it; if there is none, nothing has
-/// it.
+/// Moves the keyboard focus away from `widget` and its descendants, which are about to be hidden or
+/// disabled, to the next widget in the window's tab order that accepts it. If there is none, clears
+/// the focus.
 void giveFocusAway(QWidget& widget);
 
 }  // namespace toolkit::qt

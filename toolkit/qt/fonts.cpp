@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Which families stand in for the classic ones. The first of each row is metric-compatible where
-// there is such a family, so that lines break where their writer saw them break.
+// The families that replace the classic ones. The first of each row is metric-compatible if such a
+// family exists, so that lines break where the script's author saw them break.
 
 #include "toolkit/qt/fonts.hpp"
 
@@ -51,7 +51,7 @@ std::vector<FontFamily> familiesOf(const QStringList& desktop) {
   return families;
 }
 
-/// The family to draw `name` with.
+/// Returns the family to draw `name` with.
 QString standInFor(std::string_view name) {
   QString wanted = qString(name);
   if (QFontDatabase::hasFamily(wanted)) return wanted;
@@ -64,7 +64,7 @@ QString standInFor(std::string_view name) {
   return wanted;
 }
 
-/// What the desktop has answered, for it takes its time: longer than a whole command list.
+/// Caches the desktop's answers, each of which can take longer than a whole command list.
 class Desktop final : public QObject {
  public:
   struct Family {
@@ -72,14 +72,14 @@ class Desktop final : public QObject {
     bool fixedPitch;
   };
 
-  /// The application's, with which it ends.
+  /// Returns the application's object, which ends with the application.
   static Desktop& ofApplication() {
     static QPointer<Desktop> desktop;
     if (!desktop) desktop = new Desktop(*qGuiApp);
     return *desktop;
   }
 
-  /// The font of that name, in whatever form, at the default size.
+  /// Returns the font of that name, in any spelling that the desktop accepts, at the default size.
   std::optional<Font> fontNamed(std::string_view name) {
     const auto known = named_.find(name);
     if (known != named_.end()) return known->second;

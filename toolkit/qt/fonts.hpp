@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 // The Qt toolkit's fonts: the families of the desktop, and the classic names that scripts use.
 //
-// A point of the interface is a pixel of Qt's geometry, for text has to fit into frames that are
-// measured in points; fonts are asked for in pixels, whatever resolution the desktop claims.
+// A point of the interface is a pixel of Qt's geometry, because text must fit into frames measured
+// in points. Fonts are therefore requested in pixels, whatever resolution the desktop reports.
 #pragma once
 
 #include <QFont>
@@ -15,15 +15,15 @@ namespace toolkit::qt {
 
 class QtFonts final : public Fonts {
  public:
-  /// Known are the families that the desktop has, and Times, Helvetica, Courier, Arial, Georgia and
-  /// Verdana, with which metric-compatible or similar families stand in where they are missing.
-  /// Asked while there is an application object.
+  /// Knows the desktop's families, and Times, Helvetica, Courier, Arial, Georgia and Verdana; if
+  /// one of these is missing, a metric-compatible or similar family replaces it. Requires an
+  /// application object.
   std::optional<Font> fontWithName(std::string_view name, double size) const override;
 };
 
-/// The font to draw with: the family itself, or what stands in for it.
+/// Returns the font to draw with: the family itself or its substitute.
 QFont qFont(const Font& font);
-/// The same in words, without making a font.
+/// Returns the name of that family, without making a font.
 QString drawnFamily(const Font& font);
 int pixelSize(const Font& font);
 

@@ -22,7 +22,7 @@ const QtImage* drawable(const Ref<Image>& image) {
   return known && !known->size().isEmpty() ? known : nullptr;
 }
 
-/// `frame` shrunk to the image's proportions, in the middle of it.
+/// Returns `frame` shrunk to the image's proportions and centred.
 QRect placeFor(const QtImage& image, const QRect& frame) {
   QSizeF size = image.size();
   if (size.width() > frame.width() || size.height() > frame.height()) {
@@ -33,7 +33,7 @@ QRect placeFor(const QtImage& image, const QRect& frame) {
   return place;
 }
 
-/// Draws a label's image in place of the label, which would cut it off or distort it.
+/// Draws a label's image instead of the label, which would clip or distort it.
 class ImageLook final : public QObject {
  public:
   explicit ImageLook(QLabel& label) : QObject(&label), label_(label) {
@@ -44,7 +44,7 @@ class ImageLook final : public QObject {
     const QString formerName = qString(image_->name());
     image_ = image;
     const QtImage* const known = drawable(image);
-    // The label has the pixels too, for its size hint and for whoever asks it.
+    // The label keeps the pixmap too, for its size hint and for callers that ask for it.
     label_.setPixmap(known ? known->pixmap() : QPixmap());
     shownKey_ = label_.pixmap(Qt::ReturnByValue).cacheKey();
     describe(formerName, qString(image->name()));
@@ -68,8 +68,8 @@ class ImageLook final : public QObject {
   }
 
  private:
-  /// An image says nothing by itself: its name is the label's description, and its name too unless
-  /// the host has given it one.
+  /// Makes the image's name the label's accessible description, and its accessible name too unless
+  /// the host has set one.
   void describe(const QString& formerName, const QString& name) {
     label_.setAccessibleDescription(name);
     const QString called = label_.accessibleName();
@@ -81,7 +81,7 @@ class ImageLook final : public QObject {
   qint64 shownKey_ = 0;
 };
 
-/// Draws a view's layer under whatever the view draws itself.
+/// Draws a view's layer beneath the view's own drawing.
 class Layer final : public QObject {
  public:
   explicit Layer(QWidget& widget) : QObject(&widget), widget_(widget) {

@@ -9,18 +9,18 @@ class QWidget;
 
 namespace toolkit::qt {
 
-/// Shows `image` in the middle of the label, shrunk with its proportions where it does not fit,
-/// never enlarged; absent shows nothing.
+/// Shows `image` in the middle of the label, shrunk in proportion if it does not fit, never
+/// enlarged. An absent image shows nothing.
 void showImage(QLabel& label, const Ref<Image>& image);
-/// The very image that was shown last; absent where there is none, or the host has set another
+/// Returns the image that was shown last; absent if there is none or the host has set another
 /// pixmap since.
 Ref<Image> shownImage(const QLabel& label);
 
-/// Whether the widget has a layer, which alone has contents. Without it the contents go.
+/// Gives the widget a layer or removes the layer with its contents. Only a layer has contents.
 void setLayered(QWidget& widget, bool layered);
 bool isLayered(const QWidget& widget);
-/// Shows `image` scaled to the whole of the widget, behind its subviews; absent clears it. Without
-/// a layer nothing happens.
+/// Shows `image` scaled to the whole widget, behind its subviews. An absent image clears the layer.
+/// Does nothing without a layer.
 void showLayerContents(QWidget& widget, const Ref<Image>& image);
 Ref<Image> layerContents(const QWidget& widget);
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Looking images up and drawing them. The file system is asked every time, so that what was found
-// earlier is never older than the directory; only what the files hold is remembered.
+// Looks up and draws images. Asks the file system every time, so that a look-up is never older than
+// the directory; caches only the contents of files.
 
 #include "toolkit/qt/images.hpp"
 
@@ -19,9 +19,9 @@ namespace {
 QImage readImage(const std::string& path) {
   QImageReader reader(qString(path));
   reader.setDecideFormatFromContent(true);  // a suffix may be wrong
-  reader.setAutoTransform(true);            // photographs say which way up they are
+  reader.setAutoTransform(true);            // photographs store their orientation
   const QImage image = reader.read();
-  // As Qt draws it fastest.
+  // The format that Qt draws fastest.
   return image.hasAlphaChannel() ? image.convertToFormat(QImage::Format_ARGB32_Premultiplied)
                                  : image;
 }
@@ -70,10 +70,10 @@ Ref<Image> QtImages::imageNamed(std::string_view name) {
 }
 
 void drawImage(QPainter& painter, const QRect& place, const QtImage& image) {
-  // Not the device's: a widget that is drawn into a picture goes by the picture's.
+  // The painter's ratio, not the device's: a widget drawn into a picture uses the picture's ratio.
   const double ratio = painter.deviceTransform().m11();
   const QSize pixels = place.size() * ratio;
-  // Scaled here and not by the painter, which smooths over four pixels however much it shrinks.
+  // Scaled here, because the painter averages only four pixels however much it shrinks.
   QImage scaled = image.pixels(ratio);
   if (scaled.size() != pixels) {
     scaled = scaled.scaled(pixels, Qt::IgnoreAspectRatio, Qt::SmoothTransformation);

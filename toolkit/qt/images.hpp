@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The Qt toolkit's images: named files of the resource directory, and drawing them sharp.
+// The Qt toolkit's images: loads named files of the resource directory and draws them sharp.
 #pragma once
 
 #include <QImage>
@@ -20,44 +20,44 @@ namespace toolkit::qt {
 
 class QtImage final : public Image {
  public:
-  /// Reads the file at `path`, and, where there is one, the file of twice the resolution beside it
-  /// ("disk@2x.png" beside "disk.png"). Of no size when Qt cannot read it.
+  /// Reads the file at `path` and, if there is one, the double-resolution file next to it
+  /// ("disk@2x.png" next to "disk.png"). The size is empty if Qt cannot read the file.
   QtImage(std::string_view name, std::string path);
 
   std::string name() const override { return name_; }
-  /// Whether the file at `path` is the one that it was read from, as it was then.
+  /// True if the image was read from the file at `path` and the file has not changed since.
   bool isOf(const std::string& path) const;
-  /// Width and height in points.
+  /// Returns the width and height in points.
   QSizeF size() const;
-  /// The pixels to show at so many pixels a point.
+  /// Returns the pixels to show at `ratio` pixels a point.
   const QImage& pixels(double ratio) const;
-  /// Those at one pixel a point, for widgets that have images of their own.
+  /// Returns the pixels at one pixel a point, for widgets that show pixmaps themselves.
   const QPixmap& pixmap() const { return pixmap_; }
 
  private:
   std::string name_;
   std::string path_;
-  std::filesystem::file_time_type written_;  // the file, when it was read
+  std::filesystem::file_time_type written_;  // the file's modification time when it was read
   QImage plain_;
-  QImage twofold_;  // null when there is none
+  QImage twofold_;  // double resolution; null if there is none
   QPixmap pixmap_;
 };
 
 class QtImages final : public Images {
  public:
-  /// `files` says where the resource directory is.
+  /// `files` gives the resource directory.
   explicit QtImages(const Files& files) : files_(files) {}
 
-  /// The same image whenever the same name leads to the same file. A file that Qt cannot read is no
-  /// image.
+  /// Returns the same image whenever the name leads to the same file. Absent for a file that Qt
+  /// cannot read.
   Ref<Image> imageNamed(std::string_view name) override;
 
  private:
-  const Files& files_;  // the toolkit's, as this is
+  const Files& files_;  // owned by the toolkit, as this is
   std::map<std::string, std::shared_ptr<QtImage>, std::less<>> found_;
 };
 
-/// Draws all of `image` into `place`, each pixel of the device once.
+/// Draws all of `image` into `place`, and paints each device pixel once.
 void drawImage(QPainter& painter, const QRect& place, const QtImage& image);
 
 }  // namespace toolkit::qt

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Some classes count without the focus, too: the mouse works on them all the same.
+// Some classes count even without the focus, because they react to the mouse.
 
 #include "toolkit/qt/input_widgets.hpp"
 

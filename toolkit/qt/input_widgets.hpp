@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: MIT
-// Telling the widgets that a user acts on from those that only show something or hold others.
+// Tells widgets that take input from those that only show something or hold others.
 #pragma once
 
 class QWidget;
 
 namespace toolkit::qt {
 
-/// Whether the user can act on the widget itself, if it is enabled: buttons, fields, lists, sliders
-/// and the like; a group box that can be checked; any widget of the host's that takes the focus.
+/// True if the user can act on the widget itself when it is enabled: buttons, fields, lists,
+/// sliders and the like; a checkable group box; any widget of the host that takes the focus.
 bool takesInput(const QWidget& widget);
 
 }  // namespace toolkit::qt

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What is done here follows QLabel's own painting step by step, so that nobody sees a difference.
+// Follows QLabel's own painting step by step, so that there is no visible difference.
 
 #include "toolkit/qt/label_page.hpp"
 
@@ -19,8 +19,8 @@ struct FrameDrawer : QFrame {
   using QFrame::drawFrame;
 };
 
-/// Where in a label its text lies: within the margin, and behind the indent from the edge at which
-/// the text is aligned.
+/// Returns the area of a label's text: inside the margin, and indented from the edge at which the
+/// text is aligned.
 QRect textAreaOf(const QLabel& label) {
   const int margin = label.margin();
   QRect area = label.contentsRect().adjusted(margin, margin, -margin, -margin);
@@ -36,7 +36,7 @@ QRect textAreaOf(const QLabel& label) {
   return area;
 }
 
-/// How far below the area's top text of that height begins.
+/// Returns how far below the area's top a text of that height begins.
 qreal topOf(qreal height, const QRect& area, Qt::Alignment alignment) {
   const qreal free = std::max(area.height() - height, 0.0);
   if (alignment & Qt::AlignVCenter) return free / 2;
@@ -80,7 +80,7 @@ void LabelPage::set(const QLabel& label, const AttributedString& text, const Tex
 void LabelPage::draw(QLabel& label) {
   const QRect area = textAreaOf(label);
   document_->setLayoutEnabled(true);
-  // Even the same width would lay it out anew.
+  // Setting even the same width would repeat the layout.
   if (document_->textWidth() != area.width()) document_->setTextWidth(area.width());
   const qreal top = topOf(document_->size().height(), area, label.alignment());
   const QRect place = QRectF(area).translated(0, top).toAlignedRect();

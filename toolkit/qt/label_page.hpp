@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
-// A label's styled text, drawn from a document of its own.
+// Draws a label's styled text from a cached document.
 //
-// By itself a label reads its HTML at every change and lays it out four times, which takes longer
-// than everything else that a command list does.
+// A label on its own parses its HTML at every change and lays it out four times, which takes longer
+// than everything else in a command list.
 #pragma once
 
 #include <QLabel>
@@ -15,25 +15,26 @@ namespace toolkit::qt {
 
 class LabelPage {
  public:
-  /// Whether the label's class paints as `QLabel` does, and only text is to be drawn: neither a
-  /// selection nor the focus of a link.
+  /// True if the label's class paints like `QLabel` and only text is to be drawn, without a
+  /// selection or a focused link.
   static bool canDraw(const QLabel& label);
 
   void forget() { document_.reset(); }
-  /// Whether a text is set, for the label as it stands.
+  /// True if a text is set and the label's layout has not changed since.
   bool isFor(const QLabel& label) const;
   void set(const QLabel& label, const AttributedString& text, const TextSetting& setting);
-  /// Draws what `label` itself would draw of the text that is set, in HTML; in its paint event.
+  /// Draws the text that is set exactly as `label` itself would draw it as HTML. Call it in the
+  /// label's paint event.
   void draw(QLabel& label);
 
  private:
   std::optional<QTextDocument> document_;
-  // The label's, when the text was set.
+  // The label's settings when the text was set.
   bool wraps_ = false;
   Qt::Alignment alignment_;
 };
 
-/// Draws the frame around a label, in a paint event of it.
+/// Draws the frame around a label. Call it in the label's paint event.
 void drawFrame(QLabel& label, QPainter& painter);
 
 }  // namespace toolkit::qt

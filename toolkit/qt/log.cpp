@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Log lines as Qt's messages.
+// Writes log lines as Qt messages.
 
 #include "toolkit/qt/log.hpp"
 
@@ -11,7 +11,7 @@ namespace toolkit::qt {
 
 void QtLog::write(std::string_view line) {
   static const QLoggingCategory category("qz.walkthrough");
-  const Sink sink = sink_;  // which may replace itself
+  const Sink sink = sink_;  // a copy: the sink may replace itself
   if (sink)
     sink(line);
   else

@@ -14,7 +14,7 @@ class QtLog final : public Log {
  public:
   using Sink = std::function<void(std::string_view)>;
 
-  /// To the sink; without one, to Qt's message handler as an information of the category
+  /// Writes to the sink; without one, to Qt's message handler as an info message of the category
   /// "qz.walkthrough".
   void write(std::string_view line) override;
   void setSink(Sink sink) { sink_ = std::move(sink); }

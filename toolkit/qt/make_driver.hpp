@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Making a driver of the Qt toolkit, for programs that know nothing else of Qt.
+// Makes a driver of the Qt toolkit for programs that use nothing else of Qt.
 #pragma once
 
 #include <memory>
@@ -8,7 +8,7 @@
 
 namespace toolkit::qt {
 
-/// A driver with a Qt toolkit of its own. Makes the application object where there is none.
+/// Makes a driver with its own Qt toolkit. Makes the application object if there is none.
 std::unique_ptr<TestDriver> makeQtDriver();
 
 }  // namespace toolkit::qt

@@ -1,19 +1,19 @@
 // SPDX-License-Identifier: MIT
-// Ampersands in what Qt shows: before a letter they make it a mnemonic, two of them are one.
+// Ampersands in Qt's texts: one before a letter makes it a mnemonic, two show as one.
 #pragma once
 
 #include <QString>
 
 namespace toolkit::qt {
 
-/// `text` so that its ampersands are shown as they are.
+/// Returns `text` escaped so that its ampersands show as they are.
 inline QString withoutMeaning(QString text) { return text.replace('&', "&&"); }
 
-/// What a reader sees of `text`.
+/// Returns the text that a reader sees, without mnemonic markers.
 inline QString withoutMnemonic(const QString& text) {
   QString shown;
   for (qsizetype i = 0; i < text.size(); ++i) {
-    if (text[i] == '&' && i + 1 < text.size()) ++i;  // the next one stands for itself
+    if (text[i] == '&' && i + 1 < text.size()) ++i;  // the next character stands for itself
     shown += text[i];
   }
   return shown;

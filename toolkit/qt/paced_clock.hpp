@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// A clock that goes only while its driver lets time pass, as fast as the computer's own, and stands
-// still in between: so that what a test does meanwhile takes no time, on however slow a machine.
+// A clock that runs only while its driver lets time pass, at real speed, and stops in between. The
+// steps of a test thus take no time, however slow the machine.
 #pragma once
 
 #include <algorithm>
@@ -12,7 +12,7 @@ namespace toolkit::qt {
 
 class PacedClock final : public Clock {
  public:
-  /// While it lives the clock goes, for `seconds` at most; at its end that time has passed.
+  /// Runs the clock for at most `seconds`, while this object lives.
   class Going {
    public:
     Going(PacedClock& clock, double seconds)
@@ -23,20 +23,20 @@ class PacedClock final : public Clock {
     Going(const Going&) = delete;
     Going& operator=(const Going&) = delete;
 
-    /// What the clock can reach at this moment.
+    /// Returns the time that the clock may reach at this moment.
     double horizon() const {
       const std::chrono::duration<double> passed = std::chrono::steady_clock::now() - began_;
       return std::min(start_ + passed.count(), end_);
     }
     bool isOver() const { return horizon() >= end_; }
-    /// Seconds that it still goes.
+    /// Returns how many seconds are left.
     double left() const { return end_ - horizon(); }
-    /// Lets the rest of the time pass at once.
+    /// Lets the remaining time pass at once.
     void finish() { clock_.reach(end_); }
 
    private:
     PacedClock& clock_;
-    const Going* before_;  // which stands still meanwhile
+    const Going* before_;  // stopped meanwhile
     const double start_ = clock_.now_;
     const double end_;
     const std::chrono::steady_clock::time_point began_ = std::chrono::steady_clock::now();

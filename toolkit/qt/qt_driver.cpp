@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Acting as a user through Qt's own events, and looking at what the widgets show.
+// Acts as a user through Qt's own events, and reads what the widgets show.
 
 #include "toolkit/qt/qt_driver.hpp"
 
@@ -61,7 +61,7 @@ QWidget* imageView() {
   return label;
 }
 
-// No menu opens here: the arrow tells the button from others.
+// Opens no menu; the arrow only marks the kind of button.
 QWidget* popUpButton() {
   auto* const button = new QToolButton;
   button->setArrowType(Qt::DownArrow);
@@ -109,8 +109,8 @@ std::optional<std::string> nameOf(const Ref<Image>& image) {
   return image ? std::optional(image->name()) : std::nullopt;
 }
 
-// Where there is a display that can be reached, windows are shown on it; else they are drawn off
-// the screen. X11 comes before Wayland, on which a sheet cannot be put to its place.
+// Shows windows on a display if one can be reached; otherwise they are drawn off the screen. Tries
+// X11 before Wayland, where a sheet cannot be positioned.
 void chooseDisplay() {
 #ifdef Q_OS_LINUX
   if (!qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM")) return;
@@ -121,7 +121,7 @@ void chooseDisplay() {
 #endif
 }
 
-// Never destroyed: drivers come and go, and Qt allows for one application in a program's life.
+// Never destroyed: drivers come and go, but Qt allows only one application per program run.
 void requireApplication() {
   if (QCoreApplication::instance()) return;
   chooseDisplay();
@@ -130,10 +130,11 @@ void requireApplication() {
   static char* argv[] = {name, nullptr};
   [[maybe_unused]] static const auto* const application = new QApplication(argc, argv);
   QApplication::setQuitOnLastWindowClosed(false);
-  std::setlocale(LC_NUMERIC, "C");  // Qt sets the user's: numbers would be written with commas
+  std::setlocale(LC_NUMERIC, "C");  // Qt sets the user's, which may have decimal commas
 }
 
-// Qt keeps input from such windows, but not from events that are sent to their widgets.
+// True if a modal window blocks `window`. Qt then blocks real input, but not events that are sent
+// to the window's widgets.
 bool isBlocked(const QWidget& window) {
   const auto all = QGuiApplication::topLevelWindows();
   return std::any_of(all.begin(), all.end(), [&](const QWindow* modal) {
@@ -146,7 +147,7 @@ bool isBlocked(const QWidget& window) {
   });
 }
 
-// Check boxes and radio buttons take clicks on what they show, not on the room beside it.
+// A check box accepts clicks only on its indicator and text, not on the space next to them.
 QPoint whereToClick(const QWidget& widget) {
   QStyleOptionButton option;
   option.initFrom(&widget);
@@ -167,14 +168,14 @@ void press(QWidget& widget) {
   sendMouse(widget, QEvent::MouseButtonPress, Qt::LeftButton, whereToClick(widget));
 }
 
-// Hidden and behind a modal window it comes to nothing.
+// Releases the mouse button; has no effect on a widget that is hidden or behind a modal window.
 void release(QWidget& widget) {
   const bool arrives = widget.isVisible() && !isBlocked(*widget.window());
   const QPointF place = arrives ? whereToClick(widget) : outside;
   sendMouse(widget, QEvent::MouseButtonRelease, Qt::NoButton, place);
 }
 
-// The mouse is elsewhere. Nothing but buttons does anything with it.
+// For a click while the mouse button is down elsewhere. Only buttons react.
 void clickByKeyboard(QWidget& widget) {
   if (auto* const button = qobject_cast<QAbstractButton*>(&widget)) button->click();
 }
@@ -280,7 +281,7 @@ void QtDriver::wait(double seconds) {
   PacedClock::Going going(clock_, seconds);
   toolkit_.runLoop().wake();
   while (!going.isOver() && !thrown_) {
-    // The loop waits for events; one of them is that the time is up.
+    // The loop waits for events; this timer is the one that ends the wait.
     QTimer end;
     end.setTimerType(Qt::PreciseTimer);
     end.callOnTimeout([] {});
@@ -292,7 +293,7 @@ void QtDriver::wait(double seconds) {
   going.finish();
 }
 
-// Between two firings Qt has its turn, as it would while the time passes.
+// Processes Qt's events between two firings, as happens when real time passes.
 void QtDriver::jump(double seconds) {
   const double end = clock_.now() + seconds;
   double next = 0;
@@ -305,7 +306,7 @@ void QtDriver::jump(double seconds) {
   } while (next < end && !thrown_);
 }
 
-// What was posted is done, what changed is painted, and what is to be deleted is gone.
+// Processes posted events, pending repaints and pending deletions.
 void QtDriver::settle() {
   QCoreApplication::processEvents();
   QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);

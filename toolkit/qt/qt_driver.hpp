@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The driver of the Qt toolkit. Without a display its windows are drawn off the screen.
+// The driver of the Qt toolkit. Without a display it draws its windows off the screen.
 #pragma once
 
 #include <QPointer>
@@ -15,14 +15,14 @@ namespace toolkit::qt {
 
 class QtDriver final : public TestDriver {
  public:
-  /// Makes the application object where there is none.
+  /// Makes the application object if there is none.
   QtDriver();
 
   std::string_view name() const override { return "qt"; }
   QtToolkit& toolkit() override { return toolkit_; }
 
   Ref<Window> makeWindow(const Rect& content) override;
-  /// With an absent `parent`, a view that is in no window yet.
+  /// An absent `parent` makes a view that is in no window yet.
   Ref<View> makeView(ViewKind kind, Tag tag, const Rect& frame, const Ref<View>& parent) override;
   void removeFromSuperview(const Ref<View>& view) override;
   void setFrame(const Ref<View>& view, const Rect& frame) override;
@@ -31,11 +31,11 @@ class QtDriver final : public TestDriver {
   void setResourcePath(std::string_view path) override;
   std::string_view className(ViewKind kind) const override;
 
-  /// Presses and releases the mouse button there.
+  /// Presses and releases the mouse button on `view`.
   void click(const Ref<View>& view) override;
   void hold(const Ref<View>& view) override;
   void letGo() override;
-  /// The clock stands still at other times.
+  /// The clock runs only during this call and `handOver`.
   void advance(double seconds) override;
   void useRealTime() override { realTime_ = true; }
 
@@ -55,7 +55,7 @@ class QtDriver final : public TestDriver {
   void settle();
   void raiseWhatWasThrown();
 
-  // What waits for the event loop to be deleted would wait for the next driver's.
+  // Runs pending deleteLater() calls now, not in the next driver's event loop.
   struct Sweep {
     ~Sweep();
   };
@@ -64,7 +64,7 @@ class QtDriver final : public TestDriver {
   QPointer<QWidget> held_;  // the mouse button is down on it; null while it is up
   PacedClock clock_;
   const Sweep atTheEnd_{};
-  std::exception_ptr thrown_;  // by what the last click or advance led to
+  std::exception_ptr thrown_;  // by the last click or advance
   QtToolkit toolkit_{clock_};
 };
 

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What the driver does with a real screen: leaving the windows to the person in front of it, and
-// taking pictures of them.
+// The driver's work with a real screen: hands the windows to the person in front of it, and takes
+// pictures of them.
 
 #include <QApplication>
 #include <QPainter>
@@ -16,7 +16,7 @@ namespace toolkit::qt {
 
 namespace {
 
-/// What shows of the window and, when it is a sheet, of what it is attached to.
+/// Returns a picture of the window and, if it is a sheet, of its parent behind it.
 QPixmap pictureOf(const QtWindow& window) {
   QPixmap own = window.widget()->grab();
   const auto parent = window.sheetParent();
@@ -46,7 +46,7 @@ void QtDriver::handOver(const std::function<void(const Ref<View>&)>& willAct,
                         const std::function<bool()>& goesOn) {
   const auto desk = toolkit_.application().desk();
   desk->willAct = [&](const Ref<View>& view) {
-    clock_.reach(clock_.horizon());  // a timer that the action schedules starts at this moment
+    clock_.reach(clock_.horizon());  // timers that the action schedules start at this moment
     willAct(view);
   };
   const struct Quiet {

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The Qt toolkit: real windows, over Qt Widgets. It lives between the making of the host's
-// `QApplication` and its end, and is used on that thread; docs/toolkits.md lists its rules.
+// The Qt toolkit: real windows, made with Qt Widgets. Make it after the host's `QApplication`,
+// destroy it before, and use it only on that thread. docs/toolkits.md lists its rules.
 #pragma once
 
 #include "toolkit/qt/application.hpp"
@@ -17,7 +17,7 @@ namespace toolkit::qt {
 class QtToolkit final : public Toolkit {
  public:
   QtToolkit() : QtToolkit(steadyClock_) {}
-  /// With another clock, which outlives the toolkit.
+  /// Uses another clock, which must outlive the toolkit.
   explicit QtToolkit(Clock& clock) : runLoop_(clock, application_.desk()->calls) {}
   QtToolkit(const QtToolkit&) = delete;
   QtToolkit& operator=(const QtToolkit&) = delete;
@@ -29,7 +29,7 @@ class QtToolkit final : public Toolkit {
   SystemFiles& files() override { return files_; }
   QtLog& log() override { return log_; }
 
-  /// What becomes of exceptions that leave an action, a timer or a sheet's delegate.
+  /// Handles exceptions that escape from an action, a timer or a sheet's delegate.
   Calls& calls() { return application_.desk()->calls; }
 
  private:
@@ -39,8 +39,8 @@ class QtToolkit final : public Toolkit {
   QtImages images_{files_};
   QtFonts fonts_;
   QtApplication application_{log_};
-  // The last, so that it ends first: the actions of its timers hold engines, whose ends still use
-  // the other roles.
+  // Declared last so that it ends first: its timers' actions hold engines, which still use the
+  // other roles when they end.
   QtRunLoop runLoop_;
 };
 

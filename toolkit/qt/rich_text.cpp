@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Pieces become fragments with a character format, paragraphs become blocks with a block format.
+// Turns pieces into fragments with a character format, and paragraphs into blocks with a block
+// format.
 
 #include "toolkit/qt/rich_text.hpp"
 
@@ -37,13 +38,14 @@ QTextCharFormat formatOf(const TextAttributes& attributes, const TextSetting& se
   return format;
 }
 
-/// Qt's own tab stops are 80 points apart. Left and right are those of the page.
+/// Returns the tab stops of a list item; Qt's own are 80 points apart. Left and right are those of
+/// the page.
 QList<QTextOption::Tab> tabsFor(const MarkerStops& stops, Qt::LayoutDirection direction) {
   const bool leftwards = direction == Qt::RightToLeft;
   const auto begin = leftwards ? QTextOption::RightTab : QTextOption::LeftTab;
   const auto end = leftwards ? QTextOption::LeftTab : QTextOption::RightTab;
   return {QTextOption::Tab(stops.marker, end), QTextOption::Tab(stops.text, begin),
-          QTextOption::Tab(2 * stops.text, begin)};  // behind a wide marker
+          QTextOption::Tab(2 * stops.text, begin)};  // after a wide marker
 }
 
 QTextBlockFormat blockFormatOf(const Paragraph& paragraph, const TextSetting& setting) {
@@ -66,7 +68,7 @@ QTextBlockFormat blockFormatOf(const Paragraph& paragraph, const TextSetting& se
 
 void showIn(QTextDocument& document, const AttributedString& text, const TextSetting& setting) {
   const bool undo = document.isUndoRedoEnabled();
-  document.setUndoRedoEnabled(false);  // what a script shows is no edit of the user's
+  document.setUndoRedoEnabled(false);  // the user must not be able to undo what a script shows
   document.clear();
   document.setDefaultFont(setting.font);
   QTextOption option = document.defaultTextOption();

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Attributed strings as Qt's documents.
+// Shows attributed strings as Qt documents.
 #pragma once
 
 #include <QColor>
@@ -12,45 +12,48 @@
 
 namespace toolkit::qt {
 
-/// What the attributed string leaves to whoever draws it.
+/// The settings that an attributed string leaves to the widget that draws it.
 struct TextSetting {
   QFont font;
-  QColor link;    ///< of links that have no colour of their own
-  QColor ground;  ///< what the text stands on
-  /// Where paragraphs without a style stand.
+  QColor link;    ///< for links without a colour
+  QColor ground;  ///< the background
+  /// The alignment of paragraphs without a style.
   Qt::Alignment unasked = Qt::AlignLeading;
-  /// Where paragraphs of natural alignment stand; leading, where their own writing begins.
+  /// The alignment of paragraphs with natural alignment; leading: the edge where their writing
+  /// direction begins.
   Qt::Alignment natural = Qt::AlignLeading;
-  /// The writing direction; automatic, each paragraph's own text tells.
+  /// The writing direction; automatic: each paragraph's text decides.
   Qt::LayoutDirection direction = Qt::LeftToRight;
-  /// How text without a colour is drawn; not set, the document's viewer has the choice.
+  /// The colour of text without one; absent: the document's viewer chooses.
   std::optional<QColor> ink{};
-  /// Colours of the text's own are drawn half as strong, as in disabled controls.
+  /// Draws the text's own colours half as strong, as in disabled controls.
   bool greyed = false;
-  /// A line end behind the last line is left out, so that it takes up no room.
+  /// Leaves out a line end after the last line, so that it takes up no space.
   bool dropsLastLineEnd = true;
 };
 
-/// Makes `document` show `text`, in place of what it has.
+/// Replaces the document's content with `text`.
 void showIn(QTextDocument& document, const AttributedString& text, const TextSetting& setting);
 
-/// The same as HTML, for widgets that take nothing else.
+/// Returns the same as HTML, for widgets that accept nothing else.
 QString htmlOf(const AttributedString& text, const TextSetting& setting);
 
-/// The direction in which Qt writes the plain text: that of its first letter that has one, wherever
-/// the text stands.
+/// Returns the direction in which Qt writes the plain text: that of the first letter that has a
+/// direction, whatever the alignment.
 Qt::LayoutDirection writingDirectionOf(const AttributedString& text);
 
-/// Whether any of `text` is a link.
+/// True if any part of `text` is a link.
 bool hasLinks(const AttributedString& text);
 
-/// Whether `text` has no attributes at all, so that plain text shows all of it.
+/// True if `text` has no attributes, so that plain text shows all of it.
 bool isPlain(const AttributedString& text);
 
-/// What all of `text` has in common, of attributes: absent where its parts differ.
+/// Returns the attributes that all of `text` shares; an attribute that differs between parts is
+/// absent.
 TextAttributes commonAttributes(const AttributedString& text);
 
-/// The largest font in `text`, for whoever has room for one; `otherwise` where it names none.
+/// Returns the largest font in `text`, for widgets with only one font; `otherwise` if it names
+/// none.
 QFont largestFont(const AttributedString& text, const QFont& otherwise);
 
 }  // namespace toolkit::qt

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Attributed strings as HTML. Nothing is written that holds anyway, and tags rather than styles:
-// most of the time that it takes to show some HTML Qt spends reading styles.
+// Writes attributed strings as HTML. Omits what is the default, and prefers tags to styles: Qt
+// spends most of its time on HTML parsing styles.
 
 #include <QColor>
 #include <QFontMetricsF>
@@ -46,8 +46,8 @@ void writeText(QString& html, QStringView text) {
   }
 }
 
-/// Between `opening` and `closing`, neither of which is written around nothing. Tells whether they
-/// are.
+/// Writes between `opening` and `closing`, or leaves both out if `write` writes nothing. Returns
+/// whether they are there.
 template <class Writer>
 bool writeBetween(QLatin1String opening, QLatin1String closing, QString& html, Writer write) {
   const qsizetype start = html.size();
@@ -105,8 +105,8 @@ void writeGap(QString& html, double width, const QFontMetricsF& metrics) {
   html += "\">&nbsp;</span>"_L1;
 }
 
-/// The marker of a list item with the tabs around it, which HTML does not know: blanks of their
-/// widths. Gives the rest of the text.
+/// Writes the marker of a list item, with blanks as wide as the tabs around it, which HTML lacks.
+/// Returns the rest of the text.
 QStringView writeMarker(QString& html, const Piece& piece, const MarkerStops& stops,
                         const TextSetting& setting) {
   const QStringView text = piece.text;
@@ -151,7 +151,7 @@ void writePiece(QString& html, const Piece& piece, const std::optional<MarkerSto
   if (attributes.link) html += "</a>"_L1;
 }
 
-/// Whether HTML would drop or merge blanks of the text.
+/// True if HTML would drop or merge blanks of the text.
 bool hasBlanksToKeep(QStringView text) {
   bool behindBlank = true;
   for (const QChar c : text) {
@@ -172,7 +172,7 @@ QLatin1String alignmentIn(const BlockSetting& block) {
 
 void writeCss(QString& html, const Paragraph& paragraph, const BlockSetting& block,
               const TextSetting& setting) {
-  if (paragraph.pieces.empty()) {  // Qt's own way of writing an empty line, as high as its font
+  if (paragraph.pieces.empty()) {  // how Qt writes an empty line as high as its font
     html += "-qt-paragraph-type:empty;"_L1;
     writeCss(html, *paragraph.attributes, setting);
   }
@@ -184,7 +184,7 @@ void writeCss(QString& html, const Paragraph& paragraph, const BlockSetting& blo
   writeCss(html, "text-indent:"_L1, block.firstLine);
 }
 
-/// Whether Qt would take the paragraph to be written from right to left.
+/// True if Qt would lay out the paragraph from right to left.
 bool isWrittenLeftwards(const Paragraph& paragraph) {
   TextSetting asItIs;
   asItIs.direction = Qt::LayoutDirectionAuto;
@@ -209,10 +209,11 @@ void writeParagraph(QString& html, const Paragraph& paragraph, const TextSetting
 
 }  // namespace
 
-// Qt's own way there, by a document, takes longer than all else that a command does.
+// Writes directly: Qt's own conversion, through a document, takes longer than everything else in a
+// command.
 QString htmlOf(const AttributedString& text, const TextSetting& setting) {
   QString html;
-  html.reserve(static_cast<qsizetype>(text.string().size()) + 200);  // as much as few styles take
+  html.reserve(static_cast<qsizetype>(text.string().size()) + 200);  // enough for a few styles
   for (const Paragraph& paragraph : paragraphsOf(text, setting.dropsLastLineEnd))
     writeParagraph(html, paragraph, setting);
   return html;

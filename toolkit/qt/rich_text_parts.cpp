@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Runs, which are cut where styles change, become paragraphs, which are cut where lines end.
+// Turns runs, which end where styles change, into paragraphs, which end where lines end.
 
 #include "toolkit/qt/rich_text_parts.hpp"
 

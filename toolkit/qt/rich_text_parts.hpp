@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Attributed strings taken apart, in the terms in which Qt's documents and its HTML are written.
+// Splits attributed strings into the parts of which Qt's documents and HTML consist.
 #pragma once
 
 #include <QColor>
@@ -17,39 +17,39 @@ struct Piece {
   const TextAttributes* attributes;
 };
 
-/// A line of the text, with the attributes by which it is laid out: those of its first character,
-/// and of an empty one those of the line end before it.
+/// A line of the text, with the attributes that determine its layout: those of its first character
+/// or, in an empty line, those of the line end before it.
 struct Paragraph {
   const TextAttributes* attributes;
   std::vector<Piece> pieces;
 };
 
-/// Takes `text` apart, which outlives the paragraphs.
+/// Splits `text`, which must outlive the paragraphs.
 std::vector<Paragraph> paragraphsOf(const AttributedString& text, bool dropsLastLineEnd);
 
-/// The direction in which the paragraph is written, left to right or the other way.
+/// Returns the writing direction of the paragraph.
 Qt::LayoutDirection directionOf(const Paragraph& paragraph, const TextSetting& setting);
 
-/// How a paragraph stands.
+/// The layout of a paragraph.
 struct BlockSetting {
   Qt::Alignment alignment;
-  double before;     ///< between the edge at which lines begin and the lines, in points
-  double firstLine;  ///< what the first line stands further in than the others
+  double before;     ///< from the edge where lines begin to the lines, in points
+  double firstLine;  ///< extra indent of the first line, in points
 };
 
 BlockSetting blockSettingOf(const TextAttributes& attributes, const TextSetting& setting);
 
 /// Where the marker of a list item ends and where its text begins, in points from the beginning of
-/// a first line that hangs. Absent where lines do not hang, or too little.
+/// a hanging first line. Absent if lines do not hang, or hang too little.
 struct MarkerStops {
   double marker;
   double text;
 };
 std::optional<MarkerStops> markerStopsOf(const BlockSetting& block);
 
-/// What the text's own colour is drawn as.
+/// Returns the colour in which the text's own colour is drawn.
 QColor inkOf(const Color& color, const TextSetting& setting);
-/// What text is drawn in; absent where the viewer has the choice.
+/// Returns the colour in which text is drawn; absent if the viewer chooses.
 std::optional<QColor> inkOf(const TextAttributes& attributes, const TextSetting& setting);
 
 }  // namespace toolkit::qt

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Setting the one timer of Qt's.
+// Sets the single Qt timer.
 
 #include "toolkit/qt/run_loop.hpp"
 
@@ -12,11 +12,12 @@ namespace toolkit::qt {
 
 namespace {
 
-// Qt counts milliseconds in an int, 24 days. Longer waits are made up of such ones, in seconds.
+// In seconds. Qt counts milliseconds in an int, which holds 24 days; longer waits consist of
+// several of these.
 constexpr double longestWait = 24 * 60 * 60;
 
-// How often to ask whether the user is still busy, in seconds. Most ends are told at once; the
-// deletion of the held control is one that is not.
+// How often to check whether the user is still busy, in seconds. Most ends are reported at once;
+// the deletion of the held control is not.
 constexpr double lookAgain = 0.1;
 
 }  // namespace
@@ -40,14 +41,14 @@ void QtRunLoop::wake() {
   if (!isInDefaultMode()) {
     waited_ = true;
   } else {
-    // On a clock that stands still between firings the time passed meanwhile, too.
+    // Also lets the time of the wait pass on a clock that stops between firings.
     if (std::exchange(waited_, false)) clock_.reach(clock_.horizon());
     calls_.make([this] { fireDue(clock_.horizon()); });
   }
   setAlarm();
 }
 
-// The firing may run an event loop of its own, in which the others fire.
+// A firing timer may run its own event loop, in which the other timers must fire.
 void QtRunLoop::reach(double due) {
   clock_.reach(due);
   setAlarm();

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
 // The Qt toolkit's run loop: timers that fire from Qt's event loop.
 //
-// One timer of Qt's stands for all: it is set to the one that is due first. So the order is the
-// queue's, and an interval may be longer than Qt's timers can be set to. While the user is busy,
-// Qt's event loop goes on and the timers wait.
+// A single Qt timer serves all timers and is set to the earliest due time. So the order is the
+// queue's, and an interval may exceed the limit of Qt's timers. While the user is busy, Qt's event
+// loop continues and the timers wait.
 #pragma once
 
 #include <QTimer>
@@ -17,9 +17,10 @@ namespace toolkit::qt {
 
 class QtRunLoop final : public TimedRunLoop {
  public:
-  /// Both outlive the run loop.
+  /// Both must outlive the run loop.
   QtRunLoop(Clock& clock, Calls& calls);
-  /// Invalidates every timer. What their actions hold ends here and may still use this run loop.
+  /// Invalidates every timer. Objects that their actions hold end here and may still use this run
+  /// loop.
   ~QtRunLoop() override;
 
   Ref<Timer> schedule(double interval, bool repeats, TimerAction action) override;
@@ -27,7 +28,7 @@ class QtRunLoop final : public TimedRunLoop {
   bool isInDefaultMode() const override { return !tracking_.userIsBusy(); }
   using TimedRunLoop::nextDue;
 
-  /// Fires what is due, and looks at the clock afresh: it may go faster or slower than before.
+  /// Fires due timers and sets the Qt timer again, as the clock's speed may have changed.
   void wake();
 
  private:
@@ -37,7 +38,7 @@ class QtRunLoop final : public TimedRunLoop {
 
   Clock& clock_;
   Calls& calls_;
-  QTimer alarm_;  // of the timer that is due first
+  QTimer alarm_;  // set to the timer that is due first
   UserTracking tracking_;
   bool waited_ = false;  // for the user, since the last firing
 };

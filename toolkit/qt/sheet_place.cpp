@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Sheets are attached through their native windows, so that neither widget's parent nor its flags
-// change: Qt would make the window anew.
+// Attaches sheets through their native windows. Changing a widget's parent or flags would make Qt
+// create the window again.
 
 #include "toolkit/qt/sheet_place.hpp"
 
@@ -14,7 +14,7 @@ SheetPlace::SheetPlace(QWidget& sheet, QWidget& parent)
       modality_(sheet.windowModality()),
       hadPosition_(sheet.testAttribute(Qt::WA_Moved)),
       position_(sheet.pos()) {
-  // Asking for the number makes the native window.
+  // `winId()` creates the native window.
   sheet.winId();
   parent.winId();
   transientParent_ = sheet.windowHandle()->transientParent();

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Where a sheet hangs.
+// Places a sheet on its parent.
 #pragma once
 
 #include <QPointer>
@@ -8,9 +8,9 @@
 
 namespace toolkit::qt {
 
-/// While it lives `sheet`, which is hidden at its beginning, blocks `parent` and hangs at its top
-/// edge, wherever the user moves that. What the sheet's widget was like before comes back at the
-/// end.
+/// While it lives, `sheet` blocks `parent` and stays at the middle of its top edge when the user
+/// moves `parent`. `sheet` must be hidden when this begins. The destructor restores the sheet's
+/// former position, transient parent and modality.
 class SheetPlace final : public QObject {
  public:
   SheetPlace(QWidget& sheet, QWidget& parent);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Text and colours between the toolkit interface and Qt.
+// Converts text and colours between the toolkit interface and Qt.
 #pragma once
 
 #include <QColor>

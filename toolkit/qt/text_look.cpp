@@ -23,7 +23,7 @@ namespace toolkit::qt {
 
 namespace {
 
-/// The document of a text edit of either kind, or null.
+/// Returns the document of a text edit or plain text edit; null for other widgets.
 QTextDocument* documentOf(const QWidget& widget) {
   if (const auto* const edit = qobject_cast<const QTextEdit*>(&widget)) return edit->document();
   if (const auto* const edit = qobject_cast<const QPlainTextEdit*>(&widget))
@@ -31,13 +31,13 @@ QTextDocument* documentOf(const QWidget& widget) {
   return nullptr;
 }
 
-/// Whether Qt ends a line with `c` within a document. The last two stand around tables.
+/// True if `c` ends a line in a Qt document. The last two surround tables.
 bool endsLine(QChar c) {
   return c == QChar::ParagraphSeparator || c == QChar::LineSeparator || c == QChar(0xfdd0) ||
          c == QChar(0xfdd1);
 }
 
-/// Unlike `toPlainText`, with no-break blanks as they are.
+/// Returns the text with no-break spaces, which `toPlainText` would replace.
 QString textOf(const QTextDocument& document) {
   QString text = document.toRawText();
   for (QChar& c : text)
@@ -45,7 +45,7 @@ QString textOf(const QTextDocument& document) {
   return text;
 }
 
-/// What the widget itself says that it shows, to find out whether somebody has changed it.
+/// Returns the widget's own text, to detect whether somebody has changed it.
 QString rawText(const QWidget& widget) {
   if (const auto* const label = qobject_cast<const QLabel*>(&widget)) return label->text();
   if (const auto* const edit = qobject_cast<const QLineEdit*>(&widget)) return edit->text();
@@ -65,7 +65,7 @@ QString plainTextOf(const QLabel& label) {
   return label.buddy() ? withoutMnemonic(text) : text;
 }
 
-/// Has an edit write what comes next in its own font and colour.
+/// Makes an edit write further text in its own font and colour.
 void forgetFormat(QWidget& widget) {
   if (auto* const edit = qobject_cast<QTextEdit*>(&widget)) edit->setCurrentCharFormat({});
   if (auto* const edit = qobject_cast<QPlainTextEdit*>(&widget)) edit->setCurrentCharFormat({});
@@ -86,8 +86,8 @@ void showRich(QLabel& label, const QString& html) {
   label.setText(html);
 }
 
-/// Remembers the attributed text that a widget shows, and shows it again when the widget's colours
-/// change, for Qt neither greys text that has a colour nor turns it to the other writing direction.
+/// Remembers the attributed text of a widget, and shows it again when the widget's colours or
+/// direction change: Qt neither greys coloured text nor turns it to the other writing direction.
 class TextLook final : public QObject {
  public:
   explicit TextLook(QWidget& widget) : QObject(&widget), widget_(widget) {
@@ -102,7 +102,7 @@ class TextLook final : public QObject {
     if (qobject_cast<QLabel*>(&widget_)) announceShownName(widget_, qString(text.string()));
   }
   const AttributedString& text() const { return text_; }
-  /// Gives the widget back what it had before the text was shown.
+  /// Restores the widget to its state before the text was shown.
   void takeOff() {
     if (auto* const line = qobject_cast<QLineEdit*>(&widget_)) dress_.takeOff(*line);
     if (auto* const edit = qobject_cast<QPlainTextEdit*>(&widget_)) dress_.takeOff(*edit);
@@ -136,12 +136,12 @@ class TextLook final : public QObject {
   }
 
   void redraw() {
-    if (qobject_cast<QLineEdit*>(&widget_)) return;   // its palette has it
+    if (qobject_cast<QLineEdit*>(&widget_)) return;   // the palette does it
     const QSignalBlocker quiet(documentOf(widget_));  // the text stays the same
     draw();
   }
 
-  /// Whether it was done here and not left to the widget.
+  /// Paints a label's text. Returns false if the widget must paint itself.
   bool paint() {
     auto* const label = qobject_cast<QLabel*>(&widget_);
     if (!label || isStale() || !LabelPage::canDraw(*label)) return false;
@@ -152,10 +152,11 @@ class TextLook final : public QObject {
 
   TextSetting setting() const {
     TextSetting setting{widget_.font(), {}, {}};
-    // As Qt has it for plain text: a label's by all of its text, an edit's by each paragraph.
+    // As Qt does for plain text: a label takes the direction of its whole text, an edit that of
+    // each paragraph.
     setting.direction = documentOf(widget_) ? Qt::LayoutDirectionAuto : writingDirectionOf(text_);
     setting.greyed = !widget_.isEnabled();
-    // Only where they are needed: Qt takes its time to say which palette holds.
+    // Only if needed: Qt takes long to find the effective palette.
     if (setting.greyed || hasLinks(text_)) setColors(setting);
     if (const auto* const label = qobject_cast<QLabel*>(&widget_)) {
       setting.unasked = label->alignment() & Qt::AlignHorizontal_Mask;
@@ -180,7 +181,7 @@ class TextLook final : public QObject {
       edit->setText(qString(text_.string()));
     } else if (QTextDocument* const document = documentOf(widget_)) {
       TextSetting whole = setting();
-      whole.dropsLastLineEnd = false;  // it is the user's to edit
+      whole.dropsLastLineEnd = false;  // the user may edit it
       showIn(*document, text_, whole);
     }
     raw_ = rawText(widget_);
@@ -189,7 +190,7 @@ class TextLook final : public QObject {
   QWidget& widget_;  // its parent
   AttributedString text_;
   QString raw_;
-  LabelPage page_;  // of a label
+  LabelPage page_;  // for a label
   EditDress dress_;
 };
 

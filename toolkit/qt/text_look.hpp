@@ -11,21 +11,21 @@ class QWidget;
 
 namespace toolkit::qt {
 
-/// Whether text can be shown in `widget`: a label, a line edit, a text edit, a plain text edit.
+/// True if `widget` can show text: a label, a line edit, a text edit or a plain text edit.
 bool showsText(const QWidget& widget);
 
-/// Shows plain text, in the widget's own font and colour, as it is: neither tags nor ampersands
-/// mean anything. Nothing happens to a widget that shows no text.
+/// Shows plain text literally, in the widget's own font and colour; tags and ampersands have no
+/// meaning. Does nothing for a widget that shows no text.
 void showText(QWidget& widget, std::string_view text);
-/// Shows text with its attributes; of a line edit, only the font, colour and alignment that all of
-/// it has, and of paragraph styles a plain text edit shows only such an alignment. Links of labels
-/// open only through the host (`QLabel::linkActivated`).
+/// Shows text with its attributes. A line edit shows only the font, colour and alignment that the
+/// whole text shares; a plain text edit only such an alignment of its paragraph styles. Links in
+/// labels open only through the host (`QLabel::linkActivated`).
 void showText(QWidget& widget, const AttributedString& text);
-/// The very text that was shown last; without attributes where the host or the user has changed it
-/// since. Empty of a widget that shows none.
+/// Returns the text that was shown last, with its attributes; if the host or the user has changed
+/// it since, the new text without attributes. Empty for a widget that shows none.
 AttributedString shownText(const QWidget& widget);
 
-/// Makes a new label lay its text out as an AppKit text field: from the top, in several lines.
+/// Makes a new label lay out its text like an AppKit text field: from the top, in several lines.
 void layOutAsTextField(QLabel& label);
 
 }  // namespace toolkit::qt

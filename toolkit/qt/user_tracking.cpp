@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Following the mouse button through the application's events, and asking Qt for the rest.
+// Follows the mouse button through the application's events, and asks Qt for the rest.
 
 #include "toolkit/qt/user_tracking.hpp"
 
@@ -16,7 +16,7 @@ namespace toolkit::qt {
 
 namespace {
 
-// The viewport of a scroll area gets the mouse events of the area.
+// The viewport of a scroll area receives the area's mouse events.
 QWidget& ownerOf(QWidget& widget) {
   auto* const area = qobject_cast<QAbstractScrollArea*>(widget.parentWidget());
   return area && area->viewport() == &widget ? *area : widget;
@@ -31,7 +31,7 @@ bool isApplicationModal(const QWindow* window) {
   return window->modality() == Qt::ApplicationModal && window->isVisible();
 }
 
-// The latest modal window may be a window-modal one over an application-modal one.
+// The latest modal window may be window-modal, opened over an application-modal one.
 bool runsModalSession() {
   const QWindow* const latest = QGuiApplication::modalWindow();
   if (!latest) return false;
@@ -50,7 +50,8 @@ bool UserTracking::userIsBusy() const {
   return holdsControl() || QApplication::activePopupWidget() || runsModalSession();
 }
 
-// A release may reach no widget, as after a drag. Qt still counts it, if it counted the press.
+// After a drag, for example, a release may reach no widget. Qt still counts the release if it
+// counted the press.
 bool UserTracking::holdsControl() const {
   return held_ && held_->isVisible() &&
          (!isCountedByQt_ || QGuiApplication::mouseButtons().testFlag(Qt::LeftButton));
@@ -77,8 +78,8 @@ bool UserTracking::eventFilter(QObject* receiver, QEvent* event) {
   return false;
 }
 
-// A press that its first receiver does not take comes again for the widgets around it. A release
-// may get lost: any later event tells that the mouse button is up.
+// A press that its first receiver ignores is sent again to the widgets around it. A release may get
+// lost, so any later mouse event without the left button ends the hold.
 void UserTracking::follow(QObject& receiver, const QMouseEvent& event) {
   if (isPress(event) && receiver.isWidgetType()) {
     QWidget& pressed = ownerOf(static_cast<QWidget&>(receiver));

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-// Whether the user is in the middle of something that timers wait for: holds the mouse button down
-// on a control, has a menu or another pop-up open, or is in an application-modal window.
+// Whether the user is doing something that timers wait for: holding the mouse button down on a
+// control, using a menu or another pop-up, or using an application-modal window.
 //
-// Timers do not wait for window-modal windows, sheets among them, for event loops that a host runs,
-// and for a key that is held down.
+// Timers do not wait for window-modal windows (such as sheets), for event loops that a host runs,
+// or for a key that is held down.
 #pragma once
 
 #include <QObject>
@@ -17,8 +17,8 @@ namespace toolkit::qt {
 
 class UserTracking final : public QObject {
  public:
-  /// Listens to the application's events. `mayBeOver` is called from within an event; the user may
-  /// be free again once that event is handled. Some ends are not told: `userIsBusy` knows of them.
+  /// Listens to the application's events. `mayBeOver` is called during an event after which the
+  /// user may be free again. Some ends cause no call; only `userIsBusy` notices them.
   explicit UserTracking(std::function<void()> mayBeOver);
 
   bool userIsBusy() const;
@@ -31,7 +31,7 @@ class UserTracking final : public QObject {
 
   std::function<void()> mayBeOver_;
   QPointer<QWidget> held_;      // the mouse button is down on it; null while it is up
-  bool isCountedByQt_ = false;  // that mouse button: it came from the window system
+  bool isCountedByQt_ = false;  // the mouse button: its press came from the window system
 };
 
 }  // namespace toolkit::qt

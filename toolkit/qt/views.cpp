@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Kinds of view: telling them, sending actions, and what each kind shows.
+// The kinds of view: chooses the kind, sends actions, shows contents.
 
 #include "toolkit/qt/views.hpp"
 
@@ -42,8 +42,8 @@ std::shared_ptr<WidgetNode> makeView(QWidget& widget, const std::shared_ptr<Desk
 
 bool ControlNode::send(std::string_view action, const std::shared_ptr<Responder>& target) {
   if (action.empty()) return false;
-  // Whoever performs the action may take the sender away, and all of its window, and change its
-  // action and target: what is needed until the end is held here.
+  // The action may delete the sender and its whole window, and change its action and target, so
+  // this function holds everything that it needs until its end.
   const std::string selector(action);
   const Ref<View> sender = view();
   // NOLINTNEXTLINE(performance-unnecessary-copy-initialization)
@@ -59,7 +59,7 @@ bool ControlNode::send(std::string_view action, const std::shared_ptr<Responder>
 
 QtButton::~QtButton() { QObject::disconnect(clicks_); }
 
-// The host's own connections to the click go, and come back no more; those to other signals stay.
+// Removes the host's connections to `clicked` for good; those to other signals stay.
 void QtButton::takeClicks() {
   if (button()) QObject::disconnect(button(), &QAbstractButton::clicked, nullptr, nullptr);
 }
@@ -70,7 +70,7 @@ void QtButton::hearClicks() {
 }
 
 void QtButton::clicked() {
-  const Ref<View> kept = view();  // what is done may let it go
+  const Ref<View> kept = view();  // the action may release it
   qt::setHighlighted(*button(), false);
   if (desk_->willAct) desk_->willAct(kept);
   desk_->calls.make([this] { send(action_, target()); });
@@ -128,7 +128,7 @@ AttributedString QtTextField::value() const {
 
 void QtTextField::setValue(const AttributedString& value) { showText(*widget(), value); }
 
-// Asked each time: a host may make a group box checkable later.
+// Asked each time, because a host may make a group box checkable later.
 void QtOtherView::setEnabled(bool enabled) {
   if (widget_ && !takesInput(*widget_)) return View::setEnabled(enabled);
   enable(enabled);

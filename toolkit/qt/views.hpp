@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: MIT
-// The Qt toolkit's views and controls: the roles of toolkit/view.hpp over the widgets of a host.
+// The Qt toolkit's views and controls: implements the roles of toolkit/view.hpp with a host's
+// widgets.
 //
-// A role is joined to a node by inheriting from both: `QtView` answers what every view understands,
-// `QtControl` what every control does, and a kind adds only what is its own.
+// A class inherits from both a role and a node: `QtView` implements what all views share,
+// `QtControl` what all controls share, and each kind adds only its own part.
 #pragma once
 
 #include <QAbstractButton>
@@ -19,10 +20,10 @@
 
 namespace toolkit::qt {
 
-/// The view of `widget`, new: a button for a `QAbstractButton`; an image view for a label that
-/// shows a pixmap or is marked as one; a text field for a label, a line edit, a text edit and a
-/// plain text edit; a plain view for anything else, a combo box too. What it is stays, as long as
-/// it has a view.
+/// Makes the view of `widget`: a button for a `QAbstractButton`; an image view for a label that
+/// shows a pixmap or is marked as one; a text field for a label, a line edit, a text edit or a
+/// plain text edit; a plain view for anything else, even a combo box. The kind never changes while
+/// the view lives.
 std::shared_ptr<WidgetNode> makeView(QWidget& widget, const std::shared_ptr<Desk>& desk,
                                      Widget keptBy);
 
@@ -31,19 +32,19 @@ class ControlNode : public WidgetNode {
  public:
   using WidgetNode::WidgetNode;
 
-  /// Null when there is none or it is gone.
+  /// The target; null if there is none or it is gone.
   std::shared_ptr<Responder> target() const { return target_.lock(); }
-  /// Empty when there is none.
+  /// The action; empty if there is none.
   const std::string& action() const { return action_; }
-  /// The value that it shows or, where it shows none, keeps.
+  /// The value that the control shows; a control that shows none only stores it.
   virtual AttributedString value() const { return value_; }
 
  protected:
   virtual void setValue(const AttributedString& value) { value_ = value; }
-  /// As `Control::sendAction`; nobody performs an empty action.
+  /// As `Control::sendAction`; an empty action is not performed.
   bool send(std::string_view action, const std::shared_ptr<Responder>& target);
 
-  std::weak_ptr<Responder> target_;  // its own maker's
+  std::weak_ptr<Responder> target_;  // owned by the code that made it
   std::string action_;
 
  private:
@@ -59,7 +60,7 @@ class QtView : public Role, public Node {
   Tag tag() const final { return this->readTag(); }
   void setTag(Tag tag) final { this->writeTag(tag); }
   Rect frame() const final { return this->readFrame(); }
-  // The list follows the widgets, which nobody tells of.
+  // The list is read from the widgets, which do not report changes.
   const Subviews& subviews() const final { return const_cast<QtView*>(this)->readSubviews(); }
   void addSubview(const Ref<View>& view) final { this->insert(view); }
   bool needsDisplay() const final { return this->isRedrawPending(); }
@@ -110,9 +111,9 @@ class QtControl : public QtView<Role, ControlNode> {
   }
 
  protected:
-  // A target hears of the clicks in place of the host.
+  // Takes the clicks away from the host when a target is set.
   virtual void takeClicks() {}
-  // An action without a target is sent beside what the host does.
+  // Listens for clicks. An action without a target is sent in addition to the host's reaction.
   virtual void hearClicks() {}
 };
 
@@ -137,7 +138,7 @@ class QtButton final : public QtControl<Button> {
   void hearClicks() override;
   void clicked();
 
-  State heldState_ = State::off;  // of a button that cannot be checked: nothing of it shows
+  State heldState_ = State::off;  // for a button that is not checkable; it is not shown
   QMetaObject::Connection clicks_;
 };
 
@@ -153,10 +154,10 @@ class QtTextField final : public QtControl<TextField> {
  private:
   void setValue(const AttributedString& value) override;
 
-  std::weak_ptr<Responder> delegate_;  // its own maker's
+  std::weak_ptr<Responder> delegate_;  // owned by the code that made it
 };
 
-/// Anything else. Whatever takes the user's input can be enabled and disabled.
+/// Any other view. It can be enabled and disabled if its widget takes input.
 class QtOtherView final : public QtView<View> {
  public:
   using QtView::QtView;
@@ -164,8 +165,8 @@ class QtOtherView final : public QtView<View> {
   void setEnabled(bool enabled) override;
 };
 
-/// Shows its image as scripts ask for, with no frame, in the middle, shrunk to fit; there are no
-/// other frames, scalings and alignments.
+/// Shows its image as scripts require: no frame, centred, shrunk to fit. Other frames, scalings and
+/// alignments are not supported.
 class QtImageView final : public QtControl<ImageView> {
  public:
   using QtControl::QtControl;

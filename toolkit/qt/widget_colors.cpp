@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Text is coloured through the widget's palette.
+// Colours text through the widget's palette.
 
 #include "toolkit/qt/widget_colors.hpp"
 

@@ -11,8 +11,8 @@ class QWidget;
 
 namespace toolkit::qt {
 
-/// Has `widget` draw its text in a colour, half as strong where it is disabled, until `restore`
-/// gives it back what it had. Not at the end: that may be within the widget's own.
+/// Makes `widget` draw its text in a colour, half as strong if disabled, until `restore` puts its
+/// former colours back. The destructor does not restore: it may run during the widget's own.
 class WidgetColors {
  public:
   WidgetColors(QWidget& widget, QPalette::ColorRole text, const Color& color);

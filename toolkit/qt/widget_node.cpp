@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The tree of widgets as a tree of views. Qt owns the widgets; a view that is in none, as a host
-// took it out or a script has not put it in yet, ends its widget itself.
+// Presents the tree of widgets as a tree of views. Qt owns the widgets; a view without a superview,
+// removed from it or not yet inserted, deletes its widget itself.
 
 #include "toolkit/qt/widget_node.hpp"
 
@@ -25,7 +25,7 @@ bool isSubview(const QObject* child) {
   return child->isWidgetType() && !static_cast<const QWidget*>(child)->isWindow();
 }
 
-/// Whether the widgets are the subviews of `parent`, in their order.
+/// True if `widgets` are exactly the subviews of `parent`, in their order.
 bool areSubviewsOf(const QWidget& parent, const std::vector<QPointer<QWidget>>& widgets) {
   auto next = widgets.begin();
   for (const QObject* const child : parent.children()) {
@@ -38,12 +38,12 @@ bool areSubviewsOf(const QWidget& parent, const std::vector<QPointer<QWidget>>& 
 
 }  // namespace
 
-// What happens to the widget without this toolkit's doing.
+// Watches for changes of the widget that this toolkit does not make.
 class WidgetNode::Watch final : public QObject {
  public:
   explicit Watch(WidgetNode& node) : node_(node) { beFirst(); }
 
-  /// To be asked before whoever takes over the widget's painting.
+  /// Moves this filter before the one that takes over the widget's painting.
   void beFirst() { node_.widget_->installEventFilter(this); }
 
   bool eventFilter(QObject*, QEvent* event) override {
@@ -64,7 +64,7 @@ WidgetNode::WidgetNode(QWidget& widget, std::shared_ptr<Desk> desk, Widget keptB
       hadTag_(widget.property(tagProperty).isValid()),
       watch_(std::make_unique<Watch>(*this)) {}
 
-// Not at once: this may come about in an event of the widget's own.
+// Deletes the widget later, because this may run during one of the widget's own events.
 WidgetNode::~WidgetNode() {
   desk_->forgetView(key_);
   if (widget_ && keptBy_ == Widget::view && !widget_->parentWidget()) widget_->deleteLater();
@@ -142,7 +142,7 @@ void WidgetNode::insert(const Ref<View>& view) {
   if (&added == widget_ || added.isAncestorOf(widget_))
     refuse(receiver, "the view is the superview itself, or lies around it");
 
-  // The reference may be one of the list that it leaves now.
+  // The reference may be an element of the list that the view now leaves.
   // NOLINTNEXTLINE(performance-unnecessary-copy-initialization)
   const Ref<View> kept = view;
   const Rect frame = node->readFrame();
@@ -151,7 +151,7 @@ void WidgetNode::insert(const Ref<View>& view) {
   node->place(frame);
   added.raise();
   added.setVisible(!hidden);
-  // At the end, where it belongs, so that it is owned; whatever else has changed is seen later.
+  // Appended here so that it is owned; other changes of the list are noticed later.
   subviews_.push_back(kept);
   listed_.emplace_back(&added);
   changed();
@@ -177,7 +177,7 @@ bool WidgetNode::isHidden() const {
   return isOutside() ? hiddenOutside_ : widget_->isHidden();
 }
 
-// Outside of any other, Qt would show it as a window of its own.
+// Only remembers the state of a view without a superview: Qt would show it as a separate window.
 void WidgetNode::hide(bool hidden) {
   if (!widget_) return;
   if (hidden) giveFocusAway(*widget_);

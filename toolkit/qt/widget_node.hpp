@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
-// What all views of the Qt toolkit have in common, whatever their role: the widget that each stands
-// for. `QtView` joins it to a role.
+// What all views of the Qt toolkit have in common, whatever their role: the widget behind each.
+// `QtView` joins a node to a role.
 //
-// Invariants: a widget has one view at a time; the view outlives the widget as one that is not
-// there any more, of which every question is answered with zero and every change does nothing. What
-// a view hangs on its widget to work goes with the view; what a script shows there stays.
+// Invariants: a widget has one view at a time. A view may outlive its widget; then every question
+// returns zero and every change does nothing. Helper objects that a view attaches to its widget end
+// with the view; what a script has shown there stays.
 #pragma once
 
 #include <QPointer>
@@ -20,13 +20,13 @@
 
 namespace toolkit::qt {
 
-/// The dynamic property of a widget that is its tag, a whole number. Without it the tag is 0.
+/// The dynamic property of a widget that holds its tag, a whole number. Without it the tag is 0.
 inline constexpr const char* tagProperty = "qzTag";
-/// The dynamic property that makes a label an image view when it is set to true, also while it
-/// shows no pixmap.
+/// The dynamic property that makes a label an image view if it is true, even while the label shows
+/// no pixmap.
 inline constexpr const char* imageViewProperty = "qzImageView";
 
-/// Who ends a widget that lies in no other.
+/// Who deletes a widget that has no parent.
 enum class Widget { host, view };
 
 class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
@@ -36,19 +36,20 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   WidgetNode(const WidgetNode&) = delete;
   WidgetNode& operator=(const WidgetNode&) = delete;
 
-  /// The node of `view`; null when it is absent or another toolkit's.
+  /// Returns the node of `view`; null if it is absent or another toolkit's.
   static std::shared_ptr<WidgetNode> of(const Ref<View>& view);
-  /// The view that this is the node of.
+  /// Returns the view of this node.
   Ref<View> view();
-  /// The widget, or null when it is gone.
+  /// Returns the widget; null if it is gone.
   QWidget* widget() const { return widget_; }
 
-  /// Puts it to `frame` of its superview; remembered exactly until the host moves it.
+  /// Moves the widget to `frame` in its superview. The exact frame is remembered until the host
+  /// moves the widget.
   void place(const Rect& frame);
-  /// Takes it out of its superview; from then on it ends with its view.
+  /// Takes the widget out of its superview; from then on the widget ends with its view.
   void removeFromSuperview();
   bool isHidden() const;
-  /// The view around it, or absent.
+  /// Returns the superview; absent if there is none.
   Ref<View> superview() const;
 
  protected:
@@ -59,12 +60,12 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   void writeTag(Tag tag);
   Rect readFrame() const;
   const Subviews& readSubviews();
-  /// As `View::addSubview`. Raises an invalid-argument exception, changing nothing, when `view` is
-  /// absent, another toolkit's, a window's content view, or this view or one around it.
+  /// As `View::addSubview`. Raises an invalid-argument exception, and changes nothing, if `view` is
+  /// absent, another toolkit's, a window's content view, this view or one of its superviews.
   void insert(const Ref<View>& view);
   void hide(bool hidden);
   void enable(bool enabled);
-  /// Something that shows has changed: a redraw is pending until the next painting.
+  /// Marks a visible change: a redraw is pending until the next paint event.
   void changed();
   bool isRedrawPending() const { return widget_ && isRedrawPending_; }
   QPointer<QWidget> widget_;
@@ -74,21 +75,21 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   class Watch;
   struct Placement {
     Rect frame;      // as asked for
-    QRect geometry;  // what Qt has made of it
+    QRect geometry;  // the widget's geometry after that
     int areaHeight;  // of the superview
   };
 
-  bool isOutside() const;  // of any other, and no window either
+  bool isOutside() const;  // has no superview, and is not a window
   bool isWhereItWasPut() const;
 
   const QWidget* const key_;  // in the desk's table
   Widget keptBy_;
-  bool hadTag_;                 // before this toolkit saw it
-  bool hiddenOutside_ = false;  // as it will be when it lies in another
+  bool hadTag_;                 // before this view was made
+  bool hiddenOutside_ = false;  // applies when it is inserted again
   std::optional<Placement> placement_;
   Subviews subviews_;
   std::vector<QPointer<QWidget>> listed_;  // the widgets of `subviews_`; null once they are gone
-  mutable std::optional<Tag> tag_;         // as read last, for every search reads them all
+  mutable std::optional<Tag> tag_;         // cached, because every search reads all tags
   bool isRedrawPending_ = false;
   std::unique_ptr<Watch> watch_;
 };

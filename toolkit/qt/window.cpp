@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Windows as they come and go, and sheets. Whatever hides a sheet but this toolkit itself, such as
-// Escape, the close button, or a dialog's own buttons, ends it with the code 0.
+// Windows and sheets. A sheet that is hidden by anything but this toolkit, such as Escape, the
+// close button or a dialog's own buttons, ends with code 0.
 
 #include "toolkit/qt/window.hpp"
 
@@ -20,7 +20,7 @@ namespace toolkit::qt {
 
 namespace {
 
-// What a user's cancelling means (`NSModalResponseCancel`).
+// The code of a sheet that the user cancels (`NSModalResponseCancel`).
 constexpr long cancelled = 0;
 
 Rect onScreen(const QWidget& widget, const Rect& rect) {
@@ -43,7 +43,7 @@ Qt::WindowFlags flagsOf(StyleMask style) {
 
 }  // namespace
 
-// What happens to the widget without this toolkit's doing.
+// Watches for changes of the widget that this toolkit does not make.
 class QtWindow::Watch final : public QObject {
  public:
   explicit Watch(QtWindow& window) : window_(window) { window.widget_->installEventFilter(this); }
@@ -54,12 +54,12 @@ class QtWindow::Watch final : public QObject {
         ++window_.closes_;
         break;
       case QEvent::Hide:
-        // Its consequences may end the window, which Qt is still busy hiding.
+        // Queued, because its effects may delete the window while Qt is still hiding it.
         if (!event->spontaneous())
           QMetaObject::invokeMethod(
               this, [this] { window_.wasHidden(); }, Qt::QueuedConnection);
         break;
-      // Before the window is first seen it is the desktop that moves it.
+      // Before the first painting it is the desktop that moves the window.
       case QEvent::Move:
       case QEvent::Resize:
         if (!painted_) window_.settled_ = window_.widget_->geometry();
@@ -96,14 +96,14 @@ std::shared_ptr<QtWindow> QtWindow::make(QWidget& widget, const std::shared_ptr<
 
 std::shared_ptr<QtWindow> QtWindow::make(const Rect& content, StyleMask style,
                                          const std::shared_ptr<Desk>& desk, KeptBy keptBy) {
-  auto* const widget = new QWidget(nullptr, flagsOf(style));  // ends in our destructor
+  auto* const widget = new QWidget(nullptr, flagsOf(style));  // deleted in ~QtWindow
   auto window = make(*widget, desk, keptBy);
   widget->setGeometry(rounded(onScreen(*widget, content)));
   window->asked_ = content;
   return window;
 }
 
-// Not at once: this may come about in an event of the widget's own.
+// Deletes the widget later, because this may run during one of the widget's own events.
 QtWindow::~QtWindow() {
   watch_.reset();
   detach();
@@ -135,7 +135,7 @@ void QtWindow::show() {
     widget_->showNormal();
   else
     widget_->show();
-  // Off the screen windows have no order, and Qt complains of being asked for one.
+  // Windows off the screen have no order, and Qt prints a warning about raise().
   if (QGuiApplication::platformName() != "offscreen") widget_->raise();
   widget_->activateWindow();
 }
@@ -157,7 +157,7 @@ void QtWindow::orderOut() {
   if (parent && parent->widget_ && parent->widget_->isVisible()) parent->widget_->activateWindow();
 }
 
-// A window that has never been on the screen is closed all the same, without Qt.
+// Closing counts once even if Qt sends no close event, as for a window that was never shown.
 void QtWindow::close() {
   const auto kept = shared_from_this();
   const int before = closes_;
@@ -191,13 +191,13 @@ void QtWindow::beginAsSheet(const std::shared_ptr<QtWindow>& parent,
                             const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo) {
   detach();
   session_ = Session{delegate, contextInfo};
-  // A window that is attached to itself, in however many steps, could never be used again.
+  // A window attached to itself, even through other windows, could never be used again.
   bool isItsOwn = false;
   for (auto above = parent; above; above = above->sheetParent()) isItsOwn |= above.get() == this;
   if (parent && !isItsOwn) {
     sheetParent_ = parent;
     if (widget_ && parent->widget_) {
-      widget_->hide();  // modality is settled when a window is shown
+      widget_->hide();  // modality takes effect when a window is shown
       place_ = std::make_unique<SheetPlace>(*widget_, *parent->widget_);
     }
   }

@@ -2,7 +2,7 @@
 // The Qt toolkit's windows, which are also its sheets.
 //
 // A sheet is a window-modal window in front of its parent, at the top edge of the parent's content.
-// What that changes about the window ends when it is no sheet any more.
+// Changes that this makes to the window are undone when it stops being a sheet.
 #pragma once
 
 #include <QPointer>
@@ -20,61 +20,62 @@ namespace toolkit::qt {
 
 class SheetPlace;
 
-/// Who keeps a window alive: the host, or who asked the driver or the application for it; the
-/// application also does while it is on the screen.
+/// Who keeps a window alive: the host, or the code that asked the driver or the application for the
+/// window; `application` also keeps it while it is on the screen.
 enum class KeptBy { host, maker, application };
 
 class QtWindow final : public Window, public std::enable_shared_from_this<QtWindow> {
  public:
-  /// The window of a top-level widget. Unless it is the host's, the widget ends with the window.
+  /// Makes the window of a top-level widget. The widget ends with the window, unless the host keeps
+  /// it.
   static std::shared_ptr<QtWindow> make(QWidget& widget, const std::shared_ptr<Desk>& desk,
                                         KeptBy keptBy);
-  /// A new window, not yet shown, of the content rectangle in screen coordinates.
+  /// Makes a new window, not yet shown, with the content rectangle in screen coordinates.
   static std::shared_ptr<QtWindow> make(const Rect& content, StyleMask style,
                                         const std::shared_ptr<Desk>& desk, KeptBy keptBy);
   ~QtWindow() override;
   QtWindow(const QtWindow&) = delete;
   QtWindow& operator=(const QtWindow&) = delete;
 
-  /// `window` as a window of this toolkit; null when it is absent or another toolkit's.
+  /// Returns `window` as a window of this toolkit; null if it is absent or another toolkit's.
   static std::shared_ptr<QtWindow> of(const Ref<Window>& window);
-  /// The widget, or null when it is gone.
+  /// Returns the widget; null if it is gone.
   QWidget* widget() const { return widget_; }
 
-  /// Of a main window its central widget's view, of any other the widget's own. Absent when that is
-  /// gone.
+  /// Returns the view of a main window's central widget; for other windows, that of the widget
+  /// itself. Absent if that widget is gone.
   Ref<View> contentView() const override;
   std::shared_ptr<Responder> delegate() const override { return delegate_.lock(); }
   void setDelegate(const std::shared_ptr<Responder>& delegate) override { delegate_ = delegate; }
   void setBackgroundColor(const Color& color) override;
   void makeKeyAndOrderFront() override;
   void orderOut() override;
-  /// Closes the widget, which its host can refuse, and which ends it if the host wants that.
+  /// Closes the widget. Its host can refuse that, or have the widget deleted on close.
   void close() override;
 
-  /// The content rectangle in screen coordinates: the one that it was made with, until somebody
-  /// moves the window.
+  /// Returns the content rectangle in screen coordinates: exactly as requested until somebody moves
+  /// or resizes the window.
   Rect content() const;
-  /// How often it was closed, by whomever.
+  /// Returns how often it was closed, by the engine, the host or the user.
   int closes() const { return closes_; }
 
-  /// Shows it attached to `parent`, which may be null. A window is never its own sheet's sheet:
-  /// then it is shown on its own. Begun again before it was ended, only the latest delegate is
-  /// told.
+  /// Shows the window attached to `parent`, which may be null. If that would attach the window to
+  /// itself, even indirectly, shows it unattached. If it begins again before its end, only the
+  /// latest delegate is told.
   void beginAsSheet(const std::shared_ptr<QtWindow>& parent,
                     const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo);
-  /// Tells the delegate if its showing as a sheet was not ended before, also when it is off the
-  /// screen by now. It stays where it is.
+  /// Ends the sheet and tells the delegate, unless the sheet has ended already. Tells it even if
+  /// the window is off the screen. Does not hide the window.
   void endAsSheet(long returnCode);
-  /// The window that it is attached to as a sheet, or null.
+  /// Returns the window that it is attached to as a sheet; null if none.
   std::shared_ptr<QtWindow> sheetParent() const { return sheetParent_.lock(); }
-  /// The return codes of all ends asked for, in order.
+  /// Returns the return codes of all requested ends, in order.
   const std::vector<long>& sheetEnds() const { return sheetEnds_; }
 
  private:
   class Watch;
   struct Session {
-    std::weak_ptr<SheetDelegate> delegate;  // its own maker's
+    std::weak_ptr<SheetDelegate> delegate;  // owned by the code that made it
     void* contextInfo;
   };
 
@@ -89,13 +90,13 @@ class QtWindow final : public Window, public std::enable_shared_from_this<QtWind
   const QWidget* const key_;  // in the desk's table
   KeptBy keptBy_;
   std::unique_ptr<Watch> watch_;
-  mutable Ref<View> content_;                // owned, so that the views last as long as the window
-  mutable QPointer<QWidget> contentWidget_;  // whose view that is
-  std::weak_ptr<Responder> delegate_;        // its own maker's
-  std::optional<Rect> asked_;                // the content rectangle that it was made with
-  std::optional<QRect> settled_;             // what the desktop made of it at the first showing
+  mutable Ref<View> content_;                // owned, so that the views live as long as the window
+  mutable QPointer<QWidget> contentWidget_;  // the widget of `content_`
+  std::weak_ptr<Responder> delegate_;        // owned by the code that made it
+  std::optional<Rect> asked_;                // the requested content rectangle
+  std::optional<QRect> settled_;             // its geometry once first shown
   int closes_ = 0;
-  std::weak_ptr<QtWindow> sheetParent_;  // its own keeper's
+  std::weak_ptr<QtWindow> sheetParent_;  // owned by its keeper
   std::unique_ptr<SheetPlace> place_;    // while it is attached
   std::optional<Session> session_;       // from the beginning of a sheet to its end
   std::vector<long> sheetEnds_;

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// A window's palette, from which the widgets in it take what they have no colour of their own for.
+// Sets a window's palette. Child widgets inherit every colour they do not set.
 
 #include "toolkit/qt/window_look.hpp"
 

@@ -10,11 +10,11 @@ class QWidget;
 
 namespace toolkit::qt {
 
-/// Gives the window a background colour, and to what has no colour of its own in it (labels, check
-/// boxes, links) one that reads well there: by a contrast of at least 4.5 : 1, as WCAG's level AA
-/// asks for.
+/// Gives the window a background colour. Widgets in it without colours of their own (labels, check
+/// boxes, links) get a text colour that is readable there: contrast at least 4.5 : 1, WCAG level
+/// AA.
 void setWindowColor(QWidget& window, const Color& color);
-/// The background as it shows.
+/// Returns the visible background colour.
 Color windowColor(const QWidget& window);
 
 }  // namespace toolkit::qt

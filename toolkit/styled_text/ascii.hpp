@@ -9,7 +9,7 @@
 
 namespace toolkit {
 
-/// The bytes of `utf8` in ASCII; absent if it has a character that ASCII lacks.
+/// Returns `utf8` as ASCII bytes; absent if it has a character that ASCII lacks.
 inline std::optional<std::string> asciiBytes(std::string_view utf8) {
   const bool ascii = std::all_of(utf8.begin(), utf8.end(),
                                  [](char c) { return static_cast<unsigned char>(c) < 0x80; });

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Every change goes through `push`, which keeps the invariants of the runs: it drops what is empty
-// and lengthens the last run instead of adding an equal neighbour.
+// Every change uses `push`, which keeps the invariants of the runs: it drops empty runs and extends
+// the last run instead of adding an equal neighbour.
 #include "toolkit/styled_text/attributed_string.hpp"
 
 #include <algorithm>
@@ -29,7 +29,8 @@ void requireRange(TextRange range, std::size_t length) {
                        "} out of bounds; text length " + std::to_string(length));
 }
 
-/// `runs` with the attribute at `member` set to `value` over `range`, which lies within the text.
+/// Returns `runs` with the attribute at `member` set to `value` over `range`, which must lie within
+/// the text.
 template <class Attribute>
 std::vector<TextRun> withAttribute(const std::vector<TextRun>& runs,
                                    std::optional<Attribute> TextAttributes::*member,

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Attributed strings: text with attributes that hold over ranges of it.
+// Attributed strings: text with attributes over ranges of it.
 //
 // Invariants: the runs cover the text without gap or overlap, in order; none is empty; two
 // neighbours differ in their attributes. Positions and lengths count bytes of the UTF-8 text, and
@@ -25,16 +25,16 @@ enum class TextAlignment : int { left = 0, right = 1, center = 2, justified = 3,
 struct ParagraphStyle {
   TextAlignment alignment = TextAlignment::natural;
   double firstLineHeadIndent = 0;
-  double headIndent = 0;  ///< of the other lines; where it is the greater, the first line hangs
+  double headIndent = 0;  ///< of the other lines; if greater, the first line hangs
 
   friend bool operator==(const ParagraphStyle&, const ParagraphStyle&) = default;
 };
 
-/// The address that a click on a link opens. Copies share one text: however long it is, the runs
-/// that a link falls into cost no more.
+/// The address that a click on a link opens. Copies share one text, so splitting a link into runs
+/// costs nothing extra, however long the address.
 class Link {
  public:
-  // Both convert, so that an address can be assigned where a link is asked for.
+  // Implicit, so that an address can be assigned to a link.
   Link(std::string address) : address_(std::make_shared<const std::string>(std::move(address))) {}
   Link(const char* address) : Link(std::string(address)) {}
 
@@ -49,7 +49,7 @@ class Link {
   std::shared_ptr<const std::string> address_;
 };
 
-/// The attributes of a run; an absent one leaves the choice to whoever draws the text.
+/// The attributes of a run. The widget that draws the text chooses the absent ones.
 struct TextAttributes {
   std::optional<Font> font{};
   std::optional<Color> foregroundColor{};
@@ -58,7 +58,7 @@ struct TextAttributes {
   std::optional<Link> link{};
   bool underline = false;
   bool strikethrough = false;
-  int superscript = 0;  ///< steps above the base line; negative below it
+  int superscript = 0;  ///< steps above the baseline; negative: below it
 
   friend bool operator==(const TextAttributes&, const TextAttributes&) = default;
 };
@@ -86,17 +86,16 @@ class AttributedString {
   std::size_t length() const { return text_.size(); }
   const std::vector<TextRun>& runs() const { return runs_; }
 
-  /// Adds `text` behind what there is, all of it with `attributes`.
+  /// Appends `text` with `attributes`.
   void append(std::string_view text, const TextAttributes& attributes);
 
-  /// Changes between these two are one edit: whoever shows the text sees only the whole of it.
+  /// Makes the changes between these calls one edit: readers of the text see only the final result.
   /// Edits nest. An `endEditing` without its `beginEditing` raises a range exception.
   void beginEditing();
   void endEditing();
 
-  /// Sets one attribute over `range`, leaving the others. An absent value raises an
-  /// invalid-argument exception; a range beyond the text's end raises a range exception. Neither
-  /// changes anything.
+  /// Sets one attribute over `range`, leaving the others. Raises an invalid-argument exception for
+  /// an absent value and a range exception for a range beyond the text's end; then nothing changes.
   void addFont(const std::optional<Font>& font, TextRange range);
   void addForegroundColor(const std::optional<Color>& color, TextRange range);
   void addParagraphStyle(const std::optional<ParagraphStyle>& style, TextRange range);

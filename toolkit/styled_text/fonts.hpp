@@ -8,13 +8,13 @@
 
 namespace toolkit {
 
-/// A font as text asks for it.
+/// The font that a text requests.
 struct Font {
   std::string family;  ///< such as "Times"
   double size = 12;    ///< points
   bool bold = false;
   bool italic = false;
-  bool fixedPitch = false;  ///< every character is equally wide
+  bool fixedPitch = false;  ///< all characters have the same width
 
   friend bool operator==(const Font&, const Font&) = default;
 };
@@ -24,13 +24,13 @@ class Fonts {
  public:
   virtual ~Fonts() = default;
 
-  /// The font named `name` (a family, or a family with "-Bold", "-Italic", "-BoldItalic" or the
-  /// oblique forms behind it) at `size` points; size 0 is the default size, 12. Absent when the
-  /// toolkit knows no font of that name.
+  /// Returns the font named `name` at `size` points. `name` is a family, with or without the suffix
+  /// "-Bold", "-Italic", "-BoldItalic" or an oblique form. Size 0 is the default size, 12. Absent
+  /// if the toolkit has no font of that name.
   virtual std::optional<Font> fontWithName(std::string_view name, double size) const = 0;
 };
 
-/// The size, in points, of a font that is asked for at size 0.
+/// The size, in points, of a font requested at size 0.
 inline constexpr double defaultFontSize = 12;
 
 }  // namespace toolkit

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The rules by which tags open and close elements are those of browsers, in the main: a paragraph
-// ends where a block begins, an item where the next does, formatting outlives the block it is in.
+// Tags open and close elements mostly as in browsers: a paragraph ends where a block begins, an
+// item ends where the next begins, and formatting survives its block.
 #include "toolkit/styled_text/html_builder.hpp"
 
 #include <algorithm>
@@ -14,14 +14,14 @@
 namespace toolkit::html {
 namespace {
 
-/// Deeper elements take the place of their parents, as in browsers: what a tag costs is bounded.
+/// Deeper elements replace their parents, as in browsers. This bounds the cost of a tag.
 constexpr std::size_t maxDepth = 256;
 constexpr std::size_t maxSuspended = 16;
 
 constexpr TagSet paragraphs = tags::headings | TagSet{Tag::li, Tag::p};
 constexpr TagSet partsOfTables = tags::cells | tags::rowGroups | TagSet{Tag::caption, Tag::tr};
 
-/// Where the search for the element that the end tag closes ends.
+/// The elements at which the search for the element that an end tag closes stops.
 TagSet barriersOf(Tag tag) {
   if (tag == Tag::table) return {};
   if (partsOfTables.contains(tag)) return {Tag::table};
@@ -29,7 +29,7 @@ TagSet barriersOf(Tag tag) {
   return tags::blocks.contains(tag) ? tags::scopes : tags::blocks | tags::scopes;
 }
 
-/// What holds the part of a table itself, rather than more of its kind.
+/// The elements that can hold this part of a table.
 TagSet holdersOf(Tag part) {
   if (tags::cells.contains(part)) return tags::tableParts;
   if (part == Tag::tr) return tags::rowGroups | TagSet{Tag::table};
@@ -58,7 +58,7 @@ void Builder::startTag(Tag tag, const Attributes& attributes) {
     inHead_ = !isPastHead_;
     return;
   }
-  endHead();  // what may not stand in a head ends it
+  endHead();  // a tag that is not allowed in a head ends it
   switch (tag) {
     case Tag::br:
       breakLine();
@@ -87,13 +87,13 @@ void Builder::endTag(Tag tag) {
     breakLine();
   } else if (tag == Tag::p) {
     endHead();
-    // Without its start tag it is an empty paragraph.
+    // Without its start tag it makes an empty paragraph.
     if (!closeNearest({tag}, tags::scopes)) flow_.startBlock(style());
   } else if (tags::headings.contains(tag)) {
     closeNearest(tags::headings, tags::scopes);
   } else if (tags::formatting.contains(tag)) {
     endFormatting(tag);
-  } else if (tag != Tag::body) {  // the end of which is the document's
+  } else if (tag != Tag::body) {  // which ends with the document
     closeNearest({tag}, barriersOf(tag));
   }
 }
@@ -104,7 +104,7 @@ void Builder::addText(std::string_view bytes) {
   std::string read;
   if (!isPlain(bytes)) bytes = read = decoded(bytes, ReferencePlace::text);
   if (!isPastHead_ && !isWhiteSpace(bytes)) endHead();
-  // Between a table's parts there is no text, only their layout in the document.
+  // White space between the parts of a table is source layout, not text.
   if (tags::tableParts.contains(elements_.back().tag) && isWhiteSpace(bytes)) return;
   if (dropsNewLine) {
     if (bytes.starts_with('\r')) bytes.remove_prefix(1);
@@ -124,7 +124,7 @@ AttributedString Builder::finish() {
   return flow_.take();
 }
 
-/// Of several bodies that say so, the first counts.
+/// If several bodies set a colour, the first one counts.
 void Builder::colorLinks(const Attributes& body) {
   for (const Attribute name : {Attribute::link, Attribute::vlink}) {
     const auto value = linksColored_ ? std::nullopt : body[name];
@@ -171,7 +171,7 @@ Builder::Element Builder::pop() {
   return element;
 }
 
-/// Closes what the start of such an element ends.
+/// Closes the elements that the start of a `tag` element ends.
 void Builder::closeForStart(Tag tag) {
   if (tags::blocks.contains(tag)) closeNearest({Tag::p}, tags::scopes);
   if (tags::headings.contains(tag)) closeNearest(tags::headings, tags::blocks | tags::scopes);
@@ -183,7 +183,7 @@ void Builder::closeForStart(Tag tag) {
   if (partsOfTables.contains(tag)) closeForTablePart(tag);
 }
 
-/// Closes all that is open within the table, group or row that is to hold the part.
+/// Closes the open elements inside the table, group or row that will hold `part`.
 void Builder::closeForTablePart(Tag part) {
   const Position holder = nearest(holdersOf(part));
   if (holder != 0) {
@@ -199,7 +199,7 @@ bool Builder::closeNearest(const TagSet& wanted, const TagSet& barriers) {
   return found != 0;
 }
 
-/// Closes the element at `first` and those within it, of which formatting is only suspended.
+/// Closes the element at `first` and those inside it; formatting is only suspended.
 void Builder::closeFrom(Position first) {
   while (elements_.size() > first) {
     Element element = pop();
@@ -211,13 +211,13 @@ void Builder::closeFrom(Position first) {
   }
 }
 
-/// Writes what the end of an element, which is no longer among the open ones, calls for.
+/// Writes the text for the end of an element that is already removed from the open ones.
 void Builder::leave(const Element& element) {
   if (element.tag == Tag::q) {
     const bool outer = countOpen({Tag::q}) % 2 == 0;
     flow_.addCharacters(outer ? "\u201D" : "\u2019", element.style);
   } else if (element.tag == Tag::li || element.tag == Tag::tr) {
-    flow_.endLine(element.style);  // even if there was nothing but the marker, or empty cells
+    flow_.endLine(element.style);  // even if there was only the marker, or empty cells
   } else if (tags::blocks.contains(element.tag)) {
     flow_.startBlock(element.style);
   }
@@ -234,8 +234,8 @@ void Builder::endFormatting(Tag tag) {
   }
 }
 
-/// A tag left open in a paragraph may be left open in thousands. Of more than three alike the outer
-/// ones end, as in browsers, and of more than are ever meant.
+/// Keeps at most three alike, as browsers do, and `maxSuspended` in all, because a tag left open in
+/// a paragraph may be left open in thousands. The outer ones end.
 void Builder::suspend(Element formatting) {
   const auto alike =
       std::count_if(suspended_.begin(), suspended_.end(), [&formatting](const Element& element) {
@@ -259,7 +259,7 @@ void Builder::restyleFrom(Position first) {
   }
 }
 
-/// Writes what the start of an element, which is open by now, calls for.
+/// Writes the text for the start of an element that is already open.
 void Builder::enter(Tag tag, const Attributes& attributes) {
   if (tags::lists.contains(tag)) {
     startList(attributes);
@@ -295,7 +295,7 @@ void Builder::startItem(const Attributes& attributes) {
   ++list.number;
 }
 
-/// Parts the cell from the one in front of it: by a tab, unless that has ended its line.
+/// Separates the cell from the previous one with a tab, unless the previous one has ended its line.
 void Builder::startCell() {
   const Position holder = nearest(tags::tableParts);
   if (holder == 0) return;
@@ -316,7 +316,7 @@ void Builder::writeImage() {
   flow_.addCharacters("\uFFFC", style());
 }
 
-/// A rule has no characters: it is an empty line.
+/// Writes a rule, which has no characters, as an empty line.
 void Builder::writeRule() {
   closeNearest({Tag::p}, tags::scopes);
   flow_.startBlock(style());

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: MIT
-// Turns a document's tags and text into styled text: which elements are open, what a tag closes
-// besides, what each writes.
+// Turns a document's tags and text into styled text: tracks the open elements, closes those that a
+// tag closes implicitly, and writes what each stands for.
 //
-// Where elements overlap, formatting goes on: in `<b><i></b>x</i>` x is in italics, and in
-// `<p><i></p><p>x</i></p>` it is as well. So the end tag of formatting takes its element out from
-// under those within it, and any other end tag suspends the formatting that it closes, until the
-// next text resumes it.
+// Formatting survives overlapping elements: in `<b><i></b>x</i>` x is italic, and in
+// `<p><i></p><p>x</i></p>` it is too. So the end tag of formatting removes its element and keeps
+// those inside. Any other end tag suspends the formatting that it closes, until the next text
+// resumes it.
 #pragma once
 
 #include <cstddef>
@@ -30,11 +30,11 @@ class Builder {
   void endTag(Tag tag);
   void addText(std::string_view bytes);
 
-  /// Closes what is open. The builder is done with.
+  /// Closes the open elements and returns the text. The builder must not be used afterwards.
   AttributedString finish();
 
  private:
-  /// How the items of a list are marked, and the number of the next.
+  /// How a list marks its items, and the number of the next item.
   struct List {
     MarkerKind marker = MarkerKind::disc;
     std::int64_t number = 1;
@@ -48,15 +48,16 @@ class Builder {
 
   struct Element {
     Tag tag = Tag::unknown;
-    /// On the heap, for styles point to what they hold.
+    /// On the heap, because styles point into it.
     std::unique_ptr<const Declarations> declarations;
     Style style;
-    List list;                              ///< of a list
-    Row row;                                ///< of a row
-    std::vector<Element> suspendedOutside;  ///< of a cell: it begins with nothing suspended
+    List list;                              ///< for a list
+    Row row;                                ///< for a row
+    std::vector<Element> suspendedOutside;  ///< for a cell or caption
   };
 
-  /// The position of an open element. The document itself, at 0, is never looked for: 0 is "none".
+  /// The position of an open element. 0 means "none": it is the document itself, which is never
+  /// searched for.
   using Position = std::size_t;
 
   void endHead();
@@ -89,13 +90,13 @@ class Builder {
   const Style& style() const { return elements_.back().style; }
 
   StyleSource source_;
-  std::vector<Element> elements_;   // the open ones, the document first
-  std::vector<Element> suspended_;  // formatting, the innermost first
+  std::vector<Element> elements_;   // the open elements; the document comes first
+  std::vector<Element> suspended_;  // suspended formatting, innermost first
   TextFlow flow_;
   bool inHead_ = false;
-  bool isPastHead_ = false;    // the body has begun: a head is a stray tag from here
-  bool linksColored_ = false;  // a body has said which colour links have
-  bool dropsNewLine_ = false;  // directly behind <pre>
+  bool isPastHead_ = false;    // the body has begun; a later head is stray
+  bool linksColored_ = false;  // a body has set the links' colour
+  bool dropsNewLine_ = false;  // directly after <pre>
 };
 
 }  // namespace toolkit::html

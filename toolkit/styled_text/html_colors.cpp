@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The colour names of CSS, and the reading of colours.
+// The colour names of CSS, and how colours are read.
 #include "toolkit/styled_text/html_colors.hpp"
 
 #include <algorithm>
@@ -18,7 +18,7 @@ struct NamedColor {
   std::uint32_t rgb;
 };
 
-// CSS Color Module Level 3, chapter 4.3; the sixteen of HTML 4 are among them.
+// CSS Color Module Level 3, section 4.3, which includes the sixteen of HTML 4.
 // clang-format off
 constexpr auto namedColors = std::to_array<NamedColor>({
   {"aliceblue", 0xf0f8ff}, {"antiquewhite", 0xfaebd7}, {"aqua", 0x00ffff},
@@ -86,20 +86,20 @@ bool isHexDigit(char c) { return isDigit(c) || (lowered(c) >= 'a' && lowered(c) 
 
 double hexDigit(char c) { return isDigit(c) ? c - '0' : lowered(c) - 'a' + 10; }
 
-/// One part of a colour from one hexadecimal digit, which stands for itself twice, or two.
+/// Returns one part of a colour from two hexadecimal digits, or from one that counts twice.
 double hexPart(std::string_view digits) {
   return (hexDigit(digits.front()) * 16 + hexDigit(digits.back())) / 255;
 }
 
-/// The colour whose three parts have `digits`, of which there are a multiple of three.
+/// Returns the colour of `digits`, which are split evenly into three parts.
 Color hexColor(std::string_view digits) {
   const std::size_t length = digits.size() / 3;
   return {hexPart(digits.substr(0, length)), hexPart(digits.substr(length, length)),
           hexPart(digits.substr(2 * length))};
 }
 
-/// Cuts off a number, and its percent sign: the part, from 0 to 1, of a colour whose full part is
-/// written as `full`.
+/// Cuts off a number with its optional percent sign. Returns the part of a colour, from 0 to 1;
+/// `full` is written for 1.
 std::optional<double> takePart(std::string_view& text, double full) {
   text = trimmed(text);
   const auto number = takeNumber(text);
@@ -111,7 +111,7 @@ std::optional<double> takePart(std::string_view& text, double full) {
   return std::clamp(*number / (percentage ? 100 : full), 0.0, 1.0);
 }
 
-/// The colour in "rgb(...)" or "rgba(...)", of which `text` is what stands between the brackets.
+/// Returns the colour of "rgb(...)" or "rgba(...)"; `text` is the text between the brackets.
 std::optional<Color> functionColor(std::string_view text) {
   std::array<double, 4> parts = {0, 0, 0, 1};
   std::size_t count = 0;
@@ -126,8 +126,8 @@ std::optional<Color> functionColor(std::string_view text) {
   return Color{parts[0], parts[1], parts[2], parts[3]};
 }
 
-/// What HTML calls the rules for parsing a legacy colour value: what is no digit counts as 0, the
-/// digits fall into three parts, and of each the first two that tell anything count.
+/// Implements HTML's rules for parsing a legacy colour value: other characters count as the digit
+/// 0, the digits are split into three parts, and the first two significant digits of each count.
 Color legacyColor(std::string_view value) {
   if (value.starts_with('#')) value.remove_prefix(1);
   std::string digits(value.substr(0, 128));

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Colours as HTML and CSS write them.
+// Reads colours of HTML and CSS.
 #pragma once
 
 #include <optional>
@@ -9,13 +9,14 @@
 
 namespace toolkit::html {
 
-/// What the CSS value says: a name, "#rgb", "#rrggbb", "rgb(r, g, b)" or "rgba(r, g, b, a)" with
-/// numbers up to 255 or percentages. "transparent" has alpha 0. Absent where it is no colour.
+/// Returns the colour of a CSS value: a name, "#rgb", "#rrggbb", "rgb(r, g, b)" or "rgba(r, g, b,
+/// a)" with numbers up to 255 or percentages. "transparent" has alpha 0. Absent if it is not a
+/// colour.
 std::optional<Color> cssColor(std::string_view value);
 
-/// What the value of a `color`, `bgcolor`, `text` or `link` attribute says: a CSS colour, and
-/// otherwise what browsers have always made of it: "ff0000" is red, and no word is without a
-/// colour. Absent where the value is empty or "transparent".
+/// Returns the colour of a `color`, `bgcolor`, `text` or `link` attribute: a CSS colour or, for any
+/// other value, the colour that browsers have always shown, such as red for "ff0000"; every word
+/// has one. Absent if the value is empty or "transparent".
 std::optional<Color> attributeColor(std::string_view value);
 
 }  // namespace toolkit::html

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The entities of HTML 4, and the reading of references.
+// The entities of HTML 4, and how references are read.
 #include "toolkit/styled_text/html_entities.hpp"
 
 #include <algorithm>
@@ -16,7 +16,7 @@ struct Entity {
   char32_t character;
 };
 
-// HTML 4.01, chapter 24, in the order of the names' bytes.
+// HTML 4.01, chapter 24, in the byte order of the names.
 // clang-format off
 constexpr auto entities = std::to_array<Entity>({
   {"AElig", 198}, {"Aacute", 193}, {"Acirc", 194}, {"Agrave", 192}, {"Alpha", 913},
@@ -71,7 +71,7 @@ static_assert(entities.size() == 252);
 static_assert(std::is_sorted(entities.begin(), entities.end(),
                              [](const Entity& a, const Entity& b) { return a.name < b.name; }));
 
-// What Windows-1252 has where Latin-1 has control characters. Its five gaps stay as they are.
+// The characters of Windows-1252 where Latin-1 has control characters. Its five gaps keep theirs.
 constexpr std::array<char32_t, 32> windows1252 = {
     0x20AC, 0x81,   0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021, 0x02C6, 0x2030, 0x0160,
     0x2039, 0x0152, 0x8D,   0x017D, 0x8F,   0x90,   0x2018, 0x2019, 0x201C, 0x201D, 0x2022,
@@ -92,7 +92,7 @@ std::optional<char32_t> entityNamed(std::string_view name) {
 
 bool isAlphanumeric(char c) { return isLetter(c) || isDigit(c); }
 
-/// The value of a digit; absent where `c` is none in that base.
+/// Returns the value of a digit; absent if `c` is not a digit in that base.
 std::optional<unsigned> digitValue(char c, unsigned base) {
   if (isDigit(c)) return static_cast<unsigned>(c - '0');
   if (base == 16 && lowered(c) >= 'a' && lowered(c) <= 'f') {
@@ -116,7 +116,7 @@ std::optional<Reference> readNumeric(std::string_view bytes) {
   for (; at < bytes.size(); ++at) {
     const auto digit = digitValue(bytes[at], base);
     if (!digit) break;
-    // Beyond Unicode is beyond Unicode, however many digits follow.
+    // Stops beyond Unicode, so that any number of digits cannot overflow.
     if (number <= 0x10FFFF) number = number * base + *digit;
   }
   if (at == digits) return std::nullopt;
@@ -124,7 +124,8 @@ std::optional<Reference> readNumeric(std::string_view bytes) {
   return Reference{characterNumbered(number), at};
 }
 
-/// The Latin-1 entity that `name` begins with, the longest; in an attribute, all of `name`.
+/// Returns the longest Latin-1 entity at the start of `name`; in an attribute it must be all of
+/// `name`.
 std::optional<Reference> readUnterminated(std::string_view name, ReferencePlace place) {
   constexpr std::size_t shortest = 2;
   const std::size_t least =

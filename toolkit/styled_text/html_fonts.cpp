@@ -11,8 +11,7 @@
 namespace toolkit::html {
 namespace {
 
-/// `list[0]` to `list[6]` are the points of `<font size>` 1 to 7, browsers' 10, 13, 16, 18, 24, 32
-/// and 48 pixels.
+/// The points of `<font size>` 1 to 7: browsers' 10, 13, 16, 18, 24, 32 and 48 pixels.
 constexpr std::array<double, 7> elementSizes = {7.5, 9.75, 12, 13.5, 18, 24, 36};
 
 struct GenericFamily {
@@ -38,7 +37,8 @@ constexpr std::array<Keyword, 9> sizeKeywords = {{{"xx-small", {0, 6.75}},
                                                   {"smaller", {1 / sizeStep, 0}},
                                                   {"larger", {sizeStep, 0}}}};
 
-// What one of the unit is. An "ex" is taken to be half the size, as browsers do that cannot tell.
+// The size of one unit. An "ex" counts as half the font size, as in browsers that cannot measure
+// it.
 constexpr std::array<Keyword, 10> sizeUnits = {{{"pt", {0, 1}},
                                                 {"px", {0, pointsPerPixel}},
                                                 {"em", {1, 0}},

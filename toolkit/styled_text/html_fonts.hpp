@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Which fonts HTML's faces and sizes mean. Sizes are points; browsers' pixels are 3/4 of one, so
-// that their 16 pixels of common text are 12 points.
+// The fonts that HTML's faces and sizes mean. Sizes are in points; a browser's pixel is 3/4 point,
+// so 16 pixels of normal text are 12 points.
 #pragma once
 
 #include <optional>
@@ -11,24 +11,24 @@
 namespace toolkit::html {
 
 inline constexpr double pointsPerPixel = 0.75;
-/// What "larger" and `<big>` multiply by, "smaller" and `<small>` divide by.
+/// The factor of "larger" and `<big>`, and the divisor of "smaller" and `<small>`.
 inline constexpr double sizeStep = 1.2;
 
-/// Times, which text is in when no font is asked for.
+/// Returns Times, the font of text that requests none.
 Font commonFont(const Fonts& fonts);
 
-/// What `<tt>`, `<code>` and `<pre>` are in.
+/// Returns the font of `<tt>`, `<code>` and `<pre>`.
 Font fixedPitchFont(const Fonts& fonts);
 
-/// The first of the faces in the comma-separated `list` that `fonts` has; absent where it has none
-/// of them. A face may be in quotes, or one of CSS's generic families.
+/// Returns the first face in the comma-separated `list` that `fonts` has; absent if it has none of
+/// them. A face may be quoted, or be a generic family of CSS.
 std::optional<Font> firstKnownFace(std::string_view list, const Fonts& fonts);
 
-/// The points of `<font size>`: "1" to "7", of which "3" is 12 points. With a sign it counts from
-/// 3, wherever it stands. Absent where the value is no number.
+/// Returns the points of `<font size>`: "1" to "7"; "3" is 12 points. A value with a sign is
+/// relative to 3, never to the text around it. Absent if the value is not a number.
 std::optional<double> fontElementSize(std::string_view value);
 
-/// A size as a multiple of the size around it, and points on top; one of the two is 0.
+/// A size relative to the size around it: a factor plus points; one of the two is 0.
 struct FontSize {
   double scale = 1;
   double points = 0;
@@ -36,7 +36,8 @@ struct FontSize {
   friend bool operator==(const FontSize&, const FontSize&) = default;
 };
 
-/// The value of CSS's `font-size`: a length, a percentage or a keyword; absent where it is none.
+/// Reads a value of CSS's `font-size`: a length, a percentage or a keyword; absent if it is none of
+/// these.
 std::optional<FontSize> cssFontSize(std::string_view value);
 
 }  // namespace toolkit::html

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The HTML reader: the tokenizer's tokens go to the builder one by one.
+// The HTML reader: passes the tokenizer's tokens to the builder one by one.
 #include "toolkit/styled_text/html_reader.hpp"
 
 #include "toolkit/styled_text/html_builder.hpp"

@@ -10,16 +10,16 @@
 
 namespace toolkit {
 
-/// The styled text that `bytes`, an HTML document or a fragment of one, stands for. Bytes beyond
-/// ASCII are read as browsers read ISO-8859-1, that is as Windows-1252.
+/// Returns the styled text of `bytes`, an HTML document or a fragment of one. Bytes beyond ASCII
+/// are read as Windows-1252, as browsers do for ISO-8859-1.
 ///
-/// Without a font of its own text is in Times, 12 points; faces that `fonts` lacks are passed over.
-/// A colour is set only where the document asks for one: links have one by default, and the body's
-/// background colours the page, which is no attribute of the text.
+/// Text without a font is in Times, 12 points; faces that `fonts` lacks are skipped. A colour is
+/// set only if the document asks for one: links have one by default. The body's background belongs
+/// to the page and is not an attribute of the text.
 ///
-/// No markup is wrong: whatever is unclosed, stray or misnested is read as a browser would. Time
-/// and memory are proportional to the input. Absent only when there is nothing to read; a document
-/// with an empty body is an empty text.
+/// No markup is an error: unclosed, stray or misnested tags are read as in a browser. Time and
+/// memory are proportional to the input. Absent only if `bytes` is empty; a document with an empty
+/// body yields an empty text.
 std::optional<AttributedString> attributedStringFromHTML(std::string_view bytes,
                                                          const Fonts& fonts);
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The style of elements: by what they are, by their attributes, within others.
+// The style of elements: by tag, by attributes, and nested in others.
 #include "toolkit/styled_text/html_style.hpp"
 
 #include <algorithm>
@@ -13,12 +13,12 @@
 namespace toolkit::html {
 namespace {
 
-/// Elements whose `align` is that of the text in them; a caption's, for one, says where it stands.
+/// Elements whose `align` aligns their text; that of a caption, for example, places the caption.
 constexpr TagSet alignedByAttribute =
     tags::headings | tags::cells | tags::tableParts | TagSet{Tag::div, Tag::p};
-/// Elements that `text-align` applies to. Within a line it has no meaning.
+/// Elements that `text-align` applies to; inline elements ignore it.
 constexpr TagSet aligned = tags::blocks | tags::cells | tags::rowGroups | TagSet{Tag::body};
-/// Elements whose `bgcolor` shows behind their text; the body's is the page's.
+/// Elements whose `bgcolor` shows behind their text; the body's belongs to the page.
 constexpr TagSet coloredBehind = tags::cells | tags::tableParts;
 
 constexpr TagSet bold = tags::headings | TagSet{Tag::b, Tag::strong, Tag::th};
@@ -29,7 +29,7 @@ constexpr TagSet fixedPitch{Tag::code, Tag::kbd, Tag::pre, Tag::samp, Tag::tt};
 constexpr TagSet indented = tags::lists | TagSet{Tag::blockquote, Tag::dd};
 constexpr TagSet centered{Tag::caption, Tag::center, Tag::th};
 
-/// What the element multiplies the size by.
+/// Returns the factor by which the element scales the size.
 double scaleOf(Tag tag) {
   switch (tag) {
     case Tag::h1:
@@ -51,7 +51,7 @@ double scaleOf(Tag tag) {
   }
 }
 
-/// Declares what the element says by being what it is.
+/// Adds the declarations that follow from the tag itself.
 void declareNature(Tag tag, const Fonts& fonts, Declarations& own) {
   if (bold.contains(tag)) own.bold = true;
   if (italic.contains(tag)) own.italic = true;
@@ -59,7 +59,7 @@ void declareNature(Tag tag, const Fonts& fonts, Declarations& own) {
   own.size.scale = scaleOf(tag);
   own.underline = underlined.contains(tag);
   own.strikethrough = struckOut.contains(tag);
-  // Its size stays: whoever draws the text chooses how small it is off the base line.
+  // Keeps the size: the widget that draws the text chooses the size of super- and subscripts.
   if (tag == Tag::sup) own.superscript = 1;
   if (tag == Tag::sub) own.superscript = -1;
   if (indented.contains(tag)) own.indent = indentStep;
@@ -82,7 +82,7 @@ void declareBody(const Attributes& attributes, Declarations& own) {
 void declareLink(const Attributes& attributes, const Color& color, Declarations& own) {
   const auto written = attributes[Attribute::href];
   const std::string_view address = written ? trimmed(*written) : std::string_view();
-  // An address within the document leads nowhere: text has no places to go to.
+  // Ignores an address within the document, because text has no anchors.
   if (address.empty() || address.starts_with('#')) return;
   own.link = Link(std::string(address));
   own.color = color;
@@ -111,12 +111,12 @@ Declarations declarationsOf(Tag tag, const Attributes& attributes, const StyleSo
     readInlineStyle(*css, source.fonts, own);
   }
   if (!aligned.contains(tag)) own.alignment.reset();
-  if (tag == Tag::body) own.backgroundColor.reset();  // the page's, no attribute of text on it
+  if (tag == Tag::body) own.backgroundColor.reset();  // belongs to the page, not to its text
   return own;
 }
 
 Style styleWithin(const Style& parent, const Declarations& own) {
-  // Nested or absurd sizes stay within what can be drawn, and do not wear off by their rounding.
+  // Clamps absurd sizes to drawable ones, and rounds so that nested sizes do not drift.
   const auto drawable = [](double size) {
     return std::clamp(std::round(size * 100) / 100, 1.0, 1000.0);
   };

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What elements ask of their text, and what that amounts to within others.
+// The styles that elements declare, and the style that results from nested elements.
 #pragma once
 
 #include <optional>
@@ -14,10 +14,10 @@ namespace toolkit::html {
 /// The indent of a list, a quoted block and the like, in points.
 inline constexpr double indentStep = 36;
 
-/// What one element declares: by being what it is, by its attributes, by its inline style. What is
-/// absent is inherited.
+/// The declarations of one element: by its tag, its attributes and its inline style. Absent ones
+/// are inherited.
 struct Declarations {
-  std::optional<Font> face;  ///< its size does not count
+  std::optional<Font> face;  ///< its size is ignored
   FontSize size;
   std::optional<bool> bold;
   std::optional<bool> italic;
@@ -25,7 +25,7 @@ struct Declarations {
   std::optional<Color> backgroundColor;
   std::optional<Link> link;
   std::optional<TextAlignment> alignment;
-  // These add to what is inherited.
+  // These add to the inherited values.
   bool underline = false;
   bool strikethrough = false;
   int superscript = 0;
@@ -35,8 +35,8 @@ struct Declarations {
   friend bool operator==(const Declarations&, const Declarations&) = default;
 };
 
-/// What the open elements' declarations amount to. Small, for every start tag copies one: it points
-/// to values within the declarations, which must outlive it.
+/// The style that results from the open elements' declarations. Small, because every start tag
+/// copies one: it points into the declarations, which must outlive it.
 struct Style {
   const Font* face = nullptr;  ///< never absent
   const Color* color = nullptr;
@@ -46,27 +46,27 @@ struct Style {
   double indent = 0;
   int superscript = 0;
   TextAlignment alignment = TextAlignment::natural;
-  bool bold = false;  ///< besides what the face itself is
+  bool bold = false;  ///< in addition to the face's own weight
   bool italic = false;
   bool underline = false;
   bool strikethrough = false;
-  bool preformatted = false;  ///< white space counts
+  bool preformatted = false;  ///< white space is kept
 };
 
-/// What a document and its toolkit say to all elements.
+/// The settings of the document and toolkit that apply to all elements.
 struct StyleSource {
   const Fonts& fonts;
   Color linkColor{0, 0, 0.933};
 };
 
-/// What an element declares.
+/// Returns the declarations of an element.
 Declarations declarationsOf(Tag tag, const Attributes& attributes, const StyleSource& source);
 
-/// The style in an element that declares `own` within one of style `parent`.
+/// Returns the style of an element with declarations `own` inside an element of style `parent`.
 Style styleWithin(const Style& parent, const Declarations& own);
 
-/// The attributes of text of that style. In a `hanging` paragraph the first line begins an indent
-/// further out than the others.
+/// Returns the attributes of text in that style. The first line of a `hanging` paragraph begins one
+/// indent further left than the others.
 TextAttributes textAttributes(const Style& style, bool hanging);
 
 }  // namespace toolkit::html

@@ -30,9 +30,9 @@ constexpr Names<static_cast<std::size_t>(Attribute::unknown)> attributeNames = {
 
 constexpr std::size_t longestTag = 10;
 
-/// A name as one number, six bits a character, whatever its case, so that names compare at once and
-/// in their order. 0 of what is no name: one that is too long, or has other characters than letters
-/// and digits.
+/// Packs a name into one number, six bits a character, ignoring case, so that names compare quickly
+/// and in order. Returns 0 for other texts: too long, or with characters other than letters and
+/// digits.
 constexpr std::uint64_t packed(std::string_view name) {
   if (name.size() > longestTag) return 0;
   std::uint64_t number = 0;
@@ -56,7 +56,7 @@ static_assert(std::is_sorted(tagNumbers.begin(), tagNumbers.end()) && tagNumbers
 static_assert(std::is_sorted(attributeNumbers.begin(), attributeNumbers.end()) &&
               attributeNumbers.front() != 0);
 
-/// Where `name` stands in `numbers`; at their end, where it does not.
+/// Returns the index of `name` in `numbers`; N if it is not there.
 template <std::size_t N>
 std::size_t indexOf(const std::array<std::uint64_t, N>& numbers, std::string_view name) {
   const std::uint64_t number = packed(name);

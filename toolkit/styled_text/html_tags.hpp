@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
-// The elements and attributes of HTML 4.01 that the reader heeds, and sets of them. What is not
-// named here (areas, forms' controls, frames, scripts' hosts) has no bearing on styled text: its
-// tags are ignored, its content is read.
+// The elements and attributes of HTML 4.01 that the reader supports, and sets of them. Other
+// elements (areas, form controls, frames, script containers) do not affect styled text: their tags
+// are ignored, their content is read.
 #pragma once
 
 #include <array>
@@ -15,7 +15,7 @@
 
 namespace toolkit::html {
 
-/// In alphabetical order, as is the table of names.
+/// In alphabetical order, like the table of names.
 // clang-format off
 enum class Tag : std::uint8_t {
   a, abbr, acronym, address, b, bdo, big, blockquote, body, br, caption, center, cite, code, dd,
@@ -25,7 +25,7 @@ enum class Tag : std::uint8_t {
 };
 // clang-format on
 
-/// The tag of that name, whatever its case.
+/// Returns the tag of that name; ignores case.
 Tag tagNamed(std::string_view name);
 
 class TagSet {
@@ -57,21 +57,21 @@ inline constexpr TagSet headings{Tag::h1, Tag::h2, Tag::h3, Tag::h4, Tag::h5, Ta
 inline constexpr TagSet lists{Tag::dir, Tag::menu, Tag::ol, Tag::ul};
 inline constexpr TagSet cells{Tag::td, Tag::th};
 inline constexpr TagSet rowGroups{Tag::tbody, Tag::tfoot, Tag::thead};
-/// What holds rows and cells but no text of its own.
+/// Elements that hold rows and cells but no text directly.
 inline constexpr TagSet tableParts = TagSet{Tag::table, Tag::tr} | rowGroups;
-/// Opens and closes with a new line. `address` does not: it is only set in italics.
+/// Elements that begin and end with a new line. `address` is not one: it is only set in italics.
 inline constexpr TagSet blocks =
     headings | lists | TagSet{Tag::blockquote, Tag::caption, Tag::center,   Tag::dd,    Tag::div,
                               Tag::dl,         Tag::dt,      Tag::fieldset, Tag::form,  Tag::legend,
                               Tag::li,         Tag::p,       Tag::pre,      Tag::table, Tag::tr};
-/// What is to show through the end of an enclosing element, until its own end tag: in
+/// Elements that survive the end of an enclosing element, until their own end tag: in
 /// `<p><b>x</p><p>y</b>`, y is bold.
 inline constexpr TagSet formatting{Tag::a,      Tag::b,  Tag::big, Tag::code,  Tag::em,
                                    Tag::font,   Tag::i,  Tag::s,   Tag::small, Tag::strike,
                                    Tag::strong, Tag::tt, Tag::u};
-/// What formatting neither enters nor leaves by a stray end tag.
+/// Elements into which formatting does not continue, and beyond which its end tags do not look.
 inline constexpr TagSet formattingBarriers = cells | TagSet{Tag::caption};
-/// Where the search for the element that an end tag closes ends.
+/// Elements at which the search for the element that an end tag closes stops.
 inline constexpr TagSet scopes = formattingBarriers | TagSet{Tag::table};
 
 }  // namespace tags
@@ -82,23 +82,24 @@ enum class Attribute : std::uint8_t {
 };
 // clang-format on
 
-/// The attribute of that name, whatever its case.
+/// Returns the attribute of that name; ignores case.
 Attribute attributeNamed(std::string_view name);
 
-/// The attributes of a start tag: views of the document. Of two with one name the first counts.
+/// The attributes of a start tag, as views of the document. If a name occurs twice, the first
+/// counts.
 class Attributes {
  public:
   void clear() { present_.reset(); }
   void add(Attribute attribute, std::string_view writtenValue);
 
-  /// The value, its character references read; absent where the tag lacks the attribute.
+  /// Returns the value with character references decoded; absent if the tag lacks the attribute.
   std::optional<std::string> operator[](Attribute attribute) const;
 
  private:
   static constexpr std::size_t count = static_cast<std::size_t>(Attribute::unknown);
 
   std::array<std::string_view, count> values_;
-  std::bitset<count> present_;  // which of `values_` hold
+  std::bitset<count> present_;  // which of `values_` are set
 };
 
 }  // namespace toolkit::html

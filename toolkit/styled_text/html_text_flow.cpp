@@ -37,8 +37,7 @@ void TextFlow::endLine(const Style& style) {
   if (!isLineEmpty()) append("\n", style, End::newLine);
 }
 
-/// `text` without the white space that does not count, which `end_` tells and is kept up to date
-/// for.
+/// Returns `text` with white space collapsed; reads and updates `end_`.
 std::string_view TextFlow::collapsed(std::string_view text) {
   scratch_.clear();
   for (const char c : text) {
@@ -53,7 +52,7 @@ std::string_view TextFlow::collapsed(std::string_view text) {
   return scratch_;
 }
 
-/// `text`, which stays as it is, except that every line end is a new line.
+/// Returns `text` unchanged except that every line end becomes "\n".
 std::string_view TextFlow::withPlainLineEnds(std::string_view text) {
   scratch_.clear();
   for (std::size_t i = 0; i < text.size(); ++i) {

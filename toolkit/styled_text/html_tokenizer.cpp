@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Every function only moves forward, whatever it meets: so the whole is linear.
+// Every function only moves forward, so reading takes linear time.
 #include "toolkit/styled_text/html_tokenizer.hpp"
 
 #include <algorithm>
@@ -9,7 +9,7 @@
 namespace toolkit::html {
 namespace {
 
-/// Elements whose content is no markup, and no text to show either.
+/// Elements whose content is neither markup nor visible text.
 constexpr TagSet dropped{Tag::script, Tag::style, Tag::title};
 
 constexpr bool endsTagName(char c) { return isSpace(c) || c == '/' || c == '>'; }
@@ -63,7 +63,7 @@ void Tokenizer::readText(Token& token) {
   rest_.remove_prefix(end);
 }
 
-/// False where the document ends before the tag does.
+/// Returns false if the document ends before the tag does.
 bool Tokenizer::readTag(Token& token) {
   const bool end = peek(1) == '/';
   rest_.remove_prefix(end ? 2 : 1);
@@ -79,7 +79,7 @@ bool Tokenizer::readTag(Token& token) {
 }
 
 void Tokenizer::readAttribute(Attributes& attributes) {
-  // A "=" in front is part of the name, as it is in browsers: so every call moves forward.
+  // A leading "=" is part of the name, as in browsers, so every call moves forward.
   const Attribute name = attributeNamed(takeWhile<isAttributeName>(1));
   takeWhile<isSpace>();
   std::string_view value;
@@ -119,7 +119,7 @@ void Tokenizer::skipComment() {
   rest_ = {};
 }
 
-/// Moves to the end tag of `element`, or to the document's end.
+/// Moves to the end tag of `element` or, without one, to the document's end.
 void Tokenizer::skipContent(Tag element) {
   for (std::size_t at = rest_.find("</"); at < rest_.size(); at = rest_.find("</", at + 1)) {
     std::string_view name = rest_.substr(at + 2);

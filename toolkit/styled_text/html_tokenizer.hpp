@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-// Cuts a document into tags and the text between them, in one pass.
+// Splits a document into tags and the text between them, in one pass.
 //
-// Dropped on the way, as a browser does: comments, document types, processing instructions, marked
-// sections, the content of scripts, style sheets and titles, and a tag that the document's end cuts
-// short. A "<" that begins none of these is text.
+// As in a browser, drops comments, document types, processing instructions, marked sections, the
+// content of scripts, style sheets and titles, and a tag that the end of the document cuts off. A
+// "<" that begins none of these is text.
 #pragma once
 
 #include <cstddef>
@@ -18,9 +18,9 @@ struct Token {
   enum class Kind : std::uint8_t { text, startTag, endTag };
 
   Kind kind = Kind::text;
-  std::string_view text;  ///< as written; of a text
+  std::string_view text;  ///< as written; for a text
   Tag tag = Tag::unknown;
-  Attributes attributes;  ///< of a start tag
+  Attributes attributes;  ///< for a start tag
 };
 
 class Tokenizer {
@@ -45,7 +45,7 @@ class Tokenizer {
   std::string_view takeValue();
   char peek(std::size_t offset = 0) const { return offset < rest_.size() ? rest_[offset] : '\0'; }
 
-  std::string_view rest_;  // what is not read yet
+  std::string_view rest_;  // not yet read
 };
 
 }  // namespace toolkit::html

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Small tools for the words of HTML and CSS: ASCII letters without regard to case, numbers without
-// regard to locale.
+// Helpers for the words of HTML and CSS: ASCII letters regardless of case, numbers regardless of
+// locale.
 #pragma once
 
 #include <charconv>
@@ -13,7 +13,7 @@
 
 namespace toolkit::html {
 
-/// White space as HTML knows it.
+/// True for HTML's white space.
 constexpr bool isSpace(char c) {
   return c == ' ' || c == '\t' || c == '\n' || c == '\r' || c == '\f';
 }
@@ -34,7 +34,7 @@ constexpr std::string_view trimmed(std::string_view text) {
   return text;
 }
 
-/// Cuts off, and returns, what stands in front of the first `separator`: all, where there is none.
+/// Cuts off and returns the text before the first `separator`, or all of it if there is none.
 constexpr std::string_view takeUntil(std::string_view& text, char separator) {
   const std::size_t end = text.find(separator);
   const std::string_view part = text.substr(0, end);
@@ -42,7 +42,7 @@ constexpr std::string_view takeUntil(std::string_view& text, char separator) {
   return part;
 }
 
-/// Cuts off, and returns, the first word, with the white space around it.
+/// Cuts off the first word and the white space around it, and returns the word.
 constexpr std::string_view takeWord(std::string_view& text) {
   text = trimmed(text);
   std::size_t end = 0;
@@ -52,11 +52,11 @@ constexpr std::string_view takeWord(std::string_view& text) {
   return word;
 }
 
-/// Cuts off, and returns, the decimal number that `text` begins with, as in "-1.5em".
+/// Cuts off and returns the decimal number at the start of `text`, as in "-1.5em".
 inline std::optional<double> takeNumber(std::string_view& text) {
   const bool negative = text.starts_with('-');
   const std::string_view digits = negative || text.starts_with('+') ? text.substr(1) : text;
-  // Without this from_chars would read a second sign, "inf" and "nan".
+  // Without this check from_chars would accept a second sign, "inf" and "nan".
   if (digits.empty() || (!isDigit(digits.front()) && digits.front() != '.')) return std::nullopt;
   double number = 0;
   const auto [end, error] = std::from_chars(digits.data(), digits.data() + digits.size(), number,
@@ -66,8 +66,8 @@ inline std::optional<double> takeNumber(std::string_view& text) {
   return negative ? -number : number;
 }
 
-/// The integer that an attribute's value begins with; absent where none does or it is beyond 32
-/// bits.
+/// Returns the integer at the start of an attribute's value; absent if there is none or it exceeds
+/// 32 bits.
 inline std::optional<std::int32_t> leadingInteger(std::string_view text) {
   text = trimmed(text);
   if (text.starts_with('+')) text.remove_prefix(1);

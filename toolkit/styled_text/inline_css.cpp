@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
-// One function a property: it reads the value, and leaves the declarations alone if it is not
-// valid.
+// One function for each property: it reads the value, and changes nothing if the value is invalid.
 #include "toolkit/styled_text/inline_css.hpp"
 
 #include <array>
@@ -21,7 +20,7 @@ void readSize(std::string_view value, const Fonts&, Declarations& own) {
 }
 
 void readWeight(std::string_view value, const Fonts&, Declarations& own) {
-  constexpr int boldFrom = 600;  // the fonts of a family are two weights, of which this is nearer
+  constexpr int boldFrom = 600;  // a family has two weights; this and above is nearer to bold
   const std::string name = lowered(value);
   if (name == "bold" || name == "bolder") {
     own.bold = true;
@@ -38,8 +37,8 @@ void readFontStyle(std::string_view value, const Fonts&, Declarations& own) {
   if (name == "normal") own.italic = false;
 }
 
-// Replaces the element's own lines, such as a link's; those of the elements around it stay, for it
-// is them that draw those.
+// Replaces the element's own lines, such as a link's, but not those of enclosing elements, which
+// draw them.
 void readDecoration(std::string_view value, const Fonts&, Declarations& own) {
   bool valid = false;
   bool underline = false;
@@ -61,7 +60,7 @@ void readColor(std::string_view value, const Fonts&, Declarations& own) {
 
 void readBackground(std::string_view value, const Fonts&, Declarations& own) {
   const auto color = cssColor(value);
-  // What is transparent shows the background behind it.
+  // A transparent background shows the one behind it.
   if (color && color->alpha > 0) own.backgroundColor = color;
 }
 
@@ -83,7 +82,7 @@ constexpr std::array<Property, 8> properties = {{{"font-family", readFamily},
                                                  {"background-color", readBackground},
                                                  {"text-align", readAlignment}}};
 
-/// Cuts off, and returns, one declaration: up to a semicolon that is not in quotes.
+/// Cuts off and returns one declaration, up to a semicolon outside quotes.
 std::string_view takeDeclaration(std::string_view& css) {
   char quote = '\0';
   std::size_t end = 0;
@@ -131,7 +130,7 @@ void readInlineStyle(std::string_view css, const Fonts& fonts, Declarations& own
   for (std::string_view rest = sheet; !rest.empty();) {
     std::string_view value = takeDeclaration(rest);
     const std::string name = lowered(trimmed(takeUntil(value, ':')));
-    // Nothing competes with an inline style, so that its importance says nothing.
+    // Ignores "!important": nothing competes with an inline style.
     value = trimmed(takeUntil(value, '!'));
     for (const Property& property : properties) {
       if (property.name == name) property.read(value, fonts, own);

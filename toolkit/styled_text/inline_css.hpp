@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The style sheets in `style` attributes.
+// Reads the style sheets in `style` attributes.
 #pragma once
 
 #include <optional>
@@ -9,11 +9,12 @@
 
 namespace toolkit::html {
 
-/// "left", "right", "center", "justify" and their like; absent where it is none.
+/// Returns the alignment named "left", "right", "center", "justify" and the like; absent if it is
+/// none.
 std::optional<TextAlignment> alignmentNamed(std::string_view value);
 
-/// Adds what `css` says, such as "color: red; font-size: 14pt", to what the element declares. A
-/// property that the reader does not know, or a value that is not valid, says nothing.
+/// Adds the declarations of `css`, such as "color: red; font-size: 14pt", to `own`. Ignores unknown
+/// properties and invalid values.
 void readInlineStyle(std::string_view css, const Fonts& fonts, Declarations& own);
 
 }  // namespace toolkit::html

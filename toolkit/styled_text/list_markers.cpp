@@ -39,7 +39,7 @@ std::string roman(std::int64_t number) {
   return result;
 }
 
-/// a to z, then aa, ab and so on: there is no letter for 0.
+/// Returns a to z, then aa, ab and so on; decimal below 1.
 std::string letters(std::int64_t number) {
   if (number < 1) return std::to_string(number);
   std::string result;
@@ -61,7 +61,7 @@ std::string uppercase(std::string text) {
 
 std::optional<MarkerKind> markerKindNamed(std::string_view type) {
   type = trimmed(type);
-  // Case tells the letters apart, and nothing else.
+  // Only the letters are case-sensitive.
   if (type == "1") return MarkerKind::decimal;
   if (type == "a") return MarkerKind::lowerAlpha;
   if (type == "A") return MarkerKind::upperAlpha;

@@ -21,16 +21,16 @@ enum class MarkerKind : std::uint8_t {
   upperRoman
 };
 
-/// What the `type` attribute of a list or item says: "disc", "circle", "square" in any case, "1",
-/// "a", "A", "i" or "I"; absent where it says nothing.
+/// Returns the marker kind of a `type` attribute: "disc", "circle", "square" in any case, "1", "a",
+/// "A", "i" or "I"; absent for any other value.
 std::optional<MarkerKind> markerKindNamed(std::string_view type);
 
-/// The bullets of an unordered list at `level`, which counts from 1 at the outermost list of either
-/// kind: disc, circle, and squares from there on.
+/// Returns the bullet of an unordered list at `level`, which is 1 for the outermost list of either
+/// kind: disc, circle, then always square.
 MarkerKind bulletAtLevel(std::size_t level);
 
-/// The marker of item `number`, such as "•" or "4.". Numbers that letters or Roman numerals cannot
-/// express are decimal.
+/// Returns the marker of item `number`, such as "•" or "4.". Numbers without a form in letters or
+/// Roman numerals become decimal.
 std::string marker(MarkerKind kind, std::int64_t number);
 
 }  // namespace toolkit::html

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Descriptions of which the engine builds a walk-through window.
+// Descriptions from which the engine builds a walk-through window.
 #include "tools/play/gui_description.hpp"
 
 #include <string>

@@ -53,8 +53,8 @@ State readState(const PlistEntry& entry, ViewKind kind) {
   return State::off;
 }
 
-/// The keys that an entry of the kind may have: a caption only where the kind shows one, a state
-/// only where it has one.
+/// Returns the keys that an entry of the kind may have: a caption only if the kind shows one, a
+/// state only if it has one.
 std::vector<std::string_view> keysOf(ViewKind kind) {
   std::vector<std::string_view> keys = {"class", "tag", "frame", "hidden", "toolTip"};
   if (kind == ViewKind::imageView) keys.emplace_back("image");
@@ -91,7 +91,7 @@ void makeControl(toolkit::TestDriver& driver, const HostControl& control,
   const auto view = driver.makeView(control.kind, control.tag, control.frame, parent);
   if (control.caption) driver.setCaption(view, *control.caption);
   view->setHidden(control.hidden);
-  // A view that is no control does not understand being disabled.
+  // A view that is not a control does not understand setEnabled.
   if (!control.enabled) view->setEnabled(false);
   toolkit::asButton(view)->setState(control.state);
   if (!control.toolTip.empty()) view->setToolTip(control.toolTip);

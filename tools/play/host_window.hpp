@@ -18,7 +18,7 @@ struct HostControl {
   toolkit::ViewKind kind = toolkit::ViewKind::plain;
   toolkit::Tag tag = 0;
   toolkit::Rect frame;
-  /// The title of a button, the text of a field, the name of an image; absent: the toolkit's own.
+  /// The title of a button, text of a field or name of an image; absent: the toolkit's default.
   std::optional<std::string> caption;
   bool hidden = false;
   bool enabled = true;
@@ -32,10 +32,12 @@ struct HostWindow {
   std::vector<HostControl> controls;          ///< back to front
 };
 
-/// The window that the file describes. A Failure says which entry is wrong, counted from 1.
+/// Returns the window that the file describes. Throws a Failure that names the wrong entry, counted
+/// from 1.
 HostWindow parseHostWindow(const InputFile& file);
 
-/// Puts the window on the driver's screen. A Failure when one of its images is not known.
+/// Puts the window on the driver's screen. Throws a Failure, which names `file`, if one of its
+/// images is unknown.
 toolkit::Ref<toolkit::Window> makeHostWindow(toolkit::TestDriver& driver, const HostWindow& host,
                                              std::string_view file);
 

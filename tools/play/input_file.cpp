@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The property lists that the tool is given.
+// The property lists that the tool reads.
 #include "tools/play/input_file.hpp"
 
 #include <cerrno>

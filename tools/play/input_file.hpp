@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The property lists that the tool is given. Whatever is wrong with one ends the command with a
-// Failure that says where ("FILE:LINE:COLUMN"), what is wrong, and what was expected.
+// The property lists that the tool reads. An error in one ends the command with a Failure that says
+// where ("FILE:LINE:COLUMN"), what is wrong, and what was expected.
 #pragma once
 
 #include <string>
@@ -15,18 +15,19 @@ namespace tools::play {
 
 class InputFile {
  public:
-  /// Reads the property list at `path`, in any of the formats. `what` is what the file is to hold,
-  /// such as "a script"; `refusal` is the Failure's status where it is not that.
+  /// Reads the property list at `path`, in any of the formats. `what` names what the file should
+  /// hold, such as "a script"; `refusal` is the Failure's status if it holds something else.
   InputFile(std::string path, std::string_view what, ExitStatus refusal = ExitStatus::badInput);
 
   const std::string& path() const { return path_; }
   const toolkit::ValueRef<>& root() const { return root_; }
-  /// The root of a file that must be a dictionary.
+  /// Returns the root; throws a Failure if it is not a dictionary.
   toolkit::ValueRef<toolkit::Dictionary> dictionary() const;
 
-  /// Such as "intro.plist:12:5", for a value of this file; the path alone for any other.
+  /// Returns the place of a value of this file, such as "intro.plist:12:5"; the path alone for any
+  /// other value.
   std::string placeOf(const toolkit::ValueRef<>& value) const;
-  /// Ends the command: `message` is about `value`, which stands in this file.
+  /// Throws a Failure: `message`, at the place of `value` in this file.
   [[noreturn]] void fail(const toolkit::ValueRef<>& value, const std::string& message) const;
 
  private:
@@ -39,8 +40,8 @@ class InputFile {
   toolkit::PositionTable positions_;
 };
 
-/// A value as a message shows what was found, such as `the string “abc”` or "an array of 3";
-/// "nothing" when it is absent.
+/// Says what was found, for a message: `the string “abc”` or "an array of 3", for example;
+/// "nothing" if the value is absent.
 std::string foundWords(const toolkit::ValueRef<>& value);
 
 }  // namespace tools::play

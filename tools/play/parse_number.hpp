@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Reading a text as one number.
+// Reads a text as one number.
 #pragma once
 
 #include <charconv>
@@ -9,7 +9,7 @@
 
 namespace tools::play {
 
-/// The number that `text` is from its first character to its last, or nothing.
+/// Returns the number that `text` spells from its first character to its last; absent otherwise.
 template <class T>
 std::optional<T> parseNumber(std::string_view text) {
   T number{};

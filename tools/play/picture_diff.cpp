@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 // What changed from one picture of a walk-through to the next.
 //
-// Each thing pictured is put into a list of facts, always the same ones in the same order; two
-// lists are then compared line by line.
+// Each thing in a picture becomes a list of facts, always the same facts in the same order. Two
+// lists are then compared fact by fact.
 #include "tools/play/picture_diff.hpp"
 
 #include <algorithm>
@@ -76,7 +76,7 @@ std::vector<Change> compare(const Facts& before, const Facts& now) {
   return changes;
 }
 
-/// The attributes of each piece of a text; an empty one counts as plain.
+/// Returns the attributes of each piece of a text; an empty text counts as one plain piece.
 std::vector<toolkit::TextAttributes> attributesOf(const toolkit::AttributedString& text) {
   if (text.runs().empty()) return {toolkit::TextAttributes{}};
   std::vector<toolkit::TextAttributes> attributes;
@@ -84,7 +84,7 @@ std::vector<toolkit::TextAttributes> attributesOf(const toolkit::AttributedStrin
   return attributes;
 }
 
-/// How a text is styled; of one in several styles, every piece.
+/// Says how a text is styled, piece by piece if it has several styles.
 std::string stylesWords(const toolkit::AttributedString& text) {
   if (text.runs().empty()) return "plain";
   if (text.runs().size() == 1) return styleWords(text.runs().front().attributes);
@@ -98,7 +98,7 @@ std::string stylesWords(const toolkit::AttributedString& text) {
   return words;
 }
 
-/// The same in short, for a text whose pieces the pictures before and after list anyway.
+/// The same in short, for a text whose pieces the pictures list anyway.
 std::string stylesInShort(const toolkit::AttributedString& text) {
   return text.runs().size() < 2 ? stylesWords(text)
                                 : std::to_string(text.runs().size()) + " pieces";
@@ -133,7 +133,7 @@ ControlChanges compareControl(const ControlPicture* before, const ControlPicture
   return result;
 }
 
-/// The timers of both pictures by key: before and now.
+/// Pairs the timers of both pictures by key: before and now.
 auto pairUp(const StepPicture& before, const StepPicture& now) {
   std::map<std::string, std::pair<const TimerPicture*, const TimerPicture*>> pairs;
   for (const TimerPicture& timer : before.timers) pairs[timer.key].first = &timer;

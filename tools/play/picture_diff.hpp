@@ -9,7 +9,7 @@
 
 namespace tools::play {
 
-/// One thing that is another now, in words.
+/// One thing that changed, in words.
 struct Change {
   std::string what;
   std::string before;
@@ -30,12 +30,12 @@ struct PictureChanges {
   std::vector<ControlPicture> gone;  ///< controls that only the earlier picture has
   std::vector<Change> engine;        ///< timers, flashing, the list that was started last
 
-  /// Whether nothing at all changed.
+  /// True if nothing changed.
   bool none() const;
 };
 
-/// What is different in `now`. A control is the same as before whatever its tag has become; of a
-/// timer only that it was armed, armed anew or is gone counts, not that its time runs.
+/// Returns what is different in `now`. A control counts as the same even if its tag has changed. A
+/// timer counts as changed if it was armed, armed again or is gone, not because time has passed.
 PictureChanges diffPictures(const StepPicture& before, const StepPicture& now);
 
 }  // namespace tools::play

@@ -11,14 +11,14 @@
 namespace tools::play {
 namespace {
 
-constexpr std::size_t widestContent = 44;     // a longer text goes on below
+constexpr std::size_t widestContent = 44;     // longer text continues below
 constexpr std::size_t narrowestContent = 16;  // however narrow the terminal
 constexpr std::size_t narrowestRemarks = 20;  // the same
-constexpr std::size_t hang = 2;               // how far later lines of a paragraph are moved in
+constexpr std::size_t hang = 2;               // indent of the later lines of a paragraph
 constexpr std::string_view margin = "  ";
 constexpr std::string_view gap = "  ";
 
-// The parts of a picture that a colour terminal sets apart.
+// How a colour terminal sets parts of a picture apart.
 constexpr std::string_view bold = "1";
 constexpr std::string_view faint = "2";
 constexpr std::string_view yellow = "33";
@@ -114,7 +114,7 @@ class Renderer {
     addChanges(changes_.engine, margin.size());
   }
 
-  /// Finds out how wide the columns must be.
+  /// Computes how wide the columns must be.
   void measure(const std::vector<Row>& rows) {
     for (const Row& row : rows) {
       tagWidth_ = std::max(tagWidth_, displayWidth(row.tag));
@@ -153,7 +153,7 @@ class Renderer {
     }
   }
 
-  /// The pieces of a text whose attributes are not the same from start to end.
+  /// Adds the pieces of a text whose attributes are not the same throughout.
   void addRuns(const toolkit::AttributedString& text) {
     if (text.runs().size() < 2) return;
     for (const auto& [range, attributes] : text.runs()) {
@@ -180,7 +180,7 @@ class Renderer {
     addHanging(words, margin.size(), paint);
   }
 
-  /// Wraps `words` to the width from `column` on; the second line and later ones are moved in.
+  /// Wraps `words` to the width from `column` on; indents the second line and later ones.
   void addHanging(const std::string& words, std::size_t column, std::string_view paint) {
     std::size_t start = column;
     for (const std::string& line : wrap(words, widthFrom(column) - hang)) {
@@ -193,7 +193,7 @@ class Renderer {
   const StepPicture& picture_;
   const PictureChanges& changes_;
   const Style& style_;
-  std::size_t tagWidth_ = 3;      // of the column's head
+  std::size_t tagWidth_ = 3;      // of the column's heading
   std::size_t kindWidth_ = 4;     // the same
   std::size_t contentWidth_ = 5;  // the same
   std::string text_;

@@ -16,12 +16,12 @@ struct Style {
   std::size_t width = 100;  ///< columns; rows and changes are wrapped to it
 };
 
-/// The line that begins a step: "── 2. press 3 (Next) ──".
+/// Returns the line that begins a step: "── 2. press 3 (Next) ──".
 std::string renderHeading(int number, std::string_view what, const Style& style);
 
-/// The window, its controls in aligned columns, and what is pending. What `changes` names is
-/// marked: "*" before what changed, with what it was and is below; "+" before a new control, "-"
-/// before one that is gone. Every line ends with a line end.
+/// Shows the window, its controls in aligned columns, and what is pending. Marks the `changes`: "*"
+/// before what changed, with the old and new values below; "+" before a new control, "-" before one
+/// that is gone. Every line ends with a line end.
 std::string renderPicture(const StepPicture& picture, const PictureChanges& changes,
                           const Style& style);
 

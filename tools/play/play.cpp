@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Playing a script, from reading it to the end of the transcript.
+// Plays a script, from reading it to the end of the transcript.
 #include "tools/play/play.hpp"
 
 #include <algorithm>
@@ -29,7 +29,7 @@ namespace fs = std::filesystem;
 
 using Script = toolkit::ValueRef<toolkit::Dictionary>;
 
-/// The script's keys in the order of their tags.
+/// Returns the script's keys in the order of their tags.
 std::vector<std::string> sortedKeys(const Script& script) {
   std::vector<std::string> keys = script->allKeys();
   std::stable_sort(keys.begin(), keys.end(), [](const std::string& a, const std::string& b) {
@@ -46,13 +46,13 @@ std::string listOfKeys(const Script& script) {
   return list;
 }
 
-/// Fails unless the script has a list to start with.
+/// Throws a Failure unless the script has a list to start with.
 void checkStart(const InputFile& file, std::string key) {
   const Script script = file.dictionary();
   if (script->allKeys().empty()) {
     file.fail(script, "expected at least one list, found an empty script");
   }
-  // The engine's own rule: the smallest tag as a number, and its list under the decimal form.
+  // As the engine does: the smallest tag as a number, then the list under its decimal form.
   if (key.empty()) key = std::to_string(toolkit::intValueOf(sortedKeys(script).front()));
   const auto list = script->objectForKey(key);
   if (!list) {
@@ -103,7 +103,7 @@ void playInteractively(Session& session, const Terminal& terminal) {
   }
 }
 
-/// Whoever sees the window plays in it; else whoever types.
+/// Lets a person who sees the window play in it, else the user of an interactive terminal.
 void leaveToTheUser(const toolkit::TestDriver& driver, Session& session, const Terminal& terminal) {
   if (driver.hasPerson()) {
     terminal.out << "\nPress what the window offers; close it to stop.\n" << std::flush;
@@ -113,7 +113,7 @@ void leaveToTheUser(const toolkit::TestDriver& driver, Session& session, const T
   }
 }
 
-/// Hands the engine's log lines on, each below what the transcript already shows.
+/// Passes the engine's log lines on, each below what the transcript already shows.
 void connectLog(toolkit::TestDriver& driver, const Terminal& terminal) {
   driver.setLogSink([&terminal](std::string_view line) {
     terminal.out << std::flush;

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Playing a script: what `qz-walkthrough play` does once its command line is read.
+// Plays a script: what `qz-walkthrough play` does once its command line is read.
 #pragma once
 
 #include <iosfwd>
@@ -32,28 +32,27 @@ inline constexpr double longestAdvance = 24 * 3600;
 struct PlayOptions {
   std::string script;                    ///< path of the script
   std::optional<std::string> window;     ///< path of the host's window; or
-  std::optional<std::string> assets;     ///< path of a description of which the engine builds one
+  std::optional<std::string> assets;     ///< path of a description from which the engine builds one
   std::string startKey;                  ///< empty: the smallest tag
   std::optional<std::string> resources;  ///< directory of named images; absent: the script's own
   std::vector<Step> steps;               ///< what happens after the start, in order
-  bool sheet = false;                    ///< shown as a sheet over another window of the host
+  bool sheet = false;                    ///< show it as a sheet over another window of the host
   std::string toolkit = "memory";
-  std::optional<std::string> screenshots;  ///< directory of a picture for every step
+  std::optional<std::string> screenshots;  ///< directory for a picture of every step
 };
 
-/// Whom the player talks with.
+/// Where the player reads requests and writes its results.
 struct Terminal {
   std::istream& in;
   std::ostream& out;  ///< the transcript
-  std::ostream& log;  ///< the engine's log lines; at the end, what could not be done
-  /// Asks for steps when none are given; a person at the toolkit's own screen plays there.
+  std::ostream& log;  ///< the engine's log lines; at the end, the problems
+  /// Whether to ask for steps if none are given and no person plays at the toolkit's screen.
   bool interactive;
   Style style;
 };
 
-/// Plays the script and writes the transcript. `failed` when a step could not be made, a list
-/// raised, or the walk-through stands still at the end. A Failure when the walk-through cannot
-/// start.
+/// Plays the script and writes the transcript. Returns `failed` if a step was impossible, a list
+/// raised, or the walk-through is stuck at the end. Throws a Failure if it cannot start.
 ExitStatus play(const PlayOptions& options, const Terminal& terminal);
 
 }  // namespace tools::play

@@ -22,7 +22,7 @@ std::optional<std::int64_t> integerOf(const toolkit::ValueRef<>& value) {
   return isInteger ? std::optional<std::int64_t>(number->longValue()) : std::nullopt;
 }
 
-/// YES and NO as property lists of all formats write them.
+/// Reads YES or NO as property lists of any format write them.
 std::optional<bool> flagOf(const toolkit::ValueRef<>& value) {
   if (const auto number = toolkit::asNumber(value)) return number->boolValue();
   const auto text = toolkit::asString(value);
@@ -107,7 +107,7 @@ toolkit::Rect PlistEntry::requiredRect(std::string_view key) const {
 
 void PlistEntry::fail(std::string_view key, std::string_view expected) const {
   const auto value = valueOf(key);
-  // What is missing has no place but that of the entry that lacks it.
+  // A missing field has no place; the message points to the entry that lacks it.
   failAt(value ? value : value_,
          std::string(key) + ": expected " + std::string(expected) + ", found " + foundWords(value));
 }

@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
-// One entry of a file that describes a window: reading its fields, and saying what is wrong with
-// them.
+// One entry of a file that describes a window: reads its fields and reports errors in them.
 #pragma once
 
 #include <optional>
@@ -15,19 +14,20 @@
 
 namespace tools::play {
 
-/// A number as files write it, whole or not: a number, or a string that is one from start to end
-/// (the old-style format has nothing but strings).
+/// Returns the finite number that a value holds, whole or not: from a number, or from a string that
+/// spells one from start to end (the old-style format has only strings). Absent for other values.
 std::optional<double> numberOf(const toolkit::ValueRef<>& value);
 
-/// An entry whose fields stand under keys. Reading a field that is not what it should be throws a
+/// An entry with fields under keys. Reading a field that has the wrong kind of value throws a
 /// Failure: "FILE:LINE:COLUMN: entry 3: tag: expected …, found …".
 class PlistEntry {
  public:
-  /// `name` is how messages call it, such as "entry 3". The file outlives it.
+  /// Throws a Failure if `value` is not a dictionary. Messages call the entry `name`, such as
+  /// "entry 3". `file` must outlive it.
   PlistEntry(const InputFile& file, std::string name, const toolkit::ValueRef<>& value);
 
   bool has(std::string_view key) const;
-  /// Fails when the entry has a key that is none of these.
+  /// Throws a Failure if the entry has any other key.
   void expectOnly(const std::vector<std::string_view>& keys) const;
 
   std::string requiredText(std::string_view key) const;
@@ -40,7 +40,7 @@ class PlistEntry {
 
  private:
   toolkit::ValueRef<> valueOf(std::string_view key) const;
-  /// `value` is what the message is about.
+  /// Throws a Failure at the place of `value`.
   [[noreturn]] void failAt(const toolkit::ValueRef<>& value, const std::string& message) const;
 
   const InputFile& file_;

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What a user can press, and where the walk-through stands.
+// What a user can press, and how the walk-through can continue.
 #include "tools/play/pressing.hpp"
 
 #include <algorithm>
@@ -25,7 +25,7 @@ std::string pressableWords(const StepPicture& picture) {
   return buttons.empty() ? "; no button can be pressed" : "; press " + enumerate(buttons);
 }
 
-/// What can happen next: presses that run a list, and timers.
+/// Returns what can happen next: presses that run a list, and timers.
 std::vector<std::string> waysOn(const StepPicture& picture) {
   std::vector<std::string> ways;
   std::vector<std::string> buttons;

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What a user can press in a picture of a walk-through, and where the walk-through stands.
+// What a user can press in a picture of a walk-through, and how the walk-through can continue.
 #pragma once
 
 #include <optional>
@@ -9,20 +9,20 @@
 
 namespace tools::play {
 
-/// The control that scripts and presses mean by `tag`: the back-most one. Null when there is none.
+/// Returns the control that scripts and presses find by `tag`: the rearmost. Null if there is none.
 const ControlPicture* controlWithTag(const StepPicture& picture, toolkit::Tag tag);
 
-/// A tag with the title of its button, where it is one: "3 (Next)".
+/// Returns the tag, with the first line of the title if its control is a button: "3 (Next)".
 std::string pressWords(const StepPicture& picture, toolkit::Tag tag);
 
-/// Why a user cannot press the tag; nothing when they can.
+/// Says why a user cannot press the control with this tag; absent if they can.
 std::optional<std::string> whyNotPress(const StepPicture& picture, toolkit::Tag tag);
 
-/// Why the walk-through stands still: nothing that a user can do, and no timer, runs a list.
-/// Nothing when there is a way on, or the walk-through has ended.
+/// Says why the walk-through is stuck: nothing that a user can do, and no timer, runs a list.
+/// Absent if it can continue or has ended.
 std::optional<std::string> whyNoWayOn(const StepPicture& picture);
 
-/// Whether the walk-through ended, or what it waits for. A sentence.
+/// Says in one sentence that the walk-through ended or is stuck, or what it waits for.
 std::string standing(const StepPicture& picture);
 
 }  // namespace tools::play

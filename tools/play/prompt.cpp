@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What the user of an interactive walk-through asks for.
+// Reads what the user of an interactive walk-through asks for.
 #include "tools/play/prompt.hpp"
 
 #include "tools/play/parse_number.hpp"
@@ -44,7 +44,7 @@ std::optional<toolkit::Tag> parseTag(std::string_view text) {
 
 std::optional<double> parseSeconds(std::string_view text) {
   const auto seconds = parseNumber<double>(text);
-  // Not the other way round: that would let "nan" pass.
+  // Comparisons with "nan" are false: the opposite conditions would accept it.
   return seconds && *seconds >= 0 && *seconds <= longestAdvance ? seconds : std::nullopt;
 }
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What the user of an interactive walk-through asks for, a line at a time.
+// Reads what the user of an interactive walk-through asks for, a line at a time.
 #pragma once
 
 #include <string>
@@ -12,25 +12,25 @@ namespace tools::play {
 
 struct Help {};
 struct Quit {};
-/// A line that asks for nothing known; the hint says what was expected.
+/// A line that is not a known request; the hint says what was expected.
 struct Unclear {
   std::string hint;
 };
 
 using Request = std::variant<Press, Advance, Help, Quit, Unclear>;
 
-/// What a line asks for: a tag, "+SECONDS", "?", or "q". Spaces around it do not count.
+/// Returns what a line asks for: a tag, "+SECONDS", "?", or "q". Ignores spaces around it.
 Request parseRequest(std::string_view line);
 
-/// What is printed before each line is read.
+/// Printed before each line is read.
 inline constexpr std::string_view promptText = "tag, +seconds, ? or q: ";
 
 /// The answer to Help; ends with a line end.
 extern const std::string_view promptHelp;
 
-/// A tag as a user writes it: a whole number, nothing around it.
+/// Reads a tag as a user writes it: a whole number, nothing around it.
 std::optional<toolkit::Tag> parseTag(std::string_view text);
-/// A number of seconds from 0 to `longestAdvance`, nothing around it.
+/// Reads a number of seconds from 0 to `longestAdvance`, nothing around it.
 std::optional<double> parseSeconds(std::string_view text);
 
 }  // namespace tools::play

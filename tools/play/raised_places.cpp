@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Says where in its script a command stands that has raised.
+// Reports the place in the script of each command that raises.
 #include "tools/play/raised_places.hpp"
 
 #include <ostream>
@@ -9,7 +9,7 @@
 namespace tools::play {
 namespace {
 
-/// The key of a list, which is known by being the very one that the script holds.
+/// Returns the key under which the script holds this very list; absent if it does not hold it.
 std::optional<std::string> keyOf(const QZ_Plist_State_Parser::Dictionary& script,
                                  const toolkit::ValueRef<>& list) {
   for (const std::string& key : script->allKeys()) {
@@ -18,7 +18,7 @@ std::optional<std::string> keyOf(const QZ_Plist_State_Parser::Dictionary& script
   return std::nullopt;
 }
 
-/// Such as ": SET_TEXT_FOR_OBJECT_ID"; empty where the element names no command.
+/// Returns a text such as ": SET_TEXT_FOR_OBJECT_ID"; empty if the element names no command.
 std::string nameWords(const toolkit::ValueRef<>& element) {
   const auto array = toolkit::asArray(element);
   if (array && array->count() == 0) return "";

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Says where in its script a command stands that has raised: the engine's log line does not.
+// Reports the place in the script of each command that raises: the engine's log line does not.
 #pragma once
 
 #include <iosfwd>
@@ -15,7 +15,7 @@ namespace tools::play {
 
 class RaisedPlaces final : public qz::Observer {
  public:
-  /// All outlive the observer. `script` is the file that the engine loads.
+  /// The arguments must outlive the observer. `script` is the file that the engine loads.
   RaisedPlaces(const InputFile& script, const QZ_Plist_State_Parser& engine, std::ostream& log)
       : script_(script), engine_(engine), log_(log) {}
 

@@ -20,7 +20,7 @@ namespace fs = std::filesystem;
   throw Failure(ExitStatus::badInput, "--screenshots: " + message);
 }
 
-/// What an earlier walk-through has left would stand between the new pictures.
+/// Deletes the pictures of an earlier walk-through, which would mix with the new ones.
 void clearAway(const std::string& directory) {
   static const std::regex own("[0-9]{2,}-(start|press|advance|list)[-.0-9a-z]*\\.png");
   std::error_code error;

@@ -14,16 +14,16 @@ namespace tools::play {
 
 class Screenshots {
  public:
-  /// Makes the directory where there is none, and clears away the pictures of an earlier
-  /// walk-through. A Failure when the driver's toolkit draws nothing, or the directory cannot be
-  /// written. The driver outlives it.
+  /// Makes the directory if there is none, and deletes the pictures of an earlier walk-through.
+  /// Throws a Failure if the driver's toolkit draws nothing, or the directory cannot be written.
+  /// The driver must outlive it.
   Screenshots(toolkit::TestDriver& driver, std::string directory);
 
-  /// Writes the transcript, plain, to `transcript.txt` as well. This outlives the transcript.
+  /// Also writes the transcript, plain, to `transcript.txt`. This must outlive the transcript.
   void keep(Transcript& transcript);
 
-  /// Takes a picture of the window, "02-press-5.png" when `what` is "press-5" and there are two
-  /// already. Of a window that is not on the screen there is none. A Failure when the file cannot
+  /// Takes a picture of the window: "02-press-5.png" if `what` is "press-5" and there are two
+  /// already. Does nothing if the window is not on the screen. Throws a Failure if the file cannot
   /// be written.
   void take(const toolkit::Ref<toolkit::Window>& window, std::string_view what);
 

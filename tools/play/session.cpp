@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// A walk-through being played.
+// Plays a walk-through.
 #include "tools/play/session.hpp"
 
 #include <algorithm>
@@ -17,7 +17,7 @@ bool isSame(const TimerPicture& a, const TimerPicture& b) {
   return !a.identity.owner_before(b.identity) && !b.identity.owner_before(a.identity);
 }
 
-/// The timer that has fired between the two pictures, if one has.
+/// Returns the first timer of `before` that is not in `after`, which counts as fired; else null.
 const TimerPicture* firedBetween(const StepPicture& before, const StepPicture& after) {
   for (const TimerPicture& timer : before.timers) {
     const bool pends = std::any_of(after.timers.begin(), after.timers.end(),
@@ -61,7 +61,7 @@ void Session::advance(double seconds) {
   run(heading, "advance-" + numberWords(seconds), [&] { pass(seconds); });
 }
 
-// One firing after the other, where a picture of each is wanted.
+// With screenshots, advances from one firing to the next and takes a picture after each.
 void Session::pass(double seconds) {
   while (screenshots_) {
     const StepPicture before = look();
@@ -94,7 +94,7 @@ void Session::begin(const std::string& heading, const std::string& name) {
   transcript_.beginStep(heading);
 }
 
-// A host's event loop would report it and go on; so does the transcript.
+// A host's event loop would report the exception and continue; so does the transcript.
 void Session::noteRaised(const toolkit::Exception& exception) {
   const std::string what = exception.name() + ": " + printable(exception.reason());
   problems_.push_back(begun_->heading + ": raised " + what);
@@ -112,7 +112,7 @@ void Session::takeScreenshot(const std::string& name) {
 
 void Session::handOver() {
   const auto willAct = [this](const toolkit::Ref<toolkit::View>& view) {
-    watch();  // what went before is a step of its own, such as what a timer has just done
+    watch();  // what happened before is its own step, such as the list of a timer
     const toolkit::Tag tag = view->tag();
     begin("press " + pressWords(look(), tag), "press-" + std::to_string(tag));
   };
@@ -126,7 +126,7 @@ void Session::handOver() {
   }
 }
 
-/// Writes down what has happened since the last step; whether the walk-through goes on.
+/// Records what has happened since the last step. True if the walk-through continues.
 bool Session::watch() {
   if (!begun_) {
     const StepPicture now = look();

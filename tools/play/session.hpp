@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// A walk-through being played: makes its steps and keeps the transcript.
+// Plays a walk-through: makes its steps and keeps the transcript.
 #pragma once
 
 #include <functional>
@@ -19,8 +19,8 @@ namespace tools::play {
 
 class Session {
  public:
-  /// All outlive the session. With `screenshots`, which may be null, there is a picture after each
-  /// step, and after each list that a timer has run within one.
+  /// The arguments must outlive the session. `screenshots` may be null; else it gets a picture
+  /// after each step, and after each list that a timer runs within one.
   Session(toolkit::TestDriver& driver, Stage& stage, std::ostream& out, const Style& style,
           Screenshots* screenshots = nullptr);
 
@@ -34,12 +34,12 @@ class Session {
   /// Each press and each list that a timer runs is a step.
   void handOver();
 
-  /// Says how the walk-through ended or what it waits for, and what it leaves its host.
+  /// Says how the walk-through ended or what it waits for, and which button states it recorded.
   void conclude();
 
   const StepPicture& picture() const { return transcript_.latest(); }
-  /// The steps that could not be made and the lists that raised, a line each; once concluded, also
-  /// that there is no way on.
+  /// Returns a line for each step that could not be made and each list that raised; after
+  /// `conclude`, also one if the walk-through is stuck.
   const std::vector<std::string>& problems() const { return problems_; }
 
  private:
@@ -63,7 +63,7 @@ class Session {
   Screenshots* screenshots_;
   struct Begun {
     std::string heading;
-    std::string name;  // for its picture; empty where it needs none
+    std::string name;  // for its picture; empty if it needs none
   };
   std::optional<Begun> begun_;  // the step that is not over yet
   std::vector<std::string> problems_;

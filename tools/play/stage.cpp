@@ -12,7 +12,7 @@ namespace {
 
 constexpr toolkit::Rect parentContent{80, 80, 800, 600};
 
-/// Takes the sheet away when it has ended, which is its delegate's part.
+/// Removes the sheet when it has ended, which is its delegate's task.
 class SheetRemover final : public toolkit::SheetDelegate {
  public:
   void sheetDidEnd(const toolkit::Ref<toolkit::Window>& sheet, long, void*) override {
@@ -39,7 +39,7 @@ Stage::Stage(toolkit::TestDriver& driver, const PlayOptions& options,
 Stage::~Stage() {
   forgetScript();
   if (engine_->terminating()) return;
-  driver_.setLogSink({});  // what is left to be tidied up is no part of the walk-through
+  driver_.setLogSink({});  // tidying up is not part of the walk-through
   engine_->terminateParser();
 }
 
@@ -53,7 +53,7 @@ void Stage::buildFrom(const std::string& descriptionFile) {
 void Stage::adopt(const HostWindow& host, const std::string& file) {
   title_ = host.title;
   adopted_ = makeHostWindow(driver_, host, file);
-  if (sheet_) adopted_->orderOut();  // it is not seen before it is attached
+  if (sheet_) adopted_->orderOut();  // a sheet is not visible before it is attached
   engine_ = QZ_Plist_State_Parser::initWithWindow(driver_.toolkit(), sheet_ ? parent_ : adopted_);
   engine_->getGuiAssetsFromWindow(adopted_);
 }

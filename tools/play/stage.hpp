@@ -12,12 +12,12 @@
 
 namespace tools::play {
 
-/// Sets the walk-through window up as the options say, from the host's window, from a description,
-/// or, without either, from the script itself. The driver outlives it; at its end the engine is
-/// terminated, for its timers would keep it alive.
+/// Sets up the walk-through window as the options say: from the host's window, from a description,
+/// or, without either, from the script itself. The driver must outlive it. Terminates the engine on
+/// destruction, because the engine's timers would keep it alive.
 class Stage {
  public:
-  /// A Failure when a file is not what it should be.
+  /// Throws a Failure if a file does not hold what it should.
   Stage(toolkit::TestDriver& driver, const PlayOptions& options,
         const QZ_Plist_State_Parser::Dictionary& script);
   ~Stage();
@@ -25,11 +25,10 @@ class Stage {
   Stage& operator=(const Stage&) = delete;
 
   QZ_Plist_State_Parser& engine() { return *engine_; }
-  /// The walk-through window's title; empty when it has none.
+  /// Returns the walk-through window's title; empty if it has none.
   const std::string& title() const { return title_; }
 
-  /// Loads the script at an absolute path and runs its list under `startKey`. What a list raises
-  /// flies through.
+  /// Loads the script at an absolute path and runs its list under `startKey`. Passes exceptions on.
   bool load(const std::string& script, const std::string& startKey);
 
  private:

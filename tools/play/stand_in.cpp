@@ -16,7 +16,7 @@ namespace {
 
 using toolkit::ViewKind;
 
-/// Which element of a compound command is a tag, and what the command takes the control for.
+/// Which element of a compound command is a tag, and which kind of control the command suggests.
 struct TagUse {
   const std::string& command;
   std::size_t element;
@@ -49,7 +49,7 @@ const TagUse tagUses[] = {
     {QZ_PLIST_STATE_PARSER_SET_TAG_FOR_OBJECT_ID_WITH_TIMER, 2, anything},
 };
 
-/// The more a kind can do, the less it may be taken for another.
+/// If commands suggest several kinds for a tag, the one with the highest rank wins.
 int rank(ViewKind kind) {
   if (kind == ViewKind::imageView) return 3;
   if (kind == ViewKind::toggle) return 2;

@@ -7,9 +7,9 @@
 
 namespace tools::play {
 
-/// A window with one control for every tag that the script names: buttons where it has a list or
-/// does what only buttons can, images and texts where commands put them. In the tags' order from
-/// top to bottom.
+/// Returns a window with one control for every tag that the script names, from top to bottom in the
+/// order of the tags. The script's use of a tag decides its kind: image view, check box, button
+/// (also if it has a list), else text field.
 HostWindow standInWindow(const toolkit::ValueRef<toolkit::Dictionary>& script);
 
 }  // namespace tools::play

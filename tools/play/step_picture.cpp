@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Looking at a walk-through from outside.
+// Takes pictures of a walk-through.
 #include "tools/play/step_picture.hpp"
 
 #include <algorithm>
@@ -30,7 +30,7 @@ std::vector<ControlPicture> lookAtControls(toolkit::TestDriver& driver,
   for (const auto& view : content->subviews()) {
     ControlPicture& control = controls.emplace_back(lookAtControl(driver, engine, view));
     control.shadowed = !tags.insert(view->tag()).second;
-    if (control.shadowed) control.flashing = false;  // the one behind it flashes in its place
+    if (control.shadowed) control.flashing = false;  // the control behind it flashes instead
   }
   return controls;
 }

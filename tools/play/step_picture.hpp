@@ -14,12 +14,12 @@
 namespace tools::play {
 
 struct ControlPicture {
-  /// Stands for the control itself, so that it is known again whatever its tag has become.
+  /// Identifies the control even after its tag has changed.
   std::weak_ptr<const void> identity;
   toolkit::ViewPicture view;
-  bool flashing = false;  ///< its highlight is toggled by every tick of the flasher
+  bool flashing = false;  ///< every tick of the flasher toggles its highlight
   bool hasList = false;   ///< the script has a list under its tag
-  bool shadowed = false;  ///< a control behind it has the same tag, and is found in its place
+  bool shadowed = false;  ///< a control behind it has the same tag, and is found instead
 };
 
 struct TimerPicture {
@@ -29,7 +29,7 @@ struct TimerPicture {
 };
 
 struct StepPicture {
-  std::string title;                             ///< of the window, as its host says; may be empty
+  std::string title;  ///< of the window, as its host gave it; may be empty
   std::optional<toolkit::WindowPicture> window;  ///< absent: there is no walk-through window
   std::vector<ControlPicture> controls;          ///< directly in the window, back to front
   std::vector<TimerPicture> timers;              ///< pending, in the order of their firing
@@ -38,8 +38,8 @@ struct StepPicture {
   bool ended = false;  ///< the walk-through is over
 };
 
-/// Looks at the walk-through that `engine` runs on the driver's toolkit. The title is the caller's
-/// to know: the toolkit's windows have none.
+/// Takes a picture of the walk-through that `engine` runs on the driver's toolkit. The caller gives
+/// the window's title, because the toolkit's windows have none.
 StepPicture takePicture(toolkit::TestDriver& driver, const QZ_Plist_State_Parser& engine,
                         std::string title);
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// How the transcript puts into words what a control or a window shows.
+// Puts into words what a control or a window shows, for the transcript.
 #include "tools/play/words.hpp"
 
 #include <array>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// How the transcript puts into words what a control or a window shows.
+// Puts into words what a control or a window shows, for the transcript.
 #pragma once
 
 #include <string>
@@ -12,38 +12,38 @@
 
 namespace tools::play {
 
-/// A person's word for a kind of view, such as "check box".
+/// Returns the everyday word for a kind of view, such as "check box".
 std::string_view kindWord(toolkit::ViewKind kind);
 
-/// Whether views of the kind are buttons: what a user presses, and what has a title.
+/// Whether views of the kind are buttons: a user can press them, and they have a title.
 bool isButton(toolkit::ViewKind kind);
 
-/// "on", "off" or "mixed".
+/// Returns "on", "off" or "mixed".
 std::string_view stateWord(toolkit::State state);
 
-/// A standard colour by its name, any other as "#rrggbb", with its opacity where it has one.
+/// Returns the name of a standard colour; "#rrggbb" for any other, with its opacity if below 1.
 std::string colorWords(const toolkit::Color& color);
 
-/// The attributes of a run, such as "Times 12 bold, red, centred"; "plain" when it has none.
+/// Returns the attributes of a run, such as "Times 12 bold, red, centred"; "plain" if it has none.
 std::string styleWords(const toolkit::TextAttributes& attributes);
 
-/// When something happens that so many seconds are left to: "in 2.5 s", or, from a year on,
-/// "practically never".
+/// Says when something happens that is `seconds` ahead: "in 2.5 s", or "practically never" from a
+/// year on.
 std::string whenWords(double seconds);
 
-/// A number in as few digits as say it, such as "12" or "12.5".
+/// Returns a number in at most six significant digits, such as "12" or "12.5".
 std::string numberWords(double number);
 
-/// What the control says to its user: the title of a button, the text of anything else.
+/// Returns what the control says to its user: the title of a button, the text of anything else.
 const toolkit::AttributedString& captionOf(const ControlPicture& control);
 
-/// The caption without its attributes, or the image of an image view.
+/// Returns the caption without its attributes, or the name of an image view's image.
 std::string contentOf(const ControlPicture& control);
 
-/// What is worth knowing about the control beside its content, such as "hidden" or "tooltip “…”".
+/// Returns what else is worth knowing about the control, such as "hidden" or "tooltip “…”".
 std::vector<std::string> remarksOn(const ControlPicture& control);
 
-/// The same about a window: its size, whether it is seen, its background.
+/// The same about a window: its size, whether it is on the screen, its background.
 std::vector<std::string> remarksOn(const toolkit::WindowPicture& window);
 
 }  // namespace tools::play

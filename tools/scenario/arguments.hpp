@@ -18,26 +18,26 @@ struct Statement;
 
 class Arguments {
  public:
-  /// `slot` is a slot of the form, or one of its own words. It outlives the arguments.
+  /// `slot` is a slot of the form, or one of its literal words. It must outlive the arguments.
   void add(std::string_view slot, Word word) { words_.emplace_back(slot, std::move(word)); }
 
   bool has(std::string_view slot) const;
-  /// The word in a slot; asking for one that is not there is a mistake of ours.
+  /// Returns the word in a slot. Asking for a slot without a word is a programming error.
   const Word& word(std::string_view slot) const;
   const std::string& text(std::string_view slot) const { return word(slot).text; }
   std::vector<std::string> texts(std::string_view slot) const;
 
-  // Numbers; the parser has seen that they are such.
+  // Numbers. The parser has checked that the words are numbers.
   double number(std::string_view slot) const;
   std::int64_t whole(std::string_view slot) const;
   std::uint64_t unsignedWhole(std::string_view slot) const;
 
-  /// The statement that this one holds, of those that hold one.
+  /// Returns the statement that this one holds; null if it holds none.
   const std::shared_ptr<const Statement>& nested() const { return nested_; }
   void setNested(std::shared_ptr<const Statement> statement) { nested_ = std::move(statement); }
 
-  /// The same arguments with `change` made to every text, also within JSON, but not within the
-  /// statement that is held.
+  /// Returns the same arguments with `change` applied to every text, also within JSON, but not
+  /// within the nested statement.
   Arguments changed(const std::function<std::string(std::string)>& change) const;
 
  private:

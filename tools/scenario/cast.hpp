@@ -19,28 +19,29 @@ class Cast {
   using Window = toolkit::Ref<toolkit::Window>;
   using View = toolkit::Ref<toolkit::View>;
 
-  /// `engines` outlives the cast; its engine knows #TAG, @INDEX and `tutorial`.
+  /// `engines` must outlive the cast; its engine resolves #TAG, @INDEX and `tutorial`.
   explicit Cast(const EngineHolder& engines) : engines_(engines) {}
 
   void nameWindow(const std::string& name, toolkit::StoredRef<toolkit::Window> window);
   void nameControl(const std::string& name, toolkit::StoredRef<toolkit::View> control);
 
-  /// The window; throws an Unmet when there is none.
+  /// Returns the window; throws an Unmet if there is none.
   Window window(const std::string& name) const;
-  /// The control; throws an Unmet when there is none.
+  /// Returns the control; throws an Unmet if there is none.
   View control(const std::string& name) const;
-  /// The control, or absent.
+  /// Returns the control, or absent.
   View findControl(const std::string& name) const;
 
-  /// From now on the host does not keep what it declared under the name.
+  /// From now on, the host does not keep the window or control with this name alive.
   void letGo(const std::string& name);
-  /// From now on the host keeps the control.
+  /// From now on, the host keeps the control alive.
   void keep(const std::string& controlName);
 
   bool namesWindow(const std::string& name) const;
-  /// The name of a window; `tutorial` for an unnamed one that is the engine's; nothing for none.
+  /// Returns the name of a window, else `tutorial` for the engine's and `an unnamed window` for any
+  /// other; absent if `window` is.
   std::optional<std::string> nameOf(const Window& window) const;
-  /// The name of a control, or #TAG; nothing for none.
+  /// Returns the name of a control, else #TAG; absent if `control` is.
   std::optional<std::string> nameOf(const View& control) const;
 
  private:

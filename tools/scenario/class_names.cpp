@@ -17,7 +17,7 @@ bool isClassNameCharacter(char c) {
 
 }  // namespace
 
-// Names that a toolkit gives to several kinds are the same from then on; so are theirs.
+// Kinds to which a toolkit gives the same name share one representative.
 ClassNames::ClassNames(const toolkit::TestDriver& driver) {
   for (const auto name : viewKindNames()) {
     const std::string standard(name.substr(0, name.find(':')));

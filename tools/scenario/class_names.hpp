@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The names of the kinds of view, on a toolkit that gives them names of its own.
+// The names of the kinds of view, on a toolkit that has its own names for them.
 #pragma once
 
 #include <map>
@@ -15,8 +15,8 @@ class ClassNames {
  public:
   explicit ClassNames(const toolkit::TestDriver& driver);
 
-  /// `text` with every class name in it replaced by one that stands for the kind, whether it is the
-  /// standard name, such as NSButton, or the toolkit's. Two texts that differ only in these names
+  /// Returns `text` with every class name, be it the standard name, such as NSButton, or the
+  /// toolkit's, replaced by one that represents the kind. Two texts that differ only in these names
   /// become the same.
   std::string unified(std::string_view text) const;
   /// The same in every text of a value.

@@ -62,7 +62,7 @@ std::vector<std::string_view> commandConstants() {
 }
 
 RenamedCommands::~RenamedCommands() {
-  // In reverse, for one may have been renamed twice.
+  // In reverse, because a command may have been renamed twice.
   for (auto change = before_.rbegin(); change != before_.rend(); ++change) {
     *change->first = std::move(change->second);
   }

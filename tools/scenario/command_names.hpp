@@ -9,10 +9,10 @@
 
 namespace tools::scenario {
 
-/// The constants' names, in the order of their declaration.
+/// Returns the constants' names, in the order of their declaration.
 std::vector<std::string_view> commandConstants();
 
-/// Renames commands, and gives them their names back in the end.
+/// Renames commands, and restores their names on destruction.
 class RenamedCommands {
  public:
   RenamedCommands() = default;
@@ -20,7 +20,7 @@ class RenamedCommands {
   RenamedCommands(const RenamedCommands&) = delete;
   RenamedCommands& operator=(const RenamedCommands&) = delete;
 
-  /// `constant` is one of `commandConstants`.
+  /// `constant` must be one of `commandConstants`.
   void rename(std::string_view constant, std::string name);
 
  private:

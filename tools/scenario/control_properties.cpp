@@ -17,7 +17,7 @@ namespace {
 using toolkit::ViewKind;
 using toolkit::ViewPicture;
 
-// --- what they show ---
+// --- reading ---
 
 bool isButton(const ViewPicture& picture) {
   return picture.kind == ViewKind::button || picture.kind == ViewKind::toggle ||
@@ -77,7 +77,7 @@ Reading throughout(const Stage&, const ViewPicture& picture) {
 
 Reading runs(const Stage&, const ViewPicture& picture) { return showRuns(styledText(picture)); }
 
-// --- what they can be set to ---
+// --- writing ---
 
 using View = Cast::View;
 

@@ -14,8 +14,7 @@ namespace tools::scenario {
 namespace driving {
 namespace {
 
-// --- arguments as the engine takes them; what the statement leaves out or calls `none` is absent
-// ---
+// --- arguments for the engine; absent if the statement leaves them out or says `none` ---
 
 std::optional<std::string> optionalText(const Arguments& a, std::string_view slot) {
   return a.has(slot) ? std::optional(a.text(slot)) : std::nullopt;
@@ -60,7 +59,7 @@ Outcome assets(Stage& stage, const Arguments& a) {
   return stage.engines.held()->loadGuiAssets(description, nullptr);
 }
 
-// The script that the engine would read, for the stack guard, which must know it before it runs.
+// Returns the script that the engine would read: the stack guard must know it before it runs.
 Engine::Dictionary scriptNamed(const std::string& name, const toolkit::Files& files) {
   const auto path = std::filesystem::path(files.resourcePath()) / name;
   const auto contents = files.contentsAtPath(path.string());

@@ -24,7 +24,7 @@ void EngineHolder::begin(std::shared_ptr<Engine> engine) {
   held_ = std::move(engine);
 }
 
-// The engine may end here, and call back while it does: by then the host holds it no more.
+// The engine may be destroyed here and call back; by then the host no longer holds it.
 void EngineHolder::release() { const auto last = std::exchange(held_, nullptr); }
 
 std::shared_ptr<Engine> EngineHolder::held() const {

@@ -14,21 +14,21 @@ using Engine = QZ_Plist_State_Parser;
 class EngineHolder {
  public:
   EngineHolder() = default;
-  /// Stops the engines that are still there, for a running flasher would keep them for good.
+  /// Stops the timers of engines that still exist: a running flasher would keep its engine alive.
   ~EngineHolder();
   EngineHolder(const EngineHolder&) = delete;
   EngineHolder& operator=(const EngineHolder&) = delete;
 
-  /// Takes a new engine in place of the one before.
+  /// Holds a new engine in place of the one before.
   void begin(std::shared_ptr<Engine> engine);
-  /// The host lets go of the engine.
+  /// Releases the engine that the host holds.
   void release();
 
-  /// The engine that the host holds; throws an Unmet when it holds none.
+  /// Returns the engine that the host holds; throws an Unmet if it holds none.
   std::shared_ptr<Engine> held() const;
-  /// The engine, whether or not the host still holds it; null when there is none (any more).
+  /// Returns the engine, whether or not the host still holds it; null if there is none (any more).
   std::shared_ptr<Engine> current() const { return current_.lock(); }
-  /// The same; throws an Unmet instead of giving null.
+  /// The same; throws an Unmet instead of returning null.
   std::shared_ptr<Engine> existing() const;
 
  private:

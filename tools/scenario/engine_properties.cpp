@@ -13,7 +13,7 @@ namespace tools::scenario {
 namespace engine_properties {
 namespace {
 
-// --- what the engine's types show ---
+// --- reading the engine's types ---
 
 Reading show(const Stage&, bool flag) { return Json(flag); }
 
@@ -45,7 +45,7 @@ Reading show(const Stage&, const Engine::Timers& timers) {
   return intervals;
 }
 
-// A control that is gone shows as null in place of its tag.
+// Null replaces the tag of a control that is gone.
 Reading show(const Stage&, const Engine::GuiAssets& assets) {
   if (!assets) return std::nullopt;
   auto records = Json::object();
@@ -57,7 +57,7 @@ Reading show(const Stage&, const Engine::GuiAssets& assets) {
   return records;
 }
 
-// --- what they can be set to ---
+// --- writing ---
 
 template <class T>
 struct Written {};
@@ -104,7 +104,7 @@ struct Written<Engine::Timer> {
   static Engine::Timer from(const Stage&, const Wanted&) { return {}; }
 };
 
-/// Tables of things that are no values can only be made without any.
+/// A table of things that are not values can only be made empty.
 template <class T>
 struct Written<toolkit::Ref<T>> {
   static toolkit::Ref<T> from(const Stage&, const Wanted& value) {

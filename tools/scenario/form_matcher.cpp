@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Finding the form that a statement is written in.
+// Finds the form that a statement is written in.
 
 #include "tools/scenario/form_matcher.hpp"
 
@@ -23,17 +23,17 @@ std::vector<std::string_view> split(std::string_view text, char separator) {
   return parts;
 }
 
-// A slot has a capital in its name; a word that stands for itself has none.
+// A slot has a capital in its name; a literal word has none.
 bool isSlot(std::string_view part) {
   return std::any_of(part.begin(), part.end(),
                      [](char c) { return std::isupper(static_cast<unsigned char>(c)) != 0; });
 }
 
-/// Why words are not written in a form.
+/// Why words do not fit a form.
 struct Mismatch {
   std::size_t word = 0;               ///< the first that does not fit
-  std::optional<SyntaxError> reason;  ///< what can be said about it in particular
-  std::vector<std::string> expected;  ///< otherwise
+  std::optional<SyntaxError> reason;  ///< a more precise reason, if there is one
+  std::vector<std::string> expected;  ///< what was expected, if there is no reason
 };
 
 /// One attempt at one form.
@@ -41,7 +41,7 @@ class Attempt {
  public:
   Attempt(std::span<const Word> words, SlotContext context) : words_(words), context_(context) {}
 
-  /// The match, its `form` not yet set; nothing when the words are not written in the form.
+  /// Returns the match, its `form` not yet set; absent if the words do not fit the form.
   std::optional<Match> match(const Form& form) {
     const auto parts = split(form.syntax, ' ');
     bool skipping = false;
@@ -73,8 +73,8 @@ class Attempt {
     return std::nullopt;
   }
 
-  // An optional part that begins with a word of its own is there when that word is; any other when
-  // anything is left.
+  // An optional part that begins with a literal word is present if that word is; one that begins
+  // with a slot, if any word is left.
   bool optionalBegins(std::string_view part) const {
     if (next_ == words_.size()) return false;
     return isSlot(part) || words_[next_].isBare(part);
@@ -97,7 +97,7 @@ class Attempt {
                                                           : alternative);
     }
     if (next_ == words_.size()) return false;
-    // Words that stand for themselves come first: a slot may take any word.
+    // Literal words come first: a slot may take any word.
     return takeAlternative(alternatives, false) || takeAlternative(alternatives, true);
   }
 
@@ -131,7 +131,7 @@ class Attempt {
   Mismatch mismatch_;
 };
 
-/// Those that are words of the language; a slot is described in several.
+/// Returns the literal words in `expected`; the description of a slot has several words.
 std::vector<std::string_view> ownWords(const std::vector<std::string>& expected) {
   std::vector<std::string_view> words;
   for (const auto& one : expected) {
@@ -140,7 +140,7 @@ std::vector<std::string_view> ownWords(const std::vector<std::string>& expected)
   return words;
 }
 
-/// Of all mismatches, what is to be said about those that came furthest.
+/// Throws the SyntaxError about the mismatches that came furthest.
 [[noreturn]] void refuse(std::span<const Word> words, Position end,
                          const std::vector<Mismatch>& mismatches, std::string_view onlySyntax) {
   const auto furthest =

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Finding the form that a statement is written in.
+// Finds the form that a statement is written in.
 #pragma once
 
 #include <cstddef>
@@ -15,19 +15,19 @@
 
 namespace tools::scenario {
 
-/// The first word of a form.
+/// Returns the first word of a form.
 std::string_view keywordOf(const Form& form);
 
 struct Match {
   std::size_t form;  ///< in the forms that were tried
   Arguments arguments;
   std::vector<std::pair<Word, NameKind>> declared;
-  std::size_t used;  ///< how many words; more follow only where the form ends in a statement
+  std::size_t used;  ///< how many words; more follow only if the form ends in a statement
 };
 
-/// The first of the vocabulary's forms that `words` (at least one) are written in; `end` is the
-/// place behind the last of them. Throws a SyntaxError that says what was found and expected where
-/// the words ceased to make sense.
+/// Returns the match of the vocabulary's first form that fits `words` (at least one). `end` is the
+/// place after the last of them. Throws a SyntaxError at the first word that fits no form; it says
+/// what was found and what was expected.
 Match matchForm(std::span<const Word> words, Position end, const Vocabulary& vocabulary,
                 const Names& names);
 

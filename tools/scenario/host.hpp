@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The host of a scenario: the objects of its own, and what it does when something happens.
+// The host of a scenario: its own objects, and its reactions to events.
 #pragma once
 
 #include <functional>
@@ -15,8 +15,8 @@
 
 namespace tools::scenario {
 
-/// The target of the controls that `target` named, and the delegate of the windows that `delegate`
-/// did.
+/// The target of the controls named by `target`, and the delegate of the windows named by
+/// `delegate`.
 class HostResponder final : public toolkit::Responder {
  public:
   using Performed = std::function<void(const toolkit::Ref<toolkit::View>& sender)>;
@@ -31,7 +31,7 @@ class HostResponder final : public toolkit::Responder {
   Performed performed_;
 };
 
-/// The delegate of every sheet: notes the return codes and orders the sheet out.
+/// The delegate of every sheet: records the return codes and orders the sheet out.
 class SheetRecorder final : public toolkit::SheetDelegate {
  public:
   explicit SheetRecorder(std::function<void()> ended) : ended_(std::move(ended)) {}
@@ -44,10 +44,10 @@ class SheetRecorder final : public toolkit::SheetDelegate {
   std::vector<long> returnCodes_;
 };
 
-/// What the host does when something happens, each once: the statements that `when` holds.
+/// The statements that `when` holds; each runs once, when its event happens.
 class Reactions {
  public:
-  /// Something that happens: a log line, the host's action, or the end of a sheet.
+  /// An event: a log line, the host's action, or the end of a sheet.
   struct Event {
     enum class Kind { log, action, sheetEnd };
     Kind kind;
@@ -57,12 +57,12 @@ class Reactions {
   struct Reaction {
     std::string awaited;  ///< the event in words
     std::function<bool(const Event&)> isFor;
-    const Statement* when;  ///< where it was asked for; the scenario's, which outlives it
+    const Statement* when;  ///< the statement that holds it; the scenario owns it and outlives this
     std::shared_ptr<const Statement> statement;
   };
 
   void add(Reaction reaction) { waiting_.push_back(std::move(reaction)); }
-  /// Takes the reactions that `event` is for.
+  /// Removes and returns the reactions to `event`.
   std::vector<Reaction> take(const Event& event);
   const std::vector<Reaction>& waiting() const { return waiting_; }
 

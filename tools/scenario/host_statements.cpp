@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Statements that say what the host does besides calling the engine: what it changes, keeps, lets
-// go of, and does when something happens.
+// Statements for what the host does in addition to calling the engine: it changes, keeps and
+// releases things, and reacts to events.
 
 #include "tools/scenario/properties.hpp"
 #include "tools/scenario/references.hpp"
@@ -32,7 +32,7 @@ Outcome setProperty(Stage& stage, const Arguments& a) {
   return {};
 }
 
-// The host still has the control in its hand, and a scenario can look at it.
+// The host keeps the control alive, so that a scenario can still look at it.
 Outcome remove(Stage& stage, const Arguments& a) {
   stage.cast.keep(a.text("C"));
   stage.driver.removeFromSuperview(stage.cast.control(a.text("C")));

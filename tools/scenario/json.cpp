@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// JSON in scenarios: comparing and showing.
+// Compares and shows JSON in scenarios.
 
 #include "tools/scenario/json.hpp"
 
@@ -12,7 +12,7 @@ namespace {
 
 bool isInteger(const Json& value) { return value.is_number_integer(); }
 
-// Integers are compared as such: as floating-point numbers, large neighbours would be equal.
+// Compares integers as integers: as floating-point numbers, large neighbours would be equal.
 bool sameNumber(const Json& a, const Json& b) {
   if (!isInteger(a) || !isInteger(b)) return a.get<double>() == b.get<double>();
   if (a.is_number_unsigned() != b.is_number_unsigned()) {
@@ -25,7 +25,7 @@ bool sameNumber(const Json& a, const Json& b) {
 
 bool sameObject(const Json& a, const Json& b) {
   if (a.size() != b.size()) return false;
-  // An index, for a look-up by key in the object itself walks all of its keys.
+  // An index, because a look-up by key in the object itself walks all of its keys.
   std::map<std::string_view, const Json*> index;
   for (const auto& [key, value] : b.items()) index.emplace(key, &value);
   return std::all_of(a.items().begin(), a.items().end(), [&](const auto& item) {
@@ -68,7 +68,7 @@ std::string whereDifferent(const Json& a, const Json& b) {
     if (other == b.end()) return "." + key;
     if (!sameJson(value, *other)) return "." + key + whereDifferent(value, *other);
   }
-  // All that `a` has is the same, so `b` has a key more.
+  // Every member of `a` is the same in `b`, so `b` has a key that `a` lacks.
   const auto more =
       std::ranges::find_if(b.items(), [&](const auto& item) { return !a.contains(item.key()); });
   return "." + more.key();

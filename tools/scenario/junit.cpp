@@ -13,9 +13,9 @@ namespace {
 
 constexpr std::string_view replacement = "\xEF\xBF\xBD";
 
-/// `text` as UTF-8 that XML allows. Logged text may hold anything, lone surrogates among it.
+/// Returns `text` as UTF-8 that XML allows. Logged text may hold anything, even lone surrogates.
 std::string allowed(const std::string& text) {
-  // The JSON library replaces what is no UTF-8; what it escapes comes back by parsing.
+  // The JSON library replaces bytes that are not UTF-8; parsing undoes its escapes.
   const auto valid = Json::parse(Json(text).dump(-1, ' ', false, Json::error_handler_t::replace))
                          .get<std::string>();
   std::string result;
@@ -50,7 +50,7 @@ std::string escaped(const std::string& text) {
       case '"':
         result += "&quot;";
         break;
-      // Written as they are, an attribute would read them as blanks.
+      // Unescaped, these would be read as blanks in an attribute.
       case '\n':
         result += "&#10;";
         break;
@@ -77,7 +77,7 @@ std::string seconds(double value) {
   return text;
 }
 
-/// The counts and the time of some reports, as attributes.
+/// Returns the counts and the time of some reports, as attributes.
 std::string totals(const Report* first, const Report* last) {
   const auto count = [&](Verdict verdict) {
     return std::to_string(std::count_if(
@@ -90,7 +90,7 @@ std::string totals(const Report* first, const Report* last) {
          attribute("skipped", count(Verdict::skipped)) + attribute("time", seconds(time));
 }
 
-/// "dir/intro.walk" as "dir.intro": services group test cases by the dots.
+/// Turns "dir/intro.walk" into "dir.intro": services group test cases by the dots.
 std::string className(const std::string& file) {
   auto name = std::filesystem::path(file).lexically_normal().replace_extension().generic_string();
   while (name.starts_with("/") || name.starts_with("../")) name.erase(0, name.find('/') + 1);

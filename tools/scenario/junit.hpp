@@ -9,8 +9,8 @@
 
 namespace tools::scenario {
 
-/// One test suite a file, in the order of the reports, with one test case a scenario. What XML
-/// cannot hold shows as U+FFFD.
+/// Returns one test suite per file, in the order of the reports, with one test case per scenario.
+/// Characters that XML does not allow become U+FFFD.
 std::string junitReport(const std::vector<Report>& reports);
 
 }  // namespace tools::scenario

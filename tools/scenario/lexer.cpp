@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// From the text of a scenario file to its statements' words.
+// Splits the text of a scenario file into the words of its statements.
 
 #include "tools/scenario/lexer.hpp"
 
@@ -19,7 +19,7 @@ bool isBlank(char c) { return c == ' ' || c == '\t' || c == '\r'; }
 bool isHexDigit(char c) { return isDigit(c) || (c >= 'a' && c <= 'f') || (c >= 'A' && c <= 'F'); }
 bool continuesCharacter(char c) { return (static_cast<unsigned char>(c) & 0xC0U) == 0x80U; }
 
-/// The message of a JSON error without the library's prefix and position.
+/// Returns the message of a JSON error without the library's prefix and position.
 std::string plainMessage(const std::string& message) {
   const auto start = message.find("parse error") == std::string::npos
                          ? message.find("] ") + 2
@@ -27,7 +27,7 @@ std::string plainMessage(const std::string& message) {
   return message.substr(start);
 }
 
-/// The first key that stands twice in one object of the JSON that is being parsed.
+/// Finds the first key that occurs twice in one object of the JSON that is being parsed.
 class RepeatedKeys {
  public:
   void see(Json::parse_event_t event, const Json& parsed) {
@@ -138,20 +138,20 @@ class Lexer {
     }
     raw += take();
     requireWordEnd("the closing quotation mark");
-    // Only a pair of \u escapes that is none can still be wrong.
+    // Only a \u escape for half of a surrogate pair can still be wrong.
     const auto decoded = Json::parse(raw, nullptr, false);
     if (decoded.is_discarded()) throw SyntaxError(word.at, "a \\u escape without its partner");
     word.text = decoded.get<std::string>();
     return word;
   }
 
-  /// A byte as JSON reads it, which has no tabs within quotation marks.
+  /// Takes a byte and returns it as JSON, which allows no tab within quotation marks.
   std::string plainCharacter() {
     const char c = take();
     return c == '\t' ? "\\t" : std::string(1, c);
   }
 
-  /// An escape as JSON reads it. `\*` is none of JSON's, but what the pattern of a log line needs.
+  /// Takes an escape and returns it as JSON. JSON lacks `\*`, which patterns of log lines need.
   std::string escape() {
     const auto at = at_;
     std::string escape(1, take());
@@ -195,8 +195,8 @@ class Lexer {
     return word;
   }
 
-  /// The text from the bracket here to the one that closes it, with blanks in place of comments, so
-  /// that its bytes stand where they stand in the file.
+  /// Takes the text from the bracket here to the one that closes it. Blanks replace comments, so
+  /// that offsets in the text are offsets in the file.
   std::string bracketedText() {
     const auto start = at_;
     std::string text;
@@ -234,7 +234,7 @@ class Lexer {
     text += take();
   }
 
-  /// Where the byte stands that is the `count`th (from 1) behind `offset`, which lies at `from`.
+  /// Returns the place of byte `count` (from 1) of the text at `offset`, which begins at `from`.
   Position positionAt(Position from, std::size_t offset, std::size_t count) const {
     Lexer walker(*this);
     walker.at_ = from;
@@ -248,7 +248,7 @@ class Lexer {
   Position at_;
 };
 
-/// The length of the character at the start of `text`; 0 when it is no UTF-8.
+/// Returns the length of the character at the start of `text`; 0 if it is not UTF-8.
 std::size_t characterLength(std::string_view text) {
   const auto byte = [&](std::size_t i) -> unsigned {
     return i < text.size() ? static_cast<unsigned char>(text[i]) : 0;
@@ -259,7 +259,7 @@ std::size_t characterLength(std::string_view text) {
   for (std::size_t i = 1; i < length; ++i) {
     if ((byte(i) & 0xC0U) != 0x80U) return 0;
   }
-  // Overlong forms, surrogates, and what lies beyond the last character.
+  // Overlong forms, surrogates, and code points above U+10FFFF.
   const bool wrong = (byte(0) == 0xE0 && byte(1) < 0xA0) || (byte(0) == 0xED && byte(1) > 0x9F) ||
                      (byte(0) == 0xF0 && byte(1) < 0x90) || (byte(0) == 0xF4 && byte(1) > 0x8F);
   return wrong ? 0 : length;

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
-// From the text of a scenario file to its statements' words.
+// Splits the text of a scenario file into the words of its statements.
 //
 // A word is bare, "quoted", or JSON that begins with a bracket or a brace. A statement ends with
-// its line, unless a bracket or brace is open. A `#` where a word could start, also within JSON,
-// starts a comment; only where it is followed by a whole number and the word ends there or goes on
-// with a dot, as in #5 or #-3.text, it is the name of a control by its tag.
+// its line, unless a bracket or brace is open. A `#` at the start of a word begins a comment,
+// unless a whole number follows and then the end of the word or a dot, as in #5 or #-3.text: that
+// names a control by its tag. Within JSON, every `#` outside a string begins a comment.
 #pragma once
 
 #include <stdexcept>
@@ -24,7 +24,7 @@ struct Position {
   friend bool operator==(const Position&, const Position&) = default;
 };
 
-/// The text is no scenario: where, and what is wrong.
+/// Thrown if the text is not a scenario: says where, and what is wrong.
 class SyntaxError : public std::runtime_error {
  public:
   SyntaxError(Position at, const std::string& message) : std::runtime_error(message), at_(at) {}
@@ -38,8 +38,8 @@ struct Word {
   enum class Kind { bare, quoted, json };
 
   Kind kind = Kind::bare;
-  std::string text;  ///< quoted: without the quotation marks and escapes; JSON: as it stands
-  Json value;        ///< of JSON only
+  std::string text;  ///< quoted: without quotation marks and escapes; JSON: without comments
+  Json value;        ///< only if the word is JSON
   Position at;
 
   bool isBare(std::string_view word) const { return kind == Kind::bare && text == word; }
@@ -47,14 +47,14 @@ struct Word {
 
 struct Line {
   std::vector<Word> words;  ///< at least one
-  Position end;             ///< right behind the last word
+  Position end;             ///< right after the last word
   std::string source;       ///< the first line of the text, with an ellipsis if more follow
 };
 
 /// Deeper JSON is refused, as deeper property lists are.
 inline constexpr int deepestNesting = 512;
 
-/// The words of `text`, which is UTF-8, by statement. Throws a SyntaxError.
+/// Returns the words of `text`, which must be UTF-8, by statement. Throws a SyntaxError.
 std::vector<Line> readWords(std::string_view text);
 
 }  // namespace tools::scenario

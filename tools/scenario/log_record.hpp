@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The log of a scenario: every line, and how far it has been expected.
+// The log of a scenario: every line, and how many of them were expected so far.
 #pragma once
 
 #include <cstddef>
@@ -19,7 +19,7 @@ class LogRecord {
 
   void add(std::string_view text) { entries_.push_back({std::string(text), statementLine}); }
 
-  /// The next entry that was not yet expected; nothing when there is none.
+  /// Returns the first entry that was not yet expected; null if there is none.
   const Entry* next() const { return expected_ < entries_.size() ? &entries_[expected_] : nullptr; }
   std::size_t left() const { return entries_.size() - expected_; }
   void expectNext() { ++expected_; }

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// From the text of a scenario file to its scenarios.
+// Parses the text of a scenario file.
 
 #include "tools/scenario/parser.hpp"
 
@@ -15,7 +15,7 @@
 namespace tools::scenario {
 namespace {
 
-// The statements that shape the file itself. They stand behind the vocabulary's own.
+// The statements that structure the file. Their forms follow the vocabulary's own.
 constexpr Form scenarioForm{"scenario TEXT..."};
 constexpr Form onlyForm{"only TOOLKIT..."};
 
@@ -71,7 +71,7 @@ class FileParser {
     return file_.scenarios.back();
   }
 
-  // A scenario in which nothing stands would pass without having tried anything.
+  // An empty scenario would pass without testing anything.
   void requireStatements(const Scenario& current) const {
     if (current.statements.empty()) throw SyntaxError(currentAt_, "a scenario without a statement");
   }
@@ -101,7 +101,7 @@ class FileParser {
     return statement;
   }
 
-  /// `words` begin with the arrow.
+  /// `words` begins with the arrow.
   Clause clause(std::span<const Word> words, Position end, Result result) {
     if (result == Result::never) {
       throw SyntaxError(words[0].at, "this statement calls nothing that could have a result");
@@ -134,7 +134,7 @@ class FileParser {
   Names names_;
   Names commonNames_;
   ScenarioFile file_;
-  Position currentAt_;  // where the scenario begins that is being read
+  Position currentAt_;  // where the scenario that is being read begins
 };
 
 }  // namespace

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-// From the text of a scenario file to its scenarios.
+// Parses the text of a scenario file.
 //
-// Whatever can be known to be wrong before a scenario runs is refused here: statements that do not
-// exist, words that make no sense where they stand, names that nothing declares, properties that
-// nothing has. The parser knows the language from a vocabulary and runs nothing.
+// The parser refuses every error that can be found before a scenario runs: unknown statements,
+// misplaced words, undeclared names, unknown properties. It knows the language from a vocabulary
+// and runs nothing.
 #pragma once
 
 #include <cstddef>
@@ -17,10 +17,10 @@
 
 namespace tools::scenario {
 
-/// What stands behind `=>`.
+/// What follows `=>`.
 struct Clause {
   bool raises = false;
-  Word result;  ///< otherwise
+  Word result;  ///< unless `raises`
 };
 
 struct Statement {
@@ -28,22 +28,22 @@ struct Statement {
   Arguments arguments;
   std::optional<Clause> clause;
   Position at;
-  std::string source;  ///< as it is written; of several lines, the first
+  std::string source;  ///< as written; the first line if there are several
 };
 
 struct Scenario {
   std::string title;  ///< empty: the whole file is the scenario
   int line = 1;
-  std::vector<std::string> only;  ///< the toolkits that it is for; empty: all
+  std::vector<std::string> only;  ///< the toolkits that it runs on; empty: all
   std::vector<Statement> statements;
 };
 
 struct ScenarioFile {
-  std::vector<Statement> common;  ///< what every scenario begins with
+  std::vector<Statement> common;  ///< performed at the start of every scenario
   std::vector<Scenario> scenarios;
 };
 
-/// The scenarios in `text`, at least one. Throws a SyntaxError.
+/// Returns the scenarios in `text`, at least one. Throws a SyntaxError.
 ScenarioFile parseScenarios(std::string_view text, const Vocabulary& vocabulary);
 
 }  // namespace tools::scenario

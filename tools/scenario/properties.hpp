@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The properties of the engine, of controls and of windows: what they show, and what they can be
-// set to.
+// The properties of the engine, of controls and of windows: reads and writes them.
 #pragma once
 
 #include <functional>
@@ -17,11 +16,11 @@ std::vector<PropertyInfo> engineProperties();
 std::vector<PropertyInfo> controlProperties();
 std::vector<PropertyInfo> windowProperties();
 
-// Of a property that the parser has seen to be there; one that is not is a mistake of ours. The
-// readers and writers throw an Unmet when what they need is not there.
+// The parser has checked that the property exists; any other name is a programming error. The
+// readers and writers throw an Unmet if something that they need is missing.
 
-/// What shows the property of the engine as it is now, whatever it is later: of a table, that very
-/// table.
+/// Returns a function that shows the property's present value even after the property is set to
+/// another one; for a table, it shows this very table.
 std::function<Reading()> keepEngineProperty(Stage& stage, Engine& engine, std::string_view name);
 Reading readControlProperty(Stage& stage, const Cast::View& control, std::string_view name);
 Reading readWindowProperty(Stage& stage, const Cast::Window& window, std::string_view name);
@@ -30,10 +29,10 @@ void writeEngineProperty(Stage& stage, Engine& engine, std::string_view name, co
 void writeControlProperty(Stage& stage, const Cast::View& control, std::string_view name,
                           const Wanted& value);
 
-/// `engine`, `host`, `other` or nothing.
+/// Returns `engine`, `host` or `other`; absent if `responder` is null.
 Reading showResponder(const Stage& stage, const std::shared_ptr<toolkit::Responder>& responder);
 
-/// A timer as it shows: its interval, and whether it can still fire.
+/// Shows a timer: its interval, and whether it can still fire.
 Reading showTimer(const toolkit::Ref<toolkit::Timer>& timer);
 
 }  // namespace tools::scenario

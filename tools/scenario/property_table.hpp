@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What the tables of properties have in common.
+// What the tables of properties share.
 #pragma once
 
 #include <algorithm>
@@ -12,7 +12,7 @@
 
 namespace tools::scenario {
 
-/// The row about the property `name` in a table whose rows have an `info`.
+/// Returns the row for the property `name`, which must exist, in a table whose rows have an `info`.
 template <class Table>
 const auto& rowNamed(const Table& table, std::string_view name) {
   const auto found = std::find_if(std::begin(table), std::end(table),

@@ -10,7 +10,7 @@
 namespace tools::scenario {
 namespace {
 
-// Words that would read as something else where a name can stand.
+// Words that mean something else where a name is expected.
 constexpr std::string_view reservedNames[] = {"absent", "delegate", "engine", "entries",
                                               "log",    "none",     "plain",  "present",
                                               "state",  "tutorial"};

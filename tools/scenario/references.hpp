@@ -15,12 +15,12 @@
 
 namespace tools::scenario {
 
-/// The tag in "#TAG"; nothing when `text` is something else.
+/// Returns the tag in "#TAG"; absent if `text` is something else.
 std::optional<toolkit::Tag> tagIn(std::string_view text);
-/// The index in "@INDEX"; nothing when `text` is something else.
+/// Returns the index in "@INDEX"; absent if `text` is something else.
 std::optional<std::size_t> indexIn(std::string_view text);
 
-/// "SUBJECT", "SUBJECT.PROPERTY" or "SUBJECT.PROPERTY.KEY"; a key may hold further dots.
+/// "SUBJECT", "SUBJECT.PROPERTY" or "SUBJECT.PROPERTY.KEY"; a key may contain further dots.
 struct Path {
   std::string subject;
   std::optional<std::string> property;
@@ -28,18 +28,18 @@ struct Path {
 };
 Path splitPath(std::string_view text);
 
-/// What a name can stand for.
+/// What a name can refer to.
 enum class NameKind { window, control, kept };
 std::string_view describe(NameKind kind);
 
-/// The names that the statements up to here declare. Windows, controls and kept things share them.
+/// The names declared so far. Windows, controls and kept values share one set of names.
 class Names {
  public:
-  /// Why `word` cannot be declared; nothing when it can.
+  /// Says why `word` cannot be declared; absent if it can.
   std::optional<std::string> whyNotNew(const Word& word) const;
   void declare(const Word& word, NameKind kind);
 
-  /// What `name` stands for, also of the names that need no declaration: `tutorial`, #TAG, @INDEX.
+  /// Returns what `name` refers to, also if it needs no declaration: `tutorial`, #TAG, @INDEX.
   std::optional<NameKind> kindOf(std::string_view name) const;
   std::vector<std::string_view> all() const;
 

@@ -17,7 +17,7 @@ namespace {
 namespace fs = std::filesystem;
 
 // A white square with a black frame and its diagonals: header, 16 × 16 pixels of one grey bit each,
-// compressed, and the end. Written out here so that writing an image takes no library.
+// compressed, and the end. Written out here so that no image library is needed.
 constexpr std::array<unsigned char, 104> image = {
     0x89, 0x50, 0x4E, 0x47, 0x0D, 0x0A, 0x1A, 0x0A, 0x00, 0x00, 0x00, 0x0D, 0x49, 0x48, 0x44,
     0x52, 0x00, 0x00, 0x00, 0x10, 0x00, 0x00, 0x00, 0x10, 0x01, 0x00, 0x00, 0x00, 0x00, 0x37,
@@ -28,7 +28,7 @@ constexpr std::array<unsigned char, 104> image = {
     0x33, 0x38, 0x00, 0x00, 0x00, 0x00, 0x49, 0x45, 0x4E, 0x44, 0xAE, 0x42, 0x60, 0x82};
 
 fs::path makeTemporaryDirectory() {
-  // The canonical path, so that it reads the same wherever it comes back.
+  // The canonical path, so that the path is the same wherever it is reported.
   const auto parent = fs::canonical(fs::temp_directory_path());
   std::random_device random;
   while (true) {
@@ -51,7 +51,7 @@ ResourceDirectory::ResourceDirectory() {
 }
 
 ResourceDirectory::~ResourceDirectory() {
-  std::error_code ignored;  // what cannot be removed is the system's to clear away
+  std::error_code ignored;  // the system clears away what cannot be removed
   fs::remove_all(root_, ignored);
 }
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Running scenarios.
+// Runs scenarios.
 
 #include "tools/scenario/runner.hpp"
 

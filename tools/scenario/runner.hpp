@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Running scenarios, each on a stage of its own.
+// Runs scenarios, each on its own stage.
 #pragma once
 
 #include <filesystem>
@@ -24,27 +24,27 @@ enum class Verdict { passed, failed, skipped };
 struct Report {
   Verdict verdict = Verdict::passed;
   std::string file;
-  std::string title;  ///< the file's name where the whole file is the scenario
+  std::string title;  ///< the file's name if the whole file is the scenario
   int line = 0;       ///< where the scenario begins
   double seconds = 0;
-  // Of a failed one: where and what ("expected …, got …"), and the statement. Of a skipped one:
-  // why.
+  // If it failed: where, why ("expected …, got …") and the statement. If it was skipped, only
+  // `problem`: why.
   int failedLine = 0;
   std::string problem;
   std::string statement;
 };
 
 struct Runner {
-  /// Makes the toolkit for one scenario.
+  /// Makes the driver for one scenario.
   std::function<std::unique_ptr<toolkit::TestDriver>()> makeDriver;
-  std::string toolkit;  ///< its name
-  /// Is told of every statement that was performed: file, statement, outcome in words.
+  std::string toolkit;  ///< the name of its toolkit
+  /// Called after each statement that succeeded: file, statement, outcome in words.
   std::function<void(const std::string&, const Statement&, const std::string&)> performed;
 
   Report run(const LoadedFile& file, const Scenario& scenario) const;
 };
 
-/// The scenario's title, or the file's name where the whole file is the scenario.
+/// Returns the scenario's title, or the file's name if the whole file is the scenario.
 std::string titleOf(const LoadedFile& file, const Scenario& scenario);
 
 }  // namespace tools::scenario

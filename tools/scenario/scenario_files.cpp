@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Finding and reading scenario files.
+// Finds and reads scenario files.
 
 #include "tools/scenario/scenario_files.hpp"
 

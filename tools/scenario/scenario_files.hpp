@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Finding and reading scenario files.
+// Finds and reads scenario files.
 #pragma once
 
 #include <string>
@@ -11,12 +11,12 @@ namespace tools::scenario {
 
 struct ReadFiles {
   std::vector<LoadedFile> files;
-  std::vector<std::string> problems;  ///< one line for each file that is no scenario
+  std::vector<std::string> problems;  ///< one line for each path or file with an error
 };
 
-/// Reads the files; of a directory, every .walk file in and below it, by name. A path that is
-/// nothing, or a directory without scenarios, is a problem too. A file that is named twice is read
-/// once.
+/// Reads the files; for a directory, every .walk file in and below it, sorted by path. A path that
+/// does not exist, or a directory without scenarios, is a problem too. A file that is named twice
+/// is read once.
 ReadFiles readScenarios(const std::vector<std::string>& paths);
 
 }  // namespace tools::scenario

@@ -34,7 +34,7 @@ Outcome copy(Stage& stage, const Arguments& a) {
   const auto path = folder / a.text("PATH");
   std::ifstream source(path, std::ios::binary);
   std::ostringstream contents;
-  // An empty file is one too, though reading it out sets the stream's fail bit.
+  // An empty file is fine: copying it sets the fail bit of `contents`, not of `source`.
   if (std::filesystem::is_regular_file(path)) contents << source.rdbuf();
   if (!source || !std::filesystem::is_regular_file(path)) {
     throw Unmet("the file " + a.text("PATH") + " in " + folder.string(), "none");
@@ -64,7 +64,7 @@ Cast::View viewNamed(const Stage& stage, const std::string& place) {
                                        : stage.cast.control(place);
 }
 
-// Five in a row, so that none lies over another and each can be clicked.
+// Five in a row, so that no control covers another and each can be clicked.
 Rect frameAt(std::size_t index) {
   const auto column = index % 5;
   const auto row = index / 5;

@@ -75,7 +75,7 @@ bool isToolkit(const Word& word, SlotContext&) {
   return word.isBare("memory") || word.isBare("qt") || word.isBare("appkit");
 }
 
-// The resource directory is removed when the scenario ends; nothing is ever written outside of it.
+// Nothing may be written outside the resource directory, which is removed with the scenario.
 bool isFileName(const Word& word, SlotContext& context) {
   if (!isWord(word, context) || word.text.empty()) return false;
   const auto parts = '/' + word.text + '/';
@@ -136,7 +136,7 @@ bool isNameOf(const Word& word, SlotContext& context) {
 
 struct Subject {
   std::string_view described;
-  const std::vector<PropertyInfo>* properties;  // null of a kept value, which has none
+  const std::vector<PropertyInfo>* properties;  // null for a kept value, which has none
 };
 
 std::optional<Subject> subjectNamed(const std::string& name, const SlotContext& context) {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The slots of the statements' forms: what a word in such a place must be.
+// The slots of the statements' forms: which words fit into each.
 #pragma once
 
 #include <string_view>
@@ -12,21 +12,21 @@ namespace tools::scenario {
 struct SlotContext {
   const Vocabulary& vocabulary;
   const Names& names;
-  /// What the value behind the property takes that the statement named last.
+  /// The values accepted by the property that the statement named last.
   Takes value = Takes::nothing;
 };
 
 struct Slot {
   std::string_view name;
   std::string_view expected;  ///< for messages
-  /// Whether the word fits. Throws a SyntaxError that says more where more can be said.
+  /// Whether the word fits. Throws a SyntaxError instead of saying no if it can give a reason.
   bool (*fits)(const Word& word, SlotContext& context);
 };
 
-/// The slot named. A form that names no such slot is a mistake of ours.
+/// Returns the slot with this name. An unknown slot in a form is a programming error.
 const Slot& slotNamed(std::string_view name);
 
-/// What a slot declares, by its name: `+W` a window, `+C` a control, `+NAME` a kept value.
+/// Returns what a slot declares: `+W` a window, `+C` a control, `+NAME` a kept value; else absent.
 std::optional<NameKind> declaredBy(std::string_view slot);
 
 }  // namespace tools::scenario

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The stage of one scenario: performing statements.
+// The stage of one scenario: performs statements.
 
 #include "tools/scenario/stage.hpp"
 
@@ -13,7 +13,7 @@
 namespace tools::scenario {
 namespace {
 
-/// Puts a value in place of another for as long as it lives.
+/// Replaces a value, and restores the old one on destruction.
 template <class T>
 class Replaced {
  public:
@@ -27,8 +27,8 @@ class Replaced {
   T before_;
 };
 
-/// While it lives, a script that exhausts the stack ends the tool with a line that names the place
-/// and the lists.
+/// As long as this exists, a script that exhausts the stack ends the tool with a line that names
+/// the place and the lists.
 class GuardedStack {
  public:
   GuardedStack(const std::shared_ptr<Engine>& engine, const std::string& place) {
@@ -91,11 +91,11 @@ Stage::Stage(toolkit::TestDriver& driverToUse, std::string nameOfFile, Performed
   });
 }
 
-// What the end of windows and engines still logs concerns nobody.
+// Lines logged while windows and engines are destroyed are not part of the scenario.
 Stage::~Stage() { driver.setLogSink({}); }
 
 void Stage::perform(const Statement& statement) {
-  // Nothing here keeps the engine for as long as the statement lasts: it may have to end meanwhile.
+  // Nothing here keeps the engine alive during the statement, which may have to destroy it.
   const GuardedStack guarded(engines.current(), placeOf(statement));
   performHere(statement);
   if (auto failed = std::exchange(failedReaction_, std::nullopt)) throw Failed(*failed);
@@ -139,8 +139,8 @@ void Stage::requireNothingLeft(const Statement& last) {
   throw Failed{&last, problem};
 }
 
-// A reaction runs within a call of the toolkit, through which no exception of ours may travel: the
-// first failure waits until the statement that led to it is over.
+// A reaction runs within a call of the toolkit, which our exceptions must not pass through: the
+// first failure is kept until the statement that caused it is over.
 void Stage::happened(const Reactions::Event& event) {
   for (const auto& reaction : reactions.take(event)) {
     try {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The stage of one scenario: all that its statements act on, fresh for each.
+// The stage of one scenario: everything that its statements act on, made new for each scenario.
 #pragma once
 
 #include <functional>
@@ -20,18 +20,18 @@
 
 namespace tools::scenario {
 
-/// What a property shows: JSON, or nothing for `absent`.
+/// The value that a property shows, as JSON; no value for `absent`.
 using Reading = std::optional<Json>;
 
 /// Something that the host keeps under a name: a table of the engine, or a timer.
 struct Kept {
   std::function<Reading()> read;
-  toolkit::Ref<toolkit::Timer> timer;  ///< absent when it is a table
+  toolkit::Ref<toolkit::Timer> timer;  ///< absent if it is a table
   bool isFlasher = false;
   bool namesClasses = false;  ///< its texts are names of classes
 };
 
-/// What a statement's call gave.
+/// The result of a statement's call.
 struct Outcome {
   Result kind = Result::nothing;
   bool flag = false;
@@ -42,31 +42,31 @@ struct Outcome {
   Outcome(toolkit::Ref<toolkit::View> found) : kind(Result::control), control(std::move(found)) {}
 };
 
-/// A statement that did not go as the scenario says it does.
+/// Thrown if a statement does not do what the scenario says.
 struct Failed {
   const Statement* statement;  ///< the scenario's, which outlives this
   std::string problem;         ///< "expected …, got …"
 };
 
-/// Invariant: what a statement names is found here only; the toolkit's objects are the driver's,
-/// which outlives the stage.
+/// Invariant: what a statement names is found only here. The driver, which must outlive the stage,
+/// owns the toolkit's objects.
 class Stage {
  public:
-  /// `file` is the scenario's, as messages name it. `performed` is told of every statement that was
-  /// performed, and its outcome in words.
+  /// `file` is the scenario's, as messages name it. `performed` is called after each statement that
+  /// succeeded, with its outcome in words.
   using Performed = std::function<void(const Statement&, const std::string& outcome)>;
   Stage(toolkit::TestDriver& driver, std::string file, Performed performed);
   ~Stage();
   Stage(const Stage&) = delete;
   Stage& operator=(const Stage&) = delete;
 
-  /// Performs a statement and checks its result. Throws a Failed, also one that came of a reaction
-  /// to what happened meanwhile.
+  /// Performs a statement and checks its result. Throws a Failed if the statement fails, or a
+  /// reaction to an event during it.
   void perform(const Statement& statement);
-  /// What stands at the end: every log line was expected, everything awaited happened. Throws a
-  /// Failed about `last`, the scenario's last statement, where no other one is to blame.
+  /// Checks at the end that every log line was expected and everything awaited happened. Throws a
+  /// Failed, about `last`, the scenario's last statement, if no other statement is to blame.
   void requireNothingLeft(const Statement& last);
-  /// "FILE:LINE"
+  /// Returns "FILE:LINE".
   std::string placeOf(const Statement& statement) const;
 
   toolkit::TestDriver& driver;

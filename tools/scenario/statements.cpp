@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The statements of the language, put together.
+// Collects the statements of the language.
 
 #include "tools/scenario/statements.hpp"
 

@@ -17,16 +17,16 @@ struct StatementKind {
   Outcome (*run)(Stage& stage, const Arguments& arguments);
 };
 
-// The tables, by subject. Of two forms with the same first word, the first that fits is taken.
+// The tables, by subject. If several forms begin with the same word, the first that fits is used.
 std::span<const StatementKind> settingUpStatements();
 std::span<const StatementKind> drivingStatements();
 std::span<const StatementKind> hostStatements();
 std::span<const StatementKind> expectingStatements();
 
-/// All of them. A parsed statement's `form` is an index into this.
+/// Returns all statements. A parsed statement's `form` is an index into them.
 const std::vector<StatementKind>& statementKinds();
 
-/// The language, as the parser needs to know it.
+/// Returns the language, as the parser needs to know it.
 const Vocabulary& vocabulary();
 
 }  // namespace tools::scenario

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What the attributes of a text show.
+// Shows the attributes of a text as JSON.
 
 #include "tools/scenario/text_properties.hpp"
 
@@ -31,7 +31,7 @@ std::optional<Json> showSuperscript(const TextAttributes& attributes) {
   return attributes.superscript;
 }
 
-/// [first line, other lines] in points.
+/// Shows [first line, other lines] in points.
 std::optional<Json> showIndent(const TextAttributes& attributes) {
   const auto style = attributes.paragraphStyle.value_or(toolkit::ParagraphStyle());
   if (style.firstLineHeadIndent == 0 && style.headIndent == 0) return std::nullopt;

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What the attributes of a text show.
+// Shows the attributes of a text as JSON.
 #pragma once
 
 #include <string>
@@ -9,10 +9,10 @@
 
 namespace tools::scenario {
 
-/// One attribute as JSON; nothing when the text leaves it open.
+/// Shows one attribute as JSON; absent if the text does not set it.
 using ShowAttribute = std::optional<Json> (*)(const toolkit::TextAttributes& attributes);
 
-// "Times 12"; "center"; "#rrggbb"; the address; and YES or NO.
+// These show, in turn: "Times 12"; "center"; "#rrggbb"; the address; YES or NO for the others.
 std::optional<Json> showFont(const toolkit::TextAttributes& attributes);
 std::optional<Json> showAlignment(const toolkit::TextAttributes& attributes);
 std::optional<Json> showForeground(const toolkit::TextAttributes& attributes);
@@ -21,15 +21,15 @@ std::optional<Json> showBold(const toolkit::TextAttributes& attributes);
 std::optional<Json> showItalic(const toolkit::TextAttributes& attributes);
 std::optional<Json> showUnderline(const toolkit::TextAttributes& attributes);
 
-/// What the attribute shows over the whole text, or "mixed". Of an empty text: what a text without
-/// attributes shows.
+/// Shows the attribute if it is the same over the whole text, else "mixed". An empty text shows the
+/// same as a text without attributes.
 std::optional<Json> showThroughout(const toolkit::AttributedString& text, ShowAttribute attribute);
 
-/// The text as a list of [text, {attributes}], the attributes without those that are left open, NO
-/// or natural.
+/// Shows the text as a list of [text, {attributes}], without attributes that are not set, NO or
+/// natural.
 Json showRuns(const toolkit::AttributedString& text);
 
-/// "#rrggbb", with the alpha behind it where the colour is not opaque.
+/// Returns "#rrggbb", followed by the alpha if the colour is not opaque.
 std::string showColor(const toolkit::Color& color);
 
 }  // namespace tools::scenario

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What ends a scenario early.
+// The exception that ends a scenario early.
 #pragma once
 
 #include <stdexcept>
@@ -7,7 +7,7 @@
 
 namespace tools::scenario {
 
-/// Something that a statement needs or states is not so.
+/// Thrown if something that a statement needs or expects is not so.
 class Unmet : public std::runtime_error {
  public:
   Unmet(const std::string& expected, const std::string& got)

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// From JSON to the values that property lists hold, and back.
+// Converts JSON to property-list values, and back.
 
 #include "tools/scenario/values.hpp"
 
@@ -66,7 +66,7 @@ Json fromElements(std::span<const ValueRef<>> elements) {
   return json;
 }
 
-// Strings first, which differ from one another; another kind of key may read like one of them.
+// Strings first, which are unique; the description of another kind of key may equal one of them.
 Json fromDictionary(const toolkit::Dictionary& dictionary) {
   const auto isString = [](const ValueRef<>& key) {
     return key->kind() == toolkit::Value::Kind::string;

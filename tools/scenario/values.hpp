@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// From JSON to the values that property lists hold, and back.
+// Converts JSON to property-list values, and back.
 #pragma once
 
 #include "toolkit/property_list/collections.hpp"
@@ -8,14 +8,14 @@
 
 namespace tools::scenario {
 
-/// Numbers without a fraction become integers. Collections can be changed. JSON's null, which no
-/// property list has, is no value.
+/// Numbers written without a fraction become integers. Collections are mutable. `json` must not
+/// contain null, which property lists lack.
 toolkit::ValueRef<> toValue(const Json& json);
 toolkit::ValueRef<toolkit::Dictionary> toDictionary(const Json& object);
 
-/// What JSON lacks is written as an object of one key: {"date": seconds since 2001}, {"data":
-/// "hexadecimal"}, {"uid": number}, {"set": [...]}, {"real": "nan"}. Keys that are no strings are
-/// written as they are described.
+/// Kinds that JSON lacks become an object with one key: {"date": seconds since 2001}, {"data":
+/// "hexadecimal"}, {"uid": number}, {"set": [...]}, {"real": "nan"}. Keys that are not strings
+/// become their descriptions.
 Json toJson(const toolkit::ValueRef<>& value);
 
 }  // namespace tools::scenario

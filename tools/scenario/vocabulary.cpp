@@ -18,7 +18,7 @@ struct NamedValue {
   Wanted wanted;
 };
 
-/// Words that stand for a value where its kind is taken, and for themselves elsewhere.
+/// Words that mean a value where its kind is accepted, and are plain text elsewhere.
 const std::vector<NamedValue>& namedValues() {
   using Kind = Wanted::Kind;
   static const std::vector<NamedValue> values = {

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What the parser is told about the language: the forms of its statements, the properties that they
-// can name, and what values these take. Nothing here says what a statement does.
+// What the parser knows about the language: the forms of its statements, the properties that they
+// can name, and the values that these accept. Nothing here says what a statement does.
 #pragma once
 
 #include <optional>
@@ -13,7 +13,7 @@
 
 namespace tools::scenario {
 
-/// What may stand behind the `=>` of a statement.
+/// What may follow the `=>` of a statement.
 enum class Result {
   never,    ///< it has no `=>`
   nothing,  ///< only `raises`
@@ -21,15 +21,15 @@ enum class Result {
   control,  ///< a control, `none` or `raises`
 };
 
-/// How a statement is written. In `syntax`, words of lower-case letters stand for themselves and
-/// words of capitals for a slot (see slots.cpp); `a|B` is one or the other, `[...]` may be left
-/// out, `A...` takes all words that are left.
+/// How a statement is written. In `syntax`, words in lower case are literal and words in capitals
+/// are slots (see slots.cpp); `a|B` is one or the other, `[...]` is optional, `A...` takes all
+/// remaining words.
 struct Form {
   std::string_view syntax;
   Result result = Result::never;
 };
 
-/// The kinds of value that a place takes; they combine.
+/// The kinds of value that a place accepts; they can be combined.
 enum class Takes : unsigned {
   nothing = 0,
   flag = 1U << 0U,      ///< YES, NO
@@ -64,28 +64,28 @@ struct Wanted {
   Kind kind = Kind::value;
   Json value;
 
-  /// Whether `actual`, which may be absent, is what is wanted. `empty` is a list, object or text
-  /// without anything in it.
+  /// Whether `actual`, which may be absent, is what is wanted. `empty` means an empty list, object
+  /// or text.
   bool holdsFor(const std::optional<Json>& actual) const;
 };
 
-/// `word` as a value of one of the kinds; nothing when it is none. Where both are taken, a bare
-/// number is a number and no text.
+/// Reads `word` as a value of one of the kinds; absent if it is none. If both are accepted, a bare
+/// number is a number, not a text.
 std::optional<Wanted> readValue(const Word& word, Takes takes);
-/// The kinds in words, such as `YES or NO`.
+/// Describes the kinds in words, such as `YES or NO`.
 std::string describe(Takes takes);
-/// The wanted value in words, as a scenario writes it.
+/// Shows the wanted value as a scenario writes it.
 std::string show(const Wanted& wanted);
 
-/// What `NAME.PROPERTY` can be.
+/// A property that can follow a name, as in `NAME.PROPERTY`.
 struct PropertyInfo {
   std::string_view name;
-  Takes read = Takes::nothing;     ///< what it can be expected to be
-  Takes written = Takes::nothing;  ///< what it can be set to
+  Takes read = Takes::nothing;     ///< the values that can be expected
+  Takes written = Takes::nothing;  ///< the values that it can be set to
   bool namesClasses = false;       ///< its texts are names of classes
 };
 
-/// The property named; one that is not there is a mistake of ours.
+/// Returns the property with this name. An unknown name is a programming error.
 const PropertyInfo& infoNamed(const std::vector<PropertyInfo>& infos, std::string_view name);
 
 struct Vocabulary {
@@ -96,10 +96,10 @@ struct Vocabulary {
   std::vector<std::string_view> constants;  ///< the exported command names
 };
 
-/// The constant's whole name, for `name` may leave its prefix out.
+/// Returns the constant's whole name; `name` may leave its prefix out.
 std::string fullConstantName(std::string_view name);
 
-/// The word in a message: in quotation marks, or `JSON`.
+/// Returns the word as messages show it: in quotation marks, or `JSON`.
 std::string describe(const Word& word);
 
 }  // namespace tools::scenario

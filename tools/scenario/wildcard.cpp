@@ -10,7 +10,7 @@
 namespace tools::scenario {
 namespace {
 
-/// The texts between the pattern's stars: always one more than there are stars.
+/// Returns the texts between the pattern's stars: one more than there are stars.
 std::vector<std::string> piecesOf(std::string_view pattern) {
   std::vector<std::string> pieces(1);
   for (std::size_t i = 0; i < pattern.size(); ++i) {
@@ -31,7 +31,7 @@ bool matchesPattern(std::string_view pattern, std::string_view text) {
   if (pieces.size() == 1) return text == pieces.front();
   if (!text.starts_with(pieces.front())) return false;
   text.remove_prefix(pieces.front().size());
-  // Each piece at its first place leaves the most for those behind it.
+  // Finding each piece at its first place leaves the most text for the later ones.
   for (std::size_t i = 1; i + 1 < pieces.size(); ++i) {
     const auto found = text.find(pieces[i]);
     if (found == std::string_view::npos) return false;

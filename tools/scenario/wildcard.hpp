@@ -6,8 +6,8 @@
 
 namespace tools::scenario {
 
-/// Whether `text` is what `pattern` says: a `*` stands for any run of characters, also an empty
-/// one, `\*` for a star itself, everything else for itself.
+/// Whether `text` matches `pattern`: `*` matches any run of characters, also an empty one, `\*` a
+/// star, everything else itself.
 bool matchesPattern(std::string_view pattern, std::string_view text);
 
 }  // namespace tools::scenario
