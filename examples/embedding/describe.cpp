@@ -10,8 +10,8 @@ int main() {
   screen.setLogSink([](std::string_view line) { std::cout << "log: " << line << '\n'; });
   const auto engine = QZ_Plist_State_Parser::initWithWindow(screen.toolkit(), nullptr);
 
-  // The number is the entry's key, and a button's tag. No two entries may have the same, of
-  // whatever class they are: the later one would take the place of the earlier.
+  // The number is the entry's key, and a button's tag. It must be unique across classes: a later
+  // entry replaces an earlier one.
   auto entries = toolkit::Dictionary::make();
   engine->createNextGuiAssetEntry(&entries, "NSWindow", {200, 200, 300, 120}, 1000);
   engine->createNextGuiAssetEntry(&entries, "NSTextField", {20, 70, 260, 30}, 1001);

@@ -18,8 +18,8 @@ void show(toolkit::TestDriver& screen, const toolkit::Ref<toolkit::View>& text,
 }
 
 int play(const char* resources) {
-  // The memory toolkit has no screen. Its driver stands for what a real one has: the user, the
-  // clock, and a look at the window. Toolkit and window outlive the engine.
+  // The memory toolkit has no screen. Its driver plays the user and the clock, and shows the
+  // window. Toolkit and window must outlive the engine.
   toolkit::memory::MemoryDriver screen;
   screen.setResourcePath(resources);
   screen.setLogSink([](std::string_view line) { std::cout << "log: " << line << '\n'; });
@@ -32,8 +32,8 @@ int play(const char* resources) {
 
   const auto engine = QZ_Plist_State_Parser::initWithWindow(screen.toolkit(), window);
   engine->getGuiAssetsFromWindow(window);
-  // An empty start key is the script's smallest tag. The list there ends with IDLE_LOOP, so that NO
-  // means that there is no such list, or no such script.
+  // An empty start key means the script's smallest tag. The list there ends with IDLE_LOOP, so NO
+  // means that the list or the script is missing.
   if (!engine->loadPlist("script.plist", "", nullptr, false)) {
     std::cerr << resources << "/script.plist: found no list to start with\n";
     engine->terminateParser();
@@ -47,9 +47,9 @@ int play(const char* resources) {
   show(screen, text, button);
   screen.click(button);  // runs the list 3, which ends the walk-through
 
-  // Nobody tells the host that the script has ended it: ask after every press.
+  // The host is not told that the script has ended the walk-through: ask after every press.
   if (!engine->terminating()) engine->terminateParser();
-  const auto states = engine->buttonStates();  // held, for the entries live no longer than it
+  const auto states = engine->buttonStates();  // held: its entries live only as long
   for (const auto& [tag, on] : states->entries()) {
     std::cout << "pressed: " << tag->description() << (on->boolValue() ? " (on)\n" : " (off)\n");
   }
@@ -66,7 +66,7 @@ int main(int argc, char** argv) {
   }
   try {
     return play(argv[1]);
-  } catch (const toolkit::Exception& raised) {  // such as a script's value that is no list
+  } catch (const toolkit::Exception& raised) {  // such as a value that is not a list
     std::cerr << raised.name() << ": " << raised.reason() << '\n';
     return 1;
   }
