@@ -109,6 +109,14 @@ TEST_F(ObserverTest, IsToldOfTimersThatAreCancelled) {
   EXPECT_EQ(noted(), Lines{"found 1"}) << "nothing was pending";
 }
 
+TEST_F(ObserverTest, NeedNotListenToEverything) {
+  engine->setObserver(std::make_shared<qz::Observer>());
+  use("{ 1 = ((SET_TIMER_FOR_ID, 1, 2), (FLASH_ID)); 2 = (IDLE_LOOP); }");
+  driver.click(button);
+  driver.advance(1);
+  EXPECT_EQ(engine->currentCommandState(), "2");
+}
+
 /// Removes itself from the engine at the first event.
 struct Leaving final : qz::Observer {
   explicit Leaving(QZ_Plist_State_Parser& engine) : engine_(engine) {}
