@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
 #include "bench/direct_walkthrough.hpp"
 
-#include "toolkit/view.hpp"
+#include "qz/toolkit/view.hpp"
 
-namespace bench {
+namespace qz::bench {
 namespace {
 
 toolkit::Ref<toolkit::View> viewWithTag(const toolkit::Ref<toolkit::Window>& window,
@@ -45,4 +45,4 @@ void runDirectly(const toolkit::Ref<toolkit::Window>& window,
   }
 }
 
-}  // namespace bench
+}  // namespace qz::bench

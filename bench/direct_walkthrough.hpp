@@ -5,12 +5,12 @@
 #include <vector>
 
 #include "bench/operations.hpp"
-#include "toolkit/window.hpp"
+#include "qz/toolkit/window.hpp"
 
-namespace bench {
+namespace qz::bench {
 
 /// Looks up each control by its tag and changes it, with the same calls as the engine.
 void runDirectly(const toolkit::Ref<toolkit::Window>& window,
                  const std::vector<Operation>& operations);
 
-}  // namespace bench
+}  // namespace qz::bench

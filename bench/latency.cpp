@@ -12,10 +12,12 @@
 #include <memory>
 #include <utility>
 
-#include "QZ_Plist_State_Parser.hpp"
 #include "bench/measuring.hpp"
-#include "toolkit/property_list/reader.hpp"
-#include "toolkit/qt/qt_toolkit.hpp"
+#include "qz/engine.hpp"
+#include "qz/property_list/reader.hpp"
+#include "qz/toolkit/qt/qt_toolkit.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -157,24 +159,28 @@ void requireSame(Guided& guided, ByHand& byHand) {
 
 }  // namespace
 
+}  // namespace qz
+
+using namespace qz;
+
 int main(int argc, char** argv) {
   if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
   qputenv("QT_SCALE_FACTOR", "1");  // the slot's images have only one resolution
   const QApplication application(argc, argv);
   Guided guided;
   ByHand byHand;
-  const bench::Contender engine = click("engine", guided), slot = click("slot", byHand);
+  const qz::bench::Contender engine = click("engine", guided), slot = click("slot", byHand);
   for (const auto& contender : {engine, slot, engine, slot}) {
     contender.prepare();
     contender.run();
     if (contender.name == "slot") requireSame(guided, byHand);
   }
   // Forth and back, measured separately.
-  const auto t = bench::leastTimes({engine, slot, engine, slot}, 500);
-  bench::printHead("From a click to the last changed widget repainted",
-                   {"step", "this engine", "a slot by hand", "this : by hand"});
+  const auto t = qz::bench::leastTimes({engine, slot, engine, slot}, 500);
+  qz::bench::printHead("From a click to the last changed widget repainted",
+                       {"step", "this engine", "a slot by hand", "this : by hand"});
   for (const std::size_t i : {0U, 2U})
-    bench::printRow({i == 0 ? "forth" : "back", bench::shownTime(t[i]), bench::shownTime(t[i + 1]),
-                     bench::shownRatio(t[i] / t[i + 1])});
+    qz::bench::printRow({i == 0 ? "forth" : "back", qz::bench::shownTime(t[i]),
+                         qz::bench::shownTime(t[i + 1]), qz::bench::shownRatio(t[i] / t[i + 1])});
   return 0;
 }

@@ -16,8 +16,10 @@
 
 #include "bench/made_scripts.hpp"
 #include "bench/measuring.hpp"
-#include "toolkit/property_list/binary_writer.hpp"
-#include "toolkit/property_list/reader.hpp"
+#include "qz/property_list/binary_writer.hpp"
+#include "qz/property_list/reader.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -154,6 +156,10 @@ void measureGrowth() {
 }
 
 }  // namespace
+
+}  // namespace qz
+
+using namespace qz;
 
 int main(int argc, char** argv) {
   if (argc == 2) {

@@ -7,9 +7,9 @@
 #include <cstdlib>
 #include <string>
 
-#include "toolkit/view.hpp"
+#include "qz/toolkit/view.hpp"
 
-namespace bench {
+namespace qz::bench {
 namespace {
 
 using toolkit::View;
@@ -148,4 +148,4 @@ void LuaWalkthrough::run() {
   require(lua_, lua_pcall(lua_, 0, 0, 0));
 }
 
-}  // namespace bench
+}  // namespace qz::bench

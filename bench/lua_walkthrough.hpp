@@ -7,11 +7,11 @@
 #include <vector>
 
 #include "bench/operations.hpp"
-#include "toolkit/window.hpp"
+#include "qz/toolkit/window.hpp"
 
 struct lua_State;
 
-namespace bench {
+namespace qz::bench {
 
 class LuaWalkthrough {
  public:
@@ -27,4 +27,4 @@ class LuaWalkthrough {
   lua_State* lua_;  // owned
 };
 
-}  // namespace bench
+}  // namespace qz::bench

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "bench/made_scripts.hpp"
 
-namespace bench {
+namespace qz::bench {
 namespace {
 
 std::string element(const char* tag, const std::string& content) {
@@ -44,4 +44,4 @@ std::string xmlScript(std::size_t bytes) {
   return script;
 }
 
-}  // namespace bench
+}  // namespace qz::bench

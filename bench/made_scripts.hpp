@@ -6,9 +6,9 @@
 #include <cstddef>
 #include <string>
 
-namespace bench {
+namespace qz::bench {
 
 /// Returns a script as XML, about `bytes` bytes long; always the same one for the same size.
 std::string xmlScript(std::size_t bytes);
 
-}  // namespace bench
+}  // namespace qz::bench

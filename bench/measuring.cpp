@@ -11,7 +11,7 @@
 #include <fstream>
 #include <limits>
 
-namespace bench {
+namespace qz::bench {
 namespace {
 
 double processorTime() {
@@ -112,4 +112,4 @@ std::string shownBytes(double bytes) { return formatted("%.2f B", bytes); }
 
 std::string shownRatio(double ratio) { return formatted("×%.2f", ratio); }
 
-}  // namespace bench
+}  // namespace qz::bench

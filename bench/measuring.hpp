@@ -9,7 +9,7 @@
 #include <utility>
 #include <vector>
 
-namespace bench {
+namespace qz::bench {
 
 struct Contender {
   std::string name;
@@ -52,4 +52,4 @@ std::string shownBytes(double bytes);
 /// Formats as "×2.50".
 std::string shownRatio(double ratio);
 
-}  // namespace bench
+}  // namespace qz::bench

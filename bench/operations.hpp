@@ -5,9 +5,9 @@
 #include <string>
 #include <vector>
 
-#include "toolkit/tag.hpp"
+#include "qz/toolkit/tag.hpp"
 
-namespace bench {
+namespace qz::bench {
 
 enum class What { text, title, toolTip, enable, disable, stateOn };
 
@@ -19,4 +19,4 @@ struct Operation {
   std::string text;
 };
 
-}  // namespace bench
+}  // namespace qz::bench

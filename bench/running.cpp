@@ -8,14 +8,16 @@
 #include <string>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
 #include "bench/direct_walkthrough.hpp"
 #include "bench/lua_walkthrough.hpp"
 #include "bench/measuring.hpp"
 #include "bench/operations.hpp"
-#include "toolkit/memory/memory_driver.hpp"
-#include "toolkit/property_list/binary_writer.hpp"
-#include "toolkit/property_list/reader.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
+#include "qz/property_list/binary_writer.hpp"
+#include "qz/property_list/reader.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -30,7 +32,7 @@ struct Stage {
   explicit Stage(long controls) {
     driver.setLogSink([](std::string_view) {});
     for (toolkit::Tag tag = 1; tag <= controls; ++tag) {
-      driver.makeView(toolkit::ViewKind::toggle, tag, {0, 0, 90, 20}, window->contentView());
+      driver.makeView(drivers::ViewKind::toggle, tag, {0, 0, 90, 20}, window->contentView());
     }
     engine->getGuiAssetsFromWindow(window);
   }
@@ -38,7 +40,7 @@ struct Stage {
   Stage(const Stage&) = delete;
   Stage& operator=(const Stage&) = delete;
 
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   toolkit::Ref<toolkit::Window> window = driver.makeWindow({0, 0, 800, 600});
   std::shared_ptr<QZ_Plist_State_Parser> engine =
       QZ_Plist_State_Parser::initWithWindow(driver.toolkit(), window);
@@ -223,6 +225,10 @@ void measureEvents() {
 }
 
 }  // namespace
+
+}  // namespace qz
+
+using namespace qz;
 
 int main() {
   measureLists();

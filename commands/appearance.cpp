@@ -2,9 +2,11 @@
 // The commands that change the appearance of one control (colours, title, tooltip, image) or its
 // state.
 
-#include "QZ_Plist_State_Parser.hpp"
 #include "engine/commands.hpp"
+#include "engine/state.hpp"
 #include "engine/text_of.hpp"
+
+namespace qz {
 
 using toolkit::asButton;
 
@@ -57,7 +59,7 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_FOREGROUND_COLOR(Value 
     control->setAttributedTitle(title);
     return true;
   } catch (const toolkit::Exception&) {
-    toolkit_.log().write("Unable to set the foreground color");
+    state_->toolkit.log().write("Unable to set the foreground color");
     return false;
   }
 }
@@ -129,5 +131,7 @@ bool commands::loadGraphic(QZ_Plist_State_Parser& engine, toolkit::Toolkit& tool
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH(
     Parameters parameters, ObjectId) {
   const auto kept = keepAlive();
-  return commands::loadGraphic(*this, toolkit_, commands::ownList(parameters));
+  return commands::loadGraphic(*this, state_->toolkit, commands::ownList(parameters));
 }
+
+}  // namespace qz

@@ -1,9 +1,11 @@
 // SPDX-License-Identifier: MIT
 // Styled text from HTML: a fragment of the script within one of three fixed documents.
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "engine/state.hpp"
 #include "engine/text_of.hpp"
-#include "toolkit/styled_text/ascii.hpp"
+#include "text/ascii.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -27,8 +29,7 @@ static_assert(linkedTwoBlanks.size() == 249 && linkedOneBlank.size() == 248 && p
 std::optional<toolkit::AttributedString> read(std::string_view documentHead,
                                               const std::string& fragment,
                                               toolkit::Toolkit& toolkit) {
-  const auto document =
-      toolkit::asciiBytes(std::string(documentHead) + fragment + "</body></html>");
+  const auto document = text::asciiBytes(std::string(documentHead) + fragment + "</body></html>");
   return document ? toolkit.attributedStringWithHTML(*document) : std::nullopt;
 }
 
@@ -84,17 +85,20 @@ bool QZ_Plist_State_Parser::showHtml(std::string_view documentHead,
   const auto points = static_cast<float>(size->intValue());  // whole points; read even if not used
   // An absent fragment reads as the text that the system's formats print for an absent object.
   const std::string fragment = html ? html->description() : "(null)";
-  auto text = read(documentHead, fragment, toolkit_);
+  auto text = read(documentHead, fragment, state_->toolkit);
   if (!text) return false;
   try {
-    if (alignment) setStyle(*text, *alignment, toolkit_.fonts(), fontName, points);
+    if (alignment) setStyle(*text, *alignment, state_->toolkit.fonts(), fontName, points);
     show(*text, control);
     return true;
   } catch (const toolkit::Exception&) {
     // Every exception is reported, on purpose. A range exception was meant to count as success, but
     // the test compares the exception's class with that of the *name* (a string) of the range
     // exception, and never matches.
-    toolkit_.log().write("Couldn't set attributed string of HTML:" + fragment + " to object.");
+    state_->toolkit.log().write("Couldn't set attributed string of HTML:" + fragment +
+                                " to object.");
     return false;
   }
 }
+
+}  // namespace qz

@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: MIT
 // Plain text.
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "engine/state.hpp"
 #include "engine/text_of.hpp"
+
+namespace qz {
 
 // Sets the text of any control. YES if it reads back as given. A value that is not a string is
 // shown as its description, and then raises in the comparison. NO for an absent text.
@@ -13,3 +15,5 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TEXT(Value text, Object
   control->setStringValue(text->description());
   return text && control->stringValue() == textOf(text);
 }
+
+}  // namespace qz

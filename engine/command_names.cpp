@@ -1,7 +1,9 @@
 // SPDX-License-Identifier: MIT
 // The names of the commands in scripts. A host may assign others at any time.
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "qz/engine.hpp"
+
+namespace qz {
 
 std::string QZ_PLIST_STATE_PARSER_TERMINATE_PARSER = "TERMINATE_PARSER";
 std::string QZ_PLIST_STATE_PARSER_RETURN_TO_IDLE_LOOP = "IDLE_LOOP";
@@ -40,3 +42,5 @@ std::string
 std::string
     QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID =
         "SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID";
+
+}  // namespace qz

@@ -8,9 +8,9 @@
 
 #include <string_view>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "qz/engine.hpp"
 
-namespace commands {
+namespace qz::commands {
 
 bool runSimple(QZ_Plist_State_Parser& engine, std::string_view name,
                const QZ_Plist_State_Parser::ObjectId& id);
@@ -26,4 +26,4 @@ bool loadGraphic(QZ_Plist_State_Parser& engine, toolkit::Toolkit& toolkit,
 /// Returns a copy of the list that only the caller holds; absent for an absent list.
 QZ_Plist_State_Parser::Parameters ownList(const QZ_Plist_State_Parser::Parameters& parameters);
 
-}  // namespace commands
+}  // namespace qz::commands

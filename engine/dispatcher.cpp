@@ -7,9 +7,11 @@
 #include <tuple>
 #include <utility>
 
-#include "QZ_Plist_State_Parser.hpp"
 #include "engine/commands.hpp"
+#include "engine/state.hpp"
 #include "engine/text_of.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -199,6 +201,8 @@ QZ_Plist_State_Parser::Parameters commands::ownList(const Engine::Parameters& pa
 bool QZ_Plist_State_Parser::doCompoundCommand(std::string_view name, Parameters withParameters,
                                               ObjectId usingObject) {
   const auto kept = keepAlive();
-  return commands::runCompound(*this, toolkit_, name, commands::ownList(withParameters),
+  return commands::runCompound(*this, state_->toolkit, name, commands::ownList(withParameters),
                                usingObject);
 }
+
+}  // namespace qz

@@ -3,9 +3,11 @@
 
 #include <algorithm>
 
-#include "QZ_Plist_State_Parser.hpp"
 #include "engine/tag_key.hpp"
-#include "toolkit/uppercase.hpp"
+#include "qz/engine.hpp"
+#include "text/uppercase.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -67,7 +69,7 @@ std::optional<std::string> chainTarget(const toolkit::ValueRef<>& element, const
   const auto compound = toolkit::asArray(element);
   if (compound->count() < 2) return std::nullopt;
   const auto name = toolkit::asString(compound->elements()[0]);
-  if (!name || toolkit::uppercased(name->text()) != chain) return std::nullopt;
+  if (!name || text::uppercased(name->text()) != chain) return std::nullopt;
   try {
     return tagKey(compound->elements()[1]->intValue());
   } catch (const toolkit::Exception&) {
@@ -100,3 +102,5 @@ EndlessChains endlessChains(const toolkit::ValueRef<toolkit::Dictionary>& script
   }
   return chains;
 }
+
+}  // namespace qz

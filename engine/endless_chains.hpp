@@ -13,7 +13,9 @@
 #include <string>
 #include <vector>
 
-#include "toolkit/property_list/collections.hpp"
+#include "qz/property_list/collections.hpp"
+
+namespace qz {
 
 struct EndlessChains {
   /// Each loop once, as the keys of its lists in running order: "3 -> 7 -> 3".
@@ -28,3 +30,5 @@ std::optional<std::string> chainTarget(const toolkit::ValueRef<>& element, const
 
 /// Finds the endless chains of a script. A value that is not a list chains to nothing.
 EndlessChains endlessChains(const toolkit::ValueRef<toolkit::Dictionary>& script);
+
+}  // namespace qz

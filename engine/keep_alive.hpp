@@ -5,6 +5,8 @@
 
 #include <memory>
 
+namespace qz {
+
 /// Keeps `object` alive while the guard exists. Foreign code, such as the log's sink, may release
 /// the last reference to the object during an operation. Only the outermost operation counts a
 /// reference: `isKept`, a field of the object, spares the nested ones, such as every command of a
@@ -26,3 +28,5 @@ class KeepAlive {
   bool& isKept_;
   std::shared_ptr<void> object_;  // null in a nested operation
 };
+
+}  // namespace qz

@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: MIT
 // The engine object: construction, termination, destruction, current list and action.
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "engine/state.hpp"
 #include "engine/tag_key.hpp"
+
+namespace qz {
 
 using toolkit::StoredRef;
 
@@ -16,6 +18,9 @@ void stop(const toolkit::Ref<toolkit::Timer>& timer) {
 
 }  // namespace
 
+QZ_Plist_State_Parser::QZ_Plist_State_Parser(toolkit::Toolkit& toolkit)
+    : state_(std::make_unique<State>(toolkit)) {}
+
 std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::init(toolkit::Toolkit& toolkit) {
   return std::shared_ptr<QZ_Plist_State_Parser>(new QZ_Plist_State_Parser(toolkit));
 }
@@ -23,65 +28,66 @@ std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::init(toolkit::Tool
 std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::initWithWindow(
     toolkit::Toolkit& toolkit, const Window& window) {
   auto engine = init(toolkit);
-  engine->window_.set(StoredRef<toolkit::Window>::refer(window));
-  engine->buttonStates_ = toolkit::Dictionary::make();
-  engine->plistDictionary_.set(toolkit::Dictionary::make());
-  engine->flashingTagIds_.set(toolkit::Dictionary::make());
-  engine->addedObjectToTutorial_.set(toolkit::List<Control>::make());
-  engine->objectIdTimers_.set(toolkit::Table<Timer>::make());
+  engine->state_->window.set(StoredRef<toolkit::Window>::refer(window));
+  engine->state_->buttonStates = toolkit::Dictionary::make();
+  engine->state_->plistDictionary.set(toolkit::Dictionary::make());
+  engine->state_->flashingTagIds.set(toolkit::Dictionary::make());
+  engine->state_->addedObjectToTutorial.set(toolkit::List<Control>::make());
+  engine->state_->objectIdTimers.set(toolkit::Table<Timer>::make());
   // The timer keeps the engine alive while it ticks.
-  engine->flashingTimer_.set(toolkit.runLoop().schedule(
+  engine->state_->flashingTimer.set(toolkit.runLoop().schedule(
       flasherPeriod, true, [engine](const Timer& timer) { engine->flasherFired(timer); }));
-  engine->guiAssets_.set(toolkit::Table<AssetRecord>::make());
-  engine->originalTagValues_.set(toolkit::Dictionary::make());
+  engine->state_->guiAssets.set(toolkit::Table<AssetRecord>::make());
+  engine->state_->originalTagValues.set(toolkit::Dictionary::make());
   return engine;
 }
 
 void QZ_Plist_State_Parser::terminateParser() {
   const auto kept = keepAlive();
   restoreOriginalTagValues();
-  terminating_ = true;
-  stop(*flashingTimer_);
-  flashingTimer_.set(nullptr);
+  state_->terminating = true;
+  stop(*state_->flashingTimer);
+  state_->flashingTimer.set(nullptr);
   // Tables are emptied before they are dropped, so that a host that kept one sees the end.
-  if (objectIdTimers_->count() > 0) {
+  if (state_->objectIdTimers->count() > 0) {
     killAllTimers();
-    objectIdTimers_.set(nullptr);
+    state_->objectIdTimers.set(nullptr);
   }
   const Window tutorial = tutorialWindow();
-  if (!(tutorial && tutorial == window()) && addedObjectToTutorial_->count() > 0) {
-    addedObjectToTutorial_->removeAllObjects();
-    addedObjectToTutorial_.set(nullptr);
+  if (!(tutorial && tutorial == window()) && state_->addedObjectToTutorial->count() > 0) {
+    state_->addedObjectToTutorial->removeAllObjects();
+    state_->addedObjectToTutorial.set(nullptr);
   }
-  guiAssets_->removeAllObjects();
-  guiAssets_.set(nullptr);
-  plistDictionary_->removeAllObjects();
-  plistDictionary_.set(nullptr);
-  commandArray_.set(nullptr);
-  if (runningAsSheet_) {
-    toolkit_.application().endSheet(tutorial, 0);  // at every call, unlike closing the window
-  } else if (!hasTerminated_) {
-    hasTerminated_ = true;
+  state_->guiAssets->removeAllObjects();
+  state_->guiAssets.set(nullptr);
+  state_->plistDictionary->removeAllObjects();
+  state_->plistDictionary.set(nullptr);
+  state_->commandArray.set(nullptr);
+  if (state_->runningAsSheet) {
+    state_->toolkit.application().endSheet(tutorial,
+                                           0);  // at every call, unlike closing the window
+  } else if (!state_->hasTerminated) {
+    state_->hasTerminated = true;
     tutorial->close();
   }
 }
 
 QZ_Plist_State_Parser::~QZ_Plist_State_Parser() {
-  stop(*flashingTimer_);
-  flashingTimer_.set(nullptr);
-  const Timers timers = *objectIdTimers_;
+  stop(*state_->flashingTimer);
+  state_->flashingTimer.set(nullptr);
+  const Timers timers = *state_->objectIdTimers;
   const auto pending = timers->entries();  // a copy: releasing a timer may change the table
   for (const auto& [key, timer] : pending) timer->invalidate();
   timers->removeAllObjects();
   const Window tutorial = tutorialWindow();
   const Window host = window();
   // Unlike in `terminateParser`, the list stays if either window is absent.
-  if (tutorial && host && tutorial != host) addedObjectToTutorial_->removeAllObjects();
-  buttonStates_->removeAllObjects();
+  if (tutorial && host && tutorial != host) state_->addedObjectToTutorial->removeAllObjects();
+  state_->buttonStates->removeAllObjects();
 }
 
 std::string QZ_Plist_State_Parser::currentCommandState() const {
-  return tagKey(lastTagId_->longValue());
+  return tagKey(state_->lastTagId->longValue());
 }
 
 bool QZ_Plist_State_Parser::tryToPerform(std::string_view action, const Control& sender) {
@@ -89,3 +95,5 @@ bool QZ_Plist_State_Parser::tryToPerform(std::string_view action, const Control&
   buttonPushed(sender);
   return true;
 }
+
+}  // namespace qz

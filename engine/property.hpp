@@ -11,6 +11,8 @@
 
 #include "engine/spin_lock.hpp"
 
+namespace qz {
+
 template <class T>
 class Property {
  public:
@@ -44,3 +46,5 @@ class Property {
   mutable SpinLock lock_;
   T value_{};
 };
+
+}  // namespace qz

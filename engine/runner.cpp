@@ -1,10 +1,12 @@
 // SPDX-License-Identifier: MIT
 // The command-list runner: every list runs through it.
 
-#include "QZ_Plist_State_Parser.hpp"
 #include "engine/commands.hpp"
+#include "engine/state.hpp"
 #include "engine/text_of.hpp"
-#include "toolkit/uppercase.hpp"
+#include "text/uppercase.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -22,7 +24,7 @@ bool runElement(Engine& engine, toolkit::Toolkit& toolkit, const Engine::Value& 
   // Not asArray, which would count a reference: this runs for every command.
   const auto& compound = static_cast<const toolkit::Array&>(*element);
   std::string raised;
-  const auto name = toolkit::uppercased(textOf(compound.objectAtIndex(0)), raised);
+  const auto name = text::uppercased(textOf(compound.objectAtIndex(0)), raised);
   const auto given = compound.elements().subspan(1);
   isFixed ? parameters->borrowElements(given) : parameters->setElements(given);
   return commands::runCompound(engine, toolkit, name, parameters, id);
@@ -33,23 +35,25 @@ bool runElement(Engine& engine, toolkit::Toolkit& toolkit, const Engine::Value& 
 bool QZ_Plist_State_Parser::processCommandArray(Value list, ObjectId forObject) {
   const auto kept = keepAlive();
   const Parameters parameters = toolkit::Array::make();
-  lastTagId_.set(forObject);
+  state_->lastTagId.set(forObject);
   // Outside the try block: a value without elements raises to the caller.
   const auto count = static_cast<std::int32_t>(list->count());
-  notify(&qz::Observer::listWillRun, list, forObject);
+  state_->notify(&Observer::listWillRun, list, forObject);
   bool result = false;
   for (std::int32_t i = 0; i < count; ++i) {
     const auto index = static_cast<std::size_t>(i);
     try {
       const Value& element = list->objectAtIndex(index);
-      notify(&qz::Observer::commandWillRun, list, index);
-      result = runElement(*this, toolkit_, element, list->isFixed(), parameters, forObject);
-      notify(&qz::Observer::commandDidRun, list, index, result);
+      state_->notify(&Observer::commandWillRun, list, index);
+      result = runElement(*this, state_->toolkit, element, list->isFixed(), parameters, forObject);
+      state_->notify(&Observer::commandDidRun, list, index, result);
     } catch (const toolkit::Exception& exception) {
-      toolkit_.log().write("Exception in processCommandArray: " + exception.reason());
-      notify(&qz::Observer::commandRaised, list, index, exception);
+      state_->toolkit.log().write("Exception in processCommandArray: " + exception.reason());
+      state_->notify(&Observer::commandRaised, list, index, exception);
     }
   }
-  notify(&qz::Observer::listDidRun, list, forObject);
+  state_->notify(&Observer::listDidRun, list, forObject);
   return result;
 }
+
+}  // namespace qz

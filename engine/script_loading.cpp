@@ -4,10 +4,12 @@
 #include <algorithm>
 #include <filesystem>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "engine/state.hpp"
 #include "engine/tag_key.hpp"
-#include "toolkit/property_list/number_conversion.hpp"
-#include "toolkit/property_list/reader.hpp"
+#include "qz/property_list/reader.hpp"
+#include "text/number_conversion.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -44,25 +46,27 @@ bool QZ_Plist_State_Parser::loadPlist(std::optional<std::string> name,
                                       std::shared_ptr<toolkit::SheetDelegate> withDelegate,
                                       bool runAsSheet) {
   const auto kept = keepAlive();
-  const toolkit::Files& files = toolkit_.files();
-  runningAsSheet_ = runAsSheet;
+  const toolkit::Files& files = state_->toolkit.files();
+  state_->runningAsSheet = runAsSheet;
   const std::string path = scriptPath(name, files);
   if (files.fileExistsAtPath(path)) {
-    plistDictionary_->removeAllObjects();
-    plistDictionary_.set(readScript(path, files));
-    if (!*plistDictionary_) return false;
+    state_->plistDictionary->removeAllObjects();
+    state_->plistDictionary.set(readScript(path, files));
+    if (!*state_->plistDictionary) return false;
   }
   if (runAsSheet) {
     if (const Window tutorial = tutorialWindow()) {
-      toolkit_.application().beginSheet(tutorial, window(), withDelegate, nullptr);
+      state_->toolkit.application().beginSheet(tutorial, window(), withDelegate, nullptr);
     } else {
-      toolkit_.log().write("SERIOUS ERROR WE DON'T HAVE A WINDOW IN WHICH TO SHOW WIDGETS");
+      state_->toolkit.log().write("SERIOUS ERROR WE DON'T HAVE A WINDOW IN WHICH TO SHOW WIDGETS");
     }
   }
   withDelegate.reset();  // the run must not keep it alive
   if (!runFromKey) return true;
-  const auto key = runFromKey->empty() ? smallestTagKey(**plistDictionary_) : runFromKey;
+  const auto key = runFromKey->empty() ? smallestTagKey(**state_->plistDictionary) : runFromKey;
   if (!key) return false;
-  return processCommandArray(plistDictionary_->objectForKey(*key),
-                             toolkit::Number::withLong(toolkit::intValueOf(*key)));
+  return processCommandArray(state_->plistDictionary->objectForKey(*key),
+                             toolkit::Number::withLong(text::intValueOf(*key)));
 }
+
+}  // namespace qz

@@ -6,6 +6,8 @@
 #include "engine/endless_chains.hpp"
 #include "engine/tag_key.hpp"
 
+namespace qz {
+
 namespace {
 
 bool isTag(const toolkit::Value& key) { return key.description() == tagKey(key.integerValue()); }
@@ -30,3 +32,5 @@ std::string problemOf(const toolkit::ValueRef<toolkit::Dictionary>& script) {
   if (!chains.loops.empty()) return "lists run each other without end: " + enumeratedLoops(chains);
   return {};
 }
+
+}  // namespace qz

@@ -4,9 +4,13 @@
 
 #include <string>
 
-#include "toolkit/property_list/collections.hpp"
+#include "qz/property_list/collections.hpp"
+
+namespace qz {
 
 /// Returns why a host should not play the script from the list with its smallest tag, as a sentence
 /// without a full stop: no key is a tag, the value under the smallest tag is not a list, or lists
 /// run each other endlessly. Empty if there is no problem.
 std::string problemOf(const toolkit::ValueRef<toolkit::Dictionary>& script);
+
+}  // namespace qz

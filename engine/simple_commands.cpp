@@ -2,8 +2,10 @@
 // The simple commands: names without parameters, which act on the control whose tag is the list's
 // own id.
 
-#include "QZ_Plist_State_Parser.hpp"
 #include "engine/commands.hpp"
+#include "engine/state.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -69,3 +71,5 @@ bool QZ_Plist_State_Parser::doSimpleCommand(std::string_view name, Parameters,
   const auto kept = keepAlive();
   return commands::runSimple(*this, std::string(name), usingObject);
 }
+
+}  // namespace qz

@@ -5,6 +5,8 @@
 #include <atomic>
 #include <thread>
 
+namespace qz {
+
 /// No foreign code may run while it is held. A `std::mutex` would work too, but costs some sixty
 /// instructions even without contention, and the engine reads its properties at every command.
 class SpinLock {
@@ -17,3 +19,5 @@ class SpinLock {
  private:
   std::atomic_flag held_;
 };
+
+}  // namespace qz

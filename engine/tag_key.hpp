@@ -5,8 +5,10 @@
 #include <optional>
 #include <string>
 
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/tag.hpp"
+#include "qz/property_list/collections.hpp"
+#include "qz/toolkit/tag.hpp"
+
+namespace qz {
 
 inline std::string tagKey(toolkit::Tag tag) { return std::to_string(tag); }
 
@@ -14,3 +16,5 @@ inline std::string tagKey(toolkit::Tag tag) { return std::to_string(tag); }
 /// key read as a 32-bit integer. A key that is not a number counts as 0, and "007" as 7, so the
 /// result need not be a key of the script. Absent for an empty script.
 std::optional<std::string> smallestTagKey(const toolkit::Dictionary& script);
+
+}  // namespace qz

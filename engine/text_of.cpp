@@ -3,10 +3,14 @@
 
 #include <string>
 
-#include "toolkit/exception.hpp"
+#include "qz/toolkit/exception.hpp"
+
+namespace qz {
 
 void raiseNoString(const toolkit::Value& value) {
   // Not the description: a small file can make that larger than memory.
   throw toolkit::InvalidArgumentException("expected a string, got " +
                                           std::string(value.className()));
 }
+
+}  // namespace qz

@@ -4,7 +4,9 @@
 
 #include <string_view>
 
-#include "toolkit/property_list/scalars.hpp"
+#include "qz/property_list/scalars.hpp"
+
+namespace qz {
 
 /// Raises because `value` is not a string. Separate from `textOf`, to keep that small: it is
 /// inlined in every command.
@@ -17,3 +19,5 @@ inline std::string_view textOf(const toolkit::ValueRef<>& value) {
   if (value->kind() != toolkit::Value::Kind::string) raiseNoString(*value);
   return static_cast<const toolkit::String&>(*value).text();
 }
+
+}  // namespace qz

@@ -4,6 +4,8 @@
 // An input is a line of steps, one character each, followed by a script in any format. Lists that
 // run each other endlessly exhaust the stack, as documented, so such scripts are skipped, as are
 // those that would run very long.
+#include "qz/engine.hpp"
+
 #include <algorithm>
 #include <cstdint>
 #include <map>
@@ -12,12 +14,13 @@
 #include <string_view>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "drivers/memory/memory_driver.hpp"
 #include "engine/endless_chains.hpp"
 #include "engine/tag_key.hpp"
 #include "fuzz/require.hpp"
-#include "toolkit/memory/memory_driver.hpp"
-#include "toolkit/property_list/reader.hpp"
+#include "qz/property_list/reader.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -71,12 +74,14 @@ class RunLengths {
 class Walkthrough {
  public:
   explicit Walkthrough(const Script& script) : script_(script) {
-    using toolkit::ViewKind;
+    using drivers::ViewKind;
     driver_.setResourcePath("/nonexistent");
     toolkit::Tag tag = 0;
-    for (const ViewKind kind : {ViewKind::button, ViewKind::toggle, ViewKind::mixed,
-                                ViewKind::popUpButton, ViewKind::textField, ViewKind::imageView,
-                                ViewKind::box, ViewKind::plain, ViewKind::button}) {
+    for (const drivers::ViewKind kind :
+         {drivers::ViewKind::button, drivers::ViewKind::toggle, drivers::ViewKind::mixed,
+          drivers::ViewKind::popUpButton, drivers::ViewKind::textField,
+          drivers::ViewKind::imageView, drivers::ViewKind::box, drivers::ViewKind::plain,
+          drivers::ViewKind::button}) {
       ++tag;
       views_.push_back(driver_.makeView(kind, tag, {0, 20.0 * static_cast<double>(tag), 90, 18},
                                         window_->contentView()));
@@ -143,7 +148,7 @@ class Walkthrough {
   }
 
   Script script_;
-  toolkit::memory::MemoryDriver driver_;
+  drivers::MemoryDriver driver_;
   toolkit::Ref<toolkit::Window> window_ = driver_.makeWindow({0, 0, 400, 300});
   std::vector<toolkit::Ref<toolkit::View>> views_;
   std::shared_ptr<QZ_Plist_State_Parser> engine_ =
@@ -152,11 +157,15 @@ class Walkthrough {
 
 }  // namespace
 
+}  // namespace qz
+
+using namespace qz;
+
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   const std::string_view input(reinterpret_cast<const char*>(data), size);
   const std::size_t end = input.find('\n');
   if (end == std::string_view::npos) return -1;
-  const Script script = toolkit::dictionaryFromPropertyList(input.substr(end + 1));
+  const Script script = qz::toolkit::dictionaryFromPropertyList(input.substr(end + 1));
   if (!script || !RunLengths(script).areSmall()) return -1;
   Walkthrough walkthrough(script);
   for (const char what : input.substr(0, std::min(end, mostSteps))) walkthrough.step(what);

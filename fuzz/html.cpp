@@ -3,9 +3,11 @@
 #include <cstdint>
 
 #include "fuzz/require.hpp"
+#include "qz/styled_text/html_reader.hpp"
+#include "text/utf8.hpp"
 #include "toolkit/memory/fonts.hpp"
-#include "toolkit/property_list/utf8.hpp"
-#include "toolkit/styled_text/html_reader.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -17,7 +19,7 @@ void checkRuns(const toolkit::AttributedString& text) {
     require(run.range.location == end && run.range.length > 0, "runs follow one another");
     end += run.range.length;
     require(end <= text.length(), "runs lie in the text");
-    require(toolkit::validUtf8Length(text.string().substr(run.range.location, run.range.length)) ==
+    require(text::validUtf8Length(text.string().substr(run.range.location, run.range.length)) ==
                 run.range.length,
             "a run is whole characters");
   }
@@ -26,10 +28,14 @@ void checkRuns(const toolkit::AttributedString& text) {
 
 }  // namespace
 
+}  // namespace qz
+
+using namespace qz;
+
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-  const toolkit::memory::MemoryFonts fonts;
+  const qz::toolkit::memory::MemoryFonts fonts;
   const std::string_view bytes(reinterpret_cast<const char*>(data), size);
-  const auto text = toolkit::attributedStringFromHTML(bytes, fonts);
+  const auto text = qz::toolkit::attributedStringFromHTML(bytes, fonts);
   require(text.has_value() || size == 0, "only nothing is read as nothing");
   if (text) checkRuns(*text);
   return 0;

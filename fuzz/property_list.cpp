@@ -8,12 +8,14 @@
 #include <string_view>
 
 #include "fuzz/require.hpp"
-#include "toolkit/exception.hpp"
-#include "toolkit/property_list/binary_writer.hpp"
-#include "toolkit/property_list/canonical_dump.hpp"
-#include "toolkit/property_list/reader.hpp"
+#include "qz/property_list/binary_writer.hpp"
+#include "qz/property_list/canonical_dump.hpp"
+#include "qz/property_list/reader.hpp"
+#include "qz/property_list/xml_writer.hpp"
+#include "qz/toolkit/exception.hpp"
 #include "toolkit/property_list/walk.hpp"
-#include "toolkit/property_list/xml_writer.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -74,6 +76,10 @@ void checkReading(std::string_view bytes) {
 }
 
 }  // namespace
+
+}  // namespace qz
+
+using namespace qz;
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
   checkReading({reinterpret_cast<const char*>(data), size});

@@ -6,7 +6,7 @@
 #include <cstdlib>
 #include <string>
 
-namespace fuzz {
+namespace qz::fuzz {
 
 inline void require(bool holds, const std::string& what) {
   if (holds) return;
@@ -14,4 +14,4 @@ inline void require(bool holds, const std::string& what) {
   std::abort();
 }
 
-}  // namespace fuzz
+}  // namespace qz::fuzz

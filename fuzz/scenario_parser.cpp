@@ -8,16 +8,16 @@
 #include "tools/scenario/statements.hpp"
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-  using fuzz::require;
+  using qz::fuzz::require;
   const std::string_view text(reinterpret_cast<const char*>(data), size);
   const auto lines = 1 + std::count(text.begin(), text.end(), '\n');
   try {
-    const auto file = tools::scenario::parseScenarios(text, tools::scenario::vocabulary());
+    const auto file = qz::tools::scenario::parseScenarios(text, qz::tools::scenario::vocabulary());
     require(!file.scenarios.empty(), "a file has scenarios");
     for (const auto& scenario : file.scenarios) {
       require(scenario.line >= 1 && scenario.line <= lines, "a scenario begins in the file");
     }
-  } catch (const tools::scenario::SyntaxError& error) {
+  } catch (const qz::tools::scenario::SyntaxError& error) {
     require(!std::string_view(error.what()).empty(), "a refusal has a reason");
     require(error.at().line >= 1 && error.at().line <= lines && error.at().column >= 1,
             "a refusal points into the file");

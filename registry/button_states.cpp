@@ -1,10 +1,13 @@
 // SPDX-License-Identifier: MIT
 // The states of pressed buttons, which a host can carry over to another walk-through.
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "engine/state.hpp"
+
+namespace qz {
 
 QZ_Plist_State_Parser::Dictionary QZ_Plist_State_Parser::buttonStates() const {
-  return buttonStates_ ? buttonStates_->copy(toolkit::Mutability::immutable) : nullptr;
+  return state_->buttonStates ? state_->buttonStates->copy(toolkit::Mutability::immutable)
+                              : nullptr;
 }
 
 bool QZ_Plist_State_Parser::setButtonSates(Dictionary states) {
@@ -21,3 +24,5 @@ bool QZ_Plist_State_Parser::setButtonSates(Dictionary states) {
   }
   return changed;
 }
+
+}  // namespace qz

@@ -3,8 +3,10 @@
 
 #include <algorithm>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "engine/state.hpp"
 #include "engine/tag_key.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -37,11 +39,11 @@ bool QZ_Plist_State_Parser::getGuiAssetsFromWindow(Window window) {
   if (!window) return false;
   // A window that the engine already keeps alive stays so.
   if (tutorialWindow() != window) {
-    tutorialWindow_.set(toolkit::StoredRef<toolkit::Window>::refer(window));
+    state_->tutorialWindow.set(toolkit::StoredRef<toolkit::Window>::refer(window));
   }
   if (!window->delegate()) window->setDelegate(shared_from_this());
-  guiAssets_->removeAllObjects();
-  originalTagValues_->removeAllObjects();
+  state_->guiAssets->removeAllObjects();
+  state_->originalTagValues->removeAllObjects();
   const Control content = window->contentView();
   const toolkit::Subviews views = content->subviews();  // a copy: it may change during the loop
   std::uint64_t overflowKey = firstOverflowKey(views);
@@ -53,11 +55,11 @@ bool QZ_Plist_State_Parser::getGuiAssetsFromWindow(Window window) {
       button->setAction(buttonAction);
     }
     const std::string own = tagKey(view->tag());
-    const std::string key = guiAssets_->contains(own) ? std::to_string(overflowKey++) : own;
-    guiAssets_->setObject(recordOf(view), key);
-    originalTagValues_->setObject(toolkit::Number::withLong(view->tag()), key);
-    toolkit_.log().write("Found tag value: " + own + " for object: " + view->className() +
-                         " using Key: " + key);
+    const std::string key = state_->guiAssets->contains(own) ? std::to_string(overflowKey++) : own;
+    state_->guiAssets->setObject(recordOf(view), key);
+    state_->originalTagValues->setObject(toolkit::Number::withLong(view->tag()), key);
+    state_->toolkit.log().write("Found tag value: " + own + " for object: " + view->className() +
+                                " using Key: " + key);
     recorded = true;
   }
   return recorded;
@@ -69,3 +71,5 @@ bool QZ_Plist_State_Parser::forceButtonPushedToBeActionForGuiAttribute(Control o
   object->setAction(buttonAction);  // the target stays
   return true;
 }
+
+}  // namespace qz

@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: MIT
 // GUI-asset loading: builds the walk-through window and its controls from a description.
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "engine/state.hpp"
 #include "engine/text_of.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -35,8 +37,8 @@ bool QZ_Plist_State_Parser::loadGuiAssets(Dictionary description,
                                           std::shared_ptr<toolkit::Exception>*) {
   const auto kept = keepAlive();
   const Dictionary assets = description->copy(toolkit::Mutability::immutable);
-  addedObjectToTutorial_->removeAllObjects();
-  tutorialWindow_.set({});  // a window of an earlier load is not closed
+  state_->addedObjectToTutorial->removeAllObjects();
+  state_->tutorialWindow.set({});  // a window of an earlier load is not closed
   if (assets->count() == 0) return false;
 
   Value windowEntry;
@@ -56,7 +58,7 @@ bool QZ_Plist_State_Parser::loadGuiAssets(Dictionary description,
     if (!makeControl(key, entry)) continue;
     // Adds the last control of the list. Without a list, as after termination, adds nothing, but
     // the entry still counts.
-    const Controls controls = *addedObjectToTutorial_;
+    const Controls controls = *state_->addedObjectToTutorial;
     if (controls->count() > 0) {
       const Control last = controls->elements().back();  // kept alive: adding may change the list
       window->contentView()->addSubview(last);
@@ -69,9 +71,9 @@ bool QZ_Plist_State_Parser::loadGuiAssets(Dictionary description,
 
 QZ_Plist_State_Parser::Window QZ_Plist_State_Parser::makeTutorialWindow(
     const toolkit::Rect& content) {
-  Window window = toolkit_.application().makeWindow(content, toolkit::StyleMask::titledAndClosable,
-                                                    toolkit::BackingStore::buffered, true);
-  tutorialWindow_.set(toolkit::StoredRef<toolkit::Window>::own(window));
+  Window window = state_->toolkit.application().makeWindow(
+      content, toolkit::StyleMask::titledAndClosable, toolkit::BackingStore::buffered, true);
+  state_->tutorialWindow.set(toolkit::StoredRef<toolkit::Window>::own(window));
   window->setBackgroundColor(toolkit::colors::black);
   // The buttons have no target: their actions reach the engine through the end of the responder
   // chain.
@@ -86,10 +88,10 @@ QZ_Plist_State_Parser::Control QZ_Plist_State_Parser::makeControl(const Value& k
   // Reads everything before the test of the class: a malformed entry raises, whatever its class.
   const std::string_view className = textOf(entry->objectAtIndex(0));
   const toolkit::Rect frame = rectOf(entry);
-  toolkit::Application& application = toolkit_.application();
+  toolkit::Application& application = state_->toolkit.application();
   if (className == buttonClass) {
     const auto button = application.makeButton(frame);
-    addedObjectToTutorial_->addObject(button);
+    state_->addedObjectToTutorial->addObject(button);
     button->setBezelStyle(toolkit::BezelStyle::texturedSquare);
     button->setHidden(false);
     button->setEnabled(true);
@@ -99,7 +101,7 @@ QZ_Plist_State_Parser::Control QZ_Plist_State_Parser::makeControl(const Value& k
   }
   if (className == imageViewClass) {
     const auto imageView = application.makeImageView(frame);
-    addedObjectToTutorial_->addObject(imageView);
+    state_->addedObjectToTutorial->addObject(imageView);
     imageView->setImageFrameStyle(toolkit::ImageFrameStyle::none);
     imageView->setImageScaling(toolkit::ImageScaling::proportionallyDown);
     imageView->setImageAlignment(toolkit::ImageAlignment::center);
@@ -108,7 +110,7 @@ QZ_Plist_State_Parser::Control QZ_Plist_State_Parser::makeControl(const Value& k
   }
   if (className == textFieldClass) {
     const auto textField = application.makeTextField(frame);
-    addedObjectToTutorial_->addObject(textField);
+    state_->addedObjectToTutorial->addObject(textField);
     textField->setDelegate(shared_from_this());
     textField->setTitle("");
     textField->setHidden(false);
@@ -141,3 +143,5 @@ bool QZ_Plist_State_Parser::createNextGuiAssetEntry(Dictionary* entries,
   }
   return false;
 }
+
+}  // namespace qz

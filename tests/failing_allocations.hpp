@@ -11,7 +11,7 @@
 #include <limits>
 #include <new>
 
-namespace failing_allocations {
+namespace qz::failing_allocations {
 
 constexpr std::size_t never = std::numeric_limits<std::size_t>::max();
 
@@ -39,10 +39,10 @@ inline int failuresOf(const std::function<void()>& action) {
   }
 }
 
-}  // namespace failing_allocations
+}  // namespace qz::failing_allocations
 
 void* operator new(std::size_t size) {
-  using namespace failing_allocations;
+  using namespace qz::failing_allocations;
   if (allocationsLeft == 0) throw std::bad_alloc();
   if (allocationsLeft != never) --allocationsLeft;
   void* memory = std::malloc(size == 0 ? 1 : size);
@@ -52,7 +52,7 @@ void* operator new(std::size_t size) {
 }
 
 void operator delete(void* memory) noexcept {
-  if (memory) --failing_allocations::allocationsAlive;
+  if (memory) --qz::failing_allocations::allocationsAlive;
   std::free(memory);
 }
 

@@ -1,30 +1,32 @@
 // SPDX-License-Identifier: MIT
 // Flashing: one half-second timer toggles the pressed-in look of every button whose tag flashes.
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "engine/state.hpp"
 #include "engine/tag_key.hpp"
-#include "toolkit/property_list/number_conversion.hpp"
+#include "text/number_conversion.hpp"
+
+namespace qz {
 
 using toolkit::asButton;
 
 void QZ_Plist_State_Parser::flasherFired(Timer) {
   const auto kept = keepAlive();
-  if (!flashing_) return;
-  const Dictionary flashing = *flashingTagIds_;
+  if (!state_->flashing) return;
+  const Dictionary flashing = *state_->flashingTagIds;
   for (const std::string& key : flashing->allKeys()) {
     if (!flashing->objectForKey(key)->boolValue()) continue;
-    const auto button = asButton(findObjectWithTag(toolkit::intValueOf(key)));
+    const auto button = asButton(findObjectWithTag(text::intValueOf(key)));
     button->highlight(!button->isHighlighted());
   }
 }
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_ALLOW_FLASHING(bool allow) {
   const auto kept = keepAlive();
-  flashing_ = allow;
+  state_->flashing = allow;
   if (allow) return true;
   // Every button that has a list loses its highlight, even if it was not flashing; a flashing
   // button without a list keeps its look.
-  const Dictionary script = plistDictionary_->copy(toolkit::Mutability::immutable);
+  const Dictionary script = state_->plistDictionary->copy(toolkit::Mutability::immutable);
   for (const auto& [key, list] : script->entries()) {
     asButton(findObjectWithTag(key->intValue()))->highlight(false);
   }
@@ -35,8 +37,8 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_FLASH_ID(ObjectId id, bool 
   const auto kept = keepAlive();
   const std::string key = tagKey(id->longValue());
   // The first FLASH_ID for a tag wins; later ones are ignored.
-  if (flashingTagIds_->objectForKey(key)) return false;
-  flashingTagIds_->setObject(toolkit::Number::withBool(flashOn), key);
+  if (state_->flashingTagIds->objectForKey(key)) return false;
+  state_->flashingTagIds->setObject(toolkit::Number::withBool(flashOn), key);
   if (flashOn) return true;  // the next tick starts it
   const Control control = findObjectWithTag(id->longValue());
   control->highlight(false);  // raises if the control is not a button
@@ -47,3 +49,5 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_FLASH_ID(ObjectId id, bool 
 // Never highlights anything, on purpose: it tests whether the *script's entry* under the id is a
 // button, and gets that far only if the entry is absent. Scripts make a button flash instead.
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_HIGHLIGHT_ID(ObjectId) { return false; }
+
+}  // namespace qz

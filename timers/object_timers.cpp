@@ -2,8 +2,10 @@
 // Object timers: one-shot timers, one per tag key, that press the button of the tag or run its
 // list.
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "engine/state.hpp"
 #include "engine/tag_key.hpp"
+
+namespace qz {
 
 void QZ_Plist_State_Parser::startTimerWithValue(std::uint64_t value,
                                                 std::optional<std::string> forKey) {
@@ -13,20 +15,20 @@ void QZ_Plist_State_Parser::startTimerWithValue(std::uint64_t value,
   const auto interval = static_cast<double>(static_cast<float>(value));
   const auto self = shared_from_this();
   // A replaced timer keeps running; when it fires, no key is found for it.
-  objectIdTimers_->setObject(
-      toolkit_.runLoop().schedule(interval, false,
-                                  [self](const Timer& timer) { self->pseudoButtonPush(timer); }),
+  state_->objectIdTimers->setObject(
+      state_->toolkit.runLoop().schedule(
+          interval, false, [self](const Timer& timer) { self->pseudoButtonPush(timer); }),
       *forKey);
-  notify(&qz::Observer::timerSet, *forKey, interval);
+  state_->notify(&Observer::timerSet, *forKey, interval);
 }
 
 void QZ_Plist_State_Parser::killAllTimers() {
   const auto kept = keepAlive();
-  const Timers timers = *objectIdTimers_;
+  const Timers timers = *state_->objectIdTimers;
   const auto pending = timers->entries();  // a copy: releasing a timer may change the table
   for (const auto& [key, timer] : pending) {
     if (timer->isValid()) timer->invalidate();
-    notify(&qz::Observer::timerCancelled, key);
+    state_->notify(&Observer::timerCancelled, key);
   }
   timers->removeAllObjects();
 }
@@ -39,13 +41,15 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TIMER(std::uint64_t val
     if (value != 0) {
       startTimerWithValue(value, key);
     } else {
-      const Timer pending = objectIdTimers_->objectForKey(key);
+      const Timer pending = state_->objectIdTimers->objectForKey(key);
       pending->invalidate();
-      objectIdTimers_->removeObjectForKey(key);
-      if (pending) notify(&qz::Observer::timerCancelled, key);
+      state_->objectIdTimers->removeObjectForKey(key);
+      if (pending) state_->notify(&Observer::timerCancelled, key);
     }
-  } else if (plistDictionary_->objectForKey(key)) {
+  } else if (state_->plistDictionary->objectForKey(key)) {
     startTimerWithValue(value, key);  // here 0 does not cancel
   }
   return false;  // always, on purpose
 }
+
+}  // namespace qz

@@ -1,9 +1,11 @@
 // SPDX-License-Identifier: MIT
 // Gives a control another tag, optionally with a timer for the new tag.
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "engine/state.hpp"
 #include "engine/tag_key.hpp"
-#include "toolkit/property_list/number_conversion.hpp"
+#include "text/number_conversion.hpp"
+
+namespace qz {
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TAG(ObjectId newTag, ObjectId forId) {
   return QZ_Plist_State_Processor_SET_TAG(std::move(newTag), std::move(forId), nullptr);
@@ -28,12 +30,14 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TAG(ObjectId newTag, Ob
 // Rewrites the entry under the old id instead of moving it to the new tag: flashing follows the id
 // that FLASH_ID named.
 void QZ_Plist_State_Parser::rewriteFlashingEntry(const ObjectId& id) {
-  const Dictionary flashing = *flashingTagIds_;
+  const Dictionary flashing = *state_->flashingTagIds;
   for (const std::string& key : flashing->allKeys()) {
-    if (toolkit::intValueOf(key) != id->intValue()) continue;
+    if (text::intValueOf(key) != id->intValue()) continue;
     const std::string ownKey = tagKey(id->longValue());
     const bool flag = flashing->objectForKey(ownKey)->boolValue();
     flashing->setObject(toolkit::Number::withBool(flag), ownKey);
     return;
   }
 }
+
+}  // namespace qz

@@ -4,12 +4,12 @@
 //
 // Invariant: none of them has state, so that all absent references of a type can share one object.
 
-#include "toolkit/image.hpp"
-#include "toolkit/run_loop.hpp"
-#include "toolkit/view.hpp"
-#include "toolkit/window.hpp"
+#include "qz/toolkit/image.hpp"
+#include "qz/toolkit/run_loop.hpp"
+#include "qz/toolkit/view.hpp"
+#include "qz/toolkit/window.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 
 namespace {
 
@@ -117,4 +117,4 @@ Window& Window::nothing() { return theOnly<NothingWindow>(); }
 Timer& Timer::nothing() { return theOnly<NothingTimer>(); }
 Image& Image::nothing() { return theOnly<NothingImage>(); }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

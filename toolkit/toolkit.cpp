@@ -1,14 +1,14 @@
 // SPDX-License-Identifier: MIT
 // The defaults of a toolkit.
 
-#include "toolkit/toolkit.hpp"
+#include "qz/toolkit/toolkit.hpp"
 
-#include "toolkit/styled_text/html_reader.hpp"
+#include "qz/styled_text/html_reader.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 
 std::optional<AttributedString> Toolkit::attributedStringWithHTML(std::string_view document) {
   return attributedStringFromHTML(document, fonts());
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -2,13 +2,13 @@
 // The default answers of a view to messages that only some kinds understand, and references to
 // kinds of view.
 
-#include "toolkit/view.hpp"
+#include "qz/toolkit/view.hpp"
 
 #include <utility>
 
-#include "toolkit/exception.hpp"
+#include "qz/toolkit/exception.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 
 bool Responder::tryToPerform(std::string_view, const Ref<View>&) { return false; }
 
@@ -52,4 +52,4 @@ Ref<Button> asButton(Ref<View> view) { return seenAs(&View::asButton, std::move(
 Ref<TextField> asTextField(Ref<View> view) { return seenAs(&View::asTextField, std::move(view)); }
 Ref<ImageView> asImageView(Ref<View> view) { return seenAs(&View::asImageView, std::move(view)); }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

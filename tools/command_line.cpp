@@ -7,10 +7,10 @@
 #include <algorithm>
 #include <utility>
 
-#include "tools/failure.hpp"
-#include "tools/suggestions.hpp"
+#include "tools/support/failure.hpp"
+#include "tools/support/suggestions.hpp"
 
-namespace tools {
+namespace qz::tools {
 namespace {
 
 /// Returns the command that was given, or the tool itself if there is none.
@@ -221,4 +221,4 @@ int runCommandLine(const ToolHelp& help, const std::vector<CommandEntry>& comman
   }
 }
 
-}  // namespace tools
+}  // namespace qz::tools

@@ -14,7 +14,7 @@ class App;
 class Option;
 }  // namespace CLI
 
-namespace tools {
+namespace qz::tools {
 
 /// Thrown for a value that an option does not accept. The message says what was expected.
 class UsageError : public std::runtime_error {
@@ -95,4 +95,4 @@ struct ToolHelp {
 int runCommandLine(const ToolHelp& help, const std::vector<CommandEntry>& commands,
                    std::vector<std::string> arguments);
 
-}  // namespace tools
+}  // namespace qz::tools

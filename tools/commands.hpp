@@ -4,11 +4,11 @@
 
 #include "tools/command_line.hpp"
 
-namespace tools {
+namespace qz::tools {
 
 extern const CommandEntry playCommand;     ///< plays a script
 extern const CommandEntry testCommand;     ///< runs scenarios
 extern const CommandEntry dumpCommand;     ///< prints a property list
 extern const CommandEntry convertCommand;  ///< writes a property list in another format
 
-}  // namespace tools
+}  // namespace qz::tools

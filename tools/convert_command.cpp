@@ -6,18 +6,18 @@
 #include <optional>
 #include <string>
 
-#include "toolkit/exception.hpp"
-#include "toolkit/property_list/binary_writer.hpp"
-#include "toolkit/property_list/reader.hpp"
-#include "toolkit/property_list/xml_writer.hpp"
+#include "qz/property_list/binary_writer.hpp"
+#include "qz/property_list/reader.hpp"
+#include "qz/property_list/xml_writer.hpp"
+#include "qz/toolkit/exception.hpp"
 #include "tools/commands.hpp"
-#include "tools/failure.hpp"
-#include "tools/play/input_file.hpp"
-#include "tools/replace_file.hpp"
 #include "tools/shared_values.hpp"
-#include "tools/text_layout.hpp"
+#include "tools/support/failure.hpp"
+#include "tools/support/input_file.hpp"
+#include "tools/support/replace_file.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools {
+namespace qz::tools {
 namespace {
 
 using toolkit::Format;
@@ -81,4 +81,4 @@ void describeConvert(Command& command) {
 constexpr CommandEntry convertCommand{"convert", "Write a property list in another format",
                                       describeConvert};
 
-}  // namespace tools
+}  // namespace qz::tools

@@ -4,15 +4,15 @@
 #include <memory>
 #include <string>
 
-#include "toolkit/property_list/canonical_dump.hpp"
+#include "qz/property_list/canonical_dump.hpp"
 #include "tools/commands.hpp"
-#include "tools/failure.hpp"
-#include "tools/play/input_file.hpp"
 #include "tools/readable_dump.hpp"
 #include "tools/shared_values.hpp"
-#include "tools/terminal.hpp"
+#include "tools/support/failure.hpp"
+#include "tools/support/input_file.hpp"
+#include "tools/support/terminal.hpp"
 
-namespace tools {
+namespace qz::tools {
 namespace {
 
 struct DumpOptions {
@@ -48,4 +48,4 @@ void describeDump(Command& command) {
 
 constexpr CommandEntry dumpCommand{"dump", "Print a property list of any format", describeDump};
 
-}  // namespace tools
+}  // namespace qz::tools

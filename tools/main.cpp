@@ -5,11 +5,11 @@
 
 #include "tools/commands.hpp"
 #include "tools/shell.hpp"
-#include "tools/stack_guard.hpp"
+#include "tools/support/stack_guard.hpp"
 
 int main(int argc, char** argv) {
-  tools::installStackGuard();
+  qz::tools::installStackGuard();
   const std::vector<std::string> arguments(argv + (argc > 0 ? 1 : 0), argv + argc);
-  return tools::runTool(arguments, {tools::playCommand, tools::testCommand, tools::dumpCommand,
-                                    tools::convertCommand});
+  return qz::tools::runTool(arguments, {qz::tools::playCommand, qz::tools::testCommand,
+                                        qz::tools::dumpCommand, qz::tools::convertCommand});
 }

@@ -8,13 +8,13 @@
 #include <memory>
 
 #include "tools/commands.hpp"
-#include "tools/drivers.hpp"
 #include "tools/play/play.hpp"
 #include "tools/play/prompt.hpp"
-#include "tools/terminal.hpp"
-#include "tools/text_layout.hpp"
+#include "tools/support/drivers.hpp"
+#include "tools/support/terminal.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools {
+namespace qz::tools {
 namespace {
 
 constexpr std::size_t narrowest = 72;  // columns; a picture needs this many
@@ -100,4 +100,4 @@ void describePlay(Command& command) {
 constexpr CommandEntry playCommand{
     "play", "Play a script and show, step by step, what its user would see", describePlay};
 
-}  // namespace tools
+}  // namespace qz::tools

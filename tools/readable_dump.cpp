@@ -6,12 +6,13 @@
 #include <string>
 #include <string_view>
 
-#include "toolkit/property_list/scalars.hpp"
-#include "toolkit/property_list/utf8.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "text/hexadecimal.hpp"
+#include "text/utf8.hpp"
 #include "toolkit/property_list/walk.hpp"
-#include "tools/text_layout.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools {
+namespace qz::tools {
 namespace {
 
 using toolkit::Value;
@@ -46,9 +47,9 @@ std::string_view escapeFor(char32_t c) {
 
 /// Returns the escape of half a surrogate pair, which no terminal can show.
 std::string surrogateEscape(char32_t c) {
-  constexpr std::string_view digits = "0123456789abcdef";
   std::string text = "\\u{";
-  for (int shift = 12; shift >= 0; shift -= 4) text += digits[(c >> shift) & 15];
+  for (int shift = 12; shift >= 0; shift -= 4)
+    text += text::hexadecimalCharacter((c >> shift) & 15U);
   return text + "}";
 }
 
@@ -57,9 +58,9 @@ std::string quoted(std::string_view text) {
   std::size_t plain = 0;  // where the text that is not yet in the result begins
   for (std::size_t at = 0; at < text.size();) {
     const std::size_t start = at;
-    const char32_t c = toolkit::nextCodePoint(text, at);
+    const char32_t c = text::nextCodePoint(text, at);
     const std::string escape =
-        toolkit::isSurrogate(c) ? surrogateEscape(c) : std::string(escapeFor(c));
+        text::isSurrogate(c) ? surrogateEscape(c) : std::string(escapeFor(c));
     if (escape.empty()) continue;
     result += oneLine(text.substr(plain, start - plain)) + escape;
     plain = at;
@@ -81,7 +82,6 @@ std::string lineStart(std::size_t level) { return "\n" + std::string(4 * level, 
 /// Shows bytes in groups. More than one line of them begins on a new line, indented one level
 /// deeper than `level`.
 std::string showData(std::string_view bytes, std::size_t level) {
-  constexpr std::string_view digits = "0123456789abcdef";
   const bool isLong = bytes.size() > bytesInLine;
   std::string text = "<";
   for (std::size_t i = 0; i < bytes.size(); ++i) {
@@ -90,8 +90,7 @@ std::string showData(std::string_view bytes, std::size_t level) {
     } else if (i > 0 && i % bytesInGroup == 0) {
       text += ' ';
     }
-    const auto byte = static_cast<unsigned char>(bytes[i]);
-    text += {digits[byte >> 4], digits[byte & 15]};
+    text += text::hexadecimal(static_cast<unsigned char>(bytes[i]));
   }
   return text + (isLong ? lineStart(level) : "") + ">";
 }
@@ -170,4 +169,4 @@ void writeReadableDump(const Value& root, std::ostream& out, bool color) {
   out << '\n';
 }
 
-}  // namespace tools
+}  // namespace qz::tools

@@ -8,12 +8,12 @@
 
 #include <iosfwd>
 
-#include "toolkit/property_list/value.hpp"
+#include "qz/property_list/value.hpp"
 
-namespace tools {
+namespace qz::tools {
 
 /// Writes `root` and a line end. No text in it can move a terminal's cursor: control characters are
 /// escaped, as in `\n`, `\t` or `\u{1b}`. `color` adds a terminal's escape sequences.
 void writeReadableDump(const toolkit::Value& root, std::ostream& out, bool color);
 
-}  // namespace tools
+}  // namespace qz::tools

@@ -9,7 +9,7 @@
 
 #include "toolkit/property_list/walk.hpp"
 
-namespace tools {
+namespace qz::tools {
 namespace {
 
 // How many values any memory holds, and how many per byte files with reasonable sharing reach.
@@ -28,4 +28,4 @@ void requireWritableInFull(const play::InputFile& file) {
                                         "they cannot all be written out");
 }
 
-}  // namespace tools
+}  // namespace qz::tools

@@ -3,11 +3,11 @@
 // collection may appear in many places, and such collections may be nested.
 #pragma once
 
-#include "tools/play/input_file.hpp"
+#include "tools/support/input_file.hpp"
 
-namespace tools {
+namespace qz::tools {
 
 /// Throws a Failure if the file, written out in full, would be out of all proportion to its size.
 void requireWritableInFull(const play::InputFile& file);
 
-}  // namespace tools
+}  // namespace qz::tools

@@ -6,10 +6,10 @@
 #include <iostream>
 #include <new>
 
-#include "tools/failure.hpp"
-#include "tools/text_layout.hpp"
+#include "tools/support/failure.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools {
+namespace qz::tools {
 namespace {
 
 const ToolHelp& toolHelp() {
@@ -55,4 +55,4 @@ int runTool(const std::vector<std::string>& arguments, const std::vector<Command
   return result;
 }
 
-}  // namespace tools
+}  // namespace qz::tools

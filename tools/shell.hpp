@@ -7,10 +7,10 @@
 
 #include "tools/command_line.hpp"
 
-namespace tools {
+namespace qz::tools {
 
 /// Runs the tool with the arguments that follow its name. Returns its exit status. Reports an error
 /// as one line on standard error.
 int runTool(const std::vector<std::string>& arguments, const std::vector<CommandEntry>& commands);
 
-}  // namespace tools
+}  // namespace qz::tools

@@ -10,14 +10,14 @@
 #include <vector>
 
 #include "tools/commands.hpp"
-#include "tools/drivers.hpp"
-#include "tools/failure.hpp"
 #include "tools/scenario/junit.hpp"
 #include "tools/scenario/runner.hpp"
 #include "tools/scenario/scenario_files.hpp"
-#include "tools/text_layout.hpp"
+#include "tools/support/drivers.hpp"
+#include "tools/support/failure.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools {
+namespace qz::tools {
 namespace {
 
 using scenario::LoadedFile;
@@ -150,4 +150,4 @@ void describeTest(Command& command) {
 
 constexpr CommandEntry testCommand{"test", "Run scenarios and say which hold", describeTest};
 
-}  // namespace tools
+}  // namespace qz::tools

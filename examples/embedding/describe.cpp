@@ -3,16 +3,16 @@
 #include <iostream>
 
 #include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+#include "drivers/memory/memory_driver.hpp"
 
 int main() {
-  toolkit::memory::MemoryDriver screen;
+  qz::drivers::MemoryDriver screen;
   screen.setLogSink([](std::string_view line) { std::cout << "log: " << line << '\n'; });
   const auto engine = QZ_Plist_State_Parser::initWithWindow(screen.toolkit(), nullptr);
 
   // The number is the entry's key, and a button's tag. It must be unique across classes: a later
   // entry replaces an earlier one.
-  auto entries = toolkit::Dictionary::make();
+  auto entries = qz::toolkit::Dictionary::make();
   engine->createNextGuiAssetEntry(&entries, "NSWindow", {200, 200, 300, 120}, 1000);
   engine->createNextGuiAssetEntry(&entries, "NSTextField", {20, 70, 260, 30}, 1001);
   engine->createNextGuiAssetEntry(&entries, "NSButton", {200, 20, 80, 30}, 2);

@@ -5,32 +5,35 @@
 #include <iostream>
 
 #include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+#include "qz/toolkit/memory/memory_toolkit.hpp"
 
 namespace {
 
-using toolkit::ViewKind;
+using namespace qz::toolkit;
 
-void show(toolkit::TestDriver& screen, const toolkit::Ref<toolkit::View>& text,
-          const toolkit::Ref<toolkit::View>& button) {
-  std::cout << "text: " << screen.look(text).text.string()
-            << " | button: " << screen.look(button).title.string() << '\n';
+void show(const Ref<TextField>& text, const Ref<Button>& button) {
+  std::cout << "text: " << text->stringValue()
+            << " | button: " << button->attributedTitle()->string() << '\n';
 }
 
 int play(const char* resources) {
-  // The memory toolkit has no screen. Its driver plays the user and the clock, and shows the
-  // window. Toolkit and window must outlive the engine.
-  toolkit::memory::MemoryDriver screen;
-  screen.setResourcePath(resources);
-  screen.setLogSink([](std::string_view line) { std::cout << "log: " << line << '\n'; });
+  // The memory toolkit has no screen, but a clock. Toolkit and window must outlive the engine.
+  memory::MemoryToolkit toolkit;
+  toolkit.files().setResourcePath(resources);
+  toolkit.log().setSink([](std::string_view line) { std::cout << "log: " << line << '\n'; });
 
   // The host's own window. Scripts know its controls by their tags: 2 and 5.
-  const auto window = screen.makeWindow({100, 100, 400, 160});
-  const auto content = window->contentView();
-  const auto button = screen.makeView(ViewKind::button, 2, {300, 20, 80, 30}, content);
-  const auto text = screen.makeView(ViewKind::textField, 5, {20, 80, 360, 40}, content);
+  Application& application = toolkit.application();
+  const auto window = application.makeWindow({100, 100, 400, 160}, StyleMask::titled,
+                                             BackingStore::buffered, false);
+  const auto button = application.makeButton({300, 20, 80, 30});
+  button->setTag(2);
+  window->contentView()->addSubview(button);
+  const auto text = application.makeTextField({20, 80, 360, 40});
+  text->setTag(5);
+  window->contentView()->addSubview(text);
 
-  const auto engine = QZ_Plist_State_Parser::initWithWindow(screen.toolkit(), window);
+  const auto engine = QZ_Plist_State_Parser::initWithWindow(toolkit, window);
   engine->getGuiAssetsFromWindow(window);
   // An empty start key means the script's smallest tag. The list there ends with IDLE_LOOP, so NO
   // means that the list or the script is missing.
@@ -39,13 +42,13 @@ int play(const char* resources) {
     engine->terminateParser();
     return 1;
   }
-  show(screen, text, button);
+  show(text, button);
 
-  screen.advance(10);  // seconds without a press: the script's timer fires
-  show(screen, text, button);
-  screen.click(button);  // runs the list 2, which gives the button the tag 3
-  show(screen, text, button);
-  screen.click(button);  // runs the list 3, which ends the walk-through
+  toolkit.advance(10);  // seconds without a press: the script's timer fires
+  show(text, button);
+  engine->buttonPushed(button);  // a click: runs the list 2, which gives the button the tag 3
+  show(text, button);
+  engine->buttonPushed(button);  // runs the list 3, which ends the walk-through
 
   // The host is not told that the script has ended the walk-through: ask after every press.
   if (!engine->terminating()) engine->terminateParser();
@@ -66,7 +69,7 @@ int main(int argc, char** argv) {
   }
   try {
     return play(argv[1]);
-  } catch (const toolkit::Exception& raised) {  // such as a value that is not a list
+  } catch (const Exception& raised) {  // such as a value that is not a list
     std::cerr << raised.name() << ": " << raised.reason() << '\n';
     return 1;
   }

@@ -5,24 +5,25 @@
 #include <iostream>
 
 #include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+#include "drivers/memory/memory_driver.hpp"
 
 namespace {
 
-using toolkit::ViewKind;
+using qz::drivers::ViewKind;
 
 /// Takes the sheet off the screen: the engine only ends it.
-class Sheet final : public toolkit::SheetDelegate {
+class Sheet final : public qz::toolkit::SheetDelegate {
  public:
-  void sheetDidEnd(const toolkit::Ref<toolkit::Window>& sheet, long returnCode, void*) override {
+  void sheetDidEnd(const qz::toolkit::Ref<qz::toolkit::Window>& sheet, long returnCode,
+                   void*) override {
     sheet->orderOut();
     std::cout << "the sheet ended with " << returnCode << '\n';
   }
 };
 
 /// Plays the script in a panel over the window. Gives the states of the buttons.
-QZ_Plist_State_Parser::Dictionary play(toolkit::TestDriver& screen,
-                                       const toolkit::Ref<toolkit::Window>& window,
+QZ_Plist_State_Parser::Dictionary play(qz::drivers::Driver& screen,
+                                       const qz::toolkit::Ref<qz::toolkit::Window>& window,
                                        const QZ_Plist_State_Parser::Dictionary& states) {
   const auto panel = screen.makeWindow({0, 0, 400, 160});
   const auto next = screen.makeView(ViewKind::button, 2, {300, 20, 80, 30}, panel->contentView());
@@ -47,11 +48,11 @@ int main(int argc, char** argv) {
     std::cerr << "usage: sheet-example DIRECTORY\n";
     return 2;
   }
-  toolkit::memory::MemoryDriver screen;
+  qz::drivers::MemoryDriver screen;
   screen.setResourcePath(argv[1]);
   const auto window = screen.makeWindow({100, 100, 600, 400});
 
-  QZ_Plist_State_Parser::Dictionary states = toolkit::Dictionary::make();
+  QZ_Plist_State_Parser::Dictionary states = qz::toolkit::Dictionary::make();
   for (int round = 0; round < 2; ++round) {
     states = play(screen, window, states);
     std::cout << "the box is " << (states->objectForKey("6")->boolValue() ? "on\n" : "off\n");

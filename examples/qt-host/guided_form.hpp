@@ -4,8 +4,8 @@
 
 #include <QMenuBar>
 
-#include "hosts/qt/walk_through.hpp"
 #include "order_form.hpp"
+#include "qz/hosts/qt/walk_through.hpp"
 #include "tips_panel.hpp"
 
 class GuidedForm final : public OrderForm {
@@ -22,6 +22,6 @@ class GuidedForm final : public OrderForm {
   TipsPanel tips;
 
  private:
-  toolkit::qt::QtToolkit toolkit_;
-  hosts::qt::WalkThrough walkThrough_{toolkit_};
+  qz::toolkit::qt::QtToolkit toolkit_;
+  qz::hosts::qt::WalkThrough walkThrough_{toolkit_};
 };

@@ -2,7 +2,7 @@
 // The end of a walk-through is noticed inside the engine or inside an event of the window.
 // Destroying these objects there would be unsafe, so the clean-up runs later, from Qt's event loop.
 
-#include "hosts/qt/walk_through.hpp"
+#include "qz/hosts/qt/walk_through.hpp"
 
 #include <QEvent>
 #include <QMainWindow>
@@ -10,7 +10,7 @@
 
 #include "engine/script_problem.hpp"
 
-namespace hosts::qt {
+namespace qz::hosts::qt {
 
 namespace {
 
@@ -147,4 +147,4 @@ void WalkThrough::end() {
   if (const auto told = over_) told();
 }
 
-}  // namespace hosts::qt
+}  // namespace qz::hosts::qt

@@ -6,11 +6,11 @@
 #include <cstdint>
 #include <string_view>
 
-#include "toolkit/exception.hpp"
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/scalars.hpp"
-#include "toolkit/tag.hpp"
-#include "toolkit/view.hpp"
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "qz/toolkit/exception.hpp"
+#include "qz/toolkit/tag.hpp"
+#include "qz/toolkit/view.hpp"
 
 namespace qz {
 

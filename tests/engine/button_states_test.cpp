@@ -5,8 +5,10 @@
 
 #include <memory>
 
-#include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -14,10 +16,10 @@ class ButtonStates : public testing::Test {
  protected:
   ~ButtonStates() override { engine->terminateParser(); }
 
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   toolkit::Ref<toolkit::Window> window = driver.makeWindow({0, 0, 300, 200});
   toolkit::Ref<toolkit::View> check =
-      driver.makeView(toolkit::ViewKind::toggle, 12, {20, 20, 100, 30}, window->contentView());
+      driver.makeView(drivers::ViewKind::toggle, 12, {20, 20, 100, 30}, window->contentView());
   std::shared_ptr<QZ_Plist_State_Parser> engine =
       QZ_Plist_State_Parser::initWithWindow(driver.toolkit(), nullptr);
 };
@@ -66,3 +68,5 @@ TEST_F(ButtonStates, AnEndedEngineHasNoRecordLeftInACopysWay) {
 }
 
 }  // namespace
+
+}  // namespace qz

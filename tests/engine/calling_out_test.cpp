@@ -13,18 +13,20 @@
 #include <utility>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
 #include "tests/engine/fakes.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+
+namespace qz {
 
 namespace {
 
 using Engine = QZ_Plist_State_Parser;
+using drivers::ViewKind;
 using toolkit::Array;
 using toolkit::Dictionary;
 using toolkit::Number;
 using toolkit::String;
-using toolkit::ViewKind;
 
 /// A toolkit that calls the host whenever it is used, and forwards to another toolkit.
 struct CallingToolkit final : toolkit::Toolkit {
@@ -117,7 +119,7 @@ class CallingOut : public testing::Test {
     timer = nullptr;
     delegate = std::make_shared<Delegate>();
   }
-  toolkit::ViewPicture look() { return driver.look(button); }
+  drivers::ViewPicture look() { return driver.look(button); }
 
   bool armed = false;
   int lines = 0;
@@ -125,13 +127,13 @@ class CallingOut : public testing::Test {
     if (!std::exchange(armed, false)) return;
     changeEverything();
   };
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   CallingToolkit calling{driver.toolkit(), callHost};
   Engine::Window screen = driver.makeWindow({0, 0, 300, 200});
   Engine::Control button =
-      driver.makeView(ViewKind::toggle, 7, {20, 20, 100, 30}, screen->contentView());
+      driver.makeView(drivers::ViewKind::toggle, 7, {20, 20, 100, 30}, screen->contentView());
   Engine::Control other =
-      driver.makeView(ViewKind::toggle, 8, {20, 60, 100, 30}, screen->contentView());
+      driver.makeView(drivers::ViewKind::toggle, 8, {20, 60, 100, 30}, screen->contentView());
   std::shared_ptr<CallingContent> content = std::make_shared<CallingContent>();
 
   // The variables that the host passes in and changes.
@@ -379,7 +381,7 @@ TEST_F(CallingOut, ToolTipsAreTheOnesGiven) {
 
 TEST_F(CallingOut, AnImageIsForTheControlGiven) {
   const auto picture =
-      driver.makeView(ViewKind::imageView, 5, {20, 90, 30, 30}, screen->contentView());
+      driver.makeView(drivers::ViewKind::imageView, 5, {20, 90, 30, 30}, screen->contentView());
   content->views.push_back(picture);
   parameters = Array::make({text, Number::withLong(5)});
   EXPECT_TRUE(endsOnlyAfter([&](Engine& called) {
@@ -455,3 +457,5 @@ TEST_F(CallingOut, AnOperationThatRaisedDoesNotKeepTheEngine) {
 }
 
 }  // namespace
+
+}  // namespace qz

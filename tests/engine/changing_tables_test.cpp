@@ -8,8 +8,10 @@
 #include <memory>
 #include <utility>
 
-#include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -45,7 +47,7 @@ class ChangingTables : public testing::Test {
     engine->setObjectIdTimers(timers);
   }
 
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   std::shared_ptr<NotifyingTimer> first = std::make_shared<NotifyingTimer>();
   std::shared_ptr<NotifyingTimer> second = std::make_shared<NotifyingTimer>();
   Engine::Timers timers = toolkit::Table<Engine::Timer>::make();
@@ -86,3 +88,5 @@ TEST_F(ChangingTables, ATimerThatIsReplacedMayEmptyTheTable) {
 }
 
 }  // namespace
+
+}  // namespace qz

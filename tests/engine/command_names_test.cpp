@@ -6,7 +6,9 @@
 #include <set>
 #include <string>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "qz/engine.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -63,3 +65,5 @@ TEST(CommandNames, HoldTheirOwnNameButForTheIdleCommand) {
 }
 
 }  // namespace
+
+}  // namespace qz

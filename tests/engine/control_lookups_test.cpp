@@ -8,9 +8,11 @@
 #include <string>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
 #include "tests/engine/fakes.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -60,7 +62,7 @@ class ChangingContent final : public fakes::FakeRole<View> {
 /// Runs one command for the tag in a window over the content, and returns its result.
 bool run(const std::string& command, const std::shared_ptr<ChangingContent>& content,
          const toolkit::ValueRef<toolkit::Array>& parameters = toolkit::Array::make()) {
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   const auto engine = QZ_Plist_State_Parser::init(driver.toolkit());
   engine->setTutorialWindow(std::make_shared<fakes::FakeWindow>(content));
   return engine->doCompoundCommand(command, parameters, toolkit::Number::withLong(target));
@@ -134,7 +136,7 @@ TEST(ControlLookups, EnablingAndDisablingLookOnce) {
 TEST(ControlLookups, ASimpleCommandLooksOnceWhateverItsName) {
   for (const char* name : {"HIDE_OBJECT_WITH_ID", "IDLE_LOOP", "NO_SUCH_COMMAND", ""}) {
     SCOPED_TRACE(name);
-    toolkit::memory::MemoryDriver driver;
+    drivers::MemoryDriver driver;
     const auto content = std::make_shared<ChangingContent>("v");
     const auto engine = QZ_Plist_State_Parser::init(driver.toolkit());
     engine->setTutorialWindow(std::make_shared<fakes::FakeWindow>(content));
@@ -161,7 +163,7 @@ TEST(ControlLookups, LoadingAnImageLooksOnceForTwoParametersOnly) {
 }
 
 TEST(ControlLookups, TheBackgroundIsLayeredBeforeItShowsAnImage) {
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   const auto content = std::make_shared<FakeView>();
   const auto engine = QZ_Plist_State_Parser::init(driver.toolkit());
   engine->setTutorialWindow(std::make_shared<fakes::FakeWindow>(content));
@@ -172,3 +174,5 @@ TEST(ControlLookups, TheBackgroundIsLayeredBeforeItShowsAnImage) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -3,7 +3,9 @@
 
 #include <gtest/gtest.h>
 
-#include "toolkit/property_list/scalars.hpp"
+#include "qz/property_list/scalars.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -106,3 +108,5 @@ TEST(EndlessChains, OfAHundredThousandListsAreFoundAtOnce) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -7,10 +7,10 @@
 #include <string>
 #include <vector>
 
-#include "toolkit/view.hpp"
-#include "toolkit/window.hpp"
+#include "qz/toolkit/view.hpp"
+#include "qz/toolkit/window.hpp"
 
-namespace fakes {
+namespace qz::fakes {
 
 /// Supports the operations that every view has, and records the calls that change how the view is
 /// drawn or ask about it.
@@ -106,4 +106,4 @@ inline std::shared_ptr<FakeWindow> windowWith(const std::shared_ptr<toolkit::Vie
   return std::make_shared<FakeWindow>(content);
 }
 
-}  // namespace fakes
+}  // namespace qz::fakes

@@ -6,9 +6,11 @@
 #include <functional>
 #include <memory>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
 #include "tests/engine/fakes.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -29,7 +31,7 @@ class AskedView final : public fakes::FakeRole<toolkit::View> {
 };
 
 TEST(Flasher, WalksTheTagsThatWereMarkedWhenItsTickBegan) {
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   const auto engine = QZ_Plist_State_Parser::init(driver.toolkit());
   const auto content = std::make_shared<fakes::FakeRole<toolkit::View>>();
   const auto first = std::make_shared<AskedView>(1);
@@ -48,3 +50,5 @@ TEST(Flasher, WalksTheTagsThatWereMarkedWhenItsTickBegan) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -11,16 +11,18 @@
 #include <utility>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
 #include "tests/engine/fakes.hpp"
-#include "toolkit/memory/memory_driver.hpp"
 #include "toolkit/memory/views.hpp"
+
+namespace qz {
 
 namespace {
 
+using drivers::MemoryDriver;
 using toolkit::Ref;
 using toolkit::ValueRef;
-using toolkit::memory::MemoryDriver;
 
 /// The arguments of a request for a window.
 struct WindowOrder {
@@ -92,7 +94,7 @@ class ObservedToolkit final : public toolkit::Toolkit {
   toolkit::Files& files() override { return driver.toolkit().files(); }
   toolkit::Log& log() override { return driver.toolkit().log(); }
 
-  MemoryDriver driver;
+  drivers::MemoryDriver driver;
   ObservedApplication observed{driver.toolkit().application()};
 };
 
@@ -166,7 +168,7 @@ TEST_F(GuiAssets, WithoutAWindowNoControlIsMade) {
 // Only a discovery empties the records, and without a window there is no discovery.
 TEST_F(GuiAssets, WithoutAWindowTheRecordsOfADiscoveryStay) {
   const auto window = toolkit.driver.makeWindow({0, 0, 300, 200});
-  toolkit.driver.makeView(toolkit::ViewKind::button, 7, {0, 0, 9, 9}, window->contentView());
+  toolkit.driver.makeView(drivers::ViewKind::button, 7, {0, 0, 9, 9}, window->contentView());
   EXPECT_TRUE(engine->getGuiAssetsFromWindow(window));
   toolkit.observed.refuses = true;
   EXPECT_FALSE(load({{"1", entry("NSButton", {0, 0, 9, 9})}}));
@@ -258,7 +260,7 @@ TEST_F(GuiAssets, DescriptionIsLeftAsItIs) {
 }
 
 TEST(AssetEntries, AnEntryIsAnUnchangeableListOfSinglePrecisionNumbers) {
-  MemoryDriver driver;
+  drivers::MemoryDriver driver;
   const auto engine = QZ_Plist_State_Parser::init(driver.toolkit());
   auto entries = toolkit::Dictionary::make();
   ASSERT_TRUE(engine->createNextGuiAssetEntry(&entries, "NSButton", {1, 2, 3, 4}, 12));
@@ -271,7 +273,7 @@ TEST(AssetEntries, AnEntryIsAnUnchangeableListOfSinglePrecisionNumbers) {
 }
 
 TEST(AssetEntries, WithoutAPlaceForThemNothingIsWritten) {
-  MemoryDriver driver;
+  drivers::MemoryDriver driver;
   const auto engine = QZ_Plist_State_Parser::init(driver.toolkit());
   EXPECT_FALSE(engine->createNextGuiAssetEntry(nullptr, "NSButton", {1, 2, 3, 4}, 12));
 }
@@ -302,3 +304,5 @@ TEST_F(GuiAssets, ADescriptionThatChangesMeanwhileIsBuiltAsItWas) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -7,8 +7,10 @@
 #include <string>
 #include <string_view>
 
-#include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_toolkit.hpp"
+#include "qz/engine.hpp"
+#include "qz/toolkit/memory/memory_toolkit.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -96,3 +98,5 @@ TEST_F(HtmlDocuments, OfAnAbsentFragmentSayWhatFormatsPrintForNothing) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -8,8 +8,10 @@
 #include <string>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -22,7 +24,7 @@ class Lifetime : public testing::Test {
     return driver->toolkit().runLoop().schedule(1000, repeats, [](const Engine::Timer&) {});
   }
 
-  std::optional<toolkit::memory::MemoryDriver> driver{std::in_place};
+  std::optional<drivers::MemoryDriver> driver{std::in_place};
   std::shared_ptr<Engine> engine = Engine::init(driver->toolkit());
 };
 
@@ -200,7 +202,7 @@ class LetGo : public Lifetime {
 
   toolkit::Ref<toolkit::Window> window = driver->makeWindow({0, 0, 300, 200});
   toolkit::Ref<toolkit::View> button =
-      driver->makeView(toolkit::ViewKind::button, 7, {20, 20, 100, 30}, window->contentView());
+      driver->makeView(drivers::ViewKind::button, 7, {20, 20, 100, 30}, window->contentView());
 };
 
 TEST_F(LetGo, InARunTheRunIsDone) {
@@ -282,3 +284,5 @@ TEST_F(Lifetime, OnlyAnEndingEnginesObjectTimersAreStoppedUnasked) {
 }
 
 }  // namespace
+
+}  // namespace qz

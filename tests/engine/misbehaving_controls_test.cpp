@@ -10,9 +10,11 @@
 #include <string>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
 #include "tests/engine/fakes.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -83,7 +85,7 @@ class MisbehavingControls : public testing::Test {
   }
 
   std::vector<std::string> log;
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   std::shared_ptr<Unruly> control = std::make_shared<Unruly>();
   std::shared_ptr<QZ_Plist_State_Parser> engine = QZ_Plist_State_Parser::init(driver.toolkit());
 };
@@ -147,3 +149,5 @@ TEST_F(MisbehavingControls, SomeCommandsAskWhetherARedrawIsPending) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -9,9 +9,11 @@
 #include <string_view>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_driver.hpp"
-#include "toolkit/property_list/reader.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
+#include "qz/property_list/reader.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -52,7 +54,7 @@ class ObserverTest : public testing::Test {
  protected:
   ObserverTest() {
     driver.setLogSink([](std::string_view) {});
-    button = driver.makeView(toolkit::ViewKind::button, 1, {0, 0, 80, 20}, window->contentView());
+    button = driver.makeView(drivers::ViewKind::button, 1, {0, 0, 80, 20}, window->contentView());
     engine->getGuiAssetsFromWindow(window);
     engine->setObserver(notes);
   }
@@ -64,7 +66,7 @@ class ObserverTest : public testing::Test {
   /// Returns the lines recorded since the last call.
   Lines noted() { return std::exchange(notes->lines, {}); }
 
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   toolkit::Ref<toolkit::Window> window = driver.makeWindow({0, 0, 200, 100});
   toolkit::Ref<toolkit::View> button;
   std::shared_ptr<QZ_Plist_State_Parser> engine =
@@ -142,3 +144,5 @@ TEST_F(ObserverTest, MayBeReplacedWhileItIsTold) {
 }
 
 }  // namespace
+
+}  // namespace qz

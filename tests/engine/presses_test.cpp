@@ -8,8 +8,10 @@
 #include <string>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -42,10 +44,10 @@ class Presses : public testing::Test {
 
   std::vector<std::string> log;
   std::function<void()> onLog;
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   toolkit::Ref<toolkit::Window> window = driver.makeWindow({0, 0, 300, 200});
   toolkit::Ref<toolkit::View> button =
-      driver.makeView(toolkit::ViewKind::toggle, 7, {20, 20, 100, 30}, window->contentView());
+      driver.makeView(drivers::ViewKind::toggle, 7, {20, 20, 100, 30}, window->contentView());
   std::shared_ptr<Engine> engine = Engine::initWithWindow(driver.toolkit(), nullptr);
 };
 
@@ -117,3 +119,5 @@ TEST_F(Presses, ARecordedStateIsABoolean) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -9,8 +9,10 @@
 #include <string>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -26,10 +28,10 @@ class Processors : public testing::Test {
   ~Processors() override { engine->terminateParser(); }
 
   std::vector<std::string> log;
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   toolkit::Ref<toolkit::Window> window = driver.makeWindow({0, 0, 300, 200});
   toolkit::Ref<toolkit::View> button =
-      driver.makeView(toolkit::ViewKind::button, 7, {20, 20, 100, 30}, window->contentView());
+      driver.makeView(drivers::ViewKind::button, 7, {20, 20, 100, 30}, window->contentView());
   std::shared_ptr<QZ_Plist_State_Parser> engine =
       QZ_Plist_State_Parser::initWithWindow(driver.toolkit(), nullptr);
 };
@@ -114,3 +116,5 @@ TEST_F(Processors, NothingEqualsAnAbsentText) {
 }
 
 }  // namespace
+
+}  // namespace qz

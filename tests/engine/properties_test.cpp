@@ -10,8 +10,10 @@
 #include <thread>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -25,7 +27,7 @@ class Properties : public testing::Test {
  protected:
   ~Properties() override { engine->terminateParser(); }
 
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   std::shared_ptr<Engine> engine = Engine::initWithWindow(driver.toolkit(), nullptr);
 };
 
@@ -167,3 +169,5 @@ TEST_F(Properties, AnyThreadMayReplaceTheWindows) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -6,8 +6,10 @@
 #include <cstdint>
 #include <memory>
 
-#include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -27,10 +29,10 @@ class Retagging : public testing::Test {
     return engine->objectIdTimers()->objectForKey(key)->interval();
   }
 
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   toolkit::Ref<toolkit::Window> window = driver.makeWindow({0, 0, 300, 200});
   toolkit::Ref<toolkit::View> button =
-      driver.makeView(toolkit::ViewKind::button, 7, {20, 20, 100, 30}, window->contentView());
+      driver.makeView(drivers::ViewKind::button, 7, {20, 20, 100, 30}, window->contentView());
   std::shared_ptr<QZ_Plist_State_Parser> engine =
       QZ_Plist_State_Parser::initWithWindow(driver.toolkit(), nullptr);
 };
@@ -58,3 +60,5 @@ TEST_F(Retagging, WithoutAParameterNoTimerIsArmed) {
 }
 
 }  // namespace
+
+}  // namespace qz

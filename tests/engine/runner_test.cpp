@@ -11,10 +11,12 @@
 #include <utility>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
+#include "qz/property_list/reader.hpp"
 #include "tests/engine/fakes.hpp"
-#include "toolkit/memory/memory_driver.hpp"
-#include "toolkit/property_list/reader.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -38,7 +40,7 @@ class Runner : public testing::Test {
 
   static constexpr toolkit::Tag tag = 7;
   std::vector<std::string> log;
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   std::shared_ptr<fakes::FakeView> view = std::make_shared<fakes::FakeView>(tag);
   std::shared_ptr<QZ_Plist_State_Parser> engine = QZ_Plist_State_Parser::init(driver.toolkit());
 };
@@ -221,3 +223,5 @@ TEST_F(Runner, TakesAListsCountIn32BitsWithASign) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -10,8 +10,10 @@
 #include <random>
 #include <string>
 
-#include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -39,7 +41,7 @@ class ScriptLoading : public testing::Test {
   }
 
   fs::path resources;
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   std::shared_ptr<Engine> engine = Engine::initWithWindow(driver.toolkit(), nullptr);
 };
 
@@ -124,3 +126,5 @@ TEST_F(ScriptLoading, AMillionElementsAreReadAndRun) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -4,7 +4,9 @@
 
 #include <gtest/gtest.h>
 
-#include "toolkit/property_list/reader.hpp"
+#include "qz/property_list/reader.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -29,3 +31,5 @@ TEST(ScriptProblem, SaysWhatIsWrong) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -5,9 +5,11 @@
 
 #include <memory>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
 #include "tests/engine/fakes.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -23,7 +25,7 @@ class Retagged final : public fakes::FakeRole<toolkit::View> {
 };
 
 TEST(TagRestoration, LeavesAControlThatHasItsTag) {
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   const auto engine = QZ_Plist_State_Parser::init(driver.toolkit());
   const auto view = std::make_shared<Retagged>(7);
   const auto assets = toolkit::Table<AssetRecord>::make();
@@ -43,3 +45,5 @@ TEST(TagRestoration, LeavesAControlThatHasItsTag) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -8,9 +8,11 @@
 #include <string>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
 #include "tests/engine/fakes.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -39,7 +41,7 @@ class Teardown : public testing::Test {
            !engine->commandArray();
   }
 
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   toolkit::Ref<toolkit::Button> button = driver.toolkit().application().makeButton({0, 0, 9, 9});
   std::shared_ptr<fakes::FakeWindow> window = fakes::windowWith(button.pointer());
   std::shared_ptr<Engine> engine = Engine::initWithWindow(driver.toolkit(), nullptr);
@@ -139,3 +141,5 @@ TEST_F(Teardown, ASheetMayEndWithoutADelegate) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -1,16 +1,18 @@
 // SPDX-License-Identifier: MIT
 // Upper case by the rules of Unicode: every class of letter, and everything that is not a letter.
 
-#include "toolkit/uppercase.hpp"
+#include "text/uppercase.hpp"
 
 #include <gtest/gtest.h>
 
 #include <string>
 #include <string_view>
 
+namespace qz {
+
 namespace {
 
-using toolkit::uppercased;
+using text::uppercased;
 
 struct UppercaseCase {
   const char* name;
@@ -19,7 +21,7 @@ struct UppercaseCase {
 };
 
 void check(const UppercaseCase& wanted) {
-  EXPECT_EQ(uppercased(wanted.text), wanted.upper) << wanted.name;
+  EXPECT_EQ(text::uppercased(wanted.text), wanted.upper) << wanted.name;
 }
 
 TEST(Uppercase, SingleLetters) {
@@ -111,8 +113,8 @@ TEST(Uppercase, UpperCaseIsUpperCaseAlready) {
   int changed = 0;
   for (char32_t c = 0; c < beyondAllCase; ++c) {
     const std::string text = encoded(c);
-    const std::string upper = uppercased(text);
-    ASSERT_EQ(uppercased(upper), upper) << std::hex << static_cast<unsigned>(c);
+    const std::string upper = text::uppercased(text);
+    ASSERT_EQ(text::uppercased(upper), upper) << std::hex << static_cast<unsigned>(c);
     if (upper != text) ++changed;
   }
   EXPECT_GT(changed, 1400);  // each new version of Unicode may add letters with an upper case
@@ -126,8 +128,8 @@ TEST(Uppercase, WhatIsInUpperCaseIsNotCopied) {
       text[at] = static_cast<char>(c);
       const bool isLeft = c < 0x60;  // neither a small letter nor a sign next to them
       std::string storage;
-      const std::string_view upper = uppercased(text, storage);
-      ASSERT_EQ(upper, uppercased(text)) << c << " at " << at;
+      const std::string_view upper = text::uppercased(text, storage);
+      ASSERT_EQ(upper, text::uppercased(text)) << c << " at " << at;
       ASSERT_EQ(upper.data() == text.data(), isLeft) << c << " at " << at;
     }
   }
@@ -135,16 +137,18 @@ TEST(Uppercase, WhatIsInUpperCaseIsNotCopied) {
 
 TEST(Uppercase, ShortTextIsRaisedWithStorageToo) {
   std::string storage;
-  EXPECT_EQ(uppercased("", storage), "");
-  EXPECT_EQ(uppercased("setTag", storage), "SETTAG");
+  EXPECT_EQ(text::uppercased("", storage), "");
+  EXPECT_EQ(text::uppercased("setTag", storage), "SETTAG");
 }
 
 TEST(Uppercase, EveryCharacterIsOnItsOwn) {
   for (char32_t c = 0x80; c < beyondAllCase; ++c) {
     const std::string text = encoded(c);
-    ASSERT_EQ(uppercased("a" + text + "z"), "A" + uppercased(text) + "Z")
+    ASSERT_EQ(text::uppercased("a" + text + "z"), "A" + text::uppercased(text) + "Z")
         << std::hex << static_cast<unsigned>(c);
   }
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -9,16 +9,18 @@
 #include <type_traits>
 #include <utility>
 
-#include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/memory/memory_driver.hpp"
-#include "toolkit/property_list/number_conversion.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
+#include "text/number_conversion.hpp"
+
+namespace qz {
 
 namespace {
 
+using drivers::ViewKind;
 using toolkit::Array;
 using toolkit::Number;
 using toolkit::String;
-using toolkit::ViewKind;
 
 // Whatever the width of `long`, a tag has 64 bits with a sign all the way from the number or key
 // that names a control to the control itself.
@@ -32,7 +34,7 @@ static_assert(std::is_same_v<decltype(&Engine::findObjectWithTag),
                              Engine::Control (Engine::*)(toolkit::Tag) const>);
 static_assert(std::is_same_v<decltype(std::declval<Number>().longValue()), toolkit::Tag>);
 static_assert(std::is_same_v<decltype(std::declval<Number>().integerValue()), toolkit::Tag>);
-static_assert(std::is_same_v<decltype(toolkit::integerValueOf("")), toolkit::Tag>);
+static_assert(std::is_same_v<decltype(text::integerValueOf("")), toolkit::Tag>);
 
 constexpr toolkit::Tag beyond = toolkit::Tag{1} << 32;
 constexpr toolkit::Tag near = 7;
@@ -43,7 +45,7 @@ class WideIds : public testing::Test {
   WideIds() { engine->getGuiAssetsFromWindow(window); }
   ~WideIds() override { engine->terminateParser(); }
 
-  toolkit::Ref<toolkit::View> view(ViewKind kind, toolkit::Tag tag) {
+  toolkit::Ref<toolkit::View> view(drivers::ViewKind kind, toolkit::Tag tag) {
     return driver.makeView(kind, tag, {20, 20, 100, 30}, window->contentView());
   }
   bool showHtml(const toolkit::ValueRef<>& size) {
@@ -51,15 +53,15 @@ class WideIds : public testing::Test {
         String::make("html"), String::make("Times"), size, Number::withLong(far));
   }
 
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   toolkit::Ref<toolkit::Window> window = driver.makeWindow({0, 0, 300, 200});
   std::shared_ptr<QZ_Plist_State_Parser> engine =
       QZ_Plist_State_Parser::initWithWindow(driver.toolkit(), window);
 };
 
 TEST_F(WideIds, ReachTheControlWithAllOfThem) {
-  const auto nearField = view(ViewKind::textField, near);
-  const auto field = view(ViewKind::textField, far);
+  const auto nearField = view(drivers::ViewKind::textField, near);
+  const auto field = view(drivers::ViewKind::textField, far);
   const auto id = Number::withLong(far);
   EXPECT_TRUE(engine->QZ_Plist_State_Processor_SET_TEXT(String::make("text"), id));
   EXPECT_EQ(driver.look(field).text.string(), "text");
@@ -79,7 +81,7 @@ TEST_F(WideIds, AreTagsFromTheControlToTheKeyAndBack) {
       {std::numeric_limits<toolkit::Tag>::min(), "-9223372036854775808"},
   };
   for (const auto& [tag, key] : rows) {
-    const auto button = view(ViewKind::toggle, tag);
+    const auto button = view(drivers::ViewKind::toggle, tag);
     button->setAction("buttonPushed:");
     EXPECT_EQ(button->tag(), tag);
     EXPECT_EQ(engine->findObjectWithTag(tag), button);
@@ -100,7 +102,7 @@ TEST_F(WideIds, AreTagsFromTheControlToTheKeyAndBack) {
 
 TEST_F(WideIds, AfterTheLargestTagOverflowKeysGoOn) {
   constexpr toolkit::Tag largest = std::numeric_limits<toolkit::Tag>::max();
-  for (int i = 0; i < 3; ++i) view(ViewKind::button, largest);
+  for (int i = 0; i < 3; ++i) view(drivers::ViewKind::button, largest);
   EXPECT_TRUE(engine->getGuiAssetsFromWindow(window));
   for (const char* key : {"9223372036854775807", "9223372036854775808", "9223372036854775809"}) {
     EXPECT_TRUE(engine->guiAssets()->contains(key));
@@ -109,15 +111,15 @@ TEST_F(WideIds, AfterTheLargestTagOverflowKeysGoOn) {
 }
 
 TEST_F(WideIds, StopTheFlashingOfTheirOwnButton) {
-  view(ViewKind::button, near)->highlight(true);
-  const auto button = view(ViewKind::button, far);
+  view(drivers::ViewKind::button, near)->highlight(true);
+  const auto button = view(drivers::ViewKind::button, far);
   button->highlight(true);
   EXPECT_TRUE(engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(far), false));
   EXPECT_FALSE(driver.look(button).highlighted);
 }
 
 TEST_F(WideIds, OfAFontSizeCountInTheir32LowBits) {
-  const auto field = view(ViewKind::textField, far);
+  const auto field = view(drivers::ViewKind::textField, far);
   EXPECT_TRUE(showHtml(Number::withLong(18 + beyond)));
   const auto text = driver.look(field).text;
   ASSERT_EQ(text.runs().size(), 1U);
@@ -125,15 +127,15 @@ TEST_F(WideIds, OfAFontSizeCountInTheir32LowBits) {
 }
 
 TEST_F(WideIds, OfAnImageViewCountInTheir32LowBits) {
-  view(ViewKind::imageView, near);
+  view(drivers::ViewKind::imageView, near);
   const auto parameters = Array::make({String::make("none"), Number::withLong(far)});
   EXPECT_TRUE(engine->QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH(parameters,
                                                                              Number::withLong(1)));
 }
 
 TEST_F(WideIds, AFlashingEntryIsSoughtBy32BitsAndRewrittenUnderAll) {
-  view(ViewKind::button, near);
-  view(ViewKind::button, far);
+  view(drivers::ViewKind::button, near);
+  view(drivers::ViewKind::button, far);
   engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(near), true);
   EXPECT_TRUE(engine->QZ_Plist_State_Processor_SET_TAG(Number::withLong(9), Number::withLong(far)));
   const auto flashing = engine->flashingTagIds();
@@ -144,7 +146,7 @@ TEST_F(WideIds, AFlashingEntryIsSoughtBy32BitsAndRewrittenUnderAll) {
 
 // A key's text beyond 32 bits is clamped to the nearest 32-bit number.
 TEST_F(WideIds, AFlashingKeyBeyond32BitsIsTheGreatestOfThem) {
-  view(ViewKind::button, 2147483647);
+  view(drivers::ViewKind::button, 2147483647);
   engine->QZ_Plist_State_Processor_FLASH_ID(Number::withLong(99999999999), true);
   EXPECT_TRUE(
       engine->QZ_Plist_State_Processor_SET_TAG(Number::withLong(9), Number::withLong(2147483647)));
@@ -152,10 +154,12 @@ TEST_F(WideIds, AFlashingKeyBeyond32BitsIsTheGreatestOfThem) {
 }
 
 TEST_F(WideIds, OfANewTagAllNameItsTimer) {
-  view(ViewKind::button, near);
+  view(drivers::ViewKind::button, near);
   EXPECT_TRUE(engine->QZ_Plist_State_Processor_SET_TAG(
       Number::withLong(far), Number::withLong(near), Number::withLong(3)));
   EXPECT_TRUE(engine->objectIdTimers()->contains(std::to_string(far)));
 }
 
 }  // namespace
+
+}  // namespace qz

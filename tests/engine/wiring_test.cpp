@@ -9,9 +9,11 @@
 #include <utility>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
 #include "tests/engine/fakes.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -42,7 +44,7 @@ class Wiring : public testing::Test {
   }
 
   std::vector<std::string> log;
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   std::shared_ptr<QZ_Plist_State_Parser> engine = QZ_Plist_State_Parser::init(driver.toolkit());
 };
 
@@ -103,3 +105,5 @@ TEST_F(Wiring, TheEngineUnderstandsItsOwnActionOnly) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -3,12 +3,12 @@
 
 #include <gtest/gtest.h>
 
-#include "toolkit/image.hpp"
-#include "toolkit/run_loop.hpp"
-#include "toolkit/view.hpp"
-#include "toolkit/window.hpp"
+#include "qz/toolkit/image.hpp"
+#include "qz/toolkit/run_loop.hpp"
+#include "qz/toolkit/view.hpp"
+#include "qz/toolkit/window.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 // An absent view of any kind answers the same before and after every message.
@@ -116,4 +116,4 @@ TEST(AbsentReference, IsOfNoKind) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

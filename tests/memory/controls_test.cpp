@@ -6,7 +6,7 @@
 #include "tests/memory/support.hpp"
 #include "toolkit/memory/views.hpp"
 
-namespace toolkit::memory::test {
+namespace qz::toolkit::memory::test {
 namespace {
 
 using ControlsTest = MemoryTest;
@@ -15,9 +15,10 @@ TEST_F(ControlsTest, NewControlsHaveTheToolkitsDefaults) {
   const Ref<View> controls[] = {application.makeButton({1, 2, 3, 4}),
                                 application.makeImageView({1, 2, 3, 4}),
                                 application.makeTextField({1, 2, 3, 4})};
-  const ViewKind kinds[] = {ViewKind::button, ViewKind::imageView, ViewKind::textField};
+  const drivers::ViewKind kinds[] = {drivers::ViewKind::button, drivers::ViewKind::imageView,
+                                     drivers::ViewKind::textField};
   for (std::size_t i = 0; i < 3; ++i) {
-    const ViewPicture picture = driver.look(controls[i]);
+    const drivers::ViewPicture picture = driver.look(controls[i]);
     EXPECT_EQ(picture.kind, kinds[i]);
     EXPECT_EQ(picture.className, driver.className(kinds[i]));
     EXPECT_EQ(picture.tag, 0);
@@ -38,7 +39,7 @@ TEST_F(ControlsTest, NewControlsHaveTheToolkitsDefaults) {
 TEST_F(ControlsTest, ATitleIsPlainOrAttributed) {
   TextAttributes red;
   red.foregroundColor = colors::red;
-  const Ref<Button> button = asButton(make(ViewKind::button));
+  const Ref<Button> button = asButton(make(drivers::ViewKind::button));
   button->setTitle("Next");
   EXPECT_EQ(button->attributedTitle(), AttributedString("Next"));
   button->setAttributedTitle(AttributedString("Stop", red));
@@ -52,7 +53,8 @@ TEST_F(ControlsTest, ATitleIsPlainOrAttributed) {
 TEST_F(ControlsTest, AStringValueReadsBackAsSet) {
   TextAttributes underlined;
   underlined.underline = true;
-  for (const ViewKind kind : {ViewKind::button, ViewKind::textField, ViewKind::imageView}) {
+  for (const drivers::ViewKind kind :
+       {drivers::ViewKind::button, drivers::ViewKind::textField, drivers::ViewKind::imageView}) {
     const Ref<View> control = make(kind);
     EXPECT_EQ(control->stringValue(), "");
     control->setAttributedStringValue(AttributedString("styled", underlined));
@@ -65,7 +67,7 @@ TEST_F(ControlsTest, AStringValueReadsBackAsSet) {
 }
 
 TEST_F(ControlsTest, ATextFieldsTitleIsItsText) {
-  const Ref<TextField> field = asTextField(make(ViewKind::textField));
+  const Ref<TextField> field = asTextField(make(drivers::ViewKind::textField));
   field->setTitle("Hello");
   EXPECT_EQ(field->stringValue(), "Hello");
 }
@@ -98,12 +100,12 @@ TEST_F(ControlsTest, ATextFieldDoesNotKeepItsDelegate) {
 
 TEST_F(ControlsTest, OnlyAThreeStateButtonCanBeMixed) {
   const struct {
-    ViewKind kind;
+    drivers::ViewKind kind;
     State mixed;
-  } cases[] = {{ViewKind::button, State::on},
-               {ViewKind::toggle, State::on},
-               {ViewKind::popUpButton, State::on},
-               {ViewKind::mixed, State::mixed}};
+  } cases[] = {{drivers::ViewKind::button, State::on},
+               {drivers::ViewKind::toggle, State::on},
+               {drivers::ViewKind::popUpButton, State::on},
+               {drivers::ViewKind::mixed, State::mixed}};
   for (const auto& c : cases) {
     const Ref<Button> button = asButton(make(c.kind));
     button->setState(State::mixed);
@@ -115,13 +117,13 @@ TEST_F(ControlsTest, OnlyAThreeStateButtonCanBeMixed) {
 
 TEST_F(ControlsTest, AClickChangesTheStateBeforeTheActionIsSent) {
   const struct {
-    ViewKind kind;
+    drivers::ViewKind kind;
     std::vector<State> states;  // after each click
   } cases[] = {
-      {ViewKind::button, {State::off, State::off}},
-      {ViewKind::popUpButton, {State::off, State::off}},
-      {ViewKind::toggle, {State::on, State::off, State::on}},
-      {ViewKind::mixed, {State::mixed, State::on, State::off, State::mixed}},
+      {drivers::ViewKind::button, {State::off, State::off}},
+      {drivers::ViewKind::popUpButton, {State::off, State::off}},
+      {drivers::ViewKind::toggle, {State::on, State::off, State::on}},
+      {drivers::ViewKind::mixed, {State::mixed, State::on, State::off, State::mixed}},
   };
   for (const auto& c : cases) {
     const auto target = std::make_shared<Recorder>();
@@ -154,8 +156,8 @@ TEST_F(ControlsTest, AClickEndsThePressedInLook) {
 
 TEST_F(ControlsTest, AClickThatDoesNotArriveDoesNothing) {
   const auto target = std::make_shared<Recorder>();
-  const Ref<View> box = make(ViewKind::box, 9);
-  const Ref<Button> button = makeButton(target, ViewKind::toggle);
+  const Ref<View> box = make(drivers::ViewKind::box, 9);
+  const Ref<Button> button = makeButton(target, drivers::ViewKind::toggle);
   box->addSubview(button);
   struct Obstacle {
     const char* what;
@@ -189,7 +191,8 @@ TEST_F(ControlsTest, AClickThatDoesNotArriveDoesNothing) {
 
 TEST_F(ControlsTest, OnlyButtonsTakeClicks) {
   const auto target = std::make_shared<Recorder>();
-  for (const ViewKind kind : {ViewKind::textField, ViewKind::imageView, ViewKind::box}) {
+  for (const drivers::ViewKind kind :
+       {drivers::ViewKind::textField, drivers::ViewKind::imageView, drivers::ViewKind::box}) {
     const Ref<View> view = make(kind);
     if (const auto control = std::dynamic_pointer_cast<Control>(view.pointer())) {
       control->setTarget(target);
@@ -202,4 +205,4 @@ TEST_F(ControlsTest, OnlyButtonsTakeClicks) {
 }
 
 }  // namespace
-}  // namespace toolkit::memory::test
+}  // namespace qz::toolkit::memory::test

@@ -5,25 +5,25 @@
 
 #include "tests/memory/support.hpp"
 
-namespace toolkit::memory::test {
+namespace qz::toolkit::memory::test {
 namespace {
 
 using DriverTest = MemoryTest;
 
 TEST_F(DriverTest, MakesEveryKindOfView) {
   const struct {
-    ViewKind kind;
+    drivers::ViewKind kind;
     const char* className;
     bool button, textField, imageView;
   } cases[] = {
-      {ViewKind::button, "NSButton", true, false, false},
-      {ViewKind::toggle, "NSButton", true, false, false},
-      {ViewKind::mixed, "NSButton", true, false, false},
-      {ViewKind::popUpButton, "NSPopUpButton", true, false, false},
-      {ViewKind::textField, "NSTextField", false, true, false},
-      {ViewKind::imageView, "NSImageView", false, false, true},
-      {ViewKind::box, "NSBox", false, false, false},
-      {ViewKind::plain, "NSView", false, false, false},
+      {drivers::ViewKind::button, "NSButton", true, false, false},
+      {drivers::ViewKind::toggle, "NSButton", true, false, false},
+      {drivers::ViewKind::mixed, "NSButton", true, false, false},
+      {drivers::ViewKind::popUpButton, "NSPopUpButton", true, false, false},
+      {drivers::ViewKind::textField, "NSTextField", false, true, false},
+      {drivers::ViewKind::imageView, "NSImageView", false, false, true},
+      {drivers::ViewKind::box, "NSBox", false, false, false},
+      {drivers::ViewKind::plain, "NSView", false, false, false},
   };
   for (const auto& c : cases) {
     const Ref<View> view = make(c.kind, 7);
@@ -45,22 +45,22 @@ TEST_F(DriverTest, ACaptionIsWhatTheKindShows) {
   directory.write("sky.png", "");
   driver.setResourcePath(directory.path());
   const struct {
-    ViewKind kind;
+    drivers::ViewKind kind;
     const char* title;
     const char* text;
     std::optional<std::string> image;
   } cases[] = {
-      {ViewKind::button, "sky", "", std::nullopt},
-      {ViewKind::popUpButton, "sky", "", std::nullopt},
-      {ViewKind::textField, "", "sky", std::nullopt},
-      {ViewKind::imageView, "", "", "sky"},
-      {ViewKind::box, "", "", std::nullopt},
-      {ViewKind::plain, "", "", std::nullopt},
+      {drivers::ViewKind::button, "sky", "", std::nullopt},
+      {drivers::ViewKind::popUpButton, "sky", "", std::nullopt},
+      {drivers::ViewKind::textField, "", "sky", std::nullopt},
+      {drivers::ViewKind::imageView, "", "", "sky"},
+      {drivers::ViewKind::box, "", "", std::nullopt},
+      {drivers::ViewKind::plain, "", "", std::nullopt},
   };
   for (const auto& c : cases) {
     const Ref<View> view = make(c.kind);
     driver.setCaption(view, "sky");
-    const ViewPicture picture = driver.look(view);
+    const drivers::ViewPicture picture = driver.look(view);
     EXPECT_EQ(picture.title, AttributedString(c.title));
     EXPECT_EQ(picture.text, AttributedString(c.text));
     EXPECT_EQ(picture.image, c.image);
@@ -71,23 +71,23 @@ TEST_F(DriverTest, AnUnknownImageClearsAnImageView) {
   const Directory directory;
   directory.write("sky.png", "");
   driver.setResourcePath(directory.path());
-  const Ref<View> view = make(ViewKind::imageView);
+  const Ref<View> view = make(drivers::ViewKind::imageView);
   driver.setCaption(view, "sky");
   driver.setCaption(view, "nonesuch");
   EXPECT_EQ(driver.look(view).image, std::nullopt);
 }
 
 TEST_F(DriverTest, AbsentThingsLookLikeNothing) {
-  const ViewPicture view = driver.look(Ref<View>());
+  const drivers::ViewPicture view = driver.look(Ref<View>());
   EXPECT_EQ(view.className, "");
   EXPECT_EQ(view.tag, 0);
-  const WindowPicture picture = driver.look(Ref<Window>());
+  const drivers::WindowPicture picture = driver.look(Ref<Window>());
   EXPECT_FALSE(picture.visible);
   EXPECT_EQ(picture.closes, 0);
   driver.setCaption(nullptr, "text");
   driver.setFrame(nullptr, {});
   driver.removeFromSuperview(nullptr);
-  EXPECT_TRUE(driver.makeView(ViewKind::button, 4, {}, nullptr));
+  EXPECT_TRUE(driver.makeView(drivers::ViewKind::button, 4, {}, nullptr));
 }
 
 TEST_F(DriverTest, TimePassesOnTheToolkitsClock) {
@@ -97,12 +97,12 @@ TEST_F(DriverTest, TimePassesOnTheToolkitsClock) {
   EXPECT_EQ(firings, 0);
   driver.advance(3);
   EXPECT_EQ(firings, 6);
-  EXPECT_EQ(toolkit.runLoop().now(), 3.25);
+  EXPECT_EQ(toolkit.parts().runLoop.now(), 3.25);
 }
 
 TEST(MemoryDriverFactory, MakesADriverThatIsItsOwnWorld) {
-  const std::unique_ptr<TestDriver> one = makeMemoryDriver();
-  const std::unique_ptr<TestDriver> two = makeMemoryDriver();
+  const std::unique_ptr<drivers::Driver> one = drivers::makeMemoryDriver();
+  const std::unique_ptr<drivers::Driver> two = drivers::makeMemoryDriver();
   EXPECT_EQ(one->name(), "memory");
   const Ref<Window> window = one->makeWindow({});
   const Ref<Window> other = two->makeWindow({});
@@ -127,7 +127,7 @@ struct Engine : Responder {
 
 TEST(MemoryDriverEnd, EnginesThatTimersHoldEndBeforeTheToolkit) {
   std::string lines;
-  auto driver = std::make_unique<MemoryDriver>();
+  auto driver = std::make_unique<drivers::MemoryDriver>();
   driver->setLogSink([&](std::string_view line) { lines += line; });
   {
     const auto engine = std::make_shared<Engine>(driver->toolkit());
@@ -144,4 +144,4 @@ TEST(MemoryDriverEnd, EnginesThatTimersHoldEndBeforeTheToolkit) {
 }
 
 }  // namespace
-}  // namespace toolkit::memory::test
+}  // namespace qz::toolkit::memory::test

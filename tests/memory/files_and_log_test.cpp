@@ -8,7 +8,7 @@
 
 #include "tests/memory/support.hpp"
 
-namespace toolkit::memory::test {
+namespace qz::toolkit::memory::test {
 namespace {
 
 class FilesTest : public MemoryTest {
@@ -139,4 +139,4 @@ TEST_F(LogTest, ASinkMayReplaceItself) {
 }
 
 }  // namespace
-}  // namespace toolkit::memory::test
+}  // namespace qz::toolkit::memory::test

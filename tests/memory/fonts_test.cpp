@@ -7,9 +7,9 @@
 
 #include <limits>
 
-#include "toolkit/font_names.hpp"
+#include "toolkit/backend/font_names.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 namespace {
 
 const MemoryFonts fonts;
@@ -83,4 +83,4 @@ TEST(FontNames, TheWholeNameOfAFamilyComesFirst) {
 }
 
 }  // namespace
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

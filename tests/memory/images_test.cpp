@@ -4,9 +4,9 @@
 #include "toolkit/memory/images.hpp"
 
 #include "tests/memory/support.hpp"
-#include "toolkit/image_names.hpp"
+#include "toolkit/backend/image_names.hpp"
 
-namespace toolkit::memory::test {
+namespace qz::toolkit::memory::test {
 namespace {
 
 class ImagesTest : public MemoryTest {
@@ -105,4 +105,4 @@ TEST_F(ImagesTest, AnotherResourceDirectoryHasOtherImages) {
 }
 
 }  // namespace
-}  // namespace toolkit::memory::test
+}  // namespace qz::toolkit::memory::test

@@ -7,7 +7,7 @@
 #include "tests/memory/support.hpp"
 #include "toolkit/memory/views.hpp"
 
-namespace toolkit::memory::test {
+namespace qz::toolkit::memory::test {
 namespace {
 
 /// A host's own view that takes part in the responder chain.
@@ -32,13 +32,13 @@ class ResponderChain : public MemoryTest {
 };
 
 TEST_F(ResponderChain, TheTargetPerformsTheAction) {
-  driver.click(makeButton(target, ViewKind::button, 7));
+  driver.click(makeButton(target, drivers::ViewKind::button, 7));
   EXPECT_EQ(target->senders, std::vector<Tag>{7});
   EXPECT_TRUE(delegate->asked.empty());
 }
 
 TEST_F(ResponderChain, WithoutATargetTheActionReachesTheWindowsDelegate) {
-  driver.click(makeButton(nullptr, ViewKind::button, 7));
+  driver.click(makeButton(nullptr, drivers::ViewKind::button, 7));
   EXPECT_EQ(delegate->senders, std::vector<Tag>{7});
 }
 
@@ -122,7 +122,8 @@ TEST_F(ResponderChain, AControlMayRemoveItselfInItsAction) {
     EXPECT_EQ(sender->tag(), 3);
   };
   for (const auto& receiver : receivers) {
-    const std::weak_ptr<View> watched = makeButton(receiver, ViewKind::button, 3).pointer();
+    const std::weak_ptr<View> watched =
+        makeButton(receiver, drivers::ViewKind::button, 3).pointer();
     // A plain pointer, so that only the superview keeps the button.
     View* const button = watched.lock().get();
     dynamic_cast<MemoryButton*>(button)->click();
@@ -133,7 +134,7 @@ TEST_F(ResponderChain, AControlMayRemoveItselfInItsAction) {
 }
 
 TEST_F(ResponderChain, TheWindowMayEndInAnAction) {
-  const std::weak_ptr<View> button = makeButton(nullptr, ViewKind::button, 3).pointer();
+  const std::weak_ptr<View> button = makeButton(nullptr, drivers::ViewKind::button, 3).pointer();
   delegate->perform = [&](const Ref<View>& sender) {
     window = nullptr;
     sender->setTag(4);
@@ -169,7 +170,7 @@ TEST_F(ResponderChain, AnActionMayReplaceTheActionThatIsBeingSent) {
 }
 
 TEST_F(ResponderChain, AnActionMayPressAgain) {
-  const Ref<Button> button = makeButton(nullptr, ViewKind::toggle);
+  const Ref<Button> button = makeButton(nullptr, drivers::ViewKind::toggle);
   delegate->perform = [&](const Ref<View>&) {
     if (delegate->senders.size() < 3) driver.click(button);
   };
@@ -179,4 +180,4 @@ TEST_F(ResponderChain, AnActionMayPressAgain) {
 }
 
 }  // namespace
-}  // namespace toolkit::memory::test
+}  // namespace qz::toolkit::memory::test

@@ -10,7 +10,7 @@
 
 #include "toolkit/memory/run_loop.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 namespace {
 
 class RunLoopReentrancy : public testing::Test {
@@ -183,4 +183,4 @@ TEST_F(RunLoopReentrancy, TheEndOfTheRunLoopReleasesAllTimers) {
 }
 
 }  // namespace
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

@@ -10,9 +10,9 @@
 #include <string>
 #include <vector>
 
-#include "toolkit/exception.hpp"
+#include "qz/toolkit/exception.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 namespace {
 
 constexpr double infinity = std::numeric_limits<double>::infinity();
@@ -181,4 +181,4 @@ TEST_F(RunLoopTest, ATimerScheduledInAFiringFiresInTheSameAdvanceWhenItIsDue) {
 }
 
 }  // namespace
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

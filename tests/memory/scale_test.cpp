@@ -8,7 +8,7 @@
 
 #include "tests/memory/support.hpp"
 
-namespace toolkit::memory::test {
+namespace qz::toolkit::memory::test {
 namespace {
 
 /// Returns the processor time of `work`, in seconds.
@@ -24,7 +24,7 @@ using Scale = MemoryTest;
 TEST_F(Scale, TenThousandSubviews) {
   const Ref<View> content = window->contentView();
   const double seconds = secondsOf([&] {
-    for (Tag tag = 0; tag < 10'000; ++tag) makeIn(content, ViewKind::button, tag);
+    for (Tag tag = 0; tag < 10'000; ++tag) makeIn(content, drivers::ViewKind::button, tag);
     Tag sum = 0;
     for (int scan = 0; scan < 100; ++scan)
       for (const Ref<View>& view : content->subviews()) sum += view->tag();
@@ -69,8 +69,8 @@ TEST_F(Scale, AHundredThousandPendingTimersFireInOrder) {
   const double seconds = secondsOf([&] {
     for (int i = 0; i < 100'000; ++i)
       toolkit.runLoop().schedule(1 + i * 7919 % 100'003, false, [&](const Ref<Timer>&) {
-        EXPECT_GE(toolkit.runLoop().now(), last);
-        last = toolkit.runLoop().now();
+        EXPECT_GE(toolkit.parts().runLoop.now(), last);
+        last = toolkit.parts().runLoop.now();
         ++firings;
       });
     driver.advance(200'000);
@@ -80,4 +80,4 @@ TEST_F(Scale, AHundredThousandPendingTimersFireInOrder) {
 }
 
 }  // namespace
-}  // namespace toolkit::memory::test
+}  // namespace qz::toolkit::memory::test

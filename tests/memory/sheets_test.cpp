@@ -6,7 +6,7 @@
 #include "tests/memory/support.hpp"
 #include "toolkit/memory/window.hpp"
 
-namespace toolkit::memory::test {
+namespace qz::toolkit::memory::test {
 namespace {
 
 class SheetsTest : public MemoryTest {
@@ -188,4 +188,4 @@ TEST_F(SheetsTest, AnAbsentSheetIsNothing) {
 }
 
 }  // namespace
-}  // namespace toolkit::memory::test
+}  // namespace qz::toolkit::memory::test

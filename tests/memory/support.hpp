@@ -14,11 +14,12 @@
 #include <utility>
 #include <vector>
 
-#include "toolkit/application.hpp"
-#include "toolkit/memory/memory_driver.hpp"
-#include "toolkit/responder.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/toolkit/application.hpp"
+#include "qz/toolkit/responder.hpp"
+#include "toolkit/memory/parts.hpp"
 
-namespace toolkit::memory::test {
+namespace qz::toolkit::memory::test {
 
 /// Performs one action, and records the actions asked for and their senders.
 class Recorder : public Responder {
@@ -87,23 +88,25 @@ class Directory {
 /// Provides a driver, with a host's window on its screen.
 class MemoryTest : public testing::Test {
  protected:
-  Ref<View> make(ViewKind kind, Tag tag = 1) { return makeIn(window->contentView(), kind, tag); }
-  Ref<View> makeIn(const Ref<View>& parent, ViewKind kind, Tag tag) {
+  Ref<View> make(drivers::ViewKind kind, Tag tag = 1) {
+    return makeIn(window->contentView(), kind, tag);
+  }
+  Ref<View> makeIn(const Ref<View>& parent, drivers::ViewKind kind, Tag tag) {
     return driver.makeView(kind, tag, {10, 20, 30, 40}, parent);
   }
   /// Returns a new button with this target and the action "pressed:".
-  Ref<Button> makeButton(const std::shared_ptr<Responder>& target, ViewKind kind = ViewKind::button,
-                         Tag tag = 1) {
+  Ref<Button> makeButton(const std::shared_ptr<Responder>& target,
+                         drivers::ViewKind kind = drivers::ViewKind::button, Tag tag = 1) {
     const Ref<Button> button = asButton(make(kind, tag));
     button->setTarget(target);
     button->setAction("pressed:");
     return button;
   }
 
-  MemoryDriver driver;
+  drivers::MemoryDriver driver;
   MemoryToolkit& toolkit = driver.toolkit();
   Application& application = toolkit.application();
   Ref<Window> window = driver.makeWindow({100, 100, 640, 480});
 };
 
-}  // namespace toolkit::memory::test
+}  // namespace qz::toolkit::memory::test

@@ -3,11 +3,11 @@
 
 #include <optional>
 
+#include "qz/toolkit/exception.hpp"
 #include "tests/memory/support.hpp"
-#include "toolkit/exception.hpp"
 #include "toolkit/memory/views.hpp"
 
-namespace toolkit::memory::test {
+namespace qz::toolkit::memory::test {
 namespace {
 
 struct Message {
@@ -52,12 +52,13 @@ class UnrecognizedSelector : public MemoryTest {
 };
 
 TEST_F(UnrecognizedSelector, ButtonsUnderstandAll) {
-  for (const ViewKind kind : {ViewKind::button, ViewKind::toggle, ViewKind::popUpButton})
+  for (const drivers::ViewKind kind :
+       {drivers::ViewKind::button, drivers::ViewKind::toggle, drivers::ViewKind::popUpButton})
     for (const Message& message : messages) expectUnderstands(message, *make(kind));
 }
 
 TEST_F(UnrecognizedSelector, OtherControlsRaiseForWhatOnlyButtonsHave) {
-  for (const ViewKind kind : {ViewKind::textField, ViewKind::imageView})
+  for (const drivers::ViewKind kind : {drivers::ViewKind::textField, drivers::ViewKind::imageView})
     for (const Message& message : messages) {
       const Ref<View> view = make(kind);
       message.controlsUnderstand ? expectUnderstands(message, *view) : expectRaises(message, *view);
@@ -65,7 +66,7 @@ TEST_F(UnrecognizedSelector, OtherControlsRaiseForWhatOnlyButtonsHave) {
 }
 
 TEST_F(UnrecognizedSelector, ViewsThatAreNoControlsRaise) {
-  for (const ViewKind kind : {ViewKind::box, ViewKind::plain})
+  for (const drivers::ViewKind kind : {drivers::ViewKind::box, drivers::ViewKind::plain})
     for (const Message& message : messages) expectRaises(message, *make(kind));
 }
 
@@ -75,22 +76,26 @@ TEST_F(UnrecognizedSelector, AViewOfAHostsOwnRaisesUnderItsOwnName) {
   window->contentView()->addSubview(Ref<View>(gradient));
   EXPECT_EQ(gradient->asGradient(), gradient.get());
   for (const Message& message : messages) expectRaises(message, *gradient);
-  EXPECT_EQ(driver.look(Ref<View>(gradient)).kind, ViewKind::plain);
+  EXPECT_EQ(driver.look(Ref<View>(gradient)).kind, drivers::ViewKind::plain);
 }
 
 TEST_F(UnrecognizedSelector, EveryViewHasAState) {
-  for (const ViewKind kind : {ViewKind::textField, ViewKind::imageView, ViewKind::box})
+  for (const drivers::ViewKind kind :
+       {drivers::ViewKind::textField, drivers::ViewKind::imageView, drivers::ViewKind::box})
     EXPECT_EQ(make(kind)->state(), State::off);
 }
 
 TEST_F(UnrecognizedSelector, AReferenceToAKindSharesTheView) {
   const struct {
-    ViewKind kind;
+    drivers::ViewKind kind;
     bool button, textField, imageView;
   } cases[] = {
-      {ViewKind::button, true, false, false},    {ViewKind::popUpButton, true, false, false},
-      {ViewKind::textField, false, true, false}, {ViewKind::imageView, false, false, true},
-      {ViewKind::box, false, false, false},      {ViewKind::plain, false, false, false},
+      {drivers::ViewKind::button, true, false, false},
+      {drivers::ViewKind::popUpButton, true, false, false},
+      {drivers::ViewKind::textField, false, true, false},
+      {drivers::ViewKind::imageView, false, false, true},
+      {drivers::ViewKind::box, false, false, false},
+      {drivers::ViewKind::plain, false, false, false},
   };
   for (const auto& c : cases) {
     Ref<View> view = driver.makeView(c.kind, 5, {}, nullptr);
@@ -102,4 +107,4 @@ TEST_F(UnrecognizedSelector, AReferenceToAKindSharesTheView) {
 }
 
 }  // namespace
-}  // namespace toolkit::memory::test
+}  // namespace qz::toolkit::memory::test

@@ -5,11 +5,11 @@
 
 #include <vector>
 
+#include "qz/toolkit/exception.hpp"
 #include "tests/memory/support.hpp"
-#include "toolkit/exception.hpp"
 #include "toolkit/memory/window.hpp"
 
-namespace toolkit::memory::test {
+namespace qz::toolkit::memory::test {
 namespace {
 
 class ViewsTest : public MemoryTest {
@@ -33,19 +33,19 @@ class ViewsTest : public MemoryTest {
 };
 
 TEST_F(ViewsTest, SubviewsLieBackToFront) {
-  for (const Tag tag : {3, 1, 2}) make(ViewKind::button, tag);
+  for (const Tag tag : {3, 1, 2}) make(drivers::ViewKind::button, tag);
   EXPECT_EQ(tagsIn(content), (std::vector<Tag>{3, 1, 2}));
 }
 
 TEST_F(ViewsTest, AddingAViewAgainBringsItToTheFront) {
-  for (const Tag tag : {1, 2, 3}) make(ViewKind::button, tag);
+  for (const Tag tag : {1, 2, 3}) make(drivers::ViewKind::button, tag);
   content->addSubview(content->subviews().front());
   EXPECT_EQ(tagsIn(content), (std::vector<Tag>{2, 3, 1}));
 }
 
 TEST_F(ViewsTest, AddingAViewTakesItFromWhereItWas) {
-  const Ref<View> box = make(ViewKind::box, 9);
-  const Ref<View> button = make(ViewKind::button, 5);
+  const Ref<View> box = make(drivers::ViewKind::box, 9);
+  const Ref<View> button = make(drivers::ViewKind::button, 5);
   box->addSubview(button);
   EXPECT_EQ(tagsIn(content), std::vector<Tag>{9});
   EXPECT_EQ(tagsIn(box), std::vector<Tag>{5});
@@ -55,8 +55,8 @@ TEST_F(ViewsTest, AddingAViewTakesItFromWhereItWas) {
 }
 
 TEST_F(ViewsTest, AViewRefusesWhatCannotLieInIt) {
-  const Ref<View> outer = make(ViewKind::box, 1);
-  const Ref<View> inner = makeIn(outer, ViewKind::box, 2);
+  const Ref<View> outer = make(drivers::ViewKind::box, 1);
+  const Ref<View> inner = makeIn(outer, drivers::ViewKind::box, 2);
   // Stands for another toolkit's view: it is not a node of this one.
   const Ref<View> foreign = std::shared_ptr<View>(std::shared_ptr<void>(), &View::nothing());
   const Ref<Window> other = driver.makeWindow({});
@@ -80,7 +80,7 @@ TEST_F(ViewsTest, AViewRefusesWhatCannotLieInIt) {
 }
 
 TEST_F(ViewsTest, ASuperviewOwnsItsSubviews) {
-  const std::weak_ptr<View> button = make(ViewKind::button).pointer();
+  const std::weak_ptr<View> button = make(drivers::ViewKind::button).pointer();
   EXPECT_FALSE(button.expired());
   driver.removeFromSuperview(button.lock());
   EXPECT_TRUE(button.expired());
@@ -88,7 +88,7 @@ TEST_F(ViewsTest, ASuperviewOwnsItsSubviews) {
 }
 
 TEST_F(ViewsTest, AViewOutlivesItsSuperviewAndItsWindow) {
-  const Ref<View> button = makeIn(make(ViewKind::box, 1), ViewKind::button, 2);
+  const Ref<View> button = makeIn(make(drivers::ViewKind::box, 1), drivers::ViewKind::button, 2);
   window = nullptr;
   content = nullptr;
   EXPECT_EQ(ViewNode::of(button)->superview(), nullptr);
@@ -99,19 +99,20 @@ TEST_F(ViewsTest, AViewOutlivesItsSuperviewAndItsWindow) {
 }
 
 TEST_F(ViewsTest, AViewInAWindowKnowsItHoweverDeepItLies) {
-  const Ref<View> button =
-      makeIn(makeIn(make(ViewKind::box), ViewKind::box, 2), ViewKind::button, 3);
+  const Ref<View> button = makeIn(makeIn(make(drivers::ViewKind::box), drivers::ViewKind::box, 2),
+                                  drivers::ViewKind::button, 3);
   EXPECT_EQ(Ref<Window>(ViewNode::of(button)->window()), window);
-  EXPECT_EQ(ViewNode::of(driver.makeView(ViewKind::plain, 1, {}, nullptr))->window(), nullptr);
+  EXPECT_EQ(ViewNode::of(driver.makeView(drivers::ViewKind::plain, 1, {}, nullptr))->window(),
+            nullptr);
 }
 
 TEST_F(ViewsTest, AViewKeepsWhatItIsGiven) {
-  const Ref<View> box = make(ViewKind::box);
+  const Ref<View> box = make(drivers::ViewKind::box);
   box->setTag(-7);
   box->setHidden(true);
   box->setToolTip("Press me");
   driver.setFrame(box, {1, 2, 3, 4});
-  ViewPicture picture = driver.look(box);
+  drivers::ViewPicture picture = driver.look(box);
   EXPECT_EQ(picture.tag, -7);
   EXPECT_TRUE(picture.hidden);
   EXPECT_EQ(picture.toolTip, "Press me");
@@ -122,7 +123,7 @@ TEST_F(ViewsTest, AViewKeepsWhatItIsGiven) {
 }
 
 TEST_F(ViewsTest, ARedrawIsPendingFromAChangeToTheNextDrawing) {
-  const Ref<Button> button = asButton(make(ViewKind::button));
+  const Ref<Button> button = asButton(make(drivers::ViewKind::button));
   EXPECT_TRUE(button->needsDisplay());
   const std::function<void()> changes[] = {
       [&] { button->setTitle("Next"); },       [&] { button->setEnabled(false); },
@@ -162,4 +163,4 @@ TEST_F(ViewsTest, OnlyALayerHasContents) {
 }
 
 }  // namespace
-}  // namespace toolkit::memory::test
+}  // namespace qz::toolkit::memory::test

@@ -6,7 +6,7 @@
 #include "tests/memory/support.hpp"
 #include "toolkit/memory/window.hpp"
 
-namespace toolkit::memory::test {
+namespace qz::toolkit::memory::test {
 namespace {
 
 class WindowsTest : public MemoryTest {
@@ -28,7 +28,7 @@ class WindowsTest : public MemoryTest {
 
 TEST_F(WindowsTest, ANewWindowIsOffTheScreenAndEmpty) {
   const Ref<Window> made = makeAppWindow();
-  const WindowPicture picture = driver.look(made);
+  const drivers::WindowPicture picture = driver.look(made);
   EXPECT_FALSE(picture.visible || picture.key || picture.layered);
   EXPECT_EQ(picture.closes, 0);
   EXPECT_EQ(picture.content, (Rect{200, 300, 800, 600}));
@@ -128,7 +128,7 @@ TEST_F(WindowsTest, AWindowOffTheScreenIsItsMakersAlone) {
 
 TEST_F(WindowsTest, AHostsWindowEndsWithItsReference) {
   const std::weak_ptr<Window> watched = window.pointer();
-  const std::weak_ptr<View> button = make(ViewKind::button).pointer();
+  const std::weak_ptr<View> button = make(drivers::ViewKind::button).pointer();
   window = nullptr;
   EXPECT_TRUE(watched.expired());
   EXPECT_TRUE(button.expired());
@@ -136,12 +136,12 @@ TEST_F(WindowsTest, AHostsWindowEndsWithItsReference) {
 }
 
 TEST(WindowsOfAnEndedToolkit, CanStillBeUsed) {
-  auto driver = std::make_unique<MemoryDriver>();
+  auto driver = std::make_unique<drivers::MemoryDriver>();
   const Ref<Window> hosts = driver->makeWindow({});
   const Ref<Window> made = driver->toolkit().application().makeWindow(
       {}, StyleMask::titled, BackingStore::buffered, false);
   made->makeKeyAndOrderFront();
-  const Ref<View> button = driver->makeView(ViewKind::button, 1, {}, made->contentView());
+  const Ref<View> button = driver->makeView(drivers::ViewKind::button, 1, {}, made->contentView());
   driver = nullptr;
   for (const Ref<Window>& window : {hosts, made}) {
     window->makeKeyAndOrderFront();
@@ -155,7 +155,7 @@ TEST(WindowsOfAnEndedToolkit, CanStillBeUsed) {
 }
 
 TEST(WindowsOfAnEndedToolkit, AreReleased) {
-  auto driver = std::make_unique<MemoryDriver>();
+  auto driver = std::make_unique<drivers::MemoryDriver>();
   std::weak_ptr<Window> watched;
   {
     const Ref<Window> made = driver->toolkit().application().makeWindow(
@@ -169,4 +169,4 @@ TEST(WindowsOfAnEndedToolkit, AreReleased) {
 }
 
 }  // namespace
-}  // namespace toolkit::memory::test
+}  // namespace qz::toolkit::memory::test

@@ -6,13 +6,13 @@
 #include <new>
 #include <string>
 
+#include "qz/property_list/binary_writer.hpp"
+#include "qz/property_list/xml_writer.hpp"
 #include "tests/failing_allocations.hpp"
 #include "tests/property_list/binary_file.hpp"
 #include "tests/property_list/reading.hpp"
-#include "toolkit/property_list/binary_writer.hpp"
-#include "toolkit/property_list/xml_writer.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 using namespace failing_allocations;
@@ -83,4 +83,4 @@ TEST(AllocationFailures, LeaveACollectionAsItWas) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

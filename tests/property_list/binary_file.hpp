@@ -9,7 +9,7 @@
 
 #include "toolkit/property_list/binary_layout.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 
 /// Writes each object unchanged, including its marker. The other fields may hold wrong values.
 struct BinaryFile {
@@ -41,4 +41,4 @@ struct BinaryFile {
   }
 };
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -9,7 +9,7 @@
 #include "tests/property_list/binary_file.hpp"
 #include "tests/property_list/reading.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 using namespace std::string_literals;
@@ -240,4 +240,4 @@ TEST(BinaryReader, TakesDeepNestingUpToALimit) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -1,17 +1,17 @@
 // SPDX-License-Identifier: MIT
 // Writing binary property lists: they read back, and some values are refused.
-#include "toolkit/property_list/binary_writer.hpp"
+#include "qz/property_list/binary_writer.hpp"
 
 #include <gtest/gtest.h>
 
 #include <cmath>
 #include <string>
 
+#include "qz/toolkit/exception.hpp"
 #include "tests/property_list/random_values.hpp"
 #include "tests/property_list/reading.hpp"
-#include "toolkit/exception.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 using namespace std::string_literals;
@@ -101,4 +101,4 @@ TEST(BinaryWriter, RefusesWhatBinaryCannotCarry) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

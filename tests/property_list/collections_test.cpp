@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Dictionaries: order, look-up, changes, copies; small ones, and those large enough for an index.
-#include "toolkit/property_list/collections.hpp"
+#include "qz/property_list/collections.hpp"
 
 #include <gtest/gtest.h>
 
@@ -12,10 +12,10 @@
 #include <utility>
 #include <vector>
 
-#include "toolkit/property_list/key_index.hpp"
-#include "toolkit/property_list/scalars.hpp"
+#include "qz/property_list/key_index.hpp"
+#include "qz/property_list/scalars.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 using Model = std::vector<std::pair<std::string, ValueRef<>>>;
@@ -178,4 +178,4 @@ TEST(Arrays, BorrowElementsUntilTheyHaveOthers) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -6,10 +6,10 @@
 #include <limits>
 #include <string>
 
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/scalars.hpp"
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/scalars.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 TEST(Description, OfScalars) {
@@ -80,4 +80,4 @@ TEST(Description, AndEndOfValuesFarDeeperThanAnyFile) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -8,7 +8,7 @@
 
 #include "tests/property_list/reading.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 using namespace std::string_literals;
@@ -155,4 +155,4 @@ TEST(Encodings, OlderThanUnicodeAreRead) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -12,7 +12,7 @@
 #include "tests/property_list/binary_file.hpp"
 #include "tests/property_list/reading.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 using namespace std::literals;
@@ -130,4 +130,4 @@ TEST(HostileInput, ManyKeys) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // The numbers that texts convert to, and numbers converted to other types.
-#include "toolkit/property_list/number_conversion.hpp"
+#include "text/number_conversion.hpp"
 
 #include <gtest/gtest.h>
 
@@ -11,10 +11,10 @@
 #include <sstream>
 #include <string>
 
-#include "toolkit/property_list/scalars.hpp"
-#include "toolkit/property_list/utf8.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "text/utf8.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 constexpr double infinity = std::numeric_limits<double>::infinity();
@@ -28,7 +28,8 @@ std::string unescaped(const std::string& text) {
       result += text[at];
       continue;
     }
-    appendUtf8(result, static_cast<char32_t>(std::stoul(text.substr(at + 2, 4), nullptr, 16)));
+    text::appendUtf8(result,
+                     static_cast<char32_t>(std::stoul(text.substr(at + 2, 4), nullptr, 16)));
     at += 5;
   }
   return result;
@@ -90,8 +91,8 @@ TEST(NumberConversion, OfStringsToIntegers) {
       {"00000000000000000000000000012", 12, 12},
   };
   for (const auto& [text, intValue, integerValue] : cases) {
-    EXPECT_EQ(intValueOf(text), intValue) << text;
-    EXPECT_EQ(integerValueOf(text), integerValue) << text;
+    EXPECT_EQ(text::intValueOf(text), intValue) << text;
+    EXPECT_EQ(text::integerValueOf(text), integerValue) << text;
   }
 }
 
@@ -123,23 +124,23 @@ TEST(NumberConversion, OfStringsToReals) {
       {"0e99999999999999999999", 0},
       {"0.000000000000000000000000000001e330", 1e300},
   };
-  for (const auto& [text, value] : cases) EXPECT_EQ(doubleValueOf(text), value) << text;
-  EXPECT_TRUE(std::signbit(doubleValueOf("-0")));
+  for (const auto& [text, value] : cases) EXPECT_EQ(text::doubleValueOf(text), value) << text;
+  EXPECT_TRUE(std::signbit(text::doubleValueOf("-0")));
   // More digits before the point than the exponent removes.
-  EXPECT_EQ(doubleValueOf("1" + std::string(400, '0') + "e-10"), infinity);
-  EXPECT_EQ(doubleValueOf("1" + std::string(400, '0') + "e-400"), 1);
-  EXPECT_EQ(doubleValueOf("0." + std::string(400, '0') + "1e10"), 0);
+  EXPECT_EQ(text::doubleValueOf("1" + std::string(400, '0') + "e-10"), infinity);
+  EXPECT_EQ(text::doubleValueOf("1" + std::string(400, '0') + "e-400"), 1);
+  EXPECT_EQ(text::doubleValueOf("0." + std::string(400, '0') + "1e10"), 0);
 }
 
 TEST(NumberConversion, OfStringsToBooleans) {
   for (const char* yes : {"Y",  "y",  "T",  "t",    "YES", "true",   "Tomorrow", "1",
                           "9x", "-1", "+2", "0007", " y",  "\t 3",   "-001",     "\xC2\xA0Y",
                           "+y", "+Y", "-t", "0Y",   "0t",  "00true", " +00Yes"}) {
-    EXPECT_TRUE(boolValueOf(yes)) << yes;
+    EXPECT_TRUE(text::boolValueOf(yes)) << yes;
   }
   for (const char* no : {"",    " ",  "0",   "N",        "no", "x1",  "000", "-0",  "--1", "- 1",
                          "0x1", ".5", "0.5", "\xC3\xA9", "+",  "+-Y", "- Y", "0 Y", "0+Y", "0N"}) {
-    EXPECT_FALSE(boolValueOf(no)) << no;
+    EXPECT_FALSE(text::boolValueOf(no)) << no;
   }
 }
 
@@ -195,4 +196,4 @@ TEST(NumberConversion, KeepsTheBits) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -7,7 +7,7 @@
 
 #include "tests/property_list/reading.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 struct OldStyleCase {
@@ -195,4 +195,4 @@ TEST(OldStyleReader, TakesDeepNestingUpToALimit) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -8,7 +8,7 @@
 #include "tests/property_list/binary_file.hpp"
 #include "tests/property_list/reading.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 using namespace std::string_literals;
@@ -123,4 +123,4 @@ TEST(Positions, OfBinaryObjects) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -8,11 +8,11 @@
 #include <string>
 #include <vector>
 
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/scalars.hpp"
-#include "toolkit/property_list/utf8.hpp"
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "text/utf8.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 
 class RandomValues {
  public:
@@ -95,8 +95,8 @@ class RandomValues {
     for (std::size_t left = random_() % 40; left > 0; --left) {
       auto c = static_cast<char32_t>(isAscii ? random_() % 0x80
                                              : random_() % 0x110000 >> random_() % 21);
-      if (isForXml_ && isSurrogate(c)) c = 0xFEFF;
-      appendUtf8(text, c);
+      if (isForXml_ && text::isSurrogate(c)) c = 0xFEFF;
+      text::appendUtf8(text, c);
     }
     return isForXml_ ? text : joined(text);
   }
@@ -105,10 +105,10 @@ class RandomValues {
   /// form.
   static std::string joined(const std::string& text) {
     std::string result;
-    Utf16Appender appender(result);
+    text::Utf16Appender appender(result);
     for (std::size_t at = 0; at < text.size();) {
       std::u16string units;
-      appendUtf16(units, nextCodePoint(text, at));
+      text::appendUtf16(units, text::nextCodePoint(text, at));
       for (const char16_t unit : units) appender.append(unit);
     }
     return result;
@@ -118,4 +118,4 @@ class RandomValues {
   bool isForXml_;
 };
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -5,11 +5,11 @@
 #include <string>
 #include <string_view>
 
-#include "toolkit/property_list/canonical_dump.hpp"
-#include "toolkit/property_list/reader.hpp"
-#include "toolkit/property_list/scalars.hpp"
+#include "qz/property_list/canonical_dump.hpp"
+#include "qz/property_list/reader.hpp"
+#include "qz/property_list/scalars.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 
 /// In tables of expected results: the bytes are refused.
 constexpr std::string_view refused = "refused";
@@ -32,4 +32,4 @@ inline std::string plist(std::string_view xml) {
   return "<plist version=\"1.0\">" + std::string(xml) + "</plist>";
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

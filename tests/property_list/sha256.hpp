@@ -8,7 +8,7 @@
 #include <string>
 #include <string_view>
 
-namespace toolkit {
+namespace qz::toolkit {
 
 /// Returns the digest in hexadecimal.
 inline std::string sha256(std::string_view text) {
@@ -60,4 +60,4 @@ inline std::string sha256(std::string_view text) {
   return digest;
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

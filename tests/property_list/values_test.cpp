@@ -6,11 +6,11 @@
 #include <functional>
 #include <string>
 
-#include "toolkit/exception.hpp"
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/scalars.hpp"
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "qz/toolkit/exception.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 /// Returns the reason of the exception that `action` raises, or "" when it raises none.
@@ -184,4 +184,4 @@ TEST(Values, AreAskedForByKind) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

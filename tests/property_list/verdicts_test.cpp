@@ -10,11 +10,11 @@
 #include <string>
 #include <vector>
 
+#include "qz/property_list/canonical_dump.hpp"
+#include "qz/property_list/reader.hpp"
 #include "tests/property_list/sha256.hpp"
-#include "toolkit/property_list/canonical_dump.hpp"
-#include "toolkit/property_list/reader.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 const std::filesystem::path folder = std::filesystem::path(QZ_TEST_DATA) / "property-lists";
@@ -111,4 +111,4 @@ TEST(Verdicts, CoverEveryFileThatIsThere) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -7,7 +7,7 @@
 
 #include "tests/property_list/reading.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 struct XmlCase {
@@ -266,4 +266,4 @@ TEST(XmlReader, TakesDeepNestingUpToALimit) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -7,7 +7,7 @@
 
 #include "tests/property_list/reading.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 struct ScalarCase {
@@ -207,4 +207,4 @@ TEST(XmlScalars, Data) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Writing XML property lists: their layout, that they read back, and which values are refused.
-#include "toolkit/property_list/xml_writer.hpp"
+#include "qz/property_list/xml_writer.hpp"
 
 #include <gtest/gtest.h>
 
@@ -8,11 +8,11 @@
 #include <limits>
 #include <string>
 
+#include "qz/toolkit/exception.hpp"
 #include "tests/property_list/random_values.hpp"
 #include "tests/property_list/reading.hpp"
-#include "toolkit/exception.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 std::string xmlRefusalOf(const ValueRef<>& value) {
@@ -146,4 +146,4 @@ TEST(XmlWriter, NestsAsDeeplyAsTheReader) {
 }
 
 }  // namespace
-}  // namespace toolkit
+}  // namespace qz::toolkit

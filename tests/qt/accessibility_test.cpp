@@ -13,12 +13,14 @@
 #include <QTextEdit>
 #include <vector>
 
+#include "qz/toolkit/system_files.hpp"
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/image_look.hpp"
 #include "toolkit/qt/images.hpp"
 #include "toolkit/qt/strings.hpp"
 #include "toolkit/qt/text_look.hpp"
-#include "toolkit/system_files.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -33,11 +35,15 @@ std::vector<Announcement> announcements;
 
 }  // namespace
 
+}  // namespace qz
+
 // Replaces Qt's own function in this program. Qt passes announcements on only while assistive
 // technology is connected, which needs a desktop's message bus.
 void QAccessible::updateAccessibility(QAccessibleEvent* event) {
-  announcements.push_back({event->object(), event->type()});
+  qz::announcements.push_back({event->object(), event->type()});
 }
+
+namespace qz {
 
 namespace {
 
@@ -124,3 +130,5 @@ TEST_F(Accessibility, ImagesAreNamedByTheirNames) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -12,9 +12,11 @@
 #include <map>
 #include <set>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "qz/engine.hpp"
 #include "tests/qt/support.hpp"
 #include "toolkit/qt/widget_node.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -129,3 +131,5 @@ TEST_F(Adoption, LeavesEveryPropertyAsItWas) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -17,6 +17,8 @@
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/contrast.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace toolkit;
@@ -148,3 +150,5 @@ TEST(ButtonDetails, BackgroundsLeaveTitlesOfForeignButtonsReadable) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -22,6 +22,8 @@
 #include "toolkit/qt/contrast.hpp"
 #include "toolkit/qt/strings.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace toolkit;
@@ -209,3 +211,5 @@ TEST(ButtonLook, GivesTheHostItsFontBackWithAPlainTitle) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -18,6 +18,8 @@
 #include "tests/qt/rendering.hpp"
 #include "toolkit/qt/button_look.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace toolkit;
@@ -179,3 +181,5 @@ INSTANTIATE_TEST_SUITE_P(Qt, ButtonPixels, testing::ValuesIn(buttonKinds),
                          [](const auto& test) { return test.param.name; });
 
 }  // namespace
+
+}  // namespace qz

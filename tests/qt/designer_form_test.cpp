@@ -4,6 +4,8 @@
 #include "tests/qt/support.hpp"
 #include "ui_designer_form.h"
 
+namespace qz {
+
 namespace {
 
 using DesignerForms = hosts::Host;
@@ -22,3 +24,5 @@ TEST_F(DesignerForms, CarryTheirTags) {
 }
 
 }  // namespace
+
+}  // namespace qz

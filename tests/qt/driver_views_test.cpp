@@ -5,19 +5,21 @@
 
 #include <QWidget>
 
+#include "drivers/qt/qt_driver.hpp"
 #include "tests/qt/rendering.hpp"
-#include "toolkit/qt/qt_driver.hpp"
 #include "toolkit/qt/widget_node.hpp"
+
+namespace qz {
 
 namespace {
 
 using namespace toolkit;
 
 TEST(DriverViews, DrawPopUpButtonsWithAnArrow) {
-  qt::QtDriver driver;
+  drivers::QtDriver driver;
   const auto window = driver.makeWindow({0, 0, 200, 100});
   const auto view =
-      driver.makeView(ViewKind::popUpButton, 1, {20, 20, 120, 30}, window->contentView());
+      driver.makeView(drivers::ViewKind::popUpButton, 1, {20, 20, 120, 30}, window->contentView());
   const auto arrowIn = [&] {
     const QImage picture = rendering::pictureOf(*qt::WidgetNode::of(view)->widget());
     return rendering::countPixels(picture, QRect(4, 4, 22, 22), rendering::isDark);
@@ -28,10 +30,10 @@ TEST(DriverViews, DrawPopUpButtonsWithAnArrow) {
 }
 
 TEST(DriverViews, PlaceTheTitleOfAPopUpButtonBesideItsArrow) {
-  qt::QtDriver driver;
+  drivers::QtDriver driver;
   const auto window = driver.makeWindow({0, 0, 200, 100});
   const auto view =
-      driver.makeView(ViewKind::popUpButton, 1, {20, 20, 120, 30}, window->contentView());
+      driver.makeView(drivers::ViewKind::popUpButton, 1, {20, 20, 120, 30}, window->contentView());
   const auto titleIn = [&](auto wanted) {
     const QImage picture = rendering::pictureOf(*qt::WidgetNode::of(view)->widget());
     return rendering::boundsOf(picture.copy(20, 4, 96, 22), wanted);
@@ -43,3 +45,5 @@ TEST(DriverViews, PlaceTheTitleOfAPopUpButtonBesideItsArrow) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -12,6 +12,8 @@
 #include "tests/qt/rendering.hpp"
 #include "toolkit/qt/text_look.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace toolkit;
@@ -101,3 +103,5 @@ TEST(EditText, KeepsNoBreakBlanks) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -10,6 +10,8 @@
 
 #include "toolkit/qt/strings.hpp"
 
+namespace qz {
+
 namespace {
 
 using toolkit::Font;
@@ -70,3 +72,5 @@ TEST(QtFonts, TellFixedPitchFamiliesOfTheDesktop) {
 }
 
 }  // namespace
+
+}  // namespace qz

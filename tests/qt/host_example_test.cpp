@@ -10,6 +10,8 @@
 #include "support.hpp"
 #include "toolkit/qt/button_look.hpp"
 
+namespace qz {
+
 namespace {
 
 struct HostExample : testing::Test {
@@ -98,3 +100,5 @@ TEST_F(HostExample, takesEscapeForTheEndOfItsTips) {
 }
 
 }  // namespace
+
+}  // namespace qz

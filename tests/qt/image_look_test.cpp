@@ -9,10 +9,12 @@
 #include <QLabel>
 #include <QTemporaryDir>
 
+#include "qz/toolkit/system_files.hpp"
 #include "tests/qt/rendering.hpp"
 #include "toolkit/qt/images.hpp"
 #include "toolkit/qt/strings.hpp"
-#include "toolkit/system_files.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -141,3 +143,5 @@ TEST_F(ImageLook, KnowsTheSameImageByItsName) {
 }
 
 }  // namespace
+
+}  // namespace qz

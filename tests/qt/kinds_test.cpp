@@ -26,10 +26,12 @@
 #include <QToolBox>
 #include <QTreeWidget>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "qz/engine.hpp"
+#include "qz/toolkit/exception.hpp"
 #include "tests/qt/support.hpp"
-#include "toolkit/exception.hpp"
 #include "toolkit/qt/widget_node.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -183,3 +185,5 @@ TEST_F(Kinds, GiveTheFocusAwayWhenTheyAreHiddenOrDisabled) {
 }
 
 }  // namespace
+
+}  // namespace qz

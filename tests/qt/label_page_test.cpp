@@ -14,6 +14,8 @@
 #include "tests/qt/rendering.hpp"
 #include "toolkit/qt/text_look.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace toolkit;
@@ -180,3 +182,5 @@ TEST(LabelPage, ShowsWhatTheHostShowsInstead) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -6,10 +6,12 @@
 #include <QPointer>
 #include <QPushButton>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "qz/engine.hpp"
+#include "qz/property_list/reader.hpp"
 #include "tests/qt/support.hpp"
-#include "toolkit/property_list/reader.hpp"
 #include "toolkit/qt/widget_node.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -144,3 +146,5 @@ TEST_F(Lifetime, AControlThatIsPutNowhereEndsWithItsView) {
 }
 
 }  // namespace
+
+}  // namespace qz

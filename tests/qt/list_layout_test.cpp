@@ -11,6 +11,8 @@
 #include "tests/qt/rendering.hpp"
 #include "toolkit/qt/text_look.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace toolkit;
@@ -122,3 +124,5 @@ TEST(ListLayout, PlacesTextBehindAMarkerTooWideForItsPlace) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -17,11 +17,11 @@
 #include <sstream>
 #include <string>
 
-#include "toolkit/qt/qt_driver.hpp"
-#include "tools/play/input_file.hpp"
+#include "drivers/qt/qt_driver.hpp"
 #include "tools/play/session.hpp"
+#include "tools/support/input_file.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 namespace fs = std::filesystem;
@@ -120,7 +120,7 @@ class PlayedByAPerson : public testing::Test {
   const Directory directory;
   const PlayOptions options = optionsOfScript();
   const InputFile file{options.script, "a script"};
-  toolkit::qt::QtDriver driver;
+  drivers::QtDriver driver;
   Stage stage{driver, options, file.dictionary()};
   std::ostringstream out;
   Session session{driver, stage, out, {}};
@@ -169,4 +169,4 @@ TEST_F(PlayedByAPerson, endsWhenThePersonClosesTheWindow) {
 }
 
 }  // namespace
-}  // namespace tools::play
+}  // namespace qz::tools::play

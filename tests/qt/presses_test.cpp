@@ -5,9 +5,11 @@
 #include <QLineEdit>
 #include <QPushButton>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "qz/engine.hpp"
+#include "qz/toolkit/exception.hpp"
 #include "tests/qt/support.hpp"
-#include "toolkit/exception.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -112,3 +114,5 @@ TEST_F(Presses, CarryNoExceptionThroughQt) {
 }
 
 }  // namespace
+
+}  // namespace qz

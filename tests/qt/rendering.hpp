@@ -9,7 +9,7 @@
 #include <algorithm>
 #include <functional>
 
-namespace rendering {
+namespace qz::rendering {
 
 /// Returns a picture of `widget` on white, at `ratio` pixels a point.
 inline QImage pictureOf(QWidget& widget, double ratio = 1) {
@@ -49,4 +49,4 @@ inline QRect boundsOf(const QImage& picture, const std::function<bool(const QCol
   return bounds;
 }
 
-}  // namespace rendering
+}  // namespace qz::rendering

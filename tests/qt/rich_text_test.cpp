@@ -11,6 +11,8 @@
 #include "toolkit/qt/fonts.hpp"
 #include "toolkit/qt/strings.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace toolkit;
@@ -145,3 +147,5 @@ TEST(RichText, LeavesNothingToUndo) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -11,7 +11,9 @@
 #include <string>
 #include <vector>
 
-#include "toolkit/qt/log.hpp"
+#include "qz/toolkit/qt/log.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -88,3 +90,5 @@ TEST_F(RunLoop, GoesOnAfterAnException) {
 }
 
 }  // namespace
+
+}  // namespace qz

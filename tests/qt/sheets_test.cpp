@@ -6,6 +6,8 @@
 
 #include "tests/qt/support.hpp"
 
+namespace qz {
+
 namespace {
 
 struct Ends : toolkit::SheetDelegate {
@@ -100,3 +102,5 @@ TEST_F(Sheets, EndOnceWithTheCodeOfCancellingWhenTheUserSendsThemAway) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -13,9 +13,9 @@
 #include <string>
 #include <vector>
 
-#include "toolkit/qt/qt_toolkit.hpp"
+#include "qz/toolkit/qt/qt_toolkit.hpp"
 
-namespace hosts {
+namespace qz::hosts {
 
 /// Performs every action, and records the actions and their senders.
 struct Performer : toolkit::Responder {
@@ -74,4 +74,4 @@ struct Host : testing::Test {
   int added_ = 0;
 };
 
-}  // namespace hosts
+}  // namespace qz::hosts

@@ -15,6 +15,8 @@
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/text_look.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace toolkit;
@@ -99,3 +101,5 @@ TEST(TextDirection, LeavesExplicitAlignmentsAlone) {
 }
 
 }  // namespace
+
+}  // namespace qz

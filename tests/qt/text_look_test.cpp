@@ -15,6 +15,8 @@
 
 #include "tests/qt/rendering.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace toolkit;
@@ -148,3 +150,5 @@ TEST(TextLook, LeavesNothingOnTheWidgetWithPlainText) {
 }
 
 }  // namespace
+
+}  // namespace qz

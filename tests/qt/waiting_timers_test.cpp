@@ -20,8 +20,10 @@
 #include <string>
 #include <utility>
 
-#include "toolkit/qt/log.hpp"
+#include "qz/toolkit/qt/log.hpp"
 #include "toolkit/qt/run_loop.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -304,3 +306,5 @@ TEST_F(WaitingTimers, DoNotWaitForWindowModalDialogsAndEventLoops) {
 }
 
 }  // namespace
+
+}  // namespace qz

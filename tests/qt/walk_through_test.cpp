@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // The host's side of a walk-through: however it ends, the host is told and gets its window back.
 
-#include "hosts/qt/walk_through.hpp"
+#include "qz/hosts/qt/walk_through.hpp"
 
 #include <QCloseEvent>
 #include <QDialog>
@@ -11,6 +11,8 @@
 #include <fstream>
 
 #include "tests/qt/support.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -259,3 +261,5 @@ TEST_F(WalkThroughs, InSheetsEndWithTheSheet) {
 }
 
 }  // namespace
+
+}  // namespace qz

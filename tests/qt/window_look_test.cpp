@@ -16,6 +16,8 @@
 #include "toolkit/qt/strings.hpp"
 #include "toolkit/qt/text_look.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace toolkit;
@@ -70,3 +72,5 @@ TEST(WindowLook, ReadsTheColourBack) {
 }
 
 }  // namespace
+
+}  // namespace qz

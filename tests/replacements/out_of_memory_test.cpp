@@ -9,9 +9,11 @@
 #include <optional>
 #include <string>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
 #include "tests/failing_allocations.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -20,10 +22,10 @@ using Engine = QZ_Plist_State_Parser;
 
 class OutOfMemory : public testing::Test {
  protected:
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   toolkit::Ref<toolkit::Window> window = driver.makeWindow({0, 0, 300, 200});
   toolkit::Ref<toolkit::View> label =
-      driver.makeView(toolkit::ViewKind::textField, 5, {0, 0, 9, 9}, window->contentView());
+      driver.makeView(drivers::ViewKind::textField, 5, {0, 0, 9, 9}, window->contentView());
   std::shared_ptr<Engine> engine = Engine::init(driver.toolkit());
 };
 
@@ -62,3 +64,5 @@ TEST_F(OutOfMemory, BuildingAnEntryEndsAndLeavesTheDescriptionAsItWas) {
 }
 
 }  // namespace
+
+}  // namespace qz

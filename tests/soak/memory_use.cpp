@@ -20,9 +20,12 @@ extern "C" std::size_t __sanitizer_get_current_allocated_bytes();
 #elif defined(__GLIBC__)
 #include <malloc.h>
 #endif
+
 #if defined(__linux__)
 #include <unistd.h>
 #endif
+
+namespace qz {
 
 namespace {
 
@@ -62,3 +65,5 @@ bool knowsResident() {
   return residentBytes() > 0;
 #endif
 }
+
+}  // namespace qz

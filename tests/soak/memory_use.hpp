@@ -4,6 +4,8 @@
 
 #include <cstdint>
 
+namespace qz {
+
 /// The memory in use at one moment, in bytes. A figure that the system does not report exactly
 /// enough is 0.
 struct MemoryUse {
@@ -17,3 +19,5 @@ MemoryUse memoryUse();
 bool knowsHeap();
 /// True if resident memory tells something about the program, rather than about a sanitizer.
 bool knowsResident();
+
+}  // namespace qz

@@ -18,9 +18,11 @@
 #include <string>
 #include <string_view>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/engine.hpp"
 #include "tests/soak/memory_use.hpp"
-#include "toolkit/memory/memory_driver.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -107,7 +109,7 @@ class Soak {
   long rounds() const { return rounds_; }
 
  private:
-  toolkit::Ref<toolkit::View> add(toolkit::ViewKind kind, toolkit::Tag tag) {
+  toolkit::Ref<toolkit::View> add(drivers::ViewKind kind, toolkit::Tag tag) {
     return driver_.makeView(kind, tag, {20, 20.0 * static_cast<double>(tag), 100, 20},
                             window_->contentView());
   }
@@ -147,13 +149,13 @@ class Soak {
   }
 
   Resources resources_;
-  toolkit::memory::MemoryDriver driver_;
+  drivers::MemoryDriver driver_;
   toolkit::Ref<toolkit::Window> window_ = driver_.makeWindow({0, 0, 400, 300});
-  toolkit::Ref<toolkit::View> start_ = add(toolkit::ViewKind::button, 1);
-  toolkit::Ref<toolkit::View> timed_ = add(toolkit::ViewKind::button, 2);
-  toolkit::Ref<toolkit::View> flashing_ = add(toolkit::ViewKind::button, 3);
-  toolkit::Ref<toolkit::View> label_ = add(toolkit::ViewKind::textField, 5);
-  toolkit::Ref<toolkit::View> picture_ = add(toolkit::ViewKind::imageView, 6);
+  toolkit::Ref<toolkit::View> start_ = add(drivers::ViewKind::button, 1);
+  toolkit::Ref<toolkit::View> timed_ = add(drivers::ViewKind::button, 2);
+  toolkit::Ref<toolkit::View> flashing_ = add(drivers::ViewKind::button, 3);
+  toolkit::Ref<toolkit::View> label_ = add(drivers::ViewKind::textField, 5);
+  toolkit::Ref<toolkit::View> picture_ = add(drivers::ViewKind::imageView, 6);
   std::shared_ptr<QZ_Plist_State_Parser> engine_ =
       QZ_Plist_State_Parser::initWithWindow(driver_.toolkit(), window_);
   long rounds_ = 0;
@@ -201,6 +203,10 @@ bool soak(double scale) {
 }
 
 }  // namespace
+
+}  // namespace qz
+
+using namespace qz;
 
 int main(int argc, char** argv) {
   char* end = nullptr;

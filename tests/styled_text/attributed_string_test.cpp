@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Attributed strings: their runs, their edits, the exceptions they raise.
-#include "toolkit/styled_text/attributed_string.hpp"
+#include "qz/styled_text/attributed_string.hpp"
 
 #include <gtest/gtest.h>
 
@@ -8,9 +8,11 @@
 #include <string>
 #include <vector>
 
+#include "qz/toolkit/exception.hpp"
 #include "tests/styled_text/reading.hpp"
-#include "toolkit/exception.hpp"
-#include "toolkit/styled_text/ascii.hpp"
+#include "text/ascii.hpp"
+
+namespace qz {
 
 namespace {
 
@@ -204,11 +206,13 @@ TEST(Link, SharesItsAddressAmongCopiesAndComparesByIt) {
 }
 
 TEST(AsciiBytes, AreAbsentForWhatAsciiLacks) {
-  EXPECT_EQ(toolkit::asciiBytes(""), "");
-  EXPECT_EQ(toolkit::asciiBytes("a\t\x7f"), "a\t\x7f");
-  EXPECT_EQ(toolkit::asciiBytes(std::string("a\0b", 3)), std::string("a\0b", 3));
-  EXPECT_EQ(toolkit::asciiBytes("caf\u00e9"), std::nullopt);
-  EXPECT_EQ(toolkit::asciiBytes("\x80"), std::nullopt);
+  EXPECT_EQ(text::asciiBytes(""), "");
+  EXPECT_EQ(text::asciiBytes("a\t\x7f"), "a\t\x7f");
+  EXPECT_EQ(text::asciiBytes(std::string("a\0b", 3)), std::string("a\0b", 3));
+  EXPECT_EQ(text::asciiBytes("caf\u00e9"), std::nullopt);
+  EXPECT_EQ(text::asciiBytes("\x80"), std::nullopt);
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -7,6 +7,8 @@
 
 #include "tests/styled_text/reading.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace styled_text_tests;
@@ -140,3 +142,5 @@ TEST(HtmlAlignment, OfANewLineIsThatOfTheParagraphItEnds) {
 }
 
 }  // namespace
+
+}  // namespace qz

@@ -8,6 +8,8 @@
 
 #include "tests/styled_text/reading.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace styled_text_tests;
@@ -124,3 +126,5 @@ TEST(HtmlReferences, NameAllOfHtml4) {
 }
 
 }  // namespace
+
+}  // namespace qz

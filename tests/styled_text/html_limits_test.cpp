@@ -12,6 +12,8 @@
 
 #include "tests/styled_text/reading.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace styled_text_tests;
@@ -293,3 +295,5 @@ TEST(HtmlLimits, ReadLongAttributes) {
 }
 
 }  // namespace
+
+}  // namespace qz

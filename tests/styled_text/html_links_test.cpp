@@ -6,6 +6,8 @@
 
 #include "tests/styled_text/reading.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace styled_text_tests;
@@ -66,3 +68,5 @@ TEST(HtmlLinks, DoNotNest) {
 }
 
 }  // namespace
+
+}  // namespace qz

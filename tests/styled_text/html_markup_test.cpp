@@ -7,6 +7,8 @@
 
 #include "tests/styled_text/reading.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace styled_text_tests;
@@ -161,3 +163,5 @@ TEST(HtmlMarkup, ReadsTheDocumentsOfScripts) {
 }
 
 }  // namespace
+
+}  // namespace qz

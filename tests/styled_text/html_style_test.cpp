@@ -7,6 +7,8 @@
 
 #include "tests/styled_text/reading.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace styled_text_tests;
@@ -268,3 +270,5 @@ TEST(HtmlStyle, TakesTheBodysText) {
 }
 
 }  // namespace
+
+}  // namespace qz

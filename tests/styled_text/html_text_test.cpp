@@ -7,6 +7,8 @@
 
 #include "tests/styled_text/reading.hpp"
 
+namespace qz {
+
 namespace {
 
 using namespace styled_text_tests;
@@ -166,3 +168,5 @@ TEST(HtmlText, IsAbsentOnlyForNothing) {
 }
 
 }  // namespace
+
+}  // namespace qz

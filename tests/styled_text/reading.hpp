@@ -13,9 +13,9 @@
 #include <string>
 #include <string_view>
 
-#include "toolkit/styled_text/html_reader.hpp"
+#include "qz/styled_text/html_reader.hpp"
 
-namespace styled_text_tests {
+namespace qz::styled_text_tests {
 
 inline std::string joined(std::initializer_list<std::string_view> parts) {
   std::string text;
@@ -137,4 +137,4 @@ void expectRuns(const std::array<Case, N>& cases) {
   for (const auto& [html, runs] : cases) EXPECT_EQ(runsText(read(html)), runs) << html;
 }
 
-}  // namespace styled_text_tests
+}  // namespace qz::styled_text_tests

@@ -9,15 +9,15 @@
 #include <vector>
 
 #include "play_files.hpp"
+#include "qz/property_list/binary_writer.hpp"
+#include "qz/property_list/canonical_dump.hpp"
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/reader.hpp"
+#include "qz/property_list/scalars.hpp"
 #include "tool_run.hpp"
-#include "toolkit/property_list/binary_writer.hpp"
-#include "toolkit/property_list/canonical_dump.hpp"
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/reader.hpp"
-#include "toolkit/property_list/scalars.hpp"
 #include "tools/commands.hpp"
 
-namespace tools {
+namespace qz::tools {
 namespace {
 
 namespace fs = std::filesystem;
@@ -123,4 +123,4 @@ TEST_F(ConvertCommand, tellsWhyAFileCannotBeReadOrWritten) {
 }
 
 }  // namespace
-}  // namespace tools
+}  // namespace qz::tools

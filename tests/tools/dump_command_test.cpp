@@ -7,14 +7,14 @@
 #include <vector>
 
 #include "play_files.hpp"
+#include "qz/property_list/binary_writer.hpp"
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/scalars.hpp"
 #include "tool_run.hpp"
-#include "toolkit/property_list/binary_writer.hpp"
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/scalars.hpp"
 #include "tools/commands.hpp"
 #include "tools/readable_dump.hpp"
 
-namespace tools {
+namespace qz::tools {
 namespace {
 
 using toolkit::ValueRef;
@@ -151,4 +151,4 @@ TEST_F(DumpCommand, takesTheDeepestNestingAndRefusesSharingWithoutBound) {
 }
 
 }  // namespace
-}  // namespace tools
+}  // namespace qz::tools

@@ -8,7 +8,7 @@
 #include "tool_run.hpp"
 #include "tools/commands.hpp"
 
-namespace tools {
+namespace qz::tools {
 namespace {
 
 Result run(const std::vector<std::string>& arguments) { return tools::run(playCommand, arguments); }
@@ -129,4 +129,4 @@ TEST_F(PlayCommand, anOutputThatCannotBeWrittenIsOneLine) {
 }
 
 }  // namespace
-}  // namespace tools
+}  // namespace qz::tools

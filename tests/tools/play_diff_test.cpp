@@ -7,7 +7,7 @@
 #include "play_support.hpp"
 #include "tools/play/picture_diff.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 // For the messages of failed tests.
 void PrintTo(const Change& change, std::ostream* out) {
@@ -16,9 +16,9 @@ void PrintTo(const Change& change, std::ostream* out) {
 
 namespace {
 
+using drivers::ViewKind;
 using toolkit::AttributedString;
 using toolkit::TextAttributes;
-using toolkit::ViewKind;
 using Changes = std::vector<Change>;
 
 TextAttributes bold() {
@@ -40,7 +40,7 @@ AttributedString halfBold(const std::string& first, const std::string& second) {
   return text;
 }
 
-StepPicture oneControl(ViewKind kind) {
+StepPicture oneControl(drivers::ViewKind kind) {
   StepPicture picture = windowPicture();
   picture.controls = {controlPicture(kind, 7)};
   return picture;
@@ -68,7 +68,7 @@ TEST(PlayDiff, namesEveryChangeOfAControl) {
       {[](auto& c) { c.view.toolTip = "Help"; }, {"tooltip", "none", "“Help”"}},
   };
   for (const auto& c : cases) {
-    const StepPicture before = oneControl(ViewKind::button);
+    const StepPicture before = oneControl(drivers::ViewKind::button);
     StepPicture now = before;
     c.change(now.controls[0]);
     const PictureChanges changes = diffPictures(before, now);
@@ -79,7 +79,7 @@ TEST(PlayDiff, namesEveryChangeOfAControl) {
 
 TEST(PlayDiff, namesEveryChangeOfTheWindow) {
   const struct {
-    std::function<void(toolkit::WindowPicture&)> change;
+    std::function<void(drivers::WindowPicture&)> change;
     Change expected;
   } cases[] = {
       {[](auto& w) {
@@ -104,7 +104,7 @@ TEST(PlayDiff, namesEveryChangeOfTheWindow) {
 
 /// Returns the changes reported for a text field that shows `now` after `before`.
 Changes textChanges(const AttributedString& before, const AttributedString& now) {
-  StepPicture first = oneControl(ViewKind::textField);
+  StepPicture first = oneControl(drivers::ViewKind::textField);
   first.controls[0].view.text = before;
   StepPicture second = first;
   second.controls[0].view.text = now;
@@ -163,11 +163,11 @@ TEST(PlayDiff, theStyleOfAnotherTextIsToldInShort) {
 
 TEST(PlayDiff, controlsAreKnownAgainByThemselvesNotByTheirTag) {
   StepPicture before = windowPicture();
-  before.controls = {controlPicture(ViewKind::button, 1, "A"),
-                     controlPicture(ViewKind::button, 2, "B")};
+  before.controls = {controlPicture(drivers::ViewKind::button, 1, "A"),
+                     controlPicture(drivers::ViewKind::button, 2, "B")};
   StepPicture now = before;
   now.controls[0].view.tag = 2;
-  now.controls[1] = controlPicture(ViewKind::button, 2, "B");
+  now.controls[1] = controlPicture(drivers::ViewKind::button, 2, "B");
   const PictureChanges changes = diffPictures(before, now);
   EXPECT_EQ(changes.controls[0].changes, (Changes{{"tag", "1", "2"}}));
   EXPECT_TRUE(changes.controls[1].isNew);
@@ -202,4 +202,4 @@ TEST(PlayDiff, namesWhatTheEngineIsUpTo) {
 }
 
 }  // namespace
-}  // namespace tools::play
+}  // namespace qz::tools::play

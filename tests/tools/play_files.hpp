@@ -9,7 +9,7 @@
 #include <string>
 #include <string_view>
 
-namespace tools::play {
+namespace qz::tools::play {
 
 /// Makes a temporary directory the working directory; the destructor undoes both.
 class WorkingDirectory {
@@ -36,4 +36,4 @@ class WorkingDirectory {
   std::filesystem::path path_;
 };
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

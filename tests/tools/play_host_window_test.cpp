@@ -2,16 +2,16 @@
 // Files that describe a host's window.
 #include <gtest/gtest.h>
 
+#include "drivers/memory/memory_driver.hpp"
 #include "play_files.hpp"
-#include "toolkit/memory/memory_driver.hpp"
-#include "tools/failure.hpp"
 #include "tools/play/host_window.hpp"
+#include "tools/support/failure.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
+using drivers::ViewKind;
 using toolkit::State;
-using toolkit::ViewKind;
 
 HostWindow read(std::string_view text) {
   const WorkingDirectory directory;
@@ -39,7 +39,7 @@ TEST(PlayHostWindow, readsTheWindowAndItsControls) {
   EXPECT_EQ(host.content, (toolkit::Rect{1, 2, 300, 200}));
   ASSERT_EQ(host.controls.size(), 1U);
   const HostControl& control = host.controls[0];
-  EXPECT_EQ(control.kind, ViewKind::mixed);
+  EXPECT_EQ(control.kind, drivers::ViewKind::mixed);
   EXPECT_EQ(control.tag, -7);
   EXPECT_EQ(control.frame, (toolkit::Rect{1, 2.5, 3, 4}));
   EXPECT_EQ(control.caption, "Go");
@@ -138,7 +138,7 @@ TEST(PlayHostWindow, saysWhatIsWrongWithAFrame) {
 }
 
 TEST(PlayHostWindow, putsItOnTheScreen) {
-  const auto driver = toolkit::memory::makeMemoryDriver();
+  const auto driver = drivers::makeMemoryDriver();
   const HostWindow host = read(
       "({class = NSWindow; frame = (1, 2, 300, 200);},"
       " {class = \"NSButton:toggle\"; tag = 7; frame = (1, 2, 3, 4); title = Go; state = on;"
@@ -150,7 +150,7 @@ TEST(PlayHostWindow, putsItOnTheScreen) {
   const auto& views = window->contentView()->subviews();
   ASSERT_EQ(views.size(), 2U);
   const auto button = driver->look(views[0]);
-  EXPECT_EQ(button.kind, ViewKind::toggle);
+  EXPECT_EQ(button.kind, drivers::ViewKind::toggle);
   EXPECT_EQ(button.tag, 7);
   EXPECT_EQ(button.title.string(), "Go");
   EXPECT_EQ(button.state, State::on);
@@ -162,7 +162,7 @@ TEST(PlayHostWindow, putsItOnTheScreen) {
 
 TEST(PlayHostWindow, anImageMustBeKnown) {
   const WorkingDirectory directory;
-  const auto driver = toolkit::memory::makeMemoryDriver();
+  const auto driver = drivers::makeMemoryDriver();
   driver->setResourcePath(directory.path());
   const HostWindow host = read("({class = NSImageView; frame = (0, 0, 1, 1); image = disk;})");
   EXPECT_THROW(makeHostWindow(*driver, host, "host.plist"), Failure);
@@ -172,4 +172,4 @@ TEST(PlayHostWindow, anImageMustBeKnown) {
 }
 
 }  // namespace
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -5,12 +5,12 @@
 #include "play_support.hpp"
 #include "tools/play/picture_render.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
+using drivers::ViewKind;
 using toolkit::AttributedString;
 using toolkit::TextAttributes;
-using toolkit::ViewKind;
 
 std::string render(const StepPicture& picture, const Style& style = {}) {
   return renderPicture(picture, diffPictures(picture, picture), style);
@@ -28,26 +28,26 @@ TextAttributes styled() {
 StepPicture everything() {
   StepPicture picture = windowPicture();
   picture.window->layerImage = "paper";
-  auto next = controlPicture(ViewKind::button, 1, "Next");
+  auto next = controlPicture(drivers::ViewKind::button, 1, "Next");
   next.flashing = true;
   next.view.highlighted = true;
   next.view.background = toolkit::colors::red;
-  auto choice = controlPicture(ViewKind::mixed, 20, "Encrypt");
+  auto choice = controlPicture(drivers::ViewKind::mixed, 20, "Encrypt");
   choice.view.state = toolkit::State::mixed;
   choice.view.enabled = false;
   choice.view.toolTip = "Choose a password";
-  auto heading = controlPicture(ViewKind::textField, -3);
+  auto heading = controlPicture(drivers::ViewKind::textField, -3);
   heading.view.text = AttributedString("Your first backup", styled());
-  auto text = controlPicture(ViewKind::textField, 4);
+  auto text = controlPicture(drivers::ViewKind::textField, 4);
   TextAttributes link;
   link.link = "https://example.com/";
   link.underline = true;
   text.view.text = AttributedString("In two minutes all your files will be safe. See ");
   text.view.text.append("how it works", link);
-  auto image = controlPicture(ViewKind::imageView, 4);
+  auto image = controlPicture(drivers::ViewKind::imageView, 4);
   image.view.image = "disk";
   image.shadowed = true;
-  auto box = controlPicture(ViewKind::box, 6);
+  auto box = controlPicture(drivers::ViewKind::box, 6);
   box.view.hidden = true;
   picture.controls = {next, choice, heading, text, image, box};
   picture.lastList = "2";
@@ -81,7 +81,7 @@ TEST(PlayPicture, marksWhatChanged) {
   now.controls[3].view.text =
       AttributedString("Leave the disk plugged in until the last file is copied, please.");
   now.controls.erase(now.controls.begin() + 5);
-  now.controls.push_back(controlPicture(ViewKind::popUpButton, 9, "Daily"));
+  now.controls.push_back(controlPicture(drivers::ViewKind::popUpButton, 9, "Daily"));
   now.timers.erase(now.timers.begin());
   now.window->background = toolkit::colors::black;
   now.lastList = "5";
@@ -111,4 +111,4 @@ TEST(PlayPicture, headingsFillTheLine) {
 }
 
 }  // namespace
-}  // namespace tools::play
+}  // namespace qz::tools::play

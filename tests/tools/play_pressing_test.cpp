@@ -5,24 +5,24 @@
 #include "play_support.hpp"
 #include "tools/play/pressing.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
-using toolkit::ViewKind;
+using drivers::ViewKind;
 
 StepPicture buttons() {
   StepPicture picture = windowPicture();
-  auto next = controlPicture(ViewKind::button, 1, "Next\nplease");
+  auto next = controlPicture(drivers::ViewKind::button, 1, "Next\nplease");
   next.hasList = true;
-  auto hidden = controlPicture(ViewKind::button, 2, "Back");
+  auto hidden = controlPicture(drivers::ViewKind::button, 2, "Back");
   hidden.view.hidden = true;
   hidden.hasList = true;
-  auto disabled = controlPicture(ViewKind::button, 3, "Stop");
+  auto disabled = controlPicture(drivers::ViewKind::button, 3, "Stop");
   disabled.view.enabled = false;
   disabled.hasList = true;
-  auto toggle = controlPicture(ViewKind::toggle, 4);
-  auto text = controlPicture(ViewKind::textField, 5, "Hello");
-  auto front = controlPicture(ViewKind::button, 5, "In front");
+  auto toggle = controlPicture(drivers::ViewKind::toggle, 4);
+  auto text = controlPicture(drivers::ViewKind::textField, 5, "Hello");
+  auto front = controlPicture(drivers::ViewKind::button, 5, "In front");
   front.shadowed = true;
   front.hasList = true;
   picture.controls = {next, hidden, disabled, toggle, text, front};
@@ -91,4 +91,4 @@ TEST(PlayPressing, saysWhatTheWalkThroughWaitsFor) {
 }
 
 }  // namespace
-}  // namespace tools::play
+}  // namespace qz::tools::play

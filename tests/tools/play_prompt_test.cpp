@@ -4,7 +4,7 @@
 
 #include "tools/play/prompt.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 std::string words(const Request& request) {
@@ -50,4 +50,4 @@ TEST(PlayPrompt, understandsALine) {
 }
 
 }  // namespace
-}  // namespace tools::play
+}  // namespace qz::tools::play

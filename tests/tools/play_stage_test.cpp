@@ -2,15 +2,15 @@
 // The stand-in for a window that is not given, and the pictures of a stage.
 #include <gtest/gtest.h>
 
+#include "drivers/memory/memory_driver.hpp"
 #include "play_files.hpp"
-#include "toolkit/memory/memory_driver.hpp"
-#include "tools/play/input_file.hpp"
 #include "tools/play/stage.hpp"
 #include "tools/play/stand_in.hpp"
 #include "tools/play/step_picture.hpp"
 #include "tools/play/words.hpp"
+#include "tools/support/input_file.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 toolkit::ValueRef<toolkit::Dictionary> script(std::string_view text) {
@@ -61,7 +61,7 @@ TEST(PlayStandIn, takesOnlyListsOfTagsForButtons) {
 }
 
 TEST(PlayStage, picturesSayWhatPressesReach) {
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   const WorkingDirectory directory;
   directory.write("script.plist", "{ 1 = ((ALLOW_FLASHING, YES), (FLASH_ID, YES, 1)); 3 = (); }");
   directory.write("host.plist",
@@ -87,7 +87,7 @@ TEST(PlayStage, picturesSayWhatPressesReach) {
 }
 
 TEST(PlayStage, nothingFlashesAfterTheEnd) {
-  toolkit::memory::MemoryDriver driver;
+  drivers::MemoryDriver driver;
   const WorkingDirectory directory;
   directory.write("script.plist", "{ 1 = ((ALLOW_FLASHING, YES), (FLASH_ID, YES, 1)); }");
   PlayOptions options;
@@ -100,4 +100,4 @@ TEST(PlayStage, nothingFlashesAfterTheEnd) {
 }
 
 }  // namespace
-}  // namespace tools::play
+}  // namespace qz::tools::play

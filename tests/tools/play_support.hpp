@@ -10,7 +10,7 @@
 
 #include "tools/play/step_picture.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 /// Returns a new identity for the picture of a control or timer, valid until the program ends.
 inline std::weak_ptr<const void> newIdentity() {
@@ -18,13 +18,13 @@ inline std::weak_ptr<const void> newIdentity() {
   return identities.emplace_back(std::make_shared<int>());
 }
 
-inline ControlPicture controlPicture(toolkit::ViewKind kind, toolkit::Tag tag,
+inline ControlPicture controlPicture(drivers::ViewKind kind, toolkit::Tag tag,
                                      const std::string& caption = "") {
   ControlPicture control;
   control.identity = newIdentity();
   control.view.kind = kind;
   control.view.tag = tag;
-  const bool isText = kind == toolkit::ViewKind::textField;
+  const bool isText = kind == drivers::ViewKind::textField;
   if (!caption.empty()) {
     (isText ? control.view.text : control.view.title) = toolkit::AttributedString(caption);
   }
@@ -49,4 +49,4 @@ inline std::string playData(const std::string& name) {
   return text.str();
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

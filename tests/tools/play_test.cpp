@@ -9,7 +9,7 @@
 #include "play_files.hpp"
 #include "play_support.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 struct Played {
@@ -292,4 +292,4 @@ TEST(Play, saysWhatIsWrongWithAFile) {
 }
 
 }  // namespace
-}  // namespace tools::play
+}  // namespace qz::tools::play

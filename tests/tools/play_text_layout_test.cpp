@@ -5,9 +5,9 @@
 #include <string>
 #include <vector>
 
-#include "tools/text_layout.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools {
+namespace qz::tools {
 namespace {
 
 TEST(PlayTextLayout, widthIsThatOfATerminal) {
@@ -85,4 +85,4 @@ TEST(PlayTextLayout, paddingCountsColumns) {
 }
 
 }  // namespace
-}  // namespace tools
+}  // namespace qz::tools

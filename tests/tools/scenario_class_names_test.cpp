@@ -4,25 +4,25 @@
 
 #include <string>
 
-#include "tools/drivers.hpp"
 #include "tools/scenario/class_names.hpp"
+#include "tools/support/drivers.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
+using drivers::ViewKind;
 using toolkit::Rect;
 using toolkit::Ref;
 using toolkit::View;
-using toolkit::ViewKind;
 using toolkit::Window;
 
 /// A driver of the memory toolkit with other class names.
-class ForeignDriver final : public toolkit::TestDriver {
+class ForeignDriver final : public drivers::Driver {
  public:
   std::string_view name() const override { return "foreign"; }
   toolkit::Toolkit& toolkit() override { return driver_->toolkit(); }
   Ref<Window> makeWindow(const Rect& content) override { return driver_->makeWindow(content); }
-  Ref<View> makeView(ViewKind kind, toolkit::Tag tag, const Rect& frame,
+  Ref<View> makeView(drivers::ViewKind kind, toolkit::Tag tag, const Rect& frame,
                      const Ref<View>& in) override {
     return driver_->makeView(kind, tag, frame, in);
   }
@@ -38,34 +38,34 @@ class ForeignDriver final : public toolkit::TestDriver {
   void hold(const Ref<View>& view) override { driver_->hold(view); }
   void letGo() override { driver_->letGo(); }
   void advance(double seconds) override { driver_->advance(seconds); }
-  toolkit::ViewPicture look(const Ref<View>& view) override { return driver_->look(view); }
-  toolkit::WindowPicture look(const Ref<Window>& window) override { return driver_->look(window); }
+  drivers::ViewPicture look(const Ref<View>& view) override { return driver_->look(view); }
+  drivers::WindowPicture look(const Ref<Window>& window) override { return driver_->look(window); }
   void setLogSink(std::function<void(std::string_view)> sink) override {
     driver_->setLogSink(std::move(sink));
   }
   // On-off buttons have their own class; texts and images share one.
-  std::string_view className(ViewKind kind) const override {
+  std::string_view className(drivers::ViewKind kind) const override {
     switch (kind) {
-      case ViewKind::button:
+      case drivers::ViewKind::button:
         return "PushButton";
-      case ViewKind::toggle:
-      case ViewKind::mixed:
+      case drivers::ViewKind::toggle:
+      case drivers::ViewKind::mixed:
         return "CheckBox";
-      case ViewKind::popUpButton:
+      case drivers::ViewKind::popUpButton:
         return "ComboBox";
-      case ViewKind::textField:
-      case ViewKind::imageView:
+      case drivers::ViewKind::textField:
+      case drivers::ViewKind::imageView:
         return "Label";
-      case ViewKind::box:
+      case drivers::ViewKind::box:
         return "GroupBox";
-      case ViewKind::plain:
+      case drivers::ViewKind::plain:
         break;
     }
     return "Widget";
   }
 
  private:
-  std::unique_ptr<toolkit::TestDriver> driver_ = makeDriver("memory");
+  std::unique_ptr<drivers::Driver> driver_ = makeDriver("memory");
 };
 
 TEST(ScenarioClassNames, standardNamesStandForTheToolkits) {
@@ -114,4 +114,4 @@ TEST(ScenarioClassNames, onAToolkitWithTheStandardNamesNothingChanges) {
 }
 
 }  // namespace
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -14,10 +14,10 @@
 #include "play_files.hpp"
 #include "tool_run.hpp"
 #include "tools/commands.hpp"
-#include "tools/drivers.hpp"
-#include "tools/suggestions.hpp"
+#include "tools/support/drivers.hpp"
+#include "tools/support/suggestions.hpp"
 
-namespace tools {
+namespace qz::tools {
 namespace {
 
 namespace fs = std::filesystem;
@@ -211,4 +211,4 @@ TEST_F(ScenarioCommand, withoutADirectoryForTemporaryFilesNothingRuns) {
 }
 
 }  // namespace
-}  // namespace tools
+}  // namespace qz::tools

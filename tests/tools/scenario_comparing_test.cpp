@@ -8,9 +8,9 @@
 #include "tools/scenario/json.hpp"
 #include "tools/scenario/vocabulary.hpp"
 #include "tools/scenario/wildcard.hpp"
-#include "tools/suggestions.hpp"
+#include "tools/support/suggestions.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 TEST(ScenarioComparing, jsonValues) {
@@ -146,4 +146,4 @@ TEST(ScenarioComparing, wordsAsValues) {
 }
 
 }  // namespace
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

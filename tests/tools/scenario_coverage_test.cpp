@@ -10,7 +10,7 @@
 #include "tools/scenario/references.hpp"
 #include "tools/scenario/scenario_files.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 std::vector<std::string> namesOf(const std::vector<PropertyInfo>& infos) {
@@ -108,4 +108,4 @@ TEST(ScenarioCoverage, aFileUsesEverythingAndPasses) {
 }
 
 }  // namespace
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

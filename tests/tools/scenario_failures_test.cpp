@@ -6,7 +6,7 @@
 
 #include "scenario_support.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 /// A window with a button and a label, and an engine that has adopted it. Six lines.
@@ -156,4 +156,4 @@ TEST(ScenarioFailures, oneFailureEndsItsScenarioOnly) {
 }
 
 }  // namespace
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

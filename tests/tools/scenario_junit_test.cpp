@@ -6,7 +6,7 @@
 
 #include "tools/scenario/junit.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 Report report(Verdict verdict, const std::string& file, const std::string& title) {
@@ -88,4 +88,4 @@ TEST(ScenarioJunit, withoutScenariosItIsEmpty) {
 }
 
 }  // namespace
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -7,7 +7,7 @@
 
 #include "tools/scenario/lexer.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 /// Returns the words of each statement, marked: bare, 'quoted', <JSON>.
@@ -144,4 +144,4 @@ TEST(ScenarioLexer, refusesJsonThatNestsTooDeeply) {
 }
 
 }  // namespace
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -8,9 +8,9 @@
 #include <vector>
 
 #include "scenario_support.hpp"
-#include "tools/view_kinds.hpp"
+#include "tools/support/view_kinds.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 std::string page() {
@@ -57,4 +57,4 @@ TEST(ScenarioPage, itNamesEveryStatementPropertyAndClass) {
 }
 
 }  // namespace
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

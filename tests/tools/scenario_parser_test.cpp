@@ -8,7 +8,7 @@
 #include "scenario_support.hpp"
 #include "tools/scenario/parser.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 ScenarioFile parsed(const std::string& text) { return parseScenarios(text, vocabulary()); }
@@ -236,4 +236,4 @@ TEST(ScenarioParser, refusesEndlessNesting) {
 }
 
 }  // namespace
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

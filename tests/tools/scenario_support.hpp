@@ -6,12 +6,12 @@
 #include <utility>
 #include <vector>
 
-#include "tools/drivers.hpp"
 #include "tools/scenario/parser.hpp"
 #include "tools/scenario/runner.hpp"
 #include "tools/scenario/statements.hpp"
+#include "tools/support/drivers.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// Returns "LINE:COLUMN: problem", or an empty text when `text` is a valid scenario file.
 inline std::string refusal(const std::string& text) {
@@ -46,4 +46,4 @@ inline std::string failure(const std::string& text) {
   return std::to_string(report.failedLine) + ": " + report.problem;
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -9,7 +9,7 @@
 
 #include "tools/shell.hpp"
 
-namespace tools {
+namespace qz::tools {
 
 /// Captures the output to a standard stream while this object lives.
 class Captured {
@@ -41,4 +41,4 @@ inline Result run(const CommandEntry& command, const std::vector<std::string>& a
   return {status, out.text(), err.text()};
 }
 
-}  // namespace tools
+}  // namespace qz::tools

@@ -1,12 +1,15 @@
 // SPDX-License-Identifier: MIT
 // Makes windows and controls. Windows handle their own sheets.
 
-#include "toolkit/memory/application.hpp"
+#include "qz/toolkit/memory/application.hpp"
 
+#include "toolkit/memory/screen.hpp"
 #include "toolkit/memory/views.hpp"
 #include "toolkit/memory/window.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
+
+MemoryApplication::MemoryApplication() : screen_(std::make_shared<Screen>()) {}
 
 // This toolkit has no backing store and nothing to defer.
 Ref<Window> MemoryApplication::makeWindow(const Rect& content, StyleMask style, BackingStore,
@@ -37,4 +40,4 @@ void MemoryApplication::endSheet(const Ref<Window>& sheet, long returnCode) {
   if (const auto window = MemoryWindow::of(sheet)) window->endAsSheet(returnCode);
 }
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

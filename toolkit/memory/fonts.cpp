@@ -3,9 +3,9 @@
 
 #include "toolkit/memory/fonts.hpp"
 
-#include "toolkit/font_names.hpp"
+#include "toolkit/backend/font_names.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 
 std::optional<Font> MemoryFonts::fontWithName(std::string_view name, double size) const {
   static const FontFamily families[] = {
@@ -17,4 +17,4 @@ std::optional<Font> MemoryFonts::fontWithName(std::string_view name, double size
   return fontNamed(name, size, families);
 }
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

@@ -2,13 +2,13 @@
 // The memory toolkit's fonts: a fixed catalogue, the same on every machine.
 #pragma once
 
-#include "toolkit/styled_text/fonts.hpp"
+#include "qz/styled_text/fonts.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 
 class MemoryFonts final : public Fonts {
  public:
   std::optional<Font> fontWithName(std::string_view name, double size) const override;
 };
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

@@ -4,9 +4,9 @@
 
 #include "toolkit/memory/images.hpp"
 
-#include "toolkit/image_names.hpp"
+#include "toolkit/backend/image_names.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 
 Ref<Image> MemoryImages::imageNamed(std::string_view name) {
   const auto known = found_.find(name);
@@ -19,4 +19,4 @@ Ref<Image> MemoryImages::imageNamed(std::string_view name) {
   return image;
 }
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

@@ -8,10 +8,10 @@
 #include <string_view>
 #include <utility>
 
-#include "toolkit/files.hpp"
-#include "toolkit/image.hpp"
+#include "qz/toolkit/files.hpp"
+#include "qz/toolkit/image.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 
 class MemoryImage final : public Image {
  public:
@@ -38,4 +38,4 @@ class MemoryImages final : public Images {
   std::map<std::string, std::shared_ptr<MemoryImage>, std::less<>> found_;
 };
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

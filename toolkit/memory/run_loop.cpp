@@ -5,7 +5,7 @@
 
 #include <limits>
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 
 void MemoryRunLoop::advance(double seconds) {
   // After an infinite advance, the clock would stand at infinity and no timer would ever be due
@@ -16,4 +16,4 @@ void MemoryRunLoop::advance(double seconds) {
   now_ = std::max(now_, target);
 }
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

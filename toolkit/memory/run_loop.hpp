@@ -4,9 +4,9 @@
 
 #include <algorithm>
 
-#include "toolkit/timed_run_loop.hpp"
+#include "toolkit/backend/timed_run_loop.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 
 class MemoryRunLoop final : public TimedRunLoop {
  public:
@@ -36,4 +36,4 @@ class MemoryRunLoop final : public TimedRunLoop {
   bool userIsBusy_ = false;
 };
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

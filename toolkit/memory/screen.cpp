@@ -9,7 +9,7 @@
 
 #include "toolkit/memory/window.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 
 std::vector<MemoryWindow*> Screen::windows() const {
   std::vector<MemoryWindow*> windows;
@@ -53,4 +53,4 @@ const MemoryWindow* Screen::heirOf(const MemoryWindow& window) const {
   return shown_.empty() ? nullptr : shown_.back().window;
 }
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

@@ -11,7 +11,7 @@
 #include <memory>
 #include <vector>
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 
 class MemoryWindow;
 
@@ -56,4 +56,4 @@ class Screen {
   std::uint64_t drawings_ = 0;
 };
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

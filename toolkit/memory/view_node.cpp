@@ -6,10 +6,10 @@
 
 #include <algorithm>
 
-#include "toolkit/exception.hpp"
+#include "qz/toolkit/exception.hpp"
 #include "toolkit/memory/window.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 
 ViewNode::ViewNode(std::string_view className, const Rect& frame,
                    const std::shared_ptr<Screen>& screen)
@@ -77,4 +77,4 @@ bool ViewNode::isRedrawPending() const {
   return screen && changedAt_ == screen->drawings();
 }
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

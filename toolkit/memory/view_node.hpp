@@ -11,12 +11,12 @@
 #include <string>
 #include <string_view>
 
-#include "toolkit/geometry.hpp"
-#include "toolkit/image.hpp"
+#include "qz/toolkit/geometry.hpp"
+#include "qz/toolkit/image.hpp"
+#include "qz/toolkit/view.hpp"
 #include "toolkit/memory/screen.hpp"
-#include "toolkit/view.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 
 class MemoryWindow;
 
@@ -94,4 +94,4 @@ class ViewNode : public std::enable_shared_from_this<ViewNode> {
   std::uint64_t changedAt_ = 0;         // the number of redraws at the last change
 };
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

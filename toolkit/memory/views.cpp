@@ -5,7 +5,7 @@
 
 #include "toolkit/memory/window.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 
 bool ControlNode::send(std::string_view action, const std::shared_ptr<Responder>& target) {
   if (action.empty()) return false;
@@ -57,4 +57,4 @@ void MemoryButton::click() {
   send(action_, target());
 }
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

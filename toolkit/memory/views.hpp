@@ -11,10 +11,10 @@
 #include <string>
 #include <string_view>
 
+#include "qz/toolkit/view.hpp"
 #include "toolkit/memory/view_node.hpp"
-#include "toolkit/view.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 
 /// The base of all controls, independent of their role.
 class ControlNode : public ViewNode {
@@ -162,4 +162,4 @@ class MemoryImageView final : public MemoryControl<ImageView> {
   ImageAlignment alignment_ = ImageAlignment::center;
 };
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

@@ -8,7 +8,7 @@
 
 #include "toolkit/memory/views.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 
 MemoryWindow::MemoryWindow(const std::shared_ptr<Screen>& screen, const Rect& content,
                            StyleMask style, KeptBy keptBy)
@@ -83,4 +83,4 @@ void MemoryWindow::endAsSheet(long returnCode) {
     delegate->sheetDidEnd(shared_from_this(), returnCode, session->contextInfo);
 }
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

@@ -6,12 +6,12 @@
 #include <optional>
 #include <vector>
 
-#include "toolkit/application.hpp"
-#include "toolkit/geometry.hpp"
+#include "qz/toolkit/application.hpp"
+#include "qz/toolkit/geometry.hpp"
+#include "qz/toolkit/window.hpp"
 #include "toolkit/memory/screen.hpp"
-#include "toolkit/window.hpp"
 
-namespace toolkit::memory {
+namespace qz::toolkit::memory {
 
 /// The default background of a window (`windowBackgroundColor` in AppKit's light appearance).
 inline constexpr Color windowBackground{236 / 255.0, 236 / 255.0, 236 / 255.0};
@@ -86,4 +86,4 @@ class MemoryWindow final : public Window, public std::enable_shared_from_this<Me
   std::vector<long> sheetEnds_;
 };
 
-}  // namespace toolkit::memory
+}  // namespace qz::toolkit::memory

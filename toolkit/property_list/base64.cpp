@@ -5,7 +5,7 @@
 #include <array>
 #include <cstdint>
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 constexpr std::string_view base64Digits =
@@ -64,4 +64,4 @@ void encodeBase64(std::string_view bytes, std::string_view lineStart, std::strin
   }
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

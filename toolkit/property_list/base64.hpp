@@ -6,7 +6,7 @@
 #include <string>
 #include <string_view>
 
-namespace toolkit {
+namespace qz::toolkit {
 
 /// Decodes `text` as the platform does and appends the bytes: ASCII characters that are not base64
 /// digits are skipped, `=` counts as a digit anywhere, and an incomplete group of four at the end
@@ -17,4 +17,4 @@ std::size_t decodeBase64(std::string_view text, std::string& bytes);
 /// Appends `bytes` in base64, in lines of at most 68 digits, each starting with `lineStart`.
 void encodeBase64(std::string_view bytes, std::string_view lineStart, std::string& text);
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -14,9 +14,9 @@
 #include <string>
 #include <string_view>
 
-#include "toolkit/property_list/words.hpp"
+#include "text/words.hpp"
 
-namespace toolkit::binary {
+namespace qz::toolkit::binary {
 
 constexpr std::string_view magic = "bplist0";  // the version's second digit may be any byte
 constexpr std::size_t headerSize = 8;
@@ -55,13 +55,15 @@ class Numbers {
   /// `size` is in bytes per number, at least 1.
   explicit Numbers(std::size_t size)
       : size_(size),
-        mask_(~std::uint64_t{0} >> (8 * (words::size - std::min(size, words::size)))) {}
+        mask_(~std::uint64_t{0} >> (8 * (text::words::size - std::min(size, text::words::size)))) {}
 
   std::size_t size() const { return size_; }
   /// Returns the low 64 bits of the number at `index` in the array at `first`. The array must
   /// follow a file's header, because the function reads the eight bytes up to the number's end.
   std::uint64_t at(const char* first, std::size_t index) const {
-    return words::bigEndian(words::load(first + (index + 1) * size_ - words::size)) & mask_;
+    return text::words::bigEndian(
+               text::words::load(first + (index + 1) * size_ - text::words::size)) &
+           mask_;
   }
 
  private:
@@ -80,4 +82,4 @@ inline void appendNumber(std::string& bytes, std::uint64_t number, std::size_t s
   }
 }
 
-}  // namespace toolkit::binary
+}  // namespace qz::toolkit::binary

@@ -3,16 +3,16 @@
 #include <bit>
 #include <string>
 
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/format_readers.hpp"
+#include "qz/property_list/key_index.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "text/utf8.hpp"
 #include "toolkit/property_list/binary_layout.hpp"
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/format_readers.hpp"
-#include "toolkit/property_list/key_index.hpp"
 #include "toolkit/property_list/pending_values.hpp"
-#include "toolkit/property_list/scalars.hpp"
-#include "toolkit/property_list/utf8.hpp"
 #include "toolkit/property_list/walk.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 using binary::Marker;
@@ -251,9 +251,9 @@ Value* BinaryReader::uid(std::size_t offset) {
 /// Bytes from 0x80 are not ASCII; they are read as Latin-1.
 Value* BinaryReader::ascii(std::size_t offset) {
   const std::string_view bytes = contentOf(offset, 1);
-  if (isAscii(bytes)) return String::make(document_, bytes);
+  if (text::isAscii(bytes)) return String::make(document_, bytes);
   buffer_.clear();
-  for (const char byte : bytes) appendUtf8(buffer_, static_cast<unsigned char>(byte));
+  for (const char byte : bytes) text::appendUtf8(buffer_, static_cast<unsigned char>(byte));
   return String::make(document_, buffer_);
 }
 
@@ -261,7 +261,7 @@ Value* BinaryReader::utf16(std::size_t offset) {
   const std::string_view bytes = contentOf(offset, 2);
   if (bytes.empty()) refuse(offset, "a UTF-16 string of no characters");
   buffer_.clear();
-  Utf16Appender appender(buffer_);
+  text::Utf16Appender appender(buffer_);
   for (std::size_t at = 0; at < bytes.size(); at += 2) {
     appender.append(static_cast<char16_t>(binary::number(bytes.substr(at, 2))));
   }
@@ -326,4 +326,4 @@ Value* readBinary(std::string_view bytes, Document& document, ValueOffsets* offs
   return BinaryReader(bytes, document, offsets).root();
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "toolkit/property_list/binary_writer.hpp"
+#include "qz/property_list/binary_writer.hpp"
 
 #include <algorithm>
 #include <bit>
@@ -7,14 +7,14 @@
 #include <unordered_map>
 #include <vector>
 
-#include "toolkit/exception.hpp"
+#include "qz/property_list/format_readers.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "qz/toolkit/exception.hpp"
+#include "text/utf8.hpp"
 #include "toolkit/property_list/binary_layout.hpp"
-#include "toolkit/property_list/format_readers.hpp"
-#include "toolkit/property_list/scalars.hpp"
-#include "toolkit/property_list/utf8.hpp"
 #include "toolkit/property_list/walk.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 using binary::Marker;
@@ -146,14 +146,14 @@ void BinaryWriter::number(const Number& number) {
 }
 
 void BinaryWriter::string(std::string_view text) {
-  const auto isAscii = [](char c) { return static_cast<unsigned char>(c) < 0x80; };
-  if (std::all_of(text.begin(), text.end(), isAscii)) {
+  if (text::isAscii(text)) {
     markLong(Marker::ascii, text.size());
     bytes_ += text;
     return;
   }
   std::u16string units;
-  for (std::size_t at = 0; at < text.size();) appendUtf16(units, nextCodePoint(text, at));
+  for (std::size_t at = 0; at < text.size();)
+    text::appendUtf16(units, text::nextCodePoint(text, at));
   markLong(Marker::utf16, units.size());
   for (const char16_t unit : units) binary::appendNumber(bytes_, unit, sizeof unit);
 }
@@ -227,4 +227,4 @@ std::string writeBinaryPropertyList(const ValueRef<>& value) {
   return BinaryWriter(*value).result();
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

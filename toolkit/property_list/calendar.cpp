@@ -8,9 +8,9 @@
 #include <cstdint>
 #include <cstdio>
 
-#include "toolkit/ascii.hpp"
+#include "text/ascii.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 constexpr double secondsPerDay = 86400;
@@ -81,7 +81,7 @@ std::optional<double> secondsOfDate(std::string_view text) {
   if (negative) text.remove_prefix(1);
   std::int64_t year = 0;
   std::size_t digits = 0;
-  for (; digits < text.size() && isDigit(text[digits]); ++digits) {
+  for (; digits < text.size() && text::isDigit(text[digits]); ++digits) {
     year = std::min(year * 10 + (text[digits] - '0'), latestYear);
   }
   text.remove_prefix(digits);
@@ -90,7 +90,7 @@ std::optional<double> secondsOfDate(std::string_view text) {
   std::array<int, 5> fields{};
   std::size_t seen = 0;
   for (std::size_t i = 0; i < pattern.size(); ++i) {
-    if (pattern[i] != '0' ? text[i] != pattern[i] : !isDigit(text[i])) return std::nullopt;
+    if (pattern[i] != '0' ? text[i] != pattern[i] : !text::isDigit(text[i])) return std::nullopt;
     if (pattern[i] == '0') fields[seen / 2] = fields[seen / 2] * 10 + (text[i] - '0');
     if (pattern[i] == '0') ++seen;
   }
@@ -100,4 +100,4 @@ std::optional<double> secondsOfDate(std::string_view text) {
   return static_cast<double>(days) * secondsPerDay + hour * 3600.0 + minute * 60.0 + second;
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -6,7 +6,7 @@
 #include <string>
 #include <string_view>
 
-namespace toolkit {
+namespace qz::toolkit {
 
 /// Returns a date in ISO 8601, such as "2001-01-01T00:00:00Z", with a fraction of a second if it
 /// has one. For infinity, NaN and dates so far away that a double does not hold every second,
@@ -19,4 +19,4 @@ std::string iso8601(double secondsSinceReferenceDate);
 /// January.
 std::optional<double> secondsOfDate(std::string_view text);
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

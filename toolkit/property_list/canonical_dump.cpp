@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "toolkit/property_list/canonical_dump.hpp"
+#include "qz/property_list/canonical_dump.hpp"
 
 #include <algorithm>
 #include <array>
@@ -9,11 +9,11 @@
 #include <utility>
 #include <vector>
 
-#include "toolkit/property_list/scalars.hpp"
-#include "toolkit/property_list/utf8.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "text/utf8.hpp"
 #include "toolkit/property_list/walk.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 template <class... Arguments>
@@ -31,14 +31,14 @@ std::string dumpReal(double real) {
 std::string dumpString(std::string_view text) {
   std::string dump = "\"";
   for (std::size_t at = 0; at < text.size();) {
-    const char32_t c = nextCodePoint(text, at);
+    const char32_t c = text::nextCodePoint(text, at);
     if (c == '"' || c == '\\') dump += '\\';
     if (c >= 0x20 && c < 0x7F) {
       dump += static_cast<char>(c);
       continue;
     }
     std::u16string units;
-    appendUtf16(units, c);
+    text::appendUtf16(units, c);
     for (const char16_t unit : units) dump += formatted("\\u%04x", unsigned{unit});
   }
   return dump + '"';
@@ -140,4 +140,4 @@ std::string canonicalDump(const Value& value) {
   return dumper.result();
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: MIT
-#include "toolkit/property_list/collections.hpp"
+#include "qz/property_list/collections.hpp"
 
 #include <utility>
 
-#include "toolkit/exception.hpp"
-#include "toolkit/property_list/scalars.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "qz/toolkit/exception.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 bool isText(const Value& key, std::string_view text) {
@@ -271,4 +271,4 @@ ValueRef<Dictionary> asDictionary(const ValueRef<>& value) {
   return Counted<Dictionary>::share(static_cast<Dictionary*>(value.pointer().get()));
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -4,14 +4,15 @@
 #include <string>
 #include <string_view>
 
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "text/decimal.hpp"
+#include "text/hexadecimal.hpp"
 #include "toolkit/property_list/calendar.hpp"
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/decimal.hpp"
 #include "toolkit/property_list/old_style_tokens.hpp"
-#include "toolkit/property_list/scalars.hpp"
 #include "toolkit/property_list/walk.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 std::string describe(const Number& number) {
@@ -19,26 +20,18 @@ std::string describe(const Number& number) {
     case Number::Type::boolean:
       return number.boolValue() ? "1" : "0";
     case Number::Type::signedInteger:
-      return decimal(number.integerValue());
+      return text::decimal(number.integerValue());
     case Number::Type::unsignedInteger:
-      return decimal(number.bits());
+      return text::decimal(number.bits());
     case Number::Type::real32:
-      return decimal(number.floatValue());
+      return text::decimal(number.floatValue());
     case Number::Type::real64:
-      return decimal(number.doubleValue());
+      return text::decimal(number.doubleValue());
   }
   return {};
 }
 
-std::string hex(std::string_view bytes) {
-  constexpr std::string_view digits = "0123456789abcdef";
-  std::string text = "<";
-  for (const char c : bytes) {
-    const auto byte = static_cast<unsigned char>(c);
-    text += {digits[byte >> 4], digits[byte & 15]};
-  }
-  return text + ">";
-}
+std::string hex(std::string_view bytes) { return "<" + text::hexadecimal(bytes) + ">"; }
 
 /// Whether the old style writes a text without quotes.
 bool isBare(std::string_view text) {
@@ -73,7 +66,7 @@ std::string describeScalar(const Value& value) {
     case Value::Kind::null:
       return "<null>";
     case Value::Kind::uid:
-      return "<uid " + decimal(static_cast<const Uid&>(value).number()) + ">";
+      return "<uid " + text::decimal(static_cast<const Uid&>(value).number()) + ">";
     default:
       return {};
   }
@@ -121,4 +114,4 @@ std::string Value::description() const {
   return std::move(describer.text);
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
-#include "toolkit/property_list/document.hpp"
+#include "qz/property_list/document.hpp"
 
 #include <cassert>
 #include <new>
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 // Blocks grow with the document, so that small files waste no memory and large ones need few
@@ -51,4 +51,4 @@ void* Document::do_allocate(std::size_t bytes, [[maybe_unused]] std::size_t alig
   return place(bytes).memory;
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -3,10 +3,10 @@
 
 #include <bit>
 
+#include "text/utf8.hpp"
 #include "toolkit/property_list/legacy_encodings.hpp"
-#include "toolkit/property_list/utf8.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 enum class Scheme { utf8, utf16, utf32 };
@@ -67,15 +67,15 @@ bool convertUnits(std::string_view bytes, std::size_t size, std::endian order, s
   text.reserve(bytes.size() / size);
   for (std::size_t at = 0; at + size <= bytes.size(); at += size) {
     char32_t unit = unitAt(bytes, at, size, order);
-    if (size == 2 && isHighSurrogate(unit) && at + 4 <= bytes.size()) {
+    if (size == 2 && text::isHighSurrogate(unit) && at + 4 <= bytes.size()) {
       const char32_t next = unitAt(bytes, at + 2, size, order);
-      if (isLowSurrogate(next)) {
-        unit = combineSurrogates(unit, next);
+      if (text::isLowSurrogate(next)) {
+        unit = text::combineSurrogates(unit, next);
         at += 2;
       }
     }
-    if (isSurrogate(unit) || unit > 0x10FFFF) return false;
-    appendUtf8(text, unit);
+    if (text::isSurrogate(unit) || unit > 0x10FFFF) return false;
+    text::appendUtf8(text, unit);
   }
   return true;
 }
@@ -125,4 +125,4 @@ DecodedText decodeText(std::string_view file) {
   return decoded;
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

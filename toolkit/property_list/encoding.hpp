@@ -6,9 +6,9 @@
 #include <string>
 #include <string_view>
 
-#include "toolkit/property_list/refusal.hpp"
+#include "qz/property_list/refusal.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 
 /// A file's text as UTF-8. UTF-8 files are not copied or checked: readers check the parts they use.
 struct DecodedText {
@@ -24,4 +24,4 @@ struct DecodedText {
 /// Decodes a whole file. `file` must outlive the result.
 DecodedText decodeText(std::string_view file);
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

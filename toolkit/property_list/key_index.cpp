@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "toolkit/property_list/key_index.hpp"
+#include "qz/property_list/key_index.hpp"
 
 #include <bit>
 #include <cmath>
@@ -7,9 +7,9 @@
 #include <random>
 #include <stdexcept>
 
-#include "toolkit/property_list/scalars.hpp"
+#include "qz/property_list/scalars.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 /// SipHash-1-3: fast for short keys, and an attacker without the key cannot make keys collide.
@@ -170,4 +170,4 @@ void KeyIndex::append(std::uint64_t hash) {
   slots_[at] = {static_cast<Position>(used_++), tagOf(hash)};
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -6,9 +6,9 @@
 #include <cstdint>
 #include <span>
 
-#include "toolkit/property_list/utf8.hpp"
+#include "text/utf8.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 struct SingleByteEncoding {
@@ -62,7 +62,7 @@ std::size_t decodeWith(std::string_view bytes, std::string& text, Decode decode)
     const unsigned first = rest.take();
     const char32_t codePoint = first < 0x80 ? first : decode(first, rest);
     if (codePoint == none) return start;
-    appendUtf8(text, codePoint);
+    text::appendUtf8(text, codePoint);
   }
   return bytes.size();
 }
@@ -209,4 +209,4 @@ LegacyDecoder legacyDecoder(std::string_view name) {
   return singleByteEncoding(name) ? decodeSingleByte : nullptr;
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

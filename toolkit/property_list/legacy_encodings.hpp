@@ -6,7 +6,7 @@
 #include <string>
 #include <string_view>
 
-namespace toolkit {
+namespace qz::toolkit {
 
 /// Converts `bytes` from an encoding to UTF-8 and appends the text. Returns the number of bytes
 /// converted; it is less than all if a byte sequence is invalid.
@@ -20,4 +20,4 @@ bool isUtf8Name(std::string_view name);
 /// unknown. Pass the same name to the decoder.
 LegacyDecoder legacyDecoder(std::string_view name);
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

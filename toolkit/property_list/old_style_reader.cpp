@@ -2,14 +2,14 @@
 // Reads old-style property lists, and strings files, which are dictionaries without braces.
 #include <string>
 
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/format_readers.hpp"
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/format_readers.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "text/utf8.hpp"
 #include "toolkit/property_list/old_style_tokens.hpp"
 #include "toolkit/property_list/pending_values.hpp"
-#include "toolkit/property_list/scalars.hpp"
-#include "toolkit/property_list/utf8.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 class OldStyleReader {
@@ -112,9 +112,9 @@ Value* OldStyleReader::entries(std::size_t depth) {
 }  // namespace
 
 Value* readOldStyle(std::string_view text, Document& document, ValueOffsets* offsets) {
-  const std::size_t valid = validUtf8Length(text);
+  const std::size_t valid = text::validUtf8Length(text);
   if (valid != text.size()) throw RefusedAt{valid, "the text is not valid UTF-8"};
   return OldStyleReader(text, document, offsets).root();
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

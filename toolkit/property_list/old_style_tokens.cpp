@@ -4,10 +4,10 @@
 #include <algorithm>
 #include <array>
 
-#include "toolkit/property_list/hexadecimal.hpp"
-#include "toolkit/property_list/utf8.hpp"
+#include "text/hexadecimal.hpp"
+#include "text/utf8.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 // The upper half of the NeXTSTEP character set, which octal escapes use. Its last two places are
@@ -86,7 +86,7 @@ void OldStyleTokens::refuseUnexpected(std::string_view expected) const {
   std::string found = "the end of the file";
   if (at_ < text_.size()) {
     std::size_t end = at_;
-    nextCodePoint(text_, end);
+    text::nextCodePoint(text_, end);
     found = "'" + std::string(text_.substr(at_, end - at_)) + "'";
   }
   refuse("expected " + std::string(expected) + ", found " + found);
@@ -110,7 +110,7 @@ std::string_view OldStyleTokens::quotedString() {
   const std::size_t opening = at_;
   const std::array<char, 2> stops = {text_[at_++], '\\'};
   buffer_.clear();
-  Utf16Appender appender(buffer_);
+  text::Utf16Appender appender(buffer_);
   while (true) {
     const std::size_t stop = text_.find_first_of({stops.data(), stops.size()}, at_);
     if (stop == std::string_view::npos) {
@@ -131,7 +131,7 @@ std::string_view OldStyleTokens::quotedString() {
 unsigned OldStyleTokens::digits(unsigned base, std::size_t most) {
   unsigned number = 0;
   for (std::size_t count = 0; count < most && at_ < text_.size(); ++count, ++at_) {
-    const int digit = hexadecimalDigit(text_[at_]);
+    const int digit = text::hexadecimalDigit(text_[at_]);
     if (digit < 0 || static_cast<unsigned>(digit) >= base) break;
     number = number * base + static_cast<unsigned>(digit);
   }
@@ -173,10 +173,10 @@ std::string_view OldStyleTokens::data() {
   while (true) {
     while (at_ < text_.size() && spaces.find(text_[at_]) != std::string_view::npos) ++at_;
     if (peek() == '>') break;
-    const int high = hexadecimalDigit(peek());
+    const int high = text::hexadecimalDigit(peek());
     if (high < 0) refuseUnexpected("two hexadecimal digits or '>'");
     ++at_;
-    const int low = hexadecimalDigit(peek());
+    const int low = text::hexadecimalDigit(peek());
     if (low < 0) refuseUnexpected("the second hexadecimal digit of a byte");
     ++at_;
     buffer_ += static_cast<char>(high * 16 + low);
@@ -185,4 +185,4 @@ std::string_view OldStyleTokens::data() {
   return buffer_;
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

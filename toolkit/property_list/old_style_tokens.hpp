@@ -8,9 +8,9 @@
 #include <string_view>
 #include <utility>
 
-#include "toolkit/property_list/refusal.hpp"
+#include "qz/property_list/refusal.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 
 /// Whether a string without quotes may hold this character.
 bool isBareCharacter(char c);
@@ -54,4 +54,4 @@ class OldStyleTokens {
   std::string buffer_;  // for strings that need decoding, and for data
 };
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

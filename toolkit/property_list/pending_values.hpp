@@ -7,11 +7,11 @@
 #include <span>
 #include <vector>
 
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/document.hpp"
-#include "toolkit/property_list/key_index.hpp"
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/document.hpp"
+#include "qz/property_list/key_index.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 
 /// A stack: values are added to the collection that was opened last, which is also closed first.
 class PendingValues {
@@ -60,4 +60,4 @@ class PendingValues {
   std::vector<std::uint64_t> hashes_;  // of their keys, except the first few of each dictionary
 };
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

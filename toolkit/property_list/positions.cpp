@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-#include "toolkit/property_list/positions.hpp"
+#include "qz/property_list/positions.hpp"
 
 #include <algorithm>
 
-namespace toolkit {
+namespace qz::toolkit {
 
 std::string description(const Position& position) {
   if (const auto* byte = std::get_if<BytePosition>(&position)) {
@@ -42,4 +42,4 @@ std::optional<Position> PositionTable::of(const Value& value) const {
   return found->second;
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

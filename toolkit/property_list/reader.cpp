@@ -1,16 +1,16 @@
 // SPDX-License-Identifier: MIT
-#include "toolkit/property_list/reader.hpp"
+#include "qz/property_list/reader.hpp"
 
 #include <algorithm>
 #include <utility>
 
+#include "qz/property_list/format_readers.hpp"
+#include "qz/property_list/refusal.hpp"
+#include "text/hexadecimal.hpp"
 #include "toolkit/property_list/binary_layout.hpp"
 #include "toolkit/property_list/encoding.hpp"
-#include "toolkit/property_list/format_readers.hpp"
-#include "toolkit/property_list/hexadecimal.hpp"
-#include "toolkit/property_list/refusal.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 using FormatReader = Value* (*)(std::string_view, Document&, ValueOffsets*);
@@ -42,7 +42,7 @@ bool looksLikeXml(std::string_view text) {
   const std::string_view tag = text.substr(start + 1);
   return !tag.empty() && tag.front() != '>' && tag.front() != '*' && tag.front() != '[' &&
          !std::all_of(tag.begin(), std::find(tag.begin(), tag.end(), '>'),
-                      [](char c) { return c == ' ' || hexadecimalDigit(c) >= 0; });
+                      [](char c) { return c == ' ' || text::hexadecimalDigit(c) >= 0; });
 }
 
 ReadResult refused(Format format, Position position, std::string reason) {
@@ -109,4 +109,4 @@ ValueRef<Dictionary> dictionaryFromPropertyList(std::string_view bytes) {
   return root ? root->copy(Mutability::changeable) : nullptr;
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

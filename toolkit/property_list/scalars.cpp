@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: MIT
-#include "toolkit/property_list/scalars.hpp"
+#include "qz/property_list/scalars.hpp"
 
 #include <cstring>
 
-#include "toolkit/property_list/number_conversion.hpp"
+#include "text/number_conversion.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 void copyBehind(void* object, std::size_t size, std::string_view bytes) {
@@ -28,12 +28,12 @@ String* String::make(Document& document, std::string_view text) {
   return makeIn<String>(document, text.size(), text);
 }
 
-std::int32_t String::intValue() const { return intValueOf(text()); }
-std::int64_t String::integerValue() const { return integerValueOf(text()); }
+std::int32_t String::intValue() const { return text::intValueOf(text()); }
+std::int64_t String::integerValue() const { return text::integerValueOf(text()); }
 std::int64_t String::longValue() const { return integerValue(); }
 float String::floatValue() const { return static_cast<float>(doubleValue()); }
-double String::doubleValue() const { return doubleValueOf(text()); }
-bool String::boolValue() const { return boolValueOf(text()); }
+double String::doubleValue() const { return text::doubleValueOf(text()); }
+bool String::boolValue() const { return text::boolValueOf(text()); }
 
 Number& Number::nothing() { return nothingAs<Number>(); }
 
@@ -82,11 +82,11 @@ std::uint64_t Number::bits() const {
 }
 
 std::int32_t Number::intValue() const {
-  return isReal() ? truncatedToInt(real()) : static_cast<std::int32_t>(bits_);
+  return isReal() ? text::truncatedToInt(real()) : static_cast<std::int32_t>(bits_);
 }
 
 std::int64_t Number::integerValue() const {
-  return isReal() ? truncatedToInteger(real()) : static_cast<std::int64_t>(bits_);
+  return isReal() ? text::truncatedToInteger(real()) : static_cast<std::int64_t>(bits_);
 }
 
 std::int64_t Number::longValue() const { return integerValue(); }
@@ -148,4 +148,4 @@ ValueRef<Number> asNumber(const ValueRef<>& value) {
   return asKind<Number>(value, Value::Kind::number);
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-#include "toolkit/property_list/value.hpp"
+#include "qz/property_list/value.hpp"
 
-#include "toolkit/exception.hpp"
+#include "qz/toolkit/exception.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 
 Value& Value::nothing() { return nothingAs<Value>(); }
 
@@ -80,4 +80,4 @@ void Value::requireUnderstanding(std::string_view selector) const {
   if (kind_ != Kind::nothing) raiseUnrecognizedSelector(className(), selector);
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -4,7 +4,7 @@
 #include <limits>
 #include <unordered_map>
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 std::size_t saturatedSum(std::size_t a, std::size_t b) {
@@ -46,4 +46,4 @@ std::size_t visitsInWalk(const Value& root) {
   return visits;
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

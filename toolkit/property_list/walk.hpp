@@ -6,9 +6,9 @@
 #include <cstddef>
 #include <vector>
 
-#include "toolkit/property_list/collections.hpp"
+#include "qz/property_list/collections.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 
 inline bool isCollection(const Value& value) {
   return value.kind() == Value::Kind::array || value.kind() == Value::Kind::dictionary ||
@@ -72,4 +72,4 @@ void walk(const Value& root, Visitor& visitor) {
 /// distinct values. No collection in `root` may contain itself.
 std::size_t visitsInWalk(const Value& root);
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -5,17 +5,17 @@
 #include <limits>
 #include <string>
 
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/format_readers.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "text/hexadecimal.hpp"
+#include "text/number_conversion.hpp"
 #include "toolkit/property_list/base64.hpp"
 #include "toolkit/property_list/calendar.hpp"
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/format_readers.hpp"
-#include "toolkit/property_list/hexadecimal.hpp"
-#include "toolkit/property_list/number_conversion.hpp"
 #include "toolkit/property_list/pending_values.hpp"
-#include "toolkit/property_list/scalars.hpp"
 #include "toolkit/property_list/xml_tokens.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 class XmlReader {
@@ -200,9 +200,9 @@ Value* XmlReader::onlyValueIn(const XmlTag& plist) {
 }
 
 Value* XmlReader::integer() {
-  std::string_view text = withoutLeadingAsciiSpace(tokens_.rawText());
+  std::string_view text = text::withoutLeadingAsciiSpace(tokens_.rawText());
   const bool negative = text.starts_with('-');
-  if (negative || text.starts_with('+')) text = withoutLeadingAsciiSpace(text.substr(1));
+  if (negative || text.starts_with('+')) text = text::withoutLeadingAsciiSpace(text.substr(1));
   const bool isHexadecimal = text.starts_with("0x") || text.starts_with("0X");
   if (isHexadecimal) text.remove_prefix(2);
   if (text.empty()) refuseAt(text.data(), "an integer without digits");
@@ -211,7 +211,7 @@ Value* XmlReader::integer() {
       negative ? std::uint64_t{1} << 63 : std::numeric_limits<std::uint64_t>::max();
   std::uint64_t magnitude = 0;
   for (const char& c : text) {
-    const int digit = hexadecimalDigit(c);
+    const int digit = text::hexadecimalDigit(c);
     if (digit < 0 || static_cast<unsigned>(digit) >= base) {
       refuseAt(&c, "expected a digit of the integer or </integer>");
     }
@@ -229,12 +229,12 @@ Value* XmlReader::integer() {
 Value* XmlReader::real() {
   const std::size_t start = tokens_.offset();
   const std::string_view text = tokens_.text();
-  const std::string_view decimal = withoutLeadingSpace(text);
+  const std::string_view decimal = text::withoutLeadingSpace(text);
   std::optional<double> number;
-  if (!decimal.empty() && decimalLength(decimal) == decimal.size()) {
-    number = decimalValue(decimal);
+  if (!decimal.empty() && text::decimalLength(decimal) == decimal.size()) {
+    number = text::decimalValue(decimal);
   } else {
-    number = namedReal(text);
+    number = text::namedReal(text);
   }
   if (!number) {
     throw RefusedAt{start, "\"" + std::string(text) + "\" is not a decimal number"};
@@ -263,4 +263,4 @@ Value* readXml(std::string_view text, Document& document, ValueOffsets* offsets)
   return XmlReader(text, document, offsets).root();
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

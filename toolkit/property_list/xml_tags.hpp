@@ -8,9 +8,9 @@
 #include <cstdint>
 #include <string_view>
 
-#include "toolkit/property_list/words.hpp"
+#include "text/words.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 
 enum class XmlElement : std::uint8_t {
   plist,
@@ -46,8 +46,8 @@ struct PlainTag {
   constexpr PlainTag() = default;
   constexpr PlainTag(XmlElement tagElement, bool isSelfClosed)
       : element(tagElement), selfClosed(isSelfClosed) {
-    std::array<char, words::size> characters{};
-    std::array<char, words::size> used{};
+    std::array<char, text::words::size> characters{};
+    std::array<char, text::words::size> used{};
     const auto append = [&](char c) {
       characters[size] = c;
       used[size++] = '\xFF';
@@ -81,4 +81,4 @@ constexpr std::array<PlainTag, xmlTagNames.size()> plainClosingTags = [] {
   return tags;
 }();
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

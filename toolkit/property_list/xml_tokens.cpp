@@ -5,9 +5,9 @@
 #include <array>
 #include <utility>
 
-#include "toolkit/property_list/utf8.hpp"
+#include "text/utf8.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 constexpr int mostReferenceDigits = 8;
@@ -112,12 +112,12 @@ std::string_view XmlTokens::unusualText(const char* start) {
   const bool isPlain = at_ < end_ && *at_ == '<' && !isAt("<!");
   std::string_view text = isPlain ? std::string_view(start, static_cast<std::size_t>(at_ - start))
                                   : resolvedText(start);
-  const std::size_t valid = validUtf8Length(text);
+  const std::size_t valid = text::validUtf8Length(text);
   if (valid != text.size()) {
     if (isPlain) at_ = start + valid;
     refuse("the text is not valid UTF-8");
   }
-  if (text.starts_with(byteOrderMark)) text.remove_prefix(byteOrderMark.size());
+  if (text.starts_with(text::byteOrderMark)) text.remove_prefix(text::byteOrderMark.size());
   return text;
 }
 
@@ -173,10 +173,10 @@ void XmlTokens::appendCharacterReference() {
     codePoint = codePoint * (isHexadecimal ? 16 : 10) + value;
   }
   if (digit == end_) refuse("the character reference is not closed");
-  if (isSurrogate(codePoint) || codePoint > 0x10FFFF) {
+  if (text::isSurrogate(codePoint) || codePoint > 0x10FFFF) {
     refuse("the character reference names no character");
   }
-  appendUtf8(buffer_, codePoint);
+  text::appendUtf8(buffer_, codePoint);
   at_ = digit + 1;
 }
 
@@ -190,4 +190,4 @@ void XmlTokens::appendCdata() {
   at_ += end + closing.size();
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

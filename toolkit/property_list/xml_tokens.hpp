@@ -11,11 +11,11 @@
 #include <string>
 #include <string_view>
 
-#include "toolkit/property_list/refusal.hpp"
-#include "toolkit/property_list/words.hpp"
+#include "qz/property_list/refusal.hpp"
+#include "text/words.hpp"
 #include "toolkit/property_list/xml_tags.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 
 struct XmlTag {
   XmlElement element;
@@ -103,8 +103,8 @@ inline bool XmlTokens::open(XmlTag& tag) {
 }
 
 inline XmlTag XmlTokens::openTag() {
-  if (left() > words::size) {
-    const std::uint64_t word = words::load(at_ + 1);
+  if (left() > text::words::size) {
+    const std::uint64_t word = text::words::load(at_ + 1);
     for (const PlainTag& plain : plainTags) {
       if (!plain.matches(word)) continue;
       const XmlTag tag{plain.element, plain.selfClosed, offset()};
@@ -117,8 +117,8 @@ inline XmlTag XmlTokens::openTag() {
 
 inline void XmlTokens::close(XmlElement element) {
   const PlainTag& plain = plainClosingTags[static_cast<std::size_t>(element)];
-  if (left() >= 2 + words::size && at_[0] == '<' && at_[1] == '/' &&
-      plain.matches(words::load(at_ + 2))) {
+  if (left() >= 2 + text::words::size && at_[0] == '<' && at_[1] == '/' &&
+      plain.matches(text::words::load(at_ + 2))) {
     at_ += 2 + plain.size;
   } else {
     closeUnusually(element);
@@ -128,15 +128,16 @@ inline void XmlTokens::close(XmlElement element) {
 /// Moves to the next `<`, `&` or the end. True only if everything skipped is certainly ASCII.
 inline bool XmlTokens::skipPlainText() {
   std::uint64_t seen = 0;
-  while (left() >= words::size) {
-    const std::uint64_t word = words::load(at_);
+  while (left() >= text::words::size) {
+    const std::uint64_t word = text::words::load(at_);
     seen |= word;
-    const std::uint64_t ends = words::bytesThatAre('<', word) | words::bytesThatAre('&', word);
+    const std::uint64_t ends =
+        text::words::bytesThatAre('<', word) | text::words::bytesThatAre('&', word);
     if (ends != 0) {
-      at_ += words::charactersBefore(ends);
-      return (seen & words::highBits) == 0;
+      at_ += text::words::charactersBefore(ends);
+      return (seen & text::words::highBits) == 0;
     }
-    at_ += words::size;
+    at_ += text::words::size;
   }
   while (at_ < end_ && *at_ != '<' && *at_ != '&') ++at_;
   return false;
@@ -151,4 +152,4 @@ inline std::string_view XmlTokens::text() {
   return unusualText(start);
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

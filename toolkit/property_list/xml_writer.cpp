@@ -1,20 +1,20 @@
 // SPDX-License-Identifier: MIT
-#include "toolkit/property_list/xml_writer.hpp"
+#include "qz/property_list/xml_writer.hpp"
 
 #include <cmath>
 #include <string_view>
 #include <vector>
 
-#include "toolkit/exception.hpp"
+#include "qz/property_list/format_readers.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "qz/toolkit/exception.hpp"
+#include "text/decimal.hpp"
+#include "text/utf8.hpp"
 #include "toolkit/property_list/base64.hpp"
 #include "toolkit/property_list/calendar.hpp"
-#include "toolkit/property_list/decimal.hpp"
-#include "toolkit/property_list/format_readers.hpp"
-#include "toolkit/property_list/scalars.hpp"
-#include "toolkit/property_list/utf8.hpp"
 #include "toolkit/property_list/walk.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 constexpr std::string_view header =
@@ -106,19 +106,19 @@ void XmlWriter::character(char32_t c) {
   }
   // A carriage return is legal, but other readers of XML turn it into a line feed.
   if (isControl || c == 0xFFFE || c == 0xFFFF) {
-    text_ += "&#" + decimal(static_cast<std::uint32_t>(c)) + ";";
+    text_ += "&#" + text::decimal(static_cast<std::uint32_t>(c)) + ";";
   } else {
-    appendUtf8(text_, c);
+    text::appendUtf8(text_, c);
   }
 }
 
 void XmlWriter::string(std::string_view name, std::string_view text) {
   text_.append("<").append(name).append(">");
   // Readers drop a byte order mark at the start, so write an extra one.
-  if (text.starts_with(byteOrderMark)) text_ += byteOrderMark;
+  if (text.starts_with(text::byteOrderMark)) text_ += text::byteOrderMark;
   for (std::size_t at = 0; at < text.size();) {
-    const char32_t c = nextCodePoint(text, at);
-    if (isSurrogate(c)) refuse("half of a surrogate pair");
+    const char32_t c = text::nextCodePoint(text, at);
+    if (text::isSurrogate(c)) refuse("half of a surrogate pair");
     character(c);
   }
   text_.append("</").append(name).append(">\n");
@@ -132,7 +132,7 @@ void XmlWriter::number(const Number& number) {
   } else if (std::isnan(number.doubleValue())) {
     element("real", "nan");
   } else {
-    element("real", decimal(number.doubleValue()));
+    element("real", text::decimal(number.doubleValue()));
   }
 }
 
@@ -160,7 +160,7 @@ void XmlWriter::uid(std::uint32_t number) {
   text_.append("\t<key>").append(uidKey).append("</key>\n");
   indent();
   text_ += '\t';
-  element("integer", decimal(number));
+  element("integer", text::decimal(number));
   indent();
   text_ += "</dict>\n";
 }
@@ -222,4 +222,4 @@ std::string writeXmlPropertyList(const ValueRef<>& value) {
   return writer.result();
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -9,7 +9,7 @@
 
 #include "toolkit/qt/strings.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -44,4 +44,4 @@ void announceShownName(QWidget& widget, const QString& name) {
   if (!widget.accessibleName().isEmpty()) widget.setAccessibleName(name);  // also announces it
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

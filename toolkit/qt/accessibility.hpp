@@ -8,7 +8,7 @@
 class QString;
 class QWidget;
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// Sets the tooltip, as plain text, and announces it. The tooltip is also the widget's description
 /// if it has no other. An empty text removes the tooltip.
@@ -20,4 +20,4 @@ std::string shownToolTip(const QWidget& widget);
 /// that the host has set, because that name would now be wrong.
 void announceShownName(QWidget& widget, const QString& name);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

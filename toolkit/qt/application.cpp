@@ -1,16 +1,17 @@
 // SPDX-License-Identifier: MIT
 // Makes windows and controls, and passes sheet calls on to their windows.
 
-#include "toolkit/qt/application.hpp"
+#include "qz/toolkit/qt/application.hpp"
 
 #include <QLabel>
 #include <QPushButton>
 
+#include "toolkit/qt/desk.hpp"
 #include "toolkit/qt/text_look.hpp"
 #include "toolkit/qt/views.hpp"
 #include "toolkit/qt/window.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -24,6 +25,9 @@ Ref<View> placed(QWidget& widget, const Rect& frame, const std::shared_ptr<Desk>
 }
 
 }  // namespace
+
+QtApplication::QtApplication(Log& log) : desk_(std::make_shared<Desk>(log)) {}
+QtApplication::~QtApplication() { desk_->letAllGo(); }
 
 // Ignores `defer` and `backing`: Qt creates the native window at the first showing and chooses its
 // buffering.
@@ -61,4 +65,4 @@ Ref<Window> QtApplication::window(QWidget& widget) { return desk_->windowOf(*wid
 
 Ref<View> QtApplication::view(QWidget& widget) { return desk_->viewOf(widget); }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

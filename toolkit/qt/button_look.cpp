@@ -17,7 +17,7 @@
 #include "toolkit/qt/strings.hpp"
 #include "toolkit/qt/widget_colors.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -198,4 +198,4 @@ void setBezel(QAbstractButton& button, BezelStyle style) {
   changeLook(button, [&](ButtonLook& look) { look.setBezel(style); });
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

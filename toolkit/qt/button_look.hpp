@@ -13,12 +13,12 @@
 #include <optional>
 #include <string_view>
 
-#include "toolkit/styled_text/attributed_string.hpp"
-#include "toolkit/view.hpp"
+#include "qz/styled_text/attributed_string.hpp"
+#include "qz/toolkit/view.hpp"
 
 class QAbstractButton;
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// Shows a plain title in the button's own font and colour. Ampersands show as they are; they make
 /// no mnemonics.
@@ -46,4 +46,4 @@ void setBezel(QAbstractButton& button, BezelStyle style);
 inline constexpr const char* reducedMotionProperty = "qzReducedMotion";
 inline constexpr const char* reducedMotionVariable = "QZ_REDUCED_MOTION";
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

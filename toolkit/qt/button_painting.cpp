@@ -21,7 +21,7 @@
 #include "toolkit/qt/rich_text.hpp"
 #include "toolkit/qt/strings.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -468,4 +468,4 @@ void paintOver(QAbstractButton& button, const ButtonAppearance& appearance) {
   painting.paintFlash();
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -5,12 +5,12 @@
 #include <QFont>
 #include <optional>
 
-#include "toolkit/styled_text/attributed_string.hpp"
-#include "toolkit/view.hpp"
+#include "qz/styled_text/attributed_string.hpp"
+#include "qz/toolkit/view.hpp"
 
 class QAbstractButton;
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// What a button shows that its widget does not support.
 struct ButtonAppearance {
@@ -35,4 +35,4 @@ void paintButton(QAbstractButton& button, const ButtonAppearance& appearance);
 /// Draws over a button that has painted itself: everything but the title and the bezel.
 void paintOver(QAbstractButton& button, const ButtonAppearance& appearance);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

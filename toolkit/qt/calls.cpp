@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: MIT
 // The default handling of exceptions.
 
-#include "toolkit/qt/calls.hpp"
+#include "qz/toolkit/qt/calls.hpp"
 
-#include "toolkit/exception.hpp"
+#include "qz/toolkit/exception.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 Calls::Calls(Log& log)
     : handler_([&log](const std::exception_ptr& thrown) {
@@ -16,4 +16,4 @@ Calls::Calls(Log& log)
         }
       }) {}
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -7,7 +7,7 @@
 #include <QCheckBox>
 #include <QPointer>
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -59,4 +59,4 @@ void setCheckState(QAbstractButton& button, State state) {
   button.setChecked(false);
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -2,11 +2,11 @@
 // The states of Qt's checkable buttons.
 #pragma once
 
-#include "toolkit/view.hpp"
+#include "qz/toolkit/view.hpp"
 
 class QAbstractButton;
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 State checkState(const QAbstractButton& button);
 
@@ -14,4 +14,4 @@ State checkState(const QAbstractButton& button);
 /// button turns off too, though Qt allows that only by a click on another button.
 void setCheckState(QAbstractButton& button, State state);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

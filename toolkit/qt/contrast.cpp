@@ -6,7 +6,7 @@
 #include <algorithm>
 #include <cmath>
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -40,4 +40,4 @@ QColor halfway(const QColor& a, const QColor& b) {
                           (a.blueF() + b.blueF()) / 2, a.alphaF());
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -4,7 +4,7 @@
 
 #include <QColor>
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// The contrast that WCAG level AA requires for normal text.
 inline constexpr double readableContrast = 4.5;
@@ -20,4 +20,4 @@ QColor readableOn(const QColor& ground, const QColor& preferred);
 /// Returns the colour halfway between two: disabled text becomes fainter but stays visible.
 QColor halfway(const QColor& a, const QColor& b);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -6,7 +6,7 @@
 #include <algorithm>
 #include <cmath>
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -34,4 +34,4 @@ Rect exactly(const QRect& rect) {
           static_cast<double>(rect.width()), static_cast<double>(rect.height())};
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -4,9 +4,9 @@
 
 #include <QRect>
 
-#include "toolkit/geometry.hpp"
+#include "qz/toolkit/geometry.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// Flips y for `rect` in an area of that height; works in both directions. The only place that
 /// does.
@@ -16,4 +16,4 @@ Rect flipped(const Rect& rect, double areaHeight);
 QRect rounded(const Rect& rect);
 Rect exactly(const QRect& rect);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -10,7 +10,7 @@
 #include <QWidget>
 #include <typeinfo>
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// Returns the widget's decoration of exactly class D; null if there is none.
 template <class D>
@@ -29,4 +29,4 @@ D& decorated(W& widget) {
   return *new D(widget);  // owned by the widget
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

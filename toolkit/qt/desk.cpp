@@ -10,7 +10,7 @@
 #include "toolkit/qt/views.hpp"
 #include "toolkit/qt/window.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 Ref<View> Desk::viewOf(QWidget& widget) {
   const auto found = views_.find(&widget);
@@ -69,4 +69,4 @@ void Desk::letGo(const QtWindow& window) {
 
 void Desk::letAllGo() { const auto last = std::exchange(kept_, {}); }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -9,11 +9,11 @@
 #include <unordered_map>
 #include <vector>
 
-#include "toolkit/qt/calls.hpp"
-#include "toolkit/view.hpp"
-#include "toolkit/window.hpp"
+#include "qz/toolkit/qt/calls.hpp"
+#include "qz/toolkit/view.hpp"
+#include "qz/toolkit/window.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 class QtWindow;
 class WidgetNode;
@@ -55,4 +55,4 @@ class Desk : public std::enable_shared_from_this<Desk> {
   std::vector<std::shared_ptr<QtWindow>> kept_;
 };
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -11,7 +11,7 @@
 #include "toolkit/qt/fonts.hpp"
 #include "toolkit/qt/rich_text_parts.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -62,4 +62,4 @@ void EditDress::takeOff(QPlainTextEdit& edit) {
   if (const auto alignment = std::exchange(alignment_, {})) align(edit, *alignment);
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

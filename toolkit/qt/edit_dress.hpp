@@ -11,7 +11,7 @@
 class QLineEdit;
 class QPlainTextEdit;
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// Gives an edit the attributes that its whole text shares: font, colour and alignment for a line
 /// edit, alignment for a plain text edit. `takeOff` restores the edit's own.
@@ -28,4 +28,4 @@ class EditDress {
   std::optional<Qt::Alignment> alignment_;
 };
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -5,7 +5,7 @@
 
 #include <QWidget>
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -31,4 +31,4 @@ void giveFocusAway(QWidget& widget) {
   focused->clearFocus();
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

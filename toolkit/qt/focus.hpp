@@ -4,11 +4,11 @@
 
 class QWidget;
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// Moves the keyboard focus away from `widget` and its descendants, which are about to be hidden or
 /// disabled, to the next widget in the window's tab order that accepts it. If there is none, clears
 /// the focus.
 void giveFocusAway(QWidget& widget);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

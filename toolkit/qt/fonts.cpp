@@ -16,7 +16,7 @@
 
 #include "toolkit/qt/strings.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -134,4 +134,4 @@ QFont qFont(const Font& font) {
   return drawn;
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -8,10 +8,10 @@
 #include <QFont>
 #include <QString>
 
-#include "toolkit/font_names.hpp"
-#include "toolkit/styled_text/fonts.hpp"
+#include "qz/styled_text/fonts.hpp"
+#include "toolkit/backend/font_names.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 class QtFonts final : public Fonts {
  public:
@@ -27,4 +27,4 @@ QFont qFont(const Font& font);
 QString drawnFamily(const Font& font);
 int pixelSize(const Font& font);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

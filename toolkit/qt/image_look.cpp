@@ -13,7 +13,7 @@
 #include "toolkit/qt/label_page.hpp"
 #include "toolkit/qt/strings.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -142,4 +142,4 @@ Ref<Image> layerContents(const QWidget& widget) {
   return layer ? layer->contents() : Ref<Image>();
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

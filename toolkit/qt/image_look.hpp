@@ -2,12 +2,12 @@
 // Images in labels, and behind the subviews of a view.
 #pragma once
 
-#include "toolkit/image.hpp"
+#include "qz/toolkit/image.hpp"
 
 class QLabel;
 class QWidget;
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// Shows `image` in the middle of the label, shrunk in proportion if it does not fit, never
 /// enlarged. An absent image shows nothing.
@@ -24,4 +24,4 @@ bool isLayered(const QWidget& widget);
 void showLayerContents(QWidget& widget, const Ref<Image>& image);
 Ref<Image> layerContents(const QWidget& widget);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

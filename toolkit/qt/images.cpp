@@ -9,10 +9,10 @@
 #include <QPainter>
 #include <filesystem>
 
-#include "toolkit/image_names.hpp"
+#include "toolkit/backend/image_names.hpp"
 #include "toolkit/qt/strings.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -82,4 +82,4 @@ void drawImage(QPainter& painter, const QRect& place, const QtImage& image) {
   painter.drawImage(place.topLeft(), scaled);
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -10,13 +10,13 @@
 #include <string>
 #include <string_view>
 
-#include "toolkit/files.hpp"
-#include "toolkit/image.hpp"
+#include "qz/toolkit/files.hpp"
+#include "qz/toolkit/image.hpp"
 
 class QPainter;
 class QRect;
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 class QtImage final : public Image {
  public:
@@ -60,4 +60,4 @@ class QtImages final : public Images {
 /// Draws all of `image` into `place`, and paints each device pixel once.
 void drawImage(QPainter& painter, const QRect& place, const QtImage& image);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

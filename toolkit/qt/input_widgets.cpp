@@ -20,7 +20,7 @@
 #include <QTextEdit>
 #include <QToolBox>
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -39,4 +39,4 @@ bool takesInput(const QWidget& widget) {
                  QSplitterHandle, QTabBar, QTabWidget, QTextEdit, QToolBox>(widget);
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -4,10 +4,10 @@
 
 class QWidget;
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// True if the user can act on the widget itself when it is enabled: buttons, fields, lists,
 /// sliders and the like; a checkable group box; any widget of the host that takes the focus.
 bool takesInput(const QWidget& widget);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

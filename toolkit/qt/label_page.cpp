@@ -11,7 +11,7 @@
 #include <algorithm>
 #include <typeinfo>
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -93,4 +93,4 @@ void LabelPage::draw(QLabel& label) {
 
 void drawFrame(QLabel& label, QPainter& painter) { (label.*&FrameDrawer::drawFrame)(&painter); }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

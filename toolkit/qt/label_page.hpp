@@ -11,7 +11,7 @@
 
 #include "toolkit/qt/rich_text.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 class LabelPage {
  public:
@@ -37,4 +37,4 @@ class LabelPage {
 /// Draws the frame around a label. Call it in the label's paint event.
 void drawFrame(QLabel& label, QPainter& painter);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

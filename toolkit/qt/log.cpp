@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: MIT
 // Writes log lines as Qt messages.
 
-#include "toolkit/qt/log.hpp"
+#include "qz/toolkit/qt/log.hpp"
 
 #include <QLoggingCategory>
 
 #include "toolkit/qt/strings.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 void QtLog::write(std::string_view line) {
   static const QLoggingCategory category("qz.walkthrough");
@@ -18,4 +18,4 @@ void QtLog::write(std::string_view line) {
     qCInfo(category).noquote() << qString(line);
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -4,7 +4,7 @@
 
 #include <QString>
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// Returns `text` escaped so that its ampersands show as they are.
 inline QString withoutMeaning(QString text) { return text.replace('&', "&&"); }
@@ -19,4 +19,4 @@ inline QString withoutMnemonic(const QString& text) {
   return shown;
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

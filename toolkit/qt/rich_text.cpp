@@ -15,7 +15,7 @@
 #include "toolkit/qt/rich_text_parts.hpp"
 #include "toolkit/qt/strings.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -129,4 +129,4 @@ QFont largestFont(const AttributedString& text, const QFont& otherwise) {
   return largest ? qFont(*largest) : otherwise;
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

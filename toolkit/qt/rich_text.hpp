@@ -8,9 +8,9 @@
 #include <QTextDocument>
 #include <optional>
 
-#include "toolkit/styled_text/attributed_string.hpp"
+#include "qz/styled_text/attributed_string.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// The settings that an attributed string leaves to the widget that draws it.
 struct TextSetting {
@@ -56,4 +56,4 @@ TextAttributes commonAttributes(const AttributedString& text);
 /// none.
 QFont largestFont(const AttributedString& text, const QFont& otherwise);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -14,7 +14,7 @@
 #include "toolkit/qt/rich_text_parts.hpp"
 #include "toolkit/qt/strings.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -219,4 +219,4 @@ QString htmlOf(const AttributedString& text, const TextSetting& setting) {
   return html;
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

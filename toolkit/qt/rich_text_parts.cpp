@@ -6,7 +6,7 @@
 #include "toolkit/qt/contrast.hpp"
 #include "toolkit/qt/strings.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -90,4 +90,4 @@ std::optional<QColor> inkOf(const TextAttributes& attributes, const TextSetting&
   return setting.greyed ? halfway(setting.link, setting.ground) : setting.link;
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -9,7 +9,7 @@
 
 #include "toolkit/qt/rich_text.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// Text of one style.
 struct Piece {
@@ -52,4 +52,4 @@ QColor inkOf(const Color& color, const TextSetting& setting);
 /// Returns the colour in which text is drawn; absent if the viewer chooses.
 std::optional<QColor> inkOf(const TextAttributes& attributes, const TextSetting& setting);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

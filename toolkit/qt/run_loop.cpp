@@ -8,7 +8,7 @@
 #include <cmath>
 #include <utility>
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -63,4 +63,4 @@ void QtRunLoop::setAlarm(double leastWait) {
   alarm_.start(std::chrono::milliseconds(std::llround(std::ceil(wait * 1000))));
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -8,12 +8,12 @@
 
 #include <QTimer>
 
-#include "toolkit/qt/calls.hpp"
-#include "toolkit/qt/clock.hpp"
+#include "qz/toolkit/qt/calls.hpp"
+#include "qz/toolkit/qt/clock.hpp"
+#include "toolkit/backend/timed_run_loop.hpp"
 #include "toolkit/qt/user_tracking.hpp"
-#include "toolkit/timed_run_loop.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 class QtRunLoop final : public TimedRunLoop {
  public:
@@ -43,4 +43,4 @@ class QtRunLoop final : public TimedRunLoop {
   bool waited_ = false;  // for the user, since the last firing
 };
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

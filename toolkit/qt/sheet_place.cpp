@@ -6,7 +6,7 @@
 
 #include <QEvent>
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 SheetPlace::SheetPlace(QWidget& sheet, QWidget& parent)
     : sheet_(&sheet),
@@ -45,4 +45,4 @@ bool SheetPlace::eventFilter(QObject* watched, QEvent* event) {
   return false;
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -6,7 +6,7 @@
 #include <QWidget>
 #include <QWindow>
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// While it lives, `sheet` blocks `parent` and stays at the middle of its top edge when the user
 /// moves `parent`. `sheet` must be hidden when this begins. The destructor restores the sheet's
@@ -29,4 +29,4 @@ class SheetPlace final : public QObject {
   QPoint position_;
 };
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -7,9 +7,9 @@
 #include <string>
 #include <string_view>
 
-#include "toolkit/styled_text/color.hpp"
+#include "qz/styled_text/color.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 inline QString qString(std::string_view utf8) {
   return QString::fromUtf8(utf8.data(), static_cast<qsizetype>(utf8.size()));
@@ -28,4 +28,4 @@ inline Color toolkitColor(const QColor& color) {
           static_cast<double>(rgb.blueF()), static_cast<double>(rgb.alphaF())};
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -19,7 +19,7 @@
 #include "toolkit/qt/rich_text.hpp"
 #include "toolkit/qt/strings.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -237,4 +237,4 @@ void layOutAsTextField(QLabel& label) {
   label.setAlignment(Qt::AlignTop | Qt::AlignLeading);
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -4,12 +4,12 @@
 
 #include <string_view>
 
-#include "toolkit/styled_text/attributed_string.hpp"
+#include "qz/styled_text/attributed_string.hpp"
 
 class QLabel;
 class QWidget;
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// True if `widget` can show text: a label, a line edit, a text edit or a plain text edit.
 bool showsText(const QWidget& widget);
@@ -28,4 +28,4 @@ AttributedString shownText(const QWidget& widget);
 /// Makes a new label lay out its text like an AppKit text field: from the top, in several lines.
 void layOutAsTextField(QLabel& label);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -12,7 +12,7 @@
 
 #include "toolkit/qt/input_widgets.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -97,4 +97,4 @@ void UserTracking::letGo() {
   mayBeOver_();
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

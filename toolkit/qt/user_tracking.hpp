@@ -13,7 +13,7 @@
 
 class QMouseEvent;
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 class UserTracking final : public QObject {
  public:
@@ -34,4 +34,4 @@ class UserTracking final : public QObject {
   bool isCountedByQt_ = false;  // the mouse button: its press came from the window system
 };
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -12,7 +12,7 @@
 #include "toolkit/qt/text_look.hpp"
 #include "toolkit/qt/window.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -141,4 +141,4 @@ void QtImageView::setImage(const Ref<Image>& image) {
 
 Ref<Image> QtImageView::image() const { return label() ? shownImage(*label()) : Ref<Image>(); }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

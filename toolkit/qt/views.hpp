@@ -13,12 +13,12 @@
 #include <string>
 #include <string_view>
 
+#include "qz/toolkit/view.hpp"
 #include "toolkit/qt/accessibility.hpp"
 #include "toolkit/qt/image_look.hpp"
 #include "toolkit/qt/widget_node.hpp"
-#include "toolkit/view.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// Makes the view of `widget`: a button for a `QAbstractButton`; an image view for a label that
 /// shows a pixmap or is marked as one; a text field for a label, a line edit, a text edit or a
@@ -182,4 +182,4 @@ class QtImageView final : public QtControl<ImageView> {
   QLabel* label() const { return static_cast<QLabel*>(widget()); }
 };
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -8,7 +8,7 @@
 #include "toolkit/qt/contrast.hpp"
 #include "toolkit/qt/strings.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 WidgetColors::WidgetColors(QWidget& widget, QPalette::ColorRole text, const Color& color)
     : widget_(widget), before_(widget.palette()), hadOwn_(widget.testAttribute(Qt::WA_SetPalette)) {
@@ -23,4 +23,4 @@ WidgetColors::WidgetColors(QWidget& widget, QPalette::ColorRole text, const Colo
 
 void WidgetColors::restore() { widget_.setPalette(hadOwn_ ? before_ : QPalette()); }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -5,11 +5,11 @@
 #include <QColor>
 #include <QPalette>
 
-#include "toolkit/styled_text/color.hpp"
+#include "qz/styled_text/color.hpp"
 
 class QWidget;
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// Makes `widget` draw its text in a colour, half as strong if disabled, until `restore` puts its
 /// former colours back. The destructor does not restore: it may run during the widget's own.
@@ -24,4 +24,4 @@ class WidgetColors {
   bool hadOwn_;
 };
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -9,11 +9,11 @@
 #include <algorithm>
 #include <utility>
 
-#include "toolkit/exception.hpp"
+#include "qz/toolkit/exception.hpp"
 #include "toolkit/qt/coordinates.hpp"
 #include "toolkit/qt/focus.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -206,4 +206,4 @@ Ref<View> WidgetNode::superview() const {
   return desk_->viewOf(*widget_->parentWidget());
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -14,11 +14,11 @@
 #include <string>
 #include <vector>
 
-#include "toolkit/geometry.hpp"
+#include "qz/toolkit/geometry.hpp"
+#include "qz/toolkit/view.hpp"
 #include "toolkit/qt/desk.hpp"
-#include "toolkit/view.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// The dynamic property of a widget that holds its tag, a whole number. Without it the tag is 0.
 inline constexpr const char* tagProperty = "qzTag";
@@ -94,4 +94,4 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   std::unique_ptr<Watch> watch_;
 };
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -16,7 +16,7 @@
 #include "toolkit/qt/views.hpp"
 #include "toolkit/qt/window_look.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 namespace {
 
@@ -212,4 +212,4 @@ void QtWindow::endAsSheet(long returnCode) {
     delegate->sheetDidEnd(shared_from_this(), returnCode, session->contextInfo);
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -11,12 +11,12 @@
 #include <optional>
 #include <vector>
 
-#include "toolkit/application.hpp"
-#include "toolkit/geometry.hpp"
+#include "qz/toolkit/application.hpp"
+#include "qz/toolkit/geometry.hpp"
+#include "qz/toolkit/window.hpp"
 #include "toolkit/qt/desk.hpp"
-#include "toolkit/window.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 class SheetPlace;
 
@@ -102,4 +102,4 @@ class QtWindow final : public Window, public std::enable_shared_from_this<QtWind
   std::vector<long> sheetEnds_;
 };
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

@@ -9,7 +9,7 @@
 #include "toolkit/qt/contrast.hpp"
 #include "toolkit/qt/strings.hpp"
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 void setWindowColor(QWidget& window, const Color& color) {
   QPalette palette = window.palette();
@@ -27,4 +27,4 @@ Color windowColor(const QWidget& window) {
   return toolkitColor(window.palette().color(QPalette::Active, QPalette::Window));
 }
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

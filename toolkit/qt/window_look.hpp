@@ -4,11 +4,11 @@
 
 #include <optional>
 
-#include "toolkit/styled_text/color.hpp"
+#include "qz/styled_text/color.hpp"
 
 class QWidget;
 
-namespace toolkit::qt {
+namespace qz::toolkit::qt {
 
 /// Gives the window a background colour. Widgets in it without colours of their own (labels, check
 /// boxes, links) get a text colour that is readable there: contrast at least 4.5 : 1, WCAG level
@@ -17,4 +17,4 @@ void setWindowColor(QWidget& window, const Color& color);
 /// Returns the visible background colour.
 Color windowColor(const QWidget& window);
 
-}  // namespace toolkit::qt
+}  // namespace qz::toolkit::qt

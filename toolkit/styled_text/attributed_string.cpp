@@ -1,14 +1,14 @@
 // SPDX-License-Identifier: MIT
 // Every change uses `push`, which keeps the invariants of the runs: it drops empty runs and extends
 // the last run instead of adding an equal neighbour.
-#include "toolkit/styled_text/attributed_string.hpp"
+#include "qz/styled_text/attributed_string.hpp"
 
 #include <algorithm>
 #include <utility>
 
-#include "toolkit/exception.hpp"
+#include "qz/toolkit/exception.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 namespace {
 
 void push(std::vector<TextRun>& runs, TextRange range, const TextAttributes& attributes) {
@@ -97,4 +97,4 @@ void AttributedString::addParagraphStyle(const std::optional<ParagraphStyle>& st
   addAttribute(runs_, &TextAttributes::paragraphStyle, style, range, length());
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

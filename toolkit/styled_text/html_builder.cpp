@@ -11,7 +11,7 @@
 #include "toolkit/styled_text/html_entities.hpp"
 #include "toolkit/styled_text/html_words.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 namespace {
 
 /// Deeper elements replace their parents, as in browsers. This bounds the cost of a tag.
@@ -337,4 +337,4 @@ std::size_t Builder::countOpen(const TagSet& wanted) const {
                     [&wanted](const Element& element) { return wanted.contains(element.tag); }));
 }
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

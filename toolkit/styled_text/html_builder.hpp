@@ -20,7 +20,7 @@
 #include "toolkit/styled_text/html_text_flow.hpp"
 #include "toolkit/styled_text/list_markers.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 
 class Builder {
  public:
@@ -99,4 +99,4 @@ class Builder {
   bool dropsNewLine_ = false;  // directly after <pre>
 };
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

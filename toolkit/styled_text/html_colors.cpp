@@ -8,9 +8,10 @@
 #include <cstdint>
 #include <string>
 
+#include "text/hexadecimal.hpp"
 #include "toolkit/styled_text/html_words.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 namespace {
 
 struct NamedColor {
@@ -72,7 +73,7 @@ static_assert(std::is_sorted(namedColors.begin(), namedColors.end(),
                              }));
 
 std::optional<Color> colorNamed(std::string_view name) {
-  const std::string key = lowered(name);
+  const std::string key = text::lowered(name);
   const NamedColor* const end = namedColors.data() + namedColors.size();
   const NamedColor* const found = std::lower_bound(
       namedColors.data(), end, key,
@@ -82,13 +83,10 @@ std::optional<Color> colorNamed(std::string_view name) {
   return Color{part(16), part(8), part(0)};
 }
 
-bool isHexDigit(char c) { return isDigit(c) || (lowered(c) >= 'a' && lowered(c) <= 'f'); }
-
-double hexDigit(char c) { return isDigit(c) ? c - '0' : lowered(c) - 'a' + 10; }
-
 /// Returns one part of a colour from two hexadecimal digits, or from one that counts twice.
 double hexPart(std::string_view digits) {
-  return (hexDigit(digits.front()) * 16 + hexDigit(digits.back())) / 255;
+  return (16.0 * text::hexadecimalDigit(digits.front()) + text::hexadecimalDigit(digits.back())) /
+         255;
 }
 
 /// Returns the colour of `digits`, which are split evenly into three parts.
@@ -132,7 +130,7 @@ Color legacyColor(std::string_view value) {
   if (value.starts_with('#')) value.remove_prefix(1);
   std::string digits(value.substr(0, 128));
   std::replace_if(
-      digits.begin(), digits.end(), [](char c) { return !isHexDigit(c); }, '0');
+      digits.begin(), digits.end(), [](char c) { return !text::isHexadecimalDigit(c); }, '0');
   while (digits.empty() || digits.size() % 3 != 0) digits += '0';
   const std::size_t length = digits.size() / 3;
   std::size_t from = length > 8 ? length - 8 : 0;
@@ -153,15 +151,15 @@ std::optional<Color> cssColor(std::string_view value) {
   if (value.starts_with('#')) {
     const std::string_view digits = value.substr(1);
     const bool valid = (digits.size() == 3 || digits.size() == 6) &&
-                       std::all_of(digits.begin(), digits.end(), isHexDigit);
+                       std::all_of(digits.begin(), digits.end(), text::isHexadecimalDigit);
     return valid ? std::optional(hexColor(digits)) : std::nullopt;
   }
   if (value.ends_with(')')) {
-    const std::string function = lowered(takeUntil(value, '('));
+    const std::string function = text::lowered(takeUntil(value, '('));
     value.remove_suffix(value.empty() ? 0 : 1);
     return function == "rgb" || function == "rgba" ? functionColor(value) : std::nullopt;
   }
-  if (lowered(value) == "transparent") return Color{0, 0, 0, 0};
+  if (text::lowered(value) == "transparent") return Color{0, 0, 0, 0};
   return colorNamed(value);
 }
 
@@ -171,4 +169,4 @@ std::optional<Color> attributeColor(std::string_view value) {
   return value.empty() ? std::nullopt : std::optional(legacyColor(value));
 }
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

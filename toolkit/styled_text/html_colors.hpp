@@ -5,9 +5,9 @@
 #include <optional>
 #include <string_view>
 
-#include "toolkit/styled_text/color.hpp"
+#include "qz/styled_text/color.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 
 /// Returns the colour of a CSS value: a name, "#rgb", "#rrggbb", "rgb(r, g, b)" or "rgba(r, g, b,
 /// a)" with numbers up to 255 or percentages. "transparent" has alpha 0. Absent if it is not a
@@ -19,4 +19,4 @@ std::optional<Color> cssColor(std::string_view value);
 /// has one. Absent if the value is empty or "transparent".
 std::optional<Color> attributeColor(std::string_view value);
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

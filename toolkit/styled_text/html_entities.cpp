@@ -6,9 +6,10 @@
 #include <array>
 #include <cstdint>
 
+#include "text/utf8.hpp"
 #include "toolkit/styled_text/html_words.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 namespace {
 
 struct Entity {
@@ -90,13 +91,13 @@ std::optional<char32_t> entityNamed(std::string_view name) {
   return found->character;
 }
 
-bool isAlphanumeric(char c) { return isLetter(c) || isDigit(c); }
+bool isAlphanumeric(char c) { return isLetter(c) || text::isDigit(c); }
 
 /// Returns the value of a digit; absent if `c` is not a digit in that base.
 std::optional<unsigned> digitValue(char c, unsigned base) {
-  if (isDigit(c)) return static_cast<unsigned>(c - '0');
-  if (base == 16 && lowered(c) >= 'a' && lowered(c) <= 'f') {
-    return static_cast<unsigned>(lowered(c) - 'a' + 10);
+  if (text::isDigit(c)) return static_cast<unsigned>(c - '0');
+  if (base == 16 && text::lowered(c) >= 'a' && text::lowered(c) <= 'f') {
+    return static_cast<unsigned>(text::lowered(c) - 'a' + 10);
   }
   return std::nullopt;
 }
@@ -108,7 +109,7 @@ char32_t characterNumbered(std::uint32_t number) {
 
 std::optional<Reference> readNumeric(std::string_view bytes) {
   std::size_t at = 2;
-  const bool hexadecimal = bytes.size() > at && lowered(bytes[at]) == 'x';
+  const bool hexadecimal = bytes.size() > at && text::lowered(bytes[at]) == 'x';
   const unsigned base = hexadecimal ? 16 : 10;
   if (hexadecimal) ++at;
   const std::size_t digits = at;
@@ -150,22 +151,6 @@ std::optional<Reference> readNamed(std::string_view bytes, ReferencePlace place)
   return readUnterminated(name, place);
 }
 
-void appendUtf8(std::string& text, char32_t code) {
-  const auto continuation = [code](unsigned shift) {
-    return static_cast<char>(0x80U | ((code >> shift) & 0x3FU));
-  };
-  if (code < 0x80) {
-    text += static_cast<char>(code);
-  } else if (code < 0x800) {
-    text += {static_cast<char>(0xC0U | (code >> 6U)), continuation(0)};
-  } else if (code < 0x10000) {
-    text += {static_cast<char>(0xE0U | (code >> 12U)), continuation(6), continuation(0)};
-  } else {
-    text += {static_cast<char>(0xF0U | (code >> 18U)), continuation(12), continuation(6),
-             continuation(0)};
-  }
-}
-
 bool standsForItself(char c) {
   return c != '&' && c != '\0' && static_cast<unsigned char>(c) < 0x80;
 }
@@ -186,9 +171,9 @@ std::string decoded(std::string_view bytes, ReferencePlace place) {
     if (standsForItself(c)) {
       text += c;
     } else if (c != '&') {
-      if (c != '\0') appendUtf8(text, fromWindows1252(static_cast<unsigned char>(c)));
+      if (c != '\0') text::appendUtf8(text, fromWindows1252(static_cast<unsigned char>(c)));
     } else if (const auto reference = readReference(bytes, place)) {
-      appendUtf8(text, reference->character);
+      text::appendUtf8(text, reference->character);
       length = reference->length;
     } else {
       text += '&';
@@ -202,4 +187,4 @@ bool isPlain(std::string_view bytes) {
   return std::all_of(bytes.begin(), bytes.end(), standsForItself);
 }
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

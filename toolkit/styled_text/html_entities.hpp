@@ -7,7 +7,7 @@
 #include <string>
 #include <string_view>
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 
 /// Where a reference is. In an attribute "&copy=1" is part of an address, not a reference.
 enum class ReferencePlace { text, attribute };
@@ -32,4 +32,4 @@ std::string decoded(std::string_view bytes, ReferencePlace place);
 /// True if `decoded` would return `bytes` unchanged; does not build the text.
 bool isPlain(std::string_view bytes);
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

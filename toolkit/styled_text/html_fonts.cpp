@@ -8,7 +8,7 @@
 
 #include "toolkit/styled_text/html_words.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 namespace {
 
 /// The points of `<font size>` 1 to 7: browsers' 10, 13, 16, 18, 24, 32 and 48 pixels.
@@ -52,7 +52,7 @@ constexpr std::array<Keyword, 10> sizeUnits = {{{"pt", {0, 1}},
 
 template <std::size_t N>
 std::optional<FontSize> sizeNamed(const std::array<Keyword, N>& sizes, std::string_view name) {
-  const std::string key = lowered(name);
+  const std::string key = text::lowered(name);
   const auto found = std::find_if(sizes.begin(), sizes.end(),
                                   [&key](const Keyword& keyword) { return keyword.name == key; });
   return found != sizes.end() ? std::optional(found->size) : std::nullopt;
@@ -67,7 +67,7 @@ std::string_view unquoted(std::string_view face) {
 }
 
 std::string_view faceMeant(std::string_view written) {
-  const std::string key = lowered(written);
+  const std::string key = text::lowered(written);
   for (const auto& [name, face] : genericFamilies) {
     if (name == key) return face;
   }
@@ -119,4 +119,4 @@ std::optional<FontSize> cssFontSize(std::string_view value) {
   return FontSize{*number * unit->scale, *number * unit->points};
 }
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

@@ -6,9 +6,9 @@
 #include <optional>
 #include <string_view>
 
-#include "toolkit/styled_text/fonts.hpp"
+#include "qz/styled_text/fonts.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 
 inline constexpr double pointsPerPixel = 0.75;
 /// The factor of "larger" and `<big>`, and the divisor of "smaller" and `<small>`.
@@ -40,4 +40,4 @@ struct FontSize {
 /// these.
 std::optional<FontSize> cssFontSize(std::string_view value);
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: MIT
 // The HTML reader: passes the tokenizer's tokens to the builder one by one.
-#include "toolkit/styled_text/html_reader.hpp"
+#include "qz/styled_text/html_reader.hpp"
 
 #include "toolkit/styled_text/html_builder.hpp"
 #include "toolkit/styled_text/html_tokenizer.hpp"
 
-namespace toolkit {
+namespace qz::toolkit {
 
 std::optional<AttributedString> attributedStringFromHTML(std::string_view bytes,
                                                          const Fonts& fonts) {
@@ -28,4 +28,4 @@ std::optional<AttributedString> attributedStringFromHTML(std::string_view bytes,
   return builder.finish();
 }
 
-}  // namespace toolkit
+}  // namespace qz::toolkit

@@ -10,7 +10,7 @@
 #include "toolkit/styled_text/html_words.hpp"
 #include "toolkit/styled_text/inline_css.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 namespace {
 
 /// Elements whose `align` aligns their text; that of a caption, for example, places the caption.
@@ -155,4 +155,4 @@ TextAttributes textAttributes(const Style& style, bool hanging) {
   return attributes;
 }
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

@@ -5,11 +5,11 @@
 #include <optional>
 #include <string_view>
 
-#include "toolkit/styled_text/attributed_string.hpp"
+#include "qz/styled_text/attributed_string.hpp"
 #include "toolkit/styled_text/html_fonts.hpp"
 #include "toolkit/styled_text/html_tags.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 
 /// The indent of a list, a quoted block and the like, in points.
 inline constexpr double indentStep = 36;
@@ -69,4 +69,4 @@ Style styleWithin(const Style& parent, const Declarations& own);
 /// indent further left than the others.
 TextAttributes textAttributes(const Style& style, bool hanging);
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

@@ -7,7 +7,7 @@
 #include "toolkit/styled_text/html_entities.hpp"
 #include "toolkit/styled_text/html_words.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 namespace {
 
 template <std::size_t N>
@@ -37,8 +37,9 @@ constexpr std::uint64_t packed(std::string_view name) {
   if (name.size() > longestTag) return 0;
   std::uint64_t number = 0;
   for (const char c : name) {
-    if (!isLetter(c) && !isDigit(c)) return 0;
-    number = number << 6 | static_cast<unsigned>(isDigit(c) ? c - '0' + 1 : lowered(c) - 'a' + 11);
+    if (!isLetter(c) && !text::isDigit(c)) return 0;
+    number = number << 6 |
+             static_cast<unsigned>(text::isDigit(c) ? c - '0' + 1 : text::lowered(c) - 'a' + 11);
   }
   return number << 6 * (longestTag - name.size());
 }
@@ -87,4 +88,4 @@ std::optional<std::string> Attributes::operator[](Attribute attribute) const {
   return decoded(values_[index], ReferencePlace::attribute);
 }
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

@@ -13,7 +13,7 @@
 #include <string>
 #include <string_view>
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 
 /// In alphabetical order, like the table of names.
 // clang-format off
@@ -102,4 +102,4 @@ class Attributes {
   std::bitset<count> present_;  // which of `values_` are set
 };
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

@@ -4,7 +4,7 @@
 
 #include "toolkit/styled_text/html_words.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 
 void TextFlow::addText(std::string_view text, const Style& style) {
   append(style.preformatted ? withPlainLineEnds(text) : collapsed(text), style);
@@ -84,4 +84,4 @@ void TextFlow::append(std::string_view text, const Style& style) {
   }
 }
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

@@ -10,10 +10,10 @@
 #include <string_view>
 #include <utility>
 
-#include "toolkit/styled_text/attributed_string.hpp"
+#include "qz/styled_text/attributed_string.hpp"
 #include "toolkit/styled_text/html_style.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 
 /// Each operation takes the style of the text that it writes.
 class TextFlow {
@@ -62,4 +62,4 @@ class TextFlow {
   std::string scratch_;                      // kept to reuse its memory
 };
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

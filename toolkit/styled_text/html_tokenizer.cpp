@@ -6,7 +6,7 @@
 
 #include "toolkit/styled_text/html_words.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 namespace {
 
 /// Elements whose content is neither markup nor visible text.
@@ -130,4 +130,4 @@ void Tokenizer::skipContent(Tag element) {
   rest_ = {};
 }
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

@@ -12,7 +12,7 @@
 
 #include "toolkit/styled_text/html_tags.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 
 struct Token {
   enum class Kind : std::uint8_t { text, startTag, endTag };
@@ -48,4 +48,4 @@ class Tokenizer {
   std::string_view rest_;  // not yet read
 };
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

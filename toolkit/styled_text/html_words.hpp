@@ -9,24 +9,16 @@
 #include <string>
 #include <string_view>
 
-#include "toolkit/ascii.hpp"
+#include "text/ascii.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 
 /// True for HTML's white space.
 constexpr bool isSpace(char c) {
   return c == ' ' || c == '\t' || c == '\n' || c == '\r' || c == '\f';
 }
 
-using toolkit::lowered;
-
-constexpr bool isLetter(char c) { return lowered(c) >= 'a' && lowered(c) <= 'z'; }
-
-inline std::string lowered(std::string_view text) {
-  std::string result(text);
-  for (char& c : result) c = lowered(c);
-  return result;
-}
+using text::isLetter;
 
 constexpr std::string_view trimmed(std::string_view text) {
   while (!text.empty() && isSpace(text.front())) text.remove_prefix(1);
@@ -57,7 +49,8 @@ inline std::optional<double> takeNumber(std::string_view& text) {
   const bool negative = text.starts_with('-');
   const std::string_view digits = negative || text.starts_with('+') ? text.substr(1) : text;
   // Without this check from_chars would accept a second sign, "inf" and "nan".
-  if (digits.empty() || (!isDigit(digits.front()) && digits.front() != '.')) return std::nullopt;
+  if (digits.empty() || (!text::isDigit(digits.front()) && digits.front() != '.'))
+    return std::nullopt;
   double number = 0;
   const auto [end, error] = std::from_chars(digits.data(), digits.data() + digits.size(), number,
                                             std::chars_format::fixed);
@@ -76,4 +69,4 @@ inline std::optional<std::int32_t> leadingInteger(std::string_view text) {
   return error == std::errc() ? std::optional(number) : std::nullopt;
 }
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

@@ -8,7 +8,7 @@
 #include "toolkit/styled_text/html_colors.hpp"
 #include "toolkit/styled_text/html_words.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 namespace {
 
 void readFamily(std::string_view value, const Fonts& fonts, Declarations& own) {
@@ -21,7 +21,7 @@ void readSize(std::string_view value, const Fonts&, Declarations& own) {
 
 void readWeight(std::string_view value, const Fonts&, Declarations& own) {
   constexpr int boldFrom = 600;  // a family has two weights; this and above is nearer to bold
-  const std::string name = lowered(value);
+  const std::string name = text::lowered(value);
   if (name == "bold" || name == "bolder") {
     own.bold = true;
   } else if (name == "normal" || name == "lighter") {
@@ -32,7 +32,7 @@ void readWeight(std::string_view value, const Fonts&, Declarations& own) {
 }
 
 void readFontStyle(std::string_view value, const Fonts&, Declarations& own) {
-  const std::string name = lowered(value);
+  const std::string name = text::lowered(value);
   if (name == "italic" || name == "oblique") own.italic = true;
   if (name == "normal") own.italic = false;
 }
@@ -44,7 +44,7 @@ void readDecoration(std::string_view value, const Fonts&, Declarations& own) {
   bool underline = false;
   bool strikethrough = false;
   while (!value.empty()) {
-    const std::string name = lowered(takeWord(value));
+    const std::string name = text::lowered(takeWord(value));
     underline |= name == "underline";
     strikethrough |= name == "line-through";
     valid |= underline || strikethrough || name == "none" || name == "overline" || name == "blink";
@@ -116,7 +116,7 @@ std::string withoutComments(std::string_view css) {
 }  // namespace
 
 std::optional<TextAlignment> alignmentNamed(std::string_view value) {
-  const std::string name = lowered(trimmed(value));
+  const std::string name = text::lowered(trimmed(value));
   if (name == "left") return TextAlignment::left;
   if (name == "right" || name == "end") return TextAlignment::right;
   if (name == "center" || name == "middle") return TextAlignment::center;
@@ -129,7 +129,7 @@ void readInlineStyle(std::string_view css, const Fonts& fonts, Declarations& own
   const std::string sheet = withoutComments(css);
   for (std::string_view rest = sheet; !rest.empty();) {
     std::string_view value = takeDeclaration(rest);
-    const std::string name = lowered(trimmed(takeUntil(value, ':')));
+    const std::string name = text::lowered(trimmed(takeUntil(value, ':')));
     // Ignores "!important": nothing competes with an inline style.
     value = trimmed(takeUntil(value, '!'));
     for (const Property& property : properties) {
@@ -138,4 +138,4 @@ void readInlineStyle(std::string_view css, const Fonts& fonts, Declarations& own
   }
 }
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

@@ -7,7 +7,7 @@
 
 #include "toolkit/styled_text/html_style.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 
 /// Returns the alignment named "left", "right", "center", "justify" and the like; absent if it is
 /// none.
@@ -17,4 +17,4 @@ std::optional<TextAlignment> alignmentNamed(std::string_view value);
 /// properties and invalid values.
 void readInlineStyle(std::string_view css, const Fonts& fonts, Declarations& own);
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

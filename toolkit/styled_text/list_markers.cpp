@@ -7,7 +7,7 @@
 
 #include "toolkit/styled_text/html_words.hpp"
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 namespace {
 
 struct Numeral {
@@ -67,7 +67,7 @@ std::optional<MarkerKind> markerKindNamed(std::string_view type) {
   if (type == "A") return MarkerKind::upperAlpha;
   if (type == "i") return MarkerKind::lowerRoman;
   if (type == "I") return MarkerKind::upperRoman;
-  const std::string name = lowered(type);
+  const std::string name = text::lowered(type);
   if (name == "disc") return MarkerKind::disc;
   if (name == "circle") return MarkerKind::circle;
   if (name == "square") return MarkerKind::square;
@@ -101,4 +101,4 @@ std::string marker(MarkerKind kind, std::int64_t number) {
   return {};
 }
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

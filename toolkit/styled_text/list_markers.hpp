@@ -8,7 +8,7 @@
 #include <string>
 #include <string_view>
 
-namespace toolkit::html {
+namespace qz::toolkit::html {
 
 enum class MarkerKind : std::uint8_t {
   disc,
@@ -33,4 +33,4 @@ MarkerKind bulletAtLevel(std::size_t level);
 /// Roman numerals become decimal.
 std::string marker(MarkerKind kind, std::int64_t number);
 
-}  // namespace toolkit::html
+}  // namespace qz::toolkit::html

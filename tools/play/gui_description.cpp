@@ -4,10 +4,10 @@
 
 #include <string>
 
-#include "toolkit/property_list/scalars.hpp"
-#include "tools/text_layout.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 bool answersFloatValue(const toolkit::ValueRef<>& value) {
@@ -44,4 +44,4 @@ void checkGuiDescription(const InputFile& file) {
   }
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -4,20 +4,20 @@
 
 #include <cstddef>
 
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/scalars.hpp"
-#include "tools/failure.hpp"
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/scalars.hpp"
 #include "tools/play/plist_entry.hpp"
 #include "tools/play/words.hpp"
-#include "tools/suggestions.hpp"
-#include "tools/text_layout.hpp"
-#include "tools/view_kinds.hpp"
+#include "tools/support/failure.hpp"
+#include "tools/support/suggestions.hpp"
+#include "tools/support/text_layout.hpp"
+#include "tools/support/view_kinds.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
+using drivers::ViewKind;
 using toolkit::State;
-using toolkit::ViewKind;
 
 bool isWindow(const toolkit::ValueRef<>& entry) {
   const auto name = toolkit::asString(toolkit::asDictionary(entry)->objectForKey("class"));
@@ -30,7 +30,7 @@ void readWindow(const PlistEntry& entry, HostWindow& host) {
   host.content = entry.requiredRect("frame");
 }
 
-ViewKind readKind(const PlistEntry& entry) {
+drivers::ViewKind readKind(const PlistEntry& entry) {
   const std::string name = entry.requiredText("class");
   if (name == "NSWindow") entry.fail("class", "a control (the window is the first entry)");
   const auto kind = viewKindNamed(name);
@@ -42,25 +42,27 @@ ViewKind readKind(const PlistEntry& entry) {
   return *kind;
 }
 
-State readState(const PlistEntry& entry, ViewKind kind) {
+State readState(const PlistEntry& entry, drivers::ViewKind kind) {
   if (!entry.has("state")) return State::off;
   const std::string name = entry.text("state");
   if (name == "on") return State::on;
-  if (name == "mixed" && kind == ViewKind::mixed) return State::mixed;
+  if (name == "mixed" && kind == drivers::ViewKind::mixed) return State::mixed;
   if (name != "off") {
-    entry.fail("state", kind == ViewKind::mixed ? "“on”, “off” or “mixed”" : "“on” or “off”");
+    entry.fail("state",
+               kind == drivers::ViewKind::mixed ? "“on”, “off” or “mixed”" : "“on” or “off”");
   }
   return State::off;
 }
 
 /// Returns the keys that an entry of the kind may have: a caption only if the kind shows one, a
 /// state only if it has one.
-std::vector<std::string_view> keysOf(ViewKind kind) {
+std::vector<std::string_view> keysOf(drivers::ViewKind kind) {
   std::vector<std::string_view> keys = {"class", "tag", "frame", "hidden", "toolTip"};
-  if (kind == ViewKind::imageView) keys.emplace_back("image");
-  if (isButton(kind) || kind == ViewKind::textField) keys.emplace_back("title");
+  if (kind == drivers::ViewKind::imageView) keys.emplace_back("image");
+  if (isButton(kind) || kind == drivers::ViewKind::textField) keys.emplace_back("title");
   if (isButton(kind)) keys.emplace_back("state");
-  if (kind != ViewKind::plain && kind != ViewKind::box) keys.emplace_back("enabled");
+  if (kind != drivers::ViewKind::plain && kind != drivers::ViewKind::box)
+    keys.emplace_back("enabled");
   return keys;
 }
 
@@ -70,7 +72,8 @@ HostControl readControl(const PlistEntry& entry) {
   entry.expectOnly(keysOf(control.kind));
   control.tag = entry.integer("tag");
   control.frame = entry.requiredRect("frame");
-  const std::string_view captionKey = control.kind == ViewKind::imageView ? "image" : "title";
+  const std::string_view captionKey =
+      control.kind == drivers::ViewKind::imageView ? "image" : "title";
   if (entry.has(captionKey)) control.caption = entry.text(captionKey);
   control.hidden = entry.flag("hidden", false);
   control.enabled = entry.flag("enabled", true);
@@ -86,7 +89,7 @@ void expectImage(toolkit::Toolkit& toolkit, std::string_view name, std::string_v
                                           toolkit.files().resourcePath());
 }
 
-void makeControl(toolkit::TestDriver& driver, const HostControl& control,
+void makeControl(drivers::Driver& driver, const HostControl& control,
                  const toolkit::Ref<toolkit::View>& parent) {
   const auto view = driver.makeView(control.kind, control.tag, control.frame, parent);
   if (control.caption) driver.setCaption(view, *control.caption);
@@ -117,10 +120,10 @@ HostWindow parseHostWindow(const InputFile& file) {
   return host;
 }
 
-toolkit::Ref<toolkit::Window> makeHostWindow(toolkit::TestDriver& driver, const HostWindow& host,
+toolkit::Ref<toolkit::Window> makeHostWindow(drivers::Driver& driver, const HostWindow& host,
                                              std::string_view file) {
   for (const HostControl& control : host.controls) {
-    if (control.kind == ViewKind::imageView && control.caption) {
+    if (control.kind == drivers::ViewKind::imageView && control.caption) {
       expectImage(driver.toolkit(), *control.caption, file);
     }
   }
@@ -132,4 +135,4 @@ toolkit::Ref<toolkit::Window> makeHostWindow(toolkit::TestDriver& driver, const 
   return window;
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

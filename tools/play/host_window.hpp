@@ -8,14 +8,14 @@
 #include <string_view>
 #include <vector>
 
-#include "toolkit/geometry.hpp"
-#include "toolkit/test_driver.hpp"
-#include "tools/play/input_file.hpp"
+#include "drivers/driver.hpp"
+#include "qz/toolkit/geometry.hpp"
+#include "tools/support/input_file.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 struct HostControl {
-  toolkit::ViewKind kind = toolkit::ViewKind::plain;
+  drivers::ViewKind kind = drivers::ViewKind::plain;
   toolkit::Tag tag = 0;
   toolkit::Rect frame;
   /// The title of a button, text of a field or name of an image; absent: the toolkit's default.
@@ -38,7 +38,7 @@ HostWindow parseHostWindow(const InputFile& file);
 
 /// Puts the window on the driver's screen. Throws a Failure, which names `file`, if one of its
 /// images is unknown.
-toolkit::Ref<toolkit::Window> makeHostWindow(toolkit::TestDriver& driver, const HostWindow& host,
+toolkit::Ref<toolkit::Window> makeHostWindow(drivers::Driver& driver, const HostWindow& host,
                                              std::string_view file);
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -11,9 +11,9 @@
 #include <utility>
 
 #include "tools/play/words.hpp"
-#include "tools/text_layout.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 struct Fact {
@@ -35,7 +35,7 @@ std::string rectWords(const toolkit::Rect& rect) {
 }
 
 Facts factsOf(const ControlPicture& control) {
-  const toolkit::ViewPicture& view = control.view;
+  const drivers::ViewPicture& view = control.view;
   return {{"tag", std::to_string(view.tag)},
           {"frame", rectWords(view.frame)},
           {"title", quote(view.title.string())},
@@ -50,8 +50,8 @@ Facts factsOf(const ControlPicture& control) {
           {"tooltip", view.toolTip.empty() ? "none" : quote(view.toolTip)}};
 }
 
-Facts factsOf(const std::optional<toolkit::WindowPicture>& window) {
-  const toolkit::WindowPicture shown = window.value_or(toolkit::WindowPicture{});
+Facts factsOf(const std::optional<drivers::WindowPicture>& window) {
+  const drivers::WindowPicture shown = window.value_or(drivers::WindowPicture{});
   return {{"window", window ? "there" : "none"},
           {"rectangle", rectWords(shown.content)},
           {"on the screen", yesOrNo(shown.visible)},
@@ -177,4 +177,4 @@ PictureChanges diffPictures(const StepPicture& before, const StepPicture& now) {
   return changes;
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -7,7 +7,7 @@
 
 #include "tools/play/step_picture.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 /// One thing that changed, in words.
 struct Change {
@@ -38,4 +38,4 @@ struct PictureChanges {
 /// timer counts as changed if it was armed, armed again or is gone, not because time has passed.
 PictureChanges diffPictures(const StepPicture& before, const StepPicture& now);
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -6,9 +6,9 @@
 #include <vector>
 
 #include "tools/play/words.hpp"
-#include "tools/text_layout.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 constexpr std::size_t widestContent = 44;     // longer text continues below
@@ -212,4 +212,4 @@ std::string renderPicture(const StepPicture& picture, const PictureChanges& chan
   return Renderer(picture, changes, style).render();
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -9,7 +9,7 @@
 #include "tools/play/picture_diff.hpp"
 #include "tools/play/step_picture.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 struct Style {
   bool color = false;       ///< with the escape sequences of a colour terminal
@@ -25,4 +25,4 @@ std::string renderHeading(int number, std::string_view what, const Style& style)
 std::string renderPicture(const StepPicture& picture, const PictureChanges& changes,
                           const Style& style);
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -9,20 +9,20 @@
 #include <optional>
 #include <ostream>
 
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/number_conversion.hpp"
-#include "tools/drivers.hpp"
-#include "tools/play/input_file.hpp"
+#include "qz/property_list/collections.hpp"
+#include "text/number_conversion.hpp"
 #include "tools/play/pressing.hpp"
 #include "tools/play/prompt.hpp"
 #include "tools/play/raised_places.hpp"
 #include "tools/play/screenshots.hpp"
 #include "tools/play/session.hpp"
 #include "tools/play/stage.hpp"
-#include "tools/suggestions.hpp"
-#include "tools/text_layout.hpp"
+#include "tools/support/drivers.hpp"
+#include "tools/support/input_file.hpp"
+#include "tools/support/suggestions.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 namespace fs = std::filesystem;
@@ -33,7 +33,7 @@ using Script = toolkit::ValueRef<toolkit::Dictionary>;
 std::vector<std::string> sortedKeys(const Script& script) {
   std::vector<std::string> keys = script->allKeys();
   std::stable_sort(keys.begin(), keys.end(), [](const std::string& a, const std::string& b) {
-    return toolkit::integerValueOf(a) < toolkit::integerValueOf(b);
+    return text::integerValueOf(a) < text::integerValueOf(b);
   });
   return keys;
 }
@@ -53,7 +53,7 @@ void checkStart(const InputFile& file, std::string key) {
     file.fail(script, "expected at least one list, found an empty script");
   }
   // As the engine does: the smallest tag as a number, then the list under its decimal form.
-  if (key.empty()) key = std::to_string(toolkit::intValueOf(sortedKeys(script).front()));
+  if (key.empty()) key = std::to_string(text::intValueOf(sortedKeys(script).front()));
   const auto list = script->objectForKey(key);
   if (!list) {
     throw Failure(ExitStatus::failed, file.path() + ": no list under the start key " + quote(key) +
@@ -104,7 +104,7 @@ void playInteractively(Session& session, const Terminal& terminal) {
 }
 
 /// Lets a person who sees the window play in it, else the user of an interactive terminal.
-void leaveToTheUser(const toolkit::TestDriver& driver, Session& session, const Terminal& terminal) {
+void leaveToTheUser(const drivers::Driver& driver, Session& session, const Terminal& terminal) {
   if (driver.hasPerson()) {
     terminal.out << "\nPress what the window offers; close it to stop.\n" << std::flush;
     session.handOver();
@@ -114,7 +114,7 @@ void leaveToTheUser(const toolkit::TestDriver& driver, Session& session, const T
 }
 
 /// Passes the engine's log lines on, each below what the transcript already shows.
-void connectLog(toolkit::TestDriver& driver, const Terminal& terminal) {
+void connectLog(drivers::Driver& driver, const Terminal& terminal) {
   driver.setLogSink([&terminal](std::string_view line) {
     terminal.out << std::flush;
     terminal.log << oneLine(line) << std::endl;
@@ -153,4 +153,4 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   return session.problems().empty() ? ExitStatus::fine : ExitStatus::failed;
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

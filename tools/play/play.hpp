@@ -8,11 +8,11 @@
 #include <variant>
 #include <vector>
 
-#include "toolkit/tag.hpp"
-#include "tools/failure.hpp"
+#include "qz/toolkit/tag.hpp"
 #include "tools/play/picture_render.hpp"
+#include "tools/support/failure.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 /// The user presses the control with this tag.
 struct Press {
@@ -55,4 +55,4 @@ struct Terminal {
 /// raised, or the walk-through is stuck at the end. Throws a Failure if it cannot start.
 ExitStatus play(const PlayOptions& options, const Terminal& terminal);
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

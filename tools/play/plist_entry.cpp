@@ -7,12 +7,12 @@
 #include <cmath>
 #include <utility>
 
-#include "toolkit/property_list/scalars.hpp"
+#include "qz/property_list/scalars.hpp"
 #include "tools/play/parse_number.hpp"
-#include "tools/suggestions.hpp"
-#include "tools/text_layout.hpp"
+#include "tools/support/suggestions.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 std::optional<std::int64_t> integerOf(const toolkit::ValueRef<>& value) {
@@ -120,4 +120,4 @@ void PlistEntry::failAt(const toolkit::ValueRef<>& value, const std::string& mes
   file_.fail(value, name_ + ": " + message);
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -7,12 +7,12 @@
 #include <string_view>
 #include <vector>
 
-#include "toolkit/geometry.hpp"
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/value.hpp"
-#include "tools/play/input_file.hpp"
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/value.hpp"
+#include "qz/toolkit/geometry.hpp"
+#include "tools/support/input_file.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 /// Returns the finite number that a value holds, whole or not: from a number, or from a string that
 /// spells one from start to end (the old-style format has only strings). Absent for other values.
@@ -49,4 +49,4 @@ class PlistEntry {
   toolkit::ValueRef<toolkit::Dictionary> fields_;
 };
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

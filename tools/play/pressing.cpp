@@ -6,10 +6,10 @@
 #include <vector>
 
 #include "tools/play/words.hpp"
-#include "tools/suggestions.hpp"
-#include "tools/text_layout.hpp"
+#include "tools/support/suggestions.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 bool canBePressed(const ControlPicture& control) {
@@ -85,4 +85,4 @@ std::string standing(const StepPicture& picture) {
   return "The walk-through waits for " + enumerate(waysOn(picture)) + ".";
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

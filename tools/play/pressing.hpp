@@ -7,7 +7,7 @@
 
 #include "tools/play/step_picture.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 /// Returns the control that scripts and presses find by `tag`: the rearmost. Null if there is none.
 const ControlPicture* controlWithTag(const StepPicture& picture, toolkit::Tag tag);
@@ -25,4 +25,4 @@ std::optional<std::string> whyNoWayOn(const StepPicture& picture);
 /// Says in one sentence that the walk-through ended or is stuck, or what it waits for.
 std::string standing(const StepPicture& picture);
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -3,9 +3,9 @@
 #include "tools/play/prompt.hpp"
 
 #include "tools/play/parse_number.hpp"
-#include "tools/text_layout.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 std::string_view trimmed(std::string_view text) {
@@ -48,4 +48,4 @@ std::optional<double> parseSeconds(std::string_view text) {
   return seconds && *seconds >= 0 && *seconds <= longestAdvance ? seconds : std::nullopt;
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -8,7 +8,7 @@
 
 #include "tools/play/play.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 struct Help {};
 struct Quit {};
@@ -33,4 +33,4 @@ std::optional<toolkit::Tag> parseTag(std::string_view text);
 /// Reads a number of seconds from 0 to `longestAdvance`, nothing around it.
 std::optional<double> parseSeconds(std::string_view text);
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -4,9 +4,9 @@
 
 #include <ostream>
 
-#include "tools/text_layout.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 /// Returns the key under which the script holds this very list; absent if it does not hold it.
@@ -45,4 +45,4 @@ void RaisedPlaces::commandRaised(const Value&, std::size_t index, const toolkit:
        << index + 1 << nameWords(element) << std::endl;
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

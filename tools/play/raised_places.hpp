@@ -7,11 +7,11 @@
 #include <string>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "qz/engine.hpp"
 #include "qz/observer.hpp"
-#include "tools/play/input_file.hpp"
+#include "tools/support/input_file.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 class RaisedPlaces final : public qz::Observer {
  public:
@@ -31,4 +31,4 @@ class RaisedPlaces final : public qz::Observer {
   std::vector<std::optional<std::string>> running_;  // the keys of the lists, the outermost first
 };
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -9,9 +9,9 @@
 #include <system_error>
 #include <utility>
 
-#include "tools/failure.hpp"
+#include "tools/support/failure.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 namespace fs = std::filesystem;
@@ -31,7 +31,7 @@ void clearAway(const std::string& directory) {
 
 }  // namespace
 
-Screenshots::Screenshots(toolkit::TestDriver& driver, std::string directory)
+Screenshots::Screenshots(drivers::Driver& driver, std::string directory)
     : driver_(driver), directory_(std::move(directory)) {
   if (!driver.draws()) {
     refuse("the toolkit " + std::string(driver.name()) +
@@ -56,4 +56,4 @@ void Screenshots::take(const toolkit::Ref<toolkit::Window>& window, std::string_
   if (!driver_.savePicture(window, path)) refuse(path + ": cannot be written");
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -7,17 +7,17 @@
 #include <string>
 #include <string_view>
 
-#include "toolkit/test_driver.hpp"
+#include "drivers/driver.hpp"
 #include "tools/play/transcript.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 class Screenshots {
  public:
   /// Makes the directory if there is none, and deletes the pictures of an earlier walk-through.
   /// Throws a Failure if the driver's toolkit draws nothing, or the directory cannot be written.
   /// The driver must outlive it.
-  Screenshots(toolkit::TestDriver& driver, std::string directory);
+  Screenshots(drivers::Driver& driver, std::string directory);
 
   /// Also writes the transcript, plain, to `transcript.txt`. This must outlive the transcript.
   void keep(Transcript& transcript);
@@ -28,10 +28,10 @@ class Screenshots {
   void take(const toolkit::Ref<toolkit::Window>& window, std::string_view what);
 
  private:
-  toolkit::TestDriver& driver_;
+  drivers::Driver& driver_;
   std::string directory_;
   std::ofstream text_;
   int taken_ = 0;
 };
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

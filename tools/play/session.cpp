@@ -7,9 +7,9 @@
 
 #include "tools/play/pressing.hpp"
 #include "tools/play/words.hpp"
-#include "tools/text_layout.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 namespace {
 
@@ -29,7 +29,7 @@ const TimerPicture* firedBetween(const StepPicture& before, const StepPicture& a
 
 }  // namespace
 
-Session::Session(toolkit::TestDriver& driver, Stage& stage, std::ostream& out, const Style& style,
+Session::Session(drivers::Driver& driver, Stage& stage, std::ostream& out, const Style& style,
                  Screenshots* screenshots)
     : driver_(driver), stage_(stage), transcript_(out, style), screenshots_(screenshots) {
   transcript_.startFrom(look());
@@ -165,4 +165,4 @@ std::string Session::recordedStates() {
   return words;
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -8,20 +8,20 @@
 #include <string>
 #include <vector>
 
-#include "toolkit/exception.hpp"
-#include "toolkit/test_driver.hpp"
+#include "drivers/driver.hpp"
+#include "qz/toolkit/exception.hpp"
 #include "tools/play/play.hpp"
 #include "tools/play/screenshots.hpp"
 #include "tools/play/stage.hpp"
 #include "tools/play/transcript.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 class Session {
  public:
   /// The arguments must outlive the session. `screenshots` may be null; else it gets a picture
   /// after each step, and after each list that a timer runs within one.
-  Session(toolkit::TestDriver& driver, Stage& stage, std::ostream& out, const Style& style,
+  Session(drivers::Driver& driver, Stage& stage, std::ostream& out, const Style& style,
           Screenshots* screenshots = nullptr);
 
   /// Loads the script at an absolute path and runs its list under `startKey`.
@@ -57,7 +57,7 @@ class Session {
   StepPicture look() { return takePicture(driver_, stage_.engine(), stage_.title()); }
   std::string recordedStates();
 
-  toolkit::TestDriver& driver_;
+  drivers::Driver& driver_;
   Stage& stage_;
   Transcript transcript_;
   Screenshots* screenshots_;
@@ -69,4 +69,4 @@ class Session {
   std::vector<std::string> problems_;
 };
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

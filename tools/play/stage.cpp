@@ -3,11 +3,11 @@
 #include "tools/play/stage.hpp"
 
 #include "tools/play/gui_description.hpp"
-#include "tools/play/input_file.hpp"
 #include "tools/play/stand_in.hpp"
-#include "tools/stack_guard.hpp"
+#include "tools/support/input_file.hpp"
+#include "tools/support/stack_guard.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 constexpr toolkit::Rect parentContent{80, 80, 800, 600};
@@ -22,7 +22,7 @@ class SheetRemover final : public toolkit::SheetDelegate {
 
 }  // namespace
 
-Stage::Stage(toolkit::TestDriver& driver, const PlayOptions& options,
+Stage::Stage(drivers::Driver& driver, const PlayOptions& options,
              const QZ_Plist_State_Parser::Dictionary& script)
     : driver_(driver), sheet_(options.sheet), delegate_(std::make_shared<SheetRemover>()) {
   if (sheet_) parent_ = driver_.makeWindow(parentContent);
@@ -62,4 +62,4 @@ bool Stage::load(const std::string& script, const std::string& startKey) {
   return engine_->loadPlist(script, startKey, delegate_, sheet_);
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -5,12 +5,12 @@
 #include <memory>
 #include <string>
 
-#include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/test_driver.hpp"
+#include "drivers/driver.hpp"
+#include "qz/engine.hpp"
 #include "tools/play/host_window.hpp"
 #include "tools/play/play.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 /// Sets up the walk-through window as the options say: from the host's window, from a description,
 /// or, without either, from the script itself. The driver must outlive it. Terminates the engine on
@@ -18,7 +18,7 @@ namespace tools::play {
 class Stage {
  public:
   /// Throws a Failure if a file does not hold what it should.
-  Stage(toolkit::TestDriver& driver, const PlayOptions& options,
+  Stage(drivers::Driver& driver, const PlayOptions& options,
         const QZ_Plist_State_Parser::Dictionary& script);
   ~Stage();
   Stage(const Stage&) = delete;
@@ -35,7 +35,7 @@ class Stage {
   void buildFrom(const std::string& descriptionFile);
   void adopt(const HostWindow& host, const std::string& file);
 
-  toolkit::TestDriver& driver_;
+  drivers::Driver& driver_;
   bool sheet_;
   std::string title_;
   toolkit::Ref<toolkit::Window> parent_;  // of the sheet; absent when there is none
@@ -44,4 +44,4 @@ class Stage {
   std::shared_ptr<QZ_Plist_State_Parser> engine_;
 };
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -6,40 +6,40 @@
 #include <map>
 #include <string>
 
-#include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/property_list/scalars.hpp"
-#include "toolkit/uppercase.hpp"
+#include "qz/engine.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "text/uppercase.hpp"
 #include "tools/play/parse_number.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
-using toolkit::ViewKind;
+using drivers::ViewKind;
 
 /// Which element of a compound command is a tag, and which kind of control the command suggests.
 struct TagUse {
   const std::string& command;
   std::size_t element;
-  ViewKind kind;
+  drivers::ViewKind kind;
 };
 
-constexpr auto anything = ViewKind::textField;
+constexpr auto anything = drivers::ViewKind::textField;
 
 const TagUse tagUses[] = {
-    {QZ_PLIST_STATE_PARSER_LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID, 2, ViewKind::imageView},
-    {QZ_PLIST_STATE_PARSER_SET_STATE_ON_FOR_OBJECT_ID, 1, ViewKind::toggle},
-    {QZ_PLIST_STATE_PARSER_SET_STATE_OFF_FOR_OBJECT_ID, 1, ViewKind::toggle},
-    {QZ_PLIST_STATE_PARSER_FLASH_ID, 2, ViewKind::button},
-    {QZ_PLIST_STATE_PARSER_SET_TITLE_FOR_OBJECT_ID, 2, ViewKind::button},
-    {QZ_PLIST_STATE_PARSER_SET_BACKGROUND_COLOR_FOR_OBJECT_ID, 2, ViewKind::button},
-    {QZ_PLIST_STATE_PARSER_SET_FOREGROUND_COLOR_FOR_OBJECT_ID, 2, ViewKind::button},
-    {QZ_PLIST_STATE_PARSER_SET_TEXT_FOR_OBJECT_ID, 2, ViewKind::textField},
+    {QZ_PLIST_STATE_PARSER_LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID, 2, drivers::ViewKind::imageView},
+    {QZ_PLIST_STATE_PARSER_SET_STATE_ON_FOR_OBJECT_ID, 1, drivers::ViewKind::toggle},
+    {QZ_PLIST_STATE_PARSER_SET_STATE_OFF_FOR_OBJECT_ID, 1, drivers::ViewKind::toggle},
+    {QZ_PLIST_STATE_PARSER_FLASH_ID, 2, drivers::ViewKind::button},
+    {QZ_PLIST_STATE_PARSER_SET_TITLE_FOR_OBJECT_ID, 2, drivers::ViewKind::button},
+    {QZ_PLIST_STATE_PARSER_SET_BACKGROUND_COLOR_FOR_OBJECT_ID, 2, drivers::ViewKind::button},
+    {QZ_PLIST_STATE_PARSER_SET_FOREGROUND_COLOR_FOR_OBJECT_ID, 2, drivers::ViewKind::button},
+    {QZ_PLIST_STATE_PARSER_SET_TEXT_FOR_OBJECT_ID, 2, drivers::ViewKind::textField},
     {QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID, 4,
-     ViewKind::textField},
+     drivers::ViewKind::textField},
     {QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID,
-     4, ViewKind::textField},
+     4, drivers::ViewKind::textField},
     {QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID,
-     5, ViewKind::textField},
+     5, drivers::ViewKind::textField},
     {QZ_PLIST_STATE_PARSER_HIDE_OBJECT_WITH_ID, 1, anything},
     {QZ_PLIST_STATE_PARSER_SHOW_OBJECT_WITH_ID, 1, anything},
     {QZ_PLIST_STATE_PARSER_ENABLE_OBJECT_WITH_ID, 1, anything},
@@ -50,21 +50,21 @@ const TagUse tagUses[] = {
 };
 
 /// If commands suggest several kinds for a tag, the one with the highest rank wins.
-int rank(ViewKind kind) {
-  if (kind == ViewKind::imageView) return 3;
-  if (kind == ViewKind::toggle) return 2;
-  return kind == ViewKind::button ? 1 : 0;
+int rank(drivers::ViewKind kind) {
+  if (kind == drivers::ViewKind::imageView) return 3;
+  if (kind == drivers::ViewKind::toggle) return 2;
+  return kind == drivers::ViewKind::button ? 1 : 0;
 }
 
-using Kinds = std::map<toolkit::Tag, ViewKind>;
+using Kinds = std::map<toolkit::Tag, drivers::ViewKind>;
 
-void take(Kinds& kinds, toolkit::Tag tag, ViewKind kind) {
+void take(Kinds& kinds, toolkit::Tag tag, drivers::ViewKind kind) {
   const auto [place, isNew] = kinds.emplace(tag, kind);
   if (!isNew && rank(kind) > rank(place->second)) place->second = kind;
 }
 
 void takeTargets(Kinds& kinds, const toolkit::ValueRef<toolkit::Array>& command) {
-  const auto name = toolkit::uppercased(toolkit::asString(command->objectAtIndex(0))->text());
+  const auto name = text::uppercased(toolkit::asString(command->objectAtIndex(0))->text());
   for (const TagUse& use : tagUses) {
     if (name != use.command || command->count() <= use.element) continue;
     const auto tag = command->objectAtIndex(use.element);
@@ -75,7 +75,8 @@ void takeTargets(Kinds& kinds, const toolkit::ValueRef<toolkit::Array>& command)
 Kinds kindsByTag(const toolkit::ValueRef<toolkit::Dictionary>& script) {
   Kinds kinds;
   for (const std::string& key : script->allKeys()) {
-    if (const auto tag = parseNumber<toolkit::Tag>(key)) take(kinds, *tag, ViewKind::button);
+    if (const auto tag = parseNumber<toolkit::Tag>(key))
+      take(kinds, *tag, drivers::ViewKind::button);
     for (const auto& element : toolkit::asArray(script->objectForKey(key))->elements()) {
       const auto command = toolkit::asArray(element);
       if (command->count() > 0) takeTargets(kinds, command);
@@ -106,4 +107,4 @@ HostWindow standInWindow(const toolkit::ValueRef<toolkit::Dictionary>& script) {
   return host;
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

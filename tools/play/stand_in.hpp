@@ -2,14 +2,14 @@
 // A window for a script that is played without one.
 #pragma once
 
-#include "toolkit/property_list/collections.hpp"
+#include "qz/property_list/collections.hpp"
 #include "tools/play/host_window.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 /// Returns a window with one control for every tag that the script names, from top to bottom in the
 /// order of the tags. The script's use of a tag decides its kind: image view, check box, button
 /// (also if it has a list), else text field.
 HostWindow standInWindow(const toolkit::ValueRef<toolkit::Dictionary>& script);
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

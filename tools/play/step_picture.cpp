@@ -6,10 +6,10 @@
 #include <set>
 #include <utility>
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
-ControlPicture lookAtControl(toolkit::TestDriver& driver, const QZ_Plist_State_Parser& engine,
+ControlPicture lookAtControl(drivers::Driver& driver, const QZ_Plist_State_Parser& engine,
                              const toolkit::Ref<toolkit::View>& view) {
   const std::string key = std::to_string(view->tag());
   ControlPicture picture;
@@ -22,7 +22,7 @@ ControlPicture lookAtControl(toolkit::TestDriver& driver, const QZ_Plist_State_P
   return picture;
 }
 
-std::vector<ControlPicture> lookAtControls(toolkit::TestDriver& driver,
+std::vector<ControlPicture> lookAtControls(drivers::Driver& driver,
                                            const QZ_Plist_State_Parser& engine) {
   std::vector<ControlPicture> controls;
   std::set<toolkit::Tag> tags;
@@ -49,7 +49,7 @@ std::vector<TimerPicture> lookAtTimers(const QZ_Plist_State_Parser& engine) {
 
 }  // namespace
 
-StepPicture takePicture(toolkit::TestDriver& driver, const QZ_Plist_State_Parser& engine,
+StepPicture takePicture(drivers::Driver& driver, const QZ_Plist_State_Parser& engine,
                         std::string title) {
   StepPicture picture;
   picture.title = std::move(title);
@@ -62,4 +62,4 @@ StepPicture takePicture(toolkit::TestDriver& driver, const QZ_Plist_State_Parser
   return picture;
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -8,15 +8,15 @@
 #include <string>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
-#include "toolkit/test_driver.hpp"
+#include "drivers/driver.hpp"
+#include "qz/engine.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 struct ControlPicture {
   /// Identifies the control even after its tag has changed.
   std::weak_ptr<const void> identity;
-  toolkit::ViewPicture view;
+  drivers::ViewPicture view;
   bool flashing = false;  ///< every tick of the flasher toggles its highlight
   bool hasList = false;   ///< the script has a list under its tag
   bool shadowed = false;  ///< a control behind it has the same tag, and is found instead
@@ -30,7 +30,7 @@ struct TimerPicture {
 
 struct StepPicture {
   std::string title;  ///< of the window, as its host gave it; may be empty
-  std::optional<toolkit::WindowPicture> window;  ///< absent: there is no walk-through window
+  std::optional<drivers::WindowPicture> window;  ///< absent: there is no walk-through window
   std::vector<ControlPicture> controls;          ///< directly in the window, back to front
   std::vector<TimerPicture> timers;              ///< pending, in the order of their firing
   std::optional<std::string> lastList;           ///< key of the list that was started last
@@ -40,7 +40,7 @@ struct StepPicture {
 
 /// Takes a picture of the walk-through that `engine` runs on the driver's toolkit. The caller gives
 /// the window's title, because the toolkit's windows have none.
-StepPicture takePicture(toolkit::TestDriver& driver, const QZ_Plist_State_Parser& engine,
+StepPicture takePicture(drivers::Driver& driver, const QZ_Plist_State_Parser& engine,
                         std::string title);
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -7,7 +7,7 @@
 
 #include "tools/play/picture_diff.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 void Transcript::beginStep(std::string_view what) {
   ++steps_;
@@ -33,4 +33,4 @@ void Transcript::paragraph(std::string_view text) {
   for (const Output& output : outputs_) output.out << '\n' << text << std::flush;
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

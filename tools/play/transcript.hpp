@@ -11,7 +11,7 @@
 #include "tools/play/picture_render.hpp"
 #include "tools/play/step_picture.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 class Transcript {
  public:
@@ -47,4 +47,4 @@ class Transcript {
   int steps_ = 0;
 };
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -7,9 +7,9 @@
 #include <cstdio>
 #include <utility>
 
-#include "tools/text_layout.hpp"
+#include "tools/support/text_layout.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 namespace {
 
 std::string joined(const std::vector<std::string>& words, std::string_view separator) {
@@ -44,40 +44,40 @@ std::string_view alignmentWord(toolkit::TextAlignment alignment) {
   return "";
 }
 
-bool hasState(toolkit::ViewKind kind) {
-  return kind == toolkit::ViewKind::toggle || kind == toolkit::ViewKind::mixed;
+bool hasState(drivers::ViewKind kind) {
+  return kind == drivers::ViewKind::toggle || kind == drivers::ViewKind::mixed;
 }
 
 unsigned byteOf(double share) { return static_cast<unsigned>(std::lround(share * 255)); }
 
 }  // namespace
 
-std::string_view kindWord(toolkit::ViewKind kind) {
+std::string_view kindWord(drivers::ViewKind kind) {
   switch (kind) {
-    case toolkit::ViewKind::button:
+    case drivers::ViewKind::button:
       return "button";
-    case toolkit::ViewKind::toggle:
+    case drivers::ViewKind::toggle:
       return "check box";
-    case toolkit::ViewKind::mixed:
+    case drivers::ViewKind::mixed:
       return "mixed check box";
-    case toolkit::ViewKind::popUpButton:
+    case drivers::ViewKind::popUpButton:
       return "pop-up button";
-    case toolkit::ViewKind::textField:
+    case drivers::ViewKind::textField:
       return "text field";
-    case toolkit::ViewKind::imageView:
+    case drivers::ViewKind::imageView:
       return "image";
-    case toolkit::ViewKind::box:
+    case drivers::ViewKind::box:
       return "box";
-    case toolkit::ViewKind::plain:
+    case drivers::ViewKind::plain:
       break;
   }
   return "view";
 }
 
-bool isButton(toolkit::ViewKind kind) {
-  using toolkit::ViewKind;
-  return kind == ViewKind::button || kind == ViewKind::toggle || kind == ViewKind::mixed ||
-         kind == ViewKind::popUpButton;
+bool isButton(drivers::ViewKind kind) {
+  using drivers::ViewKind;
+  return kind == drivers::ViewKind::button || kind == drivers::ViewKind::toggle ||
+         kind == drivers::ViewKind::mixed || kind == drivers::ViewKind::popUpButton;
 }
 
 std::string_view stateWord(toolkit::State state) {
@@ -141,14 +141,14 @@ const toolkit::AttributedString& captionOf(const ControlPicture& control) {
 }
 
 std::string contentOf(const ControlPicture& control) {
-  if (control.view.kind == toolkit::ViewKind::imageView) {
+  if (control.view.kind == drivers::ViewKind::imageView) {
     return control.view.image ? printable(*control.view.image) : "(none)";
   }
   return printable(captionOf(control).string());
 }
 
 std::vector<std::string> remarksOn(const ControlPicture& control) {
-  const toolkit::ViewPicture& view = control.view;
+  const drivers::ViewPicture& view = control.view;
   std::vector<std::string> remarks;
   if (view.hidden) remarks.emplace_back("hidden");
   if (!view.enabled) remarks.emplace_back("disabled");
@@ -167,7 +167,7 @@ std::vector<std::string> remarksOn(const ControlPicture& control) {
   return remarks;
 }
 
-std::vector<std::string> remarksOn(const toolkit::WindowPicture& window) {
+std::vector<std::string> remarksOn(const drivers::WindowPicture& window) {
   std::vector<std::string> remarks = {numberWords(window.content.width) + " × " +
                                       numberWords(window.content.height)};
   const std::string_view gone = window.closes > 0 ? "closed" : "off the screen";
@@ -178,4 +178,4 @@ std::vector<std::string> remarksOn(const toolkit::WindowPicture& window) {
   return remarks;
 }
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

@@ -6,17 +6,17 @@
 #include <string_view>
 #include <vector>
 
-#include "toolkit/styled_text/attributed_string.hpp"
-#include "toolkit/test_driver.hpp"
+#include "drivers/driver.hpp"
+#include "qz/styled_text/attributed_string.hpp"
 #include "tools/play/step_picture.hpp"
 
-namespace tools::play {
+namespace qz::tools::play {
 
 /// Returns the everyday word for a kind of view, such as "check box".
-std::string_view kindWord(toolkit::ViewKind kind);
+std::string_view kindWord(drivers::ViewKind kind);
 
 /// Whether views of the kind are buttons: a user can press them, and they have a title.
-bool isButton(toolkit::ViewKind kind);
+bool isButton(drivers::ViewKind kind);
 
 /// Returns "on", "off" or "mixed".
 std::string_view stateWord(toolkit::State state);
@@ -44,6 +44,6 @@ std::string contentOf(const ControlPicture& control);
 std::vector<std::string> remarksOn(const ControlPicture& control);
 
 /// The same about a window: its size, whether it is on the screen, its background.
-std::vector<std::string> remarksOn(const toolkit::WindowPicture& window);
+std::vector<std::string> remarksOn(const drivers::WindowPicture& window);
 
-}  // namespace tools::play
+}  // namespace qz::tools::play

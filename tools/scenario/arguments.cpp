@@ -6,7 +6,7 @@
 #include <algorithm>
 #include <cassert>
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 using Change = std::function<std::string(std::string)>;
@@ -74,4 +74,4 @@ Arguments Arguments::changed(const Change& change) const {
   return changed;
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

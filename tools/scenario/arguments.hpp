@@ -12,7 +12,7 @@
 
 #include "tools/scenario/lexer.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 struct Statement;
 
@@ -45,4 +45,4 @@ class Arguments {
   std::shared_ptr<const Statement> nested_;
 };
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -8,7 +8,7 @@
 #include "tools/scenario/references.hpp"
 #include "tools/scenario/unmet.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 void Cast::nameWindow(const std::string& name, toolkit::StoredRef<toolkit::Window> window) {
   windows_.insert_or_assign(name, std::move(window));
@@ -81,4 +81,4 @@ std::optional<std::string> Cast::nameOf(const View& control) const {
   return "#" + std::to_string(control->tag());
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

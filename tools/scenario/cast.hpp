@@ -8,11 +8,11 @@
 #include <string_view>
 #include <variant>
 
-#include "toolkit/view.hpp"
-#include "toolkit/window.hpp"
+#include "qz/toolkit/view.hpp"
+#include "qz/toolkit/window.hpp"
 #include "tools/scenario/engine_holder.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 class Cast {
  public:
@@ -50,4 +50,4 @@ class Cast {
   std::map<std::string, toolkit::StoredRef<toolkit::View>> controls_;
 };
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

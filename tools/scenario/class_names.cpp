@@ -6,9 +6,9 @@
 #include <algorithm>
 #include <cctype>
 
-#include "tools/view_kinds.hpp"
+#include "tools/support/view_kinds.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 bool isClassNameCharacter(char c) {
@@ -18,7 +18,7 @@ bool isClassNameCharacter(char c) {
 }  // namespace
 
 // Kinds to which a toolkit gives the same name share one representative.
-ClassNames::ClassNames(const toolkit::TestDriver& driver) {
+ClassNames::ClassNames(const drivers::Driver& driver) {
   for (const auto name : viewKindNames()) {
     const std::string standard(name.substr(0, name.find(':')));
     const std::string own(driver.className(*viewKindNamed(name)));
@@ -52,4 +52,4 @@ Json ClassNames::unifiedTexts(const Json& value) const {
   return result;
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

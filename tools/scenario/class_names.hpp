@@ -6,14 +6,14 @@
 #include <string>
 #include <string_view>
 
-#include "toolkit/test_driver.hpp"
+#include "drivers/driver.hpp"
 #include "tools/scenario/json.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 class ClassNames {
  public:
-  explicit ClassNames(const toolkit::TestDriver& driver);
+  explicit ClassNames(const drivers::Driver& driver);
 
   /// Returns `text` with every class name, be it the standard name, such as NSButton, or the
   /// toolkit's, replaced by one that represents the kind. Two texts that differ only in these names
@@ -26,4 +26,4 @@ class ClassNames {
   std::map<std::string, std::string, std::less<>> standsFor_;
 };
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -7,9 +7,9 @@
 #include <cassert>
 #include <iterator>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "qz/engine.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 struct Constant {
@@ -76,4 +76,4 @@ void RenamedCommands::rename(std::string_view constant, std::string name) {
   before_.emplace_back(found->value, std::exchange(*found->value, std::move(name)));
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

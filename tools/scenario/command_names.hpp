@@ -7,7 +7,7 @@
 #include <utility>
 #include <vector>
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// Returns the constants' names, in the order of their declaration.
 std::vector<std::string_view> commandConstants();
@@ -27,4 +27,4 @@ class RenamedCommands {
   std::vector<std::pair<std::string*, std::string>> before_;
 };
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

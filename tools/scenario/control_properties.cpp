@@ -10,72 +10,78 @@
 #include "tools/scenario/text_properties.hpp"
 #include "tools/scenario/unmet.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace control_properties {
 namespace {
 
-using toolkit::ViewKind;
-using toolkit::ViewPicture;
+using drivers::ViewKind;
+using drivers::ViewPicture;
 
 // --- reading ---
 
-bool isButton(const ViewPicture& picture) {
-  return picture.kind == ViewKind::button || picture.kind == ViewKind::toggle ||
-         picture.kind == ViewKind::mixed || picture.kind == ViewKind::popUpButton;
+bool isButton(const drivers::ViewPicture& picture) {
+  return picture.kind == drivers::ViewKind::button || picture.kind == drivers::ViewKind::toggle ||
+         picture.kind == drivers::ViewKind::mixed || picture.kind == drivers::ViewKind::popUpButton;
 }
 
-bool isControl(const ViewPicture& picture) {
-  return picture.kind != ViewKind::box && picture.kind != ViewKind::plain;
+bool isControl(const drivers::ViewPicture& picture) {
+  return picture.kind != drivers::ViewKind::box && picture.kind != drivers::ViewKind::plain;
 }
 
-const toolkit::AttributedString& styledText(const ViewPicture& picture) {
+const toolkit::AttributedString& styledText(const drivers::ViewPicture& picture) {
   return isButton(picture) ? picture.title : picture.text;
 }
 
-Reading className(const Stage&, const ViewPicture& picture) { return picture.className; }
-Reading tag(const Stage&, const ViewPicture& picture) { return picture.tag; }
-Reading hidden(const Stage&, const ViewPicture& picture) { return picture.hidden; }
-Reading enabled(const Stage&, const ViewPicture& picture) { return picture.enabled; }
-Reading highlighted(const Stage&, const ViewPicture& picture) { return picture.highlighted; }
-Reading toolTip(const Stage&, const ViewPicture& picture) { return picture.toolTip; }
+Reading className(const Stage&, const drivers::ViewPicture& picture) { return picture.className; }
+Reading tag(const Stage&, const drivers::ViewPicture& picture) { return picture.tag; }
+Reading hidden(const Stage&, const drivers::ViewPicture& picture) { return picture.hidden; }
+Reading enabled(const Stage&, const drivers::ViewPicture& picture) { return picture.enabled; }
+Reading highlighted(const Stage&, const drivers::ViewPicture& picture) {
+  return picture.highlighted;
+}
+Reading toolTip(const Stage&, const drivers::ViewPicture& picture) { return picture.toolTip; }
 
-Reading state(const Stage&, const ViewPicture& picture) { return static_cast<int>(picture.state); }
+Reading state(const Stage&, const drivers::ViewPicture& picture) {
+  return static_cast<int>(picture.state);
+}
 
-Reading frame(const Stage&, const ViewPicture& picture) {
+Reading frame(const Stage&, const drivers::ViewPicture& picture) {
   const auto& frame = picture.frame;
   return Json{frame.x, frame.y, frame.width, frame.height};
 }
 
-Reading title(const Stage&, const ViewPicture& picture) {
+Reading title(const Stage&, const drivers::ViewPicture& picture) {
   return isButton(picture) ? Reading(picture.title.string()) : std::nullopt;
 }
 
-Reading text(const Stage&, const ViewPicture& picture) {
+Reading text(const Stage&, const drivers::ViewPicture& picture) {
   return isControl(picture) ? Reading(picture.text.string()) : std::nullopt;
 }
 
-Reading image(const Stage&, const ViewPicture& picture) {
+Reading image(const Stage&, const drivers::ViewPicture& picture) {
   return picture.image ? Reading(*picture.image) : std::nullopt;
 }
 
-Reading action(const Stage&, const ViewPicture& picture) {
+Reading action(const Stage&, const drivers::ViewPicture& picture) {
   return picture.action ? Reading(*picture.action) : std::nullopt;
 }
 
-Reading target(const Stage& stage, const ViewPicture& picture) {
+Reading target(const Stage& stage, const drivers::ViewPicture& picture) {
   return showResponder(stage, picture.target);
 }
 
-Reading background(const Stage&, const ViewPicture& picture) {
+Reading background(const Stage&, const drivers::ViewPicture& picture) {
   return picture.background ? Reading(showColor(*picture.background)) : std::nullopt;
 }
 
 template <ShowAttribute attribute>
-Reading throughout(const Stage&, const ViewPicture& picture) {
+Reading throughout(const Stage&, const drivers::ViewPicture& picture) {
   return showThroughout(styledText(picture), attribute);
 }
 
-Reading runs(const Stage&, const ViewPicture& picture) { return showRuns(styledText(picture)); }
+Reading runs(const Stage&, const drivers::ViewPicture& picture) {
+  return showRuns(styledText(picture));
+}
 
 // --- writing ---
 
@@ -161,7 +167,7 @@ void setBackground(Stage&, const View& view, const Wanted& value) {
 
 struct Property {
   PropertyInfo info;
-  Reading (*read)(const Stage& stage, const ViewPicture& picture);
+  Reading (*read)(const Stage& stage, const drivers::ViewPicture& picture);
   void (*write)(Stage& stage, const View& view, const Wanted& value);
 };
 
@@ -218,4 +224,4 @@ Reading showResponder(const Stage& stage, const std::shared_ptr<toolkit::Respond
   return responder == stage.engines.current() ? "engine" : "other";
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -4,13 +4,13 @@
 #include <filesystem>
 #include <optional>
 
-#include "toolkit/property_list/reader.hpp"
+#include "qz/property_list/reader.hpp"
 #include "tools/scenario/statements.hpp"
 #include "tools/scenario/unmet.hpp"
 #include "tools/scenario/values.hpp"
-#include "tools/stack_guard.hpp"
+#include "tools/support/stack_guard.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace driving {
 namespace {
 
@@ -204,4 +204,4 @@ constexpr StatementKind table[] = {
 
 std::span<const StatementKind> drivingStatements() { return driving::table; }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -7,7 +7,7 @@
 
 #include "tools/scenario/unmet.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 EngineHolder::~EngineHolder() {
   for (const auto& begun : begun_) {
@@ -38,4 +38,4 @@ std::shared_ptr<Engine> EngineHolder::existing() const {
   return engine;
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

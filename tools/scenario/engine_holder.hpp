@@ -5,9 +5,9 @@
 #include <memory>
 #include <vector>
 
-#include "QZ_Plist_State_Parser.hpp"
+#include "qz/engine.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 using Engine = QZ_Plist_State_Parser;
 
@@ -37,4 +37,4 @@ class EngineHolder {
   std::vector<std::weak_ptr<Engine>> begun_;  // all of them
 };
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -4,12 +4,12 @@
 #include <type_traits>
 #include <utility>
 
-#include "toolkit/table.hpp"
+#include "qz/toolkit/table.hpp"
 #include "tools/scenario/properties.hpp"
 #include "tools/scenario/property_table.hpp"
 #include "tools/scenario/values.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace engine_properties {
 namespace {
 
@@ -189,4 +189,4 @@ Reading showTimer(const toolkit::Ref<toolkit::Timer>& timer) {
   return Json{{"interval", timer->interval()}, {"valid", timer->isValid()}};
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -8,7 +8,7 @@
 #include "tools/scenario/values.hpp"
 #include "tools/scenario/wildcard.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace expecting {
 namespace {
 
@@ -170,4 +170,4 @@ constexpr StatementKind table[] = {
 
 std::span<const StatementKind> expectingStatements() { return expecting::table; }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -8,9 +8,9 @@
 #include <optional>
 
 #include "tools/scenario/slots.hpp"
-#include "tools/suggestions.hpp"
+#include "tools/support/suggestions.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 std::vector<std::string_view> split(std::string_view text, char separator) {
@@ -201,4 +201,4 @@ Match matchForm(std::span<const Word> words, Position end, const Vocabulary& voc
   refuse(words, end, mismatches, syntax);
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

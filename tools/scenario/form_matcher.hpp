@@ -13,7 +13,7 @@
 #include "tools/scenario/references.hpp"
 #include "tools/scenario/vocabulary.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// Returns the first word of a form.
 std::string_view keywordOf(const Form& form);
@@ -31,4 +31,4 @@ struct Match {
 Match matchForm(std::span<const Word> words, Position end, const Vocabulary& vocabulary,
                 const Names& names);
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

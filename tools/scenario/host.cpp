@@ -6,9 +6,9 @@
 #include <algorithm>
 #include <iterator>
 
-#include "toolkit/window.hpp"
+#include "qz/toolkit/window.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 bool HostResponder::tryToPerform(std::string_view name, const toolkit::Ref<toolkit::View>& sender) {
   if (name != action) return false;
@@ -33,4 +33,4 @@ std::vector<Reactions::Reaction> Reactions::take(const Event& event) {
   return reactions;
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

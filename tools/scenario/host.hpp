@@ -9,11 +9,11 @@
 #include <utility>
 #include <vector>
 
-#include "toolkit/application.hpp"
-#include "toolkit/responder.hpp"
+#include "qz/toolkit/application.hpp"
+#include "qz/toolkit/responder.hpp"
 #include "tools/scenario/arguments.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// The target of the controls named by `target`, and the delegate of the windows named by
 /// `delegate`.
@@ -70,4 +70,4 @@ class Reactions {
   std::vector<Reaction> waiting_;
 };
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -8,7 +8,7 @@
 #include "tools/scenario/unmet.hpp"
 #include "tools/scenario/wildcard.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace host_statements {
 namespace {
 
@@ -133,4 +133,4 @@ constexpr StatementKind table[] = {
 
 std::span<const StatementKind> hostStatements() { return host_statements::table; }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -7,7 +7,7 @@
 #include <map>
 #include <utility>
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 bool isInteger(const Json& value) { return value.is_number_integer(); }
@@ -83,4 +83,4 @@ std::string show(const std::optional<Json>& value) { return value ? show(*value)
 
 std::string inQuotes(std::string_view text) { return show(Json(text)); }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -8,7 +8,7 @@
 #include <string>
 #include <string_view>
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// JSON whose objects keep the order of their keys.
 using Json = nlohmann::ordered_json;
@@ -37,4 +37,4 @@ std::string show(const std::optional<Json>& value);
 /// Returns `text` in quotation marks, with JSON's escapes.
 std::string inQuotes(std::string_view text);
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -8,7 +8,7 @@
 #include <filesystem>
 #include <string_view>
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 constexpr std::string_view replacement = "\xEF\xBF\xBD";
@@ -137,4 +137,4 @@ std::string junitReport(const std::vector<Report>& reports) {
   return xml + "</testsuites>\n";
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -7,10 +7,10 @@
 
 #include "tools/scenario/runner.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// Returns one test suite per file, in the order of the reports, with one test case per scenario.
 /// Characters that XML does not allow become U+FFFD.
 std::string junitReport(const std::vector<Report>& reports);
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -8,15 +8,16 @@
 #include <set>
 #include <utility>
 
-#include "toolkit/ascii.hpp"
+#include "text/ascii.hpp"
+#include "text/hexadecimal.hpp"
+#include "text/utf8.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
-using toolkit::isDigit;
+using text::isDigit;
 
 bool isBlank(char c) { return c == ' ' || c == '\t' || c == '\r'; }
-bool isHexDigit(char c) { return isDigit(c) || (c >= 'a' && c <= 'f') || (c >= 'A' && c <= 'F'); }
 bool continuesCharacter(char c) { return (static_cast<unsigned char>(c) & 0xC0U) == 0x80U; }
 
 /// Returns the message of a JSON error without the library's prefix and position.
@@ -110,8 +111,8 @@ class Lexer {
   bool atComment() const {
     if (peek() != '#') return false;
     std::size_t ahead = peek(1) == '-' ? 2 : 1;
-    if (!isDigit(peek(ahead))) return true;
-    while (isDigit(peek(ahead))) ++ahead;
+    if (!text::isDigit(peek(ahead))) return true;
+    while (text::isDigit(peek(ahead))) ++ahead;
     return !atWordEnd(ahead) && peek(ahead) != '.';
   }
 
@@ -162,7 +163,8 @@ class Lexer {
     }
     escape += take();
     for (int digits = 0; escape[1] == 'u' && digits < 4; ++digits) {
-      if (!isHexDigit(peek())) throw SyntaxError(at, "expected four hexadecimal digits after \\u");
+      if (!text::isHexadecimalDigit(peek()))
+        throw SyntaxError(at, "expected four hexadecimal digits after \\u");
       escape += take();
     }
     return escape;
@@ -248,27 +250,10 @@ class Lexer {
   Position at_;
 };
 
-/// Returns the length of the character at the start of `text`; 0 if it is not UTF-8.
-std::size_t characterLength(std::string_view text) {
-  const auto byte = [&](std::size_t i) -> unsigned {
-    return i < text.size() ? static_cast<unsigned char>(text[i]) : 0;
-  };
-  if (byte(0) < 0x80) return 1;
-  const std::size_t length = byte(0) < 0xC2 ? 0 : byte(0) < 0xE0 ? 2 : byte(0) < 0xF0 ? 3 : 4;
-  if (length == 0 || byte(0) > 0xF4) return 0;
-  for (std::size_t i = 1; i < length; ++i) {
-    if ((byte(i) & 0xC0U) != 0x80U) return 0;
-  }
-  // Overlong forms, surrogates, and code points above U+10FFFF.
-  const bool wrong = (byte(0) == 0xE0 && byte(1) < 0xA0) || (byte(0) == 0xED && byte(1) > 0x9F) ||
-                     (byte(0) == 0xF0 && byte(1) < 0x90) || (byte(0) == 0xF4 && byte(1) > 0x8F);
-  return wrong ? 0 : length;
-}
-
 void requireText(std::string_view text) {
   Position at;
   while (!text.empty()) {
-    const auto length = characterLength(text);
+    const auto length = text::utf8Length(text, 0);
     if (length == 0) throw SyntaxError(at, "a byte that is no UTF-8");
     const auto c = static_cast<unsigned char>(text[0]);
     const bool endsLine = c == '\n' || text.starts_with("\r\n");
@@ -288,4 +273,4 @@ std::vector<Line> readWords(std::string_view text) {
   return Lexer(text).lines();
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -14,7 +14,7 @@
 
 #include "tools/scenario/json.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// A place in a file. Both count from 1; columns count characters.
 struct Position {
@@ -57,4 +57,4 @@ inline constexpr int deepestNesting = 512;
 /// Returns the words of `text`, which must be UTF-8, by statement. Throws a SyntaxError.
 std::vector<Line> readWords(std::string_view text);
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

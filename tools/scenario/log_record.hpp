@@ -8,7 +8,7 @@
 #include <string_view>
 #include <vector>
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 class LogRecord {
  public:
@@ -33,4 +33,4 @@ class LogRecord {
   std::size_t expected_ = 0;
 };
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

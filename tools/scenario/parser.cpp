@@ -12,7 +12,7 @@
 #include "tools/scenario/references.hpp"
 #include "tools/scenario/slots.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 // The statements that structure the file. Their forms follow the vocabulary's own.
@@ -143,4 +143,4 @@ ScenarioFile parseScenarios(std::string_view text, const Vocabulary& vocabulary)
   return FileParser(vocabulary).parse(text);
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

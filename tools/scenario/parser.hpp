@@ -15,7 +15,7 @@
 #include "tools/scenario/arguments.hpp"
 #include "tools/scenario/vocabulary.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// What follows `=>`.
 struct Clause {
@@ -46,4 +46,4 @@ struct ScenarioFile {
 /// Returns the scenarios in `text`, at least one. Throws a SyntaxError.
 ScenarioFile parseScenarios(std::string_view text, const Vocabulary& vocabulary);
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

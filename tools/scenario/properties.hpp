@@ -10,7 +10,7 @@
 #include "tools/scenario/stage.hpp"
 #include "tools/scenario/vocabulary.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 std::vector<PropertyInfo> engineProperties();
 std::vector<PropertyInfo> controlProperties();
@@ -35,4 +35,4 @@ Reading showResponder(const Stage& stage, const std::shared_ptr<toolkit::Respond
 /// Shows a timer: its interval, and whether it can still fire.
 Reading showTimer(const toolkit::Ref<toolkit::Timer>& timer);
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -10,7 +10,7 @@
 
 #include "tools/scenario/vocabulary.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// Returns the row for the property `name`, which must exist, in a table whose rows have an `info`.
 template <class Table>
@@ -28,4 +28,4 @@ std::vector<PropertyInfo> infosOf(const Table& table) {
   return infos;
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

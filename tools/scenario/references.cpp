@@ -7,7 +7,7 @@
 #include <charconv>
 #include <iterator>
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 // Words that mean something else where a name is expected.
@@ -106,4 +106,4 @@ std::vector<std::string_view> Names::all() const {
   return names;
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -10,10 +10,10 @@
 #include <string_view>
 #include <vector>
 
-#include "toolkit/tag.hpp"
+#include "qz/toolkit/tag.hpp"
 #include "tools/scenario/lexer.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// Returns the tag in "#TAG"; absent if `text` is something else.
 std::optional<toolkit::Tag> tagIn(std::string_view text);
@@ -51,4 +51,4 @@ class Names {
   std::map<std::string, Declared, std::less<>> names_;
 };
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

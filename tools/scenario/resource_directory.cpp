@@ -8,10 +8,10 @@
 #include <random>
 #include <system_error>
 
-#include "tools/failure.hpp"
 #include "tools/scenario/unmet.hpp"
+#include "tools/support/failure.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 namespace fs = std::filesystem;
@@ -74,4 +74,4 @@ void ResourceDirectory::writeImage(const std::string& name) const {
   write(name + ".png", std::string(image.begin(), image.end()));
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -7,7 +7,7 @@
 #include <string>
 #include <string_view>
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 class ResourceDirectory {
  public:
@@ -32,4 +32,4 @@ class ResourceDirectory {
   std::filesystem::path root_;  // holds the directory, and nothing else
 };
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -7,9 +7,9 @@
 #include <chrono>
 
 #include "tools/scenario/stage.hpp"
-#include "tools/suggestions.hpp"
+#include "tools/support/suggestions.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 void perform(Stage& stage, const LoadedFile& file, const Scenario& scenario) {
@@ -57,4 +57,4 @@ Report Runner::run(const LoadedFile& file, const Scenario& scenario) const {
   return report;
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

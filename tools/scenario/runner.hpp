@@ -8,10 +8,10 @@
 #include <string>
 #include <vector>
 
-#include "toolkit/test_driver.hpp"
+#include "drivers/driver.hpp"
 #include "tools/scenario/parser.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// A scenario file that was read.
 struct LoadedFile {
@@ -36,7 +36,7 @@ struct Report {
 
 struct Runner {
   /// Makes the driver for one scenario.
-  std::function<std::unique_ptr<toolkit::TestDriver>()> makeDriver;
+  std::function<std::unique_ptr<drivers::Driver>()> makeDriver;
   std::string toolkit;  ///< the name of its toolkit
   /// Called after each statement that succeeded: file, statement, outcome in words.
   std::function<void(const std::string&, const Statement&, const std::string&)> performed;
@@ -47,4 +47,4 @@ struct Runner {
 /// Returns the scenario's title, or the file's name if the whole file is the scenario.
 std::string titleOf(const LoadedFile& file, const Scenario& scenario);
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -9,9 +9,9 @@
 #include <system_error>
 
 #include "tools/scenario/statements.hpp"
-#include "tools/whole_file.hpp"
+#include "tools/support/whole_file.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 namespace fs = std::filesystem;
@@ -67,4 +67,4 @@ ReadFiles readScenarios(const std::vector<std::string>& paths) {
   return read;
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

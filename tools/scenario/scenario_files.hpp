@@ -7,7 +7,7 @@
 
 #include "tools/scenario/runner.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 struct ReadFiles {
   std::vector<LoadedFile> files;
@@ -19,4 +19,4 @@ struct ReadFiles {
 /// is read once.
 ReadFiles readScenarios(const std::vector<std::string>& paths);
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -6,13 +6,13 @@
 #include <fstream>
 #include <sstream>
 
-#include "toolkit/property_list/xml_writer.hpp"
+#include "qz/property_list/xml_writer.hpp"
 #include "tools/scenario/statements.hpp"
 #include "tools/scenario/unmet.hpp"
 #include "tools/scenario/values.hpp"
-#include "tools/view_kinds.hpp"
+#include "tools/support/view_kinds.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace setting_up {
 namespace {
 
@@ -133,4 +133,4 @@ constexpr StatementKind table[] = {
 
 std::span<const StatementKind> settingUpStatements() { return setting_up::table; }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -9,10 +9,10 @@
 #include <iterator>
 #include <limits>
 
-#include "tools/suggestions.hpp"
-#include "tools/view_kinds.hpp"
+#include "tools/support/suggestions.hpp"
+#include "tools/support/view_kinds.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 constexpr std::int64_t mostRepeats = 1'000'000;
@@ -104,11 +104,11 @@ bool isClass(const Word& word, SlotContext& context) {
 
 bool isConstant(const Word& word, SlotContext& context) {
   if (!isWord(word, context)) return false;
-  const auto& constants = context.vocabulary.constants;
+  const auto& known = context.vocabulary.constants;
   const auto matches = [&](std::string_view name) { return name == fullConstantName(word.text); };
-  if (std::any_of(constants.begin(), constants.end(), matches)) return true;
+  if (std::any_of(known.begin(), known.end(), matches)) return true;
   throw SyntaxError(word.at, "unknown command name " + inQuotes(word.text) +
-                                 didYouMean(fullConstantName(word.text), constants));
+                                 didYouMean(fullConstantName(word.text), known));
 }
 
 bool isNewName(const Word& word, SlotContext& context) {
@@ -279,4 +279,4 @@ std::optional<NameKind> declaredBy(std::string_view slot) {
   return std::nullopt;
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

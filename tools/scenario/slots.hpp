@@ -7,7 +7,7 @@
 #include "tools/scenario/references.hpp"
 #include "tools/scenario/vocabulary.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 struct SlotContext {
   const Vocabulary& vocabulary;
@@ -29,4 +29,4 @@ const Slot& slotNamed(std::string_view name);
 /// Returns what a slot declares: `+W` a window, `+C` a control, `+NAME` a kept value; else absent.
 std::optional<NameKind> declaredBy(std::string_view slot);
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

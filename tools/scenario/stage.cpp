@@ -8,9 +8,9 @@
 
 #include "tools/scenario/statements.hpp"
 #include "tools/scenario/unmet.hpp"
-#include "tools/stack_guard.hpp"
+#include "tools/support/stack_guard.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 /// Replaces a value, and restores the old one on destruction.
@@ -71,7 +71,7 @@ void requireOutcome(const Clause& clause, const Outcome& outcome, const Cast& ca
 
 }  // namespace
 
-Stage::Stage(toolkit::TestDriver& driverToUse, std::string nameOfFile, Performed performed)
+Stage::Stage(drivers::Driver& driverToUse, std::string nameOfFile, Performed performed)
     : driver(driverToUse),
       file(std::move(nameOfFile)),
       classNames(driverToUse),
@@ -156,4 +156,4 @@ std::string Stage::withPaths(std::string text) const {
   return replaceAll(std::move(text), "$MISSING", resources.missingPath());
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

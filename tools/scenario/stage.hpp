@@ -8,7 +8,7 @@
 #include <optional>
 #include <string>
 
-#include "toolkit/test_driver.hpp"
+#include "drivers/driver.hpp"
 #include "tools/scenario/cast.hpp"
 #include "tools/scenario/class_names.hpp"
 #include "tools/scenario/command_names.hpp"
@@ -18,7 +18,7 @@
 #include "tools/scenario/parser.hpp"
 #include "tools/scenario/resource_directory.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// The value that a property shows, as JSON; no value for `absent`.
 using Reading = std::optional<Json>;
@@ -55,7 +55,7 @@ class Stage {
   /// `file` is the scenario's, as messages name it. `performed` is called after each statement that
   /// succeeded, with its outcome in words.
   using Performed = std::function<void(const Statement&, const std::string& outcome)>;
-  Stage(toolkit::TestDriver& driver, std::string file, Performed performed);
+  Stage(drivers::Driver& driver, std::string file, Performed performed);
   ~Stage();
   Stage(const Stage&) = delete;
   Stage& operator=(const Stage&) = delete;
@@ -69,7 +69,7 @@ class Stage {
   /// Returns "FILE:LINE".
   std::string placeOf(const Statement& statement) const;
 
-  toolkit::TestDriver& driver;
+  drivers::Driver& driver;
   const std::string file;
   const ClassNames classNames;
   const ResourceDirectory resources;
@@ -95,4 +95,4 @@ class Stage {
   std::optional<Failed> failedReaction_;
 };
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

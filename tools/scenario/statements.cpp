@@ -6,7 +6,7 @@
 #include "tools/scenario/command_names.hpp"
 #include "tools/scenario/properties.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 const std::vector<StatementKind>& statementKinds() {
   static const auto kinds = [] {
@@ -30,4 +30,4 @@ const Vocabulary& vocabulary() {
   return vocabulary;
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -9,7 +9,7 @@
 #include "tools/scenario/stage.hpp"
 #include "tools/scenario/vocabulary.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 struct StatementKind {
   std::string_view syntax;
@@ -29,4 +29,4 @@ const std::vector<StatementKind>& statementKinds();
 /// Returns the language, as the parser needs to know it.
 const Vocabulary& vocabulary();
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

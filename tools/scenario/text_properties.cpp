@@ -7,7 +7,7 @@
 #include <cmath>
 #include <cstdio>
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 using toolkit::TextAlignment;
@@ -144,4 +144,4 @@ std::string showColor(const toolkit::Color& color) {
   return {text, std::size_t{color.alpha == 1 ? 7U : 9U}};
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

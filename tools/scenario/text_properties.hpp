@@ -4,10 +4,10 @@
 
 #include <string>
 
-#include "toolkit/styled_text/attributed_string.hpp"
+#include "qz/styled_text/attributed_string.hpp"
 #include "tools/scenario/json.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// Shows one attribute as JSON; absent if the text does not set it.
 using ShowAttribute = std::optional<Json> (*)(const toolkit::TextAttributes& attributes);
@@ -32,4 +32,4 @@ Json showRuns(const toolkit::AttributedString& text);
 /// Returns "#rrggbb", followed by the alpha if the colour is not opaque.
 std::string showColor(const toolkit::Color& color);
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

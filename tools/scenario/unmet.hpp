@@ -5,7 +5,7 @@
 #include <stdexcept>
 #include <string>
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// Thrown if something that a statement needs or expects is not so.
 class Unmet : public std::runtime_error {
@@ -14,4 +14,4 @@ class Unmet : public std::runtime_error {
       : std::runtime_error("expected " + expected + ", got " + got) {}
 };
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -12,9 +12,10 @@
 #include <utility>
 #include <vector>
 
-#include "toolkit/property_list/scalars.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "text/hexadecimal.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 using toolkit::Number;
@@ -47,17 +48,6 @@ Json fromNumber(const Number& number) {
       break;
   }
   return fromReal(number.doubleValue());
-}
-
-std::string hexadecimal(std::string_view bytes) {
-  constexpr std::string_view digits = "0123456789abcdef";
-  std::string text;
-  for (const char c : bytes) {
-    const auto byte = static_cast<unsigned char>(c);
-    text += digits[byte >> 4U];
-    text += digits[byte & 0xFU];
-  }
-  return text;
 }
 
 Json fromElements(std::span<const ValueRef<>> elements) {
@@ -119,7 +109,7 @@ Json toJson(const ValueRef<>& value) {
     case Kind::set:
       return {{"set", fromElements(static_cast<const toolkit::Set&>(*value).elements())}};
     case Kind::data:
-      return {{"data", hexadecimal(static_cast<const toolkit::Data&>(*value).bytes())}};
+      return {{"data", text::hexadecimal(static_cast<const toolkit::Data&>(*value).bytes())}};
     case Kind::uid:
       return {{"uid", static_cast<const toolkit::Uid&>(*value).number()}};
     case Kind::date:
@@ -129,4 +119,4 @@ Json toJson(const ValueRef<>& value) {
   return nullptr;
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -2,11 +2,11 @@
 // Converts JSON to property-list values, and back.
 #pragma once
 
-#include "toolkit/property_list/collections.hpp"
-#include "toolkit/property_list/value.hpp"
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/value.hpp"
 #include "tools/scenario/json.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// Numbers written without a fraction become integers. Collections are mutable. `json` must not
 /// contain null, which property lists lack.
@@ -18,4 +18,4 @@ toolkit::ValueRef<toolkit::Dictionary> toDictionary(const Json& object);
 /// become their descriptions.
 Json toJson(const toolkit::ValueRef<>& value);
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

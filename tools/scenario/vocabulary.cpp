@@ -7,9 +7,9 @@
 #include <cassert>
 #include <utility>
 
-#include "tools/suggestions.hpp"
+#include "tools/support/suggestions.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 struct NamedValue {
@@ -131,4 +131,4 @@ std::string describe(const Word& word) {
   return word.kind == Word::Kind::json ? "JSON" : inQuotes(word.text);
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -11,7 +11,7 @@
 #include "tools/scenario/json.hpp"
 #include "tools/scenario/lexer.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// What may follow the `=>` of a statement.
 enum class Result {
@@ -102,4 +102,4 @@ std::string fullConstantName(std::string_view name);
 /// Returns the word as messages show it: in quotation marks, or `JSON`.
 std::string describe(const Word& word);
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -7,7 +7,7 @@
 #include <string>
 #include <vector>
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace {
 
 /// Returns the texts between the pattern's stars: one more than there are stars.
@@ -40,4 +40,4 @@ bool matchesPattern(std::string_view pattern, std::string_view text) {
   return text.ends_with(pieces.back());
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -4,10 +4,10 @@
 
 #include <string_view>
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 
 /// Whether `text` matches `pattern`: `*` matches any run of characters, also an empty one, `\*` a
 /// star, everything else itself.
 bool matchesPattern(std::string_view pattern, std::string_view text);
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -5,51 +5,57 @@
 #include "tools/scenario/property_table.hpp"
 #include "tools/scenario/text_properties.hpp"
 
-namespace tools::scenario {
+namespace qz::tools::scenario {
 namespace window_properties {
 namespace {
 
-using toolkit::WindowPicture;
+using drivers::WindowPicture;
 using Window = Cast::Window;
 
-Reading visible(const Stage&, const Window&, const WindowPicture& picture) {
+Reading visible(const Stage&, const Window&, const drivers::WindowPicture& picture) {
   return picture.visible;
 }
 
-Reading key(const Stage&, const Window&, const WindowPicture& picture) { return picture.key; }
-Reading closes(const Stage&, const Window&, const WindowPicture& picture) { return picture.closes; }
-Reading style(const Stage&, const Window&, const WindowPicture& picture) { return picture.style; }
-Reading layered(const Stage&, const Window&, const WindowPicture& picture) {
+Reading key(const Stage&, const Window&, const drivers::WindowPicture& picture) {
+  return picture.key;
+}
+Reading closes(const Stage&, const Window&, const drivers::WindowPicture& picture) {
+  return picture.closes;
+}
+Reading style(const Stage&, const Window&, const drivers::WindowPicture& picture) {
+  return picture.style;
+}
+Reading layered(const Stage&, const Window&, const drivers::WindowPicture& picture) {
   return picture.layered;
 }
 
-Reading rect(const Stage&, const Window&, const WindowPicture& picture) {
+Reading rect(const Stage&, const Window&, const drivers::WindowPicture& picture) {
   const auto& content = picture.content;
   return Json{content.x, content.y, content.width, content.height};
 }
 
-Reading background(const Stage&, const Window&, const WindowPicture& picture) {
+Reading background(const Stage&, const Window&, const drivers::WindowPicture& picture) {
   return showColor(picture.background);
 }
 
-Reading delegate(const Stage& stage, const Window&, const WindowPicture& picture) {
+Reading delegate(const Stage& stage, const Window&, const drivers::WindowPicture& picture) {
   return showResponder(stage, picture.delegate);
 }
 
-Reading layerImage(const Stage&, const Window&, const WindowPicture& picture) {
+Reading layerImage(const Stage&, const Window&, const drivers::WindowPicture& picture) {
   return picture.layerImage ? Reading(*picture.layerImage) : std::nullopt;
 }
 
-Reading sheetOf(const Stage& stage, const Window&, const WindowPicture& picture) {
+Reading sheetOf(const Stage& stage, const Window&, const drivers::WindowPicture& picture) {
   const auto name = stage.cast.nameOf(picture.sheetOf);
   return name ? Reading(*name) : std::nullopt;
 }
 
-Reading sheetEnds(const Stage&, const Window&, const WindowPicture& picture) {
+Reading sheetEnds(const Stage&, const Window&, const drivers::WindowPicture& picture) {
   return picture.sheetEnds;
 }
 
-Reading subviews(const Stage&, const Window& window, const WindowPicture&) {
+Reading subviews(const Stage&, const Window& window, const drivers::WindowPicture&) {
   auto names = Json::array();
   for (const auto& view : window->contentView()->subviews()) names.push_back(view->className());
   return names;
@@ -57,7 +63,7 @@ Reading subviews(const Stage&, const Window& window, const WindowPicture&) {
 
 struct Property {
   PropertyInfo info;
-  Reading (*read)(const Stage& stage, const Window& window, const WindowPicture& picture);
+  Reading (*read)(const Stage& stage, const Window& window, const drivers::WindowPicture& picture);
 };
 
 constexpr Takes flag = Takes::flag;
@@ -91,4 +97,4 @@ Reading readWindowProperty(Stage& stage, const Cast::Window& window, std::string
       .read(stage, window, stage.driver.look(window));
 }
 
-}  // namespace tools::scenario
+}  // namespace qz::tools::scenario

@@ -1,0 +1,196 @@
+// SPDX-License-Identifier: MIT
+// Makes, moves and reads views and windows through this toolkit's classes, which also implement
+// time and clicks.
+
+#include "drivers/memory/memory_driver.hpp"
+
+#include <algorithm>
+#include <iterator>
+#include <utility>
+
+#include "toolkit/memory/parts.hpp"
+#include "toolkit/memory/views.hpp"
+#include "toolkit/memory/window.hpp"
+
+namespace qz::drivers {
+
+namespace {
+
+// A kind of view is identified by its class and, for a button, by the effect of a click.
+struct Kind {
+  ViewKind kind;
+  std::string_view className;
+  std::optional<ButtonBehavior> behavior;
+};
+
+constexpr Kind kinds[] = {
+    {ViewKind::button, class_names::button, ButtonBehavior::push},
+    {ViewKind::toggle, class_names::button, ButtonBehavior::toggle},
+    {ViewKind::mixed, class_names::button, ButtonBehavior::mixed},
+    {ViewKind::popUpButton, class_names::popUpButton, ButtonBehavior::popUp},
+    {ViewKind::textField, class_names::textField, std::nullopt},
+    {ViewKind::imageView, class_names::imageView, std::nullopt},
+    {ViewKind::box, class_names::box, std::nullopt},
+    {ViewKind::plain, class_names::view, std::nullopt},
+};
+
+const Kind& rowOf(ViewKind kind) {
+  return *std::find_if(std::begin(kinds), std::end(kinds),
+                       [&](const Kind& row) { return row.kind == kind; });
+}
+
+bool behavesAs(const Kind& row, const MemoryButton* button) {
+  return button ? row.behavior && *row.behavior == button->behavior() : !row.behavior;
+}
+
+// A view whose class is not in the table (a host's own class) counts as plain.
+ViewKind kindOf(View& view) {
+  const auto* const button = dynamic_cast<const MemoryButton*>(&view);
+  const auto* const row = std::find_if(std::begin(kinds), std::end(kinds), [&](const Kind& known) {
+    return known.className == view.className() && behavesAs(known, button);
+  });
+  return row == std::end(kinds) ? ViewKind::plain : row->kind;
+}
+
+std::shared_ptr<ViewNode> makeNode(const Kind& row, const Rect& frame,
+                                   const std::shared_ptr<Screen>& screen) {
+  if (row.behavior) return std::make_shared<MemoryButton>(*row.behavior, frame, screen);
+  if (row.kind == ViewKind::textField) return std::make_shared<MemoryTextField>(frame, screen);
+  if (row.kind == ViewKind::imageView) return std::make_shared<MemoryImageView>(frame, screen);
+  return std::make_shared<MemoryView<View>>(row.className, frame, screen);
+}
+
+std::optional<std::string> nameOf(const Ref<Image>& image) {
+  return image ? std::optional(image->name()) : std::nullopt;
+}
+
+void describe(const ControlNode& control, ViewPicture& picture) {
+  picture.enabled = control.isEnabled();
+  picture.text = control.attributedStringValue();
+  picture.target = control.target();
+  if (!control.action().empty()) picture.action = control.action();
+}
+
+void describe(const MemoryButton& button, ViewPicture& picture) {
+  picture.highlighted = button.isHighlighted();
+  picture.title = *button.attributedTitle();
+  picture.background = button.backgroundColor();
+}
+
+}  // namespace
+
+Ref<Window> MemoryDriver::makeWindow(const Rect& content) {
+  auto window = MemoryWindow::make(toolkit_.application().screen(), content,
+                                   StyleMask::titledAndClosable, KeptBy::maker);
+  window->makeKeyAndOrderFront();
+  return window;
+}
+
+Ref<View> MemoryDriver::makeView(ViewKind kind, Tag tag, const Rect& frame,
+                                 const Ref<View>& parent) {
+  Ref<View> view = makeNode(rowOf(kind), frame, toolkit_.application().screen())->view();
+  view->setTag(tag);
+  parent->addSubview(view);
+  return view;
+}
+
+void MemoryDriver::removeFromSuperview(const Ref<View>& view) {
+  if (const auto node = ViewNode::of(view)) node->removeFromSuperview();
+}
+
+void MemoryDriver::setFrame(const Ref<View>& view, const Rect& frame) {
+  if (const auto node = ViewNode::of(view)) node->setFrame(frame);
+}
+
+void MemoryDriver::setCaption(const Ref<View>& view, std::string_view text) {
+  asTextField(view)->setStringValue(text);
+  asButton(view)->setTitle(text);
+  if (const auto imageView = asImageView(view))
+    imageView->setImage(toolkit_.images().imageNamed(text));
+}
+
+void MemoryDriver::setResourcePath(std::string_view path) {
+  toolkit_.files().setResourcePath(path);
+}
+
+std::string_view MemoryDriver::className(ViewKind kind) const { return rowOf(kind).className; }
+
+void MemoryDriver::click(const Ref<View>& view) {
+  if (const auto button = std::dynamic_pointer_cast<MemoryButton>(view.pointer())) {
+    if (button == held_.lock()) isDown_ = false;
+    button->click();
+  }
+  toolkit_.application().screen()->draw();
+}
+
+void MemoryDriver::hold(const Ref<View>& view) {
+  letGo();
+  const auto button = std::dynamic_pointer_cast<MemoryButton>(view.pointer());
+  if (!button || !button->takesClicks()) return;
+  held_ = button;
+  isDown_ = true;
+  toolkit_.parts().runLoop.setUserIsBusy(true);
+}
+
+void MemoryDriver::letGo() {
+  if (toolkit_.parts().runLoop.isInDefaultMode()) return;
+  toolkit_.parts().runLoop.setUserIsBusy(false);
+  const auto button = held_.lock();
+  if (button && isDown_) button->click();
+  advance(0);
+}
+
+void MemoryDriver::advance(double seconds) {
+  const auto held = held_.lock();
+  if (!held || !held->takesInput()) toolkit_.parts().runLoop.setUserIsBusy(false);
+  toolkit_.parts().runLoop.advance(seconds);
+  toolkit_.application().screen()->draw();
+}
+
+ViewPicture MemoryDriver::look(const Ref<View>& view) {
+  ViewPicture picture;
+  const auto node = ViewNode::of(view);
+  if (!node) return picture;
+  picture.kind = kindOf(*view);
+  picture.className = view->className();
+  picture.tag = view->tag();
+  picture.frame = view->frame();
+  picture.hidden = node->isHidden();
+  picture.state = view->state();
+  picture.toolTip = node->toolTip();
+  if (const auto* control = dynamic_cast<const ControlNode*>(node.get()))
+    describe(*control, picture);
+  if (const auto* button = dynamic_cast<const MemoryButton*>(node.get()))
+    describe(*button, picture);
+  if (const auto* imageView = dynamic_cast<const MemoryImageView*>(node.get()))
+    picture.image = nameOf(imageView->image());
+  return picture;
+}
+
+WindowPicture MemoryDriver::look(const Ref<Window>& window) {
+  WindowPicture picture;
+  const auto shown = MemoryWindow::of(window);
+  if (!shown) return picture;
+  picture.visible = shown->isVisible();
+  picture.key = shown->isKey();
+  picture.closes = shown->closes();
+  picture.content = shown->content();
+  picture.style = static_cast<unsigned>(shown->style());
+  picture.background = shown->backgroundColor();
+  picture.delegate = shown->delegate();
+  const auto content = ViewNode::of(shown->contentView());
+  picture.layered = content->wantsLayer();
+  picture.layerImage = nameOf(content->layerContents());
+  picture.sheetOf = shown->sheetParent();
+  picture.sheetEnds = shown->sheetEnds();
+  return picture;
+}
+
+void MemoryDriver::setLogSink(std::function<void(std::string_view)> sink) {
+  // Without a sink, lines are discarded rather than written to standard error.
+  toolkit_.log().setSink(sink ? std::move(sink) : [](std::string_view) {});
+}
+
+std::unique_ptr<Driver> makeMemoryDriver() { return std::make_unique<MemoryDriver>(); }
+
+}  // namespace qz::drivers

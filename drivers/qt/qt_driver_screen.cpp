@@ -1,0 +1,73 @@
+// SPDX-License-Identifier: MIT
+// The driver's work with a real screen: hands the windows to the person in front of it, and takes
+// pictures of them.
+
+#include <QApplication>
+#include <QPainter>
+#include <QPixmap>
+#include <QTimer>
+#include <limits>
+
+#include "drivers/qt/qt_driver.hpp"
+#include "toolkit/qt/parts.hpp"
+#include "toolkit/qt/strings.hpp"
+#include "toolkit/qt/window.hpp"
+
+namespace qz::drivers {
+
+namespace {
+
+/// Returns a picture of the window and, if it is a sheet, of its parent behind it.
+QPixmap pictureOf(const QtWindow& window) {
+  QPixmap own = window.widget()->grab();
+  const auto parent = window.sheetParent();
+  if (!parent || !parent->widget()) return own;
+
+  const QPoint place = window.widget()->pos() - parent->widget()->pos();
+  const QPixmap under = pictureOf(*parent);
+  const QRect parentArea(QPoint(), under.deviceIndependentSize().toSize());
+  const QRect area = parentArea.united(QRect(place, window.widget()->size()));
+  QPixmap picture(area.size() * own.devicePixelRatio());
+  picture.setDevicePixelRatio(own.devicePixelRatio());
+  picture.fill(Qt::transparent);
+  QPainter painter(&picture);
+  painter.drawPixmap(-area.topLeft(), under);
+  painter.drawPixmap(place - area.topLeft(), own);
+  return picture;
+}
+
+}  // namespace
+
+bool QtDriver::hasPerson() const {
+  const QString platform = QGuiApplication::platformName();
+  return platform != "offscreen" && platform != "minimal" && platform != "vnc";
+}
+
+void QtDriver::handOver(const std::function<void(const Ref<View>&)>& willAct,
+                        const std::function<bool()>& goesOn) {
+  const auto desk = toolkit_.application().desk();
+  desk->willAct = [&](const Ref<View>& view) {
+    clock_.reach(clock_.horizon());  // timers that the action schedules start at this moment
+    willAct(view);
+  };
+  const struct Quiet {
+    Desk& desk;
+    ~Quiet() { desk.willAct = nullptr; }
+  } atTheEnd{*desk};
+
+  const PacedClock::Going going(clock_, std::numeric_limits<double>::max());
+  toolkit_.parts().runLoop.wake();
+  while (goesOn()) {
+    QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
+    raiseWhatWasThrown();
+  }
+}
+
+bool QtDriver::savePicture(const Ref<Window>& window, const std::string& path) {
+  settle();
+  const auto shown = QtWindow::of(window);
+  if (!shown || !shown->widget() || !shown->widget()->isVisible()) return false;
+  return pictureOf(*shown).save(qString(path), "PNG");
+}
+
+}  // namespace qz::drivers

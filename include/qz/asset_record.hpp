@@ -1,0 +1,21 @@
+// SPDX-License-Identifier: MIT
+// The record that the engine keeps of each control of an adopted window.
+#pragma once
+
+#include <array>
+#include <string>
+
+#include "qz/toolkit/ref.hpp"
+#include "qz/toolkit/view.hpp"
+
+namespace qz {
+
+/// A control at the time of its discovery: its class name (a list of one), its frame (x, y, width,
+/// height, in single precision) and the control itself, which its window owns.
+struct AssetRecord {
+  std::array<std::string, 1> classNames;
+  std::array<float, 4> frame{};
+  toolkit::StoredRef<toolkit::View> control;
+};
+
+}  // namespace qz

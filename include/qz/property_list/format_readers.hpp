@@ -1,0 +1,32 @@
+// SPDX-License-Identifier: MIT
+// The readers of the three formats, for use by reader.hpp.
+//
+// Each makes its values in `document` and returns the root, or throws RefusedAt; after that the
+// document is of no use. `offsets`, unless null, receives the position at which each value starts.
+#pragma once
+
+#include <cstddef>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+#include "qz/property_list/document.hpp"
+#include "qz/property_list/refusal.hpp"
+#include "qz/property_list/value.hpp"
+
+namespace qz::toolkit {
+
+/// Values, including keys, and the byte at which each starts.
+using ValueOffsets = std::vector<std::pair<const Value*, std::size_t>>;
+
+/// The limit of nesting, so that no file exhausts the stack: the platform's own limit.
+constexpr std::size_t deepestNesting = 512;
+
+/// `bytes` is the whole file.
+Value* readBinary(std::string_view bytes, Document& document, ValueOffsets* offsets);
+/// `text` is the file in UTF-8, not checked yet.
+Value* readXml(std::string_view text, Document& document, ValueOffsets* offsets);
+/// `text` is the file in UTF-8, not checked yet.
+Value* readOldStyle(std::string_view text, Document& document, ValueOffsets* offsets);
+
+}  // namespace qz::toolkit

@@ -1,0 +1,17 @@
+// SPDX-License-Identifier: MIT
+// The exception by which the format readers refuse a file; it stays within the readers.
+#pragma once
+
+#include <cstddef>
+#include <string>
+
+namespace qz::toolkit {
+
+/// Thrown by a reader: the reason for refusal, and the offset in bytes in the text that it was
+/// given.
+struct RefusedAt {
+  std::size_t offset;
+  std::string reason;
+};
+
+}  // namespace qz::toolkit

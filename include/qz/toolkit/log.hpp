@@ -1,0 +1,17 @@
+// SPDX-License-Identifier: MIT
+// The log: where diagnostic lines go (`NSLog` on macOS).
+#pragma once
+
+#include <string_view>
+
+namespace qz::toolkit {
+
+class Log {
+ public:
+  virtual ~Log() = default;
+
+  /// Writes one line, passed without its line end. Lines have no levels.
+  virtual void write(std::string_view line) = 0;
+};
+
+}  // namespace qz::toolkit

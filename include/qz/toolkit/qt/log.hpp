@@ -1,0 +1,26 @@
+// SPDX-License-Identifier: MIT
+// The Qt toolkit's log.
+#pragma once
+
+#include <functional>
+#include <string_view>
+#include <utility>
+
+#include "qz/toolkit/log.hpp"
+
+namespace qz::toolkit::qt {
+
+class QtLog final : public Log {
+ public:
+  using Sink = std::function<void(std::string_view)>;
+
+  /// Writes to the sink; without one, to Qt's message handler as an info message of the category
+  /// "qz.walkthrough".
+  void write(std::string_view line) override;
+  void setSink(Sink sink) { sink_ = std::move(sink); }
+
+ private:
+  Sink sink_;
+};
+
+}  // namespace qz::toolkit::qt

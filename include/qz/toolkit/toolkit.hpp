@@ -1,0 +1,36 @@
+// SPDX-License-Identifier: MIT
+// A toolkit: bundles the interfaces through which the engine reaches its platform.
+#pragma once
+
+#include <optional>
+#include <string_view>
+
+#include "qz/styled_text/attributed_string.hpp"
+#include "qz/styled_text/fonts.hpp"
+#include "qz/toolkit/application.hpp"
+#include "qz/toolkit/files.hpp"
+#include "qz/toolkit/image.hpp"
+#include "qz/toolkit/log.hpp"
+#include "qz/toolkit/run_loop.hpp"
+
+namespace qz::toolkit {
+
+/// Passed to an engine at its construction; must outlive every engine that uses it. All of it is
+/// used on one thread, the application's event thread.
+class Toolkit {
+ public:
+  virtual ~Toolkit() = default;
+
+  virtual Application& application() = 0;
+  virtual RunLoop& runLoop() = 0;
+  virtual Images& images() = 0;
+  virtual Fonts& fonts() = 0;
+  virtual Files& files() = 0;
+  virtual Log& log() = 0;
+
+  /// Converts an HTML document to styled text; absent if it cannot be read. A platform with an HTML
+  /// reader of its own overrides this; the default is the reader in styled_text/.
+  virtual std::optional<AttributedString> attributedStringWithHTML(std::string_view document);
+};
+
+}  // namespace qz::toolkit

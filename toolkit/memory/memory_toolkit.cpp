@@ -1,0 +1,22 @@
+// SPDX-License-Identifier: MIT
+// The memory toolkit: gives access to its parts.
+
+#include "qz/toolkit/memory/memory_toolkit.hpp"
+
+#include "toolkit/memory/parts.hpp"
+
+namespace qz::toolkit::memory {
+
+MemoryToolkit::MemoryToolkit() : parts_(std::make_unique<Parts>()) {}
+MemoryToolkit::~MemoryToolkit() = default;
+
+MemoryApplication& MemoryToolkit::application() { return parts_->application; }
+RunLoop& MemoryToolkit::runLoop() { return parts_->runLoop; }
+Images& MemoryToolkit::images() { return parts_->images; }
+Fonts& MemoryToolkit::fonts() { return parts_->fonts; }
+SystemFiles& MemoryToolkit::files() { return parts_->files; }
+MemoryLog& MemoryToolkit::log() { return parts_->log; }
+
+void MemoryToolkit::advance(double seconds) { parts_->runLoop.advance(seconds); }
+
+}  // namespace qz::toolkit::memory

@@ -1,0 +1,47 @@
+// SPDX-License-Identifier: MIT
+// The property lists that the tool reads. An error in one ends the command with a Failure that says
+// where ("FILE:LINE:COLUMN"), what is wrong, and what was expected.
+#pragma once
+
+#include <string>
+#include <string_view>
+
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/positions.hpp"
+#include "qz/property_list/value.hpp"
+#include "tools/support/failure.hpp"
+
+namespace qz::tools::play {
+
+class InputFile {
+ public:
+  /// Reads the property list at `path`, in any of the formats. `what` names what the file should
+  /// hold, such as "a script"; `refusal` is the Failure's status if it holds something else.
+  InputFile(std::string path, std::string_view what, ExitStatus refusal = ExitStatus::badInput);
+
+  const std::string& path() const { return path_; }
+  const toolkit::ValueRef<>& root() const { return root_; }
+  /// Returns the root; throws a Failure if it is not a dictionary.
+  toolkit::ValueRef<toolkit::Dictionary> dictionary() const;
+
+  /// Returns the place of a value of this file, such as "intro.plist:12:5"; the path alone for any
+  /// other value.
+  std::string placeOf(const toolkit::ValueRef<>& value) const;
+  /// Throws a Failure: `message`, at the place of `value` in this file.
+  [[noreturn]] void fail(const toolkit::ValueRef<>& value, const std::string& message) const;
+
+ private:
+  void read();
+
+  std::string path_;
+  std::string what_;
+  ExitStatus refusal_;
+  toolkit::ValueRef<> root_;
+  toolkit::PositionTable positions_;
+};
+
+/// Says what was found, for a message: `the string “abc”` or "an array of 3", for example;
+/// "nothing" if the value is absent.
+std::string foundWords(const toolkit::ValueRef<>& value);
+
+}  // namespace qz::tools::play
