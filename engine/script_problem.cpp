@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "engine/script_problem.hpp"
+#include "qz/script_problem.hpp"
 
 #include <algorithm>
 

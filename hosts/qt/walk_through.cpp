@@ -8,7 +8,7 @@
 #include <QMainWindow>
 #include <QScopedValueRollback>
 
-#include "engine/script_problem.hpp"
+#include "qz/script_problem.hpp"
 
 namespace qz::hosts::qt {
 

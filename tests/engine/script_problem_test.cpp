@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // The problems reported for scripts that a host should not play.
-#include "engine/script_problem.hpp"
+#include "qz/script_problem.hpp"
 
 #include <gtest/gtest.h>
 
