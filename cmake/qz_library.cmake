@@ -1,9 +1,9 @@
 # SPDX-License-Identifier: MIT
-# qz_library(NAME [HOT] [LINKS targets...] [PRIVATE_LINKS targets...])
+# qz_library(NAME [HOT] [FOLDERS folders...] [LINKS targets...] [PRIVATE_LINKS targets...])
 #
 # Adds the library of the current folder: target qz_NAME, for users qz::NAME, from all .cpp files in the
-# folder. LINKS are the libraries that the folder may use (docs/layers.md). HOT is for the libraries in
-# which tests spend their time: they are optimised even in builds without a build type.
+# folder and the FOLDERS. LINKS are the libraries that the folder may use (docs/layers.md). HOT is for the
+# libraries in which tests spend their time: they are optimised even in builds without a build type.
 function(qz_library name)
   cmake_parse_arguments(arg "HOT" "" "LINKS;PRIVATE_LINKS;FOLDERS" ${ARGN})
   set(patterns *.cpp)
@@ -20,6 +20,7 @@ function(qz_library name)
     $<BUILD_INTERFACE:${PROJECT_SOURCE_DIR}/include> $<INSTALL_INTERFACE:include>)
   target_link_libraries(qz_${name} PUBLIC ${arg_LINKS}
     PRIVATE $<BUILD_INTERFACE:qz_private> ${arg_PRIVATE_LINKS})
+  install(TARGETS qz_${name} EXPORT qz_walkthrough)
   if(arg_HOT)
     target_compile_options(qz_${name} PRIVATE $<$<CONFIG:>:-O1>)
   endif()
