@@ -41,7 +41,7 @@ void checkReals(std::string_view text) {
   const double real = text::doubleValueOf(text);
   require(std::bit_cast<std::uint64_t>(real) == std::bit_cast<std::uint64_t>(expected),
           "the real is " + std::to_string(expected) + ", not " + std::to_string(real));
-  if (text::namedReal(bare)) require(decimal.empty(), "a name is no decimal real");
+  if (text::namedReal(bare)) require(decimal.empty(), "a name is not a decimal real");
 }
 
 void checkTruncation(std::string_view text) {

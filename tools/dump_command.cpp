@@ -36,8 +36,8 @@ void describeDump(Command& command) {
   const auto options = std::make_shared<DumpOptions>();
   command.argument("FILE", options->file, "The property list");
   command.flag("--canonical", options->canonical,
-               "In one line of ASCII, the same for equal values");
-  command.flag("--dictionary", options->dictionary, "Only if its root is a dictionary");
+               "Print one line of ASCII that is the same for equal values");
+  command.flag("--dictionary", options->dictionary, "Fail unless the root is a dictionary");
   command.action([options] {
     dump(*options);
     return static_cast<int>(ExitStatus::fine);

@@ -50,26 +50,27 @@ void addWindowOptions(Command& command, play::PlayOptions& options) {
   auto window = command.option("--window", options.window,
                                "The host's window, a property list of its controls");
   auto assets = command.option("--assets", options.assets,
-                               "A description of which the engine builds the window");
+                               "A description from which the engine builds the window");
   window.valueName("HOST.plist").excludes(assets);
   assets.valueName("DESCRIPTION.plist");
   command
       .option("--resources", options.resources,
-              "The directory of the images; the script's own without it")
+              "The directory of the images (default: the script's)")
       .valueName("DIR");
-  command.flag("--sheet", options.sheet, "Show it as a sheet over another window of the host");
+  command.flag("--sheet", options.sheet,
+               "Show the window as a sheet over another window of the host");
   options.toolkit = playerToolkit();
-  command.option("--toolkit", options.toolkit, "The toolkit to play it on")
+  command.option("--toolkit", options.toolkit, "The toolkit to play the script on")
       .valueName("NAME")
       .showDefault();
   command
       .option("--screenshots", options.screenshots,
-              "Write a picture after every step there, and the transcript")
+              "Write the transcript and a picture after every step to this directory")
       .valueName("DIR");
 }
 
 void addStepOptions(Command& command, play::PlayOptions& options) {
-  command.option("--start", options.startKey, "The list to start with; else the smallest tag")
+  command.option("--start", options.startKey, "The list to start with (default: the smallest tag)")
       .valueName("KEY");
   command
       .repeatedList(
@@ -79,7 +80,7 @@ void addStepOptions(Command& command, play::PlayOptions& options) {
   command
       .repeated(
           "--advance", [&options](const std::string& text) { addAdvance(options, text); },
-          "Let time pass; in turn with --press, as they stand on the command line")
+          "Let time pass; --advance and --press run in the order given")
       .valueName("SECONDS");
 }
 

@@ -23,9 +23,9 @@ void requireWritableInFull(const play::InputFile& file) {
   const std::uintmax_t bytes = std::filesystem::file_size(file.path(), error);
   const std::uintmax_t most = error ? alwaysFine : std::max(alwaysFine, valuesPerByte * bytes);
   if (toolkit::visitsInWalk(*file.root()) <= most) return;
-  throw Failure(ExitStatus::failed, file.path() + ": stands for more than " + std::to_string(most) +
-                                        " values, as its collections are in many places each; "
-                                        "they cannot all be written out");
+  throw Failure(ExitStatus::failed,
+                file.path() + ": too large to write out: shared collections expand to more than " +
+                    std::to_string(most) + " values");
 }
 
 }  // namespace qz::tools

@@ -22,7 +22,7 @@ const ToolHelp& toolHelp() {
       "be\n"
       "     dumped or converted\n"
       "  2  bad usage, or a file that is not what it should be\n"
-      "  3  a script's lists ran each other without end"};
+      "  3  a script's lists ran each other endlessly"};
   return help;
 }
 

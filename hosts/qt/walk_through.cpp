@@ -109,7 +109,7 @@ std::shared_ptr<QZ_Plist_State_Parser> WalkThrough::load(
   if (!isRead)
     problem = "the file is not a property list with a dictionary";
   else if (lists->count() == 0)
-    problem = "there is no such file, or no list in it";
+    problem = "the file does not exist or contains no list";
   else
     problem = problemOf(lists);
   if (problem.empty()) return engine;

@@ -71,7 +71,7 @@ TEST_F(ViewsTest, AViewRefusesWhatCannotLieInIt) {
       {inner, content, "-[NSBox addSubview:]: the view is the content view of a window"},
       {inner, other->contentView(),
        "-[NSBox addSubview:]: the view is the content view of a window"},
-      {inner, foreign, "-[NSBox addSubview:]: the view, of class , is another toolkit's"},
+      {inner, foreign, "-[NSBox addSubview:]: the view, of class , belongs to another toolkit"},
   };
   for (const auto& c : cases) EXPECT_EQ(refusal(c.parent, c.view), c.reason);
   EXPECT_EQ(tagsIn(content), std::vector<Tag>{1});

@@ -86,7 +86,7 @@ TEST(BinaryWriter, WritesSharedValuesAndEqualStringsOnce) {
 }
 
 TEST(BinaryWriter, RefusesWhatBinaryCannotCarry) {
-  const std::string start = "binary property lists cannot carry ";
+  const std::string start = "binary property lists cannot hold ";
   EXPECT_EQ(binaryRefusalOf(nullptr), start + "an absent value");
   EXPECT_EQ(binaryRefusalOf(Dictionary::make({{Array::make(), Null::make()}})),
             start + "a collection as a key");
@@ -97,7 +97,7 @@ TEST(BinaryWriter, RefusesWhatBinaryCannotCarry) {
   ValueRef<> deep = Array::make();
   for (int i = 1; i < 513; ++i) deep = Array::make({deep});
   EXPECT_EQ(dumpOf(writeBinaryPropertyList(deep)), canonicalDump(*deep));
-  EXPECT_EQ(binaryRefusalOf(Array::make({deep})), start + "more than 512 levels in one another");
+  EXPECT_EQ(binaryRefusalOf(Array::make({deep})), start + "more than 512 nested levels");
 }
 
 }  // namespace

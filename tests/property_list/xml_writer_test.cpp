@@ -114,10 +114,11 @@ TEST(XmlWriter, RefusesWhatXmlCannotCarry) {
       {Null::make(), "null (at the root)"},
       {Array::make({Number::withLong(1), Null::make()}), "null (at /1)"},
       {Dictionary::make({{String::make("k"), Array::make({Set::make({})})}}), "a set (at /k/0)"},
-      {String::make("\xED\xA0\xBD"), "half of a surrogate pair (at the root)"},
+      {String::make("\xED\xA0\xBD"), "half a surrogate pair (at the root)"},
       {Dictionary::make({{Number::withLong(1), String::make("v")}}),
-       "a key that is no string (at /1)"},
-      {Dictionary::make({{Array::make(), String::make("v")}}), "a key that is no string (at /( ))"},
+       "a key that is not a string (at /1)"},
+      {Dictionary::make({{Array::make(), String::make("v")}}),
+       "a key that is not a string (at /( ))"},
       {Date::make(0.5),
        "a date with a fraction of a second, or too far away to count its seconds (at the root)"},
       {Date::make(std::nan("")),
@@ -130,7 +131,7 @@ TEST(XmlWriter, RefusesWhatXmlCannotCarry) {
        "a dictionary of nothing but a number CF$UID, which reads back as a UID (at the root)"},
   };
   for (const auto& [value, reason] : cases) {
-    EXPECT_EQ(xmlRefusalOf(value), "XML property lists cannot carry " + std::string(reason));
+    EXPECT_EQ(xmlRefusalOf(value), "XML property lists cannot hold " + std::string(reason));
   }
 }
 

@@ -116,11 +116,11 @@ TEST_F(WalkThroughs, SayInTheLogWhyAScriptIsNotPlayed) {
     const char* script;
     const char* reason;
   } cases[] = {
-      {"missing.plist", "there is no such file, or no list in it"},
+      {"missing.plist", "the file does not exist or contains no list"},
       {"list.plist", "the file is not a property list with a dictionary"},
       {"word.plist", "the value under the smallest tag, 0, is not a list"},
-      {"names.plist", "no key is a tag, a whole number in decimal"},
-      {"loop.plist", "lists run each other without end: 1 -> 2 -> 1"},
+      {"names.plist", "no key is a tag (a whole decimal number)"},
+      {"loop.plist", "lists run each other endlessly: 1 -> 2 -> 1"},
   };
   write("word.plist", "{ 0 = word; }");
   write("names.plist", "{ start = (IDLE_LOOP); }");

@@ -183,7 +183,7 @@ TEST(PlayDiff, timersCountWhenArmedAndWhenGone) {
   now.timers[1] = {newIdentity(), "5", 2};        // armed again
   now.timers[2] = {newIdentity(), "-1", 1.8e19};  // another timer
   const Changes expected = {{"timer of list -1", "none", "fires practically never"},
-                            {"timer of list 5", "fires in 2 s", "armed anew, fires in 2 s"},
+                            {"timer of list 5", "fires in 2 s", "armed again, fires in 2 s"},
                             {"timer of list 7", "fires in 3 s", "none"}};
   EXPECT_EQ(diffPictures(before, now).engine, expected);
 }

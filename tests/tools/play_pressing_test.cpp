@@ -39,7 +39,7 @@ TEST(PlayPressing, saysWhyAControlCannotBePressed) {
       {2, "control 2 is hidden" + others},
       {3, "control 3 is disabled" + others},
       {4, std::nullopt},
-      {5, "control 5 is no button" + others},
+      {5, "control 5 is not a button" + others},
       {6, "no control has the tag 6" + others},
   };
   for (const auto& c : cases) EXPECT_EQ(whyNotPress(buttons(), c.tag), c.reason) << c.tag;
@@ -78,7 +78,7 @@ TEST(PlayPressing, saysWhatTheWalkThroughWaitsFor) {
   picture.controls.clear();
   picture.timers.clear();
   EXPECT_EQ(standing(picture),
-            "The walk-through stands still: no timer is pending, and no button that can be "
+            "The walk-through is stuck: no timer is pending, and no button that can be "
             "pressed has a list.");
   EXPECT_EQ(whyNoWayOn(picture),
             "no timer is pending, and no button that can be pressed has a list");

@@ -139,13 +139,13 @@ TEST(Play, aWalkThroughThatStandsStillHasFailed) {
   PlayOptions options;
   options.script = "script.plist";
   const std::string line =
-      "qz-walkthrough: script.plist: the walk-through stands still: no timer is pending, and no "
+      "qz-walkthrough: script.plist: the walk-through is stuck: no timer is pending, and no "
       "button that can be pressed has a list\n";
   directory.write("script.plist", "{ 1 = (DISABLE_OBJECT_WITH_ID); }");
   const Played stuck = run(options);
   EXPECT_EQ(stuck.status, ExitStatus::failed);
   EXPECT_TRUE(stuck.log.ends_with(line)) << stuck.log;
-  EXPECT_NE(stuck.transcript.find("\nThe walk-through stands still: "), std::string::npos);
+  EXPECT_NE(stuck.transcript.find("\nThe walk-through is stuck: "), std::string::npos);
   // With a timer pending, or after its end, a walk-through has not failed.
   directory.write("script.plist", "{ 1 = (DISABLE_OBJECT_WITH_ID, (SET_TIMER_FOR_ID, 2, 1)); }");
   EXPECT_EQ(run(options).status, ExitStatus::fine);
@@ -267,7 +267,7 @@ TEST(Play, saysWhatIsWrongWithAFile) {
   options.script = "missing.plist";
   EXPECT_EQ(refusal(options), "missing.plist: no such file; expected a script");
   options.script = "";
-  EXPECT_EQ(refusal(options), "an empty path; expected that of a script");
+  EXPECT_EQ(refusal(options), "empty path; expected the path of a script");
   options.script = ".";
   EXPECT_EQ(refusal(options), ".: a directory; expected a script");
   options = smallScript(directory);

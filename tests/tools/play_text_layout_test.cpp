@@ -23,7 +23,7 @@ TEST(PlayTextLayout, widthIsThatOfATerminal) {
       {"a wide character", "次へ", 4},
       {"an emoji", "\U0001F600", 2},
       {"the last column before the wide ones", "\u10FF", 1},
-      {"a byte that is no UTF-8 is one column", "a\xFFz", 3},
+      {"a byte that is not valid UTF-8 is one column", "a\xFFz", 3},
       {"a sequence that ends too early", "a\xE2\x82", 3},
       {"a longer form than need be", "\xC0\xAF", 2},
       {"half a surrogate pair", "\xED\xA0\x80", 3},

@@ -65,7 +65,7 @@ TEST(ScenarioJunit, whatXmlCannotHoldIsReplaced) {
        "a\xEF\xBF\xBE"
        "b",
        "a\uFFFDb"},
-      {"a byte that is no UTF-8",
+      {"a byte that is not valid UTF-8",
        "a\xFF"
        "b",
        "a\uFFFDb"},

@@ -88,11 +88,11 @@ TEST(ScenarioLexer, refusesWhatIsNoText) {
     std::string text;
     std::string refusal;
   } cases[] = {
-      {"Latin-1", "a\nb \xFC", "2:3: a byte that is no UTF-8"},
-      {"an overlong form", "\xC0\x80", "1:1: a byte that is no UTF-8"},
-      {"a surrogate", "\xED\xA0\x80", "1:1: a byte that is no UTF-8"},
-      {"beyond Unicode", "\xF4\x90\x80\x80", "1:1: a byte that is no UTF-8"},
-      {"a cut character", "ü\xE4\xBE", "1:2: a byte that is no UTF-8"},
+      {"Latin-1", "a\nb \xFC", "2:3: a byte that is not valid UTF-8"},
+      {"an overlong form", "\xC0\x80", "1:1: a byte that is not valid UTF-8"},
+      {"a surrogate", "\xED\xA0\x80", "1:1: a byte that is not valid UTF-8"},
+      {"beyond Unicode", "\xF4\x90\x80\x80", "1:1: a byte that is not valid UTF-8"},
+      {"a cut character", "ü\xE4\xBE", "1:2: a byte that is not valid UTF-8"},
       {"a NUL", std::string("a \0", 3), "1:3: a control character"},
       {"a lone carriage return", "a\rb", "1:2: a control character"},
       {"an escape character", "a\n\x1B", "2:1: a control character"},
@@ -111,17 +111,17 @@ TEST(ScenarioLexer, refusesBrokenWords) {
       {"text behind a quoted word", "\"a\"b",
        "1:4: expected a blank after the closing quotation mark"},
       {"quotation mark in a word", "ab\"c",
-       "1:3: a quotation mark within a word; put a blank before it"},
+       "1:3: a quotation mark inside a word; put a space before it"},
       {"unknown escape", "a \"b\\x\"",
        "1:5: unknown escape; expected \\\" \\\\ \\/ \\b \\f \\n \\r \\t \\uXXXX or \\*"},
       {"short \\u", "\"\\u12\"", "1:2: expected four hexadecimal digits after \\u"},
-      {"half a pair", "a \"\\ud83d\"", "1:3: a \\u escape without its partner"},
+      {"half a pair", "a \"\\ud83d\"", "1:3: an unpaired surrogate in a \\u escape"},
       {"open bracket", "a [1,\n{\n", "1:3: this bracket is never closed"},
       {"open quotation mark in JSON", "[\"a\n\"]",
        "1:2: this quotation mark is not closed on its line"},
       {"text behind JSON", "[1]a", "1:4: expected a blank after the closing bracket"},
       {"a key twice", "a {\"k\": [{\"x\": 1}], \"l\": {\"x\": 1}, \"k\": 2}",
-       "1:3: the key \"k\" stands twice in one object"},
+       "1:3: the key \"k\" occurs twice in one object"},
       {"a number too large", "[1e999]", "1:1: number overflow parsing '1e999'"},
   };
   for (const auto& test : cases) EXPECT_EQ(refusalOf(test.text), test.refusal) << test.name;

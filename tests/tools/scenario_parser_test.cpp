@@ -130,9 +130,9 @@ TEST(ScenarioParser, refusesWrongArguments) {
        "sheet])"},
       {"assets [1]",
        "1:8: found JSON, expected none, entries or a JSON object (assets none|entries|OBJECT)"},
-      {"run [null] for 1", "1:5: null in a value for a property list, which has none"},
+      {"run [null] for 1", "1:5: null is not allowed in a property-list value"},
       {"engine\nscenario", "2:9: found the end of the line, expected a text (scenario TEXT...)"},
-      {"repeat 2 scenario x", "1:10: \"scenario\" cannot stand within another statement"},
+      {"repeat 2 scenario x", "1:10: \"scenario\" cannot be used inside another statement"},
   };
   for (const auto& test : cases) EXPECT_EQ(refusal(test.text), test.refusal) << test.text;
 }
@@ -144,13 +144,14 @@ TEST(ScenarioParser, refusesWrongNames) {
   } cases[] = {
       {"window w\nwindow w", "2:8: \"w\" is already a window, since line 1"},
       {"window w\ncontrol w NSButton 1 in w", "2:9: \"w\" is already a window, since line 1"},
-      {"window tutorial", "1:8: \"tutorial\" has a meaning of its own here; take another name"},
+      {"window tutorial", "1:8: \"tutorial\" is reserved; use another name"},
       {"window a.b",
-       "1:8: \"a.b\" is no name; names are made of letters, digits, _ and -, and begin with a "
+       "1:8: \"a.b\" is not a name; names consist of letters, digits, _ and -, and begin with a "
        "letter "
        "or _"},
       {"window 5",
-       "1:8: \"5\" is no name; names are made of letters, digits, _ and -, and begin with a letter "
+       "1:8: \"5\" is not a name; names consist of letters, digits, _ and -, and begin with a "
+       "letter "
        "or _"},
       {"window w\npress w", "2:7: \"w\" is a window, expected a control"},
       {"adopt #5", "1:7: \"#5\" is a control, expected a window"},
@@ -160,7 +161,7 @@ TEST(ScenarioParser, refusesWrongNames) {
        "2:5: found \"t\", expected constant or NAME.PROPERTY"},
       {"window w\nset w.visible NO", "2:5: \"w.visible\" cannot be set"},
       {"set #1.bold YES",
-       "1:5: \"#1.bold\" cannot be set; what can be: tag, frame, hidden, enabled, state, "
+       "1:5: \"#1.bold\" cannot be set; these can be set: tag, frame, hidden, enabled, state, "
        "highlighted, "
        "title, text, tooltip, image, action, target or background"},
       {"expect engine.flashing.x YES", "1:8: \"engine.flashing\" has no keys"},
@@ -181,8 +182,7 @@ TEST(ScenarioParser, refusesWrongValues) {
       {"expect engine.guiAssets 5",
        "1:25: found \"5\", expected a JSON object, absent, present or empty"},
       {"set engine.guiAssets {}", "1:22: found JSON, expected absent or empty"},
-      {"set engine.commandArray [null]",
-       "1:25: null in a value for a property list, which has none"},
+      {"set engine.commandArray [null]", "1:25: null is not allowed in a property-list value"},
       {"set #1.hidden absent", "1:15: found \"absent\", expected YES or NO"},
   };
   for (const auto& test : cases) EXPECT_EQ(refusal(test.text), test.refusal) << test.text;
@@ -198,7 +198,7 @@ TEST(ScenarioParser, refusesWrongResults) {
       {"adopt none => NO YES", "1:18: found \"YES\", expected the end of the line"},
       {"restore => YES", "1:12: found \"YES\", expected raises"},
       {"find 1 => YES", "1:11: \"YES\" is not declared"},
-      {"expect alive => YES", "1:14: this statement calls nothing that could have a result"},
+      {"expect alive => YES", "1:14: this statement has no result"},
       {"=> YES", "1:1: expected a statement before =>"},
       {"repeat 2 => YES",
        "1:10: found the end of the line, expected a statement (repeat COUNT "
@@ -211,7 +211,7 @@ TEST(ScenarioParser, refusesNamesOfFilesOutsideOfTheResourceDirectory) {
   for (const std::string name :
        {"/etc/passwd", "../x", "a/../../x", "a/..", "$RESOURCES/x", "a//b", "./x", "a\\b"}) {
     EXPECT_EQ(refusal("file " + inQuotes(name) + " text"),
-              "1:6: " + inQuotes(name) + " does not name a file within the resource directory");
+              "1:6: " + inQuotes(name) + " does not name a file in the resource directory");
   }
   EXPECT_EQ(refusal("file a/..b/c.txt text"), "");
   EXPECT_EQ(
@@ -232,7 +232,7 @@ TEST(ScenarioParser, refusesScenariosThatTryNothing) {
 TEST(ScenarioParser, refusesEndlessNesting) {
   std::string text;
   for (int i = 0; i < 21; ++i) text += "repeat 2 ";
-  EXPECT_EQ(refusal(text + "restore"), "1:190: too many statements within one another");
+  EXPECT_EQ(refusal(text + "restore"), "1:190: statements nested too deeply");
 }
 
 }  // namespace

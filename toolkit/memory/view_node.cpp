@@ -48,7 +48,7 @@ void ViewNode::insert(const Ref<View>& view) {
     throw InvalidArgumentException("-[" + className_ + " addSubview:]: " + std::string(what));
   };
   if (!view) refuse("the view is absent");
-  if (!node) refuse("the view, of class " + view->className() + ", is another toolkit's");
+  if (!node) refuse("the view, of class " + view->className() + ", belongs to another toolkit");
   if (!node->window_.expired()) refuse("the view is the content view of a window");
   if (isWithin(*node)) refuse("the view is the superview itself, or lies around it");
 

@@ -147,7 +147,7 @@ Value* BinaryReader::newObject(std::uint64_t index, std::size_t depth) {
   if (values_[index] == beingRead_) refuse(offset, "the object holds itself");
   if (offset < binary::headerSize) refuse(offset, "an object cannot lie in the header");
   if (depth > deepestNesting) {
-    refuse(offset, "more than " + std::to_string(deepestNesting) + " levels in one another");
+    refuse(offset, "more than " + std::to_string(deepestNesting) + " nested levels");
   }
   values_[index] = beingRead_;
   Value* value = content(offset, depth);

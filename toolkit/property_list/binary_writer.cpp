@@ -20,7 +20,7 @@ namespace {
 using binary::Marker;
 
 [[noreturn]] void refuse(const std::string& what) {
-  throw InvalidArgumentException("binary property lists cannot carry " + what);
+  throw InvalidArgumentException("binary property lists cannot hold " + what);
 }
 
 /// Returns the number of bytes that a number needs: 1, 2, 4 or 8.
@@ -56,7 +56,7 @@ std::size_t Objects::indexOf(const Value& value) const {
 
 void Objects::add(const Value& value) {
   if (open_.size() > deepestNesting) {
-    refuse("more than " + std::to_string(deepestNesting) + " levels in one another");
+    refuse("more than " + std::to_string(deepestNesting) + " nested levels");
   }
   if (value.kind() == Value::Kind::nothing) refuse("an absent value");
   if (std::find(open_.begin(), open_.end(), &value) != open_.end()) {

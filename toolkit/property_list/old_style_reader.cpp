@@ -60,7 +60,7 @@ Value* OldStyleReader::noted(Value* value, std::size_t offset) {
 Value* OldStyleReader::value(std::size_t depth) {
   if (!tokens_.skipToToken() || !isAtValue()) tokens_.refuseUnexpected("a value");
   if (depth > deepestNesting) {
-    tokens_.refuse("more than " + std::to_string(deepestNesting) + " levels in one another");
+    tokens_.refuse("more than " + std::to_string(deepestNesting) + " nested levels");
   }
   const std::size_t offset = tokens_.offset();
   return noted(content(depth), offset);

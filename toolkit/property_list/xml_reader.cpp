@@ -80,7 +80,7 @@ Value* XmlReader::content(const XmlTag& tag) {
 /// Reads the elements that must not be self-closed.
 Value* XmlReader::filled(const XmlTag& tag) {
   if (tag.selfClosed) {
-    throw RefusedAt{tag.offset, "<" + std::string(tagName(tag.element)) + "/> needs a content"};
+    throw RefusedAt{tag.offset, "<" + std::string(tagName(tag.element)) + "/> must not be empty"};
   }
   Value* result = nullptr;
   switch (tag.element) {
@@ -108,7 +108,7 @@ Value* XmlReader::filled(const XmlTag& tag) {
 
 void XmlReader::enterContainer() {
   if (depth_ == deepestNesting) {
-    tokens_.refuse("more than " + std::to_string(deepestNesting) + " containers in one another");
+    tokens_.refuse("more than " + std::to_string(deepestNesting) + " nested containers");
   }
   ++depth_;
 }
@@ -188,9 +188,9 @@ Value* XmlReader::dictionary(const XmlTag& tag) {
 }
 
 Value* XmlReader::onlyValueIn(const XmlTag& plist) {
-  if (plist.selfClosed) throw RefusedAt{plist.offset, "<plist/> holds no value"};
+  if (plist.selfClosed) throw RefusedAt{plist.offset, "<plist/> contains no value"};
   XmlTag element;
-  if (!tokens_.open(element)) tokens_.refuse("the <plist> holds no value");
+  if (!tokens_.open(element)) tokens_.refuse("the <plist> contains no value");
   Value* result = value(element);
   if (tokens_.open(element)) {
     throw RefusedAt{element.offset, "a <plist> holds one value only; expected </plist>"};

@@ -38,7 +38,7 @@ void XmlTokens::skipDoctype() {
   const std::size_t end = rest().find_first_of("[>");
   if (end == std::string_view::npos) refuse("the DOCTYPE is not closed");
   at_ += end;
-  if (*at_ == '[') refuse("a DOCTYPE with declarations of its own is not read");
+  if (*at_ == '[') refuse("a DOCTYPE with internal declarations is not supported");
   ++at_;
 }
 
@@ -124,7 +124,7 @@ std::string_view XmlTokens::unusualText(const char* start) {
 std::string_view XmlTokens::resolvedText(const char* start) {
   buffer_.assign(start, at_);
   while (true) {
-    if (at_ == end_) refuse("the file ends inside of a text");
+    if (at_ == end_) refuse("the file ends inside a text");
     if (*at_ == '&') {
       appendEntity();
     } else if (!isAt("<!")) {

@@ -74,13 +74,13 @@ void XmlWriter::refuse(std::string_view what) const {
       path += "/" + std::to_string(level.child);
     }
   }
-  throw InvalidArgumentException("XML property lists cannot carry " + std::string(what) + " (at " +
+  throw InvalidArgumentException("XML property lists cannot hold " + std::string(what) + " (at " +
                                  (path.empty() ? "the root" : path) + ")");
 }
 
 void XmlWriter::checkNesting(std::size_t more) const {
   if (levels_.size() + more > deepestNesting) {
-    refuse("more than " + std::to_string(deepestNesting) + " containers in one another");
+    refuse("more than " + std::to_string(deepestNesting) + " nested containers");
   }
 }
 
@@ -118,7 +118,7 @@ void XmlWriter::string(std::string_view name, std::string_view text) {
   if (text.starts_with(text::byteOrderMark)) text_ += text::byteOrderMark;
   for (std::size_t at = 0; at < text.size();) {
     const char32_t c = text::nextCodePoint(text, at);
-    if (text::isSurrogate(c)) refuse("half of a surrogate pair");
+    if (text::isSurrogate(c)) refuse("half a surrogate pair");
     character(c);
   }
   text_.append("</").append(name).append(">\n");
@@ -168,7 +168,7 @@ void XmlWriter::uid(std::uint32_t number) {
 void XmlWriter::scalar(const Value& value) {
   indent();
   if (isAtKey()) {
-    if (value.kind() != Value::Kind::string) refuse("a key that is no string");
+    if (value.kind() != Value::Kind::string) refuse("a key that is not a string");
     return string("key", static_cast<const String&>(value).text());
   }
   switch (value.kind()) {
@@ -194,7 +194,7 @@ std::string_view tagOf(const Value& collection) {
 }
 
 void XmlWriter::open(const Value& collection) {
-  if (isAtKey()) refuse("a key that is no string");
+  if (isAtKey()) refuse("a key that is not a string");
   if (collection.kind() == Value::Kind::set) refuse("a set");
   if (collection.kind() == Value::Kind::dictionary &&
       isArchiverUid(static_cast<const Dictionary&>(collection))) {

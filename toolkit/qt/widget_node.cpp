@@ -134,7 +134,8 @@ void WidgetNode::insert(const Ref<View>& view) {
   const auto node = of(view);
   const auto receiver = nameOfClass();
   if (!view) refuse(receiver, "the view is absent");
-  if (!node) refuse(receiver, "the view, of class " + view->className() + ", is another toolkit's");
+  if (!node)
+    refuse(receiver, "the view, of class " + view->className() + ", belongs to another toolkit");
   if (!widget_ || !node->widget_) return;
   QWidget& added = *node->widget_;
   if (added.isWindow() && node->keptBy_ == Widget::host)

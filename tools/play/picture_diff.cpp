@@ -149,7 +149,7 @@ void compareTimers(const StepPicture& before, const StepPicture& now,
     const auto words = [](const TimerPicture* timer) {
       return timer ? "fires " + whenWords(timer->timeLeft) : "none";
     };
-    const std::string anew = old && current ? "armed anew, " : "";
+    const std::string anew = old && current ? "armed again, " : "";
     changes.push_back({"timer of list " + key, words(old), anew + words(current)});
   }
 }

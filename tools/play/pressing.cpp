@@ -68,7 +68,7 @@ std::optional<std::string> whyNotPress(const StepPicture& picture, toolkit::Tag 
   const auto is = [&](std::string_view what) {
     return "control " + name + " is " + std::string(what) + pressableWords(picture);
   };
-  if (!isButton(control->view.kind)) return is("no button");
+  if (!isButton(control->view.kind)) return is("not a button");
   return is(control->view.hidden ? "hidden" : "disabled");
 }
 
@@ -80,7 +80,7 @@ std::optional<std::string> whyNoWayOn(const StepPicture& picture) {
 std::string standing(const StepPicture& picture) {
   if (picture.ended) return "The walk-through ended.";
   if (const auto reason = whyNoWayOn(picture)) {
-    return "The walk-through stands still: " + *reason + ".";
+    return "The walk-through is stuck: " + *reason + ".";
   }
   return "The walk-through waits for " + enumerate(waysOn(picture)) + ".";
 }

@@ -148,7 +148,7 @@ void Session::refuse(const std::string& heading, const std::string& reason) {
 
 void Session::conclude() {
   if (const auto reason = whyNoWayOn(picture())) {
-    problems_.push_back("the walk-through stands still: " + *reason);
+    problems_.push_back("the walk-through is stuck: " + *reason);
   }
   const std::string states = recordedStates();
   transcript_.paragraph(standing(picture()) + "\n" +

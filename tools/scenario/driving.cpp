@@ -152,7 +152,7 @@ Outcome timer(Stage& stage, const Arguments& a) {
 Kept keptTimer(const Stage& stage, const std::string& name) {
   const auto kept = stage.kept.find(name);
   if (kept == stage.kept.end() || !kept->second.timer) {
-    throw Unmet("a kept timer", name + ", which is none");
+    throw Unmet("a kept timer", name + ", which is not a timer");
   }
   return kept->second;
 }

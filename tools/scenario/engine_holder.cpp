@@ -34,7 +34,7 @@ std::shared_ptr<Engine> EngineHolder::held() const {
 
 std::shared_ptr<Engine> EngineHolder::existing() const {
   auto engine = current();
-  if (!engine) throw Unmet("an engine", begun_.empty() ? "none" : "a destroyed one");
+  if (!engine) throw Unmet("an engine", begun_.empty() ? "none" : "a destroyed engine");
   return engine;
 }
 

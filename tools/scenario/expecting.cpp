@@ -69,12 +69,12 @@ Outcome noControl(Stage& stage, const Arguments& a) {
 }
 
 Outcome alive(Stage& stage, const Arguments&) {
-  if (!stage.engines.current()) throw Unmet("the engine alive", "a destroyed one");
+  if (!stage.engines.current()) throw Unmet("the engine alive", "a destroyed engine");
   return {};
 }
 
 Outcome destroyed(Stage& stage, const Arguments&) {
-  if (stage.engines.current()) throw Unmet("the engine destroyed", "a living one");
+  if (stage.engines.current()) throw Unmet("the engine destroyed", "a living engine");
   return {};
 }
 

@@ -122,7 +122,7 @@ class Lexer {
     Word word{Word::Kind::bare, {}, {}, at_};
     while (!atWordEnd()) {
       if (peek() == '"')
-        throw SyntaxError(at_, "a quotation mark within a word; put a blank before it");
+        throw SyntaxError(at_, "a quotation mark inside a word; put a space before it");
       word.text += take();
     }
     return word;
@@ -139,9 +139,9 @@ class Lexer {
     }
     raw += take();
     requireWordEnd("the closing quotation mark");
-    // Only a \u escape for half of a surrogate pair can still be wrong.
+    // Only a \u escape for half a surrogate pair can still be wrong.
     const auto decoded = Json::parse(raw, nullptr, false);
-    if (decoded.is_discarded()) throw SyntaxError(word.at, "a \\u escape without its partner");
+    if (decoded.is_discarded()) throw SyntaxError(word.at, "an unpaired surrogate in a \\u escape");
     word.text = decoded.get<std::string>();
     return word;
   }
@@ -192,7 +192,7 @@ class Lexer {
     }
     if (keys.first()) {
       throw SyntaxError(word.at,
-                        "the key " + inQuotes(*keys.first()) + " stands twice in one object");
+                        "the key " + inQuotes(*keys.first()) + " occurs twice in one object");
     }
     return word;
   }
@@ -254,7 +254,7 @@ void requireText(std::string_view text) {
   Position at;
   while (!text.empty()) {
     const auto length = text::utf8Length(text, 0);
-    if (length == 0) throw SyntaxError(at, "a byte that is no UTF-8");
+    if (length == 0) throw SyntaxError(at, "a byte that is not valid UTF-8");
     const auto c = static_cast<unsigned char>(text[0]);
     const bool endsLine = c == '\n' || text.starts_with("\r\n");
     if (c < 0x20 && c != '\t' && !endsLine) {

@@ -79,7 +79,7 @@ class FileParser {
   Statement statement(std::span<const Word> words, Position end, const std::string& source,
                       int depth) {
     if (depth > deepestStatement) {
-      throw SyntaxError(words.front().at, "too many statements within one another");
+      throw SyntaxError(words.front().at, "statements nested too deeply");
     }
     const auto arrow = std::find_if(words.begin(), words.end(),
                                     [](const Word& word) { return word.isBare("=>"); });
@@ -88,7 +88,7 @@ class FileParser {
     auto match = matchForm(call, arrow == words.end() ? end : arrow->at, vocabulary_, names_);
     if (match.form >= ownForms_) {
       throw SyntaxError(words.front().at,
-                        describe(words.front()) + " cannot stand within another statement");
+                        describe(words.front()) + " cannot be used inside another statement");
     }
     for (const auto& [name, kind] : match.declared) names_.declare(name, kind);
     Statement statement{match.form, std::move(match.arguments), {}, words.front().at, source};
@@ -104,7 +104,7 @@ class FileParser {
   /// `words` begins with the arrow.
   Clause clause(std::span<const Word> words, Position end, Result result) {
     if (result == Result::never) {
-      throw SyntaxError(words[0].at, "this statement calls nothing that could have a result");
+      throw SyntaxError(words[0].at, "this statement has no result");
     }
     if (words.size() > 2) {
       throw SyntaxError(words[2].at,

@@ -75,11 +75,11 @@ std::optional<std::string> Names::whyNotNew(const Word& word) const {
   const auto shown = inQuotes(word.text);
   if (!isName(word.text)) {
     return shown +
-           " is no name; names are made of letters, digits, _ and -, and begin with a "
+           " is not a name; names consist of letters, digits, _ and -, and begin with a "
            "letter or _";
   }
   if (std::ranges::find(reservedNames, word.text) != std::end(reservedNames)) {
-    return shown + " has a meaning of its own here; take another name";
+    return shown + " is reserved; use another name";
   }
   if (const auto found = names_.find(word.text); found != names_.end()) {
     return shown + " is already " + std::string(describe(found->second.kind)) + ", since line " +

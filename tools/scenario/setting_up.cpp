@@ -97,7 +97,7 @@ Outcome delegate(Stage& stage, const Arguments& a) {
 
 Outcome target(Stage& stage, const Arguments& a) {
   const auto button = toolkit::asButton(stage.cast.control(a.text("C")));
-  if (!button) throw Unmet("a button", a.text("C") + ", which is none");
+  if (!button) throw Unmet("a button", a.text("C") + ", which is not a button");
   button->setTarget(stage.host);
   button->setAction(HostResponder::action);
   return {};

@@ -58,7 +58,7 @@ bool holdsNull(const Json& value) {
 bool isPropertyList(const Word& word, SlotContext&) {
   if (!readValue(word, anyJson)) return false;
   if (holdsNull(word.value) && word.kind == Word::Kind::json) {
-    throw SyntaxError(word.at, "null in a value for a property list, which has none");
+    throw SyntaxError(word.at, "null is not allowed in a property-list value");
   }
   return true;
 }
@@ -84,7 +84,7 @@ bool isFileName(const Word& word, SlotContext& context) {
       word.text.find_first_of("$\\") != std::string::npos ||
       word.text.find('\0') != std::string::npos) {
     throw SyntaxError(word.at,
-                      inQuotes(word.text) + " does not name a file within the resource directory");
+                      inQuotes(word.text) + " does not name a file in the resource directory");
   }
   return true;
 }
@@ -206,8 +206,9 @@ bool isSettable(const Word& word, SlotContext& context) {
   for (const auto& other : *subject->properties) {
     if (other.written != Takes::nothing) settable.emplace_back(other.name);
   }
-  throw SyntaxError(word.at, inQuotes(word.text) + " cannot be set" +
-                                 (settable.empty() ? "" : "; what can be: " + enumerate(settable)));
+  throw SyntaxError(word.at,
+                    inQuotes(word.text) + " cannot be set" +
+                        (settable.empty() ? "" : "; these can be set: " + enumerate(settable)));
 }
 
 bool isEngineProperty(const Word& word, SlotContext& context) {

@@ -31,7 +31,7 @@ constexpr NamedDriver drivers[] = {
 std::string_view howToGet(std::string_view name) {
   if (name != "qt") return {};
   return "this build is without Qt; install Qt 6.4 Widgets or later (scripts/setup qt, on Debian), "
-         "then configure and build anew";
+         "then configure and build again";
 }
 
 }  // namespace

@@ -21,7 +21,7 @@ namespace {
 }
 
 std::string contentsOf(const std::string& path, const std::string& what) {
-  if (path.empty()) cannotRead("an empty path; expected that of " + what);
+  if (path.empty()) cannotRead("empty path; expected the path of " + what);
   std::error_code error;
   const auto status = std::filesystem::status(path, error);
   if (!exists(status)) cannotRead(path + ": no such file; expected " + what);

@@ -27,8 +27,8 @@ struct Guarded {
 Guarded guarded;  // the script that runs; the tool has one thread
 
 std::string lineFor(const std::string& name, const std::string& loop) {
-  return "qz-walkthrough: " + name +
-         ": the stack is exhausted: lists run each other without end (" + loop + ")\n";
+  return "qz-walkthrough: " + name + ": the stack is exhausted: lists run each other endlessly (" +
+         loop + ")\n";
 }
 
 }  // namespace

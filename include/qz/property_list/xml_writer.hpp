@@ -14,7 +14,7 @@ namespace qz::toolkit {
 ///
 /// Raises an invalid-argument exception, which names the problem and its key or index, for a value
 /// that no XML property list can hold: an absent value, null, a set, a key that is not a string,
-/// half of a surrogate pair, a date with a fraction of a second or too far away for exact seconds,
+/// half a surrogate pair, a date with a fraction of a second or too far away for exact seconds,
 /// a dictionary with only a number `CF$UID` (it reads back as a UID), and more than 512 nested
 /// containers. Control characters, which XML does not allow, are written as character references,
 /// which every property-list reader accepts.
