@@ -43,9 +43,9 @@ struct HostExample : testing::Test {
   }
 };
 
-TEST_F(HostExample, worksBeforeAnyWalkThrough) { expectHostWorks(); }
+TEST_F(HostExample, WorksBeforeAnyWalkThrough) { expectHostWorks(); }
 
-TEST_F(HostExample, isGuidedOverItsOwnWindowAndGoesOnAfterwards) {
+TEST_F(HostExample, IsGuidedOverItsOwnWindowAndGoesOnAfterwards) {
   for (int round = 0; round < 2; ++round) {
     choose(0);
     EXPECT_TRUE(form->guide.isVisible());
@@ -67,13 +67,13 @@ TEST_F(HostExample, isGuidedOverItsOwnWindowAndGoesOnAfterwards) {
   }
 }
 
-TEST_F(HostExample, closesInTheMiddleOfAWalkThroughWhenTheUserWantsIt) {
+TEST_F(HostExample, ClosesInTheMiddleOfAWalkThroughWhenTheUserWantsIt) {
   choose(0);
   EXPECT_TRUE(form->close());
   EXPECT_FALSE(form->isVisible());
 }
 
-TEST_F(HostExample, showsTipsInASheet) {
+TEST_F(HostExample, ShowsTipsInASheet) {
   choose(1);
   EXPECT_TRUE(form->tips.isVisible());
   EXPECT_TRUE(form->tips.isModal());
@@ -87,7 +87,7 @@ TEST_F(HostExample, showsTipsInASheet) {
   expectHostWorks();
 }
 
-TEST_F(HostExample, takesEscapeForTheEndOfItsTips) {
+TEST_F(HostExample, TakesEscapeForTheEndOfItsTips) {
   for (int round = 0; round < 2; ++round) {
     choose(1);
     click(form->tips.next);

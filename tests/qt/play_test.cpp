@@ -63,7 +63,7 @@ constexpr const char* script =
     "  5 = ((SHOW_OBJECT_WITH_ID, 3), (SET_TITLE_FOR_OBJECT_ID, End, 3));"
     "  3 = (TERMINATE_PARSER); }";
 
-TEST(PlayInWindows, takesAPictureOfEveryStep) {
+TEST(PlayInWindows, TakesAPictureOfEveryStep) {
   const Directory scripts;
   PlayOptions options;
   options.script = scripts.write("script.plist", script);
@@ -126,7 +126,7 @@ class PlayedByAPerson : public testing::Test {
   Session session{driver, stage, out, {}};
 };
 
-TEST_F(PlayedByAPerson, writesDownWhatAPersonDoes) {
+TEST_F(PlayedByAPerson, WritesDownWhatAPersonDoes) {
   // The person presses each button as soon as it is visible.
   QTimer person;
   person.callOnTimeout([] {
@@ -150,7 +150,7 @@ struct Eager : QObject {
   }
 };
 
-TEST_F(PlayedByAPerson, isNotTakenForTheTimerThatFiredRightBefore) {
+TEST_F(PlayedByAPerson, IsNotTakenForTheTimerThatFiredRightBefore) {
   Eager eager;
   for (QWidget* const widget : QApplication::allWidgets()) {
     auto* const button = qobject_cast<QPushButton*>(widget);
@@ -161,7 +161,7 @@ TEST_F(PlayedByAPerson, isNotTakenForTheTimerThatFiredRightBefore) {
   expectInOrder({"1. start", "2. press 2 (2)", "3. list 5 runs by its timer", "4. press 3 (3)"});
 }
 
-TEST_F(PlayedByAPerson, endsWhenThePersonClosesTheWindow) {
+TEST_F(PlayedByAPerson, EndsWhenThePersonClosesTheWindow) {
   QTimer::singleShot(20, [] { buttonTitled("2")->window()->close(); });
   session.handOver();
   EXPECT_FALSE(session.picture().ended);

@@ -49,7 +49,7 @@ class ConvertCommand : public testing::Test {
   play::WorkingDirectory directory_;
 };
 
-TEST_F(ConvertCommand, choosesTheFormat) {
+TEST_F(ConvertCommand, ChoosesTheFormat) {
   const struct {
     std::vector<std::string> arguments;
     toolkit::Format format;
@@ -75,7 +75,7 @@ TEST_F(ConvertCommand, choosesTheFormat) {
             "convert --help\n");
 }
 
-TEST_F(ConvertCommand, replacesAFileAndKeepsWhatBelongsToIt) {
+TEST_F(ConvertCommand, ReplacesAFileAndKeepsWhatBelongsToIt) {
   directory_.write("real.bplist", "before");
   fs::permissions("real.bplist", fs::perms::owner_read | fs::perms::owner_write);
   fs::create_symlink("real.bplist", "link.bplist");
@@ -89,7 +89,7 @@ TEST_F(ConvertCommand, replacesAFileAndKeepsWhatBelongsToIt) {
   EXPECT_EQ(filesHere(), 3U);
 }
 
-TEST_F(ConvertCommand, leavesTheFileWhereTheFormatCannotHoldTheValue) {
+TEST_F(ConvertCommand, LeavesTheFileWhereTheFormatCannotHoldTheValue) {
   writeUnwritable();
   directory_.write("out.xml", "before");
   const auto result = convert({"null.bplist", "out.xml"});
@@ -102,7 +102,7 @@ TEST_F(ConvertCommand, leavesTheFileWhereTheFormatCannotHoldTheValue) {
   EXPECT_EQ(filesHere(), 3U);
 }
 
-TEST_F(ConvertCommand, tellsWhyAFileCannotBeReadOrWritten) {
+TEST_F(ConvertCommand, TellsWhyAFileCannotBeReadOrWritten) {
   fs::create_directory("folder");
   const struct {
     std::vector<std::string> arguments;

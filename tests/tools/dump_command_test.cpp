@@ -38,7 +38,7 @@ class DumpCommand : public testing::Test {
   play::WorkingDirectory directory_;
 };
 
-TEST_F(DumpCommand, showsTheTypeOfEveryScalar) {
+TEST_F(DumpCommand, ShowsTheTypeOfEveryScalar) {
   using namespace std::string_view_literals;
   const struct {
     ValueRef<> value;
@@ -69,7 +69,7 @@ TEST_F(DumpCommand, showsTheTypeOfEveryScalar) {
   for (const auto& c : cases) EXPECT_EQ(readable(c.value), std::string(c.line) + "\n");
 }
 
-TEST_F(DumpCommand, indentsCollections) {
+TEST_F(DumpCommand, IndentsCollections) {
   const auto result = dump("{ 1 = (SET_TEXT, (a, {})); 2 = (); }");
   EXPECT_EQ(result.status, 0);
   EXPECT_EQ(result.err, "");
@@ -88,7 +88,7 @@ TEST_F(DumpCommand, indentsCollections) {
   EXPECT_EQ(readable(toolkit::Set::make({})), "{()}\n");
 }
 
-TEST_F(DumpCommand, breaksLongDataIntoLines) {
+TEST_F(DumpCommand, BreaksLongDataIntoLines) {
   const std::string line =
       "00000000 00000000 00000000 00000000 00000000 00000000 00000000 00000000";
   EXPECT_EQ(readable(toolkit::Data::make(std::string(32, '\0'))), "<" + line + ">\n");
@@ -96,20 +96,20 @@ TEST_F(DumpCommand, breaksLongDataIntoLines) {
             "<\n    " + line + "\n    00\n>\n");
 }
 
-TEST_F(DumpCommand, paintsOnlyWhenAsked) {
+TEST_F(DumpCommand, PaintsOnlyWhenAsked) {
   const auto value = toolkit::Dictionary::make(
       {{toolkit::String::make("k"), toolkit::Array::make({toolkit::String::make("v")})}});
   EXPECT_EQ(readable(value, true),
             "{\n    \x1b[1m\"k\"\x1b[0m = (\n        \x1b[32m\"v\"\x1b[0m\n    );\n}\n");
 }
 
-TEST_F(DumpCommand, printsTheCanonicalLine) {
+TEST_F(DumpCommand, PrintsTheCanonicalLine) {
   EXPECT_EQ(dump("{ b = (x); a = <01>; }", {"--canonical"}).out,
             "{\"dict\":[[\"a\",{\"data\":\"01\"}],[\"b\",[\"x\"]]]}\n");
   EXPECT_EQ(dump("<plist><integer>5</integer></plist>", {"--canonical"}).out, "{\"int\":\"5\"}\n");
 }
 
-TEST_F(DumpCommand, tellsWhyAFileIsRefused) {
+TEST_F(DumpCommand, TellsWhyAFileIsRefused) {
   const struct {
     const char* contents;
     std::vector<std::string> options;
@@ -133,7 +133,7 @@ TEST_F(DumpCommand, tellsWhyAFileIsRefused) {
   EXPECT_EQ(run(dumpCommand, {"dump", "none.plist"}).status, 2);
 }
 
-TEST_F(DumpCommand, takesTheDeepestNestingAndRefusesSharingWithoutBound) {
+TEST_F(DumpCommand, TakesTheDeepestNestingAndRefusesSharingWithoutBound) {
   const auto nested = [](int depth) {
     std::string text;
     for (int i = 0; i < depth; ++i) text += "<array>";

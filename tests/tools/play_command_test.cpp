@@ -21,7 +21,7 @@ class PlayCommand : public testing::Test {
   play::WorkingDirectory directory_;
 };
 
-TEST_F(PlayCommand, badUsageIsOneLine) {
+TEST_F(PlayCommand, BadUsageIsOneLine) {
   const std::string help = "; see qz-walkthrough play --help\n";
   const std::string toolHelp = "; see qz-walkthrough --help\n";
   const struct {
@@ -54,7 +54,7 @@ TEST_F(PlayCommand, badUsageIsOneLine) {
   }
 }
 
-TEST_F(PlayCommand, aBadFileIsOneLine) {
+TEST_F(PlayCommand, ABadFileIsOneLine) {
   const Result missing = run({"play", "no.plist"});
   EXPECT_EQ(missing.err, "qz-walkthrough: no.plist: no such file; expected a script\n");
   EXPECT_EQ(missing.status, 2);
@@ -71,7 +71,7 @@ TEST_F(PlayCommand, aBadFileIsOneLine) {
   EXPECT_EQ(start.status, 1);
 }
 
-TEST_F(PlayCommand, stepsKeepTheOrderOfTheCommandLine) {
+TEST_F(PlayCommand, StepsKeepTheOrderOfTheCommandLine) {
   const Result result = run({"play", "--press", "2", "1", "--advance", "0.5", "script.plist",
                              "--press", "2", "--advance=1", "--toolkit", "memory"});
   EXPECT_EQ(result.status, 0);
@@ -84,7 +84,7 @@ TEST_F(PlayCommand, stepsKeepTheOrderOfTheCommandLine) {
   EXPECT_EQ(result.out.find("7. "), std::string::npos);
 }
 
-TEST_F(PlayCommand, aRefusedPressIsAStatusAndALine) {
+TEST_F(PlayCommand, ARefusedPressIsAStatusAndALine) {
   const Result result = run({"play", "script.plist", "--toolkit", "memory", "--press", "-2"});
   EXPECT_EQ(result.status, 1);
   EXPECT_NE(result.out.find("no control has the tag -2"), std::string::npos) << result.out;
@@ -94,7 +94,7 @@ TEST_F(PlayCommand, aRefusedPressIsAStatusAndALine) {
       << result.err;
 }
 
-TEST_F(PlayCommand, screenshotsNeedPixels) {
+TEST_F(PlayCommand, ScreenshotsNeedPixels) {
   const Result result =
       run({"play", "script.plist", "--toolkit", "memory", "--screenshots", "pictures"});
   EXPECT_EQ(result.err,
@@ -104,7 +104,7 @@ TEST_F(PlayCommand, screenshotsNeedPixels) {
   EXPECT_EQ(result.out, "");
 }
 
-TEST_F(PlayCommand, helpNamesEveryOptionAndTheExitStatuses) {
+TEST_F(PlayCommand, HelpNamesEveryOptionAndTheExitStatuses) {
   const Result help = run({"play", "--help"});
   EXPECT_EQ(help.status, 0);
   EXPECT_EQ(help.err, "");
@@ -117,7 +117,7 @@ TEST_F(PlayCommand, helpNamesEveryOptionAndTheExitStatuses) {
   EXPECT_EQ(version.status, 0);
 }
 
-TEST_F(PlayCommand, anOutputThatCannotBeWrittenIsOneLine) {
+TEST_F(PlayCommand, AnOutputThatCannotBeWrittenIsOneLine) {
   const Captured err(std::cerr);
   const Captured out(std::cout);
   std::cout.setstate(std::ios::badbit);

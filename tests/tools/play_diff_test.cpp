@@ -46,7 +46,7 @@ StepPicture oneControl(drivers::ViewKind kind) {
   return picture;
 }
 
-TEST(PlayDiff, namesEveryChangeOfAControl) {
+TEST(PlayDiff, NamesEveryChangeOfAControl) {
   const struct {
     std::function<void(ControlPicture&)> change;
     Change expected;
@@ -77,7 +77,7 @@ TEST(PlayDiff, namesEveryChangeOfAControl) {
   }
 }
 
-TEST(PlayDiff, namesEveryChangeOfTheWindow) {
+TEST(PlayDiff, NamesEveryChangeOfTheWindow) {
   const struct {
     std::function<void(drivers::WindowPicture&)> change;
     Change expected;
@@ -111,7 +111,7 @@ Changes textChanges(const AttributedString& before, const AttributedString& now)
   return diffPictures(first, second).controls[0].changes;
 }
 
-TEST(PlayDiff, theStyleOfATextThatStaysIsToldPieceByPiece) {
+TEST(PlayDiff, TheStyleOfATextThatStaysIsToldPieceByPiece) {
   const struct {
     const char* what;
     AttributedString before;
@@ -135,7 +135,7 @@ TEST(PlayDiff, theStyleOfATextThatStaysIsToldPieceByPiece) {
   for (const auto& c : cases) EXPECT_EQ(textChanges(c.before, c.now), c.expected) << c.what;
 }
 
-TEST(PlayDiff, theStyleOfAnotherTextIsToldInShort) {
+TEST(PlayDiff, TheStyleOfAnotherTextIsToldInShort) {
   AttributedString boldFirst("x", bold());
   boldFirst.append("y", {});
   const struct {
@@ -161,7 +161,7 @@ TEST(PlayDiff, theStyleOfAnotherTextIsToldInShort) {
   for (const auto& c : cases) EXPECT_EQ(textChanges(c.before, c.now), c.expected) << c.what;
 }
 
-TEST(PlayDiff, controlsAreKnownAgainByThemselvesNotByTheirTag) {
+TEST(PlayDiff, ControlsAreKnownAgainByThemselvesNotByTheirTag) {
   StepPicture before = windowPicture();
   before.controls = {controlPicture(drivers::ViewKind::button, 1, "A"),
                      controlPicture(drivers::ViewKind::button, 2, "B")};
@@ -175,7 +175,7 @@ TEST(PlayDiff, controlsAreKnownAgainByThemselvesNotByTheirTag) {
   EXPECT_EQ(changes.gone[0].view.title.string(), "B");
 }
 
-TEST(PlayDiff, timersCountWhenArmedAndWhenGone) {
+TEST(PlayDiff, TimersCountWhenArmedAndWhenGone) {
   StepPicture before = windowPicture();
   before.timers = {{newIdentity(), "3", 1}, {newIdentity(), "5", 2}, {newIdentity(), "7", 3}};
   StepPicture now = before;
@@ -188,7 +188,7 @@ TEST(PlayDiff, timersCountWhenArmedAndWhenGone) {
   EXPECT_EQ(diffPictures(before, now).engine, expected);
 }
 
-TEST(PlayDiff, namesWhatTheEngineIsUpTo) {
+TEST(PlayDiff, NamesWhatTheEngineIsUpTo) {
   const StepPicture before = windowPicture();
   StepPicture now = before;
   now.lastList = "9";

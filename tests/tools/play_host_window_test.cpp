@@ -30,7 +30,7 @@ std::string refusal(std::string_view text) {
   return "accepted";
 }
 
-TEST(PlayHostWindow, readsTheWindowAndItsControls) {
+TEST(PlayHostWindow, ReadsTheWindowAndItsControls) {
   const HostWindow host = read(
       "({class = NSWindow; frame = (1, 2, 300, 200); title = Backup;},"
       " {class = \"NSButton:mixed\"; tag = \"-7\"; frame = (1, 2.5, 3, 4); title = Go;"
@@ -49,7 +49,7 @@ TEST(PlayHostWindow, readsTheWindowAndItsControls) {
   EXPECT_EQ(control.toolTip, "Help");
 }
 
-TEST(PlayHostWindow, readsNumbersAndFlagsOfXml) {
+TEST(PlayHostWindow, ReadsNumbersAndFlagsOfXml) {
   const HostWindow host = read(
       "<plist><array><dict><key>class</key><string>NSTextField</string>"
       "<key>tag</key><integer>4</integer><key>hidden</key><true/>"
@@ -60,7 +60,7 @@ TEST(PlayHostWindow, readsNumbersAndFlagsOfXml) {
   EXPECT_TRUE(host.controls[0].hidden);
 }
 
-TEST(PlayHostWindow, whatIsAbsentHasADefault) {
+TEST(PlayHostWindow, WhatIsAbsentHasADefault) {
   const HostWindow host = read("({class = NSTextField; frame = (0, 0, 1, 1);})");
   EXPECT_EQ(host.title, "");
   EXPECT_EQ(host.content, (toolkit::Rect{100, 100, 640, 480}));
@@ -70,7 +70,7 @@ TEST(PlayHostWindow, whatIsAbsentHasADefault) {
   EXPECT_FALSE(host.controls[0].hidden);
 }
 
-TEST(PlayHostWindow, saysWhatIsWrongWithTheList) {
+TEST(PlayHostWindow, SaysWhatIsWrongWithTheList) {
   const struct {
     std::string text;
     std::string message;
@@ -90,7 +90,7 @@ TEST(PlayHostWindow, saysWhatIsWrongWithTheList) {
   for (const auto& c : cases) EXPECT_EQ(refusal(c.text), "host.plist:" + c.message) << c.text;
 }
 
-TEST(PlayHostWindow, saysWhatIsWrongWithAField) {
+TEST(PlayHostWindow, SaysWhatIsWrongWithAField) {
   const struct {
     std::string kind;
     std::string field;
@@ -115,7 +115,7 @@ TEST(PlayHostWindow, saysWhatIsWrongWithAField) {
   }
 }
 
-TEST(PlayHostWindow, saysWhatIsWrongWithAFrame) {
+TEST(PlayHostWindow, SaysWhatIsWrongWithAFrame) {
   const std::string four = ": expected four numbers (x, y, width, height), found ";
   const std::string length = ": expected a number of 0 or more, found ";
   const struct {
@@ -137,7 +137,7 @@ TEST(PlayHostWindow, saysWhatIsWrongWithAFrame) {
   }
 }
 
-TEST(PlayHostWindow, putsItOnTheScreen) {
+TEST(PlayHostWindow, PutsItOnTheScreen) {
   const auto driver = drivers::makeMemoryDriver();
   const HostWindow host = read(
       "({class = NSWindow; frame = (1, 2, 300, 200);},"
@@ -160,7 +160,7 @@ TEST(PlayHostWindow, putsItOnTheScreen) {
   EXPECT_TRUE(driver->look(views[1]).hidden);
 }
 
-TEST(PlayHostWindow, anImageMustBeKnown) {
+TEST(PlayHostWindow, AnImageMustBeKnown) {
   const WorkingDirectory directory;
   const auto driver = drivers::makeMemoryDriver();
   driver->setResourcePath(directory.path());

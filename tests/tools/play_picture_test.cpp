@@ -56,15 +56,15 @@ StepPicture everything() {
   return picture;
 }
 
-TEST(PlayPicture, showsEverythingInColumns) {
+TEST(PlayPicture, ShowsEverythingInColumns) {
   EXPECT_EQ(render(everything()), playData("everything.txt"));
 }
 
-TEST(PlayPicture, keepsWithinANarrowTerminal) {
+TEST(PlayPicture, KeepsWithinANarrowTerminal) {
   EXPECT_EQ(render(everything(), {.color = false, .width = 72}), playData("narrow.txt"));
 }
 
-TEST(PlayPicture, setsApartInColourWhatMatters) {
+TEST(PlayPicture, SetsApartInColourWhatMatters) {
   StepPicture before = everything();
   StepPicture now = before;
   now.controls[0].view.title = AttributedString("Finish");
@@ -72,7 +72,7 @@ TEST(PlayPicture, setsApartInColourWhatMatters) {
             playData("color.txt"));
 }
 
-TEST(PlayPicture, marksWhatChanged) {
+TEST(PlayPicture, MarksWhatChanged) {
   StepPicture before = everything();
   StepPicture now = before;
   now.controls[0].view.title = AttributedString("Finish");
@@ -88,12 +88,12 @@ TEST(PlayPicture, marksWhatChanged) {
   EXPECT_EQ(renderPicture(now, diffPictures(before, now), {}), playData("changes.txt"));
 }
 
-TEST(PlayPicture, saysWhatThereIsNot) {
+TEST(PlayPicture, SaysWhatThereIsNot) {
   EXPECT_EQ(render(StepPicture{}),
             "  No walk-through window.\n\n  No list was started.\n  Nothing changed.\n");
 }
 
-TEST(PlayPicture, saysThatItEnded) {
+TEST(PlayPicture, SaysThatItEnded) {
   StepPicture picture = windowPicture();
   picture.window->visible = false;
   picture.window->closes = 1;
@@ -104,7 +104,7 @@ TEST(PlayPicture, saysThatItEnded) {
             "  List 9 was started last; the walk-through has ended.\n  Nothing changed.\n");
 }
 
-TEST(PlayPicture, headingsFillTheLine) {
+TEST(PlayPicture, HeadingsFillTheLine) {
   EXPECT_EQ(renderHeading(2, "press 3 (Next)", {.color = false, .width = 30}),
             "── 2. press 3 (Next) ─────────\n");
   EXPECT_EQ(renderHeading(12, "start", {.color = false, .width = 5}), "── 12. start ──\n");

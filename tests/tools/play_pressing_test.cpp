@@ -29,7 +29,7 @@ StepPicture buttons() {
   return picture;
 }
 
-TEST(PlayPressing, saysWhyAControlCannotBePressed) {
+TEST(PlayPressing, SaysWhyAControlCannotBePressed) {
   const std::string others = "; press 1 (Next) or 4";
   const struct {
     toolkit::Tag tag;
@@ -45,7 +45,7 @@ TEST(PlayPressing, saysWhyAControlCannotBePressed) {
   for (const auto& c : cases) EXPECT_EQ(whyNotPress(buttons(), c.tag), c.reason) << c.tag;
 }
 
-TEST(PlayPressing, nothingCanBePressedWithoutAWindow) {
+TEST(PlayPressing, NothingCanBePressedWithoutAWindow) {
   StepPicture picture = buttons();
   picture.window->visible = false;
   EXPECT_EQ(whyNotPress(picture, 1), "the window is not on the screen");
@@ -55,18 +55,18 @@ TEST(PlayPressing, nothingCanBePressedWithoutAWindow) {
   EXPECT_EQ(whyNotPress(picture, 1), "the walk-through has ended");
 }
 
-TEST(PlayPressing, saysWhenThereIsNothingElseToPress) {
+TEST(PlayPressing, SaysWhenThereIsNothingElseToPress) {
   EXPECT_EQ(whyNotPress(windowPicture(), 1), "no control has the tag 1; no button can be pressed");
 }
 
-TEST(PlayPressing, namesAButtonByTagAndTitle) {
+TEST(PlayPressing, NamesAButtonByTagAndTitle) {
   EXPECT_EQ(pressWords(buttons(), 1), "1 (Next)");
   EXPECT_EQ(pressWords(buttons(), 4), "4");
   EXPECT_EQ(pressWords(buttons(), 5), "5");
   EXPECT_EQ(pressWords(buttons(), -6), "-6");
 }
 
-TEST(PlayPressing, saysWhatTheWalkThroughWaitsFor) {
+TEST(PlayPressing, SaysWhatTheWalkThroughWaitsFor) {
   StepPicture picture = buttons();
   EXPECT_EQ(standing(picture), "The walk-through waits for a press of 1 (Next).");
   EXPECT_EQ(whyNoWayOn(picture), std::nullopt);

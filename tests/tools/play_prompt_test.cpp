@@ -17,7 +17,7 @@ std::string words(const Request& request) {
   return std::holds_alternative<Help>(request) ? "help" : "quit";
 }
 
-TEST(PlayPrompt, understandsALine) {
+TEST(PlayPrompt, UnderstandsALine) {
   const std::string unclear = "expected a tag, +seconds, ? or q, found ";
   const std::string badTime = "after + expected seconds from 0 to 86400, such as +2.5";
   const struct {

@@ -29,7 +29,7 @@ std::string standIn(std::string_view text) {
   return words;
 }
 
-TEST(PlayStandIn, makesAControlOfTheKindThatTheScriptTakesItFor) {
+TEST(PlayStandIn, MakesAControlOfTheKindThatTheScriptTakesItFor) {
   const struct {
     std::string list;
     std::string controls;
@@ -56,11 +56,11 @@ TEST(PlayStandIn, makesAControlOfTheKindThatTheScriptTakesItFor) {
   }
 }
 
-TEST(PlayStandIn, takesOnlyListsOfTagsForButtons) {
+TEST(PlayStandIn, TakesOnlyListsOfTagsForButtons) {
   EXPECT_EQ(standIn("{ 10 = (); 2 = text; 007 = (); abc = (); }"), "2 button, 7 button, 10 button");
 }
 
-TEST(PlayStage, picturesSayWhatPressesReach) {
+TEST(PlayStage, PicturesSayWhatPressesReach) {
   drivers::MemoryDriver driver;
   const WorkingDirectory directory;
   directory.write("script.plist", "{ 1 = ((ALLOW_FLASHING, YES), (FLASH_ID, YES, 1)); 3 = (); }");
@@ -86,7 +86,7 @@ TEST(PlayStage, picturesSayWhatPressesReach) {
   EXPECT_EQ(picture.lastList, "1");
 }
 
-TEST(PlayStage, nothingFlashesAfterTheEnd) {
+TEST(PlayStage, NothingFlashesAfterTheEnd) {
   drivers::MemoryDriver driver;
   const WorkingDirectory directory;
   directory.write("script.plist", "{ 1 = ((ALLOW_FLASHING, YES), (FLASH_ID, YES, 1)); }");

@@ -68,7 +68,7 @@ PlayOptions smallScript(const WorkingDirectory& directory) {
   return options;
 }
 
-TEST(Play, theFirstStepsToTheirEnd) {
+TEST(Play, TheFirstStepsToTheirEnd) {
   PlayOptions options = firstSteps();
   options.steps = {Press{12}, Press{5}, Press{13}, Press{14}, Advance{2}, Advance{2.5}, Press{16}};
   const Played played = run(options);
@@ -77,7 +77,7 @@ TEST(Play, theFirstStepsToTheirEnd) {
   EXPECT_EQ(played.log, playData("first-steps.log.txt"));
 }
 
-TEST(Play, stepsKeepTheirOrder) {
+TEST(Play, StepsKeepTheirOrder) {
   const WorkingDirectory directory;
   PlayOptions options = smallScript(directory);
   options.steps = {Press{2}, Advance{3}, Press{2}, Press{3}};
@@ -89,7 +89,7 @@ TEST(Play, stepsKeepTheirOrder) {
       "\nThe walk-through ended.\nButton states recorded: 2 off, 1 off, 3 off.\n"));
 }
 
-TEST(Play, aPressThatNoUserCouldMakeIsRefused) {
+TEST(Play, APressThatNoUserCouldMakeIsRefused) {
   const WorkingDirectory directory;
   PlayOptions options = smallScript(directory);
   options.steps = {Press{9}, Press{3}, Press{1}, Advance{1}};
@@ -105,7 +105,7 @@ TEST(Play, aPressThatNoUserCouldMakeIsRefused) {
   }
 }
 
-TEST(Play, whatAListRaisesIsReportedAndTheWalkThroughGoesOn) {
+TEST(Play, WhatAListRaisesIsReportedAndTheWalkThroughGoesOn) {
   const WorkingDirectory directory;
   PlayOptions options = smallScript(directory);
   options.steps = {Press{4}, Press{2}};
@@ -118,7 +118,7 @@ TEST(Play, whatAListRaisesIsReportedAndTheWalkThroughGoesOn) {
   EXPECT_NE(played.transcript.find("\n── 3. press 2 (2) ──"), std::string::npos);
 }
 
-TEST(Play, saysWhereACommandStandsThatRaised) {
+TEST(Play, SaysWhereACommandStandsThatRaised) {
   const WorkingDirectory directory;
   directory.write("script.plist",
                   "{ 1 = (IDLE_LOOP,\n  (PROCESS_COMMANDS_FOR_ID, 2));\n"
@@ -134,7 +134,7 @@ TEST(Play, saysWhereACommandStandsThatRaised) {
   EXPECT_TRUE(log.ends_with(raised + "Button tag 1 pressed.\n" + raised)) << log;
 }
 
-TEST(Play, aWalkThroughThatStandsStillHasFailed) {
+TEST(Play, AWalkThroughThatStandsStillHasFailed) {
   const WorkingDirectory directory;
   PlayOptions options;
   options.script = "script.plist";
@@ -156,7 +156,7 @@ TEST(Play, aWalkThroughThatStandsStillHasFailed) {
   EXPECT_EQ(ended.log.find("stands still"), std::string::npos);
 }
 
-TEST(Play, aSheetLeavesTheScreenWhenItEnds) {
+TEST(Play, ASheetLeavesTheScreenWhenItEnds) {
   const WorkingDirectory directory;
   PlayOptions options = smallScript(directory);
   options.sheet = true;
@@ -168,7 +168,7 @@ TEST(Play, aSheetLeavesTheScreenWhenItEnds) {
   EXPECT_NE(transcript.find("↳ on the screen: yes → no", end), std::string::npos) << transcript;
 }
 
-TEST(Play, theEngineBuildsTheWindowFromADescription) {
+TEST(Play, TheEngineBuildsTheWindowFromADescription) {
   const WorkingDirectory directory;
   PlayOptions options = smallScript(directory);
   directory.write("assets.plist",
@@ -182,7 +182,7 @@ TEST(Play, theEngineBuildsTheWindowFromADescription) {
       << played.transcript;
 }
 
-TEST(Play, theResourcesAreTheScriptsOwnDirectoryUnlessNamed) {
+TEST(Play, TheResourcesAreTheScriptsOwnDirectoryUnlessNamed) {
   const WorkingDirectory directory;
   std::filesystem::create_directory("images");
   directory.write("images/disk.png", "not looked into");
@@ -194,21 +194,21 @@ TEST(Play, theResourcesAreTheScriptsOwnDirectoryUnlessNamed) {
   EXPECT_NE(run(options).transcript.find("7  image   disk"), std::string::npos);
 }
 
-TEST(Play, interactivelyAsksUntilTheEnd) {
+TEST(Play, InteractivelyAsksUntilTheEnd) {
   const WorkingDirectory directory;
   const Played played = run(smallScript(directory), "7\nnext\n\n?\n+x\n2\n+3\n3\n1\n", true);
   EXPECT_EQ(played.status, ExitStatus::fine);
   EXPECT_EQ(played.transcript, playData("interactive.txt"));
 }
 
-TEST(Play, interactivelyStopsWhenAskedToOrLeftAlone) {
+TEST(Play, InteractivelyStopsWhenAskedToOrLeftAlone) {
   const WorkingDirectory directory;
   const std::string end = "The walk-through waits for a press of 1 (Go), 2 (2), 3 (3) or 4 (4).\n";
   EXPECT_TRUE(run(smallScript(directory), "q\n3\n", true).transcript.ends_with("\n" + end));
   EXPECT_TRUE(run(smallScript(directory), "", true).transcript.ends_with("\n" + end));
 }
 
-TEST(Play, asksForNothingWhenNobodyIsThere) {
+TEST(Play, AsksForNothingWhenNobodyIsThere) {
   const WorkingDirectory directory;
   PlayOptions options = smallScript(directory);
   EXPECT_EQ(headings(run(options, "3\n", false).transcript), "── 1. start\n");
@@ -216,7 +216,7 @@ TEST(Play, asksForNothingWhenNobodyIsThere) {
   EXPECT_EQ(headings(run(options, "3\n", true).transcript), "── 1. start\n── 2. press 2 (2)\n");
 }
 
-TEST(Play, saysWhatIsWrongWithTheStart) {
+TEST(Play, SaysWhatIsWrongWithTheStart) {
   const WorkingDirectory directory;
   PlayOptions options = smallScript(directory);
   options.startKey = "9";
@@ -235,7 +235,7 @@ TEST(Play, saysWhatIsWrongWithTheStart) {
             "script.plist:1:1: expected at least one list, found an empty script");
 }
 
-TEST(Play, saysWhatIsWrongWithADescription) {
+TEST(Play, SaysWhatIsWrongWithADescription) {
   const WorkingDirectory directory;
   PlayOptions options = smallScript(directory);
   options.assets = "assets.plist";
@@ -261,7 +261,7 @@ TEST(Play, saysWhatIsWrongWithADescription) {
   }
 }
 
-TEST(Play, saysWhatIsWrongWithAFile) {
+TEST(Play, SaysWhatIsWrongWithAFile) {
   const WorkingDirectory directory;
   PlayOptions options;
   options.script = "missing.plist";

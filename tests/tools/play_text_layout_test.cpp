@@ -10,7 +10,7 @@
 namespace qz::tools {
 namespace {
 
-TEST(PlayTextLayout, widthIsThatOfATerminal) {
+TEST(PlayTextLayout, WidthIsThatOfATerminal) {
   const struct {
     const char* what;
     std::string text;
@@ -32,7 +32,7 @@ TEST(PlayTextLayout, widthIsThatOfATerminal) {
   for (const auto& c : cases) EXPECT_EQ(displayWidth(c.text), c.width) << c.what;
 }
 
-TEST(PlayTextLayout, whatDisturbsATerminalIsWrittenOut) {
+TEST(PlayTextLayout, WhatDisturbsATerminalIsWrittenOut) {
   const struct {
     const char* what;
     std::string text;
@@ -52,13 +52,13 @@ TEST(PlayTextLayout, whatDisturbsATerminalIsWrittenOut) {
   for (const auto& c : cases) EXPECT_EQ(printable(c.text), c.shown) << c.what;
 }
 
-TEST(PlayTextLayout, quotedTextIsOneLine) {
+TEST(PlayTextLayout, QuotedTextIsOneLine) {
   EXPECT_EQ(quote("one\ntwo"), "“one\\ntwo”");
   EXPECT_EQ(oneLine("one\ntwo\x1b"), "one\\ntwo\\u{1b}");
   EXPECT_EQ(quote(""), "“”");
 }
 
-TEST(PlayTextLayout, textWraps) {
+TEST(PlayTextLayout, TextWraps) {
   using Lines = std::vector<std::string>;
   const struct {
     const char* what;
@@ -78,7 +78,7 @@ TEST(PlayTextLayout, textWraps) {
   for (const auto& c : cases) EXPECT_EQ(wrap(c.text, c.width), c.lines) << c.what;
 }
 
-TEST(PlayTextLayout, paddingCountsColumns) {
+TEST(PlayTextLayout, PaddingCountsColumns) {
   EXPECT_EQ(padRight("次", 4), "次  ");
   EXPECT_EQ(padLeft("é", 3), "  é");
   EXPECT_EQ(padRight("longer", 3), "longer");

@@ -68,7 +68,7 @@ class ForeignDriver final : public drivers::Driver {
   std::unique_ptr<drivers::Driver> driver_ = makeDriver("memory");
 };
 
-TEST(ScenarioClassNames, standardNamesStandForTheToolkits) {
+TEST(ScenarioClassNames, StandardNamesStandForTheToolkits) {
   const ForeignDriver driver;
   const ClassNames names(driver);
   const struct {
@@ -98,7 +98,7 @@ TEST(ScenarioClassNames, standardNamesStandForTheToolkits) {
   }
 }
 
-TEST(ScenarioClassNames, alsoWithinJson) {
+TEST(ScenarioClassNames, AlsoWithinJson) {
   const ForeignDriver driver;
   const ClassNames names(driver);
   EXPECT_EQ(names.unifiedTexts(Json::parse(R"({"1": ["NSButton", 2]})")),
@@ -107,7 +107,7 @@ TEST(ScenarioClassNames, alsoWithinJson) {
             names.unifiedTexts(Json::parse(R"(["Label"])")));
 }
 
-TEST(ScenarioClassNames, onAToolkitWithTheStandardNamesNothingChanges) {
+TEST(ScenarioClassNames, OnAToolkitWithTheStandardNamesNothingChanges) {
   const auto driver = makeDriver("memory");
   const ClassNames names(*driver);
   EXPECT_EQ(names.unified("NSButton, PushButton: NSView"), "NSButton, PushButton: NSView");

@@ -50,7 +50,7 @@ class ScenarioCommand : public testing::Test {
   play::WorkingDirectory directory_;
 };
 
-TEST_F(ScenarioCommand, printsFailuresAndCounts) {
+TEST_F(ScenarioCommand, PrintsFailuresAndCounts) {
   const auto result = runTest({"test", data + "failing.walk"});
   EXPECT_EQ(result.status, 1);
   EXPECT_EQ(result.err, "");
@@ -68,7 +68,7 @@ TEST_F(ScenarioCommand, printsFailuresAndCounts) {
             "1 passed, 3 failed, 1 skipped\n");
 }
 
-TEST_F(ScenarioCommand, aFileThatIsOneScenario) {
+TEST_F(ScenarioCommand, AFileThatIsOneScenario) {
   const auto result = runTest({"test", data + "whole-file.walk"});
   EXPECT_EQ(result.status, 1);
   EXPECT_EQ(result.out,
@@ -76,14 +76,14 @@ TEST_F(ScenarioCommand, aFileThatIsOneScenario) {
             "0 passed, 1 failed\n");
 }
 
-TEST_F(ScenarioCommand, whatPassesIsOnlyCounted) {
+TEST_F(ScenarioCommand, WhatPassesIsOnlyCounted) {
   write("a.walk", "engine\nexpect state 0\n");
   const auto result = runTest({"test", "a.walk", "a.walk"});
   EXPECT_EQ(result.status, 0);
   EXPECT_EQ(result.out, "1 passed, 0 failed\n");
 }
 
-TEST_F(ScenarioCommand, nothingRunsWhenAFileIsRefused) {
+TEST_F(ScenarioCommand, NothingRunsWhenAFileIsRefused) {
   const auto result =
       runTest({"test", data + "failing.walk", data + "refused.walk", data + "none.walk"});
   EXPECT_EQ(result.status, 2);
@@ -93,7 +93,7 @@ TEST_F(ScenarioCommand, nothingRunsWhenAFileIsRefused) {
             "refused.walk:3:3: unknown statement \"controll\"; did you mean \"control\"?\n");
 }
 
-TEST_F(ScenarioCommand, directoriesStandForTheScenariosBelow) {
+TEST_F(ScenarioCommand, DirectoriesStandForTheScenariosBelow) {
   write("b/two.walk", "engine\nexpect state 1\n");
   write("a.walk", "engine\nexpect state 2\n");
   write("b/notes.txt", "no scenario");
@@ -107,7 +107,7 @@ TEST_F(ScenarioCommand, directoriesStandForTheScenariosBelow) {
   EXPECT_EQ(runTest({"test", "empty"}).err, "empty: no .walk file in or below this directory\n");
 }
 
-TEST_F(ScenarioCommand, listsAndFilters) {
+TEST_F(ScenarioCommand, ListsAndFilters) {
   const auto list = runTest({"test", "--list", "--filter", "fails", data + "failing.walk"});
   EXPECT_EQ(list.status, 0);
   EXPECT_EQ(list.out,
@@ -117,13 +117,13 @@ TEST_F(ScenarioCommand, listsAndFilters) {
             "1 passed, 0 failed\n");
 }
 
-TEST_F(ScenarioCommand, aFilterThatNothingFitsFails) {
+TEST_F(ScenarioCommand, AFilterThatNothingFitsFails) {
   const auto result = runTest({"test", "--filter", "nothing", data + "failing.walk"});
   EXPECT_EQ(result.status, 2);
   EXPECT_EQ(result.err, "qz-walkthrough: no scenario has \"nothing\" in its title\n");
 }
 
-TEST_F(ScenarioCommand, verboselyEveryStatementIsPrinted) {
+TEST_F(ScenarioCommand, VerboselyEveryStatementIsPrinted) {
   write("a.walk",
         "window w\nengine\nadopt w => NO\nfind 5 => none\n"
         "compound FLASH_ID [] for 1 => raises\n");
@@ -138,14 +138,14 @@ TEST_F(ScenarioCommand, verboselyEveryStatementIsPrinted) {
             "1 passed, 0 failed\n");
 }
 
-TEST_F(ScenarioCommand, whatWouldDisturbATerminalIsWrittenOut) {
+TEST_F(ScenarioCommand, WhatWouldDisturbATerminalIsWrittenOut) {
   write("a.walk", "engine\nexpect state \"\u009b\"\nscenario x\nengine\n");
   EXPECT_EQ(runTest({"test", "a.walk"}).out,
             "a.walk:2: expected \"\\u{9b}\", got \"0\"\n    expect state \"\\u{9b}\"\n"
             "    in a.walk:3: x\n0 passed, 1 failed\n");
 }
 
-TEST_F(ScenarioCommand, badUsageIsOneLine) {
+TEST_F(ScenarioCommand, BadUsageIsOneLine) {
   write("a.walk", "engine\n");
   const auto names = driverNames();
   const std::string toolkits = enumerate({names.begin(), names.end()});
@@ -173,7 +173,7 @@ TEST_F(ScenarioCommand, badUsageIsOneLine) {
   }
 }
 
-TEST_F(ScenarioCommand, writesAReport) {
+TEST_F(ScenarioCommand, WritesAReport) {
   EXPECT_EQ(runTest({"test", "--junit", "report.xml", data + "failing.walk"}).status, 1);
   std::stringstream xml;
   xml << std::ifstream("report.xml").rdbuf();
@@ -183,7 +183,7 @@ TEST_F(ScenarioCommand, writesAReport) {
   EXPECT_TRUE(std::regex_search(xml.str(), suite)) << xml.str();
 }
 
-TEST_F(ScenarioCommand, resourceDirectoriesAreRemoved) {
+TEST_F(ScenarioCommand, ResourceDirectoriesAreRemoved) {
   write("a.walk",
         "script deep/er/intro.plist {}\nimage star\nengine\n"
         "scenario passes\nload deep/er/intro.plist => YES\n"
@@ -198,7 +198,7 @@ TEST_F(ScenarioCommand, resourceDirectoriesAreRemoved) {
   EXPECT_TRUE(fs::is_empty("temporary"));
 }
 
-TEST_F(ScenarioCommand, withoutADirectoryForTemporaryFilesNothingRuns) {
+TEST_F(ScenarioCommand, WithoutADirectoryForTemporaryFilesNothingRuns) {
   write("a.walk", "engine\n");
   const auto before = fs::temp_directory_path();
   ::setenv("TMPDIR", fs::absolute("nowhere").c_str(), 1);

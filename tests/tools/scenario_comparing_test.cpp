@@ -13,7 +13,7 @@
 namespace qz::tools::scenario {
 namespace {
 
-TEST(ScenarioComparing, jsonValues) {
+TEST(ScenarioComparing, JsonValues) {
   const struct {
     const char* a;
     const char* b;
@@ -46,7 +46,7 @@ TEST(ScenarioComparing, jsonValues) {
   }
 }
 
-TEST(ScenarioComparing, whereJsonDiffers) {
+TEST(ScenarioComparing, WhereJsonDiffers) {
   const struct {
     const char* a;
     const char* b;
@@ -65,7 +65,7 @@ TEST(ScenarioComparing, whereJsonDiffers) {
   }
 }
 
-TEST(ScenarioComparing, patterns) {
+TEST(ScenarioComparing, Patterns) {
   const struct {
     const char* pattern;
     const char* text;
@@ -97,7 +97,7 @@ TEST(ScenarioComparing, patterns) {
   }
 }
 
-TEST(ScenarioComparing, nearMisses) {
+TEST(ScenarioComparing, NearMisses) {
   const std::vector<std::string_view> words = {"press", "push", "expect", "set", "state"};
   const struct {
     const char* word;
@@ -115,7 +115,7 @@ TEST(ScenarioComparing, nearMisses) {
   EXPECT_EQ(didYouMean(std::string(100000, 'x'), words), "");
 }
 
-TEST(ScenarioComparing, wordsAsValues) {
+TEST(ScenarioComparing, WordsAsValues) {
   const struct {
     Word::Kind kind;
     const char* text;

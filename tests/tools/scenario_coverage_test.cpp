@@ -20,7 +20,7 @@ std::vector<std::string> namesOf(const std::vector<PropertyInfo>& infos) {
   return names;
 }
 
-TEST(ScenarioCoverage, theEngineShowsAllOfItsFields) {
+TEST(ScenarioCoverage, TheEngineShowsAllOfItsFields) {
   EXPECT_EQ(namesOf(vocabulary().engine),
             (std::vector<std::string>{"flashing", "runningAsSheet", "terminating", "hasTerminated",
                                       "window", "plistDictionary", "commandArray", "objectId",
@@ -29,13 +29,13 @@ TEST(ScenarioCoverage, theEngineShowsAllOfItsFields) {
                                       "objectIdTimers", "buttonStates", "originalTagValues"}));
 }
 
-TEST(ScenarioCoverage, allOfItsFieldsButTheButtonStatesCanBeSet) {
+TEST(ScenarioCoverage, AllOfItsFieldsButTheButtonStatesCanBeSet) {
   for (const auto& info : vocabulary().engine) {
     EXPECT_EQ(info.written != Takes::nothing, info.name != "buttonStates") << info.name;
   }
 }
 
-TEST(ScenarioCoverage, controlsAndWindowsShowAllThatTheyAre) {
+TEST(ScenarioCoverage, ControlsAndWindowsShowAllThatTheyAre) {
   EXPECT_EQ(namesOf(vocabulary().control),
             (std::vector<std::string>{"class",     "tag",         "frame",  "hidden",     "enabled",
                                       "state",     "highlighted", "title",  "text",       "tooltip",
@@ -48,7 +48,7 @@ TEST(ScenarioCoverage, controlsAndWindowsShowAllThatTheyAre) {
                                       "style"}));
 }
 
-TEST(ScenarioCoverage, everyCommandCanBeRenamed) { EXPECT_EQ(vocabulary().constants.size(), 27U); }
+TEST(ScenarioCoverage, EveryCommandCanBeRenamed) { EXPECT_EQ(vocabulary().constants.size(), 27U); }
 
 /// The forms of the statements that a file used, and the properties that they named.
 struct Used {
@@ -85,7 +85,7 @@ struct Used {
   }
 };
 
-TEST(ScenarioCoverage, aFileUsesEverythingAndPasses) {
+TEST(ScenarioCoverage, AFileUsesEverythingAndPasses) {
   const auto files = readScenarios({QZ_TEST_DATA "/scenarios/everything.walk"});
   ASSERT_TRUE(files.problems.empty()) << files.problems.front();
   Used used;

@@ -29,7 +29,7 @@ void expectFailures(std::initializer_list<Case> cases) {
   }
 }
 
-TEST(ScenarioFailures, expectationsThatDoNotHold) {
+TEST(ScenarioFailures, ExpectationsThatDoNotHold) {
   expectFailures({
       {"expect label.text \"Well done\"", "7: expected \"Well done\", got \"\""},
       {"expect next.hidden YES", "7: expected YES, got NO"},
@@ -59,7 +59,7 @@ TEST(ScenarioFailures, expectationsThatDoNotHold) {
   });
 }
 
-TEST(ScenarioFailures, results) {
+TEST(ScenarioFailures, Results) {
   expectFailures({
       {"adopt none => YES", "7: expected YES, got NO"},
       {"find 2 => label", "7: expected label, got next"},
@@ -74,7 +74,7 @@ TEST(ScenarioFailures, results) {
   });
 }
 
-TEST(ScenarioFailures, logLines) {
+TEST(ScenarioFailures, LogLines) {
   expectFailures({
       {"expect log \"a\"", "7: expected the log line \"a\", got no further line"},
       {"press next\nexpect log \"Button\"",
@@ -90,7 +90,7 @@ TEST(ScenarioFailures, logLines) {
   });
 }
 
-TEST(ScenarioFailures, thingsThatAreNotThere) {
+TEST(ScenarioFailures, ThingsThatAreNotThere) {
   expectFailures({
       {"press #9", "7: expected the control #9, got none"},
       {"press @2", "7: expected the control @2, got none"},
@@ -113,7 +113,7 @@ TEST(ScenarioFailures, thingsThatAreNotThere) {
   EXPECT_EQ(failure("window w\nexpect #5.tag 5"), "2: expected an engine, got none");
 }
 
-TEST(ScenarioFailures, whatTheHostWasToDo) {
+TEST(ScenarioFailures, WhatTheHostWasToDo) {
   expectFailures({
       {"when sheet ends release", "7: expected the end of a sheet, got none"},
       {"when action next release\npress next\nignore log",
@@ -127,7 +127,7 @@ TEST(ScenarioFailures, whatTheHostWasToDo) {
   });
 }
 
-TEST(ScenarioFailures, filesThatAreNotThere) {
+TEST(ScenarioFailures, FilesThatAreNotThere) {
   const auto found = failure("copy a.plist no/such.plist");
   EXPECT_TRUE(found.starts_with("1: expected the file no/such.plist in /")) << found;
   EXPECT_TRUE(found.ends_with(", got none")) << found;
@@ -135,13 +135,13 @@ TEST(ScenarioFailures, filesThatAreNotThere) {
             "2: expected the file a/b in the resource directory, got an error writing it");
 }
 
-TEST(ScenarioFailures, whatNoPropertyListCanCarry) {
+TEST(ScenarioFailures, WhatNoPropertyListCanCarry) {
   const auto found = failure("script a.plist {\"CF$UID\": 1}");
   EXPECT_TRUE(found.starts_with("1: expected no exception, got NSInvalidArgumentException: "))
       << found;
 }
 
-TEST(ScenarioFailures, oneFailureEndsItsScenarioOnly) {
+TEST(ScenarioFailures, OneFailureEndsItsScenarioOnly) {
   const auto reports = runAll(beginning +
                               "scenario first\nexpect state 1\nexpect state 2\n"
                               "scenario second\nexpect state 0\n"

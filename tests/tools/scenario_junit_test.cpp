@@ -19,7 +19,7 @@ Report report(Verdict verdict, const std::string& file, const std::string& title
   return report;
 }
 
-TEST(ScenarioJunit, aSuiteAFileAndACaseAScenario) {
+TEST(ScenarioJunit, ASuiteAFileAndACaseAScenario) {
   auto failed = report(Verdict::failed, "dir/a.b.walk", "fails");
   failed.failedLine = 7;
   failed.problem = "expected \"x\", got \"<y>\"";
@@ -52,7 +52,7 @@ TEST(ScenarioJunit, aSuiteAFileAndACaseAScenario) {
       "</testsuites>\n");
 }
 
-TEST(ScenarioJunit, whatXmlCannotHoldIsReplaced) {
+TEST(ScenarioJunit, WhatXmlCannotHoldIsReplaced) {
   const struct {
     const char* name;
     std::string title;
@@ -79,7 +79,7 @@ TEST(ScenarioJunit, whatXmlCannotHoldIsReplaced) {
   }
 }
 
-TEST(ScenarioJunit, withoutScenariosItIsEmpty) {
+TEST(ScenarioJunit, WithoutScenariosItIsEmpty) {
   EXPECT_EQ(junitReport({}),
             "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n"
             "<testsuites name=\"qz-walkthrough\" tests=\"0\" failures=\"0\" errors=\"0\" "

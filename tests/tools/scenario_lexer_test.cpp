@@ -24,7 +24,7 @@ std::vector<std::vector<std::string>> marked(const std::string& text) {
   return all;
 }
 
-TEST(ScenarioLexer, wordsStatementsAndComments) {
+TEST(ScenarioLexer, WordsStatementsAndComments) {
   const struct {
     const char* name;
     std::string text;
@@ -56,7 +56,7 @@ TEST(ScenarioLexer, wordsStatementsAndComments) {
   for (const auto& test : cases) EXPECT_EQ(marked(test.text), test.words) << test.name;
 }
 
-TEST(ScenarioLexer, wordsKnowWhereTheyStand) {
+TEST(ScenarioLexer, WordsKnowWhereTheyStand) {
   const auto lines = readWords("a \"ü\" b\n [\n1] c");
   ASSERT_EQ(lines.size(), 2U);
   EXPECT_EQ(lines[0].words[1].at, (Position{1, 3}));
@@ -66,7 +66,7 @@ TEST(ScenarioLexer, wordsKnowWhereTheyStand) {
   EXPECT_EQ(lines[1].words[1].at, (Position{3, 4}));
 }
 
-TEST(ScenarioLexer, theSourceIsTheFirstLine) {
+TEST(ScenarioLexer, TheSourceIsTheFirstLine) {
   const auto lines = readWords("  a b   # c\nd {\n} e");
   EXPECT_EQ(lines[0].source, "a b   # c");
   EXPECT_EQ(lines[1].source, "d { …");
@@ -82,7 +82,7 @@ std::string refusalOf(const std::string& text) {
   return "";
 }
 
-TEST(ScenarioLexer, refusesWhatIsNoText) {
+TEST(ScenarioLexer, RefusesWhatIsNoText) {
   const struct {
     const char* name;
     std::string text;
@@ -100,7 +100,7 @@ TEST(ScenarioLexer, refusesWhatIsNoText) {
   for (const auto& test : cases) EXPECT_EQ(refusalOf(test.text), test.refusal) << test.name;
 }
 
-TEST(ScenarioLexer, refusesBrokenWords) {
+TEST(ScenarioLexer, RefusesBrokenWords) {
   const struct {
     const char* name;
     std::string text;
@@ -127,14 +127,14 @@ TEST(ScenarioLexer, refusesBrokenWords) {
   for (const auto& test : cases) EXPECT_EQ(refusalOf(test.text), test.refusal) << test.name;
 }
 
-TEST(ScenarioLexer, refusesBrokenJsonWhereItBreaks) {
+TEST(ScenarioLexer, RefusesBrokenJsonWhereItBreaks) {
   EXPECT_TRUE(refusalOf("a [1,\n  2 3]").starts_with("2:5: syntax error"))
       << refusalOf("a [1,\n  2 3]");
   EXPECT_TRUE(refusalOf("a [1}").starts_with("1:5: syntax error"));
   EXPECT_TRUE(refusalOf("# ü\na {\"ü\": nul}").starts_with("2:12: syntax error"));
 }
 
-TEST(ScenarioLexer, refusesJsonThatNestsTooDeeply) {
+TEST(ScenarioLexer, RefusesJsonThatNestsTooDeeply) {
   const auto nested = [](std::size_t depth) {
     return std::string(depth, '[') + std::string(depth, ']');
   };

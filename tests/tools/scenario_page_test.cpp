@@ -31,7 +31,7 @@ std::vector<std::string> examples() {
   return examples;
 }
 
-TEST(ScenarioPage, itsExamplesPass) {
+TEST(ScenarioPage, ItsExamplesPass) {
   EXPECT_GE(examples().size(), 5U);
   for (const auto& example : examples()) {
     for (const auto& report : runAll(example)) {
@@ -41,7 +41,7 @@ TEST(ScenarioPage, itsExamplesPass) {
   }
 }
 
-TEST(ScenarioPage, itNamesEveryStatementPropertyAndClass) {
+TEST(ScenarioPage, ItNamesEveryStatementPropertyAndClass) {
   const auto text = page();
   const auto names = [&](const std::string& what) {
     return text.find('`' + what) != std::string::npos;

@@ -20,7 +20,7 @@ std::vector<std::string> sources(const std::vector<Statement>& statements) {
   return all;
 }
 
-TEST(ScenarioParser, aFileWithoutSectionsIsOneScenario) {
+TEST(ScenarioParser, AFileWithoutSectionsIsOneScenario) {
   const auto file = parsed("# intro\n\nengine\nexpect alive\n");
   ASSERT_EQ(file.scenarios.size(), 1U);
   EXPECT_EQ(file.scenarios[0].title, "");
@@ -30,7 +30,7 @@ TEST(ScenarioParser, aFileWithoutSectionsIsOneScenario) {
   EXPECT_TRUE(file.common.empty());
 }
 
-TEST(ScenarioParser, sectionsShareTheCommonBeginning) {
+TEST(ScenarioParser, SectionsShareTheCommonBeginning) {
   const auto file =
       parsed("engine\nscenario \"a title\"\nrestore\nscenario two words\nterminate\n");
   EXPECT_EQ(sources(file.common), std::vector<std::string>{"engine"});
@@ -41,19 +41,19 @@ TEST(ScenarioParser, sectionsShareTheCommonBeginning) {
   EXPECT_EQ(sources(file.scenarios[1].statements), std::vector<std::string>{"terminate"});
 }
 
-TEST(ScenarioParser, namesOfTheCommonBeginningAreKnownInEverySection) {
+TEST(ScenarioParser, NamesOfTheCommonBeginningAreKnownInEverySection) {
   EXPECT_EQ(refusal("window w\nscenario a\ncontrol c NSButton 1 in w\nscenario b\nadopt w\n"), "");
   EXPECT_EQ(refusal("window w\nscenario a\ncontrol c NSButton 1 in w\nscenario b\npress c\n"),
             "5:7: \"c\" is not declared");
 }
 
-TEST(ScenarioParser, onlyHoldsForTheFileOrForOneScenario) {
+TEST(ScenarioParser, OnlyHoldsForTheFileOrForOneScenario) {
   const auto file = parsed("only qt appkit\nscenario a\nengine\nscenario b\nonly memory\nengine\n");
   EXPECT_EQ(file.scenarios[0].only, (std::vector<std::string>{"qt", "appkit"}));
   EXPECT_EQ(file.scenarios[1].only, (std::vector<std::string>{"memory"}));
 }
 
-TEST(ScenarioParser, theResultBelongsToTheInnermostStatement) {
+TEST(ScenarioParser, TheResultBelongsToTheInnermostStatement) {
   const auto file = parsed("engine\nwhen sheet ends repeat 2 find 5 => none\n");
   const auto& when = file.scenarios[0].statements[1];
   EXPECT_FALSE(when.clause);
@@ -65,7 +65,7 @@ TEST(ScenarioParser, theResultBelongsToTheInnermostStatement) {
   EXPECT_EQ(find.at, (Position{2, 26}));
 }
 
-TEST(ScenarioParser, refusesUnknownWords) {
+TEST(ScenarioParser, RefusesUnknownWords) {
   const struct {
     const char* text;
     const char* refusal;
@@ -96,7 +96,7 @@ TEST(ScenarioParser, refusesUnknownWords) {
   for (const auto& test : cases) EXPECT_EQ(refusal(test.text), test.refusal) << test.text;
 }
 
-TEST(ScenarioParser, refusesWrongArguments) {
+TEST(ScenarioParser, RefusesWrongArguments) {
   const struct {
     const char* text;
     const char* refusal;
@@ -137,7 +137,7 @@ TEST(ScenarioParser, refusesWrongArguments) {
   for (const auto& test : cases) EXPECT_EQ(refusal(test.text), test.refusal) << test.text;
 }
 
-TEST(ScenarioParser, refusesWrongNames) {
+TEST(ScenarioParser, RefusesWrongNames) {
   const struct {
     const char* text;
     const char* refusal;
@@ -169,7 +169,7 @@ TEST(ScenarioParser, refusesWrongNames) {
   for (const auto& test : cases) EXPECT_EQ(refusal(test.text), test.refusal) << test.text;
 }
 
-TEST(ScenarioParser, refusesWrongValues) {
+TEST(ScenarioParser, RefusesWrongValues) {
   const struct {
     const char* text;
     const char* refusal;
@@ -188,7 +188,7 @@ TEST(ScenarioParser, refusesWrongValues) {
   for (const auto& test : cases) EXPECT_EQ(refusal(test.text), test.refusal) << test.text;
 }
 
-TEST(ScenarioParser, refusesWrongResults) {
+TEST(ScenarioParser, RefusesWrongResults) {
   const struct {
     const char* text;
     const char* refusal;
@@ -207,7 +207,7 @@ TEST(ScenarioParser, refusesWrongResults) {
   for (const auto& test : cases) EXPECT_EQ(refusal(test.text), test.refusal) << test.text;
 }
 
-TEST(ScenarioParser, refusesNamesOfFilesOutsideOfTheResourceDirectory) {
+TEST(ScenarioParser, RefusesNamesOfFilesOutsideOfTheResourceDirectory) {
   for (const std::string name :
        {"/etc/passwd", "../x", "a/../../x", "a/..", "$RESOURCES/x", "a//b", "./x", "a\\b"}) {
     EXPECT_EQ(refusal("file " + inQuotes(name) + " text"),
@@ -220,7 +220,7 @@ TEST(ScenarioParser, refusesNamesOfFilesOutsideOfTheResourceDirectory) {
       "PATH)");
 }
 
-TEST(ScenarioParser, refusesScenariosThatTryNothing) {
+TEST(ScenarioParser, RefusesScenariosThatTryNothing) {
   EXPECT_EQ(refusal(""), "1:1: a scenario without a statement");
   EXPECT_EQ(refusal("\n only memory\n"), "2:2: a scenario without a statement");
   EXPECT_EQ(refusal("engine\nscenario a\nscenario b\nengine"),
@@ -229,7 +229,7 @@ TEST(ScenarioParser, refusesScenariosThatTryNothing) {
             "4:2: a scenario without a statement");
 }
 
-TEST(ScenarioParser, refusesEndlessNesting) {
+TEST(ScenarioParser, RefusesEndlessNesting) {
   std::string text;
   for (int i = 0; i < 21; ++i) text += "repeat 2 ";
   EXPECT_EQ(refusal(text + "restore"), "1:190: statements nested too deeply");
