@@ -66,8 +66,8 @@ TEST_F(ViewsTest, AViewRefusesWhatCannotLieInIt) {
     std::string reason;
   } cases[] = {
       {outer, nullptr, "-[NSBox addSubview:]: the view is absent"},
-      {outer, outer, "-[NSBox addSubview:]: the view is the superview itself, or lies around it"},
-      {inner, outer, "-[NSBox addSubview:]: the view is the superview itself, or lies around it"},
+      {outer, outer, "-[NSBox addSubview:]: the view is the superview itself, or contains it"},
+      {inner, outer, "-[NSBox addSubview:]: the view is the superview itself, or contains it"},
       {inner, content, "-[NSBox addSubview:]: the view is the content view of a window"},
       {inner, other->contentView(),
        "-[NSBox addSubview:]: the view is the content view of a window"},

@@ -6,7 +6,7 @@
 
 #include <algorithm>
 
-#include "qz/toolkit/exception.hpp"
+#include "toolkit/backend/insertion.hpp"
 #include "toolkit/memory/window.hpp"
 
 namespace qz::toolkit::memory {
@@ -44,13 +44,8 @@ bool ViewNode::isWithin(const ViewNode& view) const {
 
 void ViewNode::insert(const Ref<View>& view) {
   const auto node = of(view);
-  const auto refuse = [&](std::string_view what) {
-    throw InvalidArgumentException("-[" + className_ + " addSubview:]: " + std::string(what));
-  };
-  if (!view) refuse("the view is absent");
-  if (!node) refuse("the view, of class " + view->className() + ", belongs to another toolkit");
-  if (!node->window_.expired()) refuse("the view is the content view of a window");
-  if (isWithin(*node)) refuse("the view is the superview itself, or lies around it");
+  requireOwnView(className_, view, node != nullptr);
+  requireFreeView(className_, !node->window_.expired(), isWithin(*node));
 
   node->removeFromSuperview();
   subviews_.push_back(node->view());  // `view` may refer into the list that the view has just left

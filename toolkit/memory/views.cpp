@@ -3,24 +3,19 @@
 
 #include "toolkit/memory/views.hpp"
 
+#include "toolkit/backend/responder_chain.hpp"
 #include "toolkit/memory/window.hpp"
 
 namespace qz::toolkit::memory {
 
 bool ControlNode::send(std::string_view action, const std::shared_ptr<Responder>& target) {
-  if (action.empty()) return false;
-  // The responder may destroy the sender and its window, or change its action and target. Therefore
-  // everything needed until the end is held here.
-  const std::string selector(action);
-  const Ref<View> sender = view();
-  // NOLINTNEXTLINE(performance-unnecessary-copy-initialization)
-  if (const auto receiver = target) return receiver->tryToPerform(selector, sender);
-
-  for (auto responder = shared_from_this(); responder; responder = responder->superview())
-    if (responder->view()->tryToPerform(selector, sender)) return true;
-  const auto window = this->window();
-  const auto delegate = window ? window->delegate() : nullptr;
-  return delegate && delegate->tryToPerform(selector, sender);
+  const auto self = shared_from_this();
+  return sendAlongResponderChain(action, target, view(),
+                                 {[](const Ref<View>& view) -> Ref<View> {
+                                    const auto superview = of(view)->superview();
+                                    return superview ? superview->view() : nullptr;
+                                  },
+                                  [self]() -> Ref<Window> { return self->window(); }});
 }
 
 MemoryButton::MemoryButton(ButtonBehavior behavior, const Rect& frame,

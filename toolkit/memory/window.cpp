@@ -4,8 +4,6 @@
 
 #include "toolkit/memory/window.hpp"
 
-#include <utility>
-
 #include "toolkit/memory/views.hpp"
 
 namespace qz::toolkit::memory {
@@ -66,21 +64,15 @@ bool MemoryWindow::takesInput() const {
 
 void MemoryWindow::beginAsSheet(const std::shared_ptr<MemoryWindow>& parent,
                                 const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo) {
-  session_ = Session{delegate, contextInfo};
-  sheetParent_ = parent;
-  // A window that is attached to itself, directly or through others, could never accept input
-  // again.
-  for (auto above = parent; above; above = above->sheetParent())
-    if (above.get() == this) sheetParent_.reset();
+  session_.begin(delegate, contextInfo);
+  if (isAttachedTo(*this, parent)) {
+    sheetParent_.reset();
+  } else {
+    sheetParent_ = parent;
+  }
   makeKeyAndOrderFront();
 }
 
-void MemoryWindow::endAsSheet(long returnCode) {
-  sheetEnds_.push_back(returnCode);
-  const auto session = std::exchange(session_, std::nullopt);
-  if (!session) return;
-  if (const auto delegate = session->delegate.lock())
-    delegate->sheetDidEnd(shared_from_this(), returnCode, session->contextInfo);
-}
+void MemoryWindow::endAsSheet(long returnCode) { session_.end(shared_from_this(), returnCode); }
 
 }  // namespace qz::toolkit::memory

@@ -9,6 +9,7 @@
 #include "qz/toolkit/application.hpp"
 #include "qz/toolkit/geometry.hpp"
 #include "qz/toolkit/window.hpp"
+#include "toolkit/backend/sheet_session.hpp"
 #include "toolkit/memory/screen.hpp"
 
 namespace qz::toolkit::memory {
@@ -62,16 +63,11 @@ class MemoryWindow final : public Window, public std::enable_shared_from_this<Me
   /// Returns the window to which this one is attached as a sheet, or null.
   std::shared_ptr<MemoryWindow> sheetParent() const { return sheetParent_.lock(); }
   /// Returns the return codes of all requests to end the sheet, in order.
-  const std::vector<long>& sheetEnds() const { return sheetEnds_; }
+  const std::vector<long>& sheetEnds() const { return session_.ends(); }
 
  private:
   MemoryWindow(const std::shared_ptr<Screen>& screen, const Rect& content, StyleMask style,
                KeptBy keptBy);
-
-  struct Session {
-    std::weak_ptr<SheetDelegate> delegate;  // kept alive by its owner
-    void* contextInfo;
-  };
 
   std::weak_ptr<Screen> screen_;  // owned by the application
   Rect content_;
@@ -82,8 +78,7 @@ class MemoryWindow final : public Window, public std::enable_shared_from_this<Me
   Color background_ = windowBackground;
   int closes_ = 0;
   std::weak_ptr<MemoryWindow> sheetParent_;  // kept alive by its owner
-  std::optional<Session> session_;           // from the beginning of a sheet to its end
-  std::vector<long> sheetEnds_;
+  SheetSession session_;
 };
 
 }  // namespace qz::toolkit::memory

@@ -6,6 +6,7 @@
 #include <QCheckBox>
 #include <QVariant>
 
+#include "toolkit/backend/responder_chain.hpp"
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/check_state.hpp"
 #include "toolkit/qt/input_widgets.hpp"
@@ -41,20 +42,11 @@ std::shared_ptr<WidgetNode> makeView(QWidget& widget, const std::shared_ptr<Desk
 }
 
 bool ControlNode::send(std::string_view action, const std::shared_ptr<Responder>& target) {
-  if (action.empty()) return false;
-  // The action may delete the sender and its whole window, and change its action and target, so
-  // this function holds everything that it needs until its end.
-  const std::string selector(action);
-  const Ref<View> sender = view();
-  // NOLINTNEXTLINE(performance-unnecessary-copy-initialization)
-  if (const auto receiver = target) return receiver->tryToPerform(selector, sender);
-
-  const QPointer<QWidget> top = widget()->window();
-  for (Ref<View> responder = sender; responder; responder = of(responder)->superview())
-    if (responder->tryToPerform(selector, sender)) return true;
-  const auto window = top ? desk_->knownWindow(*top) : nullptr;
-  const auto delegate = window ? window->delegate() : nullptr;
-  return delegate && delegate->tryToPerform(selector, sender);
+  const QPointer<QWidget> top = widget() ? widget()->window() : nullptr;
+  return sendAlongResponderChain(
+      action, target, view(),
+      {[](const Ref<View>& view) { return of(view)->superview(); },
+       [desk = desk_, top]() -> Ref<Window> { return top ? desk->knownWindow(*top) : nullptr; }});
 }
 
 QtButton::~QtButton() { QObject::disconnect(clicks_); }

@@ -9,17 +9,13 @@
 #include <algorithm>
 #include <utility>
 
-#include "qz/toolkit/exception.hpp"
+#include "toolkit/backend/insertion.hpp"
 #include "toolkit/qt/coordinates.hpp"
 #include "toolkit/qt/focus.hpp"
 
 namespace qz::toolkit::qt {
 
 namespace {
-
-void refuse(const std::string& receiver, const std::string& what) {
-  throw InvalidArgumentException("-[" + receiver + " addSubview:]: " + what);
-}
 
 bool isSubview(const QObject* child) {
   return child->isWidgetType() && !static_cast<const QWidget*>(child)->isWindow();
@@ -133,15 +129,11 @@ const Subviews& WidgetNode::readSubviews() {
 void WidgetNode::insert(const Ref<View>& view) {
   const auto node = of(view);
   const auto receiver = nameOfClass();
-  if (!view) refuse(receiver, "the view is absent");
-  if (!node)
-    refuse(receiver, "the view, of class " + view->className() + ", belongs to another toolkit");
+  requireOwnView(receiver, view, node != nullptr);
   if (!widget_ || !node->widget_) return;
   QWidget& added = *node->widget_;
-  if (added.isWindow() && node->keptBy_ == Widget::host)
-    refuse(receiver, "the view is the content view of a window");
-  if (&added == widget_ || added.isAncestorOf(widget_))
-    refuse(receiver, "the view is the superview itself, or lies around it");
+  requireFreeView(receiver, added.isWindow() && node->keptBy_ == Widget::host,
+                  &added == widget_ || added.isAncestorOf(widget_));
 
   // The reference may be an element of the list that the view now leaves.
   // NOLINTNEXTLINE(performance-unnecessary-copy-initialization)

@@ -190,11 +190,8 @@ void QtWindow::wasHidden() {
 void QtWindow::beginAsSheet(const std::shared_ptr<QtWindow>& parent,
                             const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo) {
   detach();
-  session_ = Session{delegate, contextInfo};
-  // A window attached to itself, even through other windows, could never be used again.
-  bool isItsOwn = false;
-  for (auto above = parent; above; above = above->sheetParent()) isItsOwn |= above.get() == this;
-  if (parent && !isItsOwn) {
+  session_.begin(delegate, contextInfo);
+  if (parent && !isAttachedTo(*this, parent)) {
     sheetParent_ = parent;
     if (widget_ && parent->widget_) {
       widget_->hide();  // modality takes effect when a window is shown
@@ -204,12 +201,6 @@ void QtWindow::beginAsSheet(const std::shared_ptr<QtWindow>& parent,
   makeKeyAndOrderFront();
 }
 
-void QtWindow::endAsSheet(long returnCode) {
-  sheetEnds_.push_back(returnCode);
-  const auto session = std::exchange(session_, std::nullopt);
-  if (!session) return;
-  if (const auto delegate = session->delegate.lock())
-    delegate->sheetDidEnd(shared_from_this(), returnCode, session->contextInfo);
-}
+void QtWindow::endAsSheet(long returnCode) { session_.end(shared_from_this(), returnCode); }
 
 }  // namespace qz::toolkit::qt

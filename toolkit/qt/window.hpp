@@ -14,6 +14,7 @@
 #include "qz/toolkit/application.hpp"
 #include "qz/toolkit/geometry.hpp"
 #include "qz/toolkit/window.hpp"
+#include "toolkit/backend/sheet_session.hpp"
 #include "toolkit/qt/desk.hpp"
 
 namespace qz::toolkit::qt {
@@ -70,15 +71,10 @@ class QtWindow final : public Window, public std::enable_shared_from_this<QtWind
   /// Returns the window that it is attached to as a sheet; null if none.
   std::shared_ptr<QtWindow> sheetParent() const { return sheetParent_.lock(); }
   /// Returns the return codes of all requested ends, in order.
-  const std::vector<long>& sheetEnds() const { return sheetEnds_; }
+  const std::vector<long>& sheetEnds() const { return session_.ends(); }
 
  private:
   class Watch;
-  struct Session {
-    std::weak_ptr<SheetDelegate> delegate;  // owned by the code that made it
-    void* contextInfo;
-  };
-
   QtWindow(QWidget& widget, std::shared_ptr<Desk> desk, KeptBy keptBy);
 
   void show();
@@ -98,8 +94,7 @@ class QtWindow final : public Window, public std::enable_shared_from_this<QtWind
   int closes_ = 0;
   std::weak_ptr<QtWindow> sheetParent_;  // owned by its keeper
   std::unique_ptr<SheetPlace> place_;    // while it is attached
-  std::optional<Session> session_;       // from the beginning of a sheet to its end
-  std::vector<long> sheetEnds_;
+  SheetSession session_;
 };
 
 }  // namespace qz::toolkit::qt
