@@ -1,0 +1,45 @@
+// SPDX-License-Identifier: MIT
+// The words in which the transcript describes how a text looks.
+#include "tools/play/words.hpp"
+
+#include <gtest/gtest.h>
+
+namespace tools::play {
+namespace {
+
+using toolkit::ParagraphStyle;
+using toolkit::TextAlignment;
+using toolkit::TextAttributes;
+
+TEST(PlayWords, nameEveryAlignmentThatAnAuthorChose) {
+  const struct {
+    TextAlignment alignment;
+    const char* words;
+  } cases[] = {
+      {TextAlignment::left, "left"},       {TextAlignment::right, "right"},
+      {TextAlignment::center, "centred"},  {TextAlignment::justified, "justified"},
+      {TextAlignment::natural, "plain"},
+  };
+  for (const auto& test : cases) {
+    const TextAttributes attributes{.paragraphStyle = ParagraphStyle{.alignment = test.alignment}};
+    EXPECT_EQ(styleWords(attributes), test.words);
+  }
+}
+
+TEST(PlayWords, nameWhatDiffersFromPlainText) {
+  const struct {
+    TextAttributes attributes;
+    const char* words;
+  } cases[] = {
+      {{}, "plain"},
+      {{.superscript = 2}, "raised"},
+      {{.superscript = -1}, "lowered"},
+      {{.backgroundColor = toolkit::colors::red, .strikethrough = true}, "on red, struck through"},
+      {{.link = "x:y", .underline = true, .superscript = 1},
+       "underlined, raised, link to “x:y”"},
+  };
+  for (const auto& test : cases) EXPECT_EQ(styleWords(test.attributes), test.words);
+}
+
+}  // namespace
+}  // namespace tools::play
