@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 // The toolkit's exceptions, as a C++ program catches them.
-#include "toolkit/exception.hpp"
-
 #include <gtest/gtest.h>
+
+#include "toolkit/exception.hpp"
 
 namespace toolkit {
 namespace {

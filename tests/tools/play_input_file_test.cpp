@@ -1,7 +1,5 @@
 // SPDX-License-Identifier: MIT
 // Property lists that the player reads: what it says about those that it refuses.
-#include "tools/play/input_file.hpp"
-
 #include <gtest/gtest.h>
 
 #include <string>
@@ -9,6 +7,7 @@
 
 #include "play_files.hpp"
 #include "toolkit/property_list/scalars.hpp"
+#include "tools/play/input_file.hpp"
 
 namespace tools::play {
 namespace {
@@ -54,9 +53,10 @@ std::string refusalOfContents(std::string_view contents) {
 TEST(PlayInputFile, namesThePlaceOfTheFaultInTextAndInBytes) {
   EXPECT_EQ(refusalOfContents("{ 1 =\n  (; }"),
             "script.plist:2:4: expected ',' or ')', found ';' (read as old-style property list)");
-  EXPECT_EQ(refusalOfContents("bplist00\xff"),
-            "script.plist: byte 9: the file is too short for a header, an object and a trailer (read "
-            "as binary property list)");
+  EXPECT_EQ(
+      refusalOfContents("bplist00\xff"),
+      "script.plist: byte 9: the file is too short for a header, an object and a trailer (read "
+      "as binary property list)");
 }
 
 }  // namespace

@@ -1,7 +1,5 @@
 // SPDX-License-Identifier: MIT
 // The places of commands that raise: known only for the lists of the script.
-#include "tools/play/raised_places.hpp"
-
 #include <gtest/gtest.h>
 
 #include <memory>
@@ -11,6 +9,7 @@
 #include "play_files.hpp"
 #include "toolkit/memory/memory_driver.hpp"
 #include "toolkit/property_list/scalars.hpp"
+#include "tools/play/raised_places.hpp"
 
 namespace tools::play {
 namespace {

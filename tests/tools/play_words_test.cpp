@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 // The words in which the transcript describes how a text looks.
-#include "tools/play/words.hpp"
-
 #include <gtest/gtest.h>
+
+#include "tools/play/words.hpp"
 
 namespace tools::play {
 namespace {
@@ -16,8 +16,8 @@ TEST(PlayWords, nameEveryAlignmentThatAnAuthorChose) {
     TextAlignment alignment;
     const char* words;
   } cases[] = {
-      {TextAlignment::left, "left"},       {TextAlignment::right, "right"},
-      {TextAlignment::center, "centred"},  {TextAlignment::justified, "justified"},
+      {TextAlignment::left, "left"},      {TextAlignment::right, "right"},
+      {TextAlignment::center, "centred"}, {TextAlignment::justified, "justified"},
       {TextAlignment::natural, "plain"},
   };
   for (const auto& test : cases) {
@@ -35,8 +35,7 @@ TEST(PlayWords, nameWhatDiffersFromPlainText) {
       {{.superscript = 2}, "raised"},
       {{.superscript = -1}, "lowered"},
       {{.backgroundColor = toolkit::colors::red, .strikethrough = true}, "on red, struck through"},
-      {{.link = "x:y", .underline = true, .superscript = 1},
-       "underlined, raised, link to “x:y”"},
+      {{.link = "x:y", .underline = true, .superscript = 1}, "underlined, raised, link to “x:y”"},
   };
   for (const auto& test : cases) EXPECT_EQ(styleWords(test.attributes), test.words);
 }

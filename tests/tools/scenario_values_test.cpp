@@ -1,13 +1,12 @@
 // SPDX-License-Identifier: MIT
 // How scenarios show values of every kind as JSON.
-#include "tools/scenario/values.hpp"
-
 #include <gtest/gtest.h>
 
 #include <limits>
 #include <string>
 
 #include "toolkit/property_list/scalars.hpp"
+#include "tools/scenario/values.hpp"
 
 namespace tools::scenario {
 namespace {

@@ -8,8 +8,8 @@
 #include <stdexcept>
 #include <string>
 
-#include "toolkit/exception.hpp"
 #include "tool_run.hpp"
+#include "toolkit/exception.hpp"
 #include "tools/failure.hpp"
 
 namespace tools {
