@@ -2,6 +2,7 @@
 // Absent scalars answer as nothing does.
 #include <gtest/gtest.h>
 
+#include "toolkit/property_list/canonical_dump.hpp"
 #include "toolkit/property_list/scalars.hpp"
 
 namespace toolkit {
@@ -14,6 +15,7 @@ TEST(AbsentScalars, AreOfNoKindAndDescribeNothing) {
   EXPECT_EQ(null->description(), "");
   EXPECT_EQ(null->intValue(), 0);
   EXPECT_EQ(null->count(), 0U);
+  EXPECT_EQ(canonicalDump(*null.operator->()), "");
   EXPECT_EQ(ValueRef<String>()->description(), null->description());
 }
 

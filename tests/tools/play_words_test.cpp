@@ -26,6 +26,24 @@ TEST(PlayWords, nameEveryAlignmentThatAnAuthorChose) {
   }
 }
 
+TEST(PlayWords, nameEveryKindOfControl) {
+  using toolkit::ViewKind;
+  const struct {
+    ViewKind kind;
+    const char* word;
+  } cases[] = {
+      {ViewKind::button, "button"},
+      {ViewKind::toggle, "check box"},
+      {ViewKind::mixed, "mixed check box"},
+      {ViewKind::popUpButton, "pop-up button"},
+      {ViewKind::textField, "text field"},
+      {ViewKind::imageView, "image"},
+      {ViewKind::box, "box"},
+      {ViewKind::plain, "view"},
+  };
+  for (const auto& test : cases) EXPECT_EQ(kindWord(test.kind), test.word);
+}
+
 TEST(PlayWords, nameWhatDiffersFromPlainText) {
   const struct {
     TextAttributes attributes;

@@ -4,10 +4,13 @@
 
 #include <gtest/gtest.h>
 
+#include <csignal>
 #include <sstream>
 #include <string>
 
 #include "play_files.hpp"
+#include "toolkit/memory/memory_toolkit.hpp"
+#include "tools/play/input_file.hpp"
 #include "tools/play/play.hpp"
 
 namespace tools {
@@ -50,6 +53,28 @@ TEST_F(StackGuard, endsTheProgramWithTheListsThatRunEachOther) {
   EXPECT_EXIT(endless(), testing::ExitedWithCode(stackExhausted),
               "^qz-walkthrough: script.plist: the stack is exhausted: lists run each other without "
               "end \\(1 -> 2 -> 1\\)\n$");
+}
+
+// A lock of the engine may be held for ever when the stack ends; then an alarm ends the wait.
+TEST_F(StackGuard, endsTheProgramEvenIfTheEngineDoesNotAnswer) {
+  const auto waiting = [] {
+    installStackGuard();
+    toolkit::memory::MemoryToolkit toolkit;
+    const auto engine = QZ_Plist_State_Parser::init(toolkit);
+    guardScript(*engine, "script.plist", play::InputFile("script.plist", "a script").dictionary());
+    std::raise(SIGALRM);
+  };
+  EXPECT_EXIT(waiting(), testing::ExitedWithCode(stackExhausted),
+              "^qz-walkthrough: script.plist: the stack is exhausted: lists run each other");
+}
+
+TEST_F(StackGuard, leavesOtherBadAccessesToTheSystem) {
+  const auto broken = [] {
+    installStackGuard();
+    std::raise(SIGSEGV);
+    std::raise(SIGSEGV);
+  };
+  EXPECT_EXIT(broken(), testing::KilledBySignal(SIGSEGV), "^$");
 }
 #endif
 
