@@ -23,7 +23,8 @@ QPixmap pictureOf(const QtWindow& window) {
   const auto parent = window.sheetParent();
   if (!parent || !parent->widget()) return own;
 
-  const QPoint place = window.widget()->pos() - parent->widget()->pos();
+  const QPoint place =
+      window.widget()->geometry().topLeft() - parent->widget()->geometry().topLeft();
   const QPixmap under = pictureOf(*parent);
   const QRect parentArea(QPoint(), under.deviceIndependentSize().toSize());
   const QRect area = parentArea.united(QRect(place, window.widget()->size()));

@@ -153,7 +153,7 @@ TEST(Play, AWalkThroughThatStandsStillHasFailed) {
   options.steps = {Press{2}};
   const Played ended = run(options);
   EXPECT_EQ(ended.status, ExitStatus::fine);
-  EXPECT_EQ(ended.log.find("stands still"), std::string::npos);
+  EXPECT_EQ(ended.log.find("is stuck"), std::string::npos);
 }
 
 TEST(Play, ASheetLeavesTheScreenWhenItEnds) {
