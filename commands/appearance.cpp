@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
-// The commands that change the appearance of one control (colours, title, tooltip, image) or its
-// state.
+// The commands that change the appearance of one control (colours, title, tooltip, image), its
+// state, or the window's background.
 
-#include "engine/commands.hpp"
+#include "engine/command_calls.hpp"
 #include "engine/state.hpp"
 #include "engine/text_of.hpp"
 
@@ -89,16 +89,14 @@ bool QZ_Plist_State_Parser::setState(const ObjectId& id, toolkit::State state) {
   return true;
 }
 
-bool commands::setToolTip(QZ_Plist_State_Parser& engine,
-                          const QZ_Plist_State_Parser::Parameters& parameters,
-                          const QZ_Plist_State_Parser::ObjectId& id) {
-  const std::size_t count = parameters->count();
+bool commands::setToolTip(const CompoundCall& call) {
+  const std::size_t count = call.parameters->count();
   if (count == 0) return false;
-  const std::string_view text = textOf(parameters->objectAtIndex(0));
+  const std::string_view text = textOf(call.at(0));
   // The second parameter is the target only if it is the last one; otherwise the list's own control
   // is.
-  const toolkit::Tag tag = count == 2 ? parameters->objectAtIndex(1)->intValue() : id->longValue();
-  const QZ_Plist_State_Parser::Control control = engine.findObjectWithTag(tag);
+  const toolkit::Tag tag = count == 2 ? call.at(1)->intValue() : call.id->longValue();
+  const QZ_Plist_State_Parser::Control control = call.engine.findObjectWithTag(tag);
   if (!control) return false;
   control->setToolTip(text);
   control->needsDisplay();
@@ -108,20 +106,20 @@ bool commands::setToolTip(QZ_Plist_State_Parser& engine,
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TOOL_TIP(Parameters parameters,
                                                                   ObjectId forObject) {
   const auto kept = keepAlive();
-  return commands::setToolTip(*this, commands::ownList(parameters), forObject);
+  const Parameters own = commands::ownList(parameters);
+  return commands::setToolTip({*this, own, forObject, state_->toolkit});
 }
 
-bool commands::loadGraphic(QZ_Plist_State_Parser& engine, toolkit::Toolkit& toolkit,
-                           const QZ_Plist_State_Parser::Parameters& parameters) {
-  if (parameters->count() != 2) return false;
-  const toolkit::Tag tag = parameters->objectAtIndex(1)->intValue();
+bool commands::loadGraphic(const CompoundCall& call) {
+  if (call.parameters->count() != 2) return false;
+  const toolkit::Tag tag = call.at(1)->intValue();
   // Two diagnostics that the test of the count above makes unreachable; their place is kept on
   // purpose.
-  if (!parameters) toolkit.log().write("No commandInfo found.");
-  if (parameters->count() == 0) toolkit.log().write("commandInfo count is zero.");
+  if (!call.parameters) call.toolkit.log().write("No commandInfo found.");
+  if (call.parameters->count() == 0) call.toolkit.log().write("commandInfo count is zero.");
   // A resource name, not a path, despite the command's name.
-  const auto image = toolkit.images().imageNamed(textOf(parameters->objectAtIndex(0)));
-  const auto imageView = toolkit::asImageView(engine.findObjectWithTag(tag));
+  const auto image = call.toolkit.images().imageNamed(textOf(call.at(0)));
+  const auto imageView = toolkit::asImageView(call.engine.findObjectWithTag(tag));
   if (!imageView) return false;
   imageView->setImage(image);
   imageView->needsDisplay();
@@ -129,9 +127,18 @@ bool commands::loadGraphic(QZ_Plist_State_Parser& engine, toolkit::Toolkit& tool
 }
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH(
-    Parameters parameters, ObjectId) {
+    Parameters parameters, ObjectId forObject) {
   const auto kept = keepAlive();
-  return commands::loadGraphic(*this, state_->toolkit, commands::ownList(parameters));
+  const Parameters own = commands::ownList(parameters);
+  return commands::loadGraphic({*this, own, forObject, state_->toolkit});
+}
+
+bool commands::loadBackground(const CompoundCall& call) {
+  const auto image = call.toolkit.images().imageNamed(textOf(call.at(0)));
+  const auto content = call.engine.tutorialWindow()->contentView();
+  content->setWantsLayer(true);
+  content->setLayerContents(image);
+  return true;
 }
 
 }  // namespace qz

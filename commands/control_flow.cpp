@@ -2,6 +2,7 @@
 // The commands that control a run: running another list, ending the walk-through, and the idle
 // placeholder.
 
+#include "engine/command_calls.hpp"
 #include "engine/state.hpp"
 #include "engine/tag_key.hpp"
 
@@ -14,12 +15,24 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(Obj
   return processCommandArray(std::move(list), std::move(id));
 }
 
+// No limit, on purpose: a list with this command runs itself again from its first element.
+bool commands::processCommands(const SimpleCall& call) {
+  return call.engine.QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(call.id);
+}
+
 void QZ_Plist_State_Parser::QZ_Plist_State_Processor_TERMINATE_PARSER() {
   const auto kept = keepAlive();
   state_->terminating = true;
   terminateParser();
 }
 
+bool commands::terminate(const SimpleCall& call) {
+  call.engine.QZ_Plist_State_Processor_TERMINATE_PARSER();
+  return true;
+}
+
 void QZ_Plist_State_Parser::QZ_Plist_State_Processor_RETURN_TO_IDLE_LOOP() {}
+
+bool commands::idle(const SimpleCall&) { return true; }
 
 }  // namespace qz

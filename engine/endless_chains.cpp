@@ -4,8 +4,9 @@
 #include <algorithm>
 
 #include "engine/tag_key.hpp"
-#include "qz/engine.hpp"
-#include "text/uppercase.hpp"
+#include "qz/commands.hpp"
+#include "qz/property_list/scalars.hpp"
+#include "qz/toolkit/exception.hpp"
 
 namespace qz {
 
@@ -17,8 +18,11 @@ using Graph = std::map<std::string, Keys, std::less<>>;
 // The engine has no script after this command: later elements chain to nothing.
 bool endsTheWalkThrough(const toolkit::ValueRef<>& element) {
   const auto simple = toolkit::asString(element);
-  return simple && simple->text() == QZ_PLIST_STATE_PARSER_TERMINATE_PARSER;
+  const Command* const command = simple ? simpleCommandNamed(simple->text()) : nullptr;
+  return command && command->flow == CommandFlow::endsWalkThrough;
 }
+
+bool runsList(const Command* command) { return command && command->flow == CommandFlow::runsList; }
 
 Graph chainsOf(const toolkit::ValueRef<toolkit::Dictionary>& script) {
   Graph graph;
@@ -62,18 +66,19 @@ void removeEndingLists(Graph& graph) {
 }  // namespace
 
 std::optional<std::string> chainTarget(const toolkit::ValueRef<>& element, const std::string& own) {
-  const std::string& chain = QZ_PLIST_STATE_PARSER_PROCESS_COMMANDS_FOR_ID;
   if (const auto simple = toolkit::asString(element)) {
-    return simple->text() == chain ? std::optional(own) : std::nullopt;
+    return runsList(simpleCommandNamed(simple->text())) ? std::optional(own) : std::nullopt;
   }
   const auto compound = toolkit::asArray(element);
-  if (compound->count() < 2) return std::nullopt;
+  if (compound->count() == 0) return std::nullopt;
   const auto name = toolkit::asString(compound->elements()[0]);
-  if (!name || text::uppercased(name->text()) != chain) return std::nullopt;
+  const Command* const command = name ? compoundCommandNamed(name->text()) : nullptr;
+  if (!runsList(command)) return std::nullopt;
   try {
-    return tagKey(compound->elements()[1]->intValue());
+    const auto position = *command->positionOf(ParameterType::listTag);
+    return tagKey(compound->objectAtIndex(position + 1)->intValue());
   } catch (const toolkit::Exception&) {
-    return std::nullopt;  // not a tag: the run continues with the next element
+    return std::nullopt;  // missing, or not a tag: the run continues with the next element
   }
 }
 

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // The command-list runner: every list runs through it.
 
-#include "engine/commands.hpp"
+#include "engine/command_calls.hpp"
 #include "engine/state.hpp"
 #include "engine/text_of.hpp"
 #include "text/uppercase.hpp"
@@ -19,7 +19,7 @@ bool runElement(Engine& engine, toolkit::Toolkit& toolkit, const Engine::Value& 
                 bool isFixed, const Engine::Parameters& parameters, const Engine::ObjectId& id) {
   if (element->kind() != toolkit::Value::Kind::array) {
     parameters->removeAllObjects();
-    return commands::runSimple(engine, textOf(Engine::Value(element)), id);
+    return commands::runSimple(textOf(Engine::Value(element)), engine, id);
   }
   // Not asArray, which would count a reference: this runs for every command.
   const auto& compound = static_cast<const toolkit::Array&>(*element);
@@ -27,7 +27,7 @@ bool runElement(Engine& engine, toolkit::Toolkit& toolkit, const Engine::Value& 
   const auto name = text::uppercased(textOf(compound.objectAtIndex(0)), raised);
   const auto given = compound.elements().subspan(1);
   isFixed ? parameters->borrowElements(given) : parameters->setElements(given);
-  return commands::runCompound(engine, toolkit, name, parameters, id);
+  return commands::runCompound(name, {engine, parameters, id, toolkit});
 }
 
 }  // namespace

@@ -9,7 +9,7 @@
 
 namespace qz::tools::scenario {
 
-/// Returns the constants' names, in the order of their declaration.
+/// Returns the constants' names, in the order of the catalogue.
 std::vector<std::string_view> commandConstants();
 
 /// Renames commands, and restores their names on destruction.
