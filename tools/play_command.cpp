@@ -47,9 +47,9 @@ void addAdvance(play::PlayOptions& options, const std::string& text) {
 }
 
 void addWindowOptions(Command& command, play::PlayOptions& options) {
-  auto window = command.option("--window", options.window,
+  auto window = command.option("--window", options.stage.window,
                                "The host's window, a property list of its controls");
-  auto assets = command.option("--assets", options.assets,
+  auto assets = command.option("--assets", options.stage.assets,
                                "A description from which the engine builds the window");
   window.valueName("HOST.plist").excludes(assets);
   assets.valueName("DESCRIPTION.plist");
@@ -57,7 +57,7 @@ void addWindowOptions(Command& command, play::PlayOptions& options) {
       .option("--resources", options.resources,
               "The directory of the images (default: the script's)")
       .valueName("DIR");
-  command.flag("--sheet", options.sheet,
+  command.flag("--sheet", options.stage.sheet,
                "Show the window as a sheet over another window of the host");
   options.toolkit = playerToolkit();
   command.option("--toolkit", options.toolkit, "The toolkit to play the script on")

@@ -24,7 +24,7 @@ TEST(PlayRaisingTimer, IsAStepOfItsOwnAndThePersonGoesOn) {
   PlayOptions options;
   options.script = directory.path() + "/script.plist";
   drivers::QtDriver driver;
-  Stage stage(driver, options, InputFile(options.script, "a script").dictionary());
+  Stage stage(driver, options.stage, InputFile(options.script, "a script").dictionary(), options.script);
   std::ostringstream out;
   Session session(driver, stage, out, {});
   session.start(options.script, "1");

@@ -121,7 +121,7 @@ class PlayedByAPerson : public testing::Test {
   const PlayOptions options = optionsOfScript();
   const InputFile file{options.script, "a script"};
   drivers::QtDriver driver;
-  Stage stage{driver, options, file.dictionary()};
+  Stage stage{driver, options.stage, file.dictionary(), options.script};
   std::ostringstream out;
   Session session{driver, stage, out, {}};
 };

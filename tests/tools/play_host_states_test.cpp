@@ -5,7 +5,7 @@
 #include <string>
 
 #include "play_files.hpp"
-#include "tools/play/host_window.hpp"
+#include "tools/walkthrough/host_window.hpp"
 
 namespace qz::tools::play {
 namespace {

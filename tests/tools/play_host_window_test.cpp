@@ -4,7 +4,7 @@
 
 #include "drivers/memory/memory_driver.hpp"
 #include "play_files.hpp"
-#include "tools/play/host_window.hpp"
+#include "tools/walkthrough/host_window.hpp"
 #include "tools/support/failure.hpp"
 
 namespace qz::tools::play {

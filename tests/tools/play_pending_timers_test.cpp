@@ -7,8 +7,8 @@
 
 #include "drivers/memory/memory_driver.hpp"
 #include "play_files.hpp"
-#include "tools/play/stage.hpp"
-#include "tools/play/step_picture.hpp"
+#include "tools/walkthrough/stage.hpp"
+#include "tools/walkthrough/step_picture.hpp"
 #include "tools/support/input_file.hpp"
 
 namespace qz::tools::play {
@@ -20,10 +20,9 @@ TEST(PlayPendingTimers, TheNextToFireComesFirst) {
                   "{ 1 = ((SET_TIMER_FOR_ID, 9, 2), (SET_TIMER_FOR_ID, 4, 3),"
                   "       (SET_TIMER_FOR_ID, 9, 4), (SET_TIMER_FOR_ID, 1, 5));"
                   "  2 = (); 3 = (); 4 = (); 5 = (); }");
-  PlayOptions options;
-  options.script = "script.plist";
+  StageOptions options;
   drivers::MemoryDriver driver;
-  Stage stage(driver, options, InputFile("script.plist", "a script").dictionary());
+  Stage stage(driver, options, InputFile("script.plist", "a script").dictionary(), "script.plist");
   stage.load(directory.path() + "/script.plist", "1");
 
   std::vector<std::string> timers;

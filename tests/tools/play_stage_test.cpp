@@ -4,9 +4,9 @@
 
 #include "drivers/memory/memory_driver.hpp"
 #include "play_files.hpp"
-#include "tools/play/stage.hpp"
-#include "tools/play/stand_in.hpp"
-#include "tools/play/step_picture.hpp"
+#include "tools/walkthrough/stage.hpp"
+#include "tools/walkthrough/stand_in.hpp"
+#include "tools/walkthrough/step_picture.hpp"
 #include "tools/play/words.hpp"
 #include "tools/support/input_file.hpp"
 
@@ -68,10 +68,9 @@ TEST(PlayStage, PicturesSayWhatPressesReach) {
                   "({class = NSButton; tag = 1; frame = (0, 0, 1, 1);},"
                   " {class = NSButton; tag = 1; frame = (0, 0, 1, 1);},"
                   " {class = NSTextField; tag = 3; frame = (0, 0, 1, 1);})");
-  PlayOptions options;
-  options.script = "script.plist";
+  StageOptions options;
   options.window = "host.plist";
-  Stage stage(driver, options, InputFile("script.plist", "a script").dictionary());
+  Stage stage(driver, options, InputFile("script.plist", "a script").dictionary(), "script.plist");
   stage.load(directory.path() + "/script.plist", "");
   const StepPicture picture = takePicture(driver, stage.engine(), "title");
   ASSERT_EQ(picture.controls.size(), 3U);
@@ -90,9 +89,8 @@ TEST(PlayStage, NothingFlashesAfterTheEnd) {
   drivers::MemoryDriver driver;
   const WorkingDirectory directory;
   directory.write("script.plist", "{ 1 = ((ALLOW_FLASHING, YES), (FLASH_ID, YES, 1)); }");
-  PlayOptions options;
-  options.script = "script.plist";
-  Stage stage(driver, options, InputFile("script.plist", "a script").dictionary());
+  StageOptions options;
+  Stage stage(driver, options, InputFile("script.plist", "a script").dictionary(), "script.plist");
   stage.load(directory.path() + "/script.plist", "1");
   EXPECT_TRUE(takePicture(driver, stage.engine(), "").controls[0].flashing);
   stage.engine().terminateParser();

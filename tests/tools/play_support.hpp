@@ -8,7 +8,7 @@
 #include <sstream>
 #include <string>
 
-#include "tools/play/step_picture.hpp"
+#include "tools/walkthrough/step_picture.hpp"
 
 namespace qz::tools::play {
 

@@ -51,7 +51,7 @@ PlayOptions firstSteps() {
   const std::string directory = std::string(QZ_SOURCE_DIR) + "/examples/first-steps/";
   PlayOptions options;
   options.script = directory + "script.plist";
-  options.window = directory + "host.plist";
+  options.stage.window = directory + "host.plist";
   return options;
 }
 
@@ -159,7 +159,7 @@ TEST(Play, AWalkThroughThatStandsStillHasFailed) {
 TEST(Play, ASheetLeavesTheScreenWhenItEnds) {
   const WorkingDirectory directory;
   PlayOptions options = smallScript(directory);
-  options.sheet = true;
+  options.stage.sheet = true;
   options.steps = {Press{3}};
   const std::string transcript = run(options).transcript;
   const std::size_t end = transcript.find("── 2.");
@@ -173,7 +173,7 @@ TEST(Play, TheEngineBuildsTheWindowFromADescription) {
   PlayOptions options = smallScript(directory);
   directory.write("assets.plist",
                   "{ 1 = (NSButton, 20, 20, 100, 30); 2 = (Unknown, 0, 0, 0, 0); }");
-  options.assets = "assets.plist";
+  options.stage.assets = "assets.plist";
   options.steps = {Press{1}};
   const Played played = run(options);
   EXPECT_EQ(played.status, ExitStatus::fine);
@@ -238,7 +238,7 @@ TEST(Play, SaysWhatIsWrongWithTheStart) {
 TEST(Play, SaysWhatIsWrongWithADescription) {
   const WorkingDirectory directory;
   PlayOptions options = smallScript(directory);
-  options.assets = "assets.plist";
+  options.stage.assets = "assets.plist";
   const struct {
     std::string text;
     std::string message;
@@ -271,7 +271,7 @@ TEST(Play, SaysWhatIsWrongWithAFile) {
   options.script = ".";
   EXPECT_EQ(refusal(options), ".: a directory; expected a script");
   options = smallScript(directory);
-  options.window = "host.plist";
+  options.stage.window = "host.plist";
   EXPECT_EQ(refusal(options), "host.plist: no such file; expected a host's window");
   options = smallScript(directory);
   options.resources = "images";

@@ -5,9 +5,11 @@
 #include <string>
 #include <vector>
 
-#include "tools/play/step_picture.hpp"
+#include "tools/walkthrough/step_picture.hpp"
 
 namespace qz::tools::play {
+
+using namespace walkthrough;
 
 /// One thing that changed, in words.
 struct Change {

@@ -7,9 +7,11 @@
 #include <string_view>
 
 #include "tools/play/picture_diff.hpp"
-#include "tools/play/step_picture.hpp"
+#include "tools/walkthrough/step_picture.hpp"
 
 namespace qz::tools::play {
+
+using namespace walkthrough;
 
 struct Style {
   bool color = false;       ///< with the escape sequences of a colour terminal

@@ -16,7 +16,7 @@
 #include "tools/play/raised_places.hpp"
 #include "tools/play/screenshots.hpp"
 #include "tools/play/session.hpp"
-#include "tools/play/stage.hpp"
+#include "tools/walkthrough/stage.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/input_file.hpp"
 #include "tools/support/suggestions.hpp"
@@ -138,7 +138,7 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   } else if (driver->hasPerson()) {
     driver->useRealTime();
   }
-  Stage stage(*driver, options, file.dictionary());
+  Stage stage(*driver, options.stage, file.dictionary(), options.script);
   stage.engine().setObserver(std::make_shared<RaisedPlaces>(file, stage.engine(), terminal.log));
   Session session(*driver, stage, terminal.out, terminal.style,
                   screenshots ? &*screenshots : nullptr);

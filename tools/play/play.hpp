@@ -5,38 +5,23 @@
 #include <iosfwd>
 #include <optional>
 #include <string>
-#include <variant>
 #include <vector>
 
-#include "qz/toolkit/tag.hpp"
 #include "tools/play/picture_render.hpp"
 #include "tools/support/failure.hpp"
+#include "tools/walkthrough/stage.hpp"
+#include "tools/walkthrough/steps.hpp"
 
 namespace qz::tools::play {
 
-/// The user presses the control with this tag.
-struct Press {
-  toolkit::Tag tag = 0;
-};
-
-/// Time passes.
-struct Advance {
-  double seconds = 0;
-};
-
-using Step = std::variant<Press, Advance>;
-
-/// The longest time that may pass in one step, in seconds: a day.
-inline constexpr double longestAdvance = 24 * 3600;
+using namespace walkthrough;
 
 struct PlayOptions {
   std::string script;                    ///< path of the script
-  std::optional<std::string> window;     ///< path of the host's window; or
-  std::optional<std::string> assets;     ///< path of a description from which the engine builds one
+  StageOptions stage;                    ///< the window that it is played in
   std::string startKey;                  ///< empty: the smallest tag
   std::optional<std::string> resources;  ///< directory of named images; absent: the script's own
   std::vector<Step> steps;               ///< what happens after the start, in order
-  bool sheet = false;                    ///< show it as a sheet over another window of the host
   std::string toolkit = "memory";
   std::optional<std::string> screenshots;  ///< directory for a picture of every step
 };

@@ -5,9 +5,11 @@
 #include <optional>
 #include <string>
 
-#include "tools/play/step_picture.hpp"
+#include "tools/walkthrough/step_picture.hpp"
 
 namespace qz::tools::play {
+
+using namespace walkthrough;
 
 /// Returns the control that scripts and presses find by `tag`: the rearmost. Null if there is none.
 const ControlPicture* controlWithTag(const StepPicture& picture, toolkit::Tag tag);

@@ -2,7 +2,7 @@
 // Reads what the user of an interactive walk-through asks for.
 #include "tools/play/prompt.hpp"
 
-#include "tools/play/parse_number.hpp"
+#include "tools/walkthrough/parse_number.hpp"
 #include "tools/support/text_layout.hpp"
 
 namespace qz::tools::play {

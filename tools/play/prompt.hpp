@@ -10,6 +10,8 @@
 
 namespace qz::tools::play {
 
+using namespace walkthrough;
+
 struct Help {};
 struct Quit {};
 /// A line that is not a known request; the hint says what was expected.

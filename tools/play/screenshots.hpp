@@ -12,6 +12,8 @@
 
 namespace qz::tools::play {
 
+using namespace walkthrough;
+
 class Screenshots {
  public:
   /// Makes the directory if there is none, and deletes the pictures of an earlier walk-through.

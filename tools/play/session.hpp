@@ -12,10 +12,12 @@
 #include "qz/toolkit/exception.hpp"
 #include "tools/play/play.hpp"
 #include "tools/play/screenshots.hpp"
-#include "tools/play/stage.hpp"
+#include "tools/walkthrough/stage.hpp"
 #include "tools/play/transcript.hpp"
 
 namespace qz::tools::play {
+
+using namespace walkthrough;
 
 class Session {
  public:

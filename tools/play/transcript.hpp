@@ -9,9 +9,11 @@
 #include <vector>
 
 #include "tools/play/picture_render.hpp"
-#include "tools/play/step_picture.hpp"
+#include "tools/walkthrough/step_picture.hpp"
 
 namespace qz::tools::play {
+
+using namespace walkthrough;
 
 class Transcript {
  public:

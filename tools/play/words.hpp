@@ -8,9 +8,11 @@
 
 #include "drivers/driver.hpp"
 #include "qz/styled_text/attributed_string.hpp"
-#include "tools/play/step_picture.hpp"
+#include "tools/walkthrough/step_picture.hpp"
 
 namespace qz::tools::play {
+
+using namespace walkthrough;
 
 /// Returns the everyday word for a kind of view, such as "check box".
 std::string_view kindWord(drivers::ViewKind kind);

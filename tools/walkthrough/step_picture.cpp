@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: MIT
 // Takes pictures of a walk-through.
-#include "tools/play/step_picture.hpp"
+#include "tools/walkthrough/step_picture.hpp"
 
 #include <algorithm>
 #include <set>
 #include <utility>
 
-namespace qz::tools::play {
+namespace qz::tools::walkthrough {
 namespace {
 
 ControlPicture lookAtControl(drivers::Driver& driver, const QZ_Plist_State_Parser& engine,
@@ -62,4 +62,4 @@ StepPicture takePicture(drivers::Driver& driver, const QZ_Plist_State_Parser& en
   return picture;
 }
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools::walkthrough

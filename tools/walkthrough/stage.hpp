@@ -3,23 +3,32 @@
 #pragma once
 
 #include <memory>
+#include <optional>
 #include <string>
 
 #include "drivers/driver.hpp"
 #include "qz/engine.hpp"
-#include "tools/play/host_window.hpp"
-#include "tools/play/play.hpp"
+#include "tools/walkthrough/host_window.hpp"
 
-namespace qz::tools::play {
+namespace qz::tools::walkthrough {
+
+/// What a walk-through is played on. Without a window and a description, its window is made from the
+/// script itself.
+struct StageOptions {
+  std::optional<std::string> window;  ///< path of the host's window; or
+  std::optional<std::string> assets;  ///< path of a description from which the engine builds one
+  bool sheet = false;                 ///< show it as a sheet over another window of the host
+};
 
 /// Sets up the walk-through window as the options say: from the host's window, from a description,
 /// or, without either, from the script itself. The driver must outlive it. Terminates the engine on
 /// destruction, because the engine's timers would keep it alive.
 class Stage {
  public:
-  /// Throws a Failure if a file does not hold what it should.
-  Stage(drivers::Driver& driver, const PlayOptions& options,
-        const QZ_Plist_State_Parser::Dictionary& script);
+  /// `script` is the script, and `path` its file, for messages. Throws a Failure if a file does not
+  /// hold what it should.
+  Stage(drivers::Driver& driver, const StageOptions& options,
+        const QZ_Plist_State_Parser::Dictionary& script, const std::string& path);
   ~Stage();
   Stage(const Stage&) = delete;
   Stage& operator=(const Stage&) = delete;
@@ -44,4 +53,4 @@ class Stage {
   std::shared_ptr<QZ_Plist_State_Parser> engine_;
 };
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools::walkthrough

@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: MIT
 // What a walk-through is played on.
-#include "tools/play/stage.hpp"
+#include "tools/walkthrough/stage.hpp"
 
-#include "tools/play/gui_description.hpp"
-#include "tools/play/stand_in.hpp"
+#include "tools/walkthrough/gui_description.hpp"
+#include "tools/walkthrough/stand_in.hpp"
 #include "tools/support/input_file.hpp"
 #include "tools/support/stack_guard.hpp"
 
-namespace qz::tools::play {
+namespace qz::tools::walkthrough {
 namespace {
 
 constexpr toolkit::Rect parentContent{80, 80, 800, 600};
@@ -22,8 +22,8 @@ class SheetRemover final : public toolkit::SheetDelegate {
 
 }  // namespace
 
-Stage::Stage(drivers::Driver& driver, const PlayOptions& options,
-             const QZ_Plist_State_Parser::Dictionary& script)
+Stage::Stage(drivers::Driver& driver, const StageOptions& options,
+             const QZ_Plist_State_Parser::Dictionary& script, const std::string& path)
     : driver_(driver), sheet_(options.sheet), delegate_(std::make_shared<SheetRemover>()) {
   if (sheet_) parent_ = driver_.makeWindow(parentContent);
   if (options.assets) {
@@ -31,9 +31,9 @@ Stage::Stage(drivers::Driver& driver, const PlayOptions& options,
   } else if (options.window) {
     adopt(parseHostWindow(InputFile(*options.window, "a host's window")), *options.window);
   } else {
-    adopt(standInWindow(script), options.script);
+    adopt(standInWindow(script), path);
   }
-  guardScript(*engine_, options.script, script);
+  guardScript(*engine_, path, script);
 }
 
 Stage::~Stage() {
@@ -62,4 +62,4 @@ bool Stage::load(const std::string& script, const std::string& startKey) {
   return engine_->loadPlist(script, startKey, delegate_, sheet_);
 }
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools::walkthrough

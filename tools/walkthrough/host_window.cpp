@@ -1,19 +1,19 @@
 // SPDX-License-Identifier: MIT
 // The host's window that a walk-through is played over.
-#include "tools/play/host_window.hpp"
+#include "tools/walkthrough/host_window.hpp"
 
 #include <cstddef>
 
 #include "qz/property_list/collections.hpp"
 #include "qz/property_list/scalars.hpp"
-#include "tools/play/plist_entry.hpp"
+#include "tools/walkthrough/plist_entry.hpp"
 #include "tools/play/words.hpp"
 #include "tools/support/failure.hpp"
 #include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
 #include "tools/support/view_kinds.hpp"
 
-namespace qz::tools::play {
+namespace qz::tools::walkthrough {
 namespace {
 
 using drivers::ViewKind;
@@ -135,4 +135,4 @@ toolkit::Ref<toolkit::Window> makeHostWindow(drivers::Driver& driver, const Host
   return window;
 }
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools::walkthrough

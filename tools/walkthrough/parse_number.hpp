@@ -7,7 +7,7 @@
 #include <string_view>
 #include <system_error>
 
-namespace qz::tools::play {
+namespace qz::tools::walkthrough {
 
 /// Returns the number that `text` spells from its first character to its last; absent otherwise.
 template <class T>
@@ -18,4 +18,4 @@ std::optional<T> parseNumber(std::string_view text) {
   return whole ? std::optional(number) : std::nullopt;
 }
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools::walkthrough

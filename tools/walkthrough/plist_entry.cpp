@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // One entry of a file that describes a window.
-#include "tools/play/plist_entry.hpp"
+#include "tools/walkthrough/plist_entry.hpp"
 
 #include <algorithm>
 #include <array>
@@ -8,11 +8,11 @@
 #include <utility>
 
 #include "qz/property_list/scalars.hpp"
-#include "tools/play/parse_number.hpp"
+#include "tools/walkthrough/parse_number.hpp"
 #include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
 
-namespace qz::tools::play {
+namespace qz::tools::walkthrough {
 namespace {
 
 std::optional<std::int64_t> integerOf(const toolkit::ValueRef<>& value) {
@@ -120,4 +120,4 @@ void PlistEntry::failAt(const toolkit::ValueRef<>& value, const std::string& mes
   file_.fail(value, name_ + ": " + message);
 }
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools::walkthrough

@@ -1,16 +1,16 @@
 // SPDX-License-Identifier: MIT
 // A window for a script that is played without one: guesses each tag's kind from what the script
 // does with it.
-#include "tools/play/stand_in.hpp"
+#include "tools/walkthrough/stand_in.hpp"
 
 #include <map>
 #include <string>
 
 #include "qz/commands.hpp"
 #include "qz/property_list/scalars.hpp"
-#include "tools/play/parse_number.hpp"
+#include "tools/walkthrough/parse_number.hpp"
 
-namespace qz::tools::play {
+namespace qz::tools::walkthrough {
 namespace {
 
 using drivers::ViewKind;
@@ -93,4 +93,4 @@ HostWindow standInWindow(const toolkit::ValueRef<toolkit::Dictionary>& script) {
   return host;
 }
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools::walkthrough

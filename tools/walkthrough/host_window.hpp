@@ -12,7 +12,7 @@
 #include "qz/toolkit/geometry.hpp"
 #include "tools/support/input_file.hpp"
 
-namespace qz::tools::play {
+namespace qz::tools::walkthrough {
 
 struct HostControl {
   drivers::ViewKind kind = drivers::ViewKind::plain;
@@ -41,4 +41,4 @@ HostWindow parseHostWindow(const InputFile& file);
 toolkit::Ref<toolkit::Window> makeHostWindow(drivers::Driver& driver, const HostWindow& host,
                                              std::string_view file);
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools::walkthrough

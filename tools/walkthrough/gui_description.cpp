@@ -1,13 +1,13 @@
 // SPDX-License-Identifier: MIT
 // Descriptions from which the engine builds a walk-through window.
-#include "tools/play/gui_description.hpp"
+#include "tools/walkthrough/gui_description.hpp"
 
 #include <string>
 
 #include "qz/property_list/scalars.hpp"
 #include "tools/support/text_layout.hpp"
 
-namespace qz::tools::play {
+namespace qz::tools::walkthrough {
 namespace {
 
 bool answersFloatValue(const toolkit::ValueRef<>& value) {
@@ -44,4 +44,4 @@ void checkGuiDescription(const InputFile& file) {
   }
 }
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools::walkthrough

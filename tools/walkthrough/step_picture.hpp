@@ -11,7 +11,7 @@
 #include "drivers/driver.hpp"
 #include "qz/engine.hpp"
 
-namespace qz::tools::play {
+namespace qz::tools::walkthrough {
 
 struct ControlPicture {
   /// Identifies the control even after its tag has changed.
@@ -43,4 +43,4 @@ struct StepPicture {
 StepPicture takePicture(drivers::Driver& driver, const QZ_Plist_State_Parser& engine,
                         std::string title);
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools::walkthrough

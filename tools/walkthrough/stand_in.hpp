@@ -3,13 +3,13 @@
 #pragma once
 
 #include "qz/property_list/collections.hpp"
-#include "tools/play/host_window.hpp"
+#include "tools/walkthrough/host_window.hpp"
 
-namespace qz::tools::play {
+namespace qz::tools::walkthrough {
 
 /// Returns a window with one control for every tag that the script names, from top to bottom in the
 /// order of the tags. The script's use of a tag decides its kind: image view, check box, button
 /// (also if it has a list), else text field.
 HostWindow standInWindow(const toolkit::ValueRef<toolkit::Dictionary>& script);
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools::walkthrough

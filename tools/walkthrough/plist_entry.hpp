@@ -12,7 +12,7 @@
 #include "qz/toolkit/geometry.hpp"
 #include "tools/support/input_file.hpp"
 
-namespace qz::tools::play {
+namespace qz::tools::walkthrough {
 
 /// Returns the finite number that a value holds, whole or not: from a number, or from a string that
 /// spells one from start to end (the old-style format has only strings). Absent for other values.
@@ -49,4 +49,4 @@ class PlistEntry {
   toolkit::ValueRef<toolkit::Dictionary> fields_;
 };
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools::walkthrough

@@ -4,10 +4,10 @@
 
 #include "tools/support/input_file.hpp"
 
-namespace qz::tools::play {
+namespace qz::tools::walkthrough {
 
 /// Throws a Failure if the engine could not read the whole description: it must have an entry, and
 /// every entry must be an array of a class name and four numbers. Accepts what the engine ignores.
 void checkGuiDescription(const InputFile& file);
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools::walkthrough

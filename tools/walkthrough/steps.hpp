@@ -1,0 +1,26 @@
+// SPDX-License-Identifier: MIT
+// The steps of a walk-through.
+#pragma once
+
+#include <variant>
+
+#include "qz/toolkit/tag.hpp"
+
+namespace qz::tools::walkthrough {
+
+/// The user presses the control with this tag.
+struct Press {
+  toolkit::Tag tag = 0;
+};
+
+/// Time passes.
+struct Advance {
+  double seconds = 0;
+};
+
+using Step = std::variant<Press, Advance>;
+
+/// The longest time that may pass in one step, in seconds: a day.
+inline constexpr double longestAdvance = 24 * 3600;
+
+}  // namespace qz::tools::walkthrough
