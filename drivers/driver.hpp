@@ -37,6 +37,8 @@ struct ViewPicture {
   std::shared_ptr<Responder> target;
   std::optional<std::string> action;
   std::optional<Color> background;  // of a button, within its bezel
+
+  friend bool operator==(const ViewPicture&, const ViewPicture&) = default;
 };
 
 /// A snapshot of a window.
@@ -52,6 +54,8 @@ struct WindowPicture {
   std::optional<std::string> layerImage;  // the name of its layer's contents
   Ref<Window> sheetOf;                    // the window it is attached to as a sheet
   std::vector<long> sheetEnds;            // return codes of all requests to end it, in order
+
+  friend bool operator==(const WindowPicture&, const WindowPicture&) = default;
 };
 
 /// What the program does whose windows these are.

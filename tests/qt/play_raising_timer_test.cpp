@@ -24,9 +24,11 @@ TEST(PlayRaisingTimer, IsAStepOfItsOwnAndThePersonGoesOn) {
   PlayOptions options;
   options.script = directory.path() + "/script.plist";
   drivers::QtDriver driver;
-  Stage stage(driver, options.stage, InputFile(options.script, "a script").dictionary(), options.script);
+  Stage stage(driver, options.stage, InputFile(options.script, "a script").dictionary(),
+              options.script);
   std::ostringstream out;
-  Session session(driver, stage, out, {});
+  Transcript transcript(out, {});
+  Session session(driver, stage, transcript);
   session.start(options.script, "1");
 
   QTimer person;  // closes the window once the transcript tells of the exception

@@ -123,7 +123,8 @@ class PlayedByAPerson : public testing::Test {
   drivers::QtDriver driver;
   Stage stage{driver, options.stage, file.dictionary(), options.script};
   std::ostringstream out;
-  Session session{driver, stage, out, {}};
+  Transcript transcript{out, {}};
+  Session session{driver, stage, transcript};
 };
 
 TEST_F(PlayedByAPerson, WritesDownWhatAPersonDoes) {

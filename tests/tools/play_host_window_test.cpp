@@ -4,8 +4,8 @@
 
 #include "drivers/memory/memory_driver.hpp"
 #include "play_files.hpp"
-#include "tools/walkthrough/host_window.hpp"
 #include "tools/support/failure.hpp"
+#include "tools/walkthrough/host_window.hpp"
 
 namespace qz::tools::play {
 namespace {

@@ -7,9 +7,9 @@
 
 #include "drivers/memory/memory_driver.hpp"
 #include "play_files.hpp"
+#include "tools/support/input_file.hpp"
 #include "tools/walkthrough/stage.hpp"
 #include "tools/walkthrough/step_picture.hpp"
-#include "tools/support/input_file.hpp"
 
 namespace qz::tools::play {
 namespace {

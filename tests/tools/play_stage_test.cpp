@@ -4,11 +4,11 @@
 
 #include "drivers/memory/memory_driver.hpp"
 #include "play_files.hpp"
+#include "tools/play/words.hpp"
+#include "tools/support/input_file.hpp"
 #include "tools/walkthrough/stage.hpp"
 #include "tools/walkthrough/stand_in.hpp"
 #include "tools/walkthrough/step_picture.hpp"
-#include "tools/play/words.hpp"
-#include "tools/support/input_file.hpp"
 
 namespace qz::tools::play {
 namespace {

@@ -13,7 +13,7 @@
 namespace qz::tools::play {
 
 /// Returns a new identity for the picture of a control or timer, valid until the program ends.
-inline std::weak_ptr<const void> newIdentity() {
+inline Identity newIdentity() {
   static std::deque<std::shared_ptr<int>> identities;
   return identities.emplace_back(std::make_shared<int>());
 }

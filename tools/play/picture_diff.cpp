@@ -114,14 +114,10 @@ void compareStyles(const toolkit::AttributedString& before, const toolkit::Attri
   changes.push_back({"style", was, is == was ? "other " + is : is});
 }
 
-bool isSame(const std::weak_ptr<const void>& a, const std::weak_ptr<const void>& b) {
-  return !a.owner_before(b) && !b.owner_before(a);
-}
-
 const ControlPicture* find(const ControlPicture& control, const StepPicture& picture) {
-  const auto found = std::find_if(
-      picture.controls.begin(), picture.controls.end(),
-      [&control](const ControlPicture& c) { return isSame(c.identity, control.identity); });
+  const auto found =
+      std::find_if(picture.controls.begin(), picture.controls.end(),
+                   [&control](const ControlPicture& c) { return c.identity == control.identity; });
   return found == picture.controls.end() ? nullptr : &*found;
 }
 
@@ -145,7 +141,7 @@ void compareTimers(const StepPicture& before, const StepPicture& now,
                    std::vector<Change>& changes) {
   for (const auto& [key, pair] : pairUp(before, now)) {
     const auto [old, current] = pair;
-    if (old && current && isSame(old->identity, current->identity)) continue;
+    if (old && current && old->identity == current->identity) continue;
     const auto words = [](const TimerPicture* timer) {
       return timer ? "fires " + whenWords(timer->timeLeft) : "none";
     };

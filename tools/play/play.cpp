@@ -16,11 +16,11 @@
 #include "tools/play/raised_places.hpp"
 #include "tools/play/screenshots.hpp"
 #include "tools/play/session.hpp"
-#include "tools/walkthrough/stage.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/input_file.hpp"
 #include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
+#include "tools/walkthrough/stage.hpp"
 
 namespace qz::tools::play {
 namespace {
@@ -140,8 +140,8 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   }
   Stage stage(*driver, options.stage, file.dictionary(), options.script);
   stage.engine().setObserver(std::make_shared<RaisedPlaces>(file, stage.engine(), terminal.log));
-  Session session(*driver, stage, terminal.out, terminal.style,
-                  screenshots ? &*screenshots : nullptr);
+  Transcript transcript(terminal.out, terminal.style);
+  Session session(*driver, stage, transcript, screenshots ? &*screenshots : nullptr);
 
   session.start(path.string(), options.startKey);
   for (const Step& step : options.steps) session.perform(step);

@@ -2,7 +2,6 @@
 // What a user can press, and how the walk-through can continue.
 #include "tools/play/pressing.hpp"
 
-#include <algorithm>
 #include <vector>
 
 #include "tools/play/words.hpp"
@@ -11,11 +10,6 @@
 
 namespace qz::tools::play {
 namespace {
-
-bool canBePressed(const ControlPicture& control) {
-  return isButton(control.view.kind) && !control.view.hidden && control.view.enabled &&
-         !control.shadowed;
-}
 
 std::string pressableWords(const StepPicture& picture) {
   std::vector<std::string> buttons;
@@ -41,13 +35,6 @@ std::vector<std::string> waysOn(const StepPicture& picture) {
 }
 
 }  // namespace
-
-const ControlPicture* controlWithTag(const StepPicture& picture, toolkit::Tag tag) {
-  const auto found =
-      std::find_if(picture.controls.begin(), picture.controls.end(),
-                   [tag](const ControlPicture& control) { return control.view.tag == tag; });
-  return found == picture.controls.end() ? nullptr : &*found;
-}
 
 std::string pressWords(const StepPicture& picture, toolkit::Tag tag) {
   std::string words = std::to_string(tag);

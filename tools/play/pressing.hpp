@@ -5,14 +5,11 @@
 #include <optional>
 #include <string>
 
-#include "tools/walkthrough/step_picture.hpp"
+#include "tools/walkthrough/possible_steps.hpp"
 
 namespace qz::tools::play {
 
 using namespace walkthrough;
-
-/// Returns the control that scripts and presses find by `tag`: the rearmost. Null if there is none.
-const ControlPicture* controlWithTag(const StepPicture& picture, toolkit::Tag tag);
 
 /// Returns the tag, with the first line of the title if its control is a button: "3 (Next)".
 std::string pressWords(const StepPicture& picture, toolkit::Tag tag);

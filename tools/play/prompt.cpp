@@ -2,8 +2,8 @@
 // Reads what the user of an interactive walk-through asks for.
 #include "tools/play/prompt.hpp"
 
-#include "tools/walkthrough/parse_number.hpp"
 #include "tools/support/text_layout.hpp"
+#include "tools/walkthrough/parse_number.hpp"
 
 namespace qz::tools::play {
 namespace {

@@ -13,15 +13,12 @@ namespace qz::tools::play {
 
 namespace {
 
-bool isSame(const TimerPicture& a, const TimerPicture& b) {
-  return !a.identity.owner_before(b.identity) && !b.identity.owner_before(a.identity);
-}
-
 /// Returns the first timer of `before` that is not in `after`, which counts as fired; else null.
 const TimerPicture* firedBetween(const StepPicture& before, const StepPicture& after) {
   for (const TimerPicture& timer : before.timers) {
-    const bool pends = std::any_of(after.timers.begin(), after.timers.end(),
-                                   [&](const TimerPicture& other) { return isSame(timer, other); });
+    const bool pends =
+        std::any_of(after.timers.begin(), after.timers.end(),
+                    [&](const TimerPicture& other) { return timer.identity == other.identity; });
     if (!pends) return &timer;
   }
   return nullptr;
@@ -29,9 +26,9 @@ const TimerPicture* firedBetween(const StepPicture& before, const StepPicture& a
 
 }  // namespace
 
-Session::Session(drivers::Driver& driver, Stage& stage, std::ostream& out, const Style& style,
+Session::Session(drivers::Driver& driver, Stage& stage, Transcript& transcript,
                  Screenshots* screenshots)
-    : driver_(driver), stage_(stage), transcript_(out, style), screenshots_(screenshots) {
+    : driver_(driver), stage_(stage), transcript_(transcript), screenshots_(screenshots) {
   transcript_.startFrom(look());
   if (screenshots_) screenshots_->keep(transcript_);
 }

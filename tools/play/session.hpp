@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Plays a walk-through: makes its steps and keeps the transcript.
+// Plays a walk-through: makes its steps and describes them in the transcript, which may be one that
+// writes nothing.
 #pragma once
 
 #include <functional>
@@ -12,8 +13,8 @@
 #include "qz/toolkit/exception.hpp"
 #include "tools/play/play.hpp"
 #include "tools/play/screenshots.hpp"
-#include "tools/walkthrough/stage.hpp"
 #include "tools/play/transcript.hpp"
+#include "tools/walkthrough/stage.hpp"
 
 namespace qz::tools::play {
 
@@ -23,7 +24,7 @@ class Session {
  public:
   /// The arguments must outlive the session. `screenshots` may be null; else it gets a picture
   /// after each step, and after each list that a timer runs within one.
-  Session(drivers::Driver& driver, Stage& stage, std::ostream& out, const Style& style,
+  Session(drivers::Driver& driver, Stage& stage, Transcript& transcript,
           Screenshots* screenshots = nullptr);
 
   /// Loads the script at an absolute path and runs its list under `startKey`.
@@ -61,7 +62,7 @@ class Session {
 
   drivers::Driver& driver_;
   Stage& stage_;
-  Transcript transcript_;
+  Transcript& transcript_;
   Screenshots* screenshots_;
   struct Begun {
     std::string heading;

@@ -17,6 +17,8 @@ using namespace walkthrough;
 
 class Transcript {
  public:
+  /// Writes nothing, and keeps only the latest picture.
+  Transcript() = default;
   /// `out` must outlive the transcript.
   Transcript(std::ostream& out, const Style& style) : outputs_{{out, style}} {}
 

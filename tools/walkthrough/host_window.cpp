@@ -6,12 +6,12 @@
 
 #include "qz/property_list/collections.hpp"
 #include "qz/property_list/scalars.hpp"
-#include "tools/walkthrough/plist_entry.hpp"
 #include "tools/play/words.hpp"
 #include "tools/support/failure.hpp"
 #include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
 #include "tools/support/view_kinds.hpp"
+#include "tools/walkthrough/plist_entry.hpp"
 
 namespace qz::tools::walkthrough {
 namespace {

@@ -8,9 +8,9 @@
 #include <utility>
 
 #include "qz/property_list/scalars.hpp"
-#include "tools/walkthrough/parse_number.hpp"
 #include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
+#include "tools/walkthrough/parse_number.hpp"
 
 namespace qz::tools::walkthrough {
 namespace {

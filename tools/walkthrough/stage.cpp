@@ -2,10 +2,10 @@
 // What a walk-through is played on.
 #include "tools/walkthrough/stage.hpp"
 
-#include "tools/walkthrough/gui_description.hpp"
-#include "tools/walkthrough/stand_in.hpp"
 #include "tools/support/input_file.hpp"
 #include "tools/support/stack_guard.hpp"
+#include "tools/walkthrough/gui_description.hpp"
+#include "tools/walkthrough/stand_in.hpp"
 
 namespace qz::tools::walkthrough {
 namespace {

@@ -12,8 +12,8 @@
 
 namespace qz::tools::walkthrough {
 
-/// What a walk-through is played on. Without a window and a description, its window is made from the
-/// script itself.
+/// What a walk-through is played on. Without a window and a description, its window is made from
+/// the script itself.
 struct StageOptions {
   std::optional<std::string> window;  ///< path of the host's window; or
   std::optional<std::string> assets;  ///< path of a description from which the engine builds one

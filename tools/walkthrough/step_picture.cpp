@@ -3,6 +3,7 @@
 #include "tools/walkthrough/step_picture.hpp"
 
 #include <algorithm>
+#include <functional>
 #include <set>
 #include <utility>
 
@@ -47,7 +48,49 @@ std::vector<TimerPicture> lookAtTimers(const QZ_Plist_State_Parser& engine) {
   return timers;
 }
 
+class Hash {
+ public:
+  template <class T>
+  void add(const T& value) {
+    // As Boost's hash_combine: the golden ratio and shifts keep the order of the values apart.
+    hash_ ^= std::hash<T>()(value) + 0x9e3779b9U + (hash_ << 6U) + (hash_ >> 2U);
+  }
+  std::size_t value() const { return hash_; }
+
+ private:
+  std::size_t hash_ = 0;
+};
+
+void addTo(Hash& hash, const drivers::ViewPicture& view) {
+  hash.add(view.className);
+  hash.add(view.tag);
+  hash.add(view.hidden);
+  hash.add(view.enabled);
+  hash.add(static_cast<int>(view.state));
+  hash.add(view.highlighted);
+  hash.add(view.title.string());
+  hash.add(view.text.string());
+  hash.add(view.toolTip);
+  hash.add(view.image);
+}
+
 }  // namespace
+
+std::size_t hashOf(const StepPicture& picture) {
+  Hash hash;
+  for (const ControlPicture& control : picture.controls) {
+    addTo(hash, control.view);
+    hash.add(control.flashing);
+  }
+  for (const TimerPicture& timer : picture.timers) {
+    hash.add(timer.key);
+    hash.add(timer.timeLeft);
+  }
+  hash.add(picture.lastList);
+  hash.add(picture.flashingAllowed);
+  hash.add(picture.ended);
+  return hash.value();
+}
 
 StepPicture takePicture(drivers::Driver& driver, const QZ_Plist_State_Parser& engine,
                         std::string title) {

@@ -13,19 +13,39 @@
 
 namespace qz::tools::walkthrough {
 
+/// Tells one object from another, even when the objects are gone and their addresses are used
+/// again.
+class Identity {
+ public:
+  Identity() = default;
+  template <class T>
+  Identity(const std::shared_ptr<T>& object)
+      : object_(object) {}  // NOLINT(google-explicit-constructor)
+
+  friend bool operator==(const Identity& a, const Identity& b) {
+    return !a.object_.owner_before(b.object_) && !b.object_.owner_before(a.object_);
+  }
+
+ private:
+  std::weak_ptr<const void> object_;
+};
+
 struct ControlPicture {
-  /// Identifies the control even after its tag has changed.
-  std::weak_ptr<const void> identity;
+  Identity identity;  ///< of the control, even after its tag has changed
   drivers::ViewPicture view;
   bool flashing = false;  ///< every tick of the flasher toggles its highlight
   bool hasList = false;   ///< the script has a list under its tag
   bool shadowed = false;  ///< a control behind it has the same tag, and is found instead
+
+  friend bool operator==(const ControlPicture&, const ControlPicture&) = default;
 };
 
 struct TimerPicture {
-  std::weak_ptr<const void> identity;
+  Identity identity;
   std::string key;      ///< of the list that it runs
   double timeLeft = 0;  ///< seconds
+
+  friend bool operator==(const TimerPicture&, const TimerPicture&) = default;
 };
 
 struct StepPicture {
@@ -36,7 +56,12 @@ struct StepPicture {
   std::optional<std::string> lastList;           ///< key of the list that was started last
   bool flashingAllowed = false;
   bool ended = false;  ///< the walk-through is over
+
+  friend bool operator==(const StepPicture&, const StepPicture&) = default;
 };
+
+/// Returns a hash of what the picture shows. Equal pictures have equal hashes.
+std::size_t hashOf(const StepPicture& picture);
 
 /// Takes a picture of the walk-through that `engine` runs on the driver's toolkit. The caller gives
 /// the window's title, because the toolkit's windows have none.
