@@ -1,28 +1,30 @@
 // SPDX-License-Identifier: MIT
 // The command `convert`.
+#include <algorithm>
 #include <filesystem>
-#include <map>
 #include <memory>
 #include <optional>
 #include <string>
+#include <vector>
 
-#include "qz/property_list/binary_writer.hpp"
-#include "qz/property_list/reader.hpp"
-#include "qz/property_list/xml_writer.hpp"
+#include "qz/property_list/formats.hpp"
 #include "qz/toolkit/exception.hpp"
 #include "tools/commands.hpp"
 #include "tools/shared_values.hpp"
 #include "tools/support/failure.hpp"
 #include "tools/support/input_file.hpp"
 #include "tools/support/replace_file.hpp"
+#include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
 
 namespace qz::tools {
 namespace {
 
 using toolkit::Format;
+using toolkit::FormatRow;
 
-const std::map<std::string, Format> formats = {{"binary", Format::binary}, {"xml", Format::xml}};
+// For an output file whose suffix says nothing.
+constexpr Format standardFormat = Format::xml;
 
 struct ConvertOptions {
   std::string in;
@@ -30,35 +32,65 @@ struct ConvertOptions {
   std::optional<Format> format;
 };
 
-Format formatByExtension(const std::string& path) {
-  const auto extension = std::filesystem::path(path).extension();
-  return extension == ".bplist" || extension == ".bin" ? Format::binary : Format::xml;
+/// Returns the formats that can be written, the standard one first.
+std::vector<FormatRow> writableFormats() {
+  std::vector<FormatRow> rows;
+  for (const FormatRow& row : toolkit::formats()) {
+    if (row.write) rows.push_back(row);
+  }
+  std::stable_partition(rows.begin(), rows.end(),
+                        [](const FormatRow& row) { return row.format == standardFormat; });
+  return rows;
 }
 
-std::string written(const play::InputFile& file, Format format) {
-  if (format == Format::binary) return toolkit::writeBinaryPropertyList(file.root());
-  requireWritableInFull(file);
-  return toolkit::writeXmlPropertyList(file.root());
+std::string writableNames() {
+  std::vector<std::string> names;
+  for (const FormatRow& row : writableFormats()) names.emplace_back(row.name);
+  return enumerate(names);
+}
+
+/// Says which suffix chooses which format.
+std::string suffixRules() {
+  std::string rules;
+  for (const FormatRow& row : writableFormats()) {
+    if (row.format == standardFormat) continue;
+    rules += std::string(row.name) + " where OUT ends with " +
+             enumerate({row.suffixes.begin(), row.suffixes.end()}) + ", ";
+  }
+  return rules + "else " + std::string(toolkit::formatRow(standardFormat).name);
+}
+
+Format formatBySuffix(const std::string& path) {
+  const auto suffix = std::filesystem::path(path).extension();
+  for (const FormatRow& row : writableFormats()) {
+    const auto& known = row.suffixes;
+    if (std::find(known.begin(), known.end(), suffix) != known.end()) return row.format;
+  }
+  return standardFormat;
+}
+
+std::string written(const play::InputFile& file, const FormatRow& row) {
+  if (!row.writesSharedOnce) requireWritableInFull(file);
+  return row.write(file.root());
 }
 
 void convert(const ConvertOptions& options) {
   const play::InputFile file(options.in, "a property list", ExitStatus::failed);
-  const Format format = options.format.value_or(formatByExtension(options.out));
+  const FormatRow& row = toolkit::formatRow(options.format.value_or(formatBySuffix(options.out)));
   try {
-    replaceFile(options.out, written(file, format));
+    replaceFile(options.out, written(file, row));
   } catch (const toolkit::InvalidArgumentException& refusal) {
-    throw Failure(ExitStatus::failed, options.in + ": no " +
-                                          std::string(toolkit::description(format)) +
+    throw Failure(ExitStatus::failed, options.in + ": no " + std::string(row.title) +
                                           " can hold it: " + refusal.reason());
   }
 }
 
 void setFormat(ConvertOptions& options, const std::string& name) {
-  const auto found = formats.find(name);
-  if (found == formats.end()) {
-    throw UsageError("--format: expected xml or binary, found " + quote(name));
+  for (const FormatRow& row : writableFormats()) {
+    if (row.name == name) options.format = row.format;
   }
-  options.format = found->second;
+  if (options.format) return;
+  throw UsageError("--format: expected " + writableNames() + ", found " + quote(name));
 }
 
 void describeConvert(Command& command) {
@@ -68,7 +100,7 @@ void describeConvert(Command& command) {
   command
       .taken(
           "--format", [options](const std::string& name) { setFormat(*options, name); },
-          "xml or binary; without it, binary where OUT ends with .bplist or .bin, else xml")
+          writableNames() + "; without it, " + suffixRules())
       .valueName("FORMAT");
   command.action([options] {
     convert(*options);

@@ -48,14 +48,8 @@ std::vector<Row> rows() {
 }
 
 std::string nameOf(Format format) {
-  switch (format) {
-    case Format::binary:
-      return "binary";
-    case Format::xml:
-      return "xml";
-    default:
-      return "openstep";
-  }
+  if (format == Format::oldStyle) return "openstep";
+  return std::string(formatRow(format).name);
 }
 
 std::string nameOf(Value::Kind kind) {

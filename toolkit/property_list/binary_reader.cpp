@@ -318,8 +318,10 @@ Value* BinaryReader::dictionary(std::size_t offset, std::size_t depth) {
 
 }  // namespace
 
+bool looksLikeBinary(std::string_view bytes) { return bytes.starts_with(binary::magic); }
+
 Value* readBinary(std::string_view bytes, Document& document, ValueOffsets* offsets) {
-  if (!bytes.starts_with(binary::magic)) refuse(0, "the file does not start with \"bplist0\"");
+  if (!looksLikeBinary(bytes)) refuse(0, "the file does not start with \"bplist0\"");
   if (bytes.size() <= binary::headerSize + Trailer::size) {
     refuse(bytes.size(), "the file is too short for a header, an object and a trailer");
   }

@@ -4,16 +4,11 @@
 #include <algorithm>
 #include <utility>
 
-#include "qz/property_list/format_readers.hpp"
 #include "qz/property_list/refusal.hpp"
-#include "text/hexadecimal.hpp"
-#include "toolkit/property_list/binary_layout.hpp"
 #include "toolkit/property_list/encoding.hpp"
 
 namespace qz::toolkit {
 namespace {
-
-using FormatReader = Value* (*)(std::string_view, Document&, ValueOffsets*);
 
 /// One attempt to read a text or file in one format.
 struct Attempt {
@@ -22,27 +17,16 @@ struct Attempt {
   std::optional<RefusedAt> refusal;
 };
 
-Attempt attempt(FormatReader read, std::string_view text, bool wantsOffsets) {
+Attempt attempt(const FormatRow& row, std::string_view contents, bool wantsOffsets) {
   Attempt attempt;
   const auto document = Counted<Document>::adopt(Document::make());
   try {
     attempt.value = Counted<Value>::share(
-        read(text, *document.get(), wantsOffsets ? &attempt.offsets : nullptr));
+        row.read(contents, *document.get(), wantsOffsets ? &attempt.offsets : nullptr));
   } catch (RefusedAt& refusal) {
     attempt.refusal = std::move(refusal);
   }
   return attempt;
-}
-
-/// Whether a text that neither reader accepts was meant as XML rather than as old-style data in <
-/// >.
-bool looksLikeXml(std::string_view text) {
-  const std::size_t start = text.find_first_not_of(" \t\r\n");
-  if (start == std::string_view::npos || text[start] != '<') return false;
-  const std::string_view tag = text.substr(start + 1);
-  return !tag.empty() && tag.front() != '>' && tag.front() != '*' && tag.front() != '[' &&
-         !std::all_of(tag.begin(), std::find(tag.begin(), tag.end(), '>'),
-                      [](char c) { return c == ' ' || text::hexadecimalDigit(c) >= 0; });
 }
 
 ReadResult refused(Format format, Position position, std::string reason) {
@@ -53,38 +37,52 @@ ReadResult refusedInText(Format format, std::string_view text, const RefusedAt& 
   return refused(format, TextCursor(text).at(refusal.offset), refusal.reason);
 }
 
+/// Returns the text format as which a text was probably meant.
+const FormatRow& likelyTextFormat(std::string_view text) {
+  const auto rows = formats();
+  const auto found = std::find_if(rows.begin(), rows.end(), [&](const FormatRow& row) {
+    return row.isText && row.looksLike(text);
+  });
+  return found == rows.end() ? rows.back() : *found;
+}
+
 ReadResult readText(std::string_view bytes, PositionTable* positions) {
   const DecodedText decoded = decodeText(bytes);
   const std::string_view text = decoded.text();
-  const Format likely = looksLikeXml(text) ? Format::xml : Format::oldStyle;
+  const Format likely = likelyTextFormat(text).format;
   if (decoded.refusal) return refusedInText(likely, text, *decoded.refusal);
   if (text.empty()) return refused(likely, TextPosition{1, 1}, "the file is empty");
   std::optional<RefusedAt> reason;
-  for (const auto& [format, read] :
-       {std::pair{Format::xml, &readXml}, std::pair{Format::oldStyle, &readOldStyle}}) {
-    Attempt tried = attempt(read, text, positions != nullptr);
+  for (const FormatRow& row : formats()) {
+    if (!row.isText) continue;
+    Attempt tried = attempt(row, text, positions != nullptr);
     if (tried.value) {
       if (positions) *positions = PositionTable(std::move(tried.offsets), text);
-      return {tried.value, format, std::nullopt};
+      return {tried.value, row.format, std::nullopt};
     }
-    if (format == likely) reason = std::move(tried.refusal);
+    if (row.format == likely) reason = std::move(tried.refusal);
   }
   return refusedInText(likely, text, *reason);
 }
 
-}  // namespace
-
-std::string_view description(Format format) {
-  switch (format) {
-    case Format::binary:
-      return "binary property list";
-    case Format::xml:
-      return "XML property list";
-    case Format::oldStyle:
-      return "old-style property list";
+/// Reads a file that is not text as each format that it looks like. Absent if it looks like none.
+/// If all refuse it, the first refusal counts.
+std::optional<ReadResult> readBytes(std::string_view bytes, PositionTable* positions) {
+  std::optional<ReadResult> refusal;
+  for (const FormatRow& row : formats()) {
+    if (row.isText || !row.looksLike(bytes)) continue;
+    Attempt tried = attempt(row, bytes, positions != nullptr);
+    if (tried.value) {
+      if (positions) *positions = PositionTable(std::move(tried.offsets), std::nullopt);
+      return ReadResult{tried.value, row.format, std::nullopt};
+    }
+    if (refusal) continue;
+    refusal = refused(row.format, BytePosition{tried.refusal->offset}, tried.refusal->reason);
   }
-  return "";
+  return refusal;
 }
+
+}  // namespace
 
 std::string Refusal::description() const {
   return toolkit::description(position) + ": " + reason + " (read as " +
@@ -92,16 +90,11 @@ std::string Refusal::description() const {
 }
 
 ReadResult readPropertyList(std::string_view bytes, PositionTable* positions) {
-  if (!bytes.starts_with(binary::magic)) return readText(bytes, positions);
-  Attempt tried = attempt(&readBinary, bytes, positions != nullptr);
-  if (tried.value) {
-    if (positions) *positions = PositionTable(std::move(tried.offsets), std::nullopt);
-    return {tried.value, Format::binary, std::nullopt};
-  }
+  std::optional<ReadResult> asBytes = readBytes(bytes, positions);
+  if (asBytes && asBytes->value) return *std::move(asBytes);
   // Some texts start like a binary file: the magic number itself is an old-style string.
   ReadResult asText = readText(bytes, positions);
-  if (asText.value) return asText;
-  return refused(Format::binary, BytePosition{tried.refusal->offset}, tried.refusal->reason);
+  return asText.value || !asBytes ? asText : *std::move(asBytes);
 }
 
 ValueRef<Dictionary> dictionaryFromPropertyList(std::string_view bytes) {

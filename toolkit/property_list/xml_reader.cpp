@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Reads XML property lists: the meaning of their elements.
+#include <algorithm>
 #include <bit>
 #include <cmath>
 #include <limits>
@@ -258,6 +259,16 @@ Value* XmlReader::data() {
 }
 
 }  // namespace
+
+// Old-style data in < > is not XML.
+bool looksLikeXml(std::string_view text) {
+  const std::size_t start = text.find_first_not_of(" \t\r\n");
+  if (start == std::string_view::npos || text[start] != '<') return false;
+  const std::string_view tag = text.substr(start + 1);
+  return !tag.empty() && tag.front() != '>' && tag.front() != '*' && tag.front() != '[' &&
+         !std::all_of(tag.begin(), std::find(tag.begin(), tag.end(), '>'),
+                      [](char c) { return c == ' ' || text::hexadecimalDigit(c) >= 0; });
+}
 
 Value* readXml(std::string_view text, Document& document, ValueOffsets* offsets) {
   return XmlReader(text, document, offsets).root();

@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: MIT
-// The readers of the three formats, for use by reader.hpp.
+// The readers of the formats, for the table in formats.hpp.
 //
-// Each makes its values in `document` and returns the root, or throws RefusedAt; after that the
-// document is of no use. `offsets`, unless null, receives the position at which each value starts.
+// Each reader makes its values in `document` and returns the root, or throws RefusedAt; after that
+// the document is of no use. `offsets`, unless null, receives the position at which each value
+// starts.
 #pragma once
 
 #include <cstddef>
@@ -23,10 +24,14 @@ using ValueOffsets = std::vector<std::pair<const Value*, std::size_t>>;
 constexpr std::size_t deepestNesting = 512;
 
 /// `bytes` is the whole file.
+bool looksLikeBinary(std::string_view bytes);
 Value* readBinary(std::string_view bytes, Document& document, ValueOffsets* offsets);
 /// `text` is the file in UTF-8, not checked yet.
+bool looksLikeXml(std::string_view text);
 Value* readXml(std::string_view text, Document& document, ValueOffsets* offsets);
-/// `text` is the file in UTF-8, not checked yet.
+/// `text` is the file in UTF-8, not checked yet. Any text looks like this format, even a single
+/// word.
+bool looksLikeOldStyle(std::string_view text);
 Value* readOldStyle(std::string_view text, Document& document, ValueOffsets* offsets);
 
 }  // namespace qz::toolkit

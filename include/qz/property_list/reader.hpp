@@ -1,26 +1,21 @@
 // SPDX-License-Identifier: MIT
-// Reads property lists in the three formats of the platform: binary, XML and old-style.
+// Reads property lists in the formats of the platform: binary, XML and old-style.
 //
 // Accepts the same files as the platform's own reader, with the same results, down to its oddities.
 // Any bytes are safe to read: time and memory are proportional to their number, and collections
 // nest at most 512 levels deep.
 #pragma once
 
-#include <cstdint>
 #include <optional>
 #include <string>
 #include <string_view>
 
 #include "qz/property_list/collections.hpp"
+#include "qz/property_list/formats.hpp"
 #include "qz/property_list/positions.hpp"
 #include "qz/property_list/value.hpp"
 
 namespace qz::toolkit {
-
-enum class Format : std::uint8_t { binary, xml, oldStyle };
-
-/// Returns the name of the format, such as "XML property list".
-std::string_view description(Format format);
 
 /// Why bytes are not a property list.
 struct Refusal {
