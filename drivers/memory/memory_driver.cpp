@@ -81,7 +81,7 @@ void describe(const MemoryButton& button, ViewPicture& picture) {
 
 Ref<Window> MemoryDriver::makeWindow(const Rect& content) {
   auto window = MemoryWindow::make(toolkit_.application().screen(), content,
-                                   StyleMask::titledAndClosable, KeptBy::maker);
+                                   StyleMask::titledAndClosable, KeptBy::holder);
   window->makeKeyAndOrderFront();
   return window;
 }

@@ -194,13 +194,14 @@ QtDriver::Sweep::~Sweep() { QCoreApplication::sendPostedEvents(nullptr, QEvent::
 
 Ref<Window> QtDriver::makeWindow(const Rect& content) {
   auto window = QtWindow::make(content, StyleMask::titledAndClosable, toolkit_.application().desk(),
-                               KeptBy::maker);
+                               KeptBy::holder);
   window->makeKeyAndOrderFront();
   return window;
 }
 
 Ref<View> QtDriver::makeView(ViewKind kind, Tag tag, const Rect& frame, const Ref<View>& parent) {
-  const auto node = qt::makeView(*rowOf(kind).make(), toolkit_.application().desk(), Widget::view);
+  const auto node =
+      qt::makeView(*rowOf(kind).make(), toolkit_.application().desk(), KeptBy::holder);
   node->place(frame);
   Ref<View> view = node->view();
   view->setTag(tag);

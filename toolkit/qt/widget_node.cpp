@@ -56,7 +56,7 @@ class WidgetNode::Watch final : public QObject {
   WidgetNode& node_;  // its owner
 };
 
-WidgetNode::WidgetNode(QWidget& widget, std::shared_ptr<Desk> desk, Widget keptBy)
+WidgetNode::WidgetNode(QWidget& widget, std::shared_ptr<Desk> desk, KeptBy keptBy)
     : widget_(&widget),
       desk_(std::move(desk)),
       key_(&widget),
@@ -67,7 +67,7 @@ WidgetNode::WidgetNode(QWidget& widget, std::shared_ptr<Desk> desk, Widget keptB
 // Deletes the widget later, because this may run during one of the widget's own events.
 WidgetNode::~WidgetNode() {
   desk_->forgetView(key_);
-  if (widget_ && keptBy_ == Widget::view && !widget_->parentWidget()) widget_->deleteLater();
+  if (widget_ && keptBy_ == KeptBy::holder && !widget_->parentWidget()) widget_->deleteLater();
 }
 
 std::shared_ptr<WidgetNode> WidgetNode::of(const Ref<View>& view) {
@@ -137,7 +137,7 @@ void WidgetNode::insert(const Ref<View>& view) {
   if (!node) refuse(receiver, "the view, of class " + view->className() + ", is another toolkit's");
   if (!widget_ || !node->widget_) return;
   QWidget& added = *node->widget_;
-  if (added.isWindow() && node->keptBy_ == Widget::host)
+  if (added.isWindow() && node->keptBy_ == KeptBy::host)
     refuse(receiver, "the view is the content view of a window");
   if (&added == widget_ || added.isAncestorOf(widget_))
     refuse(receiver, "the view is the superview itself, or lies around it");
@@ -165,12 +165,12 @@ void WidgetNode::removeFromSuperview() {
   hiddenOutside_ = widget_->isHidden();
   giveFocusAway(*widget_);
   widget_->setParent(nullptr);
-  keptBy_ = Widget::view;
+  keptBy_ = KeptBy::holder;
   around->readSubviews();
   around->changed();
 }
 
-bool WidgetNode::isOutside() const { return keptBy_ == Widget::view && !widget_->parentWidget(); }
+bool WidgetNode::isOutside() const { return keptBy_ == KeptBy::holder && !widget_->parentWidget(); }
 
 bool WidgetNode::isHidden() const {
   if (!widget_) return false;
