@@ -10,15 +10,13 @@
 #include <string_view>
 #include <vector>
 
+#include "drivers/view_kinds.hpp"
 #include "qz/toolkit/geometry.hpp"
 #include "qz/toolkit/toolkit.hpp"
 
 namespace qz::drivers {
 
 using namespace toolkit;
-
-/// The kinds of view that a driver can make.
-enum class ViewKind { button, toggle, mixed, popUpButton, textField, imageView, box, plain };
 
 /// A snapshot of a view.
 struct ViewPicture {

@@ -74,14 +74,12 @@ class RunLengths {
 class Walkthrough {
  public:
   explicit Walkthrough(const Script& script) : script_(script) {
-    using drivers::ViewKind;
     driver_.setResourcePath("/nonexistent");
     toolkit::Tag tag = 0;
-    for (const drivers::ViewKind kind :
-         {drivers::ViewKind::button, drivers::ViewKind::toggle, drivers::ViewKind::mixed,
-          drivers::ViewKind::popUpButton, drivers::ViewKind::textField,
-          drivers::ViewKind::imageView, drivers::ViewKind::box, drivers::ViewKind::plain,
-          drivers::ViewKind::button}) {
+    std::vector<drivers::ViewKind> kinds;
+    for (const drivers::ViewKindRow& row : drivers::viewKinds) kinds.push_back(row.kind);
+    kinds.push_back(drivers::ViewKind::button);  // a second one
+    for (const drivers::ViewKind kind : kinds) {
       ++tag;
       views_.push_back(driver_.makeView(kind, tag, {0, 20.0 * static_cast<double>(tag), 90, 18},
                                         window_->contentView()));

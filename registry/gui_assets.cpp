@@ -3,15 +3,11 @@
 
 #include "engine/state.hpp"
 #include "engine/text_of.hpp"
+#include "toolkit/class_names.hpp"
 
 namespace qz {
 
 namespace {
-
-constexpr auto windowClass = "NSWindow";
-constexpr auto buttonClass = "NSButton";
-constexpr auto imageViewClass = "NSImageView";
-constexpr auto textFieldClass = "NSTextField";
 
 constexpr toolkit::Rect defaultContent{100, 100, 640, 480};
 
@@ -31,6 +27,69 @@ toolkit::Rect rectOf(const toolkit::ValueRef<>& entry) {
   return {x, y, width, length(4)};
 }
 
+// What a control is made from.
+struct ControlPlan {
+  QZ_Plist_State_Parser& engine;
+  toolkit::Application& application;
+  // Receives the control before it is set up. Looked up then: making a control can replace it.
+  const Property<QZ_Plist_State_Parser::Controls>& added;
+  const toolkit::ValueRef<>& key;
+  toolkit::Rect frame;
+};
+
+// Only buttons get a tag: scripts reach the other controls by the toolkit's default tag, or by a
+// tag that the host sets.
+QZ_Plist_State_Parser::Control makeButton(const ControlPlan& plan) {
+  const auto button = plan.application.makeButton(plan.frame);
+  plan.added->addObject(button);
+  button->setBezelStyle(toolkit::BezelStyle::texturedSquare);
+  button->setHidden(false);
+  button->setEnabled(true);
+  button->setAction("buttonPushed:");
+  button->setTag(plan.key->integerValue());
+  return button;
+}
+
+QZ_Plist_State_Parser::Control makeImageView(const ControlPlan& plan) {
+  const auto imageView = plan.application.makeImageView(plan.frame);
+  plan.added->addObject(imageView);
+  imageView->setImageFrameStyle(toolkit::ImageFrameStyle::none);
+  imageView->setImageScaling(toolkit::ImageScaling::proportionallyDown);
+  imageView->setImageAlignment(toolkit::ImageAlignment::center);
+  imageView->setHidden(false);
+  return imageView;
+}
+
+QZ_Plist_State_Parser::Control makeTextField(const ControlPlan& plan) {
+  const auto textField = plan.application.makeTextField(plan.frame);
+  plan.added->addObject(textField);
+  textField->setDelegate(plan.engine.shared_from_this());
+  textField->setTitle("");
+  textField->setHidden(false);
+  return textField;
+}
+
+// A class that a description can name.
+struct DescribedClass {
+  std::string_view name;
+  QZ_Plist_State_Parser::Control (*make)(const ControlPlan& plan);  // null for the window
+};
+
+constexpr DescribedClass describedClasses[] = {
+    {toolkit::class_names::button, makeButton},
+    {toolkit::class_names::imageView, makeImageView},
+    {toolkit::class_names::textField, makeTextField},
+    {toolkit::class_names::window, nullptr},
+};
+
+// Null for a class that no description can name.
+const DescribedClass* describedClass(std::string_view name) {
+  for (const DescribedClass& row : describedClasses) {
+    if (row.name == name) return &row;
+  }
+  return nullptr;
+}
+
 }  // namespace
 
 bool QZ_Plist_State_Parser::loadGuiAssets(Dictionary description,
@@ -43,7 +102,7 @@ bool QZ_Plist_State_Parser::loadGuiAssets(Dictionary description,
 
   Value windowEntry;
   for (const auto& [key, entry] : assets->entries()) {
-    const bool isWindow = isOfClass(entry, windowClass);
+    const bool isWindow = isOfClass(entry, toolkit::class_names::window);
     if (!isWindow || windowEntry) continue;
     windowEntry = entry;
     makeTutorialWindow(rectOf(entry))->makeKeyAndOrderFront();
@@ -81,42 +140,16 @@ QZ_Plist_State_Parser::Window QZ_Plist_State_Parser::makeTutorialWindow(
   return window;
 }
 
-// Absent for an entry that makes no control. Only buttons get a tag: scripts reach the other
-// controls by the toolkit's default tag, or by a tag that the host sets.
+// Absent for an entry that makes no control.
 QZ_Plist_State_Parser::Control QZ_Plist_State_Parser::makeControl(const Value& key,
                                                                   const Value& entry) {
   // Reads everything before the test of the class: a malformed entry raises, whatever its class.
   const std::string_view className = textOf(entry->objectAtIndex(0));
   const toolkit::Rect frame = rectOf(entry);
-  toolkit::Application& application = state_->toolkit.application();
-  if (className == buttonClass) {
-    const auto button = application.makeButton(frame);
-    state_->addedObjectToTutorial->addObject(button);
-    button->setBezelStyle(toolkit::BezelStyle::texturedSquare);
-    button->setHidden(false);
-    button->setEnabled(true);
-    button->setAction("buttonPushed:");
-    button->setTag(key->integerValue());
-    return button;
-  }
-  if (className == imageViewClass) {
-    const auto imageView = application.makeImageView(frame);
-    state_->addedObjectToTutorial->addObject(imageView);
-    imageView->setImageFrameStyle(toolkit::ImageFrameStyle::none);
-    imageView->setImageScaling(toolkit::ImageScaling::proportionallyDown);
-    imageView->setImageAlignment(toolkit::ImageAlignment::center);
-    imageView->setHidden(false);
-    return imageView;
-  }
-  if (className == textFieldClass) {
-    const auto textField = application.makeTextField(frame);
-    state_->addedObjectToTutorial->addObject(textField);
-    textField->setDelegate(shared_from_this());
-    textField->setTitle("");
-    textField->setHidden(false);
-    return textField;
-  }
-  return {};
+  const ControlPlan plan{*this, state_->toolkit.application(), state_->addedObjectToTutorial, key,
+                         frame};
+  const DescribedClass* const described = describedClass(className);
+  return described && described->make ? described->make(plan) : Control();
 }
 
 bool QZ_Plist_State_Parser::createNextGuiAssetEntry(Dictionary* entries,
@@ -124,24 +157,22 @@ bool QZ_Plist_State_Parser::createNextGuiAssetEntry(Dictionary* entries,
                                                     const toolkit::Rect& usingFrame,
                                                     std::uint64_t withTagId) {
   if (!entries || !*entries || !forObject) return false;
-  for (const auto* className : {buttonClass, imageViewClass, textFieldClass, windowClass}) {
-    if (*forObject != className) continue;
-    const auto number = [](double length) {
-      return toolkit::Number::withFloat(static_cast<float>(length));
-    };
-    try {
-      (*entries)->setObject(
-          toolkit::Array::make(
-              {toolkit::String::make(className), number(usingFrame.x), number(usingFrame.y),
-               number(usingFrame.width), number(usingFrame.height)},
-              toolkit::Mutability::immutable),
-          std::to_string(withTagId));
-      return true;
-    } catch (const toolkit::Exception&) {
-      return false;
-    }
+  const DescribedClass* const described = describedClass(*forObject);
+  if (!described) return false;
+  const auto number = [](double length) {
+    return toolkit::Number::withFloat(static_cast<float>(length));
+  };
+  try {
+    (*entries)->setObject(
+        toolkit::Array::make(
+            {toolkit::String::make(described->name), number(usingFrame.x), number(usingFrame.y),
+             number(usingFrame.width), number(usingFrame.height)},
+            toolkit::Mutability::immutable),
+        std::to_string(withTagId));
+    return true;
+  } catch (const toolkit::Exception&) {
+    return false;
   }
-  return false;
 }
 
 }  // namespace qz

@@ -4,8 +4,6 @@
 
 #include "drivers/memory/memory_driver.hpp"
 
-#include <algorithm>
-#include <iterator>
 #include <utility>
 
 #include "toolkit/memory/parts.hpp"
@@ -16,48 +14,53 @@ namespace qz::drivers {
 
 namespace {
 
-// A kind of view is identified by its class and, for a button, by the effect of a click.
-struct Kind {
-  ViewKind kind;
-  std::string_view className;
-  std::optional<ButtonBehavior> behavior;
-};
-
-constexpr Kind kinds[] = {
-    {ViewKind::button, class_names::button, ButtonBehavior::push},
-    {ViewKind::toggle, class_names::button, ButtonBehavior::toggle},
-    {ViewKind::mixed, class_names::button, ButtonBehavior::mixed},
-    {ViewKind::popUpButton, class_names::popUpButton, ButtonBehavior::popUp},
-    {ViewKind::textField, class_names::textField, std::nullopt},
-    {ViewKind::imageView, class_names::imageView, std::nullopt},
-    {ViewKind::box, class_names::box, std::nullopt},
-    {ViewKind::plain, class_names::view, std::nullopt},
-};
-
-const Kind& rowOf(ViewKind kind) {
-  return *std::find_if(std::begin(kinds), std::end(kinds),
-                       [&](const Kind& row) { return row.kind == kind; });
+template <ButtonBehavior behavior>
+std::shared_ptr<ViewNode> makeButton(const Rect& frame, const std::shared_ptr<Screen>& screen) {
+  return std::make_shared<MemoryButton>(behavior, frame, screen);
 }
 
-bool behavesAs(const Kind& row, const MemoryButton* button) {
+template <class Node>
+std::shared_ptr<ViewNode> makeNode(const Rect& frame, const std::shared_ptr<Screen>& screen) {
+  return std::make_shared<Node>(frame, screen);
+}
+
+template <ViewKind kind>
+std::shared_ptr<ViewNode> makePlain(const Rect& frame, const std::shared_ptr<Screen>& screen) {
+  return std::make_shared<MemoryView<View>>(rowOf(kind).className, frame, screen);
+}
+
+// How a kind of view is made. It is recognised by its class and, for a button, by the effect of a
+// click.
+struct MemoryKind {
+  ViewKind kind;
+  std::optional<ButtonBehavior> behavior;
+  std::shared_ptr<ViewNode> (*make)(const Rect& frame, const std::shared_ptr<Screen>& screen);
+};
+
+constexpr MemoryKind memoryKinds[] = {
+    {ViewKind::button, ButtonBehavior::push, makeButton<ButtonBehavior::push>},
+    {ViewKind::toggle, ButtonBehavior::toggle, makeButton<ButtonBehavior::toggle>},
+    {ViewKind::mixed, ButtonBehavior::mixed, makeButton<ButtonBehavior::mixed>},
+    {ViewKind::popUpButton, ButtonBehavior::popUp, makeButton<ButtonBehavior::popUp>},
+    {ViewKind::textField, std::nullopt, makeNode<MemoryTextField>},
+    {ViewKind::imageView, std::nullopt, makeNode<MemoryImageView>},
+    {ViewKind::box, std::nullopt, makePlain<ViewKind::box>},
+    {ViewKind::plain, std::nullopt, makePlain<ViewKind::plain>},
+};
+
+static_assert(hasOneRowForEachKind(memoryKinds));
+
+bool behavesAs(const MemoryKind& row, const MemoryButton* button) {
   return button ? row.behavior && *row.behavior == button->behavior() : !row.behavior;
 }
 
 // A view whose class is not in the table (a host's own class) counts as plain.
 ViewKind kindOf(View& view) {
   const auto* const button = dynamic_cast<const MemoryButton*>(&view);
-  const auto* const row = std::find_if(std::begin(kinds), std::end(kinds), [&](const Kind& known) {
-    return known.className == view.className() && behavesAs(known, button);
-  });
-  return row == std::end(kinds) ? ViewKind::plain : row->kind;
-}
-
-std::shared_ptr<ViewNode> makeNode(const Kind& row, const Rect& frame,
-                                   const std::shared_ptr<Screen>& screen) {
-  if (row.behavior) return std::make_shared<MemoryButton>(*row.behavior, frame, screen);
-  if (row.kind == ViewKind::textField) return std::make_shared<MemoryTextField>(frame, screen);
-  if (row.kind == ViewKind::imageView) return std::make_shared<MemoryImageView>(frame, screen);
-  return std::make_shared<MemoryView<View>>(row.className, frame, screen);
+  for (const MemoryKind& row : memoryKinds) {
+    if (rowOf(row.kind).className == view.className() && behavesAs(row, button)) return row.kind;
+  }
+  return ViewKind::plain;
 }
 
 std::optional<std::string> nameOf(const Ref<Image>& image) {
@@ -81,14 +84,15 @@ void describe(const MemoryButton& button, ViewPicture& picture) {
 
 Ref<Window> MemoryDriver::makeWindow(const Rect& content) {
   auto window = MemoryWindow::make(toolkit_.application().screen(), content,
-                                   StyleMask::titledAndClosable, KeptBy::maker);
+                                   StyleMask::titledAndClosable, KeptBy::holder);
   window->makeKeyAndOrderFront();
   return window;
 }
 
 Ref<View> MemoryDriver::makeView(ViewKind kind, Tag tag, const Rect& frame,
                                  const Ref<View>& parent) {
-  Ref<View> view = makeNode(rowOf(kind), frame, toolkit_.application().screen())->view();
+  const auto node = rowOf(memoryKinds, kind).make(frame, toolkit_.application().screen());
+  Ref<View> view = node->view();
   view->setTag(tag);
   parent->addSubview(view);
   return view;

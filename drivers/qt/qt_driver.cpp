@@ -18,7 +18,6 @@
 #include <chrono>
 #include <clocale>
 #include <cmath>
-#include <iterator>
 #include <utility>
 
 #include "drivers/qt/make_driver.hpp"
@@ -70,13 +69,14 @@ QWidget* popUpButton() {
   return button;
 }
 
-struct Kind {
+// How a kind of view is made.
+struct QtKind {
   ViewKind kind;
   std::string_view className;
   QWidget* (*make)();
 };
 
-constexpr Kind kinds[] = {
+constexpr QtKind qtKinds[] = {
     {ViewKind::button, "QPushButton", pushButton},
     {ViewKind::toggle, "QCheckBox", toggle},
     {ViewKind::mixed, "QCheckBox", threeStates},
@@ -87,10 +87,7 @@ constexpr Kind kinds[] = {
     {ViewKind::plain, "QWidget", plain<QWidget>},
 };
 
-const Kind& rowOf(ViewKind kind) {
-  return *std::find_if(std::begin(kinds), std::end(kinds),
-                       [&](const Kind& row) { return row.kind == kind; });
-}
+static_assert(hasOneRowForEachKind(qtKinds));
 
 ViewKind kindOf(const QAbstractButton& button) {
   const auto* const box = qobject_cast<const QCheckBox*>(&button);
@@ -194,13 +191,14 @@ QtDriver::Sweep::~Sweep() { QCoreApplication::sendPostedEvents(nullptr, QEvent::
 
 Ref<Window> QtDriver::makeWindow(const Rect& content) {
   auto window = QtWindow::make(content, StyleMask::titledAndClosable, toolkit_.application().desk(),
-                               KeptBy::maker);
+                               KeptBy::holder);
   window->makeKeyAndOrderFront();
   return window;
 }
 
 Ref<View> QtDriver::makeView(ViewKind kind, Tag tag, const Rect& frame, const Ref<View>& parent) {
-  const auto node = qt::makeView(*rowOf(kind).make(), toolkit_.application().desk(), Widget::view);
+  const auto node =
+      qt::makeView(*rowOf(qtKinds, kind).make(), toolkit_.application().desk(), KeptBy::holder);
   node->place(frame);
   Ref<View> view = node->view();
   view->setTag(tag);
@@ -230,7 +228,7 @@ void QtDriver::setWindowTitle(const Ref<Window>& window, std::string_view title)
 
 void QtDriver::setResourcePath(std::string_view path) { toolkit_.files().setResourcePath(path); }
 
-std::string_view QtDriver::className(ViewKind kind) const { return rowOf(kind).className; }
+std::string_view QtDriver::className(ViewKind kind) const { return rowOf(qtKinds, kind).className; }
 
 void QtDriver::click(const Ref<View>& view) {
   settle();

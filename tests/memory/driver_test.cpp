@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include "tests/memory/support.hpp"
+#include "tests/view_kinds.hpp"
 
 namespace qz::toolkit::memory::test {
 namespace {
@@ -39,6 +40,8 @@ TEST_F(DriverTest, MakesEveryKindOfView) {
     EXPECT_EQ(window->contentView()->subviews().back(), view);
   }
 }
+
+TEST_F(DriverTest, AgreesWithTheTableOfKinds) { expectEveryKindOfView(driver); }
 
 TEST_F(DriverTest, ACaptionIsWhatTheKindShows) {
   const Directory directory;

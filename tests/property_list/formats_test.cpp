@@ -8,11 +8,11 @@
 #include <set>
 #include <string>
 
-#include "../enumerators.hpp"
 #include "qz/property_list/canonical_dump.hpp"
 #include "qz/property_list/collections.hpp"
 #include "qz/property_list/reader.hpp"
 #include "qz/property_list/scalars.hpp"
+#include "tests/enumerators.hpp"
 
 namespace qz::toolkit {
 namespace {

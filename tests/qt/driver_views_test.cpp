@@ -7,6 +7,7 @@
 
 #include "drivers/qt/qt_driver.hpp"
 #include "tests/qt/rendering.hpp"
+#include "tests/view_kinds.hpp"
 #include "toolkit/qt/widget_node.hpp"
 
 namespace qz {
@@ -14,6 +15,11 @@ namespace qz {
 namespace {
 
 using namespace toolkit;
+
+TEST(DriverViews, AgreeWithTheTableOfKinds) {
+  drivers::QtDriver driver;
+  expectEveryKindOfView(driver);
+}
 
 TEST(DriverViews, DrawPopUpButtonsWithAnArrow) {
   drivers::QtDriver driver;

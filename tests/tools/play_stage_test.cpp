@@ -24,7 +24,7 @@ std::string standIn(std::string_view text) {
   std::string words;
   for (const HostControl& control : standInWindow(script(text)).controls) {
     if (!words.empty()) words += ", ";
-    words += std::to_string(control.tag) + " " + std::string(kindWord(control.kind));
+    words += std::to_string(control.tag) + " " + std::string(rowOf(control.kind).word);
   }
   return words;
 }

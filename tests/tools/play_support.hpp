@@ -24,7 +24,7 @@ inline ControlPicture controlPicture(drivers::ViewKind kind, toolkit::Tag tag,
   control.identity = newIdentity();
   control.view.kind = kind;
   control.view.tag = tag;
-  const bool isText = kind == drivers::ViewKind::textField;
+  const bool isText = rowOf(kind).caption == drivers::Caption::text;
   if (!caption.empty()) {
     (isText ? control.view.text : control.view.title) = toolkit::AttributedString(caption);
   }

@@ -7,8 +7,8 @@
 #include <string>
 #include <vector>
 
+#include "drivers/view_kinds.hpp"
 #include "scenario_support.hpp"
-#include "tools/support/view_kinds.hpp"
 
 namespace qz::tools::scenario {
 namespace {
@@ -53,7 +53,8 @@ TEST(ScenarioPage, ItNamesEveryStatementPropertyAndClass) {
   for (const auto* infos : {&vocabulary().engine, &vocabulary().control, &vocabulary().window}) {
     for (const auto& info : *infos) EXPECT_TRUE(names(std::string(info.name) + '`')) << info.name;
   }
-  for (const auto name : viewKindNames()) EXPECT_TRUE(names(std::string(name) + '`')) << name;
+  for (const auto name : drivers::viewKindNames())
+    EXPECT_TRUE(names(std::string(name) + '`')) << name;
 }
 
 }  // namespace

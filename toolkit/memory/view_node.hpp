@@ -14,21 +14,12 @@
 #include "qz/toolkit/geometry.hpp"
 #include "qz/toolkit/image.hpp"
 #include "qz/toolkit/view.hpp"
+#include "toolkit/class_names.hpp"
 #include "toolkit/memory/screen.hpp"
 
 namespace qz::toolkit::memory {
 
 class MemoryWindow;
-
-/// The class names that views of this toolkit report: AppKit's.
-namespace class_names {
-inline constexpr std::string_view box = "NSBox";
-inline constexpr std::string_view button = "NSButton";
-inline constexpr std::string_view imageView = "NSImageView";
-inline constexpr std::string_view popUpButton = "NSPopUpButton";
-inline constexpr std::string_view textField = "NSTextField";
-inline constexpr std::string_view view = "NSView";
-}  // namespace class_names
 
 class ViewNode : public std::enable_shared_from_this<ViewNode> {
  public:

@@ -9,6 +9,7 @@
 #include "qz/toolkit/application.hpp"
 #include "qz/toolkit/geometry.hpp"
 #include "qz/toolkit/window.hpp"
+#include "toolkit/backend/kept_by.hpp"
 #include "toolkit/backend/sheet_session.hpp"
 #include "toolkit/memory/screen.hpp"
 
@@ -16,9 +17,6 @@ namespace qz::toolkit::memory {
 
 /// The default background of a window (`windowBackgroundColor` in AppKit's light appearance).
 inline constexpr Color windowBackground{236 / 255.0, 236 / 255.0, 236 / 255.0};
-
-/// Who keeps a window alive: only its maker, or also the application while it is on the screen.
-enum class KeptBy { maker, application };
 
 class MemoryWindow final : public Window, public std::enable_shared_from_this<MemoryWindow> {
  public:

@@ -19,7 +19,7 @@ namespace {
 constexpr auto newButtonTitle = "Button";
 
 Ref<View> placed(QWidget& widget, const Rect& frame, const std::shared_ptr<Desk>& desk) {
-  const auto node = makeView(widget, desk, Widget::view);
+  const auto node = makeView(widget, desk, KeptBy::holder);
   node->place(frame);
   return node->view();
 }

@@ -16,7 +16,7 @@ Ref<View> Desk::viewOf(QWidget& widget) {
   const auto found = views_.find(&widget);
   const auto known = found == views_.end() ? nullptr : found->second.lock();
   if (known && known->widget() == &widget) return known->view();
-  return makeView(widget, shared_from_this(), Widget::host)->view();
+  return makeView(widget, shared_from_this(), KeptBy::host)->view();
 }
 
 std::shared_ptr<QtWindow> Desk::windowOf(QWidget& widget) {

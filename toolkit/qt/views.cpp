@@ -25,7 +25,7 @@ bool isImageView(const QWidget& widget) {
 
 template <class V>
 std::shared_ptr<WidgetNode> make(QWidget& widget, const std::shared_ptr<Desk>& desk,
-                                 Widget keptBy) {
+                                 KeptBy keptBy) {
   const auto view = std::make_shared<V>(widget, desk, keptBy);
   desk->enter(widget, view);
   return view;
@@ -34,7 +34,7 @@ std::shared_ptr<WidgetNode> make(QWidget& widget, const std::shared_ptr<Desk>& d
 }  // namespace
 
 std::shared_ptr<WidgetNode> makeView(QWidget& widget, const std::shared_ptr<Desk>& desk,
-                                     Widget keptBy) {
+                                     KeptBy keptBy) {
   if (qobject_cast<QAbstractButton*>(&widget)) return make<QtButton>(widget, desk, keptBy);
   if (isImageView(widget)) return make<QtImageView>(widget, desk, keptBy);
   if (showsText(widget)) return make<QtTextField>(widget, desk, keptBy);

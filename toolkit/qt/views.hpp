@@ -25,7 +25,7 @@ namespace qz::toolkit::qt {
 /// plain text edit; a plain view for anything else, even a combo box. The kind never changes while
 /// the view lives.
 std::shared_ptr<WidgetNode> makeView(QWidget& widget, const std::shared_ptr<Desk>& desk,
-                                     Widget keptBy);
+                                     KeptBy keptBy);
 
 /// What all controls have in common, whatever their role.
 class ControlNode : public WidgetNode {

@@ -52,7 +52,7 @@ class WidgetNode::Watch final : public QObject {
   WidgetNode& node_;  // its owner
 };
 
-WidgetNode::WidgetNode(QWidget& widget, std::shared_ptr<Desk> desk, Widget keptBy)
+WidgetNode::WidgetNode(QWidget& widget, std::shared_ptr<Desk> desk, KeptBy keptBy)
     : widget_(&widget),
       desk_(std::move(desk)),
       key_(&widget),
@@ -63,7 +63,7 @@ WidgetNode::WidgetNode(QWidget& widget, std::shared_ptr<Desk> desk, Widget keptB
 // Deletes the widget later, because this may run during one of the widget's own events.
 WidgetNode::~WidgetNode() {
   desk_->forgetView(key_);
-  if (widget_ && keptBy_ == Widget::view && !widget_->parentWidget()) widget_->deleteLater();
+  if (widget_ && keptBy_ == KeptBy::holder && !widget_->parentWidget()) widget_->deleteLater();
 }
 
 std::shared_ptr<WidgetNode> WidgetNode::of(const Ref<View>& view) {
@@ -132,7 +132,7 @@ void WidgetNode::insert(const Ref<View>& view) {
   requireOwnView(receiver, view, node != nullptr);
   if (!widget_ || !node->widget_) return;
   QWidget& added = *node->widget_;
-  requireFreeView(receiver, added.isWindow() && node->keptBy_ == Widget::host,
+  requireFreeView(receiver, added.isWindow() && node->keptBy_ == KeptBy::host,
                   &added == widget_ || added.isAncestorOf(widget_));
 
   // The reference may be an element of the list that the view now leaves.
@@ -158,12 +158,12 @@ void WidgetNode::removeFromSuperview() {
   hiddenOutside_ = widget_->isHidden();
   giveFocusAway(*widget_);
   widget_->setParent(nullptr);
-  keptBy_ = Widget::view;
+  keptBy_ = KeptBy::holder;
   around->readSubviews();
   around->changed();
 }
 
-bool WidgetNode::isOutside() const { return keptBy_ == Widget::view && !widget_->parentWidget(); }
+bool WidgetNode::isOutside() const { return keptBy_ == KeptBy::holder && !widget_->parentWidget(); }
 
 bool WidgetNode::isHidden() const {
   if (!widget_) return false;

@@ -16,6 +16,7 @@
 
 #include "qz/toolkit/geometry.hpp"
 #include "qz/toolkit/view.hpp"
+#include "toolkit/backend/kept_by.hpp"
 #include "toolkit/qt/desk.hpp"
 
 namespace qz::toolkit::qt {
@@ -26,12 +27,11 @@ inline constexpr const char* tagProperty = "qzTag";
 /// no pixmap.
 inline constexpr const char* imageViewProperty = "qzImageView";
 
-/// Who deletes a widget that has no parent.
-enum class Widget { host, view };
-
 class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
  public:
-  WidgetNode(QWidget& widget, std::shared_ptr<Desk> desk, Widget keptBy);
+  /// `keptBy` says who deletes the widget while it has no parent: the host, or this node
+  /// (`holder`).
+  WidgetNode(QWidget& widget, std::shared_ptr<Desk> desk, KeptBy keptBy);
   virtual ~WidgetNode();
   WidgetNode(const WidgetNode&) = delete;
   WidgetNode& operator=(const WidgetNode&) = delete;
@@ -83,7 +83,7 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   bool isWhereItWasPut() const;
 
   const QWidget* const key_;  // in the desk's table
-  Widget keptBy_;
+  KeptBy keptBy_;
   bool hadTag_;                 // before this view was made
   bool hiddenOutside_ = false;  // applies when it is inserted again
   std::optional<Placement> placement_;

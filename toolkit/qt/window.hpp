@@ -14,16 +14,13 @@
 #include "qz/toolkit/application.hpp"
 #include "qz/toolkit/geometry.hpp"
 #include "qz/toolkit/window.hpp"
+#include "toolkit/backend/kept_by.hpp"
 #include "toolkit/backend/sheet_session.hpp"
 #include "toolkit/qt/desk.hpp"
 
 namespace qz::toolkit::qt {
 
 class SheetPlace;
-
-/// Who keeps a window alive: the host, or the code that asked the driver or the application for the
-/// window; `application` also keeps it while it is on the screen.
-enum class KeptBy { host, maker, application };
 
 class QtWindow final : public Window, public std::enable_shared_from_this<QtWindow> {
  public:

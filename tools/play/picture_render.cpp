@@ -49,7 +49,7 @@ Row rowOf(const ControlPicture& control, char mark) {
   std::string content = contentOf(control);
   // The line end that closes a paragraph would only leave an empty line in the table.
   content.erase(content.find_last_not_of('\n') + 1);
-  return {mark,    std::to_string(control.view.tag), std::string(kindWord(control.view.kind)),
+  return {mark,    std::to_string(control.view.tag), std::string(rowOf(control.view.kind).word),
           content, joined(remarksOn(control)),       control.view.hidden};
 }
 

@@ -44,41 +44,9 @@ std::string_view alignmentWord(toolkit::TextAlignment alignment) {
   return "";
 }
 
-bool hasState(drivers::ViewKind kind) {
-  return kind == drivers::ViewKind::toggle || kind == drivers::ViewKind::mixed;
-}
-
 unsigned byteOf(double share) { return static_cast<unsigned>(std::lround(share * 255)); }
 
 }  // namespace
-
-std::string_view kindWord(drivers::ViewKind kind) {
-  switch (kind) {
-    case drivers::ViewKind::button:
-      return "button";
-    case drivers::ViewKind::toggle:
-      return "check box";
-    case drivers::ViewKind::mixed:
-      return "mixed check box";
-    case drivers::ViewKind::popUpButton:
-      return "pop-up button";
-    case drivers::ViewKind::textField:
-      return "text field";
-    case drivers::ViewKind::imageView:
-      return "image";
-    case drivers::ViewKind::box:
-      return "box";
-    case drivers::ViewKind::plain:
-      break;
-  }
-  return "view";
-}
-
-bool isButton(drivers::ViewKind kind) {
-  using drivers::ViewKind;
-  return kind == drivers::ViewKind::button || kind == drivers::ViewKind::toggle ||
-         kind == drivers::ViewKind::mixed || kind == drivers::ViewKind::popUpButton;
-}
 
 std::string_view stateWord(toolkit::State state) {
   if (state == toolkit::State::mixed) return "mixed";
@@ -137,11 +105,12 @@ std::string whenWords(double seconds) {
 }
 
 const toolkit::AttributedString& captionOf(const ControlPicture& control) {
-  return isButton(control.view.kind) ? control.view.title : control.view.text;
+  const bool hasTitle = rowOf(control.view.kind).caption == drivers::Caption::title;
+  return hasTitle ? control.view.title : control.view.text;
 }
 
 std::string contentOf(const ControlPicture& control) {
-  if (control.view.kind == drivers::ViewKind::imageView) {
+  if (rowOf(control.view.kind).caption == drivers::Caption::imageName) {
     return control.view.image ? printable(*control.view.image) : "(none)";
   }
   return printable(captionOf(control).string());
@@ -152,7 +121,7 @@ std::vector<std::string> remarksOn(const ControlPicture& control) {
   std::vector<std::string> remarks;
   if (view.hidden) remarks.emplace_back("hidden");
   if (!view.enabled) remarks.emplace_back("disabled");
-  if (hasState(view.kind) || view.state != toolkit::State::off) {
+  if (rowOf(view.kind).showsState || view.state != toolkit::State::off) {
     remarks.emplace_back(stateWord(view.state));
   }
   if (control.flashing) remarks.emplace_back("flashing");

@@ -14,12 +14,6 @@ namespace qz::tools::play {
 
 using namespace walkthrough;
 
-/// Returns the everyday word for a kind of view, such as "check box".
-std::string_view kindWord(drivers::ViewKind kind);
-
-/// Whether views of the kind are buttons: a user can press them, and they have a title.
-bool isButton(drivers::ViewKind kind);
-
 /// Returns "on", "off" or "mixed".
 std::string_view stateWord(toolkit::State state);
 

@@ -6,8 +6,6 @@
 #include <algorithm>
 #include <cctype>
 
-#include "tools/support/view_kinds.hpp"
-
 namespace qz::tools::scenario {
 namespace {
 
@@ -19,9 +17,9 @@ bool isClassNameCharacter(char c) {
 
 // Kinds to which a toolkit gives the same name share one representative.
 ClassNames::ClassNames(const drivers::Driver& driver) {
-  for (const auto name : viewKindNames()) {
-    const std::string standard(name.substr(0, name.find(':')));
-    const std::string own(driver.className(*viewKindNamed(name)));
+  for (const drivers::ViewKindRow& row : drivers::viewKinds) {
+    const std::string standard(row.className);
+    const std::string own(driver.className(row.kind));
     const auto first = standsFor_.try_emplace(standard, standard).first->second;
     const auto second = standsFor_.try_emplace(own, first).first->second;
     for (auto& [key, representative] : standsFor_) {

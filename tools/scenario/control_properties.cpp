@@ -14,22 +14,12 @@ namespace qz::tools::scenario {
 namespace control_properties {
 namespace {
 
-using drivers::ViewKind;
 using drivers::ViewPicture;
 
 // --- reading ---
 
-bool isButton(const drivers::ViewPicture& picture) {
-  return picture.kind == drivers::ViewKind::button || picture.kind == drivers::ViewKind::toggle ||
-         picture.kind == drivers::ViewKind::mixed || picture.kind == drivers::ViewKind::popUpButton;
-}
-
-bool isControl(const drivers::ViewPicture& picture) {
-  return picture.kind != drivers::ViewKind::box && picture.kind != drivers::ViewKind::plain;
-}
-
 const toolkit::AttributedString& styledText(const drivers::ViewPicture& picture) {
-  return isButton(picture) ? picture.title : picture.text;
+  return isButton(picture.kind) ? picture.title : picture.text;
 }
 
 Reading className(const Stage&, const drivers::ViewPicture& picture) { return picture.className; }
@@ -51,11 +41,11 @@ Reading frame(const Stage&, const drivers::ViewPicture& picture) {
 }
 
 Reading title(const Stage&, const drivers::ViewPicture& picture) {
-  return isButton(picture) ? Reading(picture.title.string()) : std::nullopt;
+  return isButton(picture.kind) ? Reading(picture.title.string()) : std::nullopt;
 }
 
 Reading text(const Stage&, const drivers::ViewPicture& picture) {
-  return isControl(picture) ? Reading(picture.text.string()) : std::nullopt;
+  return rowOf(picture.kind).isControl ? Reading(picture.text.string()) : std::nullopt;
 }
 
 Reading image(const Stage&, const drivers::ViewPicture& picture) {

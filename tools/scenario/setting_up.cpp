@@ -10,7 +10,6 @@
 #include "tools/scenario/statements.hpp"
 #include "tools/scenario/unmet.hpp"
 #include "tools/scenario/values.hpp"
-#include "tools/support/view_kinds.hpp"
 
 namespace qz::tools::scenario {
 namespace setting_up {
@@ -74,7 +73,7 @@ Rect frameAt(std::size_t index) {
 
 Outcome control(Stage& stage, const Arguments& a) {
   const auto parent = viewNamed(stage, a.text("PLACE"));
-  const auto made = stage.driver.makeView(*viewKindNamed(a.text("CLASS")), a.whole("TAG"),
+  const auto made = stage.driver.makeView(*drivers::viewKindNamed(a.text("CLASS")), a.whole("TAG"),
                                           rectangle(a, frameAt(parent->subviews().size())), parent);
   stage.cast.nameControl(a.text("+C"), toolkit::StoredRef<toolkit::View>::refer(made));
   return {};
@@ -82,7 +81,7 @@ Outcome control(Stage& stage, const Arguments& a) {
 
 Outcome controls(Stage& stage, const Arguments& a) {
   const auto parent = viewNamed(stage, a.text("PLACE"));
-  const auto kind = *viewKindNamed(a.text("CLASS"));
+  const auto kind = *drivers::viewKindNamed(a.text("CLASS"));
   std::size_t index = parent->subviews().size();
   for (toolkit::Tag i = 0; i < a.whole("COUNT"); ++i) {
     stage.driver.makeView(kind, a.whole("TAG") + i, frameAt(index++), parent);

@@ -9,8 +9,8 @@
 #include <iterator>
 #include <limits>
 
+#include "drivers/view_kinds.hpp"
 #include "tools/support/suggestions.hpp"
-#include "tools/support/view_kinds.hpp"
 
 namespace qz::tools::scenario {
 namespace {
@@ -96,8 +96,8 @@ bool isRelativePath(const Word& word, SlotContext& context) {
 
 bool isClass(const Word& word, SlotContext& context) {
   if (!isWord(word, context)) return false;
-  if (viewKindNamed(word.text)) return true;
-  const auto names = viewKindNames();
+  if (drivers::viewKindNamed(word.text)) return true;
+  const auto names = drivers::viewKindNames();
   throw SyntaxError(word.at, "unknown class " + inQuotes(word.text) + didYouMean(word.text, names) +
                                  "; the classes are " + enumerate({names.begin(), names.end()}));
 }

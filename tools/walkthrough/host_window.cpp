@@ -6,22 +6,20 @@
 
 #include "qz/property_list/collections.hpp"
 #include "qz/property_list/scalars.hpp"
-#include "tools/play/words.hpp"
+#include "tools/walkthrough/plist_entry.hpp"
 #include "tools/support/failure.hpp"
 #include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
-#include "tools/support/view_kinds.hpp"
-#include "tools/walkthrough/plist_entry.hpp"
 
 namespace qz::tools::walkthrough {
 namespace {
 
-using drivers::ViewKind;
+using drivers::Caption;
 using toolkit::State;
 
 bool isWindow(const toolkit::ValueRef<>& entry) {
   const auto name = toolkit::asString(toolkit::asDictionary(entry)->objectForKey("class"));
-  return name->text() == "NSWindow";
+  return name->text() == toolkit::class_names::window;
 }
 
 void readWindow(const PlistEntry& entry, HostWindow& host) {
@@ -32,11 +30,12 @@ void readWindow(const PlistEntry& entry, HostWindow& host) {
 
 drivers::ViewKind readKind(const PlistEntry& entry) {
   const std::string name = entry.requiredText("class");
-  if (name == "NSWindow") entry.fail("class", "a control (the window is the first entry)");
-  const auto kind = viewKindNamed(name);
+  if (name == toolkit::class_names::window)
+    entry.fail("class", "a control (the window is the first entry)");
+  const auto kind = drivers::viewKindNamed(name);
   if (!kind) {
-    std::string names = "one of NSWindow";
-    for (const std::string_view known : viewKindNames()) names.append(", ").append(known);
+    std::string names = "one of " + std::string(toolkit::class_names::window);
+    for (const auto known : drivers::viewKindNames()) names.append(", ").append(known);
     entry.fail("class", names);
   }
   return *kind;
@@ -46,23 +45,27 @@ State readState(const PlistEntry& entry, drivers::ViewKind kind) {
   if (!entry.has("state")) return State::off;
   const std::string name = entry.text("state");
   if (name == "on") return State::on;
-  if (name == "mixed" && kind == drivers::ViewKind::mixed) return State::mixed;
+  const bool hasMixedState = rowOf(kind).hasMixedState;
+  if (name == "mixed" && hasMixedState) return State::mixed;
   if (name != "off") {
-    entry.fail("state",
-               kind == drivers::ViewKind::mixed ? "“on”, “off” or “mixed”" : "“on” or “off”");
+    entry.fail("state", hasMixedState ? "“on”, “off” or “mixed”" : "“on” or “off”");
   }
   return State::off;
+}
+
+/// Returns the key of what a view shows.
+std::string_view captionKey(Caption caption) {
+  return caption == Caption::imageName ? "image" : "title";
 }
 
 /// Returns the keys that an entry of the kind may have: a caption only if the kind shows one, a
 /// state only if it has one.
 std::vector<std::string_view> keysOf(drivers::ViewKind kind) {
   std::vector<std::string_view> keys = {"class", "tag", "frame", "hidden", "toolTip"};
-  if (kind == drivers::ViewKind::imageView) keys.emplace_back("image");
-  if (isButton(kind) || kind == drivers::ViewKind::textField) keys.emplace_back("title");
-  if (isButton(kind)) keys.emplace_back("state");
-  if (kind != drivers::ViewKind::plain && kind != drivers::ViewKind::box)
-    keys.emplace_back("enabled");
+  const drivers::ViewKindRow& row = rowOf(kind);
+  if (row.caption != Caption::none) keys.push_back(captionKey(row.caption));
+  if (row.isButton) keys.emplace_back("state");
+  if (row.isControl) keys.emplace_back("enabled");
   return keys;
 }
 
@@ -72,9 +75,8 @@ HostControl readControl(const PlistEntry& entry) {
   entry.expectOnly(keysOf(control.kind));
   control.tag = entry.integer("tag");
   control.frame = entry.requiredRect("frame");
-  const std::string_view captionKey =
-      control.kind == drivers::ViewKind::imageView ? "image" : "title";
-  if (entry.has(captionKey)) control.caption = entry.text(captionKey);
+  const std::string_view caption = captionKey(rowOf(control.kind).caption);
+  if (entry.has(caption)) control.caption = entry.text(caption);
   control.hidden = entry.flag("hidden", false);
   control.enabled = entry.flag("enabled", true);
   control.state = readState(entry, control.kind);
@@ -123,7 +125,7 @@ HostWindow parseHostWindow(const InputFile& file) {
 toolkit::Ref<toolkit::Window> makeHostWindow(drivers::Driver& driver, const HostWindow& host,
                                              std::string_view file) {
   for (const HostControl& control : host.controls) {
-    if (control.kind == drivers::ViewKind::imageView && control.caption) {
+    if (rowOf(control.kind).caption == Caption::imageName && control.caption) {
       expectImage(driver.toolkit(), *control.caption, file);
     }
   }
