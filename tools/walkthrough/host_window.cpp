@@ -6,10 +6,10 @@
 
 #include "qz/property_list/collections.hpp"
 #include "qz/property_list/scalars.hpp"
-#include "tools/walkthrough/plist_entry.hpp"
 #include "tools/support/failure.hpp"
 #include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
+#include "tools/walkthrough/plist_entry.hpp"
 
 namespace qz::tools::walkthrough {
 namespace {
