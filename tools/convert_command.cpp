@@ -69,13 +69,13 @@ Format formatBySuffix(const std::string& path) {
   return standardFormat;
 }
 
-std::string written(const play::InputFile& file, const FormatRow& row) {
+std::string written(const InputFile& file, const FormatRow& row) {
   if (!row.writesSharedOnce) requireWritableInFull(file);
   return row.write(file.root());
 }
 
 void convert(const ConvertOptions& options) {
-  const play::InputFile file(options.in, "a property list", ExitStatus::failed);
+  const InputFile file(options.in, "a property list", ExitStatus::failed);
   const FormatRow& row = toolkit::formatRow(options.format.value_or(formatBySuffix(options.out)));
   try {
     replaceFile(options.out, written(file, row));

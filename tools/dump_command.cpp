@@ -22,7 +22,7 @@ struct DumpOptions {
 };
 
 void dump(const DumpOptions& options) {
-  const play::InputFile file(options.file, "a property list", ExitStatus::failed);
+  const InputFile file(options.file, "a property list", ExitStatus::failed);
   if (options.dictionary) file.dictionary();
   requireWritableInFull(file);
   if (options.canonical) {

@@ -18,7 +18,7 @@ constexpr std::uintmax_t valuesPerByte = 100;
 
 }  // namespace
 
-void requireWritableInFull(const play::InputFile& file) {
+void requireWritableInFull(const InputFile& file) {
   std::error_code error;
   const std::uintmax_t bytes = std::filesystem::file_size(file.path(), error);
   const std::uintmax_t most = error ? alwaysFine : std::max(alwaysFine, valuesPerByte * bytes);

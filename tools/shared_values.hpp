@@ -8,6 +8,6 @@
 namespace qz::tools {
 
 /// Throws a Failure if the file, written out in full, would be out of all proportion to its size.
-void requireWritableInFull(const play::InputFile& file);
+void requireWritableInFull(const InputFile& file);
 
 }  // namespace qz::tools

@@ -61,7 +61,7 @@ TEST_F(StackGuard, EndsTheProgramEvenIfTheEngineDoesNotAnswer) {
     installStackGuard();
     toolkit::memory::MemoryToolkit toolkit;
     const auto engine = QZ_Plist_State_Parser::init(toolkit);
-    guardScript(*engine, "script.plist", play::InputFile("script.plist", "a script").dictionary());
+    guardScript(*engine, "script.plist", InputFile("script.plist", "a script").dictionary());
     std::raise(SIGALRM);
   };
   EXPECT_EXIT(waiting(), testing::ExitedWithCode(stackExhausted),

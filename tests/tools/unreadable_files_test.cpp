@@ -33,7 +33,7 @@ TEST(UnreadableFiles, AreRefusedAsPropertyLists) {
   const play::WorkingDirectory directory;
   makeSocket("script.plist");
   try {
-    const play::InputFile file("script.plist", "a script");
+    const InputFile file("script.plist", "a script");
     FAIL() << "accepted";
   } catch (const Failure& failure) {
     EXPECT_EQ(failure.status(), ExitStatus::badInput);

@@ -13,7 +13,7 @@
 #include "tools/support/text_layout.hpp"
 #include "tools/support/whole_file.hpp"
 
-namespace qz::tools::play {
+namespace qz::tools {
 namespace {
 
 [[noreturn]] void cannotRead(const std::string& message) {
@@ -106,4 +106,4 @@ std::string foundWords(const toolkit::ValueRef<>& value) {
   return "nothing";
 }
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools

@@ -11,7 +11,7 @@
 #include "qz/property_list/value.hpp"
 #include "tools/support/failure.hpp"
 
-namespace qz::tools::play {
+namespace qz::tools {
 
 class InputFile {
  public:
@@ -44,4 +44,4 @@ class InputFile {
 /// "nothing" if the value is absent.
 std::string foundWords(const toolkit::ValueRef<>& value);
 
-}  // namespace qz::tools::play
+}  // namespace qz::tools
