@@ -59,7 +59,7 @@ void addWindowOptions(Command& command, play::PlayOptions& options) {
       .valueName("DIR");
   command.flag("--sheet", options.sheet, "Show it as a sheet over another window of the host");
   options.toolkit = playerToolkit();
-  command.option("--toolkit", options.toolkit, "The toolkit to play it on")
+  command.option("--toolkit", options.toolkit, "The toolkit to play it on: " + toolkitHelp())
       .valueName("NAME")
       .showDefault();
   command

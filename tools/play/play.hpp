@@ -10,6 +10,7 @@
 
 #include "qz/toolkit/tag.hpp"
 #include "tools/play/picture_render.hpp"
+#include "tools/support/drivers.hpp"
 #include "tools/support/failure.hpp"
 
 namespace qz::tools::play {
@@ -37,7 +38,7 @@ struct PlayOptions {
   std::optional<std::string> resources;  ///< directory of named images; absent: the script's own
   std::vector<Step> steps;               ///< what happens after the start, in order
   bool sheet = false;                    ///< show it as a sheet over another window of the host
-  std::string toolkit = "memory";
+  std::string toolkit = testToolkit();
   std::optional<std::string> screenshots;  ///< directory for a picture of every step
 };
 
