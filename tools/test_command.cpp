@@ -27,7 +27,7 @@ using scenario::Verdict;
 
 struct TestOptions {
   std::vector<std::string> paths;  // scenario files, and directories of them
-  std::string toolkit = "memory";
+  std::string toolkit = testToolkit();
   std::string filter;  // run only scenarios whose title contains this
   bool list = false;   // name the scenarios instead of running them
   bool verbose = false;
@@ -138,7 +138,8 @@ void describeTest(Command& command) {
   const auto options = std::make_shared<TestOptions>();
   command.arguments("FILE", options->paths, "Scenario files (.walk), or directories of them")
       .path();
-  command.option("--toolkit", options->toolkit, "The toolkit to run on").showDefault();
+  command.option("--toolkit", options->toolkit, "The toolkit to run on: " + toolkitHelp())
+      .showDefault();
   command.option("--filter", options->filter, "Run only scenarios whose title contains this");
   command.flag("--list", options->list, "Name the scenarios instead of running them");
   command.flag("--verbose", options->verbose, "Print every statement with its result");

@@ -26,7 +26,7 @@ inline std::string refusal(const std::string& text) {
 
 /// Returns a runner on memory toolkits that does not report what it performs.
 inline Runner quietRunner() {
-  return {[] { return makeDriver("memory"); }, "memory",
+  return {[] { return makeDriver(testToolkit()); }, testToolkit(),
           [](const std::string&, const Statement&, const std::string&) {}};
 }
 

@@ -8,6 +8,7 @@
 #include <vector>
 
 #include "tools/play/picture_render.hpp"
+#include "tools/support/drivers.hpp"
 #include "tools/support/failure.hpp"
 #include "tools/walkthrough/stage.hpp"
 #include "tools/walkthrough/steps.hpp"
@@ -22,7 +23,7 @@ struct PlayOptions {
   std::string startKey;                  ///< empty: the smallest tag
   std::optional<std::string> resources;  ///< directory of named images; absent: the script's own
   std::vector<Step> steps;               ///< what happens after the start, in order
-  std::string toolkit = "memory";
+  std::string toolkit = testToolkit();
   std::optional<std::string> screenshots;  ///< directory for a picture of every step
 };
 

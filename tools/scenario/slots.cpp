@@ -10,6 +10,7 @@
 #include <limits>
 
 #include "drivers/view_kinds.hpp"
+#include "tools/support/drivers.hpp"
 #include "tools/support/suggestions.hpp"
 
 namespace qz::tools::scenario {
@@ -72,7 +73,8 @@ bool isObject(const Word& word, SlotContext& context) {
 }
 
 bool isToolkit(const Word& word, SlotContext&) {
-  return word.isBare("memory") || word.isBare("qt") || word.isBare("appkit");
+  const auto names = toolkitNames();
+  return std::any_of(names.begin(), names.end(), [&](auto name) { return word.isBare(name); });
 }
 
 // Nothing may be written outside the resource directory, which is removed with the scenario.
@@ -229,7 +231,12 @@ bool isSetting(const Word& word, SlotContext& context) {
   return isValue(word, context);
 }
 
-constexpr Slot slots[] = {
+const std::string toolkitChoice = [] {
+  const auto names = toolkitNames();
+  return enumerate({names.begin(), names.end()});
+}();
+
+const Slot slots[] = {
     {"+C", "a name for the control", isNewName},
     {"+NAME", "a name", isNewName},
     {"+W", "a name for the window", isNewName},
@@ -255,7 +262,7 @@ constexpr Slot slots[] = {
     {"SETTING", "a value", isSetting},
     {"TAG", "a whole number", isSigned},
     {"TEXT", "a text", isWord},
-    {"TOOLKIT", "memory, qt or appkit", isToolkit},
+    {"TOOLKIT", toolkitChoice, isToolkit},
     {"UNSIGNED", "a whole number, 0 or more", isUnsigned},
     {"VALUE", "a value", isValue},
     {"W", "a window (a declared name or tutorial)", isNameOf<NameKind::window>},

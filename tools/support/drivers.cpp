@@ -1,8 +1,7 @@
 // SPDX-License-Identifier: MIT
-// The toolkits that this build of the tool has.
+// The table of the toolkits.
 #include "tools/support/drivers.hpp"
 
-#include <algorithm>
 #include <string>
 
 #include "drivers/memory/memory_driver.hpp"
@@ -15,50 +14,87 @@
 namespace qz::tools {
 namespace {
 
-struct NamedDriver {
-  std::string_view name;
-  std::unique_ptr<drivers::Driver> (*make)();
-};
+using MakeDriver = std::unique_ptr<drivers::Driver> (*)();
 
-constexpr NamedDriver drivers[] = {
-    {"memory", drivers::makeMemoryDriver},
 #if QZ_QT
-    {"qt", drivers::makeQtDriver},
+constexpr MakeDriver makeQt = drivers::makeQtDriver;
+#else
+constexpr MakeDriver makeQt = nullptr;
 #endif
-};
 
-// Says how to get a toolkit that other builds have; empty for any other name.
-std::string_view howToGet(std::string_view name) {
-  if (name != "qt") return {};
-  return "this build is without Qt; install Qt 6.4 Widgets or later (scripts/setup qt, on Debian), "
-         "then configure and build again";
-}
+
+// The first is the one for tests and programs: every build has it.
+constexpr ToolkitRow toolkitRows[] = {
+    {.name = "memory",
+     .description = "records everything, without a display",
+     .howToGet = "",
+     .hasDisplay = false,
+     .make = drivers::makeMemoryDriver},
+    {.name = "qt",
+     .description = "windows of Qt 6 Widgets",
+     .howToGet = "this build is without Qt; install Qt 6.4 Widgets or later (scripts/setup qt, on "
+                 "Debian), then configure and build again",
+     .hasDisplay = true,
+     .make = makeQt},
+    // Scenarios can name it; no build has it yet.
+    {.name = "appkit",
+     .description = "windows of AppKit",
+     .howToGet = "",
+     .hasDisplay = true,
+     .make = nullptr},
+};
 
 }  // namespace
 
-std::vector<std::string_view> driverNames() {
+std::span<const ToolkitRow> toolkits() { return toolkitRows; }
+
+std::vector<std::string_view> toolkitNames() {
   std::vector<std::string_view> names;
-  for (const NamedDriver& driver : drivers) names.push_back(driver.name);
+  for (const ToolkitRow& row : toolkitRows) names.push_back(row.name);
   return names;
 }
 
+std::vector<std::string_view> driverNames() {
+  std::vector<std::string_view> names;
+  for (const ToolkitRow& row : toolkitRows) {
+    if (row.make) names.push_back(row.name);
+  }
+  return names;
+}
+
+std::string testToolkit() { return std::string(toolkitRows[0].name); }
+
 std::string playerToolkit() {
-  const auto names = driverNames();
-  return std::find(names.begin(), names.end(), "qt") != names.end() ? "qt" : "memory";
+  for (const ToolkitRow& row : toolkitRows) {
+    if (row.make && row.hasDisplay) return std::string(row.name);
+  }
+  return testToolkit();
+}
+
+std::string toolkitHelp() {
+  std::string help;
+  for (const ToolkitRow& row : toolkitRows) {
+    if (!row.make) continue;
+    help += help.empty() ? "" : ", ";
+    help += std::string(row.name) + " (" + std::string(row.description) + ")";
+  }
+  return help;
 }
 
 std::unique_ptr<drivers::Driver> makeDriver(std::string_view name) {
-  for (const NamedDriver& driver : drivers) {
-    if (driver.name == name) return driver.make();
+  for (const ToolkitRow& row : toolkitRows) {
+    if (row.name == name && row.make) return row.make();
   }
   return nullptr;
 }
 
 std::unique_ptr<drivers::Driver> requireDriver(std::string_view name) {
   if (auto driver = makeDriver(name)) return driver;
-  if (const auto way = howToGet(name); !way.empty())
+  for (const ToolkitRow& row : toolkitRows) {
+    if (row.name != name || row.howToGet.empty()) continue;
     throw Failure(ExitStatus::badInput,
-                  "no toolkit " + std::string(name) + ": " + std::string(way));
+                  "no toolkit " + std::string(name) + ": " + std::string(row.howToGet));
+  }
   const auto known = driverNames();
   throw Failure(ExitStatus::badInput,
                 "unknown toolkit " + (name.empty() ? "\"\"" : std::string(name)) +

@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: MIT
-// The toolkits that this build of the tool has, by name.
+// The table of the toolkits, of which a build of the tool has some. A new toolkit is one row in
+// drivers.cpp.
 #pragma once
 
 #include <memory>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -11,11 +13,34 @@
 
 namespace qz::tools {
 
-/// Returns the names that `--toolkit` accepts.
+/// What is known of a toolkit.
+struct ToolkitRow {
+  std::string_view name;         ///< for `--toolkit` and in scenarios
+  std::string_view description;  ///< for the help
+  /// Says how to get the toolkit if this build is without it; empty if there is no way.
+  std::string_view howToGet;
+  bool hasDisplay;  ///< whether its windows have pixels
+  /// Makes a driver with its own toolkit; null if this build is without the toolkit.
+  std::unique_ptr<drivers::Driver> (*make)();
+};
+
+/// Returns all toolkits, also those that this build is without.
+std::span<const ToolkitRow> toolkits();
+
+/// Returns the names of all toolkits, which scenarios accept.
+std::vector<std::string_view> toolkitNames();
+
+/// Returns the names of the toolkits of this build, which `--toolkit` accepts.
 std::vector<std::string_view> driverNames();
+
+/// Returns the default toolkit for running scenarios, which every build has.
+std::string testToolkit();
 
 /// Returns the default toolkit for playing scripts: one that shows windows, if the build has one.
 std::string playerToolkit();
+
+/// Lists the toolkits of this build with their descriptions, for the help of `--toolkit`.
+std::string toolkitHelp();
 
 /// Makes a driver with its own toolkit; null if this build has no toolkit of that name.
 std::unique_ptr<drivers::Driver> makeDriver(std::string_view name);

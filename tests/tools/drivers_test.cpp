@@ -1,0 +1,93 @@
+// SPDX-License-Identifier: MIT
+// The table of toolkits: what scenarios, options and defaults take from it.
+#include "tools/support/drivers.hpp"
+
+#include <gtest/gtest.h>
+
+#include <algorithm>
+#include <filesystem>
+#include <set>
+#include <string>
+#include <string_view>
+
+#include "scenario_support.hpp"
+#include "tools/support/failure.hpp"
+
+namespace qz::tools {
+namespace {
+
+bool isIn(const std::vector<std::string_view>& names, std::string_view name) {
+  return std::find(names.begin(), names.end(), name) != names.end();
+}
+
+std::string reasonWithout(std::string_view toolkit) {
+  try {
+    requireDriver(toolkit);
+  } catch (const Failure& failure) {
+    return failure.what();
+  }
+  return "";
+}
+
+TEST(Toolkits, EveryDriverOfTheSourcesHasARow) {
+  int drivers = 0;
+  for (const auto& entry : std::filesystem::directory_iterator(QZ_SOURCE_DIR "/drivers")) {
+    if (!entry.is_directory()) continue;
+    ++drivers;
+    EXPECT_TRUE(isIn(toolkitNames(), entry.path().filename().string())) << entry.path();
+  }
+  EXPECT_GE(drivers, 2);
+}
+
+TEST(Toolkits, EveryRowHasItsOwnNameAndADescription) {
+  std::set<std::string_view> names;
+  for (const ToolkitRow& row : toolkits()) {
+    EXPECT_TRUE(names.insert(row.name).second) << row.name;
+    EXPECT_NE(row.description, "") << row.name;
+  }
+}
+
+TEST(Toolkits, ScenariosAcceptEveryNameAndNoOther) {
+  for (const ToolkitRow& row : toolkits()) {
+    EXPECT_EQ(scenario::refusal("only " + std::string(row.name) + "\nengine\n"), "") << row.name;
+  }
+  EXPECT_NE(scenario::refusal("only gtk\nengine\n").find("memory, qt or appkit"), std::string::npos)
+      << scenario::refusal("only gtk\nengine\n");
+}
+
+TEST(Toolkits, ABuildHasThoseThatItCanMake) {
+  for (const ToolkitRow& row : toolkits()) {
+    EXPECT_EQ(isIn(driverNames(), row.name), row.make != nullptr) << row.name;
+    if (row.make) continue;
+    EXPECT_EQ(makeDriver(row.name), nullptr);
+    const std::string reason = reasonWithout(row.name);
+    EXPECT_NE(reason.find(row.howToGet), std::string::npos) << reason;
+    EXPECT_TRUE(reason.starts_with(row.howToGet.empty() ? "unknown toolkit " : "no toolkit "))
+        << reason;
+  }
+}
+
+TEST(Toolkits, TheDefaultForTestsNeedsNoDisplay) {
+  const auto driver = makeDriver(testToolkit());
+  ASSERT_NE(driver, nullptr);
+  EXPECT_EQ(driver->name(), testToolkit());
+  EXPECT_FALSE(driver->draws());
+}
+
+TEST(Toolkits, TheDefaultForPlayingHasADisplayIfOneIsThere) {
+  const auto rows = toolkits();
+  const auto shows = [](const ToolkitRow& row) { return row.make && row.hasDisplay; };
+  const auto first = std::find_if(rows.begin(), rows.end(), shows);
+  EXPECT_EQ(playerToolkit(), first == rows.end() ? testToolkit() : first->name);
+}
+
+TEST(Toolkits, TheHelpListsThoseOfThisBuild) {
+  const std::string help = toolkitHelp();
+  for (const ToolkitRow& row : toolkits()) {
+    const std::string entry = std::string(row.name) + " (" + std::string(row.description) + ")";
+    EXPECT_EQ(help.find(entry) != std::string::npos, row.make != nullptr) << help;
+  }
+}
+
+}  // namespace
+}  // namespace qz::tools
