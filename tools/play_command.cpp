@@ -60,7 +60,8 @@ void addWindowOptions(Command& command, play::PlayOptions& options) {
   command.flag("--sheet", options.stage.sheet,
                "Show the window as a sheet over another window of the host");
   options.toolkit = playerToolkit();
-  command.option("--toolkit", options.toolkit, "The toolkit to play the script on: " + toolkitHelp())
+  command
+      .option("--toolkit", options.toolkit, "The toolkit to play the script on: " + toolkitHelp())
       .valueName("NAME")
       .showDefault();
   command

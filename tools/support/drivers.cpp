@@ -22,7 +22,6 @@ constexpr MakeDriver makeQt = drivers::makeQtDriver;
 constexpr MakeDriver makeQt = nullptr;
 #endif
 
-
 // The first is the one for tests and programs: every build has it.
 constexpr ToolkitRow toolkitRows[] = {
     {.name = "memory",
