@@ -39,10 +39,10 @@ TEST(RefusedSubviews, LeaveTheViewsAsTheyWere) {
     std::string reason;
   } cases[] = {
       {outer, nullptr, " is absent"},
-      {outer, outer, " is the superview itself, or lies around it"},
-      {inner, outer, " is the superview itself, or lies around it"},
+      {outer, outer, " is the superview itself, or contains it"},
+      {inner, outer, " is the superview itself, or contains it"},
       {inner, content, " is the content view of a window"},
-      {outer, foreign, ", of class , is another toolkit's"},
+      {outer, foreign, ", of class , belongs to another toolkit"},
   };
   for (const auto& test : cases) {
     EXPECT_EQ(reasonToRefuse(test.parent, test.view), start + test.reason);

@@ -12,6 +12,8 @@
 
 namespace qz::tools::play {
 
+using namespace walkthrough;
+
 /// Returns a new identity for the picture of a control or timer, valid until the program ends.
 inline Identity newIdentity() {
   static std::deque<std::shared_ptr<int>> identities;

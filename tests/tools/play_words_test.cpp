@@ -2,6 +2,7 @@
 // The words in which the transcript describes how a text looks.
 #include <gtest/gtest.h>
 
+#include "drivers/view_kinds.hpp"
 #include "tools/play/words.hpp"
 
 namespace qz::tools::play {
@@ -41,7 +42,7 @@ TEST(PlayWords, NameEveryKindOfControl) {
       {drivers::ViewKind::box, "box"},
       {drivers::ViewKind::plain, "view"},
   };
-  for (const auto& test : cases) EXPECT_EQ(kindWord(test.kind), test.word);
+  for (const auto& test : cases) EXPECT_EQ(drivers::rowOf(test.kind).word, test.word);
 }
 
 TEST(PlayWords, NameWhatDiffersFromPlainText) {

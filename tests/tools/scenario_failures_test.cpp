@@ -50,7 +50,7 @@ TEST(ScenarioFailures, ExpectationsThatDoNotHold) {
       {"expect state 5", "7: expected \"5\", got \"0\""},
       {"expect same next label", "7: expected one control, got next and label"},
       {"expect no #5", "7: expected no control #5, got label"},
-      {"expect destroyed", "7: expected the engine destroyed, got a living one"},
+      {"expect destroyed", "7: expected the engine destroyed, got a living engine"},
       {"release\nset label.text x\nexpect alive\nadopt panel",
        "10: expected an engine that the host holds, got none"},
       {"expect delegate.ends [0]", "7: expected [0], got [] (they differ at [0])"},
@@ -100,15 +100,15 @@ TEST(ScenarioFailures, ThingsThatAreNotThere) {
       {"engine\nexpect tutorial.visible NO", "8: expected the window tutorial, got none"},
       {"when sheet ends window late\nadopt late", "8: expected the window late, got none"},
       {"keep t timer 7", "7: expected an object timer under \"7\", got none"},
-      {"keep t engine.guiAssets\nfire t", "8: expected a kept timer, got t, which is none"},
-      {"target label", "7: expected a button, got label, which is none"},
+      {"keep t engine.guiAssets\nfire t", "8: expected a kept timer, got t, which is not a timer"},
+      {"target label", "7: expected a button, got label, which is not a button"},
       {"set label.state on", "7: expected a button, got NSTextField"},
       {"set next.state 2", "7: expected -1, 0 or 1, got 2"},
       {"set next.frame [1, 2, 3]", "7: expected [x, y, width, height], got [1,2,3]"},
       {"set next.background red", "7: expected \"#rrggbb\", got \"red\""},
       {"set next.target me", "7: expected engine, host or absent, got \"me\""},
       {"terminate\nignore log\nrelease\nexpect engine.flashing NO",
-       "10: expected an engine, got a destroyed one"},
+       "10: expected an engine, got a destroyed engine"},
   });
   EXPECT_EQ(failure("window w\nexpect #5.tag 5"), "2: expected an engine, got none");
 }

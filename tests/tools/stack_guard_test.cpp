@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The stack guard: lists that run each other without end close the program with one line.
+// The stack guard: lists that run each other endlessly close the program with one line.
 #include "tools/support/stack_guard.hpp"
 
 #include <gtest/gtest.h>
