@@ -51,8 +51,8 @@ TEST_F(StackGuard, EndsTheProgramWithTheListsThatRunEachOther) {
     playFrom("1");
   };
   EXPECT_EXIT(endless(), testing::ExitedWithCode(stackExhausted),
-              "^qz-walkthrough: script.plist: the stack is exhausted: lists run each other without "
-              "end \\(1 -> 2 -> 1\\)\n$");
+              "^qz-walkthrough: script.plist: the stack is exhausted: lists run each other "
+              "endlessly \\(1 -> 2 -> 1\\)\n$");
 }
 
 // A lock of the engine may be held for ever when the stack ends; then an alarm ends the wait.
