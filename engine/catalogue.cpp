@@ -235,7 +235,7 @@ bool commands::runCompound(std::string_view name, const CompoundCall& call) {
   return catalogue::runFirstNamed<&catalogue::Functions::compound>(name, call);
 }
 
-// Looks the control up first, even if there is no command of the name.
+// On purpose, an unknown name looks up the control too, which observers and windows can notice.
 bool commands::runSimple(std::string_view name, QZ_Plist_State_Parser& engine,
                          const QZ_Plist_State_Parser::ObjectId& id) {
   const auto control = engine.findObjectWithTag(id->longValue());

@@ -33,7 +33,7 @@ struct SimpleCall {
   const QZ_Plist_State_Parser::ObjectId& id;      // the list's own
 };
 
-/// Run the command of the name, and return its result; NO if there is no such command.
+/// Run the command with this name and return its result; NO if no command has the name.
 bool runCompound(std::string_view name, const CompoundCall& call);
 bool runSimple(std::string_view name, QZ_Plist_State_Parser& engine,
                const QZ_Plist_State_Parser::ObjectId& id);

@@ -102,8 +102,8 @@ const Command* compoundCommandNamed(std::string_view name);
 /// there is none.
 const Command* simpleCommandNamed(std::string_view name);
 
-/// Returns the command of a constant, such as "QZ_PLIST_STATE_PARSER_FLASH_ID", whatever its
-/// current name is; null if there is no such constant.
+/// Returns the command of a constant, such as "QZ_PLIST_STATE_PARSER_FLASH_ID". A new name of the
+/// command changes nothing here. Null if no constant has this name.
 const Command* commandOfConstant(std::string_view constant);
 
 }  // namespace qz

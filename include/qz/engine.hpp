@@ -116,8 +116,8 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   /// exactly as given), shows the walk-through window as a sheet over the host window if
   /// `runAsSheet`, and runs the list under `runFromKey`. An absent key runs no list and gives YES;
   /// an empty key means the smallest tag. Otherwise returns the result of the run. NO if the file
-  /// exists but is not a dictionary, or if the key is empty and the script has no entry. If there
-  /// is no such file, the current script stays in use. `withDelegate` is told when the sheet ends
+  /// exists but is not a dictionary, or if the key is empty and the script has no entry. If the
+  /// file does not exist, the engine keeps the current script. `withDelegate` is told when the sheet ends
   /// and is not kept alive. Raises if the value under the key is not a list.
   bool loadPlist(std::optional<std::string> name, std::optional<std::string> runFromKey,
                  std::shared_ptr<toolkit::SheetDelegate> withDelegate, bool runAsSheet);
@@ -166,7 +166,7 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   /// raise if a parameter is missing.
   bool doCompoundCommand(std::string_view name, Parameters withParameters, ObjectId usingObject);
   /// Returns the back-most view directly in the walk-through window that now has the tag; absent if
-  /// there is none.
+  /// no view has it.
   Control findObjectWithTag(toolkit::Tag tag) const;
   /// Gives every recorded control the tag that it had when it was recorded.
   void restoreOriginalTagValues();
@@ -183,8 +183,8 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
 
   // --- the command processors; each takes the tag of its target as an object id ---
 
-  /// Sets the text of a control. YES if the control then reads back the same text. NO if there is
-  /// no such control. A view that is not a control raises, and so does a value that is not a
+  /// Sets the text of a control. YES if the control then reads back the same text. NO if no
+  /// control has the tag. A view that is not a control raises, and so does a value that is not a
   /// string, after it has been shown.
   bool QZ_Plist_State_Processor_SET_TEXT(Value text, ObjectId forId);
   /// Shows HTML, centred, in a font of WITH_SIZE points. NO if the HTML cannot be read or the view
@@ -202,24 +202,24 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   bool QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(bool asIs, Value WITH_HTML,
                                                             Value WITH_FONT_NAME, Value WITH_SIZE,
                                                             ObjectId FOR_OBJECT_ID);
-  /// Colours a button red, whatever `color` is. NO if there is no such button.
+  /// Colours a button red; `color` is not used. NO if no button has the tag.
   bool QZ_Plist_State_Processor_SET_BACKGROUND_COLOR(std::uint64_t color, ObjectId forId);
-  /// Sets the colour of a button's title, by name. NO if there is no such button or colour. A name
-  /// that is not a string raises.
+  /// Sets the colour of a button's title, by name. NO if no button has the tag or no colour has the
+  /// name. A name that is not a string raises.
   bool QZ_Plist_State_Processor_SET_FOREGROUND_COLOR(Value name, ObjectId FOR_OBJECT_ID);
-  /// Sets a button's title. NO if there is no such button. A title that is not a string raises.
+  /// Sets a button's title. NO if no button has the tag. A title that is not a string raises.
   bool QZ_Plist_State_Processor_SET_TITLE(Value title, ObjectId forId);
-  /// Turn a button on or off without sending its action. NO if there is no such button.
+  /// Turn a button on or off without sending its action. NO if no button has the tag.
   bool QZ_Plist_State_Processor_SET_STATE_ON(ObjectId id);
   bool QZ_Plist_State_Processor_SET_STATE_OFF(ObjectId id);
-  /// Sets a tooltip: the text, then optionally the tag of another control. NO if there is no text
-  /// or no such control.
+  /// Sets a tooltip: the text, then optionally the tag of another control. NO if the text is
+  /// missing or no control has the tag.
   bool QZ_Plist_State_Processor_SET_TOOL_TIP(Parameters parameters, ObjectId forObject);
   /// Shows an image in an image view: the image's resource name, then the view's tag. `forObject`
-  /// is not used. NO if there are not exactly two parameters or there is no such image view.
+  /// is not used. NO if there are not exactly two parameters or no image view has the tag.
   bool QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH(Parameters parameters,
                                                               ObjectId forObject);
-  /// Runs the list under the tag and returns its result. NO if there is no such list.
+  /// Runs the list under the tag and returns its result. NO if the script has no list there.
   bool QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(ObjectId id);
   /// Calls `terminateParser`.
   void QZ_Plist_State_Processor_TERMINATE_PARSER();
@@ -228,7 +228,7 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   /// Starts the object timer of a tag, if a control or a list has the tag. `value` is in seconds;
   /// for a control, 0 cancels the pending timer. Always NO.
   bool QZ_Plist_State_Processor_SET_TIMER(std::uint64_t value, ObjectId forId);
-  /// Gives a control another tag. NO if there is no such control.
+  /// Gives a control another tag. NO if no control has the old tag.
   bool QZ_Plist_State_Processor_SET_TAG(ObjectId newTag, ObjectId forId);
   /// The same; also starts an object timer under the new tag. Its seconds are the address of the
   /// parameter, not its number: such a timer practically never fires.

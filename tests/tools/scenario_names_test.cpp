@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Names of scenarios can be given only once, whatever they name.
+// A scenario gives each name only once: to a control, a window or a kept value.
 #include <gtest/gtest.h>
 
 #include <string>

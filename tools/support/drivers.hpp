@@ -17,7 +17,7 @@ namespace qz::tools {
 struct ToolkitRow {
   std::string_view name;         ///< for `--toolkit` and in scenarios
   std::string_view description;  ///< for the help
-  /// Says how to get the toolkit if this build is without it; empty if there is no way.
+  /// Says how to get the toolkit if this build lacks it; empty if nobody can get it.
   std::string_view howToGet;
   bool hasDisplay;  ///< whether its windows have pixels
   /// Makes a driver with its own toolkit; null if this build is without the toolkit.

@@ -29,7 +29,7 @@ struct FormatRow {
   bool (*looksLike)(std::string_view contents);
   Value* (*read)(std::string_view contents, Document& document, ValueOffsets* offsets);
   /// Returns the value as a whole file; raises an invalid-argument exception for a value that the
-  /// format cannot hold. Null if there is no writer.
+  /// format cannot hold. Null if the format has no writer.
   std::string (*write)(const ValueRef<>& value);
   /// Whether a collection that is in many places is written only once.
   bool writesSharedOnce;
