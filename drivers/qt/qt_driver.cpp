@@ -312,6 +312,15 @@ void QtDriver::settle() {
   QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
 }
 
+// What is looked at is one moment: while a person acts, a timer that is due must not fire in it.
+void QtDriver::settleWithoutFiring() {
+  {
+    const PacedClock::Going still(clock_, 0);
+    settle();
+  }
+  toolkit_.parts().runLoop.setAlarm();
+}
+
 void QtDriver::raiseWhatWasThrown() {
   if (thrown_) std::rethrow_exception(std::exchange(thrown_, nullptr));
 }
@@ -346,7 +355,7 @@ ViewPicture QtDriver::look(const Ref<View>& view) {
 
 WindowPicture QtDriver::look(const Ref<Window>& window) {
   WindowPicture picture;
-  settle();
+  settleWithoutFiring();
   const auto shown = QtWindow::of(window);
   if (!shown || !shown->widget()) return picture;
   const QWidget& widget = *shown->widget();

@@ -55,6 +55,7 @@ class QtDriver final : public Driver {
   void wait(double seconds);
   void jump(double seconds);
   void settle();
+  void settleWithoutFiring();
   void raiseWhatWasThrown();
 
   // Runs pending deleteLater() calls now, not in the next driver's event loop.

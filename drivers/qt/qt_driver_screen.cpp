@@ -65,7 +65,7 @@ void QtDriver::handOver(const std::function<void(const Ref<View>&)>& willAct,
 }
 
 bool QtDriver::savePicture(const Ref<Window>& window, const std::string& path) {
-  settle();
+  settleWithoutFiring();
   const auto shown = QtWindow::of(window);
   if (!shown || !shown->widget() || !shown->widget()->isVisible()) return false;
   return pictureOf(*shown).save(qString(path), "PNG");
