@@ -5,6 +5,7 @@
 #include "engine/command_calls.hpp"
 #include "engine/state.hpp"
 #include "engine/text_of.hpp"
+#include "qz/commands.hpp"
 
 namespace qz {
 
@@ -12,19 +13,15 @@ using toolkit::asButton;
 
 namespace {
 
+constexpr std::string_view titleColors[] = {"red",   "white",  "blue", "green",
+                                            "black", "orange", "gray"};
+constexpr toolkit::Color colorsOfTheNames[] = {
+    toolkit::colors::red,   toolkit::colors::white,  toolkit::colors::blue, toolkit::colors::green,
+    toolkit::colors::black, toolkit::colors::orange, toolkit::colors::gray};
+
 std::optional<toolkit::Color> colorNamed(std::string_view name) {
-  namespace colors = toolkit::colors;
-  struct Named {
-    std::string_view name;
-    toolkit::Color color;
-  };
-  static constexpr Named known[] = {
-      {"red", colors::red},     {"white", colors::white}, {"blue", colors::blue},
-      {"green", colors::green}, {"black", colors::black}, {"orange", colors::orange},
-      {"gray", colors::gray},
-  };
-  for (const auto& [knownName, color] : known) {
-    if (name == knownName) return color;
+  for (std::size_t i = 0; i < std::size(titleColors); ++i) {
+    if (name == titleColors[i]) return colorsOfTheNames[i];
   }
   return std::nullopt;
 }
@@ -37,6 +34,8 @@ toolkit::AttributedString titleOf(const QZ_Plist_State_Parser::Control& control)
 }
 
 }  // namespace
+
+std::span<const std::string_view> titleColorNames() { return titleColors; }
 
 // Always red, whatever colour is given; on purpose.
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_BACKGROUND_COLOR(std::uint64_t,

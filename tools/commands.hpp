@@ -7,6 +7,7 @@
 namespace qz::tools {
 
 extern const CommandEntry playCommand;     ///< plays a script
+extern const CommandEntry checkCommand;    ///< checks scripts
 extern const CommandEntry testCommand;     ///< runs scenarios
 extern const CommandEntry dumpCommand;     ///< prints a property list
 extern const CommandEntry convertCommand;  ///< writes a property list in another format

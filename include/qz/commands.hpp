@@ -106,4 +106,7 @@ const Command* simpleCommandNamed(std::string_view name);
 /// command changes nothing here. Null if no constant has this name.
 const Command* commandOfConstant(std::string_view constant);
 
+/// Returns the values that a parameter of the type `colorName` may have.
+std::span<const std::string_view> titleColorNames();
+
 }  // namespace qz

@@ -24,8 +24,8 @@ TEST(PlayRaisingTimer, IsAStepOfItsOwnAndThePersonGoesOn) {
   PlayOptions options;
   options.script = directory.path() + "/script.plist";
   drivers::QtDriver driver;
-  Stage stage(driver, options.stage, InputFile(options.script, "a script").dictionary(),
-              options.script);
+  Stage stage(driver, planStage(options.stage, InputFile(options.script, "a script").dictionary(),
+                                options.script));
   std::ostringstream out;
   Transcript transcript(out, {});
   Session session(driver, stage, transcript);

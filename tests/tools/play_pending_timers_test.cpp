@@ -22,7 +22,8 @@ TEST(PlayPendingTimers, TheNextToFireComesFirst) {
                   "  2 = (); 3 = (); 4 = (); 5 = (); }");
   StageOptions options;
   drivers::MemoryDriver driver;
-  Stage stage(driver, options, InputFile("script.plist", "a script").dictionary(), "script.plist");
+  Stage stage(driver, planStage(options, InputFile("script.plist", "a script").dictionary(),
+                                "script.plist"));
   stage.load(directory.path() + "/script.plist", "1");
 
   std::vector<std::string> timers;

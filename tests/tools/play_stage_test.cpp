@@ -70,7 +70,8 @@ TEST(PlayStage, PicturesSayWhatPressesReach) {
                   " {class = NSTextField; tag = 3; frame = (0, 0, 1, 1);})");
   StageOptions options;
   options.window = "host.plist";
-  Stage stage(driver, options, InputFile("script.plist", "a script").dictionary(), "script.plist");
+  Stage stage(driver, planStage(options, InputFile("script.plist", "a script").dictionary(),
+                                "script.plist"));
   stage.load(directory.path() + "/script.plist", "");
   const StepPicture picture = takePicture(driver, stage.engine(), "title");
   ASSERT_EQ(picture.controls.size(), 3U);
@@ -90,7 +91,8 @@ TEST(PlayStage, NothingFlashesAfterTheEnd) {
   const WorkingDirectory directory;
   directory.write("script.plist", "{ 1 = ((ALLOW_FLASHING, YES), (FLASH_ID, YES, 1)); }");
   StageOptions options;
-  Stage stage(driver, options, InputFile("script.plist", "a script").dictionary(), "script.plist");
+  Stage stage(driver, planStage(options, InputFile("script.plist", "a script").dictionary(),
+                                "script.plist"));
   stage.load(directory.path() + "/script.plist", "1");
   EXPECT_TRUE(takePicture(driver, stage.engine(), "").controls[0].flashing);
   stage.engine().terminateParser();

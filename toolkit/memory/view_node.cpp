@@ -21,6 +21,23 @@ std::shared_ptr<ViewNode> ViewNode::of(const Ref<View>& view) {
   return std::dynamic_pointer_cast<ViewNode>(view.pointer());
 }
 
+SavedView ViewNode::save() const {
+  return {.tag = tag_,
+          .hidden = hidden_,
+          .toolTip = toolTip_,
+          .wantsLayer = wantsLayer_,
+          .layerContents = layerContents_};
+}
+
+void ViewNode::restore(const SavedView& saved) {
+  tag_ = saved.tag;
+  hidden_ = saved.hidden;
+  toolTip_ = saved.toolTip;
+  wantsLayer_ = saved.wantsLayer;
+  layerContents_ = saved.layerContents;
+  changed();
+}
+
 Ref<View> ViewNode::view() { return std::shared_ptr<View>(shared_from_this(), &role()); }
 
 std::shared_ptr<MemoryWindow> ViewNode::window() const {

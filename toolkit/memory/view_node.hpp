@@ -15,6 +15,7 @@
 #include "qz/toolkit/image.hpp"
 #include "qz/toolkit/view.hpp"
 #include "toolkit/class_names.hpp"
+#include "toolkit/memory/saved_view.hpp"
 #include "toolkit/memory/screen.hpp"
 
 namespace qz::toolkit::memory {
@@ -39,6 +40,10 @@ class ViewNode : public std::enable_shared_from_this<ViewNode> {
   /// Returns the image that the layer shows; absent without a layer.
   const Ref<Image>& layerContents() const { return layerContents_; }
   void setFrame(const Rect& frame) { change(frame_, frame); }
+
+  /// Returns what the view shows now; `restore` shows it again, in this view or another of its kind.
+  virtual SavedView save() const;
+  virtual void restore(const SavedView& saved);
 
   std::shared_ptr<ViewNode> superview() const { return superview_.lock(); }
   /// Returns the window that contains the view at any depth, or null.

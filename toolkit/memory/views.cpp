@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Actions and buttons.
+// Actions, buttons, and what controls save.
 
 #include "toolkit/memory/views.hpp"
 
@@ -16,6 +16,19 @@ bool ControlNode::send(std::string_view action, const std::shared_ptr<Responder>
                                     return superview ? superview->view() : nullptr;
                                   },
                                   [self]() -> Ref<Window> { return self->window(); }});
+}
+
+SavedView ControlNode::save() const {
+  SavedView saved = ViewNode::save();
+  saved.enabled = enabled_;
+  saved.text = text_;
+  return saved;
+}
+
+void ControlNode::restore(const SavedView& saved) {
+  ViewNode::restore(saved);
+  enabled_ = saved.enabled;
+  text_ = saved.text;
 }
 
 MemoryButton::MemoryButton(ButtonBehavior behavior, const Rect& frame,
@@ -50,6 +63,42 @@ void MemoryButton::click() {
   highlight(false);  // the mouse button is up again
   setState(stateAfterClick());
   send(action_, target());
+}
+
+SavedView MemoryButton::save() const {
+  SavedView saved = MemoryControl::save();
+  saved.title = title_;
+  saved.state = state_;
+  saved.highlighted = highlighted_;
+  saved.background = background_;
+  saved.bezel = bezel_;
+  return saved;
+}
+
+void MemoryButton::restore(const SavedView& saved) {
+  MemoryControl::restore(saved);
+  title_ = saved.title;
+  state_ = saved.state;
+  highlighted_ = saved.highlighted;
+  background_ = saved.background;
+  bezel_ = saved.bezel;
+}
+
+SavedView MemoryImageView::save() const {
+  SavedView saved = MemoryControl::save();
+  saved.image = image_;
+  saved.frameStyle = frameStyle_;
+  saved.scaling = scaling_;
+  saved.imageAlignment = alignment_;
+  return saved;
+}
+
+void MemoryImageView::restore(const SavedView& saved) {
+  MemoryControl::restore(saved);
+  image_ = saved.image;
+  frameStyle_ = saved.frameStyle;
+  scaling_ = saved.scaling;
+  alignment_ = saved.imageAlignment;
 }
 
 }  // namespace qz::toolkit::memory

@@ -28,6 +28,9 @@ class ControlNode : public ViewNode {
   const std::string& action() const { return action_; }
   const AttributedString& attributedStringValue() const { return text_; }
 
+  SavedView save() const override;
+  void restore(const SavedView& saved) override;
+
  protected:
   /// Like `Control::sendAction`; an empty action is not sent.
   bool send(std::string_view action, const std::shared_ptr<Responder>& target);
@@ -106,6 +109,9 @@ class MemoryButton final : public MemoryControl<Button> {
   void setBackgroundColor(const Color& color) override { change(background_, color); }
   void setBezelStyle(BezelStyle style) override { change(bezel_, style); }
 
+  SavedView save() const override;
+  void restore(const SavedView& saved) override;
+
   ButtonBehavior behavior() const { return behavior_; }
   const std::optional<Color>& backgroundColor() const { return background_; }
   BezelStyle bezelStyle() const { return bezel_; }
@@ -149,6 +155,9 @@ class MemoryImageView final : public MemoryControl<ImageView> {
   void setImageFrameStyle(ImageFrameStyle style) override { change(frameStyle_, style); }
   void setImageScaling(ImageScaling scaling) override { change(scaling_, scaling); }
   void setImageAlignment(ImageAlignment alignment) override { change(alignment_, alignment); }
+
+  SavedView save() const override;
+  void restore(const SavedView& saved) override;
 
   const Ref<Image>& image() const { return image_; }
   ImageFrameStyle imageFrameStyle() const { return frameStyle_; }

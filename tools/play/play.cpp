@@ -19,6 +19,7 @@
 #include "tools/support/drivers.hpp"
 #include "tools/support/input_file.hpp"
 #include "tools/support/suggestions.hpp"
+#include "tools/support/stack_guard.hpp"
 #include "tools/support/text_layout.hpp"
 #include "tools/walkthrough/stage.hpp"
 
@@ -138,7 +139,8 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   } else if (driver->hasPerson()) {
     driver->useRealTime();
   }
-  Stage stage(*driver, options.stage, file.dictionary(), options.script);
+  Stage stage(*driver, planStage(options.stage, file.dictionary(), options.script));
+  const ScriptGuard guard(stage.engine(), options.script, file.dictionary());
   stage.engine().setObserver(std::make_shared<RaisedPlaces>(file, stage.engine(), terminal.log));
   Transcript transcript(terminal.out, terminal.style);
   Session session(*driver, stage, transcript, screenshots ? &*screenshots : nullptr);

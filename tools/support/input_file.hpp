@@ -24,6 +24,10 @@ class InputFile {
   /// Returns the root; throws a Failure if it is not a dictionary.
   toolkit::ValueRef<toolkit::Dictionary> dictionary() const;
 
+  /// Returns the position of a value of this file; absent for any other value.
+  std::optional<toolkit::Position> positionOf(const toolkit::ValueRef<>& value) const {
+    return positions_.of(*value);
+  }
   /// Returns the place of a value of this file, such as "intro.plist:12:5"; the path alone for any
   /// other value.
   std::string placeOf(const toolkit::ValueRef<>& value) const;

@@ -26,4 +26,16 @@ void guardScript(const QZ_Plist_State_Parser& engine, const std::string& name,
                  const toolkit::ValueRef<toolkit::Dictionary>& script);
 void forgetScript();
 
+/// Guards a script while this object lives.
+class ScriptGuard {
+ public:
+  ScriptGuard(const QZ_Plist_State_Parser& engine, const std::string& name,
+              const toolkit::ValueRef<toolkit::Dictionary>& script) {
+    guardScript(engine, name, script);
+  }
+  ~ScriptGuard() { forgetScript(); }
+  ScriptGuard(const ScriptGuard&) = delete;
+  ScriptGuard& operator=(const ScriptGuard&) = delete;
+};
+
 }  // namespace qz::tools

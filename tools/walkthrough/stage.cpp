@@ -3,7 +3,6 @@
 #include "tools/walkthrough/stage.hpp"
 
 #include "tools/support/input_file.hpp"
-#include "tools/support/stack_guard.hpp"
 #include "tools/walkthrough/gui_description.hpp"
 #include "tools/walkthrough/stand_in.hpp"
 
@@ -22,32 +21,41 @@ class SheetRemover final : public toolkit::SheetDelegate {
 
 }  // namespace
 
-Stage::Stage(drivers::Driver& driver, const StageOptions& options,
-             const QZ_Plist_State_Parser::Dictionary& script, const std::string& path)
-    : driver_(driver), sheet_(options.sheet), delegate_(std::make_shared<SheetRemover>()) {
-  if (sheet_) parent_ = driver_.makeWindow(parentContent);
+StagePlan planStage(const StageOptions& options, const QZ_Plist_State_Parser::Dictionary& script,
+                    const std::string& path) {
+  StagePlan plan{.hostFile = path, .sheet = options.sheet};
   if (options.assets) {
-    buildFrom(*options.assets);
+    const InputFile file(*options.assets, "a description of a window");
+    checkGuiDescription(file);
+    plan.description = file.dictionary();
   } else if (options.window) {
-    adopt(parseHostWindow(InputFile(*options.window, "a host's window")), *options.window);
+    plan.host = parseHostWindow(InputFile(*options.window, "a host's window"));
+    plan.hostFile = *options.window;
   } else {
-    adopt(standInWindow(script), path);
+    plan.host = standInWindow(script);
   }
-  guardScript(*engine_, path, script);
+  return plan;
+}
+
+Stage::Stage(drivers::Driver& driver, const StagePlan& plan)
+    : driver_(driver), sheet_(plan.sheet), delegate_(std::make_shared<SheetRemover>()) {
+  if (sheet_) parent_ = driver_.makeWindow(parentContent);
+  if (plan.description) {
+    buildFrom(plan.description);
+  } else {
+    adopt(plan.host, plan.hostFile);
+  }
 }
 
 Stage::~Stage() {
-  forgetScript();
   if (engine_->terminating()) return;
   driver_.setLogSink({});  // tidying up is not part of the walk-through
   engine_->terminateParser();
 }
 
-void Stage::buildFrom(const std::string& descriptionFile) {
-  const InputFile file(descriptionFile, "a description of a window");
-  checkGuiDescription(file);
+void Stage::buildFrom(const QZ_Plist_State_Parser::Dictionary& description) {
   engine_ = QZ_Plist_State_Parser::initWithWindow(driver_.toolkit(), parent_);
-  engine_->loadGuiAssets(file.dictionary(), nullptr);
+  engine_->loadGuiAssets(description, nullptr);
 }
 
 void Stage::adopt(const HostWindow& host, const std::string& file) {
@@ -58,7 +66,7 @@ void Stage::adopt(const HostWindow& host, const std::string& file) {
   engine_->getGuiAssetsFromWindow(adopted_);
 }
 
-bool Stage::load(const std::string& script, const std::string& startKey) {
+bool Stage::load(const std::string& script, const std::optional<std::string>& startKey) {
   return engine_->loadPlist(script, startKey, delegate_, sheet_);
 }
 

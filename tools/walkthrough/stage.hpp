@@ -20,15 +20,26 @@ struct StageOptions {
   bool sheet = false;                 ///< show it as a sheet over another window of the host
 };
 
-/// Sets up the walk-through window as the options say: from the host's window, from a description,
-/// or, without either, from the script itself. The driver must outlive it. Terminates the engine on
+/// What the options name, read from its files, so that any number of stages can be set up from it.
+struct StagePlan {
+  HostWindow host;       ///< without a description
+  std::string hostFile;  ///< for messages
+  QZ_Plist_State_Parser::Dictionary description;  ///< of the window that the engine builds; or absent
+  bool sheet = false;
+};
+
+/// Reads the host's window or the description that the options name; without either, makes a window
+/// from the script itself. `path` is the script's file. Throws a Failure if a file does not hold
+/// what it should.
+StagePlan planStage(const StageOptions& options, const QZ_Plist_State_Parser::Dictionary& script,
+                    const std::string& path);
+
+/// Sets up the walk-through window as planned. The driver must outlive it. Terminates the engine on
 /// destruction, because the engine's timers would keep it alive.
 class Stage {
  public:
-  /// `script` is the script, and `path` its file, for messages. Throws a Failure if a file does not
-  /// hold what it should.
-  Stage(drivers::Driver& driver, const StageOptions& options,
-        const QZ_Plist_State_Parser::Dictionary& script, const std::string& path);
+  /// Throws a Failure if an image of the host's window is unknown.
+  Stage(drivers::Driver& driver, const StagePlan& plan);
   ~Stage();
   Stage(const Stage&) = delete;
   Stage& operator=(const Stage&) = delete;
@@ -37,11 +48,12 @@ class Stage {
   /// Returns the walk-through window's title; empty if it has none.
   const std::string& title() const { return title_; }
 
-  /// Loads the script at an absolute path and runs its list under `startKey`. Passes exceptions on.
-  bool load(const std::string& script, const std::string& startKey);
+  /// Loads the script at an absolute path and runs its list under `startKey`, if there is a key.
+  /// Passes exceptions on.
+  bool load(const std::string& script, const std::optional<std::string>& startKey);
 
  private:
-  void buildFrom(const std::string& descriptionFile);
+  void buildFrom(const QZ_Plist_State_Parser::Dictionary& description);
   void adopt(const HostWindow& host, const std::string& file);
 
   drivers::Driver& driver_;

@@ -1,0 +1,259 @@
+// SPDX-License-Identifier: MIT
+// What the facts say of elements, lists and tags; place_conclusions.cpp says what follows from the
+// graph of the places.
+#include "tools/check/conclusions.hpp"
+
+#include <algorithm>
+#include <set>
+
+#include "tools/check/place_conclusions.hpp"
+#include "tools/support/text_layout.hpp"
+
+namespace qz::tools::check {
+namespace {
+
+class Conclusions {
+ public:
+  Conclusions(const Exploration& exploration, const std::vector<Finding>& read, bool isStandIn)
+      : exploration_(exploration),
+        script_(exploration.setting().script),
+        facts_(exploration.facts()),
+        isStandIn_(isStandIn) {
+    for (const Finding& finding : read) {
+      if (finding.severity == Severity::error && finding.list)
+        read_.emplace(*finding.list, finding.element.value_or(noElement));
+      if (finding.code == "useless-delay") useless_.emplace(*finding.list, *finding.element);
+    }
+  }
+
+  std::vector<Finding> findings() {
+    endlessChains();
+    raised();
+    if (exploration_.isComplete()) neverRuns();
+    if (!isStandIn_) targets();
+    flashing();
+    if (exploration_.isComplete()) neverFires();
+    sharedTags();
+    buttonsWithoutList();
+    auto more = concludeFromPlaces(exploration_);
+    std::move(more.begin(), more.end(), std::back_inserter(findings_));
+    return std::move(findings_);
+  }
+
+ private:
+  static constexpr std::size_t noElement = static_cast<std::size_t>(-1);
+
+  void endlessChains() {
+    const EndlessChains& chains = exploration_.setting().chains;
+    for (const auto& [subject, entry] : facts_.all(FactKind::endlessChain)) {
+      const ScriptList& list = script_.lists()[static_cast<std::size_t>(subject)];
+      const std::string& loop = chains.loops[chains.loopOf.find(list.key)->second];
+      addForList(list, entry,
+                 findingOf("endless-chain",
+                           "list " + quote(list.key) + " runs lists without end (" + loop +
+                               "); the host's program crashes",
+                           "take out one PROCESS_COMMANDS_FOR_ID of the loop"));
+    }
+  }
+
+  void raised() {
+    for (const auto& [subject, entry] : facts_.all(FactKind::elementRaised)) {
+      if (wasRead(subject) || isUnsuitedAlways(subject)) continue;
+      addForElement(subject, entry,
+                    findingOf("raises",
+                              nameOf(subject) + " raises an exception here: " + entry.detail +
+                                  "; the engine skips it"));
+    }
+    for (const auto& [subject, entry] : facts_.all(FactKind::listRaised)) {
+      const ScriptList& list = script_.lists()[static_cast<std::size_t>(subject)];
+      if (read_.contains({list.key, noElement})) continue;
+      addForList(list, entry,
+                 findingOf("raises", "running list " + quote(list.key) +
+                                         " raises an exception: " + entry.detail));
+    }
+  }
+
+  void neverRuns() {
+    const auto ran = listsThatRun();
+    for (std::size_t i = 0; i < script_.lists().size(); ++i) {
+      const ScriptList& list = script_.lists()[i];
+      if (ran.contains(list.key) || !list.tag || !toolkit::asArray(list.value)) continue;
+      Finding finding = findingOf("never-runs",
+                                  "nothing runs list " + quote(list.key) +
+                                      ": no press, no timer and no list leads to it",
+                                  "delete the list, or run it from another one");
+      finding.list = list.key;
+      finding.where = list.keyValue;
+      findings_.push_back(std::move(finding));
+    }
+  }
+
+  /// Returns the keys of the lists that a move runs, also those that only an endless chain runs.
+  std::set<std::string> listsThatRun() const {
+    std::set<std::string> ran;
+    for (const auto& [subject, entry] : facts_.all(FactKind::listRan))
+      ran.insert(script_.lists()[static_cast<std::size_t>(subject)].key);
+    for (const auto& [subject, entry] : facts_.all(FactKind::endlessChain))
+      addChain(script_.lists()[static_cast<std::size_t>(subject)].key, ran);
+    return ran;
+  }
+
+  void addChain(const std::string& start, std::set<std::string>& ran) const {
+    std::vector<std::string> open{start};
+    while (!open.empty()) {
+      const std::string key = open.back();
+      open.pop_back();
+      const auto list = script_.listUnder(key);
+      if (!list || !ran.insert(key).second) continue;
+      for (const Element& element : script_.lists()[*list].elements) {
+        if (auto next = chainTarget(element.value, key)) open.push_back(*std::move(next));
+      }
+    }
+  }
+
+  void targets() {
+    for (const auto& [subject, entry] : facts_.all(FactKind::targetMissed)) missed(subject, entry);
+    for (const auto& [subject, entry] : facts_.all(FactKind::targetUnsuited)) {
+      if (!isUnsuitedAlways(subject) || !exploration_.isComplete()) continue;
+      addForElement(subject, entry,
+                    findingOf("wrong-target",
+                              nameOf(subject) + " names a control of another kind every time it "
+                                                "runs, on which it has no effect"));
+    }
+  }
+
+  void missed(Subject subject, const FactTable::Entry& entry) {
+    const bool found = facts_.has(FactKind::targetFound, subject);
+    if (!found && !exploration_.isComplete()) return;
+    const auto tag = script_.element(static_cast<std::size_t>(subject)).target(ownIdOf(subject));
+    Finding finding = findingOf(
+        "no-target", "no control has the tag " + std::to_string(tag.value_or(0)) + " " +
+                         (found ? "in some of the runs" : "whenever " + nameOf(subject) + " runs"));
+    if (found) finding.severity = Severity::note;
+    finding.tag = tag;
+    addForElement(subject, entry, std::move(finding));
+  }
+
+  void flashing() {
+    for (const auto& [subject, entry] : facts_.all(FactKind::flashRefused)) {
+      if (facts_.has(FactKind::flashAccepted, subject) || !exploration_.isComplete()) continue;
+      addForElement(subject, entry,
+                    findingOf("flash-decided",
+                              nameOf(subject) + " is refused every time: an earlier one has decided "
+                                                "whether the tag flashes",
+                              "keep only the FLASH_ID that should count; ALLOW_FLASHING turns all "
+                              "flashing on and off"));
+    }
+  }
+
+  void neverFires() {
+    for (const auto& [subject, entry] : facts_.all(FactKind::timerStarted)) {
+      if (facts_.has(FactKind::timerFires, subject)) continue;
+      const auto [list, element] = placeOf(subject);
+      if (useless_.contains({list->key, element})) continue;
+      addForElement(subject, entry,
+                    findingOf("never-fires",
+                              "the timer that " + nameOf(subject) +
+                                  " starts never fires: another one fires or replaces it first",
+                              "a press or a firing cancels all other timers; start them one after "
+                              "the other"));
+    }
+  }
+
+  void sharedTags() {
+    for (const auto& [subject, entry] : facts_.all(FactKind::sharedTagUsed)) {
+      Finding finding = findingOf(
+          "same-tag", "two controls have the tag that " + nameOf(subject) +
+                          " names; it reaches only the one that is farther back");
+      finding.tag = script_.element(static_cast<std::size_t>(subject)).target(ownIdOf(subject));
+      addForElement(subject, entry, std::move(finding));
+    }
+    for (const auto& [subject, entry] : facts_.all(FactKind::sharedTagPressed)) {
+      addForTag(subject, entry,
+                findingOf("same-tag", "a button with the tag " + std::to_string(subject) +
+                                          " is pressed while another control has that tag"));
+    }
+  }
+
+  void buttonsWithoutList() {
+    for (const auto& [subject, entry] : facts_.all(FactKind::noListPressed)) {
+      addForTag(subject, entry,
+                findingOf("no-list",
+                          "a user can press the button with the tag " + std::to_string(subject) +
+                              ", but there is no list under that tag, so nothing happens",
+                          "add a list, or hide or disable the button"));
+    }
+    for (const auto& [subject, entry] : facts_.all(FactKind::timerLost)) {
+      addForTag(subject, entry,
+                findingOf("timer-lost",
+                          "a press of the button with the tag " + std::to_string(subject) +
+                              ", which has no list, cancels the pending timer",
+                          "hide or disable the button while the timer runs"));
+    }
+  }
+
+  bool wasRead(Subject subject) const {
+    const auto [list, element] = placeOf(subject);
+    return read_.contains({list->key, element});
+  }
+  bool isUnsuitedAlways(Subject subject) const {
+    return facts_.has(FactKind::targetUnsuited, subject) &&
+           !facts_.has(FactKind::targetSuited, subject);
+  }
+
+  std::pair<const ScriptList*, std::size_t> placeOf(Subject subject) const {
+    const auto number = static_cast<std::size_t>(subject);
+    const auto& lists = script_.lists();
+    const auto after = std::upper_bound(
+        lists.begin(), lists.end(), number,
+        [](std::size_t wanted, const ScriptList& each) { return wanted < each.firstElement; });
+    const ScriptList& list = *std::prev(after);
+    return {&list, number - list.firstElement};
+  }
+
+  Tag ownIdOf(Subject subject) const { return placeOf(subject).first->tag.value_or(0); }
+
+  std::string nameOf(Subject subject) const {
+    const Element& element = script_.element(static_cast<std::size_t>(subject));
+    return element.command ? element.command->name : "the element";
+  }
+
+  void addForElement(Subject subject, const FactTable::Entry& entry, Finding finding) {
+    const auto [list, element] = placeOf(subject);
+    finding.list = list->key;
+    finding.element = element;
+    finding.where = list->elements[element].value;
+    add(entry, std::move(finding));
+  }
+  void addForList(const ScriptList& list, const FactTable::Entry& entry, Finding finding) {
+    finding.list = list.key;
+    finding.where = list.keyValue;
+    add(entry, std::move(finding));
+  }
+  void addForTag(Subject subject, const FactTable::Entry& entry, Finding finding) {
+    finding.tag = subject;
+    add(entry, std::move(finding));
+  }
+  void add(const FactTable::Entry& entry, Finding finding) {
+    finding.path = exploration_.path(entry.first);
+    finding.places = std::max<std::size_t>(entry.places, 1);
+    findings_.push_back(std::move(finding));
+  }
+
+  const Exploration& exploration_;
+  const Script& script_;
+  const FactTable& facts_;
+  bool isStandIn_;
+  std::set<std::pair<std::string, std::size_t>> read_;     // what reading calls an error
+  std::set<std::pair<std::string, std::size_t>> useless_;  // elements with a useless delay
+  std::vector<Finding> findings_;
+};
+
+}  // namespace
+
+std::vector<Finding> conclude(const Exploration& exploration, const std::vector<Finding>& read,
+                              bool isStandIn) {
+  return Conclusions(exploration, read, isStandIn).findings();
+}
+
+}  // namespace qz::tools::check

@@ -1,0 +1,313 @@
+// SPDX-License-Identifier: MIT
+// Visits are expanded in rounds: any number of worlds make the moves, then what they found is added
+// in the order of the visits. So the result does not depend on the number of threads.
+#include "tools/check/exploration.hpp"
+
+#include <algorithm>
+#include <chrono>
+#include <thread>
+
+#include "tools/check/expansion.hpp"
+
+namespace qz::tools::check {
+namespace {
+
+constexpr std::size_t worthThreads = 256;  // visits; below, threads cost more than they save
+constexpr std::size_t edgeBytes = 3;
+constexpr std::size_t mostPlaces = (std::size_t{1} << (8 * edgeBytes)) - 1;
+
+std::vector<Tag> allTags(const Setting& setting) {
+  std::vector<Tag> tags = setting.script.newTags();
+  tags.insert(tags.end(), setting.ownTags.begin(), setting.ownTags.end());
+  return tags;
+}
+
+}  // namespace
+
+Exploration::Exploration(const Setting& setting, std::vector<std::string> startKeys)
+    : setting_(setting),
+      startKeys_(std::move(startKeys)),
+      format_(setting.ownTags.size(), allTags(setting)),
+      set_(format_.size()) {
+  numberOf({});
+}
+
+void Exploration::run(const ExplorationLimits& limits, unsigned threads,
+                      const std::function<void(const Progress&)>& report,
+                      const std::function<bool()>& isCancelled) {
+  const auto began = std::chrono::steady_clock::now();
+  const auto isLate = [&] {
+    const std::chrono::duration<double> passed = std::chrono::steady_clock::now() - began;
+    return limits.seconds && passed.count() > *limits.seconds;
+  };
+  const std::size_t most = std::min(limits.places, mostPlaces);
+  start();
+  std::vector<Expansion> expansions;
+  std::uint32_t next = 0;
+  while (next < visits_.size()) {
+    if (set_.count() >= most || isLate() || isCancelled()) return;
+    expansions.resize(std::min(Expansion::roundSize, visits_.size() - next));
+    expandAll(expansions, next, threads);
+    for (const Expansion& expansion : expansions) {
+      if (set_.count() >= most) return;
+      merge(expansion);
+      ++next;
+    }
+    report({set_.count(), visits_.size() - next});
+  }
+  complete_ = true;
+}
+
+void Exploration::start() {
+  worlds_.push_back(std::make_unique<World>(setting_, format_, looks_));
+  World& world = *worlds_.front();
+  for (std::size_t i = 0; i < startKeys_.size(); ++i) {
+    const Occasion occasion{noVisit, static_cast<Move>(i)};
+    std::vector<std::uint8_t> place(format_.size());
+    PendingTimers timers;
+    const auto list = setting_.script.listUnder(startKeys_[i]);
+    if (setting_.chains.loopOf.contains(startKeys_[i]) && list) {
+      facts_.add({FactKind::endlessChain, static_cast<Subject>(*list), {}}, occasion, noPlace);
+      continue;
+    }
+    const Arrival arrival = world.start(startKeys_[i], timers, place.data());
+    for (const Fact& fact : world.facts()) facts_.add(fact, occasion, noPlace);
+    arrive(timers, std::move(place),
+           {.look = arrival.look,
+            .parent = noVisit,
+            .move = occasion.move,
+            .lastList = arrival.lastList.value_or(noList)});
+  }
+}
+
+void Exploration::expandAll(std::vector<Expansion>& expansions, std::uint32_t first,
+                            unsigned threads) {
+  for (std::size_t i = 0; i < expansions.size(); ++i)
+    expansions[i].visit = first + static_cast<std::uint32_t>(i);
+  if (expansions.size() < worthThreads || threads <= 1) {
+    for (Expansion& expansion : expansions) expand(*worlds_.front(), expansion);
+    return;
+  }
+  while (worlds_.size() < threads)
+    worlds_.push_back(std::make_unique<World>(setting_, format_, looks_));
+  constexpr std::size_t share = 32;  // visits that a thread takes at a time
+  std::atomic<std::size_t> taken = 0;
+  const auto work = [&](World& world) {
+    for (std::size_t begin = taken.fetch_add(share); begin < expansions.size();
+         begin = taken.fetch_add(share)) {
+      const std::size_t end = std::min(begin + share, expansions.size());
+      for (std::size_t i = begin; i < end; ++i) expand(world, expansions[i]);
+    }
+  };
+  std::vector<std::jthread> running;
+  for (std::size_t i = 1; i < worlds_.size(); ++i)
+    running.emplace_back([&work, this, i] { work(*worlds_[i]); });
+  work(*worlds_.front());
+}
+
+void Exploration::expand(World& world, Expansion& expansion) const {
+  const Visit& visit = visits_[expansion.visit];
+  const std::uint8_t* const from = set_.place(visit.place);
+  const PendingTimers& pending = timers(visit.place);
+  const auto moves = world.moves(from, pending);
+  expansion.found.resize(moves.size());
+  expansion.places.resize(moves.size() * format_.size());
+  expansion.facts.clear();
+  for (std::size_t i = 0; i < moves.size(); ++i) {
+    Expansion::Found& found = expansion.found[i];
+    std::uint8_t* const place = expansion.places.data() + i * format_.size();
+    found.firstFact = expansion.facts.size();
+    found.arrival = world.make(moves[i], from, visit.look, pending, found.timers, place);
+    const auto& facts = world.facts();
+    expansion.facts.insert(expansion.facts.end(), facts.begin(), facts.end());
+  }
+}
+
+void Exploration::merge(const Expansion& expansion) {
+  const Visit from = visits_[expansion.visit];
+  const bool isFirst = firstVisit_[from.place] == expansion.visit;
+  std::vector<std::uint32_t> targets;
+  bool runsList = false;
+  for (std::size_t i = 0; i < expansion.found.size(); ++i) {
+    const auto& [arrival, timers, firstFact] = expansion.found[i];
+    const std::size_t lastFact = i + 1 < expansion.found.size() ? expansion.found[i + 1].firstFact
+                                                                : expansion.facts.size();
+    for (std::size_t fact = firstFact; fact < lastFact; ++fact)
+      facts_.add(expansion.facts[fact], {expansion.visit, arrival.move},
+                 isFirst ? from.place : noPlace);
+    if (isFirst) ++(arrival.move == waitMove ? waits_ : presses_);
+    runsList |= arrival.ranList || arrival.isEndless;
+    if (arrival.isEndless) continue;
+    const auto* const bytes = expansion.places.data() + i * format_.size();
+    targets.push_back(arrive(timers, {bytes, bytes + format_.size()},
+                             {.look = arrival.look,
+                              .parent = expansion.visit,
+                              .move = arrival.move,
+                              .lastList = arrival.lastList.value_or(from.lastList)}));
+  }
+  if (!isFirst) return;
+  runsList_.push_back(runsList);
+  addEdges(targets);
+}
+
+std::uint32_t Exploration::arrive(const PendingTimers& timers, std::vector<std::uint8_t> place,
+                                  Visit visit) {
+  format_.setTimers(place.data(), numberOf(timers));
+  const std::uint64_t hash = PlaceSet::hashOf(place.data(), place.size());
+  const auto known = set_.find(place.data(), hash);
+  visit.place = known ? *known : set_.add(place.data(), hash);
+  if (!known) firstVisit_.push_back(static_cast<std::uint32_t>(visits_.size()));
+  if (isNews(visit.place, visit) || !known) visits_.push_back(visit);
+  if (visit.parent != noVisit) followTexts(visits_[visit.parent], visit);
+  return visit.place;
+}
+
+bool Exploration::isNews(std::uint32_t place, const Visit& visit) {
+  const bool newList = hasNewList(place, visit);
+  return hasNewPart(place, visit) || newList;
+}
+
+bool Exploration::hasNewPart(std::uint32_t place, const Visit& visit) {
+  if (firstVisit_[place] == visits_.size()) return true;
+  const Visit& first = visits_[firstVisit_[place]];
+  if (visit.look == first.look) return false;
+  const Looks::Parts& parts = looks_.parts(visit.look);
+  const Looks::Parts& known = looks_.parts(first.look);
+  auto& further = furtherLooks_[place];
+  further.resize(parts.size());
+  bool isNew = false;
+  for (std::size_t i = 0; i < parts.size(); ++i) {
+    if (parts[i] == known[i]) continue;
+    auto& values = further[i];
+    if (std::find(values.begin(), values.end(), parts[i]) != values.end()) continue;
+    values.push_back(parts[i]);
+    isNew = true;
+  }
+  return isNew;
+}
+
+// Which list had the last word matters after the end, and where a press without a list leads to
+// another place because it cancels timers.
+bool Exploration::hasNewList(std::uint32_t place, const Visit& visit) {
+  const std::uint8_t* const bytes = set_.place(place);
+  if (!format_.isOver(bytes) && format_.timers(bytes) == 0) return false;
+  auto& lists = lastLists_[place];
+  if (std::find(lists.begin(), lists.end(), visit.lastList) != lists.end()) return false;
+  lists.push_back(visit.lastList);
+  return true;
+}
+
+std::vector<std::size_t> Exploration::partsWithOtherText(std::uint32_t before,
+                                                         std::uint32_t after) const {
+  std::vector<std::size_t> found;
+  if (before == after) return found;
+  const Looks::Parts& old = looks_.parts(before);
+  const Looks::Parts& now = looks_.parts(after);
+  for (std::size_t i = 0; i < format_.controls(); ++i) {
+    if (old[i] != now[i] && textOf(looks_.look(old[i]).view) != textOf(looks_.look(now[i]).view))
+      found.push_back(i);
+  }
+  return found;
+}
+
+void Exploration::followTexts(const Visit& from, const Visit& to) {
+  const auto changed = partsWithOtherText(from.look, to.look);
+  if (changed.empty()) return;
+  const Looks::Parts& old = looks_.parts(from.look);
+  const Looks::Parts& now = looks_.parts(to.look);
+  const auto isShown = [&](std::uint32_t place, std::size_t part) {
+    return !format_.control(set_.place(place), part).hidden;
+  };
+  for (const std::size_t part : changed) {
+    if (to.move == waitMove && isShown(from.place, part))
+      replacedTexts_.insert({from.place, part, old[part]});
+    if (!timers(to.place).empty() && isShown(to.place, part))
+      freshTexts_.try_emplace({to.place, part, now[part]},
+                              ReplacedText{.place = to.place,
+                                           .part = part,
+                                           .value = now[part],
+                                           .list = to.lastList,
+                                           .shown = {to.parent, to.move}});
+  }
+}
+
+std::vector<ReplacedText> Exploration::replacedTexts() const {
+  std::vector<ReplacedText> texts;
+  for (const auto& [key, text] : freshTexts_) {
+    if (replacedTexts_.contains(key)) texts.push_back(text);
+  }
+  return texts;
+}
+
+std::optional<std::uint32_t> Exploration::knownPlace(const Expansion& expansion, std::size_t move) {
+  const auto* const bytes = expansion.places.data() + move * format_.size();
+  std::vector<std::uint8_t> place(bytes, bytes + format_.size());
+  format_.setTimers(place.data(), numberOf(expansion.found[move].timers));
+  return set_.find(place.data(), PlaceSet::hashOf(place.data(), place.size()));
+}
+
+std::uint32_t Exploration::numberOf(const PendingTimers& timers) {
+  if (timers.empty() && !timers_.empty()) return 0;
+  std::vector<std::pair<std::string, double>> key;
+  for (const PendingTimer& timer : timers) key.emplace_back(timer.key, timer.seconds);
+  const auto [place, isNew] =
+      timerNumbers_.emplace(key, static_cast<std::uint32_t>(timers_.size()));
+  if (isNew) timers_.push_back(std::make_unique<PendingTimers>(timers));
+  return place->second;
+}
+
+void Exploration::addEdges(const std::vector<std::uint32_t>& targets) {
+  edgeStart_.push_back(edges_.size());
+  for (const std::uint32_t target : targets) {
+    for (std::size_t byte = 0; byte < edgeBytes; ++byte)
+      edges_.push_back(static_cast<std::uint8_t>(target >> 8 * byte));
+  }
+}
+
+std::vector<std::uint32_t> Exploration::successors(std::uint32_t place) const {
+  std::vector<std::uint32_t> targets;
+  if (!isExpanded(place)) return targets;
+  const std::size_t end = place + 1 < edgeStart_.size() ? edgeStart_[place + 1] : edges_.size();
+  for (std::size_t at = edgeStart_[place]; at < end; at += edgeBytes) {
+    std::uint32_t target = 0;
+    for (std::size_t byte = edgeBytes; byte-- > 0;) target = target << 8U | edges_[at + byte];
+    targets.push_back(target);
+  }
+  return targets;
+}
+
+Step Exploration::stepFrom(std::uint32_t place, Move move) const {
+  if (move == waitMove) return WaitMove{timers(place).front().seconds};
+  const std::uint8_t* const bytes = set_.place(place);
+  PressMove press{.tag = format_.control(bytes, move).tag, .control = move};
+  for (std::size_t i = 0; i < move; ++i)
+    press.isShadowed |= format_.control(bytes, i).tag == press.tag;
+  return press;
+}
+
+Step Exploration::step(const Visit& visit) const {
+  if (visit.parent == noVisit) return StartMove{startKeys_[visit.move]};
+  return stepFrom(visits_[visit.parent].place, visit.move);
+}
+
+Path Exploration::path(std::uint32_t visit) const {
+  Path path;
+  for (; visit != noVisit; visit = visits_[visit].parent) path.push_back(step(visits_[visit]));
+  std::reverse(path.begin(), path.end());
+  return path;
+}
+
+Path Exploration::path(const Occasion& occasion) const {
+  if (occasion.visit == noVisit) return {StartMove{startKeys_[occasion.move]}};
+  Path path = this->path(occasion.visit);
+  path.push_back(stepFrom(visits_[occasion.visit].place, occasion.move));
+  return path;
+}
+
+std::size_t Exploration::depth(std::uint32_t visit) const {
+  std::size_t depth = 0;
+  for (; visit != noVisit; visit = visits_[visit].parent) ++depth;
+  return depth;
+}
+
+}  // namespace qz::tools::check

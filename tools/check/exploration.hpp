@@ -1,0 +1,160 @@
+// SPDX-License-Identifier: MIT
+// Goes through everything that a user can do: every place, every move, breadth first.
+#pragma once
+
+#include <atomic>
+#include <cstdint>
+#include <functional>
+#include <map>
+#include <memory>
+#include <optional>
+#include <set>
+#include <string>
+#include <tuple>
+#include <unordered_map>
+#include <vector>
+
+#include "tools/check/facts.hpp"
+#include "tools/check/looks.hpp"
+#include "tools/check/move.hpp"
+#include "tools/check/place.hpp"
+#include "tools/check/place_set.hpp"
+#include "tools/check/world.hpp"
+
+namespace qz::tools::check {
+
+/// One way of being at a place: with a look that was not seen there before. The first visit of a
+/// place finds the place. The visits are in the order of their finding, so a later visit has no
+/// shorter path.
+struct Visit {
+  std::uint32_t place = 0;
+  std::uint32_t look = 0;
+  std::uint32_t parent = 0;    ///< the visit before the move; `noVisit` for a start
+  Move move = 0;               ///< from the parent; for a start, the index of its key
+  std::uint32_t lastList = 0;  ///< whose command ran last
+};
+
+inline constexpr std::uint32_t noVisit = 0xffffffff;
+inline constexpr std::uint32_t noList = 0xffffffff;
+
+struct ExplorationLimits {
+  std::size_t places = 1'000'000;
+  std::optional<double> seconds;
+};
+
+/// How far an exploration has come.
+struct Progress {
+  std::size_t places = 0;
+  std::size_t frontier = 0;  ///< how many visits wait for their moves
+};
+
+/// A second look on a control at a place where the same list had the last word.
+struct LookDifference {
+  std::uint32_t list = 0;
+  std::size_t part = 0;
+  Occasion first;   ///< after which the place was seen with one look
+  Occasion second;  ///< and with another
+  std::size_t places = 0;
+};
+
+/// A text that the first pending timer of a place replaces.
+struct ReplacedText {
+  std::uint32_t place = 0;
+  std::size_t part = 0;  ///< the control
+  LookValue value = 0;   ///< what it shows
+  std::uint32_t list = 0;  ///< which showed the text
+  Occasion shown;
+};
+
+class Exploration {
+ public:
+  Exploration(const Setting& setting, std::vector<std::string> startKeys);
+
+  /// Explores until everything is known, a limit is reached, or `isCancelled` answers YES.
+  void run(const ExplorationLimits& limits, unsigned threads,
+           const std::function<void(const Progress&)>& report,
+           const std::function<bool()>& isCancelled);
+
+  const Setting& setting() const { return setting_; }
+  const PlaceFormat& format() const { return format_; }
+  bool isComplete() const { return complete_; }
+  std::size_t places() const { return set_.count(); }
+  std::size_t presses() const { return presses_; }
+  std::size_t waits() const { return waits_; }
+  const std::uint8_t* place(std::uint32_t number) const { return set_.place(number); }
+  const PendingTimers& timers(std::uint32_t place) const {
+    return *timers_[format_.timers(set_.place(place))];
+  }
+  const FactTable& facts() const { return facts_; }
+  const std::vector<Visit>& visits() const { return visits_; }
+  Looks& looks() const { return looks_; }
+  const std::vector<std::string>& startKeys() const { return startKeys_; }
+
+  /// Returns the path of a visit, or of a visit and a move out of it.
+  Path path(std::uint32_t visit) const;
+  Path path(const Occasion& occasion) const;
+  std::size_t depth(std::uint32_t visit) const;
+
+  /// Returns the places to which the moves out of a place lead, in the order of the moves.
+  std::vector<std::uint32_t> successors(std::uint32_t place) const;
+  /// Whether a move out of the place runs a list.
+  bool canRunList(std::uint32_t place) const { return runsList_[place]; }
+  /// Whether the moves out of the place are known.
+  bool isExpanded(std::uint32_t place) const { return place < edgeStart_.size(); }
+  /// Returns the first visit of a place.
+  std::uint32_t firstVisit(std::uint32_t place) const { return firstVisit_[place]; }
+  /// Returns the places that look different depending on the way to them. Makes every move once
+  /// more if there may be such places.
+  std::vector<LookDifference> lookDifferences(unsigned threads);
+  /// Returns the texts that a timer replaces, with the occasions on which they appeared just before
+  /// it started. For each text, control and place, only the first occasion.
+  std::vector<ReplacedText> replacedTexts() const;
+  /// Returns the controls that can show several things at a place.
+  std::vector<std::size_t> partsWithSeveralLooks(std::uint32_t place) const;
+
+ private:
+  struct Expansion;  // of one visit: where its moves lead
+
+  void start();
+  void expandAll(std::vector<Expansion>& expansions, std::uint32_t first, unsigned threads);
+  void expand(World& world, Expansion& expansion) const;
+  void merge(const Expansion& expansion);
+  std::uint32_t arrive(const PendingTimers& timers, std::vector<std::uint8_t> place, Visit visit);
+  bool isNews(std::uint32_t place, const Visit& visit);
+  bool hasNewPart(std::uint32_t place, const Visit& visit);
+  bool hasNewList(std::uint32_t place, const Visit& visit);
+  void followTexts(const Visit& from, const Visit& to);
+  std::vector<std::size_t> partsWithOtherText(std::uint32_t before, std::uint32_t after) const;
+  std::optional<std::uint32_t> knownPlace(const Expansion& expansion, std::size_t move);
+  std::uint32_t numberOf(const PendingTimers& timers);
+  Step step(const Visit& visit) const;
+  Step stepFrom(std::uint32_t place, Move move) const;
+  void addEdges(const std::vector<std::uint32_t>& targets);
+
+  const Setting& setting_;
+  std::vector<std::string> startKeys_;
+  PlaceFormat format_;
+  mutable Looks looks_;  // giving numbers changes nothing for others
+  PlaceSet set_;
+  FactTable facts_;
+  std::vector<Visit> visits_;
+  std::vector<std::uint32_t> firstVisit_;  // by place
+  std::map<std::vector<std::pair<std::string, double>>, std::uint32_t> timerNumbers_;
+  std::vector<std::unique_ptr<PendingTimers>> timers_;
+  /// The further values of the parts of a place's look, beyond those of its first visit.
+  std::unordered_map<std::uint32_t, std::vector<std::vector<LookValue>>> furtherLooks_;
+  std::vector<std::size_t> edgeStart_;    // by place, in edges_
+  std::vector<std::uint8_t> edges_;       // three bytes each
+  std::vector<bool> runsList_;
+  std::vector<std::unique_ptr<World>> worlds_;
+  /// The lists that had the last word before a place where that matters for what follows.
+  std::unordered_map<std::uint32_t, std::vector<std::uint32_t>> lastLists_;
+  using TextPlace = std::tuple<std::uint32_t, std::size_t, LookValue>;
+  std::map<TextPlace, ReplacedText> freshTexts_;
+  std::set<TextPlace> replacedTexts_;
+  std::size_t presses_ = 0;
+  std::size_t waits_ = 0;
+  bool complete_ = false;
+};
+
+}  // namespace qz::tools::check

@@ -1,0 +1,14 @@
+// SPDX-License-Identifier: MIT
+// What follows from the places of an exploration and what can be reached from them.
+#pragma once
+
+#include <vector>
+
+#include "tools/check/exploration.hpp"
+#include "tools/check/finding.hpp"
+
+namespace qz::tools::check {
+
+std::vector<Finding> concludeFromPlaces(const Exploration& exploration);
+
+}  // namespace qz::tools::check

@@ -1,0 +1,115 @@
+// SPDX-License-Identifier: MIT
+// Tarjan's algorithm for strongly connected components, with a stack of its own instead of
+// recursion: a walk-through can be longer than the program's stack.
+#include "tools/check/place_graph.hpp"
+
+#include <algorithm>
+
+namespace qz::tools::check {
+namespace {
+
+constexpr std::uint32_t notSeen = 0xffffffff;
+
+class CircleFinder {
+ public:
+  explicit CircleFinder(const Exploration& exploration)
+      : exploration_(exploration),
+        order_(exploration.places(), notSeen),
+        lowest_(exploration.places()),
+        circleOf_(exploration.places(), notSeen) {}
+
+  std::vector<PlaceCircle> circles() {
+    for (std::uint32_t place = 0; place < order_.size(); ++place) {
+      if (order_[place] == notSeen) search(place);
+    }
+    return std::move(circles_);
+  }
+
+ private:
+  struct Frame {
+    std::uint32_t place;
+    std::vector<std::uint32_t> targets;
+    std::size_t next = 0;
+  };
+
+  void enter(std::uint32_t place) {
+    order_[place] = lowest_[place] = entered_++;
+    open_.push_back(place);
+    frames_.push_back({place, exploration_.successors(place)});
+  }
+
+  void search(std::uint32_t root) {
+    enter(root);
+    while (!frames_.empty()) {
+      Frame& frame = frames_.back();
+      if (frame.next < frame.targets.size()) {
+        follow(frame, frame.targets[frame.next++]);
+      } else {
+        leave();
+      }
+    }
+  }
+
+  void follow(Frame& frame, std::uint32_t target) {
+    if (order_[target] == notSeen) {
+      enter(target);
+    } else if (circleOf_[target] == notSeen) {
+      lowest_[frame.place] = std::min(lowest_[frame.place], order_[target]);
+    }
+  }
+
+  void leave() {
+    const std::uint32_t place = frames_.back().place;
+    frames_.pop_back();
+    if (!frames_.empty()) {
+      std::uint32_t& above = lowest_[frames_.back().place];
+      above = std::min(above, lowest_[place]);
+    }
+    if (lowest_[place] == order_[place]) close(place);
+  }
+
+  void close(std::uint32_t root) {
+    const auto number = static_cast<std::uint32_t>(circles_.size());
+    PlaceCircle circle;
+    std::uint32_t place = root;
+    do {
+      place = open_.back();
+      open_.pop_back();
+      circleOf_[place] = number;
+      circle.places.push_back(place);
+    } while (place != root);
+    std::sort(circle.places.begin(), circle.places.end());
+    for (const std::uint32_t each : circle.places) describe(circle, each, number);
+    circles_.push_back(std::move(circle));
+  }
+
+  void describe(PlaceCircle& circle, std::uint32_t place, std::uint32_t number) {
+    circle.isEnd |= exploration_.format().isOver(exploration_.place(place));
+    circle.reachesEnd |= circle.isEnd;
+    circle.reachesList |= exploration_.canRunList(place);
+    for (const std::uint32_t target : exploration_.successors(place)) {
+      if (circleOf_[target] == number) continue;
+      const PlaceCircle& next = circles_[circleOf_[target]];
+      circle.isLast = false;
+      circle.reachesEnd |= next.reachesEnd;
+      circle.reachesList |= next.reachesList;
+    }
+  }
+
+  const Exploration& exploration_;
+  std::uint32_t entered_ = 0;
+  std::vector<std::uint32_t> order_;
+  std::vector<std::uint32_t> lowest_;
+  std::vector<std::uint32_t> circleOf_;
+  std::vector<std::uint32_t> open_;
+  std::vector<Frame> frames_;
+  std::vector<PlaceCircle> circles_;
+};
+
+}  // namespace
+
+std::vector<PlaceCircle> circlesOf(const Exploration& exploration) {
+  return CircleFinder(exploration).circles();
+}
+
+}  // namespace qz::tools::check

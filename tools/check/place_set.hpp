@@ -1,0 +1,42 @@
+// SPDX-License-Identifier: MIT
+// The places that were found, each once, under numbers in the order of their finding.
+#pragma once
+
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <vector>
+
+namespace qz::tools::check {
+
+/// Two places are the same if all their bytes are: the hash only says where to look.
+class PlaceSet {
+ public:
+  /// `size` is the number of bytes of a place.
+  explicit PlaceSet(std::size_t size);
+
+  static std::uint64_t hashOf(const std::uint8_t* place, std::size_t size);
+
+  std::size_t count() const { return count_; }
+  const std::uint8_t* place(std::uint32_t number) const {
+    return blocks_[number / blockCount].get() + number % blockCount * size_;
+  }
+  /// Returns the number of a place; absent if it was not added. May be called by several threads
+  /// while none adds.
+  std::optional<std::uint32_t> find(const std::uint8_t* place, std::uint64_t hash) const;
+  /// Adds a place that is not there yet and returns its number.
+  std::uint32_t add(const std::uint8_t* place, std::uint64_t hash);
+
+ private:
+  static constexpr std::uint32_t blockCount = 1U << 14U;  // places of a block
+  static constexpr std::uint32_t noPlace = 0xffffffff;
+
+  void grow();
+
+  std::size_t size_;
+  std::size_t count_ = 0;
+  std::vector<std::unique_ptr<std::uint8_t[]>> blocks_;
+  std::vector<std::uint32_t> slots_;  // numbers of places; a power of two, at most two thirds full
+};
+
+}  // namespace qz::tools::check

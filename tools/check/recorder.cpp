@@ -1,0 +1,213 @@
+// SPDX-License-Identifier: MIT
+#include "tools/check/recorder.hpp"
+
+#include <algorithm>
+
+namespace qz::tools::check {
+namespace {
+
+using drivers::ViewKind;
+
+/// Whether a command for this kind of target works on a control of this kind.
+bool suits(TargetKind target, ViewKind kind) {
+  const drivers::ViewKindRow& row = drivers::rowOf(kind);
+  switch (target) {
+    case TargetKind::none:
+    case TargetKind::anyView:
+      return true;
+    case TargetKind::anyControl:
+      return row.isControl;
+    case TargetKind::button:
+      return row.isButton;
+    case TargetKind::buttonWithState:
+      return row.showsState;
+    case TargetKind::imageView:
+      return kind == ViewKind::imageView;
+    case TargetKind::textField:
+      return kind == ViewKind::textField;
+  }
+  return true;
+}
+
+bool hasParameter(const Command& command, ParameterType type) {
+  return command.positionOf(type).has_value();
+}
+
+bool marksFlashing(const Command& command) {
+  return command.target == TargetKind::button && hasParameter(command, ParameterType::flag);
+}
+
+/// Whether the command changes what its control shows, and not only whether and where it is.
+bool changesLook(const Command& command) {
+  if (command.target == TargetKind::none || marksFlashing(command)) return false;
+  if (command.target == TargetKind::buttonWithState) return true;
+  return std::any_of(command.parameters.begin(), command.parameters.end(), [](const auto& each) {
+    switch (each.type) {
+      case ParameterType::text:
+      case ParameterType::html:
+      case ParameterType::imageName:
+      case ParameterType::colorName:
+      case ParameterType::integer:
+        return true;
+      default:
+        return false;
+    }
+  });
+}
+
+bool changesNotes(const Command& command) {
+  return marksFlashing(command) ||
+         (command.target == TargetKind::none && (hasParameter(command, ParameterType::flag) ||
+                                                 hasParameter(command, ParameterType::imageName)));
+}
+
+// The delay of such a timer is an address, which differs from run to run.
+constexpr double uselessDelay = 1e15;
+
+}  // namespace
+
+Recorder::Recorder(const Script& script, Surroundings& surroundings)
+    : script_(script),
+      surroundings_(surroundings),
+      noted_(std::max(script.elementCount(), script.lists().size())) {}
+
+void Recorder::begin() {
+  isRecording_ = true;
+  running_.clear();
+  timers_.clear();
+  facts_.clear();
+  lastList_.reset();
+  ranList_ = false;
+  notesMayHaveChanged_ = false;
+}
+
+void Recorder::end() {
+  isRecording_ = false;
+  std::stable_sort(timers_.begin(), timers_.end(), [](const Timer& a, const Timer& b) {
+    return a.timer.seconds < b.timer.seconds;
+  });
+  if (!timers_.empty() && timers_.front().element)
+    noteOnce(FactKind::timerFires, *timers_.front().element);
+}
+
+PendingTimers Recorder::pending() const {
+  PendingTimers pending;
+  for (const Timer& timer : timers_) pending.push_back(timer.timer);
+  return pending;
+}
+
+void Recorder::note(FactKind kind, Subject subject, std::string detail) {
+  facts_.push_back({kind, subject, std::move(detail)});
+}
+
+void Recorder::noteOnce(FactKind kind, std::size_t subject) {
+  const std::uint32_t bit = 1U << static_cast<unsigned>(kind);
+  if ((noted_[subject] & bit) != 0) return;
+  noted_[subject] |= bit;
+  note(kind, static_cast<Subject>(subject));
+}
+
+void Recorder::listWillRun(const Value& list, const ObjectId& id) {
+  if (!isRecording_) return;
+  const Tag tag = id->longValue();
+  running_.push_back({.list = script_.runningList(list, tag), .id = tag});
+  if (!running_.back().list) return;
+  ranList_ = true;
+  lastList_ = running_.back().list;
+  noteOnce(FactKind::listRan, *lastList_);
+}
+
+void Recorder::listDidRun(const Value&, const ObjectId&) {
+  if (isRecording_) running_.pop_back();
+}
+
+void Recorder::commandWillRun(const Value&, std::size_t index) {
+  if (!isRecording_ || !running_.back().list) return;
+  Running& running = running_.back();
+  const ScriptList& list = script_.lists()[*running.list];
+  running.element = list.firstElement + index;
+  running.command = &list.elements[index];
+  running.target = running.command->target(running.id);
+  running.found.reset();
+  lastList_ = running.list;
+  noteOnce(FactKind::elementRan, running.element);
+  const Command* const command = running.command->command;
+  notesMayHaveChanged_ |= command && changesNotes(*command);
+  if (running.target && surroundings_.controlsWithTag(*running.target) > 1)
+    note(FactKind::sharedTagUsed, static_cast<Subject>(running.element));
+}
+
+void Recorder::commandDidRun(const Value&, std::size_t, bool result) {
+  if (!isRecording_ || !running_.back().list) return;
+  const Running& running = running_.back();
+  lastList_ = running.list;
+  if (!running.command->command) return;
+  noteTarget(running);
+  if (!marksFlashing(*running.command->command)) return;
+  if (result) {
+    noteOnce(FactKind::flashAccepted, running.element);
+  } else {
+    note(FactKind::flashRefused, static_cast<Subject>(running.element));
+  }
+}
+
+void Recorder::commandRaised(const Value&, std::size_t, const toolkit::Exception& exception) {
+  if (!isRecording_ || !running_.back().list) return;
+  const Running& running = running_.back();
+  lastList_ = running.list;
+  note(FactKind::elementRaised, static_cast<Subject>(running.element), exception.reason());
+  if (running.command->command) noteTarget(running);
+}
+
+void Recorder::noteTarget(const Running& running) {
+  const Command& command = *running.command->command;
+  if (!running.target) return;
+  const auto control = running.found ? *running.found : surroundings_.controlWithTag(*running.target);
+  const auto subject = static_cast<Subject>(running.element);
+  if (control) {
+    noteOnce(FactKind::targetFound, running.element);
+    if (hasParameter(command, ParameterType::newTag)) surroundings_.tagMayHaveChanged(control);
+    if (command.target == TargetKind::buttonWithState) surroundings_.stateWasSet(control);
+    if (changesLook(command)) surroundings_.lookMayHaveChanged(control);
+    if (suits(command.target, surroundings_.kindOf(control))) {
+      noteOnce(FactKind::targetSuited, running.element);
+    } else {
+      note(FactKind::targetUnsuited, subject);
+    }
+  } else if (hasParameter(command, ParameterType::controlOrListTag) &&
+             script_.listOfTag(*running.target)) {
+    noteOnce(FactKind::targetFound, running.element);
+  } else {
+    note(FactKind::targetMissed, subject);
+  }
+}
+
+void Recorder::controlSought(Tag tag, const toolkit::Ref<toolkit::View>& control) {
+  if (control) surroundings_.willTouch(control);
+  if (!isRecording_ || running_.empty()) return;
+  Running& running = running_.back();
+  if (running.target == tag) running.found = control;
+}
+
+void Recorder::timerSet(std::string_view key, double seconds) {
+  if (!isRecording_) return;
+  forget(key);
+  std::optional<std::size_t> element;
+  const Running* const running = running_.empty() ? nullptr : &running_.back();
+  if (running && running->list) {
+    element = running->element;
+    noteOnce(FactKind::timerStarted, *element);
+    if (hasParameter(*running->command->command, ParameterType::anything)) seconds = uselessDelay;
+  }
+  timers_.push_back({{std::string(key), seconds}, element});
+}
+
+void Recorder::timerFired(std::string_view key) { forget(key); }
+
+void Recorder::timerCancelled(std::string_view key) { forget(key); }
+
+void Recorder::forget(std::string_view key) {
+  std::erase_if(timers_, [&](const Timer& each) { return each.timer.key == key; });
+}
+
+}  // namespace qz::tools::check

@@ -1,0 +1,52 @@
+// SPDX-License-Identifier: MIT
+#include "tools/check/report.hpp"
+
+#include <charconv>
+
+namespace qz::tools::check {
+namespace {
+
+std::string shortest(double number) {
+  char digits[32];
+  const auto end = std::to_chars(std::begin(digits), std::end(digits), number).ptr;
+  return {std::begin(digits), end};
+}
+
+/// Returns the text as one word of a shell's command line.
+std::string shellWord(const std::string& text) {
+  const bool isPlain = !text.empty() && text.find_first_not_of(
+                                            "abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ"
+                                            "0123456789_-./") == std::string::npos;
+  if (isPlain) return text;
+  std::string quoted = "'";
+  for (const char c : text) quoted += c == '\'' ? std::string("'\\''") : std::string(1, c);
+  return quoted + "'";
+}
+
+}  // namespace
+
+std::vector<ReportFormat> reportFormats() {
+  return {{"text", "for people", writeText}, {"json", "one JSON object", writeJson}};
+}
+
+std::string playArguments(const Path& path) {
+  std::string arguments;
+  bool isPressing = false;
+  for (const Step& step : path) {
+    if (const auto* press = std::get_if<PressMove>(&step)) {
+      arguments += isPressing ? " " : " --press ";
+      arguments += std::to_string(press->tag);
+      isPressing = true;
+      continue;
+    }
+    isPressing = false;
+    if (const auto* start = std::get_if<StartMove>(&step)) {
+      arguments += " --start " + shellWord(start->key);
+    } else {
+      arguments += " --advance " + shortest(std::get<WaitMove>(step).seconds);
+    }
+  }
+  return arguments.empty() ? arguments : arguments.substr(1);
+}
+
+}  // namespace qz::tools::check

@@ -1,0 +1,37 @@
+// SPDX-License-Identifier: MIT
+// Writes what checks have found.
+#pragma once
+
+#include <iosfwd>
+#include <string>
+#include <string_view>
+#include <vector>
+
+#include "tools/check/check.hpp"
+
+namespace qz::tools::check {
+
+/// A verdict with what its report needs.
+struct Report {
+  const Verdict& verdict;
+  const InputFile& file;
+  std::string stageArguments;  ///< the arguments of `play` that set up the window, or empty
+};
+
+/// A format of the reports.
+struct ReportFormat {
+  std::string_view name;
+  std::string_view description;  ///< for the help
+  void (*write)(const std::vector<Report>& reports, bool color, std::ostream& out);
+};
+
+/// Returns the formats, the standard one first.
+std::vector<ReportFormat> reportFormats();
+
+void writeText(const std::vector<Report>& reports, bool color, std::ostream& out);
+void writeJson(const std::vector<Report>& reports, bool color, std::ostream& out);
+
+/// Returns the arguments of `play` that walk a path, such as "--start 1 --press 2 3".
+std::string playArguments(const Path& path);
+
+}  // namespace qz::tools::check

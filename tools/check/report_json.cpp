@@ -1,0 +1,74 @@
+// SPDX-License-Identifier: MIT
+// The report as one JSON object.
+#include <nlohmann/json.hpp>
+#include <ostream>
+
+#include "tools/check/report.hpp"
+
+namespace qz::tools::check {
+namespace {
+
+using Json = nlohmann::ordered_json;
+
+Json jsonOf(const Step& step) {
+  if (const auto* start = std::get_if<StartMove>(&step)) return {{"start", start->key}};
+  if (const auto* wait = std::get_if<WaitMove>(&step)) return {{"wait", wait->seconds}};
+  const auto& press = std::get<PressMove>(step);
+  Json json = {{"press", press.tag}};
+  if (press.isShadowed) json["index"] = press.control;
+  return json;
+}
+
+Json jsonOf(const Path& path) {
+  Json json = Json::array();
+  for (const Step& step : path) json.push_back(jsonOf(step));
+  return json;
+}
+
+void addPosition(Json& json, const Finding& finding, const InputFile& file) {
+  const auto position = finding.where ? file.positionOf(finding.where) : std::nullopt;
+  if (!position) return;
+  if (const auto* text = std::get_if<toolkit::TextPosition>(&*position)) {
+    json["line"] = text->line;
+    json["column"] = text->column;
+  }
+}
+
+Json jsonOf(const Finding& finding, const InputFile& file) {
+  Json json = {{"code", finding.code},
+               {"severity", nameOf(finding.severity)},
+               {"message", finding.message}};
+  if (finding.list) json["list"] = *finding.list;
+  if (finding.element) json["element"] = *finding.element;
+  addPosition(json, finding, file);
+  if (finding.tag) json["tag"] = *finding.tag;
+  if (!finding.path.empty()) json["path"] = jsonOf(finding.path);
+  if (!finding.otherPath.empty()) json["otherPath"] = jsonOf(finding.otherPath);
+  if (finding.places > 0) json["places"] = finding.places;
+  return json;
+}
+
+Json jsonOf(const Report& report) {
+  const Explored& explored = report.verdict.explored;
+  Json findings = Json::array();
+  for (const Finding& finding : report.verdict.findings)
+    findings.push_back(jsonOf(finding, report.file));
+  return {{"script", report.verdict.path},
+          {"explored",
+           {{"places", explored.places},
+            {"presses", explored.presses},
+            {"waits", explored.waits},
+            {"complete", explored.complete}}},
+          {"findings", std::move(findings)}};
+}
+
+}  // namespace
+
+void writeJson(const std::vector<Report>& reports, bool, std::ostream& out) {
+  Json scripts = Json::array();
+  for (const Report& report : reports) scripts.push_back(jsonOf(report));
+  const Json json = {{"version", 1}, {"scripts", std::move(scripts)}};
+  out << json.dump(2, ' ', false, Json::error_handler_t::replace) << '\n';
+}
+
+}  // namespace qz::tools::check

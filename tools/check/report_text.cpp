@@ -1,0 +1,107 @@
+// SPDX-License-Identifier: MIT
+// The report for people.
+#include <algorithm>
+#include <ostream>
+#include <sstream>
+
+#include "tools/check/report.hpp"
+#include "tools/support/text_layout.hpp"
+#include "tools/support/whole_file.hpp"
+
+namespace qz::tools::check {
+namespace {
+
+constexpr std::size_t widestLine = 100;  // columns of a source line
+
+struct Colors {
+  bool isOn;
+  std::string_view bold() const { return isOn ? "\x1b[1m" : ""; }
+  std::string_view plain() const { return isOn ? "\x1b[0m" : ""; }
+  std::string_view of(Severity severity) const {
+    if (!isOn) return "";
+    if (severity == Severity::error) return "\x1b[1;31m";
+    return severity == Severity::warning ? "\x1b[1;33m" : "\x1b[1;36m";
+  }
+};
+
+std::string counted(std::size_t count, const std::string& noun) {
+  const std::string many = noun == "press" ? "presses" : noun + "s";
+  return std::to_string(count) + " " + (count == 1 ? noun : many);
+}
+
+class TextReport {
+ public:
+  TextReport(const Report& report, bool color, std::ostream& out)
+      : report_(report), colors_{color}, out_(out) {
+    std::istringstream source(wholeFile(report.file.path()).value_or(""));
+    for (std::string line; std::getline(source, line);) lines_.push_back(line);
+  }
+
+  void write() {
+    for (const Finding& finding : report_.verdict.findings) writeFinding(finding);
+    writeSummary();
+  }
+
+ private:
+  void writeFinding(const Finding& finding) {
+    const auto place =
+        finding.where ? report_.file.placeOf(finding.where) : report_.verdict.path;
+    out_ << colors_.bold() << oneLine(place) << ": " << colors_.of(finding.severity)
+         << nameOf(finding.severity) << ":" << colors_.plain() << ' ' << oneLine(finding.message)
+         << " [" << finding.code << "]\n";
+    writeSource(finding);
+    writePath(finding.path, "see it");
+    writePath(finding.otherPath, "and the other");
+    if (finding.places > 1) out_ << "  places: " << finding.places << " show it\n";
+    if (!finding.help.empty()) out_ << "  help: " << oneLine(finding.help) << '\n';
+  }
+
+  void writeSource(const Finding& finding) {
+    const auto position =
+        finding.where ? report_.file.positionOf(finding.where) : std::nullopt;
+    const auto* const text = position ? std::get_if<toolkit::TextPosition>(&*position) : nullptr;
+    if (!text || text->line > lines_.size()) return;
+    const std::string& line = lines_[text->line - 1];
+    if (displayWidth(line) > widestLine || line.find('\0') != std::string::npos) return;
+    out_ << "  | " << oneLine(line) << "\n  | " << std::string(text->column - 1, ' ')
+         << colors_.of(finding.severity) << '^' << colors_.plain() << '\n';
+  }
+
+  void writePath(const Path& path, std::string_view title) {
+    if (path.empty()) return;
+    out_ << "  " << title << ": qz-walkthrough play " << report_.verdict.path
+         << report_.stageArguments << ' ' << playArguments(path) << '\n';
+  }
+
+  void writeSummary() {
+    const Explored& explored = report_.verdict.explored;
+    out_ << colors_.bold() << report_.verdict.path << colors_.plain() << ": explored "
+         << counted(explored.places, "place") << ", " << counted(explored.presses, "press")
+         << " and " << counted(explored.waits, "wait") << ", "
+         << (explored.complete ? "which are all" : "and not everything") << "; ";
+    std::string counts;
+    for (const auto severity : {Severity::error, Severity::warning, Severity::note}) {
+      const auto count = static_cast<std::size_t>(
+          std::count_if(report_.verdict.findings.begin(), report_.verdict.findings.end(),
+                        [&](const Finding& each) { return each.severity == severity; }));
+      counts += (counts.empty() ? "" : ", ") + counted(count, std::string(nameOf(severity)));
+    }
+    out_ << counts << '\n';
+    if (report_.verdict.isStandIn)
+      out_ << "  The window was made from the script, so nothing is said about the tags and kinds "
+              "of controls; name the host's with --window.\n";
+  }
+
+  const Report& report_;
+  Colors colors_;
+  std::ostream& out_;
+  std::vector<std::string> lines_;
+};
+
+}  // namespace
+
+void writeText(const std::vector<Report>& reports, bool color, std::ostream& out) {
+  for (const Report& report : reports) TextReport(report, color, out).write();
+}
+
+}  // namespace qz::tools::check

@@ -1,0 +1,390 @@
+// SPDX-License-Identifier: MIT
+// Only what a move may have touched is read back afterwards, and only what differs between two
+// places is restored, so that a move costs hardly more than the engine's own work.
+#include "tools/check/world.hpp"
+
+#include <algorithm>
+#include <limits>
+#include <utility>
+
+#include "qz/toolkit/exception.hpp"
+#include "toolkit/memory/parts.hpp"
+
+namespace qz::tools::check {
+namespace {
+
+using drivers::MemoryDriver;
+using toolkit::memory::ButtonBehavior;
+using toolkit::memory::ControlNode;
+using toolkit::memory::MemoryButton;
+using toolkit::memory::ViewNode;
+using walkthrough::Stage;
+
+// No file can have this path, so the engine keeps the script that it has.
+constexpr const char* noFile = "/dev/null/no-script";
+
+std::unique_ptr<MemoryDriver> makeDriver(const std::string& resources) {
+  auto driver = std::make_unique<MemoryDriver>();
+  driver->setResourcePath(resources);
+  return driver;
+}
+
+std::vector<std::string> flashKeys(const Script& script) {
+  std::vector<std::string> keys;
+  for (const ScriptList& list : script.lists()) {
+    for (const Element& element : list.elements) {
+      const bool marks = element.command && element.command->target == TargetKind::button &&
+                         element.command->positionOf(ParameterType::flag);
+      const auto target = marks ? element.target(0) : std::nullopt;
+      if (target) keys.push_back(std::to_string(*target));
+    }
+  }
+  std::sort(keys.begin(), keys.end());
+  keys.erase(std::unique(keys.begin(), keys.end()), keys.end());
+  return keys;
+}
+
+LookValue noteOf(const QZ_Plist_State_Parser::Value& flag) {
+  if (!flag) return notedNothing;
+  return flag->boolValue() ? notedYes : notedNo;
+}
+
+/// Returns the seconds as the engine takes them.
+std::uint64_t wholeSeconds(double seconds) {
+  constexpr auto most = std::numeric_limits<std::uint64_t>::max();
+  return seconds >= static_cast<double>(most) ? most : static_cast<std::uint64_t>(seconds);
+}
+
+const toolkit::Subviews& controlsOf(QZ_Plist_State_Parser& engine) {
+  return engine.tutorialWindow()->contentView()->subviews();
+}
+
+}  // namespace
+
+Setting settingOf(const Script& script, const walkthrough::StagePlan& plan,
+                  std::string resources) {
+  const auto driver = makeDriver(resources);
+  Stage stage(*driver, plan);
+  Setting setting{.script = script,
+                  .plan = plan,
+                  .resources = std::move(resources),
+                  .chains = endlessChains(script.dictionary()),
+                  .flashKeys = flashKeys(script)};
+  for (const auto& view : controlsOf(stage.engine())) {
+    setting.ownTags.push_back(view->tag());
+    setting.before.push_back(ViewNode::of(view)->save());
+    setting.kinds.push_back(driver->look(view).kind);
+  }
+  return setting;
+}
+
+World::World(const Setting& setting, const PlaceFormat& format, Looks& looks)
+    : setting_(setting), format_(format), looks_(looks), place_(format.size()) {
+  build(std::nullopt);
+}
+
+World::~World() {
+  if (stage_) stage_->engine().setObserver(nullptr);
+}
+
+// A new window and engine. The parts of the look that are not controls come behind them: the
+// background, whether flashing is allowed, and the tags that flash.
+void World::build(const std::optional<std::string>& startKey) {
+  if (stage_) stage_->engine().setObserver(nullptr);
+  stage_.reset();
+  driver_ = makeDriver(setting_.resources);
+  stage_ = std::make_unique<Stage>(*driver_, setting_.plan);
+  observe();
+  auto& engine = stage_->engine();
+  engine.setPlistDictionary(setting_.script.dictionary()->copy(toolkit::Mutability::changeable));
+  // A tick changes nothing but the pressed-in look, which is not part of a place or a look.
+  engine.flashingTimer()->invalidate();
+  std::fill(place_.begin(), place_.end(), 0);
+  for (std::size_t i = 0; i < controls_.size(); ++i)
+    format_.setControl(place_.data(), i, controls_[i].state);
+  if (startKey) recorder_->begin();
+  try {
+    stage_->load(noFile, startKey);
+  } catch (const toolkit::Exception& exception) {
+    if (const auto list = setting_.script.listUnder(*startKey))
+      recorder_->note(FactKind::listRaised, static_cast<Subject>(*list), exception.reason());
+  }
+}
+
+void World::observe() {
+  controls_.clear();
+  indexOf_.clear();
+  tagCounts_.clear();
+  touched_.clear();
+  sharedTags_ = 0;
+  parts_.clear();
+  for (const auto& view : controlsOf(stage_->engine())) {
+    Control control{.node = ViewNode::of(view), .view = view};
+    control.button = dynamic_cast<MemoryButton*>(control.node.get());
+    control.state = stateOf(control);
+    control.look = looks_.valueOf({control.node->save(), false});
+    parts_.push_back(control.look);
+    indexOf_.emplace(view.pointer().get(), controls_.size());
+    if (++tagCounts_[control.state.tag] == 2) ++sharedTags_;
+    controls_.push_back(std::move(control));
+  }
+  parts_.resize(controls_.size() + 2 + setting_.flashKeys.size(), notedNothing);
+  const auto content = stage_->engine().tutorialWindow()->contentView();
+  parts_[controls_.size()] = looks_.valueOf({ViewNode::of(content)->save(), false});
+  parts_[controls_.size() + 1] = notedNo;
+  look_ = looks_.numberOf(parts_);
+  Surroundings& surroundings = *this;
+  recorder_ = std::make_shared<Recorder>(setting_.script, surroundings);
+  stage_->engine().setObserver(recorder_);
+}
+
+Arrival World::start(const std::string& key, PendingTimers& timers, std::uint8_t* place) {
+  build(key);
+  return arrive(0, timers, place);
+}
+
+std::vector<Move> World::moves(const std::uint8_t* place, const PendingTimers& pending) const {
+  std::vector<Move> moves;
+  if (format_.isOver(place)) return moves;
+  for (std::size_t i = 0; i < controls_.size(); ++i) {
+    if (!controls_[i].button) continue;
+    const ControlState state = format_.control(place, i);
+    if (!state.hidden && state.enabled) moves.push_back(static_cast<Move>(i));
+  }
+  if (!pending.empty()) moves.push_back(waitMove);
+  return moves;
+}
+
+Arrival World::make(Move move, const std::uint8_t* from, std::uint32_t look,
+                    const PendingTimers& pending, PendingTimers& timers, std::uint8_t* place) {
+  goTo(from, look);
+  recorder_->begin();
+  if (const auto endless = endlessList(move, from, pending)) {
+    recorder_->note(FactKind::endlessChain, static_cast<Subject>(*endless));
+    recorder_->end();
+    return {.move = move, .isEndless = true};
+  }
+  if (move == waitMove) {
+    wait(pending.front());
+  } else {
+    const Tag tag = controls_[move].state.tag;
+    if (sharedTags_ > 0 && tagCounts_[tag] > 1) recorder_->note(FactKind::sharedTagPressed, tag);
+    if (!setting_.script.listOfTag(tag)) {
+      recorder_->note(FactKind::noListPressed, tag);
+      if (!pending.empty()) recorder_->note(FactKind::timerLost, tag);
+    }
+    press(move);
+  }
+  return arrive(move, timers, place);
+}
+
+std::optional<std::size_t> World::listRunBy(Tag tag) const {
+  const auto list = setting_.script.listOfTag(tag);
+  if (!list || setting_.chains.loopOf.empty()) return std::nullopt;
+  return setting_.chains.loopOf.contains(setting_.script.lists()[*list].key) ? list : std::nullopt;
+}
+
+std::optional<std::size_t> World::endlessList(Move move, const std::uint8_t* from,
+                                              const PendingTimers& pending) const {
+  if (setting_.chains.loopOf.empty()) return std::nullopt;
+  if (move != waitMove) return listRunBy(format_.control(from, move).tag);
+  const auto list = setting_.script.listUnder(pending.front().key);
+  return list ? listRunBy(*setting_.script.lists()[*list].tag) : std::nullopt;
+}
+
+void World::goTo(const std::uint8_t* place, std::uint32_t look) {
+  if (format_.isOver(place_.data())) build(std::nullopt);
+  for (std::size_t i = 0; i < controls_.size(); ++i) {
+    if (!format_.differs(place, place_.data(), i)) continue;
+    Control& control = controls_[i];
+    const ControlState state = format_.control(place, i);
+    setTag(control, state.tag);
+    if (state.hidden != control.state.hidden) control.view->setHidden(state.hidden);
+    if (state.enabled != control.state.enabled) control.view->setEnabled(state.enabled);
+    control.state = state;
+    format_.setControl(place_.data(), i, state);
+  }
+  if (look != look_) restoreLook(look);
+}
+
+void World::restoreLook(std::uint32_t look) {
+  const Looks::Parts& parts = looks_.parts(look);
+  const auto restore = [&](ViewNode& node, LookValue value) {
+    SavedView saved = looks_.look(value).view;
+    const SavedView now = node.save();
+    saved.tag = now.tag;
+    saved.hidden = now.hidden;
+    saved.enabled = now.enabled;
+    node.restore(saved);
+  };
+  for (std::size_t i = 0; i < controls_.size(); ++i) {
+    if (parts[i] == parts_[i]) continue;
+    restore(*controls_[i].node, parts[i]);
+    controls_[i].look = parts[i];
+    controls_[i].hasUsersState = looks_.look(parts[i]).hasUsersState;
+  }
+  auto& engine = stage_->engine();
+  std::size_t part = controls_.size();
+  if (parts[part] != parts_[part])
+    restore(*ViewNode::of(engine.tutorialWindow()->contentView()), parts[part]);
+  ++part;
+  if (parts[part] != parts_[part]) engine.setFlashing(parts[part] == notedYes);
+  const auto flashing = engine.flashingTagIds();
+  for (const std::string& key : setting_.flashKeys) {
+    ++part;
+    if (parts[part] == parts_[part]) continue;
+    if (parts[part] == notedNothing) {
+      flashing->removeObjectForKey(key);
+    } else {
+      flashing->setObject(toolkit::Number::withBool(parts[part] == notedYes), key);
+    }
+  }
+  parts_ = parts;
+  look_ = look;
+}
+
+void World::press(std::size_t control) {
+  Control& pressed = controls_[control];
+  willTouch(pressed.view);
+  const auto behavior = pressed.button->behavior();
+  if (behavior == ButtonBehavior::toggle || behavior == ButtonBehavior::mixed) {
+    pressed.hasUsersState = true;
+    pressed.mayLookDifferent = true;
+  }
+  try {
+    pressed.button->click();
+  } catch (const toolkit::Exception& exception) {
+    if (const auto list = setting_.script.listOfTag(pressed.state.tag))
+      recorder_->note(FactKind::listRaised, static_cast<Subject>(*list), exception.reason());
+  }
+}
+
+// The others need not be set: the first that fires cancels them.
+void World::wait(const PendingTimer& first) {
+  stage_->engine().startTimerWithValue(wholeSeconds(first.seconds), first.key);
+  recorder_->begin();
+  try {
+    driver_->toolkit().advance(first.seconds);
+  } catch (const toolkit::Exception& exception) {
+    if (const auto list = setting_.script.listUnder(first.key))
+      recorder_->note(FactKind::listRaised, static_cast<Subject>(*list), exception.reason());
+  }
+}
+
+Arrival World::arrive(Move move, PendingTimers& timers, std::uint8_t* place) {
+  recorder_->end();
+  readTouched(place_.data());
+  if (recorder_->notesMayHaveChanged()) readEngine();
+  const bool isOver = stage_->engine().terminating();
+  format_.setOver(place_.data(), isOver);
+  timers = isOver ? PendingTimers() : recorder_->pending();
+  std::copy(place_.begin(), place_.end(), place);
+  Arrival arrival{.move = move, .ranList = recorder_->ranList(), .look = look_};
+  if (const auto list = recorder_->lastList()) arrival.lastList = static_cast<std::uint32_t>(*list);
+  return arrival;
+}
+
+void World::readTouched(std::uint8_t* place) {
+  if (stage_->engine().terminating()) {  // the end restores tags without looking controls up
+    for (const Control& control : controls_) willTouch(control.view);
+  }
+  bool looksElse = false;
+  for (const std::size_t index : touched_) {
+    Control& control = controls_[index];
+    control.isTouched = false;
+    const ControlState state = stateOf(control);
+    if (!(state == control.state)) {
+      setTag(control, state.tag);
+      control.state = state;
+      format_.setControl(place, index, state);
+    }
+    if (!std::exchange(control.mayLookDifferent, false)) continue;
+    control.look = looks_.valueOf({control.node->save(), control.hasUsersState});
+    looksElse |= control.look != parts_[index];
+    parts_[index] = control.look;
+  }
+  touched_.clear();
+  if (looksElse) look_ = looks_.numberOf(parts_);
+}
+
+void World::readEngine() {
+  const auto& engine = stage_->engine();
+  Looks::Parts parts = parts_;
+  std::size_t part = controls_.size();
+  const auto content = engine.tutorialWindow()->contentView();
+  parts[part] = looks_.valueOf({ViewNode::of(content)->save(), false});
+  parts[++part] = engine.flashing() ? notedYes : notedNo;
+  const auto flashing = engine.flashingTagIds();
+  for (const std::string& key : setting_.flashKeys)
+    parts[++part] = noteOf(flashing->objectForKey(key));
+  if (parts == parts_) return;
+  parts_ = parts;
+  look_ = looks_.numberOf(parts_);
+}
+
+void World::setTag(Control& control, Tag tag) {
+  if (control.state.tag == tag && control.view->tag() == tag) return;
+  if (control.state.tag != tag) {
+    if (--tagCounts_[control.state.tag] == 1) --sharedTags_;
+    if (++tagCounts_[tag] == 2) ++sharedTags_;
+    control.state.tag = tag;
+  }
+  control.view->setTag(tag);
+}
+
+ControlState World::stateOf(const Control& control) const {
+  const auto* const node = dynamic_cast<const ControlNode*>(control.node.get());
+  return {.tag = control.view->tag(),
+          .hidden = control.node->isHidden(),
+          .enabled = !node || node->isEnabled()};
+}
+
+World::Control* World::controlOf(const toolkit::Ref<toolkit::View>& view) {
+  const auto found = indexOf_.find(view.pointer().get());
+  return found == indexOf_.end() ? nullptr : &controls_[found->second];
+}
+
+void World::willTouch(const toolkit::Ref<toolkit::View>& view) {
+  Control* const control = controlOf(view);
+  if (!control || control->isTouched) return;
+  control->isTouched = true;
+  touched_.push_back(static_cast<std::size_t>(control - controls_.data()));
+}
+
+void World::tagMayHaveChanged(const toolkit::Ref<toolkit::View>& view) {
+  if (Control* const control = controlOf(view)) {
+    const ControlState before = control->state;
+    setTag(*control, view->tag());
+    if (!(before == control->state))
+      format_.setControl(place_.data(), static_cast<std::size_t>(control - controls_.data()),
+                         control->state);
+  }
+}
+
+void World::stateWasSet(const toolkit::Ref<toolkit::View>& view) {
+  if (Control* const control = controlOf(view)) control->hasUsersState = false;
+}
+
+void World::lookMayHaveChanged(const toolkit::Ref<toolkit::View>& view) {
+  if (Control* const control = controlOf(view)) control->mayLookDifferent = true;
+}
+
+std::size_t World::controlsWithTag(Tag tag) const {
+  if (sharedTags_ == 0) return 1;
+  const auto count = tagCounts_.find(tag);
+  return count == tagCounts_.end() ? 0 : count->second;
+}
+
+toolkit::Ref<toolkit::View> World::controlWithTag(Tag tag) const {
+  for (const Control& control : controls_) {
+    if (control.view->tag() == tag) return control.view;
+  }
+  return {};
+}
+
+drivers::ViewKind World::kindOf(const toolkit::Ref<toolkit::View>& view) const {
+  const auto found = indexOf_.find(view.pointer().get());
+  return found == indexOf_.end() ? drivers::ViewKind::plain : setting_.kinds[found->second];
+}
+
+}  // namespace qz::tools::check

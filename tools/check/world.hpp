@@ -1,0 +1,116 @@
+// SPDX-License-Identifier: MIT
+// A world: a toolkit, a window and an engine, which can be brought to any place directly and make
+// one move from there.
+#pragma once
+
+#include <cstdint>
+#include <memory>
+#include <optional>
+#include <string>
+#include <unordered_map>
+#include <vector>
+
+#include "drivers/memory/memory_driver.hpp"
+#include "engine/endless_chains.hpp"
+#include "tools/check/looks.hpp"
+#include "tools/check/place.hpp"
+#include "tools/check/recorder.hpp"
+#include "tools/check/script.hpp"
+#include "tools/walkthrough/stage.hpp"
+
+namespace qz::tools::check {
+
+/// What all worlds of one check share. The references must outlive the worlds.
+struct Setting {
+  const Script& script;
+  const walkthrough::StagePlan& plan;
+  std::string resources;      ///< the directory of the images
+  EndlessChains chains;       ///< of the script
+  std::vector<Tag> ownTags{};   ///< of the window's controls, before the start
+  std::vector<SavedView> before{};  ///< the window's controls, before the start
+  std::vector<drivers::ViewKind> kinds{};
+  std::vector<std::string> flashKeys;  ///< the tag keys that the script can make flash
+};
+
+/// Reads from a world of its own what all worlds share.
+Setting settingOf(const Script& script, const walkthrough::StagePlan& plan, std::string resources);
+
+/// Where a move has led.
+struct Arrival {
+  Move move = 0;
+  bool isEndless = false;  ///< the move would run lists without end, and was not made
+  bool ranList = false;
+  std::optional<std::uint32_t> lastList{};  ///< whose command ran last; absent if none ran
+  std::uint32_t look = 0;
+  std::uint64_t hash = 0;
+};
+
+class World final : private Surroundings {
+ public:
+  World(const Setting& setting, const PlaceFormat& format, Looks& looks);
+  ~World() override;
+
+  /// The walk-through starts, in a window as the host made it. Writes where that leads to `place`.
+  Arrival start(const std::string& key, PendingTimers& timers, std::uint8_t* place);
+  /// Makes a move from a place, whose pending timers are `pending`.
+  Arrival make(Move move, const std::uint8_t* from, std::uint32_t look,
+               const PendingTimers& pending, PendingTimers& timers, std::uint8_t* place);
+
+  /// Returns the moves from a place.
+  std::vector<Move> moves(const std::uint8_t* place, const PendingTimers& pending) const;
+  const std::vector<Fact>& facts() const { return recorder_->facts(); }
+
+ private:
+  struct Control {
+    std::shared_ptr<toolkit::memory::ViewNode> node;
+    toolkit::Ref<toolkit::View> view;
+    toolkit::memory::MemoryButton* button = nullptr;  // null for another kind
+    ControlState state{};
+    LookValue look = 0;
+    bool hasUsersState = false;
+    bool isTouched = false;
+    bool mayLookDifferent = false;
+  };
+
+  // Surroundings:
+  void willTouch(const toolkit::Ref<toolkit::View>& control) override;
+  void tagMayHaveChanged(const toolkit::Ref<toolkit::View>& control) override;
+  void stateWasSet(const toolkit::Ref<toolkit::View>& control) override;
+  void lookMayHaveChanged(const toolkit::Ref<toolkit::View>& control) override;
+  std::size_t controlsWithTag(Tag tag) const override;
+  toolkit::Ref<toolkit::View> controlWithTag(Tag tag) const override;
+  drivers::ViewKind kindOf(const toolkit::Ref<toolkit::View>& control) const override;
+
+  void build(const std::optional<std::string>& startKey);
+  void observe();
+  void goTo(const std::uint8_t* place, std::uint32_t look);
+  void restoreLook(std::uint32_t look);
+  void press(std::size_t control);
+  void wait(const PendingTimer& first);
+  std::optional<std::size_t> endlessList(Move move, const std::uint8_t* from,
+                                         const PendingTimers& pending) const;
+  std::optional<std::size_t> listRunBy(Tag tag) const;
+  Arrival arrive(Move move, PendingTimers& timers, std::uint8_t* place);
+  void readTouched(std::uint8_t* place);
+  void readEngine();
+  void setTag(Control& control, Tag tag);
+  ControlState stateOf(const Control& control) const;
+  Control* controlOf(const toolkit::Ref<toolkit::View>& view);
+
+  const Setting& setting_;
+  const PlaceFormat& format_;
+  Looks& looks_;
+  std::unique_ptr<drivers::MemoryDriver> driver_;
+  std::unique_ptr<walkthrough::Stage> stage_;
+  std::shared_ptr<Recorder> recorder_;
+  std::vector<Control> controls_;
+  std::unordered_map<const toolkit::View*, std::size_t> indexOf_;
+  std::vector<std::size_t> touched_;
+  std::unordered_map<Tag, std::size_t> tagCounts_;
+  std::size_t sharedTags_ = 0;        // how many tags two controls or more have
+  std::vector<std::uint8_t> place_;   // where the world is
+  Looks::Parts parts_;                // of the look that it shows
+  std::uint32_t look_ = 0;            // the number of that
+};
+
+}  // namespace qz::tools::check
