@@ -178,6 +178,15 @@ void describeCheck(Command& command) {
           "--fail-on", [options](const std::string& name) { setFailOn(*options, name); },
           "The least severity that fails: error, warning or note (default: warning)")
       .valueName("SEVERITY");
+  command
+      .repeated(
+          "--allow",
+          [options](const std::string& text) {
+            options->check.allowances.push_back(check::parseAllowance(text, "--allow"));
+            options->check.allowances.back().place.clear();
+          },
+          "Take back the findings of a code, or those of one list")
+      .valueName("CODE[=KEY]");
   command.action([options] {
     auto& check = options->check;
     if (!check.stage.window && !check.stage.assets) check.standIn = true;

@@ -18,16 +18,16 @@ struct SavedView {
   Tag tag = 0;
   bool hidden = false;
   bool enabled = true;
-  std::string toolTip;
+  std::string toolTip{};
   bool wantsLayer = false;
-  Ref<Image> layerContents;
-  AttributedString text;   ///< of a control that is not a button
-  AttributedString title;  ///< of a button
+  Ref<Image> layerContents{};
+  AttributedString text{};   ///< of a control that is not a button
+  AttributedString title{};  ///< of a button
   State state = State::off;
   bool highlighted = false;
-  std::optional<Color> background;  ///< of a button
+  std::optional<Color> background{};  ///< of a button
   BezelStyle bezel = BezelStyle::rounded;
-  Ref<Image> image;  ///< of an image view
+  Ref<Image> image{};  ///< of an image view
   ImageFrameStyle frameStyle = ImageFrameStyle::none;
   ImageScaling scaling = ImageScaling::proportionallyDown;
   ImageAlignment imageAlignment = ImageAlignment::center;

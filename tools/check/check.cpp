@@ -7,6 +7,8 @@
 #include "tools/check/conclusions.hpp"
 #include "tools/check/look_conclusions.hpp"
 #include "tools/check/reading.hpp"
+#include "tools/check/replay.hpp"
+#include "tools/check/self_check.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/text_layout.hpp"
 
@@ -27,6 +29,18 @@ std::vector<std::string> startKeysOf(const Script& script, const CheckOptions& o
   }
   if (!smallest) return {};
   return {smallest->key};
+}
+
+constexpr std::size_t longestShownPath = 100;  // moves
+
+/// Returns the allowances of the options, and of the file beside the script.
+std::vector<Allowance> allowancesFor(const InputFile& file, const CheckOptions& options) {
+  std::vector<Allowance> allowances = options.allowances;
+  const auto beside = std::filesystem::path(file.path()).replace_filename("check.allow");
+  if (!std::filesystem::exists(beside)) return allowances;
+  const auto more = readAllowances(beside.string());
+  allowances.insert(allowances.end(), more.begin(), more.end());
+  return allowances;
 }
 
 /// Sorts by place in the script; what belongs to no place comes last.
@@ -65,11 +79,22 @@ Verdict checkScript(const InputFile& file, const CheckOptions& options, const Ch
   exploration.run(options.limits, options.threads, hooks.report, hooks.isCancelled);
   verdict.explored = {exploration.places(), exploration.presses(), exploration.waits(),
                       exploration.isComplete()};
+  if (const auto difference = selfCheck(exploration)) {
+    throw Failure(ExitStatus::failed, file.path() + ": internal error: the exploration is wrong (" +
+                                          *difference + "); please report this with the script");
+  }
   auto found = conclude(exploration, verdict.findings, options.standIn);
   std::move(found.begin(), found.end(), std::back_inserter(verdict.findings));
-  found = concludeFromLooks(exploration, {options.wordsPerMinute, options.threads});
+  if (!options.standIn)
+    found = concludeFromLooks(exploration, {options.wordsPerMinute, options.threads});
+  else
+    found.clear();
   std::move(found.begin(), found.end(), std::back_inserter(verdict.findings));
+  applyAllowances(verdict.findings, allowancesFor(file, options));
   sortByPlace(verdict.findings, file);
+  for (Finding& finding : verdict.findings) {
+    if (finding.path.size() <= longestShownPath) finding.played = playPath(setting, finding.path);
+  }
   return verdict;
 }
 

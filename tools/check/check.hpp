@@ -8,6 +8,7 @@
 #include <string>
 #include <vector>
 
+#include "tools/check/allowances.hpp"
 #include "tools/check/exploration.hpp"
 #include "tools/check/finding.hpp"
 #include "tools/support/input_file.hpp"
@@ -24,6 +25,7 @@ struct CheckOptions {
   ExplorationLimits limits;
   double wordsPerMinute = 200;
   unsigned threads = 1;
+  std::vector<Allowance> allowances;  ///< in addition to the file `check.allow` beside the script
 };
 
 /// What was explored, and whether that is everything.

@@ -30,11 +30,13 @@ class Conclusions {
     endlessChains();
     raised();
     if (exploration_.isComplete()) neverRuns();
-    if (!isStandIn_) targets();
     flashing();
     if (exploration_.isComplete()) neverFires();
-    sharedTags();
-    buttonsWithoutList();
+    if (!isStandIn_) {
+      targets();
+      sharedTags();
+      buttonsWithoutList();
+    }
     auto more = concludeFromPlaces(exploration_);
     std::move(more.begin(), more.end(), std::back_inserter(findings_));
     return std::move(findings_);

@@ -37,6 +37,12 @@ using Step = std::variant<StartMove, PressMove, WaitMove>;
 /// A walk from the start.
 using Path = std::vector<Step>;
 
+/// One move of a path that was played.
+struct PlayedMove {
+  std::string words;                 ///< such as "press 2"
+  std::vector<std::string> changes;  ///< such as `5: text “Hello”`; in the order of the controls
+};
+
 /// A move out of a place, in few bytes: the press of a control by its index, or a wait.
 using Move = std::uint32_t;
 inline constexpr Move waitMove = 0xffffffff;

@@ -26,7 +26,17 @@ std::string shellWord(const std::string& text) {
 }  // namespace
 
 std::vector<ReportFormat> reportFormats() {
-  return {{"text", "for people", writeText}, {"json", "one JSON object", writeJson}};
+  return {{"text", "for people", writeText},
+          {"json", "one JSON object", writeJson},
+          {"sarif", "SARIF 2.1.0, for code hosts", writeSarif},
+          {"junit", "JUnit's XML, for CI services", writeJunit},
+          {"github", "annotations of GitHub's workflows", writeGithub}};
+}
+
+std::optional<toolkit::TextPosition> positionOf(const Finding& finding, const InputFile& file) {
+  const auto position = finding.where ? file.positionOf(finding.where) : std::nullopt;
+  const auto* const text = position ? std::get_if<toolkit::TextPosition>(&*position) : nullptr;
+  return text ? std::optional(*text) : std::nullopt;
 }
 
 std::string playArguments(const Path& path) {

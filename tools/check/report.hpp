@@ -29,7 +29,13 @@ struct ReportFormat {
 std::vector<ReportFormat> reportFormats();
 
 void writeText(const std::vector<Report>& reports, bool color, std::ostream& out);
+void writeSarif(const std::vector<Report>& reports, bool color, std::ostream& out);
+void writeJunit(const std::vector<Report>& reports, bool color, std::ostream& out);
+void writeGithub(const std::vector<Report>& reports, bool color, std::ostream& out);
 void writeJson(const std::vector<Report>& reports, bool color, std::ostream& out);
+
+/// Returns where in the script a finding is; absent for one elsewhere, or in a binary file.
+std::optional<toolkit::TextPosition> positionOf(const Finding& finding, const InputFile& file);
 
 /// Returns the arguments of `play` that walk a path, such as "--start 1 --press 2 3".
 std::string playArguments(const Path& path);

@@ -25,22 +25,16 @@ Json jsonOf(const Path& path) {
   return json;
 }
 
-void addPosition(Json& json, const Finding& finding, const InputFile& file) {
-  const auto position = finding.where ? file.positionOf(finding.where) : std::nullopt;
-  if (!position) return;
-  if (const auto* text = std::get_if<toolkit::TextPosition>(&*position)) {
-    json["line"] = text->line;
-    json["column"] = text->column;
-  }
-}
-
 Json jsonOf(const Finding& finding, const InputFile& file) {
   Json json = {{"code", finding.code},
                {"severity", nameOf(finding.severity)},
                {"message", finding.message}};
   if (finding.list) json["list"] = *finding.list;
   if (finding.element) json["element"] = *finding.element;
-  addPosition(json, finding, file);
+  if (const auto position = positionOf(finding, file)) {
+    json["line"] = position->line;
+    json["column"] = position->column;
+  }
   if (finding.tag) json["tag"] = *finding.tag;
   if (!finding.path.empty()) json["path"] = jsonOf(finding.path);
   if (!finding.otherPath.empty()) json["otherPath"] = jsonOf(finding.otherPath);

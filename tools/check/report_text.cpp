@@ -44,22 +44,25 @@ class TextReport {
 
  private:
   void writeFinding(const Finding& finding) {
-    const auto place =
-        finding.where ? report_.file.placeOf(finding.where) : report_.verdict.path;
+    const auto place = placeOf(finding);
     out_ << colors_.bold() << oneLine(place) << ": " << colors_.of(finding.severity)
          << nameOf(finding.severity) << ":" << colors_.plain() << ' ' << oneLine(finding.message)
          << " [" << finding.code << "]\n";
     writeSource(finding);
     writePath(finding.path, "see it");
+    for (const PlayedMove& move : finding.played) writeMove(move);
     writePath(finding.otherPath, "and the other");
     if (finding.places > 1) out_ << "  places: " << finding.places << " show it\n";
     if (!finding.help.empty()) out_ << "  help: " << oneLine(finding.help) << '\n';
   }
 
+  std::string placeOf(const Finding& finding) const {
+    if (!finding.place.empty()) return finding.place;
+    return finding.where ? report_.file.placeOf(finding.where) : report_.verdict.path;
+  }
+
   void writeSource(const Finding& finding) {
-    const auto position =
-        finding.where ? report_.file.positionOf(finding.where) : std::nullopt;
-    const auto* const text = position ? std::get_if<toolkit::TextPosition>(&*position) : nullptr;
+    const auto text = positionOf(finding, report_.file);
     if (!text || text->line > lines_.size()) return;
     const std::string& line = lines_[text->line - 1];
     if (displayWidth(line) > widestLine || line.find('\0') != std::string::npos) return;
@@ -71,6 +74,13 @@ class TextReport {
     if (path.empty()) return;
     out_ << "  " << title << ": qz-walkthrough play " << report_.verdict.path
          << report_.stageArguments << ' ' << playArguments(path) << '\n';
+  }
+
+  void writeMove(const PlayedMove& move) {
+    out_ << "    " << move.words << ": ";
+    for (std::size_t i = 0; i < move.changes.size(); ++i)
+      out_ << (i == 0 ? "" : "; ") << move.changes[i];
+    out_ << (move.changes.empty() ? "nothing changes" : "") << '\n';
   }
 
   void writeSummary() {

@@ -23,7 +23,9 @@ class SheetRemover final : public toolkit::SheetDelegate {
 
 StagePlan planStage(const StageOptions& options, const QZ_Plist_State_Parser::Dictionary& script,
                     const std::string& path) {
-  StagePlan plan{.hostFile = path, .sheet = options.sheet};
+  StagePlan plan;
+  plan.hostFile = path;
+  plan.sheet = options.sheet;
   if (options.assets) {
     const InputFile file(*options.assets, "a description of a window");
     checkGuiDescription(file);

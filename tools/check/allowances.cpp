@@ -1,0 +1,69 @@
+// SPDX-License-Identifier: MIT
+#include "tools/check/allowances.hpp"
+
+#include <algorithm>
+
+#include "tools/check/lines.hpp"
+#include "tools/support/failure.hpp"
+#include "tools/support/suggestions.hpp"
+#include "tools/support/text_layout.hpp"
+
+namespace qz::tools::check {
+namespace {
+
+bool matches(const Allowance& allowance, const Finding& finding) {
+  if (allowance.code != finding.code) return false;
+  if (!allowance.key) return true;
+  if (finding.list) return finding.list == allowance.key;
+  return finding.tag && std::to_string(*finding.tag) == *allowance.key;
+}
+
+std::string wordsOf(const Allowance& allowance) {
+  return allowance.code + (allowance.key ? "=" + *allowance.key : "");
+}
+
+}  // namespace
+
+Allowance parseAllowance(std::string_view text, const std::string& place) {
+  const auto equals = text.find('=');
+  Allowance allowance{.code = std::string(text.substr(0, equals)), .key = {}, .place = place};
+  if (equals != std::string_view::npos) allowance.key = std::string(text.substr(equals + 1));
+  if (codeNamed(allowance.code)) return allowance;
+  std::vector<std::string_view> names;
+  for (const Code& code : codes()) names.push_back(code.name);
+  throw Failure(ExitStatus::badInput, place + ": no finding has the code " +
+                                          quote(allowance.code) + didYouMean(allowance.code, names));
+}
+
+std::vector<Allowance> readAllowances(const std::string& path) {
+  std::vector<Allowance> allowances;
+  for (const Line& line : linesOf(path, "allowances")) {
+    const std::string place = path + ":" + std::to_string(line.number);
+    if (line.words.size() > 1)
+      throw Failure(ExitStatus::badInput, place + ": expected one CODE or CODE=KEY, then a comment "
+                                                  "that begins with #");
+    allowances.push_back(parseAllowance(line.words.front(), place));
+  }
+  return allowances;
+}
+
+void applyAllowances(std::vector<Finding>& findings, const std::vector<Allowance>& allowances) {
+  std::vector<Finding> unneeded;
+  for (const Allowance& allowance : allowances) {
+    const bool isNeeded = std::any_of(findings.begin(), findings.end(), [&](const Finding& each) {
+      return matches(allowance, each);
+    });
+    if (isNeeded || allowance.place.empty()) continue;
+    unneeded.push_back(findingOf("unneeded-allowance",
+                                 "nothing needs the allowance " + wordsOf(allowance) + " any more",
+                                 "delete the line"));
+    unneeded.back().place = allowance.place;
+  }
+  std::erase_if(findings, [&](const Finding& finding) {
+    return std::any_of(allowances.begin(), allowances.end(),
+                       [&](const Allowance& each) { return matches(each, finding); });
+  });
+  std::move(unneeded.begin(), unneeded.end(), std::back_inserter(findings));
+}
+
+}  // namespace qz::tools::check

@@ -1,0 +1,21 @@
+// SPDX-License-Identifier: MIT
+// Small text files with one statement on a line.
+#pragma once
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace qz::tools::check {
+
+struct Line {
+  std::size_t number = 0;  ///< from 1
+  std::vector<std::string> words;
+};
+
+/// Returns the lines of a file that have words, without comments, which begin with a `#`. Throws a
+/// Failure if the file cannot be read; `what` names what it should hold.
+std::vector<Line> linesOf(const std::string& path, std::string_view what);
+
+}  // namespace qz::tools::check

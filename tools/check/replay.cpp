@@ -1,0 +1,162 @@
+// SPDX-License-Identifier: MIT
+#include "tools/check/replay.hpp"
+
+#include <charconv>
+#include <sstream>
+
+#include "drivers/memory/memory_driver.hpp"
+#include "qz/toolkit/exception.hpp"
+#include "tools/support/text_layout.hpp"
+
+namespace qz::tools::check {
+namespace {
+
+using walkthrough::ControlPicture;
+using walkthrough::StepPicture;
+
+// No file can have this path, so the engine keeps the script that it has.
+constexpr const char* noFile = "/dev/null/no-script";
+
+constexpr std::size_t longestText = 60;  // characters of a text that are shown
+
+std::string shortened(const std::string& text) {
+  return quote(text.size() <= longestText ? text : text.substr(0, longestText) + "…");
+}
+
+std::string number(double value) {
+  std::ostringstream text;
+  text << value;
+  return text.str();
+}
+
+class Replay {
+ public:
+  explicit Replay(const Setting& setting) : setting_(setting) {
+    driver_.setResourcePath(setting.resources);
+    stage_.emplace(driver_, setting.plan);
+    stage_->engine().setPlistDictionary(
+        setting.script.dictionary()->copy(toolkit::Mutability::changeable));
+  }
+
+  /// Makes a move; NO if it would never end.
+  bool make(const Step& step) {
+    if (runsWithoutEnd(step)) return false;
+    try {
+      if (const auto* start = std::get_if<StartMove>(&step)) {
+        stage_->load(noFile, start->key);
+      } else if (const auto* press = std::get_if<PressMove>(&step)) {
+        driver_.click(controls()[press->control]);
+      } else {
+        driver_.advance(std::get<WaitMove>(step).seconds);
+      }
+    } catch (const toolkit::Exception&) {
+      // The host would see it; the picture shows what was done until then.
+    }
+    return true;
+  }
+
+  StepPicture picture() { return walkthrough::takePicture(driver_, stage_->engine(), ""); }
+
+ private:
+  const toolkit::Subviews& controls() {
+    return stage_->engine().tutorialWindow()->contentView()->subviews();
+  }
+
+  bool runsWithoutEnd(const Step& step) {
+    const auto& loops = setting_.chains.loopOf;
+    if (loops.empty()) return false;
+    if (const auto* start = std::get_if<StartMove>(&step)) return loops.contains(start->key);
+    if (const auto* press = std::get_if<PressMove>(&step))
+      return loops.contains(std::to_string(press->tag));
+    const auto timers = picture().timers;
+    return !timers.empty() && loops.contains(timers.front().key);
+  }
+
+  const Setting& setting_;
+  drivers::MemoryDriver driver_;
+  std::optional<walkthrough::Stage> stage_;
+};
+
+std::string wordsOf(const Step& step) {
+  if (const auto* start = std::get_if<StartMove>(&step)) return "start " + start->key;
+  if (const auto* press = std::get_if<PressMove>(&step)) return "press " + std::to_string(press->tag);
+  return "wait " + number(std::get<WaitMove>(step).seconds) + " s";
+}
+
+/// Says what differs between two pictures of one control.
+class Changes {
+ public:
+  Changes(const ControlPicture& before, const ControlPicture& after)
+      : before_(before.view), after_(after.view) {
+    if (before_.tag != after_.tag) add("tag " + std::to_string(after_.tag));
+    if (before_.hidden != after_.hidden) add(after_.hidden ? "hidden" : "shown");
+    if (before_.enabled != after_.enabled) add(after_.enabled ? "enabled" : "disabled");
+    addText("title", before_.title, after_.title);
+    addText("text", before_.text, after_.text);
+    if (before_.state != after_.state) add(after_.state == toolkit::State::on ? "on" : "off");
+    if (before_.image != after_.image) add("image " + after_.image.value_or("none"));
+    if (before_.toolTip != after_.toolTip) add("tooltip " + shortened(after_.toolTip));
+    if (before_.background != after_.background) add("another background");
+    if (before.flashing != after.flashing) add(after.flashing ? "flashes" : "flashes no more");
+  }
+
+  /// Returns a line such as "5: hidden, tag 6"; empty if nothing differs.
+  std::string line() const {
+    return words_.empty() ? words_ : std::to_string(before_.tag) + ": " + words_;
+  }
+
+ private:
+  void addText(const std::string& what, const toolkit::AttributedString& before,
+               const toolkit::AttributedString& after) {
+    if (before.string() != after.string()) {
+      add(what + " " + shortened(after.string()));
+    } else if (!(before == after)) {
+      add("another look of the " + what);
+    }
+  }
+  void add(const std::string& words) { words_ += (words_.empty() ? "" : ", ") + words; }
+
+  const drivers::ViewPicture& before_;
+  const drivers::ViewPicture& after_;
+  std::string words_;
+};
+
+std::vector<std::string> changesBetween(const StepPicture& before, const StepPicture& after) {
+  std::vector<std::string> changes;
+  for (std::size_t i = 0; i < after.controls.size() && i < before.controls.size(); ++i) {
+    std::string line = Changes(before.controls[i], after.controls[i]).line();
+    if (!line.empty()) changes.push_back(std::move(line));
+  }
+  for (const auto& timer : after.timers)
+    changes.push_back("timer " + timer.key + " in " + number(timer.timeLeft) + " s");
+  if (after.ended && !before.ended) changes.emplace_back("the end");
+  return changes;
+}
+
+}  // namespace
+
+std::vector<PlayedMove> playPath(const Setting& setting, const Path& path) {
+  Replay replay(setting);
+  std::vector<PlayedMove> played;
+  StepPicture before = replay.picture();
+  for (const Step& step : path) {
+    if (!replay.make(step)) {
+      played.push_back({wordsOf(step), {"runs lists without end"}});
+      break;
+    }
+    StepPicture after = replay.picture();
+    played.push_back({wordsOf(step), changesBetween(before, after)});
+    before = std::move(after);
+  }
+  return played;
+}
+
+walkthrough::StepPicture pictureAfter(const Setting& setting, const Path& path) {
+  Replay replay(setting);
+  for (const Step& step : path) {
+    if (!replay.make(step)) break;
+  }
+  return replay.picture();
+}
+
+}  // namespace qz::tools::check

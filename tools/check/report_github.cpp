@@ -1,0 +1,60 @@
+// SPDX-License-Identifier: MIT
+// The report as annotations of GitHub's workflows: one line for each finding.
+#include <ostream>
+
+#include "tools/check/report.hpp"
+
+namespace qz::tools::check {
+namespace {
+
+/// Returns `text` with the escapes that workflow commands need; more of them in a property.
+std::string escaped(const std::string& text, bool isProperty) {
+  std::string result;
+  for (const char c : text) {
+    switch (c) {
+      case '%':
+        result += "%25";
+        break;
+      case '\r':
+        result += "%0D";
+        break;
+      case '\n':
+        result += "%0A";
+        break;
+      case ':':
+        result += isProperty ? "%3A" : ":";
+        break;
+      case ',':
+        result += isProperty ? "%2C" : ",";
+        break;
+      default:
+        result += c;
+    }
+  }
+  return result;
+}
+
+std::string_view commandOf(Severity severity) {
+  return severity == Severity::note ? "notice" : nameOf(severity);
+}
+
+}  // namespace
+
+void writeGithub(const std::vector<Report>& reports, bool, std::ostream& out) {
+  for (const Report& report : reports) {
+    for (const Finding& finding : report.verdict.findings) {
+      out << "::" << commandOf(finding.severity)
+          << " file=" << escaped(report.verdict.path, true);
+      const auto position = positionOf(finding, report.file);
+      if (position) out << ",line=" << position->line << ",col=" << position->column;
+      out << ",title=" << escaped(finding.code, true) << "::" << escaped(finding.message, false);
+      if (!finding.path.empty())
+        out << escaped("\nqz-walkthrough play " + report.verdict.path + report.stageArguments +
+                           " " + playArguments(finding.path),
+                       false);
+      out << '\n';
+    }
+  }
+}
+
+}  // namespace qz::tools::check

@@ -1,0 +1,94 @@
+// SPDX-License-Identifier: MIT
+// The report in SARIF 2.1.0, the format in which code hosts take the results of checkers.
+#include <algorithm>
+#include <nlohmann/json.hpp>
+#include <ostream>
+
+#include "tools/check/report.hpp"
+
+namespace qz::tools::check {
+namespace {
+
+using Json = nlohmann::ordered_json;
+
+// What the hosts of such reports show at most.
+constexpr std::size_t mostResults = 5000;
+constexpr std::size_t mostSteps = 1000;
+
+Json messageOf(const std::string& text) { return {{"text", text}}; }
+
+Json locationOf(const Report& report, const Finding* finding) {
+  Json physical = {{"artifactLocation", {{"uri", report.verdict.path}}}};
+  const auto position = finding ? positionOf(*finding, report.file) : std::nullopt;
+  if (position)
+    physical["region"] = {{"startLine", position->line}, {"startColumn", position->column}};
+  return {{"physicalLocation", std::move(physical)}};
+}
+
+Json codeFlowOf(const Report& report, const Finding& finding) {
+  Json locations = Json::array();
+  const std::size_t shown = std::min(finding.path.size(), mostSteps);
+  for (std::size_t i = 0; i < shown; ++i) {
+    Json location = locationOf(report, nullptr);
+    location["message"] = messageOf(playArguments({finding.path[i]}));
+    locations.push_back({{"location", std::move(location)}});
+  }
+  return {{"threadFlows", Json::array({{{"locations", std::move(locations)}}})}};
+}
+
+Json resultOf(const Report& report, const Finding& finding) {
+  std::string message = finding.message;
+  if (finding.path.size() > mostSteps)
+    message += " (the path has " + std::to_string(finding.path.size()) + " steps; the first " +
+               std::to_string(mostSteps) + " are here)";
+  Json result = {{"ruleId", finding.code},
+                 {"level", nameOf(finding.severity)},
+                 {"message", messageOf(message)},
+                 {"locations", Json::array({locationOf(report, &finding)})}};
+  if (!finding.path.empty())
+    result["codeFlows"] = Json::array({codeFlowOf(report, finding)});
+  return result;
+}
+
+Json rules() {
+  Json rules = Json::array();
+  for (const Code& code : codes()) {
+    rules.push_back({{"id", code.name},
+                     {"shortDescription", messageOf(std::string(code.summary))},
+                     {"defaultConfiguration", {{"level", nameOf(code.severity)}}}});
+  }
+  return rules;
+}
+
+std::string notification(std::size_t total) {
+  return std::to_string(total) + " findings; the first " + std::to_string(mostResults) +
+         " are in this report, because its readers show no more";
+}
+
+}  // namespace
+
+void writeSarif(const std::vector<Report>& reports, bool, std::ostream& out) {
+  Json results = Json::array();
+  std::size_t total = 0;
+  for (const Report& report : reports) {
+    for (const Finding& finding : report.verdict.findings) {
+      if (++total <= mostResults) results.push_back(resultOf(report, finding));
+    }
+  }
+  Json invocation = {{"executionSuccessful", true}};
+  if (total > mostResults)
+    invocation["toolExecutionNotifications"] =
+        Json::array({{{"level", "warning"}, {"message", messageOf(notification(total))}}});
+  const Json run = {{"tool", {{"driver", {{"name", "qz-walkthrough check"}, {"rules", rules()}}}}},
+                    {"columnKind", "unicodeCodePoints"},
+                    {"invocations", Json::array({std::move(invocation)})},
+                    {"results", std::move(results)}};
+  const Json json = {
+      {"$schema", "https://json.schemastore.org/sarif-2.1.0.json"},
+      {"version", "2.1.0"},
+      {"runs", Json::array({run})},
+  };
+  out << json.dump(2, ' ', false, Json::error_handler_t::replace) << '\n';
+}
+
+}  // namespace qz::tools::check
