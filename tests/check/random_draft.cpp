@@ -29,9 +29,9 @@ class Filler {
   void addEnd();
   Value command(Tag list);
   bool isStep(Tag list) const;
-  Value stepOn(Tag list);
+  void addStep(Tag tag, Draft::List& list);
   bool isWanted(const Command& command, Tag list);
-  void choosePair(Tag list);
+  void chooseRetagging(Tag list);
   Tag nextTag();
   Value simpleForm(const Command& command);
   Value compoundForm(const Command& command, Tag list);
@@ -56,47 +56,49 @@ void Filler::fill() {
   addControls();
   addLists();
   for (auto& [tag, list] : draft_.lists) {
-    if (isStep(tag) && !dice_.oneIn(6)) list.push_back(stepOn(tag));
-    const std::size_t count = 1 + dice_.below(4);
+    if (isStep(tag) && !dice_.oneIn(10)) addStep(tag, list);
+    const std::size_t count = 1 + dice_.below(tag == Draft::start ? 2 : 4);
     for (std::size_t i = 0; i < count; ++i) list.push_back(command(tag));
   }
   if (bounds_.ends && !dice_.oneIn(4)) addEnd();
   if (dice_.oneIn(2)) draft_.addToStart(text("IDLE_LOOP"));
 }
 
-// The first two controls are buttons.
+// The first two controls are buttons, the third is none.
 void Filler::addControls() {
   constexpr ViewKind buttons[] = {ViewKind::button, ViewKind::button, ViewKind::toggle,
                                   ViewKind::popUpButton, ViewKind::mixed};
   constexpr ViewKind others[] = {ViewKind::textField, ViewKind::textField, ViewKind::textField,
                                  ViewKind::imageView, ViewKind::box,       ViewKind::plain};
-  const std::size_t count = dice_.oneIn(8) ? 1 : 2 + dice_.below(bounds_.controls - 1);
+  const std::size_t count =
+      dice_.oneIn(12) ? 1 + dice_.below(2) : 3 + dice_.below(bounds_.controls - 2);
   for (std::size_t i = 0; i < count; ++i) {
     const bool isTwin = bounds_.isWild && i > 0 && dice_.oneIn(5);
-    const ViewKind kind = dice_.oneIn(2) ? dice_.oneOf(others) : dice_.oneOf(buttons);
-    draft_.addControl(i == 0 ? ViewKind::button : kind, tagsOfControl(isTwin ? i - 1 : i));
+    const ViewKind kind = i == 2 || dice_.oneIn(2) ? dice_.oneOf(others) : dice_.oneOf(buttons);
+    draft_.addControl(i < 2 ? ViewKind::button : kind, tagsOfControl(isTwin ? i - 1 : i));
     auto& control = draft_.host.controls.back();
-    control.hidden = dice_.oneIn(isButton(control.kind) ? 12 : 4);
-    control.enabled = !rowOf(control.kind).isControl || !dice_.oneIn(12);
+    control.hidden = dice_.oneIn(isButton(control.kind) ? 16 : 4);
+    control.enabled = !rowOf(control.kind).isControl || !dice_.oneIn(16);
   }
 }
 
-// Most buttons get a list, then some of the tags that re-tagging gives them; the rest are helpers.
+// Two buttons get lists for their first two steps, more or less in turn; then come their third
+// steps, the other buttons and helpers.
 void Filler::addLists() {
-  const std::size_t count = bounds_.lists / 2 + dice_.below((bounds_.lists + 1) / 2);
+  const std::size_t count = bounds_.lists - 1 - dice_.below(bounds_.lists / 2);
   std::vector<Tag> buttons;
   for (const auto& control : draft_.host.controls) {
     if (isButton(control.kind)) buttons.push_back(control.tag);
   }
   Tag helpers = firstHelperList;
   for (std::size_t i = 0; i < count; ++i) {
-    if (i < buttons.size() && !dice_.oneIn(5)) {
-      draft_.lists[buttons[i]];
-    } else if (dice_.oneIn(4)) {
+    const Tag button = buttons[i / 2 % buttons.size()];
+    if (i < 4 && !dice_.oneIn(8)) {
+      draft_.lists[button + static_cast<Tag>(i % 2)];
+    } else if (dice_.oneIn(2)) {
       draft_.lists[helpers++];
     } else {
-      const Tag button = buttons[dice_.below(std::min<std::size_t>(buttons.size(), 2))];
-      draft_.lists[draft_.lists.contains(button + 1) ? button + 2 : button + 1];
+      draft_.lists[dice_.oneIn(2) ? dice_.oneOf(buttons) : button + 2];
     }
   }
 }
@@ -107,8 +109,8 @@ void Filler::addEnd() {
   auto list = std::next(draft_.lists.begin(),
                         static_cast<std::ptrdiff_t>(dice_.below(draft_.lists.size())));
   // Mostly no button that can be pressed at once.
-  while (list != draft_.lists.begin() && list->first % tagsOfControl(0) == 0 && !dice_.oneIn(4))
-    --list;
+  const bool isEarly = list->first % tagsOfControl(0) == 0;
+  if (isEarly && std::next(list) != draft_.lists.end() && !dice_.oneIn(4)) ++list;
   if (list->first == Draft::start && !isAnywhere) return;
   list->second.push_back(text("TERMINATE_PARSER"));
   if (isAnywhere) std::reverse(list->second.begin(), list->second.end());
@@ -122,24 +124,31 @@ bool Filler::isStep(Tag list) const {
          1;
 }
 
-/// Returns the command that gives the pressed button the tag of its next step.
-Value Filler::stepOn(Tag list) {
-  retagged_ = static_cast<std::size_t>(list / tagsOfControl(0) - 1);
-  tagNow_ = list;
-  return compound("SET_TAG_FOR_OBJECT_ID", {written(nextTag()), written(list)});
+/// Gives the pressed button the tag of its next step. Mostly also changes another control: steps
+/// that show and hide in turn have many places between them.
+void Filler::addStep(Tag tag, Draft::List& list) {
+  constexpr std::string_view changes[] = {"HIDE_OBJECT_WITH_ID", "SHOW_OBJECT_WITH_ID",
+                                          "DISABLE_OBJECT_WITH_ID"};
+  retagged_ = static_cast<std::size_t>(tag / tagsOfControl(0) - 1);
+  tagNow_ = tag;
+  list.push_back(compound("SET_TAG_FOR_OBJECT_ID", {written(nextTag()), written(tag)}));
+  if (dice_.oneIn(4)) return;
+  const Command& change = *compoundCommandNamed(changes[tag % ownTags]);
+  list.push_back(compound(change.name, {written(targetOf(change.target, true))}));
 }
 
 Value Filler::command(Tag list) {
   // What changes places is more interesting than what changes looks, and comes up more often.
-  constexpr std::string_view favourites[] = {
-      "HIDE_OBJECT_WITH_ID",   "SHOW_OBJECT_WITH_ID",     "ENABLE_OBJECT_WITH_ID",
-      "SET_TAG_FOR_OBJECT_ID", "DISABLE_OBJECT_WITH_ID",  "SET_TAG_FOR_OBJECT_ID",
-      "SET_TIMER_FOR_ID",      "PROCESS_COMMANDS_FOR_ID", "SET_TEXT_FOR_OBJECT_ID"};
+  constexpr std::string_view favourites[] = {"HIDE_OBJECT_WITH_ID",     "SHOW_OBJECT_WITH_ID",
+                                             "HIDE_OBJECT_WITH_ID",     "SHOW_OBJECT_WITH_ID",
+                                             "DISABLE_OBJECT_WITH_ID",  "ENABLE_OBJECT_WITH_ID",
+                                             "SET_TIMER_FOR_ID",        "SET_TIMER_FOR_ID",
+                                             "PROCESS_COMMANDS_FOR_ID", "SET_TEXT_FOR_OBJECT_ID"};
   for (;;) {
-    const Command& command = dice_.oneIn(3) ? dice_.oneOf(commandCatalogue())
+    const Command& command = dice_.oneIn(4) ? dice_.oneOf(commandCatalogue())
                                             : *compoundCommandNamed(dice_.oneOf(favourites));
     if (!isWanted(command, list)) continue;
-    choosePair(list);
+    chooseRetagging(list);
     const bool isSimple = command.form == CommandForm::simple ||
                           (command.form == CommandForm::both && dice_.oneIn(4)) ||
                           (command.form == CommandForm::none && dice_.oneIn(2));
@@ -163,13 +172,12 @@ bool Filler::takesAway(const Command& command) {
   return command.name.starts_with("HIDE") || command.name.starts_with("DISABLE");
 }
 
-// The control that a re-tagging command is about, and its tags. A button's list mostly moves the
-// button on.
-void Filler::choosePair(Tag list) {
+// The control that a re-tagging command is about, and its tags: seldom once more the list's own.
+void Filler::chooseRetagging(Tag list) {
   const auto controls = static_cast<Tag>(draft_.host.controls.size());
   const Tag owner = list / tagsOfControl(0) - 1;
   const bool isOwned = list >= tagsOfControl(0) && owner < controls;
-  const bool movesOn = isOwned && !dice_.oneIn(3);
+  const bool movesOn = isOwned && dice_.oneIn(3);
   retagged_ = movesOn ? static_cast<std::size_t>(owner) : dice_.below(draft_.host.controls.size());
   tagNow_ = movesOn ? list : ownTag(retagged_);
 }
@@ -252,7 +260,7 @@ Value Filler::flag() {
 /// first.
 Tag Filler::targetOf(TargetKind kind, bool takesAway) {
   std::size_t control = 0;
-  const bool wantsButton = dice_.oneIn(takesAway ? 5 : 3);
+  const bool wantsButton = dice_.oneIn(takesAway ? 16 : 5);
   for (int tries = 0; tries < 6; ++tries) {
     control = dice_.below(draft_.host.controls.size());
     const ViewKind found = draft_.host.controls[control].kind;
@@ -260,18 +268,19 @@ Tag Filler::targetOf(TargetKind kind, bool takesAway) {
     if (suits(kind, found) && (suitsWell || isButton(found) == wantsButton)) break;
     if (bounds_.isWild && dice_.oneIn(3)) break;
   }
-  return dice_.oneIn(5) ? ownTag(control) : draft_.host.controls[control].tag;
+  return dice_.oneIn(10) ? ownTag(control) : draft_.host.controls[control].tag;
 }
 
-/// Returns a list behind `list`, so that lists do not run each other without end; `list` itself if
-/// it is the last. A wild script runs any list, seldom one that is not there.
+/// Returns a list behind `list`, mostly a helper, so that lists do not run each other without end;
+/// `list` itself if it is the last. A wild script also runs lists in front, and missing ones.
 Tag Filler::laterList(Tag list) {
-  const auto first = draft_.lists.upper_bound(list);
-  const auto count = std::distance(first, draft_.lists.end());
   if (bounds_.isWild && dice_.oneIn(10)) return ownTag(0);
+  const auto behind = dice_.oneIn(4) ? list : std::max(list, firstHelperList - 1);
+  auto first = draft_.lists.upper_bound(behind);
+  if (first == draft_.lists.end()) first = draft_.lists.upper_bound(list);
+  const auto count = static_cast<std::size_t>(std::distance(first, draft_.lists.end()));
   if (count == 0) return list;
-  return std::next(first, static_cast<std::ptrdiff_t>(dice_.below(static_cast<std::size_t>(count))))
-      ->first;
+  return std::next(first, static_cast<std::ptrdiff_t>(dice_.below(count)))->first;
 }
 
 }  // namespace
