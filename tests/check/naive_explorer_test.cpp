@@ -185,15 +185,22 @@ TEST(NaiveExplorer, FindsTimersThatAreLost) {
   for (const Case& row : cases) expect(row);
 }
 
-// Who started a timer is not part of the place: both lists start the same timer.
-TEST(NaiveExplorer, KnowsThatATimerFiresWhoeverStartedIt) {
-  const auto found = explore(script("{1=(IDLE_LOOP); 2=((SET_TIMER_FOR_ID,5,4));"
-                                    " 3=((SET_TIMER_FOR_ID,5,4),(SET_TIMER_FOR_ID,6,5));"
-                                    " 4=(IDLE_LOOP); 5=(IDLE_LOOP);"
-                                    " 6=((SET_TIMER_FOR_ID,5,4));}"),
-                             window({{button, 2}, {button, 3}, {button, 6}}), {}, noLimit);
-  const std::vector<Finding> never = {{"never-fires", "3", 1, 5, 2}};
-  EXPECT_EQ(findingsOf(found, "never-fires"), never);
+// Who started a timer is not part of the place, nor who re-tagged a control: 2 and 3 do the same,
+// and 7 has the last word after both.
+TEST(NaiveExplorer, BlamesEveryListThatLeadsToAPlace) {
+  const auto found =
+      explore(script("{1=(IDLE_LOOP); 4=(IDLE_LOOP); 5=(TERMINATE_PARSER); 7=(IDLE_LOOP);"
+                     " 2=((SET_TIMER_FOR_ID,5,4),(SET_TAG_FOR_OBJECT_ID,10,9),"
+                     "    (PROCESS_COMMANDS_FOR_ID,7));"
+                     " 3=((SET_TIMER_FOR_ID,5,4),(SET_TAG_FOR_OBJECT_ID,10,9),"
+                     "    (SET_TIMER_FOR_ID,6,5),(SET_TIMER_FOR_ID,0,5),"
+                     "    (PROCESS_COMMANDS_FOR_ID,7));}"),
+              window({{button, 2}, {button, 3}, {button, 5}, {button, 6}, {box, 9}}), {}, noLimit);
+  EXPECT_EQ(findingsOf(found, "never-fires"), std::vector<Finding>());
+  const std::vector<Finding> lost = {{"timer-lost", "2", 0, 6, 3}, {"timer-lost", "3", 0, 6, 3}};
+  EXPECT_EQ(findingsOf(found, "timer-lost"), lost);
+  const std::vector<Finding> tags = {{"tag-left", "2", 1, 9, 3}, {"tag-left", "3", 1, 9, 3}};
+  EXPECT_EQ(findingsOf(found, "tag-left"), tags);
 }
 
 TEST(NaiveExplorer, FindsPlacesThatLookDifferent) {

@@ -64,17 +64,19 @@ void Filler::fill() {
   if (dice_.oneIn(2)) draft_.addToStart(text("IDLE_LOOP"));
 }
 
-// The first two controls are buttons, the third is none.
+// The first two controls are buttons, the next two are none.
 void Filler::addControls() {
   constexpr ViewKind buttons[] = {ViewKind::button, ViewKind::button, ViewKind::toggle,
                                   ViewKind::popUpButton, ViewKind::mixed};
   constexpr ViewKind others[] = {ViewKind::textField, ViewKind::textField, ViewKind::textField,
                                  ViewKind::imageView, ViewKind::box,       ViewKind::plain};
+  const std::size_t least = std::min<std::size_t>(bounds_.controls, 4);
   const std::size_t count =
-      dice_.oneIn(12) ? 1 + dice_.below(2) : 3 + dice_.below(bounds_.controls - 2);
+      dice_.oneIn(8) ? 1 + dice_.below(3) : least + dice_.below(bounds_.controls - least + 1);
   for (std::size_t i = 0; i < count; ++i) {
     const bool isTwin = bounds_.isWild && i > 0 && dice_.oneIn(5);
-    const ViewKind kind = i == 2 || dice_.oneIn(2) ? dice_.oneOf(others) : dice_.oneOf(buttons);
+    const ViewKind kind =
+        i == 2 || i == 3 || dice_.oneIn(2) ? dice_.oneOf(others) : dice_.oneOf(buttons);
     draft_.addControl(i < 2 ? ViewKind::button : kind, tagsOfControl(isTwin ? i - 1 : i));
     auto& control = draft_.host.controls.back();
     control.hidden = dice_.oneIn(isButton(control.kind) ? 16 : 4);
@@ -82,19 +84,20 @@ void Filler::addControls() {
   }
 }
 
-// Two buttons get lists for their first two steps, more or less in turn; then come their third
-// steps, the other buttons and helpers.
+// Two buttons get lists for two or all of their steps; then come other steps, the other buttons and
+// helpers.
 void Filler::addLists() {
-  const std::size_t count = bounds_.lists - 1 - dice_.below(bounds_.lists / 2);
+  const std::size_t steps = 2 + dice_.below(ownTags - 1);
+  const std::size_t count = bounds_.lists - 1 - dice_.below(bounds_.lists / 3);
   std::vector<Tag> buttons;
   for (const auto& control : draft_.host.controls) {
     if (isButton(control.kind)) buttons.push_back(control.tag);
   }
   Tag helpers = firstHelperList;
   for (std::size_t i = 0; i < count; ++i) {
-    const Tag button = buttons[i / 2 % buttons.size()];
-    if (i < 4 && !dice_.oneIn(8)) {
-      draft_.lists[button + static_cast<Tag>(i % 2)];
+    const Tag button = buttons[i / steps % buttons.size()];
+    if (i < 2 * steps && !dice_.oneIn(10)) {
+      draft_.lists[button + static_cast<Tag>(i % steps)];
     } else if (dice_.oneIn(2)) {
       draft_.lists[helpers++];
     } else {
@@ -133,7 +136,7 @@ void Filler::addStep(Tag tag, Draft::List& list) {
   tagNow_ = tag;
   list.push_back(compound("SET_TAG_FOR_OBJECT_ID", {written(nextTag()), written(tag)}));
   if (dice_.oneIn(4)) return;
-  const Command& change = *compoundCommandNamed(changes[tag % ownTags]);
+  const Command& change = *compoundCommandNamed(changes[tag % tagsOfControl(0)]);
   list.push_back(compound(change.name, {written(targetOf(change.target, true))}));
 }
 
@@ -260,7 +263,7 @@ Value Filler::flag() {
 /// first.
 Tag Filler::targetOf(TargetKind kind, bool takesAway) {
   std::size_t control = 0;
-  const bool wantsButton = dice_.oneIn(takesAway ? 16 : 5);
+  const bool wantsButton = dice_.oneIn(takesAway ? 16 : 8);
   for (int tries = 0; tries < 6; ++tries) {
     control = dice_.below(draft_.host.controls.size());
     const ViewKind found = draft_.host.controls[control].kind;
