@@ -30,8 +30,8 @@ TEST_P(Corpus, HasNothingThatACheckReports) {
   EXPECT_EQ(codes, std::set<std::string>()) << messagesOf(verdict);
 }
 
-INSTANTIATE_TEST_SUITE_P(All, Corpus, testing::ValuesIn(correctScripts()), [](const auto& info) {
-  std::string name = info.param.filename().string();
+INSTANTIATE_TEST_SUITE_P(All, Corpus, testing::ValuesIn(correctScripts()), [](const auto& each) {
+  std::string name = each.param.filename().string();
   std::replace(name.begin(), name.end(), '-', '_');
   return name;
 });

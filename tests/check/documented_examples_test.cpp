@@ -18,10 +18,10 @@ namespace {
 struct Example {
   std::string code;
   std::set<std::string> codes;  ///< with those that cannot be avoided
-  std::string severity;
-  std::string script;
-  std::string mended;
-  std::string window;
+  std::string severity{};
+  std::string script{};
+  std::string mended{};
+  std::string window{};
 };
 
 std::string afterWord(const std::string& line, const std::string& word) {
@@ -78,7 +78,9 @@ TEST_P(DocumentedExample, HasExactlyItsFinding) {
   const Verdict verdict = check(GetParam(), GetParam().script);
   EXPECT_EQ(codesOf(verdict), GetParam().codes) << messagesOf(verdict);
   for (const Finding& finding : verdict.findings) {
-    if (finding.code == GetParam().code) EXPECT_EQ(nameOf(finding.severity), GetParam().severity);
+    if (finding.code == GetParam().code) {
+      EXPECT_EQ(nameOf(finding.severity), GetParam().severity);
+    }
   }
 }
 
@@ -97,8 +99,8 @@ std::vector<Example> examplesOfScripts() {
 }
 
 INSTANTIATE_TEST_SUITE_P(All, DocumentedExample, testing::ValuesIn(examplesOfScripts()),
-                         [](const auto& info) {
-                           std::string name = info.param.code;
+                         [](const auto& each) {
+                           std::string name = each.param.code;
                            std::replace(name.begin(), name.end(), '-', '_');
                            return name;
                          });

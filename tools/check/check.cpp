@@ -83,7 +83,7 @@ Verdict checkScript(const InputFile& file, const CheckOptions& options, const Ch
     throw Failure(ExitStatus::failed, file.path() + ": internal error: the exploration is wrong (" +
                                           *difference + "); please report this with the script");
   }
-  auto found = conclude(exploration, verdict.findings, options.standIn);
+  auto found = conclude(exploration, verdict.findings, options.standIn, options.threads);
   std::move(found.begin(), found.end(), std::back_inserter(verdict.findings));
   if (!options.standIn)
     found = concludeFromLooks(exploration, {options.wordsPerMinute, options.threads});

@@ -4,6 +4,7 @@
 #include "tools/check/conclusions.hpp"
 
 #include <algorithm>
+#include <map>
 #include <set>
 
 #include "tools/check/place_conclusions.hpp"
@@ -14,11 +15,13 @@ namespace {
 
 class Conclusions {
  public:
-  Conclusions(const Exploration& exploration, const std::vector<Finding>& read, bool isStandIn)
+  Conclusions(Exploration& exploration, const std::vector<Finding>& read, bool isStandIn,
+              unsigned threads)
       : exploration_(exploration),
         script_(exploration.setting().script),
         facts_(exploration.facts()),
-        isStandIn_(isStandIn) {
+        isStandIn_(isStandIn),
+        threads_(threads) {
     for (const Finding& finding : read) {
       if (finding.severity == Severity::error && finding.list)
         read_.emplace(*finding.list, finding.element.value_or(noElement));
@@ -36,8 +39,9 @@ class Conclusions {
       targets();
       sharedTags();
       buttonsWithoutList();
+      lostTimers();
     }
-    auto more = concludeFromPlaces(exploration_);
+    auto more = concludeFromPlaces(exploration_, threads_);
     std::move(more.begin(), more.end(), std::back_inserter(findings_));
     return std::move(findings_);
   }
@@ -50,11 +54,27 @@ class Conclusions {
     for (const auto& [subject, entry] : facts_.all(FactKind::endlessChain)) {
       const ScriptList& list = script_.lists()[static_cast<std::size_t>(subject)];
       const std::string& loop = chains.loops[chains.loopOf.find(list.key)->second];
-      addForList(list, entry,
+      addChainElement(list, entry,
                  findingOf("endless-chain",
                            "list " + quote(list.key) + " runs lists without end (" + loop +
                                "); the host's program crashes",
                            "take out one PROCESS_COMMANDS_FOR_ID of the loop"));
+    }
+  }
+
+  /// Adds a finding at the element that runs a list which is running already.
+  void addChainElement(const ScriptList& start, const FactTable::Entry& entry, Finding finding) {
+    std::set<std::string> running;
+    const ScriptList* list = &start;
+    for (std::size_t i = 0; i < list->elements.size(); ++i) {
+      running.insert(list->key);
+      const auto next = chainTarget(list->elements[i].value, list->key);
+      if (!next || !exploration_.setting().chains.loopOf.contains(*next)) continue;
+      if (running.contains(*next))
+        return addForElement(static_cast<Subject>(list->firstElement + i), entry,
+                             std::move(finding));
+      list = &script_.lists()[*script_.listUnder(*next)];
+      i = static_cast<std::size_t>(-1);  // from its first element
     }
   }
 
@@ -150,7 +170,8 @@ class Conclusions {
 
   void neverFires() {
     for (const auto& [subject, entry] : facts_.all(FactKind::timerStarted)) {
-      if (facts_.has(FactKind::timerFires, subject)) continue;
+      if (facts_.has(FactKind::timerFires, subject) || !facts_.has(FactKind::timerBeaten, subject))
+        continue;
       const auto [list, element] = placeOf(subject);
       if (useless_.contains({list->key, element})) continue;
       addForElement(subject, entry,
@@ -179,19 +200,60 @@ class Conclusions {
 
   void buttonsWithoutList() {
     for (const auto& [subject, entry] : facts_.all(FactKind::noListPressed)) {
-      addForTag(subject, entry,
+      FactTable::Entry place = entry;
+      place.isPlace = true;
+      addForTag(subject, place,
                 findingOf("no-list",
                           "a user can press the button with the tag " + std::to_string(subject) +
                               ", but there is no list under that tag, so nothing happens",
                           "add a list, or hide or disable the button"));
     }
-    for (const auto& [subject, entry] : facts_.all(FactKind::timerLost)) {
-      addForTag(subject, entry,
-                findingOf("timer-lost",
-                          "a press of the button with the tag " + std::to_string(subject) +
-                              ", which has no list, cancels the pending timer",
-                          "hide or disable the button while the timer runs"));
+  }
+
+  void lostTimers() {
+    std::map<std::pair<std::uint32_t, Tag>, Finding> found;
+    for (const auto& [start, occasion] : exploration_.timerStarts()) {
+      const auto [place, element] = start;
+      for (const PressMove& press : pressesWithoutList(place)) {
+        Path path = exploration_.path(occasion);
+        path.emplace_back(press);
+        Finding& finding = found[{element, press.tag}];
+        ++finding.places;
+        if (finding.places == 1 || path.size() < finding.path.size()) finding.path = path;
+      }
     }
+    for (auto& [cause, lost] : found) {
+      const auto [list, element] = placeOf(cause.first);
+      Finding finding =
+          findingOf("timer-lost",
+                    "a press of the button with the tag " + std::to_string(cause.second) +
+                        ", which has no list, cancels the timer that " + nameOf(cause.first) +
+                        " starts",
+                    "hide or disable the button while the timer runs");
+      finding.list = list->key;
+      finding.element = element;
+      finding.where = list->elements[element].value;
+      finding.tag = cause.second;
+      finding.path = std::move(lost.path);
+      finding.places = lost.places;
+      findings_.push_back(std::move(finding));
+    }
+  }
+
+  /// Returns the presses at a place that run nothing.
+  std::vector<PressMove> pressesWithoutList(std::uint32_t place) const {
+    std::vector<PressMove> presses;
+    const auto& format = exploration_.format();
+    const auto* const bytes = exploration_.place(place);
+    if (format.isOver(bytes)) return presses;
+    for (std::size_t i = 0; i < format.controls(); ++i) {
+      const ControlState state = format.control(bytes, i);
+      const bool isSeen = !state.hidden && state.enabled;
+      if (isSeen && drivers::isButton(exploration_.setting().kinds[i]) &&
+          !script_.listOfTag(state.tag))
+        presses.push_back({.tag = state.tag, .control = i});
+    }
+    return presses;
   }
 
   bool wasRead(Subject subject) const {
@@ -225,6 +287,7 @@ class Conclusions {
     finding.list = list->key;
     finding.element = element;
     finding.where = list->elements[element].value;
+    if (!finding.tag) finding.tag = list->elements[element].target(list->tag.value_or(0));
     add(entry, std::move(finding));
   }
   void addForList(const ScriptList& list, const FactTable::Entry& entry, Finding finding) {
@@ -237,15 +300,17 @@ class Conclusions {
     add(entry, std::move(finding));
   }
   void add(const FactTable::Entry& entry, Finding finding) {
-    finding.path = exploration_.path(entry.first);
+    finding.path =
+        entry.isPlace ? exploration_.path(entry.first.visit) : exploration_.path(entry.first);
     finding.places = std::max<std::size_t>(entry.places, 1);
     findings_.push_back(std::move(finding));
   }
 
-  const Exploration& exploration_;
+  Exploration& exploration_;
   const Script& script_;
   const FactTable& facts_;
   bool isStandIn_;
+  unsigned threads_;
   std::set<std::pair<std::string, std::size_t>> read_;     // what reading calls an error
   std::set<std::pair<std::string, std::size_t>> useless_;  // elements with a useless delay
   std::vector<Finding> findings_;
@@ -253,9 +318,9 @@ class Conclusions {
 
 }  // namespace
 
-std::vector<Finding> conclude(const Exploration& exploration, const std::vector<Finding>& read,
-                              bool isStandIn) {
-  return Conclusions(exploration, read, isStandIn).findings();
+std::vector<Finding> conclude(Exploration& exploration, const std::vector<Finding>& read,
+                              bool isStandIn, unsigned threads) {
+  return Conclusions(exploration, read, isStandIn, threads).findings();
 }
 
 }  // namespace qz::tools::check

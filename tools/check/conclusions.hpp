@@ -11,7 +11,7 @@ namespace qz::tools::check {
 
 /// Returns the findings that need exploring. `read` is what was read off the script: what it says
 /// is not said again. If there is no host's window (`isStandIn`), says nothing about targets.
-std::vector<Finding> conclude(const Exploration& exploration, const std::vector<Finding>& read,
-                              bool isStandIn);
+std::vector<Finding> conclude(Exploration& exploration, const std::vector<Finding>& read,
+                              bool isStandIn, unsigned threads);
 
 }  // namespace qz::tools::check

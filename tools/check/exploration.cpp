@@ -61,6 +61,7 @@ void Exploration::run(const ExplorationLimits& limits, unsigned threads,
 void Exploration::start() {
   worlds_.push_back(std::make_unique<World>(setting_, format_, looks_));
   World& world = *worlds_.front();
+  firstLook_ = world.look();
   for (std::size_t i = 0; i < startKeys_.size(); ++i) {
     const Occasion occasion{noVisit, static_cast<Move>(i)};
     std::vector<std::uint8_t> place(format_.size());
@@ -72,7 +73,9 @@ void Exploration::start() {
     }
     const Arrival arrival = world.start(startKeys_[i], timers, place.data());
     for (const Fact& fact : world.facts()) facts_.add(fact, occasion, noPlace);
-    arrive(timers, std::move(place),
+    starts_.push_back(arrival);
+    starts_.back().move = occasion.move;
+    arrive(arrival, timers, std::move(place),
            {.look = arrival.look,
             .parent = noVisit,
             .move = occasion.move,
@@ -139,7 +142,7 @@ void Exploration::merge(const Expansion& expansion) {
     runsList |= arrival.ranList || arrival.isEndless;
     if (arrival.isEndless) continue;
     const auto* const bytes = expansion.places.data() + i * format_.size();
-    targets.push_back(arrive(timers, {bytes, bytes + format_.size()},
+    targets.push_back(arrive(arrival, timers, {bytes, bytes + format_.size()},
                              {.look = arrival.look,
                               .parent = expansion.visit,
                               .move = arrival.move,
@@ -150,15 +153,17 @@ void Exploration::merge(const Expansion& expansion) {
   addEdges(targets);
 }
 
-std::uint32_t Exploration::arrive(const PendingTimers& timers, std::vector<std::uint8_t> place,
-                                  Visit visit) {
+std::uint32_t Exploration::arrive(const Arrival& arrival, const PendingTimers& timers,
+                                  std::vector<std::uint8_t> place, Visit visit) {
   format_.setTimers(place.data(), numberOf(timers));
   const std::uint64_t hash = PlaceSet::hashOf(place.data(), place.size());
   const auto known = set_.find(place.data(), hash);
   visit.place = known ? *known : set_.add(place.data(), hash);
   if (!known) firstVisit_.push_back(static_cast<std::uint32_t>(visits_.size()));
   if (isNews(visit.place, visit) || !known) visits_.push_back(visit);
-  if (visit.parent != noVisit) followTexts(visits_[visit.parent], visit);
+  followTexts(visit);
+  for (const std::uint32_t element : arrival.timerElements)
+    timerStarts_.try_emplace({visit.place, element}, Occasion{visit.parent, visit.move});
   return visit.place;
 }
 
@@ -210,17 +215,18 @@ std::vector<std::size_t> Exploration::partsWithOtherText(std::uint32_t before,
   return found;
 }
 
-void Exploration::followTexts(const Visit& from, const Visit& to) {
-  const auto changed = partsWithOtherText(from.look, to.look);
+void Exploration::followTexts(const Visit& to) {
+  const std::uint32_t before = to.parent == noVisit ? firstLook_ : visits_[to.parent].look;
+  const auto changed = partsWithOtherText(before, to.look);
   if (changed.empty()) return;
-  const Looks::Parts& old = looks_.parts(from.look);
+  const Looks::Parts& old = looks_.parts(before);
   const Looks::Parts& now = looks_.parts(to.look);
   const auto isShown = [&](std::uint32_t place, std::size_t part) {
     return !format_.control(set_.place(place), part).hidden;
   };
   for (const std::size_t part : changed) {
-    if (to.move == waitMove && isShown(from.place, part))
-      replacedTexts_.insert({from.place, part, old[part]});
+    if (to.parent != noVisit && to.move == waitMove && isShown(visits_[to.parent].place, part))
+      replacedTexts_.insert({visits_[to.parent].place, part, old[part]});
     if (!timers(to.place).empty() && isShown(to.place, part))
       freshTexts_.try_emplace({to.place, part, now[part]},
                               ReplacedText{.place = to.place,

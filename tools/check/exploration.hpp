@@ -106,6 +106,14 @@ class Exploration {
   /// Returns the places that look different depending on the way to them. Makes every move once
   /// more if there may be such places.
   std::vector<LookDifference> lookDifferences(unsigned threads);
+  /// Makes every move once more, starts included, and tells `see` where each leads.
+  using See = std::function<void(const Occasion& occasion, const Arrival& arrival,
+                                 std::uint32_t lastList, std::uint32_t place)>;
+  void makeAllMoves(unsigned threads, const See& see);
+  /// Returns when each element first left a timer pending at each place.
+  const std::map<std::pair<std::uint32_t, std::uint32_t>, Occasion>& timerStarts() const {
+    return timerStarts_;
+  }
   /// Returns the texts that a timer replaces, with the occasions on which they appeared just before
   /// it started. For each text, control and place, only the first occasion.
   std::vector<ReplacedText> replacedTexts() const;
@@ -119,12 +127,14 @@ class Exploration {
   void expandAll(std::vector<Expansion>& expansions, std::uint32_t first, unsigned threads);
   void expand(World& world, Expansion& expansion) const;
   void merge(const Expansion& expansion);
-  std::uint32_t arrive(const PendingTimers& timers, std::vector<std::uint8_t> place, Visit visit);
+  std::uint32_t arrive(const Arrival& arrival, const PendingTimers& timers,
+                       std::vector<std::uint8_t> place, Visit visit);
   bool isNews(std::uint32_t place, const Visit& visit);
   bool hasNewPart(std::uint32_t place, const Visit& visit);
   bool hasNewList(std::uint32_t place, const Visit& visit);
-  void followTexts(const Visit& from, const Visit& to);
+  void followTexts(const Visit& to);
   std::vector<std::size_t> partsWithOtherText(std::uint32_t before, std::uint32_t after) const;
+  void seeExpansion(const Expansion& expansion, const See& see);
   std::optional<std::uint32_t> knownPlace(const Expansion& expansion, std::size_t move);
   std::uint32_t numberOf(const PendingTimers& timers);
   Step step(const Visit& visit) const;
@@ -152,6 +162,9 @@ class Exploration {
   using TextPlace = std::tuple<std::uint32_t, std::size_t, LookValue>;
   std::map<TextPlace, ReplacedText> freshTexts_;
   std::set<TextPlace> replacedTexts_;
+  std::map<std::pair<std::uint32_t, std::uint32_t>, Occasion> timerStarts_;  // place, element
+  std::vector<Arrival> starts_;
+  std::uint32_t firstLook_ = 0;  // before the start
   std::size_t presses_ = 0;
   std::size_t waits_ = 0;
   bool complete_ = false;

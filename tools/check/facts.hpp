@@ -26,6 +26,7 @@ enum class FactKind : std::uint8_t {
   flashRefused,
   timerStarted,
   timerFires,      ///< the timer that the element started is the first to fire after a move
+  timerBeaten,     ///< another timer replaced it, or fires before it
   sharedTagUsed,   ///< two controls had the tag that it names
   // of a list
   listRan,
@@ -33,7 +34,6 @@ enum class FactKind : std::uint8_t {
   endlessChain,    ///< a move would run it, and it never ends
   // of a tag
   noListPressed,    ///< a button with the tag can be pressed, and no list is under the tag
-  timerLost,        ///< the press of such a button cancels a timer
   sharedTagPressed  ///< a button is pressed while another control has its tag
 };
 
@@ -64,6 +64,7 @@ class FactTable {
     Occasion first;
     std::string detail;
     std::size_t places = 0;
+    bool isPlace = false;  ///< the place before the move shows it already
     std::uint32_t lastPlace = noPlace;
   };
 

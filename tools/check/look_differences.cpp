@@ -87,24 +87,40 @@ std::vector<std::size_t> Exploration::partsWithSeveralLooks(std::uint32_t place)
 std::vector<LookDifference> Exploration::lookDifferences(unsigned threads) {
   if (furtherLooks_.empty()) return {};
   Comparison comparison(*this);
+  makeAllMoves(threads, [&](const Occasion& occasion, const Arrival& arrival,
+                            std::uint32_t lastList, std::uint32_t place) {
+    comparison.see(place, lastList, arrival.look, occasion);
+  });
+  return comparison.take();
+}
+
+void Exploration::makeAllMoves(unsigned threads, const See& see) {
+  for (std::uint32_t number = 0; number < visits_.size(); ++number) {
+    const Visit& visit = visits_[number];
+    if (visit.parent != noVisit) continue;
+    for (const Arrival& start : starts_) {
+      if (start.move == visit.move)
+        see({noVisit, visit.move}, start, visit.lastList, visit.place);
+    }
+  }
   std::vector<Expansion> expansions;
   for (std::uint32_t next = 0; next < visits_.size();) {
     expansions.resize(std::min<std::size_t>(Expansion::roundSize, visits_.size() - next));
     expandAll(expansions, next, threads);
-    for (const Expansion& expansion : expansions) {
-      const Visit& visit = visits_[next++];
-      if (visit.parent == noVisit)
-        comparison.see(visit.place, visit.lastList, visit.look, {noVisit, visit.move});
-      for (std::size_t i = 0; i < expansion.found.size(); ++i) {
-        const auto& [arrival, timers, fact] = expansion.found[i];
-        if (arrival.isEndless) continue;
-        if (const auto place = knownPlace(expansion, i))
-          comparison.see(*place, arrival.lastList.value_or(visit.lastList), arrival.look,
-                         {expansion.visit, arrival.move});
-      }
-    }
+    next += static_cast<std::uint32_t>(expansions.size());
+    for (const Expansion& expansion : expansions) seeExpansion(expansion, see);
   }
-  return comparison.take();
+}
+
+void Exploration::seeExpansion(const Expansion& expansion, const See& see) {
+  const Visit& visit = visits_[expansion.visit];
+  for (std::size_t i = 0; i < expansion.found.size(); ++i) {
+    const Arrival& arrival = expansion.found[i].arrival;
+    if (arrival.isEndless) continue;
+    if (const auto place = knownPlace(expansion, i))
+      see({expansion.visit, arrival.move}, arrival, arrival.lastList.value_or(visit.lastList),
+          *place);
+  }
 }
 
 }  // namespace qz::tools::check

@@ -2,6 +2,7 @@
 #include "tools/check/place_conclusions.hpp"
 
 #include <algorithm>
+#include <compare>
 #include <map>
 #include <set>
 
@@ -13,8 +14,8 @@ namespace {
 
 class PlaceConclusions {
  public:
-  explicit PlaceConclusions(const Exploration& exploration)
-      : exploration_(exploration), script_(exploration.setting().script) {}
+  PlaceConclusions(Exploration& exploration, unsigned threads)
+      : exploration_(exploration), threads_(threads), script_(exploration.setting().script) {}
 
   std::vector<Finding> findings() {
     circles_ = circlesOf(exploration_);
@@ -30,29 +31,65 @@ class PlaceConclusions {
   }
 
  private:
-  // A place is reported where the way into the dead end begins: its places differ only in what the
-  // presses that run nothing have cancelled.
+  /// Who is to blame for a move: the list that it ran, else the button that was pressed.
+  struct Blame {
+    std::optional<std::uint32_t> list;
+    std::optional<Tag> tag;
+    friend auto operator<=>(const Blame&, const Blame&) = default;
+  };
+
+  // One finding for each list, or button without a list, that leads into a dead end; its other
+  // places differ only in what presses without a list have cancelled.
   void deadEnds() {
-    std::set<std::uint32_t> dead;
+    std::vector<bool> isDead(exploration_.places());
+    bool isAny = false;
     for (const PlaceCircle& circle : circles_) {
-      if (!circle.reachesList && !circle.isEnd)
-        dead.insert(circle.places.begin(), circle.places.end());
+      if (circle.reachesList || circle.isEnd) continue;
+      isAny = true;
+      for (const std::uint32_t place : circle.places) isDead[place] = true;
     }
-    std::map<std::uint32_t, std::vector<std::uint32_t>> byList;  // first visits of entries
-    for (const std::uint32_t place : dead) {
-      const std::uint32_t number = exploration_.firstVisit(place);
-      const Visit& visit = exploration_.visits()[number];
-      if (visit.parent == noVisit || !dead.contains(exploration_.visits()[visit.parent].place))
-        byList[visit.lastList].push_back(number);
-    }
-    for (const auto& [list, visits] : byList) {
+    if (!isAny) return;
+    std::map<Blame, std::pair<Occasion, std::set<std::uint32_t>>> entries;
+    exploration_.makeAllMoves(threads_, [&](const Occasion& occasion, const Arrival& arrival,
+                                            std::uint32_t, std::uint32_t place) {
+      const bool isFromDead =
+          occasion.visit != noVisit && isDead[exploration_.visits()[occasion.visit].place];
+      if (!isDead[place] || isFromDead) return;
+      auto& entry = entries.try_emplace(blameOf(occasion, arrival.firstList), occasion,
+                                        std::set<std::uint32_t>()).first->second;
+      entry.second.insert(place);
+    });
+    for (const auto& [blame, entry] : entries) {
       add(findingOf("dead-end",
                     "after this nothing that the user does, and no timer, runs a list again, but the "
                     "walk-through has not ended",
                     "show or enable a button that has a list, start a timer, or end with "
                     "TERMINATE_PARSER"),
-          list, visits.front(), visits.size());
+          blame, exploration_.path(entry.first), entry.second.size());
     }
+  }
+
+  Blame blameOf(const Occasion& occasion, std::optional<std::uint32_t> list) const {
+    if (list || occasion.visit == noVisit || occasion.move == waitMove) return {list, {}};
+    const auto* const place =
+        exploration_.place(exploration_.visits()[occasion.visit].place);
+    return {{}, exploration_.format().control(place, occasion.move).tag};
+  }
+
+  /// The same for the last move of a path.
+  Blame blameOf(const Visit& visit) const {
+    const Occasion occasion{visit.parent, visit.move};
+    std::optional<std::size_t> list;
+    if (visit.parent == noVisit) {
+      list = script_.listUnder(exploration_.startKeys()[visit.move]);
+    } else if (visit.move == waitMove) {
+      list = script_.listUnder(
+          exploration_.timers(exploration_.visits()[visit.parent].place).front().key);
+    } else {
+      list = script_.listOfTag(*blameOf(occasion, std::nullopt).tag);
+    }
+    return blameOf(occasion,
+                   list ? std::optional(static_cast<std::uint32_t>(*list)) : std::nullopt);
   }
 
   void traps() {
@@ -63,7 +100,7 @@ class PlaceConclusions {
                     "from here the end of the walk-through cannot be reached any more, whatever the "
                     "user does",
                     "lead a button or a timer back to a list from which the end can be reached"),
-          exploration_.visits()[visit].lastList, visit, circle.places.size());
+          blameOf(exploration_.visits()[visit]), exploration_.path(visit), circle.places.size());
     }
   }
 
@@ -80,17 +117,19 @@ class PlaceConclusions {
     return first;
   }
 
-  void add(Finding finding, std::uint32_t list, std::uint32_t visit, std::size_t places) {
-    if (list != noList) {
-      finding.list = script_.lists()[list].key;
-      finding.where = script_.lists()[list].keyValue;
+  void add(Finding finding, const Blame& blame, Path path, std::size_t places) {
+    if (blame.list) {
+      finding.list = script_.lists()[*blame.list].key;
+      finding.where = script_.lists()[*blame.list].keyValue;
     }
-    finding.path = exploration_.path(visit);
+    finding.tag = blame.tag;
+    finding.path = std::move(path);
     finding.places = places;
     findings_.push_back(std::move(finding));
   }
 
-  const Exploration& exploration_;
+  Exploration& exploration_;
+  unsigned threads_;
   const Script& script_;
   std::vector<PlaceCircle> circles_;
   std::vector<Finding> findings_;
@@ -98,9 +137,9 @@ class PlaceConclusions {
 
 }  // namespace
 
-std::vector<Finding> concludeFromPlaces(const Exploration& exploration) {
+std::vector<Finding> concludeFromPlaces(Exploration& exploration, unsigned threads) {
   if (!exploration.isComplete()) return {};
-  return PlaceConclusions(exploration).findings();
+  return PlaceConclusions(exploration, threads).findings();
 }
 
 }  // namespace qz::tools::check

@@ -9,6 +9,6 @@
 
 namespace qz::tools::check {
 
-std::vector<Finding> concludeFromPlaces(const Exploration& exploration);
+std::vector<Finding> concludeFromPlaces(Exploration& exploration, unsigned threads);
 
 }  // namespace qz::tools::check

@@ -61,8 +61,8 @@ bool changesNotes(const Command& command) {
                                                  hasParameter(command, ParameterType::imageName)));
 }
 
-// The delay of such a timer is an address, which differs from run to run.
-constexpr double uselessDelay = 1e15;
+// The longest time that a script can write, in seconds, rounded up as the engine does.
+constexpr double longestDelay = 2147483648.0;
 
 }  // namespace
 
@@ -76,6 +76,8 @@ void Recorder::begin() {
   running_.clear();
   timers_.clear();
   facts_.clear();
+  firstList_.reset();
+  endList_.reset();
   lastList_.reset();
   ranList_ = false;
   notesMayHaveChanged_ = false;
@@ -83,11 +85,25 @@ void Recorder::begin() {
 
 void Recorder::end() {
   isRecording_ = false;
+  // Those that never fire have no order, and are sorted by key.
   std::stable_sort(timers_.begin(), timers_.end(), [](const Timer& a, const Timer& b) {
-    return a.timer.seconds < b.timer.seconds;
+    if (a.timer.seconds != b.timer.seconds) return a.timer.seconds < b.timer.seconds;
+    return a.timer.seconds == never && a.timer.key < b.timer.key;
   });
-  if (!timers_.empty() && timers_.front().element)
-    noteOnce(FactKind::timerFires, *timers_.front().element);
+  bool isFirst = true;
+  for (const Timer& timer : timers_) {
+    if (timer.timer.seconds != never && timer.element)
+      noteOnce(isFirst ? FactKind::timerFires : FactKind::timerBeaten, *timer.element);
+    isFirst = false;
+  }
+}
+
+std::vector<std::uint32_t> Recorder::pendingElements() const {
+  std::vector<std::uint32_t> elements;
+  for (const Timer& timer : timers_) {
+    if (timer.element) elements.push_back(static_cast<std::uint32_t>(*timer.element));
+  }
+  return elements;
 }
 
 PendingTimers Recorder::pending() const {
@@ -113,8 +129,8 @@ void Recorder::listWillRun(const Value& list, const ObjectId& id) {
   running_.push_back({.list = script_.runningList(list, tag), .id = tag});
   if (!running_.back().list) return;
   ranList_ = true;
-  lastList_ = running_.back().list;
-  noteOnce(FactKind::listRan, *lastList_);
+  if (!firstList_) firstList_ = running_.back().list;
+  noteOnce(FactKind::listRan, *running_.back().list);
 }
 
 void Recorder::listDidRun(const Value&, const ObjectId&) {
@@ -142,6 +158,8 @@ void Recorder::commandDidRun(const Value&, std::size_t, bool result) {
   const Running& running = running_.back();
   lastList_ = running.list;
   if (!running.command->command) return;
+  if (!endList_ && running.command->command->flow == CommandFlow::endsWalkThrough)
+    endList_ = running.list;
   noteTarget(running);
   if (!marksFlashing(*running.command->command)) return;
   if (result) {
@@ -161,8 +179,9 @@ void Recorder::commandRaised(const Value&, std::size_t, const toolkit::Exception
 
 void Recorder::noteTarget(const Running& running) {
   const Command& command = *running.command->command;
-  if (!running.target) return;
-  const auto control = running.found ? *running.found : surroundings_.controlWithTag(*running.target);
+  // A mark for flashing is for whatever control has the tag later: it looks none up.
+  if (!running.target || !running.found) return;
+  const auto& control = *running.found;
   const auto subject = static_cast<Subject>(running.element);
   if (control) {
     noteOnce(FactKind::targetFound, running.element);
@@ -191,13 +210,18 @@ void Recorder::controlSought(Tag tag, const toolkit::Ref<toolkit::View>& control
 
 void Recorder::timerSet(std::string_view key, double seconds) {
   if (!isRecording_) return;
+  for (const Timer& replaced : timers_) {
+    if (replaced.timer.key == key && replaced.element)
+      noteOnce(FactKind::timerBeaten, *replaced.element);
+  }
   forget(key);
   std::optional<std::size_t> element;
+  if (seconds > longestDelay) seconds = never;
   const Running* const running = running_.empty() ? nullptr : &running_.back();
   if (running && running->list) {
     element = running->element;
-    noteOnce(FactKind::timerStarted, *element);
-    if (hasParameter(*running->command->command, ParameterType::anything)) seconds = uselessDelay;
+    if (hasParameter(*running->command->command, ParameterType::anything)) seconds = never;
+    if (seconds != never) noteOnce(FactKind::timerStarted, *element);
   }
   timers_.push_back({{std::string(key), seconds}, element});
 }

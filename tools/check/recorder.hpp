@@ -3,6 +3,7 @@
 #pragma once
 
 #include <cstdint>
+#include <limits>
 #include <optional>
 #include <string>
 #include <vector>
@@ -14,6 +15,10 @@
 #include "tools/check/script.hpp"
 
 namespace qz::tools::check {
+
+/// What stands for the time left of a timer that fires in no user's lifetime: its delay was negative
+/// or an address, and is millions of years or more.
+inline constexpr double never = std::numeric_limits<double>::infinity();
 
 /// What the recorder asks of the world in which the engine works.
 class Surroundings {
@@ -28,7 +33,6 @@ class Surroundings {
   virtual void stateWasSet(const toolkit::Ref<toolkit::View>& control) = 0;
   virtual void lookMayHaveChanged(const toolkit::Ref<toolkit::View>& control) = 0;
   virtual std::size_t controlsWithTag(Tag tag) const = 0;
-  virtual toolkit::Ref<toolkit::View> controlWithTag(Tag tag) const = 0;
   virtual drivers::ViewKind kindOf(const toolkit::Ref<toolkit::View>& control) const = 0;
 };
 
@@ -47,6 +51,12 @@ class Recorder final : public Observer {
   const std::vector<Fact>& facts() const { return facts_; }
   /// Returns the timers that are pending, in the order of their firing.
   PendingTimers pending() const;
+  /// Returns the elements that started those timers.
+  std::vector<std::uint32_t> pendingElements() const;
+  /// Returns the index of the list that the move ran first; absent if it ran none.
+  std::optional<std::size_t> firstList() const { return firstList_; }
+  /// Returns the index of the list that ended the walk-through; absent if none did.
+  std::optional<std::size_t> endList() const { return endList_; }
   /// Returns the index of the list whose command ran last; absent if no command ran.
   std::optional<std::size_t> lastList() const { return lastList_; }
   /// Whether a command ran that can change the background, or what the engine notes of flashing.
@@ -91,6 +101,8 @@ class Recorder final : public Observer {
   std::vector<Timer> timers_;
   std::vector<Fact> facts_;
   std::vector<std::uint32_t> noted_;  // bits of FactKind, by the subject
+  std::optional<std::size_t> firstList_;
+  std::optional<std::size_t> endList_;
   std::optional<std::size_t> lastList_;
   bool ranList_ = false;
   bool notesMayHaveChanged_ = false;

@@ -14,9 +14,6 @@ namespace {
 using walkthrough::ControlPicture;
 using walkthrough::StepPicture;
 
-// No file can have this path, so the engine keeps the script that it has.
-constexpr const char* noFile = "/dev/null/no-script";
-
 constexpr std::size_t longestText = 60;  // characters of a text that are shown
 
 std::string shortened(const std::string& text) {

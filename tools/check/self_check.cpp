@@ -24,9 +24,9 @@ bool canBePlayed(const Path& path) {
          });
 }
 
-class Comparison {
+class Likeness {
  public:
-  Comparison(const Exploration& exploration, const Visit& visit, const StepPicture& picture)
+  Likeness(const Exploration& exploration, const Visit& visit, const StepPicture& picture)
       : exploration_(exploration), visit_(visit), picture_(picture) {}
 
   std::string difference() const {
@@ -84,7 +84,7 @@ std::optional<std::string> selfCheck(const Exploration& exploration) {
     const Path path = exploration.path(static_cast<std::uint32_t>(number));
     if (!canBePlayed(path)) continue;
     const StepPicture picture = pictureAfter(exploration.setting(), path);
-    const auto difference = Comparison(exploration, visits[number], picture).difference();
+    const auto difference = Likeness(exploration, visits[number], picture).difference();
     if (!difference.empty()) return difference + " after " + playArguments(path);
   }
   return std::nullopt;

@@ -20,9 +20,6 @@ using toolkit::memory::MemoryButton;
 using toolkit::memory::ViewNode;
 using walkthrough::Stage;
 
-// No file can have this path, so the engine keeps the script that it has.
-constexpr const char* noFile = "/dev/null/no-script";
-
 std::unique_ptr<MemoryDriver> makeDriver(const std::string& resources) {
   auto driver = std::make_unique<MemoryDriver>();
   driver->setResourcePath(resources);
@@ -73,6 +70,7 @@ Setting settingOf(const Script& script, const walkthrough::StagePlan& plan,
   for (const auto& view : controlsOf(stage.engine())) {
     setting.ownTags.push_back(view->tag());
     setting.before.push_back(ViewNode::of(view)->save());
+    if (!view->asTextField()) setting.before.back().text = {};
     setting.kinds.push_back(driver->look(view).kind);
   }
   return setting;
@@ -122,7 +120,7 @@ void World::observe() {
     Control control{.node = ViewNode::of(view), .view = view};
     control.button = dynamic_cast<MemoryButton*>(control.node.get());
     control.state = stateOf(control);
-    control.look = looks_.valueOf({control.node->save(), false});
+    control.look = looks_.valueOf(lookOf(control));
     parts_.push_back(control.look);
     indexOf_.emplace(view.pointer().get(), controls_.size());
     if (++tagCounts_[control.state.tag] == 2) ++sharedTags_;
@@ -151,7 +149,7 @@ std::vector<Move> World::moves(const std::uint8_t* place, const PendingTimers& p
     const ControlState state = format_.control(place, i);
     if (!state.hidden && state.enabled) moves.push_back(static_cast<Move>(i));
   }
-  if (!pending.empty()) moves.push_back(waitMove);
+  if (!pending.empty() && pending.front().seconds != never) moves.push_back(waitMove);
   return moves;
 }
 
@@ -171,7 +169,6 @@ Arrival World::make(Move move, const std::uint8_t* from, std::uint32_t look,
     if (sharedTags_ > 0 && tagCounts_[tag] > 1) recorder_->note(FactKind::sharedTagPressed, tag);
     if (!setting_.script.listOfTag(tag)) {
       recorder_->note(FactKind::noListPressed, tag);
-      if (!pending.empty()) recorder_->note(FactKind::timerLost, tag);
     }
     press(move);
   }
@@ -277,11 +274,32 @@ Arrival World::arrive(Move move, PendingTimers& timers, std::uint8_t* place) {
   if (recorder_->notesMayHaveChanged()) readEngine();
   const bool isOver = stage_->engine().terminating();
   format_.setOver(place_.data(), isOver);
-  timers = isOver ? PendingTimers() : recorder_->pending();
+  timers = isOver ? pendingAtTheEnd() : recorder_->pending();
   std::copy(place_.begin(), place_.end(), place);
   Arrival arrival{.move = move, .ranList = recorder_->ranList(), .look = look_};
-  if (const auto list = recorder_->lastList()) arrival.lastList = static_cast<std::uint32_t>(*list);
+  arrival.timerElements = recorder_->pendingElements();
+  if (const auto list = recorder_->firstList())
+    arrival.firstList = static_cast<std::uint32_t>(*list);
+  const auto last = isOver ? recorder_->endList() : recorder_->lastList();
+  if (last) arrival.lastList = static_cast<std::uint32_t>(*last);
   return arrival;
+}
+
+// The end may have taken the engine's table of timers away; what is set then is not pending.
+PendingTimers World::pendingAtTheEnd() const {
+  PendingTimers pending = recorder_->pending();
+  const auto table = stage_->engine().objectIdTimers();
+  std::erase_if(pending, [&](const PendingTimer& timer) {
+    return !table || !table->objectForKey(timer.key);
+  });
+  return pending;
+}
+
+// The text of other controls than text fields is not seen.
+ViewLook World::lookOf(const Control& control) const {
+  ViewLook look{control.node->save(), control.hasUsersState};
+  if (!control.view->asTextField()) look.view.text = {};
+  return look;
 }
 
 void World::readTouched(std::uint8_t* place) {
@@ -299,7 +317,7 @@ void World::readTouched(std::uint8_t* place) {
       format_.setControl(place, index, state);
     }
     if (!std::exchange(control.mayLookDifferent, false)) continue;
-    control.look = looks_.valueOf({control.node->save(), control.hasUsersState});
+    control.look = looks_.valueOf(lookOf(control));
     looksElse |= control.look != parts_[index];
     parts_[index] = control.look;
   }
@@ -373,13 +391,6 @@ std::size_t World::controlsWithTag(Tag tag) const {
   if (sharedTags_ == 0) return 1;
   const auto count = tagCounts_.find(tag);
   return count == tagCounts_.end() ? 0 : count->second;
-}
-
-toolkit::Ref<toolkit::View> World::controlWithTag(Tag tag) const {
-  for (const Control& control : controls_) {
-    if (control.view->tag() == tag) return control.view;
-  }
-  return {};
 }
 
 drivers::ViewKind World::kindOf(const toolkit::Ref<toolkit::View>& view) const {

@@ -20,6 +20,9 @@
 
 namespace qz::tools::check {
 
+/// No file can have this path: an engine that loads it keeps the script that it has.
+inline constexpr const char* noFile = "/dev/null/no-script";
+
 /// What all worlds of one check share. The references must outlive the worlds.
 struct Setting {
   const Script& script;
@@ -40,9 +43,10 @@ struct Arrival {
   Move move = 0;
   bool isEndless = false;  ///< the move would run lists without end, and was not made
   bool ranList = false;
+  std::optional<std::uint32_t> firstList{};  ///< that the move ran; absent if it ran none
   std::optional<std::uint32_t> lastList{};  ///< whose command ran last; absent if none ran
   std::uint32_t look = 0;
-  std::uint64_t hash = 0;
+  std::vector<std::uint32_t> timerElements{};  ///< which started the pending timers
 };
 
 class World final : private Surroundings {
@@ -58,6 +62,8 @@ class World final : private Surroundings {
 
   /// Returns the moves from a place.
   std::vector<Move> moves(const std::uint8_t* place, const PendingTimers& pending) const;
+  /// Returns the number of the look that the world shows.
+  std::uint32_t look() const { return look_; }
   const std::vector<Fact>& facts() const { return recorder_->facts(); }
 
  private:
@@ -78,7 +84,6 @@ class World final : private Surroundings {
   void stateWasSet(const toolkit::Ref<toolkit::View>& control) override;
   void lookMayHaveChanged(const toolkit::Ref<toolkit::View>& control) override;
   std::size_t controlsWithTag(Tag tag) const override;
-  toolkit::Ref<toolkit::View> controlWithTag(Tag tag) const override;
   drivers::ViewKind kindOf(const toolkit::Ref<toolkit::View>& control) const override;
 
   void build(const std::optional<std::string>& startKey);
@@ -90,6 +95,8 @@ class World final : private Surroundings {
   std::optional<std::size_t> endlessList(Move move, const std::uint8_t* from,
                                          const PendingTimers& pending) const;
   std::optional<std::size_t> listRunBy(Tag tag) const;
+  ViewLook lookOf(const Control& control) const;
+  PendingTimers pendingAtTheEnd() const;
   Arrival arrive(Move move, PendingTimers& timers, std::uint8_t* place);
   void readTouched(std::uint8_t* place);
   void readEngine();
