@@ -117,8 +117,8 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   /// `runAsSheet`, and runs the list under `runFromKey`. An absent key runs no list and gives YES;
   /// an empty key means the smallest tag. Otherwise returns the result of the run. NO if the file
   /// exists but is not a dictionary, or if the key is empty and the script has no entry. If the
-  /// file does not exist, the engine keeps the current script. `withDelegate` is told when the sheet ends
-  /// and is not kept alive. Raises if the value under the key is not a list.
+  /// file does not exist, the engine keeps the current script. `withDelegate` is told when the
+  /// sheet ends and is not kept alive. Raises if the value under the key is not a list.
   bool loadPlist(std::optional<std::string> name, std::optional<std::string> runFromKey,
                  std::shared_ptr<toolkit::SheetDelegate> withDelegate, bool runAsSheet);
 
