@@ -14,7 +14,7 @@ class Driver;
 struct ToolkitRow {
   std::string_view name;         ///< for `--toolkit` and in scenarios; the name of its folders
   std::string_view description;  ///< for the help
-  /// Says how to get the toolkit if this build lacks it; empty if nobody can get it.
+  /// Says how to get the toolkit if this build lacks it. Ends a message that names the toolkit.
   std::string_view howToGet;
   bool hasDisplay;  ///< whether its windows have pixels
   /// The place in lists, its own for each toolkit. The default for playing is the first toolkit of

@@ -9,7 +9,7 @@ namespace qz::drivers {
 inline constexpr ToolkitRow appkitRow = {
     .name = "appkit",
     .description = "windows of AppKit",
-    .howToGet = "",
+    .howToGet = "there is no such toolkit yet",
     .hasDisplay = true,
     .place = 3,
 };

@@ -10,8 +10,8 @@ inline constexpr ToolkitRow qtRow = {
     .name = "qt",
     .description = "windows of Qt 6 Widgets",
     .howToGet =
-        "this build is without Qt; install Qt 6.4 Widgets or later (scripts/setup qt, on "
-        "Debian), then configure and build again",
+        "install Qt 6.4 Widgets or later (scripts/setup qt, on Debian), then configure and build "
+        "again",
     .hasDisplay = true,
     .place = 2,
 };

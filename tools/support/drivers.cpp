@@ -75,9 +75,9 @@ std::unique_ptr<drivers::Driver> makeDriver(std::string_view name) {
 std::unique_ptr<drivers::Driver> requireDriver(std::string_view name) {
   if (auto driver = makeDriver(name)) return driver;
   for (const ToolkitRow& row : toolkits()) {
-    if (row.name != name || row.howToGet.empty()) continue;
-    throw Failure(ExitStatus::badInput,
-                  "no toolkit " + std::string(name) + ": " + std::string(row.howToGet));
+    if (row.name != name) continue;
+    throw Failure(ExitStatus::badInput, "this build does not include the toolkit " +
+                                            std::string(name) + ": " + std::string(row.howToGet));
   }
   const auto known = driverNames();
   throw Failure(ExitStatus::badInput,
