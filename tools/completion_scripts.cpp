@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Writes completion scripts. Each script lists what every command accepts, so that completing does not
-// run the tool.
+// Writes completion scripts. Each script lists what every command accepts, so that completing does
+// not run the tool.
 #include "tools/completion_scripts.hpp"
 
 #include <utility>
@@ -27,7 +27,8 @@ std::string replaced(std::string text, std::string_view mark, const std::string&
 
 // --- bash ---
 
-constexpr std::string_view bashScript = R"(# Completes qz-walkthrough:  source <(qz-walkthrough completion bash)
+constexpr std::string_view bashScript =
+    R"(# Completes qz-walkthrough:  source <(qz-walkthrough completion bash)
 _qz_walkthrough_words() { mapfile -t COMPREPLY < <(compgen -W "$1" -- "$current"); }
 
 _qz_walkthrough_paths() {  # -f for files, -d for directories
@@ -85,7 +86,8 @@ std::string bash(const std::vector<CommandOutline>& commands) {
 
 // --- zsh ---
 
-constexpr std::string_view zshScript = R"(# Completes qz-walkthrough:  source <(qz-walkthrough completion zsh), after compinit
+constexpr std::string_view zshScript =
+    R"(# Completes qz-walkthrough:  source <(qz-walkthrough completion zsh), after compinit
 _qz_walkthrough() {
   local -a commands=(
 @commands@  )

@@ -1,10 +1,10 @@
 // SPDX-License-Identifier: MIT
 // The names that the public header brings into the global namespace.
-#include "QZ_Plist_State_Parser.hpp"
-
 #include <gtest/gtest.h>
 
 #include <type_traits>
+
+#include "QZ_Plist_State_Parser.hpp"
 
 namespace host {
 namespace {

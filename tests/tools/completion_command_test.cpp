@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The completion scripts, run by the shells themselves. zsh and fish are tested where they are installed.
+// The completion scripts, run by the shells themselves. zsh and fish are tested where they are
+// installed.
 #include <gtest/gtest.h>
 
 #include <algorithm>
@@ -31,9 +32,7 @@ std::string outputOf(const std::string& command) {
   return output;
 }
 
-bool isInstalled(const std::string& shell) {
-  return !outputOf("command -v " + shell).empty();
-}
+bool isInstalled(const std::string& shell) { return !outputOf("command -v " + shell).empty(); }
 
 Words linesOf(const std::string& text) {
   Words lines;
@@ -61,7 +60,7 @@ class CompletionPlace {
   /// Returns the output of the program, which the named shell runs in the directory.
   std::string outputOf(const std::string& shell, const std::string& program) const {
     std::ofstream(path_ / "program") << program;
-    return tools::outputOf("cd '" + path_.string() + "' && " + shell + " program 2>&1");
+    return tools::outputOf("cd '" + path_.string() + "' && timeout 60 " + shell + " program 2>&1");
   }
 
  private:
@@ -70,7 +69,7 @@ class CompletionPlace {
 
 /// Completes the last word of the line, whose words bash would divide in this way.
 Words bashCompletes(const CompletionPlace& place, const std::vector<std::string>& words) {
-  std::string program = "source script\nCOMP_WORDS=(qz-walkthrough";
+  std::string program = "source ./script\nCOMP_WORDS=(qz-walkthrough";
   for (const std::string& word : words) program += " '" + word + "'";
   program += ")\nCOMP_CWORD=" + std::to_string(words.size()) +
              "\n_qz_walkthrough\nprintf '%s\\n' \"${COMPREPLY[@]}\"\n";
@@ -148,7 +147,7 @@ TEST(Completion, FishCompletesCommandsOptionsAndValues) {
       {"play --press ", {}},
   };
   for (const auto& test : cases) {
-    const std::string program = "source script\ncomplete -C 'qz-walkthrough " + test.line + "'\n";
+    const std::string program = "source ./script\ncomplete -C 'qz-walkthrough " + test.line + "'\n";
     EXPECT_EQ(linesOf(place.outputOf("fish", program)), test.expected) << test.line;
   }
 }
@@ -161,13 +160,15 @@ zpty -w shell 'autoload -U compinit; compinit -u -D; source ./script; stty -echo
 zpty -w shell 'show() { print -r -- "[[$BUFFER]]"; BUFFER=; zle accept-line }; zle -N show'
 zpty -w shell 'bindkey "^X" show; print -r -- re""ady'
 zpty -r -m shell out '*ready*'
-zpty -w -n shell "qz-walkthrough )" + line + R"("$'\t\x18'
+zpty -w -n shell "qz-walkthrough )" +
+                              line + R"("$'\t\x18'
 zpty -r -m shell out '*\]\]*'
 print -r -- "$out"
 )";
   const std::string output = place.outputOf("zsh", program);
   const std::size_t from = output.rfind("[[qz-walkthrough ");
-  return from == std::string::npos ? output : output.substr(from + 17, output.find("]]") - from - 17);
+  return from == std::string::npos ? output
+                                   : output.substr(from + 17, output.find("]]") - from - 17);
 }
 
 TEST(Completion, ZshCompletesCommandsOptionsAndValues) {
