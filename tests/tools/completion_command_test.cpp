@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cstdio>
+#include <cstdlib>
 #include <filesystem>
 #include <fstream>
 #include <set>
@@ -46,10 +47,10 @@ Words linesOf(const std::string& text) {
 /// A directory with a file, a directory, and the completion script of a shell.
 class CompletionPlace {
  public:
-  explicit CompletionPlace(const std::string& shell)
-      : path_(std::filesystem::temp_directory_path() / ("qz-completion-" + shell)) {
-    std::filesystem::remove_all(path_);
-    std::filesystem::create_directories(path_ / "dir");
+  explicit CompletionPlace(const std::string& shell) {
+    std::string name = std::filesystem::temp_directory_path() / "qz-completion-XXXXXX";
+    path_ = ::mkdtemp(name.data());
+    std::filesystem::create_directory(path_ / "dir");
     std::ofstream(path_ / "data.plist") << "{}";
     std::ofstream(path_ / "script") << run(completionCommand, {"completion", shell}).out;
   }
