@@ -144,8 +144,9 @@ bench::Contender click(const char* name, Form& form) {
 double difference(Form& one, Form& other) {
   const QImage a = one.window.grab().toImage(), b = other.window.grab().toImage();
   int count = 0;
-  for (int y = 0; y < a.height(); ++y)
+  for (int y = 0; y < a.height(); ++y) {
     for (int x = 0; x < a.width(); ++x) count += a.pixel(x, y) != b.pixel(x, y);
+  }
   return count / static_cast<double>(a.width() * a.height());
 }
 
@@ -179,8 +180,9 @@ int main(int argc, char** argv) {
   const auto t = qz::bench::leastTimes({engine, slot, engine, slot}, 500);
   qz::bench::printHead("From a click to the last changed widget repainted",
                        {"step", "this engine", "a slot by hand", "this : by hand"});
-  for (const std::size_t i : {0U, 2U})
+  for (const std::size_t i : {0U, 2U}) {
     qz::bench::printRow({i == 0 ? "forth" : "back", qz::bench::shownTime(t[i]),
                          qz::bench::shownTime(t[i + 1]), qz::bench::shownRatio(t[i] / t[i + 1])});
+  }
   return 0;
 }

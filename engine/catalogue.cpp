@@ -14,7 +14,9 @@
 
 namespace qz {
 
-// The names. A host may assign others at any time.
+inline namespace command_names {
+
+// A host may assign other names at any time.
 std::string QZ_PLIST_STATE_PARSER_TERMINATE_PARSER = "TERMINATE_PARSER";
 std::string QZ_PLIST_STATE_PARSER_RETURN_TO_IDLE_LOOP = "IDLE_LOOP";
 std::string QZ_PLIST_STATE_PARSER_HIDE_OBJECT_WITH_ID = "HIDE_OBJECT_WITH_ID";
@@ -52,6 +54,8 @@ std::string
 std::string
     QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID =
         "SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID";
+
+}  // namespace command_names
 
 // Named, so that the short names of parameters hide nothing of other files.
 namespace catalogue {

@@ -22,12 +22,14 @@ std::string enumeratedLoops(const EndlessChains& chains) {
 
 std::string problemOf(const toolkit::ValueRef<toolkit::Dictionary>& script) {
   const auto entries = script->entries();
-  if (std::none_of(entries.begin(), entries.end(), [](const auto& e) { return isTag(*e.key); }))
+  if (std::none_of(entries.begin(), entries.end(), [](const auto& e) { return isTag(*e.key); })) {
     return "no key is a tag (a whole decimal number)";
+  }
   const std::string start = *smallestTagKey(*script);
   const auto first = script->objectForKey(start);
-  if (first && !toolkit::asArray(first))
+  if (first && !toolkit::asArray(first)) {
     return "the value under the smallest tag, " + start + ", is not a list";
+  }
   const EndlessChains chains = endlessChains(script);
   if (!chains.loops.empty()) return "lists run each other endlessly: " + enumeratedLoops(chains);
   return {};

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // The standard names of the classes of windows and views, as scripts' descriptions and scenarios
-// spell them. A toolkit may have names of its own.
+// spell them. A toolkit may have other names.
 #pragma once
 
 #include <string_view>

@@ -120,6 +120,21 @@ Command::Option& Command::Option::excludes(Option& other) {
   return *this;
 }
 
+Command::Option& Command::Option::choices(const std::vector<std::string_view>& names) {
+  hints_[option_].choices.assign(names.begin(), names.end());
+  return *this;
+}
+
+Command::Option& Command::Option::file() {
+  hints_[option_].isFile = true;
+  return *this;
+}
+
+Command::Option& Command::Option::directory() {
+  hints_[option_].isDirectory = true;
+  return *this;
+}
+
 // Options pass their words on unconverted: CLI11's conversions are templates, which take longer to
 // compile than the rest of this file.
 namespace {
@@ -144,7 +159,7 @@ constexpr int anyNumber = CLI::detail::expected_max_vector_size;
 
 Command::Option Command::argument(const std::string& name, std::string& value,
                                   const std::string& help) {
-  return Option(app_.add_option(name, storeIn(value), help)->required()->type_name(""));
+  return {app_.add_option(name, storeIn(value), help)->required()->type_name(""), hints_};
 }
 
 Command::Option Command::arguments(const std::string& name, std::vector<std::string>& values,
@@ -153,14 +168,15 @@ Command::Option Command::arguments(const std::string& name, std::vector<std::str
     values = words;
     return true;
   };
-  return Option(
-      app_.add_option(name, store, help)->required()->expected(anyNumber)->type_name("TEXT"));
+  return {app_.add_option(name, store, help)->required()->expected(anyNumber)->type_name("TEXT"),
+          hints_};
 }
 
 Command::Option Command::option(const std::string& name, std::string& value,
                                 const std::string& help) {
-  return Option(app_.add_option(name, storeIn(value), help, false, [&value] { return value; })
-                    ->type_name("TEXT"));
+  return {app_.add_option(name, storeIn(value), help, false, [&value] { return value; })
+              ->type_name("TEXT"),
+          hints_};
 }
 
 Command::Option Command::option(const std::string& name, std::optional<std::string>& value,
@@ -170,28 +186,67 @@ Command::Option Command::option(const std::string& name, std::optional<std::stri
 }
 
 Command::Option Command::flag(const std::string& name, bool& value, const std::string& help) {
-  return Option(app_.add_flag_callback(
-      name, [&value] { value = true; }, help));
+  const auto set = [&value] { value = true; };
+  return {app_.add_flag_callback(name, set, help), hints_};
 }
 
 Command::Option Command::taken(const std::string& name, Take take, const std::string& help) {
-  return Option(app_.add_option(name, eachTo(std::move(take)), help)->type_name("TEXT"));
+  return {app_.add_option(name, eachTo(std::move(take)), help)->type_name("TEXT"), hints_};
 }
 
 Command::Option Command::repeated(const std::string& name, Take take, const std::string& help) {
-  return Option(
-      app_.add_option(name, eachTo(std::move(take)), help)->type_name("TEXT")->trigger_on_parse());
+  return {
+      app_.add_option(name, eachTo(std::move(take)), help)->type_name("TEXT")->trigger_on_parse(),
+      hints_};
 }
 
 Command::Option Command::repeatedList(const std::string& name, Take take, const std::string& help) {
-  return Option(app_.add_option(name, eachTo(std::move(take)), help)
-                    ->type_name("TEXT")
-                    ->expected(anyNumber)
-                    ->trigger_on_parse());
+  return {app_.add_option(name, eachTo(std::move(take)), help)
+              ->type_name("TEXT")
+              ->expected(anyNumber)
+              ->trigger_on_parse(),
+          hints_};
 }
 
 void Command::action(std::function<int()> run) {
   app_.callback([run = std::move(run), &status = status_] { status = run(); });
+}
+
+namespace {
+
+/// Returns the help up to its first detail.
+std::string firstWords(const std::string& help) {
+  const std::string words = help.substr(0, help.find_first_of(":;("));
+  return words.substr(0, words.find_last_not_of(' ') + 1);
+}
+
+CommandOutline outlineOf(const CLI::App& app, ValueHints& hints) {
+  CommandOutline outline{app.get_name(), app.get_description(), {}, {}};
+  for (const CLI::Option* option : app.get_options()) {
+    if (!option->get_positional()) {
+      outline.options.push_back(
+          {option->get_name(false, false), firstWords(option->get_description()),
+           option->get_items_expected_max() > 0, option->get_trigger_on_parse(), hints[option]});
+    } else {
+      outline.arguments = hints[option];
+    }
+  }
+  return outline;
+}
+
+}  // namespace
+
+std::vector<CommandOutline> outlineOf(const std::vector<CommandEntry>& commands) {
+  std::vector<CommandOutline> outlines;
+  for (const CommandEntry& entry : commands) {
+    CLI::App app(entry.summary, entry.name);
+    int status = 0;
+    ValueHints hints;
+    Command command(app, status, hints);
+    entry.describe(command);
+    outlines.push_back(outlineOf(app, hints));
+  }
+  return outlines;
 }
 
 int runCommandLine(const ToolHelp& help, const std::vector<CommandEntry>& commands,
@@ -205,8 +260,9 @@ int runCommandLine(const ToolHelp& help, const std::vector<CommandEntry>& comman
   app.require_subcommand(1);
   app.option_defaults()
       ->disable_flag_override();  // otherwise "--list=3" would be accepted without an error
+  ValueHints hints;
   for (const CommandEntry& entry : commands) {
-    Command command(*app.add_subcommand(entry.name, entry.summary), status);
+    Command command(*app.add_subcommand(entry.name, entry.summary), status, hints);
     entry.describe(command);
   }
   try {

@@ -4,9 +4,11 @@
 #pragma once
 
 #include <functional>
+#include <map>
 #include <optional>
 #include <stdexcept>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace CLI {
@@ -22,6 +24,16 @@ class UsageError : public std::runtime_error {
   using std::runtime_error::runtime_error;
 };
 
+/// What a shell can offer where the user types a value.
+struct ValueHint {
+  std::vector<std::string> choices;  ///< every value that is accepted; empty if they are not known
+  bool isFile = false;               ///< the path of a file
+  bool isDirectory = false;          ///< the path of a directory
+};
+
+/// The hints of the options that have one.
+using ValueHints = std::map<const CLI::Option*, ValueHint>;
+
 /// Declares the arguments and options of one command. The variables passed by reference must
 /// outlive the reading of the command line. They are set before the action runs; a variable whose
 /// option the user leaves out keeps its value.
@@ -30,7 +42,7 @@ class Command {
   /// An option that was added; its functions refine it.
   class Option {
    public:
-    explicit Option(CLI::Option* option) : option_(option) {}
+    Option(CLI::Option* option, ValueHints& hints) : option_(option), hints_(hints) {}
     /// Sets how the help names the option's value.
     Option& valueName(const std::string& name);
     /// Shows the variable's present value in the help, as the default.
@@ -39,12 +51,20 @@ class Command {
     Option& path();
     /// Lets the user give only one of the two.
     Option& excludes(Option& other);
+    /// Names every value that is accepted, for shells that complete it. Checks nothing.
+    Option& choices(const std::vector<std::string_view>& names);
+    /// Lets shells complete the value as the path of a file.
+    Option& file();
+    /// Lets shells complete the value as the path of a directory.
+    Option& directory();
 
    private:
     CLI::Option* option_;
+    ValueHints& hints_;
   };
 
-  explicit Command(CLI::App& app, int& status) : app_(app), status_(status) {}
+  Command(CLI::App& app, int& status, ValueHints& hints)
+      : app_(app), status_(status), hints_(hints) {}
 
   /// Adds a required positional argument.
   Option argument(const std::string& name, std::string& value, const std::string& help);
@@ -72,6 +92,7 @@ class Command {
  private:
   CLI::App& app_;
   int& status_;
+  ValueHints& hints_;
 };
 
 /// A command as the tool lists it.
@@ -94,5 +115,25 @@ struct ToolHelp {
 /// arguments make no sense, and passes on what the command throws.
 int runCommandLine(const ToolHelp& help, const std::vector<CommandEntry>& commands,
                    std::vector<std::string> arguments);
+
+/// An option as shells complete it.
+struct OptionOutline {
+  std::string name;  ///< such as "--toolkit"
+  std::string help;  ///< the first words of its help
+  bool takesValue = false;
+  bool isRepeated = false;  ///< can be given any number of times
+  ValueHint value;
+};
+
+/// A command as shells complete it.
+struct CommandOutline {
+  std::string name;
+  std::string summary;
+  std::vector<OptionOutline> options;
+  ValueHint arguments;  ///< of its positional arguments
+};
+
+/// Returns what the commands accept.
+std::vector<CommandOutline> outlineOf(const std::vector<CommandEntry>& commands);
 
 }  // namespace qz::tools

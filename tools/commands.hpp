@@ -1,15 +1,25 @@
 // SPDX-License-Identifier: MIT
-// The commands of qz-walkthrough. A new one is declared here and added to the list in main.cpp.
+// The commands of qz-walkthrough. A new one is a row of commands.inc.
 #pragma once
+
+#include <vector>
 
 #include "tools/command_line.hpp"
 
 namespace qz::tools {
 
-extern const CommandEntry playCommand;     ///< plays a script
-extern const CommandEntry checkCommand;    ///< checks scripts
-extern const CommandEntry testCommand;     ///< runs scenarios
-extern const CommandEntry dumpCommand;     ///< prints a property list
-extern const CommandEntry convertCommand;  ///< writes a property list in another format
+// The entries, such as playCommand.
+#define QZ_COMMAND(name) extern const CommandEntry name##Command;
+#include "tools/commands.inc"
+#undef QZ_COMMAND
+
+/// Returns all entries, in the order of the help.
+inline std::vector<CommandEntry> allCommands() {
+  return {
+#define QZ_COMMAND(name) name##Command,
+#include "tools/commands.inc"
+#undef QZ_COMMAND
+  };
+}
 
 }  // namespace qz::tools

@@ -5,6 +5,7 @@
 #include <memory>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 #include "qz/property_list/formats.hpp"
@@ -43,10 +44,15 @@ std::vector<FormatRow> writableFormats() {
   return rows;
 }
 
-std::string writableNames() {
-  std::vector<std::string> names;
-  for (const FormatRow& row : writableFormats()) names.emplace_back(row.name);
-  return enumerate(names);
+std::vector<std::string_view> writableNames() {
+  std::vector<std::string_view> names;
+  for (const FormatRow& row : writableFormats()) names.push_back(row.name);
+  return names;
+}
+
+std::string writableList() {
+  const auto names = writableNames();
+  return enumerate({names.begin(), names.end()});
 }
 
 /// Says which suffix chooses which format.
@@ -90,18 +96,19 @@ void setFormat(ConvertOptions& options, const std::string& name) {
     if (row.name == name) options.format = row.format;
   }
   if (options.format) return;
-  throw UsageError("--format: expected " + writableNames() + ", found " + quote(name));
+  throw UsageError("--format: expected " + writableList() + ", found " + quote(name));
 }
 
 void describeConvert(Command& command) {
   const auto options = std::make_shared<ConvertOptions>();
-  command.argument("IN", options->in, "The property list, of any format");
-  command.argument("OUT", options->out, "The file to write").path();
+  command.argument("IN", options->in, "The property list, of any format").file();
+  command.argument("OUT", options->out, "The file to write").path().file();
   command
       .taken(
           "--format", [options](const std::string& name) { setFormat(*options, name); },
-          writableNames() + "; without it, " + suffixRules())
-      .valueName("FORMAT");
+          writableList() + "; without it, " + suffixRules())
+      .valueName("FORMAT")
+      .choices(writableNames());
   command.action([options] {
     convert(*options);
     return static_cast<int>(ExitStatus::fine);

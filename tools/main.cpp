@@ -10,6 +10,5 @@
 int main(int argc, char** argv) {
   qz::tools::installStackGuard();
   const std::vector<std::string> arguments(argv + (argc > 0 ? 1 : 0), argv + argc);
-  return qz::tools::runTool(arguments, {qz::tools::playCommand, qz::tools::checkCommand, qz::tools::testCommand,
-                                        qz::tools::dumpCommand, qz::tools::convertCommand});
+  return qz::tools::runTool(arguments, qz::tools::allCommands());
 }

@@ -51,23 +51,26 @@ void addWindowOptions(Command& command, play::PlayOptions& options) {
                                "The host's window, a property list of its controls");
   auto assets = command.option("--assets", options.stage.assets,
                                "A description from which the engine builds the window");
-  window.valueName("HOST.plist").excludes(assets);
-  assets.valueName("DESCRIPTION.plist");
+  window.valueName("HOST.plist").file().excludes(assets);
+  assets.valueName("DESCRIPTION.plist").file();
   command
       .option("--resources", options.resources,
               "The directory of the images (default: the script's)")
-      .valueName("DIR");
+      .valueName("DIR")
+      .directory();
   command.flag("--sheet", options.stage.sheet,
                "Show the window as a sheet over another window of the host");
   options.toolkit = playerToolkit();
   command
       .option("--toolkit", options.toolkit, "The toolkit to play the script on: " + toolkitHelp())
       .valueName("NAME")
+      .choices(driverNames())
       .showDefault();
   command
       .option("--screenshots", options.screenshots,
               "Write the transcript and a picture after every step to this directory")
-      .valueName("DIR");
+      .valueName("DIR")
+      .directory();
 }
 
 void addStepOptions(Command& command, play::PlayOptions& options) {
@@ -87,7 +90,7 @@ void addStepOptions(Command& command, play::PlayOptions& options) {
 
 void describePlay(Command& command) {
   const auto options = std::make_shared<play::PlayOptions>();
-  command.argument("SCRIPT", options->script, "The script, a property list");
+  command.argument("SCRIPT", options->script, "The script, a property list").file();
   addWindowOptions(command, *options);
   addStepOptions(command, *options);
   command.action([options] {

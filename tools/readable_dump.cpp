@@ -48,8 +48,9 @@ std::string_view escapeFor(char32_t c) {
 /// Returns the escape of half a surrogate pair, which no terminal can show.
 std::string surrogateEscape(char32_t c) {
   std::string text = "\\u{";
-  for (int shift = 12; shift >= 0; shift -= 4)
+  for (int shift = 12; shift >= 0; shift -= 4) {
     text += text::hexadecimalCharacter((c >> shift) & 15U);
+  }
   return text + "}";
 }
 

@@ -61,8 +61,9 @@ void printSummary(std::ostream& out, const std::vector<Report>& reports) {
                          [&](const Report& report) { return report.verdict == verdict; });
   };
   out << count(Verdict::passed) << " passed, " << count(Verdict::failed) << " failed";
-  if (const auto skipped = count(Verdict::skipped); skipped > 0)
+  if (const auto skipped = count(Verdict::skipped); skipped > 0) {
     out << ", " << skipped << " skipped";
+  }
   out << std::endl;
 }
 
@@ -137,13 +138,15 @@ int runTests(const TestOptions& options, std::ostream& out, std::ostream& proble
 void describeTest(Command& command) {
   const auto options = std::make_shared<TestOptions>();
   command.arguments("FILE", options->paths, "Scenario files (.walk), or directories of them")
-      .path();
+      .path()
+      .file();
   command.option("--toolkit", options->toolkit, "The toolkit to run on: " + toolkitHelp())
+      .choices(driverNames())
       .showDefault();
   command.option("--filter", options->filter, "Run only scenarios whose title contains this");
   command.flag("--list", options->list, "Name the scenarios instead of running them");
   command.flag("--verbose", options->verbose, "Print every statement with its result");
-  command.option("--junit", options->junit, "Write a JUnit report to this file").path();
+  command.option("--junit", options->junit, "Write a JUnit report to this file").path().file();
   command.action([options] { return runTests(*options, std::cout, std::cerr); });
 }
 

@@ -109,8 +109,9 @@ void MemoryDriver::setFrame(const Ref<View>& view, const Rect& frame) {
 void MemoryDriver::setCaption(const Ref<View>& view, std::string_view text) {
   asTextField(view)->setStringValue(text);
   asButton(view)->setTitle(text);
-  if (const auto imageView = asImageView(view))
+  if (const auto imageView = asImageView(view)) {
     imageView->setImage(toolkit_.images().imageNamed(text));
+  }
 }
 
 void MemoryDriver::setResourcePath(std::string_view path) {
@@ -162,12 +163,15 @@ ViewPicture MemoryDriver::look(const Ref<View>& view) {
   picture.hidden = node->isHidden();
   picture.state = view->state();
   picture.toolTip = node->toolTip();
-  if (const auto* control = dynamic_cast<const ControlNode*>(node.get()))
+  if (const auto* control = dynamic_cast<const ControlNode*>(node.get())) {
     describe(*control, picture);
-  if (const auto* button = dynamic_cast<const MemoryButton*>(node.get()))
+  }
+  if (const auto* button = dynamic_cast<const MemoryButton*>(node.get())) {
     describe(*button, picture);
-  if (const auto* imageView = dynamic_cast<const MemoryImageView*>(node.get()))
+  }
+  if (const auto* imageView = dynamic_cast<const MemoryImageView*>(node.get())) {
     picture.image = nameOf(imageView->image());
+  }
   return picture;
 }
 

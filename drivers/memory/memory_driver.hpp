@@ -5,6 +5,7 @@
 #include <memory>
 
 #include "drivers/driver.hpp"
+#include "drivers/memory/toolkit_row.hpp"
 #include "qz/toolkit/memory/memory_toolkit.hpp"
 #include "toolkit/memory/views.hpp"
 
@@ -43,8 +44,5 @@ class MemoryDriver final : public Driver {
   std::weak_ptr<MemoryButton> held_;  // holds the mouse button while the user is busy
   bool isDown_ = false;               // the held button is pressed in, until a keyboard click
 };
-
-/// Makes a driver with its own memory toolkit.
-std::unique_ptr<Driver> makeMemoryDriver();
 
 }  // namespace qz::drivers

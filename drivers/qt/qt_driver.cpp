@@ -20,7 +20,7 @@
 #include <cmath>
 #include <utility>
 
-#include "drivers/qt/make_driver.hpp"
+#include "drivers/qt/toolkit_row.hpp"
 #include "toolkit/qt/accessibility.hpp"
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/parts.hpp"
@@ -139,8 +139,9 @@ bool isBlocked(const QWidget& window) {
     if (!modal->isVisible() || modal->modality() == Qt::NonModal) return false;
     const QWindow* const own = window.windowHandle();
     if (modal->modality() == Qt::ApplicationModal) return modal != own;
-    for (const QWindow* above = modal->transientParent(); above; above = above->transientParent())
+    for (const QWindow* above = modal->transientParent(); above; above = above->transientParent()) {
       if (above == own) return true;
+    }
     return false;
   });
 }
@@ -149,8 +150,9 @@ bool isBlocked(const QWidget& window) {
 QPoint whereToClick(const QWidget& widget) {
   QStyleOptionButton option;
   option.initFrom(&widget);
-  if (qobject_cast<const QCheckBox*>(&widget))
+  if (qobject_cast<const QCheckBox*>(&widget)) {
     return widget.style()->subElementRect(QStyle::SE_CheckBoxIndicator, &option, &widget).center();
+  }
   return widget.rect().center();
 }
 
@@ -217,8 +219,9 @@ void QtDriver::setFrame(const Ref<View>& view, const Rect& frame) {
 void QtDriver::setCaption(const Ref<View>& view, std::string_view text) {
   asTextField(view)->setStringValue(text);
   asButton(view)->setTitle(text);
-  if (const auto imageView = asImageView(view))
+  if (const auto imageView = asImageView(view)) {
     imageView->setImage(toolkit_.images().imageNamed(text));
+  }
 }
 
 void QtDriver::setWindowTitle(const Ref<Window>& window, std::string_view title) {
@@ -250,8 +253,9 @@ void QtDriver::hold(const Ref<View>& view) {
   settle();
   const auto node = WidgetNode::of(view);
   auto* const button = node ? qobject_cast<QAbstractButton*>(node->widget()) : nullptr;
-  if (!button || !button->isVisible() || !button->isEnabled() || isBlocked(*button->window()))
+  if (!button || !button->isVisible() || !button->isEnabled() || isBlocked(*button->window())) {
     return;
+  }
   held_ = button;
   press(*button);
   settle();
@@ -348,8 +352,9 @@ ViewPicture QtDriver::look(const Ref<View>& view) {
     picture.title = shownTitle(*button);
     picture.background = faceColor(*button);
   }
-  if (const auto* imageView = dynamic_cast<const QtImageView*>(node.get()))
+  if (const auto* imageView = dynamic_cast<const QtImageView*>(node.get())) {
     picture.image = nameOf(imageView->image());
+  }
   return picture;
 }
 
@@ -365,8 +370,9 @@ WindowPicture QtDriver::look(const Ref<Window>& window) {
   picture.content = shown->content();
   const auto flags = widget.windowFlags();
   if (flags & Qt::WindowTitleHint) picture.style |= static_cast<unsigned>(StyleMask::titled);
-  if (flags & Qt::WindowCloseButtonHint)
+  if (flags & Qt::WindowCloseButtonHint) {
     picture.style |= static_cast<unsigned>(StyleMask::closable);
+  }
   picture.background = windowColor(widget);
   picture.delegate = shown->delegate();
   if (const auto content = WidgetNode::of(shown->contentView())) {

@@ -63,8 +63,9 @@ OrderForm::OrderForm() {
   tag(picture, 11);
   tag(next, 20);
   connect(&parcels, &QSpinBox::valueChanged, this, &OrderForm::showPrice);
-  for (QCheckBox* const box : {&express, &insured})
+  for (QCheckBox* const box : {&express, &insured}) {
     connect(box, &QCheckBox::toggled, this, &OrderForm::showPrice);
+  }
   connectButtons();
   showPrice();
   resize(480, 480);

@@ -106,12 +106,13 @@ std::shared_ptr<QZ_Plist_State_Parser> WalkThrough::load(
   const bool isRead = engine->loadPlist(script, std::nullopt, nullptr, false);
   const auto lists = engine->plistDictionary();
   std::string problem;
-  if (!isRead)
+  if (!isRead) {
     problem = "the file is not a property list with a dictionary";
-  else if (lists->count() == 0)
+  } else if (lists->count() == 0) {
     problem = "the file does not exist or contains no list";
-  else
+  } else {
     problem = problemOf(lists);
+  }
   if (problem.empty()) return engine;
   refuse(script, problem);
   engine->terminateParser();  // otherwise its flasher would keep it alive

@@ -35,7 +35,11 @@
 
 namespace qz {
 
-// The names of the commands in scripts. Assigning another string to one renames the command for
+/// The names of the commands in scripts, which QZ_Plist_State_Parser.hpp brings into the global
+/// namespace.
+inline namespace command_names {
+
+// Assigning another string to one renames the command for
 // every script from then on. The names of compound commands are upper-cased before they are
 // compared; those of simple commands are not.
 extern std::string QZ_PLIST_STATE_PARSER_TERMINATE_PARSER;
@@ -72,6 +76,8 @@ extern std::string
     QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID;
 extern std::string
     QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID;
+
+}  // namespace command_names
 
 class KeepAlive;
 
@@ -117,8 +123,8 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   /// `runAsSheet`, and runs the list under `runFromKey`. An absent key runs no list and gives YES;
   /// an empty key means the smallest tag. Otherwise returns the result of the run. NO if the file
   /// exists but is not a dictionary, or if the key is empty and the script has no entry. If the
-  /// file does not exist, the engine keeps the current script. `withDelegate` is told when the sheet ends
-  /// and is not kept alive. Raises if the value under the key is not a list.
+  /// file does not exist, the engine keeps the current script. `withDelegate` learns when the
+  /// sheet ends and is not kept alive. Raises if the value under the key is not a list.
   bool loadPlist(std::optional<std::string> name, std::optional<std::string> runFromKey,
                  std::shared_ptr<toolkit::SheetDelegate> withDelegate, bool runAsSheet);
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What an observer is told about lists, commands, looked-up controls and timers.
+// What an observer learns about lists, commands, looked-up controls and timers.
 #include "qz/observer.hpp"
 
 #include <gtest/gtest.h>

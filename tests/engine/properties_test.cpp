@@ -123,8 +123,9 @@ TEST_F(Properties, AnyThreadMayAskWhileTheEngineRuns) {
     if (engine->plistDictionary()->count() != 2) damaged = true;
   };
   meanwhile({askForId, askForScript}, [&] {
-    for (int i = 0; i < 3000; ++i)
+    for (int i = 0; i < 3000; ++i) {
       EXPECT_TRUE(engine->QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(Number::withLong(1)));
+    }
   });
   EXPECT_FALSE(damaged);
 }

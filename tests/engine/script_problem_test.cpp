@@ -26,8 +26,9 @@ TEST(ScriptProblem, SaysWhatIsWrong) {
        "  4 = (PROCESS_COMMANDS_FOR_ID); }",
        "lists run each other endlessly: 2 -> 3 -> 2, 4 -> 4"},
   };
-  for (const auto& c : cases)
+  for (const auto& c : cases) {
     EXPECT_EQ(problemOf(toolkit::dictionaryFromPropertyList(c.script)), c.problem) << c.script;
+  }
 }
 
 }  // namespace

@@ -99,8 +99,9 @@ TEST_F(Wiring, AWindowWithoutAContentViewIsAdoptedWithoutControls) {
 TEST_F(Wiring, TheEngineUnderstandsItsOwnActionOnly) {
   EXPECT_TRUE(engine->tryToPerform("buttonPushed:", nullptr));
   EXPECT_EQ(log, std::vector<std::string>{"Button tag 0 pressed."});
-  for (const char* other : {"buttonPushed", "buttonpushed:", "pseudoButtonPush:", ""})
+  for (const char* other : {"buttonPushed", "buttonpushed:", "pseudoButtonPush:", ""}) {
     EXPECT_FALSE(engine->tryToPerform(other, nullptr)) << other;
+  }
   EXPECT_EQ(log.size(), 1U);
 }
 

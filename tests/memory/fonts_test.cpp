@@ -53,8 +53,9 @@ TEST(MemoryFonts, NamesAreUnderstood) {
 
 TEST(MemoryFonts, OtherNamesAreUnknown) {
   for (const char* const name : {"", " ", "-", "-Bold", "Nonesuch", "Nonesuch-Bold", "Times-",
-                                 "Times-Heavy", "Times-Bold-Italic", "Bold", "Tim", "MT", "PSMT"})
+                                 "Times-Heavy", "Times-Bold-Italic", "Bold", "Tim", "MT", "PSMT"}) {
     EXPECT_EQ(fonts.fontWithName(name, 12), std::nullopt) << name;
+  }
 }
 
 TEST(MemoryFonts, ASizeNotAboveZeroIsTheDefaultSize) {

@@ -34,8 +34,9 @@ TEST_F(ImagesTest, ANameIsTriedWithTheUsualSuffixes) {
 }
 
 TEST_F(ImagesTest, EarlierSuffixesComeFirst) {
-  for (const char* const file : {"sky.pdf", "sky.jpeg", "sky.png", "sky.jpg"})
+  for (const char* const file : {"sky.pdf", "sky.jpeg", "sky.png", "sky.jpg"}) {
     directory.write(file, "");
+  }
   EXPECT_EQ(fileOf("sky"), "sky.png");
   EXPECT_EQ(fileOf("sky.pdf"), "sky.pdf");
 }
@@ -68,8 +69,9 @@ TEST_F(ImagesTest, ANameIsNoPath) {
   EXPECT_TRUE(find("inside"));
   for (const std::string_view name :
        {""sv, ".."sv, "../inside"sv, "../inside.png"sv, "..\\inside"sv, "./inside"sv,
-        "/inside.png"sv, "inside.png\0x"sv})
+        "/inside.png"sv, "inside.png\0x"sv}) {
     EXPECT_FALSE(find(name)) << name;
+  }
   driver.setResourcePath(directory.path());
   for (const std::string_view name : {""sv, ".."sv, "sub/inside"sv}) EXPECT_FALSE(find(name));
 }

@@ -98,8 +98,9 @@ TEST_F(RunLoopTest, ARepeatingTimerDoesNotDrift) {
   loop.advance(10'000);
   ASSERT_EQ(fired.size(), 100'000U);
   EXPECT_EQ(fired.back().at, 10'000);
-  for (std::size_t i = 0; i < fired.size(); ++i)
+  for (std::size_t i = 0; i < fired.size(); ++i) {
     ASSERT_EQ(fired[i].at, static_cast<double>(i + 1) * 0.1);
+  }
 }
 
 TEST_F(RunLoopTest, TimeThatPassesInStepsAddsUp) {
@@ -147,8 +148,9 @@ TEST_F(RunLoopTest, TimeOnlyPassesForwards) {
 }
 
 TEST_F(RunLoopTest, IntervalIsAsGiven) {
-  for (const double interval : {0.0, -3.0, 0.5, 1e30})
+  for (const double interval : {0.0, -3.0, 0.5, 1e30}) {
     EXPECT_EQ(note("a", interval)->interval(), interval);
+  }
 }
 
 TEST_F(RunLoopTest, ATimerWithoutAnActionIsRefused) {

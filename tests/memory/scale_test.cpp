@@ -26,8 +26,9 @@ TEST_F(Scale, TenThousandSubviews) {
   const double seconds = secondsOf([&] {
     for (Tag tag = 0; tag < 10'000; ++tag) makeIn(content, drivers::ViewKind::button, tag);
     Tag sum = 0;
-    for (int scan = 0; scan < 100; ++scan)
+    for (int scan = 0; scan < 100; ++scan) {
       for (const Ref<View>& view : content->subviews()) sum += view->tag();
+    }
     EXPECT_EQ(sum, Tag{100} * 10'000 * 9'999 / 2);
     for (int click = 0; click < 1'000; ++click) driver.click(content->subviews()[9'999]);
     while (!content->subviews().empty()) driver.removeFromSuperview(content->subviews().back());
@@ -38,8 +39,9 @@ TEST_F(Scale, TenThousandSubviews) {
 TEST_F(Scale, AMillionFirings) {
   long firings = 0;
   const double seconds = secondsOf([&] {
-    for (int i = 0; i < 10; ++i)
+    for (int i = 0; i < 10; ++i) {
       toolkit.runLoop().schedule(0.5, true, [&](const Ref<Timer>&) { ++firings; });
+    }
     driver.advance(50'000);
   });
   EXPECT_EQ(firings, 1'000'000);
@@ -67,12 +69,13 @@ TEST_F(Scale, AHundredThousandPendingTimersFireInOrder) {
   double last = 0;
   int firings = 0;
   const double seconds = secondsOf([&] {
-    for (int i = 0; i < 100'000; ++i)
+    for (int i = 0; i < 100'000; ++i) {
       toolkit.runLoop().schedule(1 + i * 7919 % 100'003, false, [&](const Ref<Timer>&) {
         EXPECT_GE(toolkit.parts().runLoop.now(), last);
         last = toolkit.parts().runLoop.now();
         ++firings;
       });
+    }
     driver.advance(200'000);
   });
   EXPECT_EQ(firings, 100'000);

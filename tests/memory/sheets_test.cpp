@@ -69,8 +69,9 @@ TEST_F(SheetsTest, ItsParentBringsItAlongToTheFront) {
   const Ref<Window> other = driver.makeWindow({});
   window->makeKeyAndOrderFront();
   std::vector<Ref<Window>> shown;
-  for (MemoryWindow* const each : toolkit.application().screen()->windows())
+  for (MemoryWindow* const each : toolkit.application().screen()->windows()) {
     shown.emplace_back(each->shared_from_this());
+  }
   EXPECT_TRUE((shown == std::vector<Ref<Window>>{other, window, sheet, onSheet}));
   EXPECT_TRUE(driver.look(onSheet).key);
   EXPECT_FALSE(takesClicks(sheet));

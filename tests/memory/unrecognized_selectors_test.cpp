@@ -53,21 +53,25 @@ class UnrecognizedSelector : public MemoryTest {
 
 TEST_F(UnrecognizedSelector, ButtonsUnderstandAll) {
   for (const drivers::ViewKind kind :
-       {drivers::ViewKind::button, drivers::ViewKind::toggle, drivers::ViewKind::popUpButton})
+       {drivers::ViewKind::button, drivers::ViewKind::toggle, drivers::ViewKind::popUpButton}) {
     for (const Message& message : messages) expectUnderstands(message, *make(kind));
+  }
 }
 
 TEST_F(UnrecognizedSelector, OtherControlsRaiseForWhatOnlyButtonsHave) {
-  for (const drivers::ViewKind kind : {drivers::ViewKind::textField, drivers::ViewKind::imageView})
+  for (const drivers::ViewKind kind :
+       {drivers::ViewKind::textField, drivers::ViewKind::imageView}) {
     for (const Message& message : messages) {
       const Ref<View> view = make(kind);
       message.controlsUnderstand ? expectUnderstands(message, *view) : expectRaises(message, *view);
     }
+  }
 }
 
 TEST_F(UnrecognizedSelector, ViewsThatAreNoControlsRaise) {
-  for (const drivers::ViewKind kind : {drivers::ViewKind::box, drivers::ViewKind::plain})
+  for (const drivers::ViewKind kind : {drivers::ViewKind::box, drivers::ViewKind::plain}) {
     for (const Message& message : messages) expectRaises(message, *make(kind));
+  }
 }
 
 TEST_F(UnrecognizedSelector, AViewOfAHostsOwnRaisesUnderItsOwnName) {
@@ -81,8 +85,9 @@ TEST_F(UnrecognizedSelector, AViewOfAHostsOwnRaisesUnderItsOwnName) {
 
 TEST_F(UnrecognizedSelector, EveryViewHasAState) {
   for (const drivers::ViewKind kind :
-       {drivers::ViewKind::textField, drivers::ViewKind::imageView, drivers::ViewKind::box})
+       {drivers::ViewKind::textField, drivers::ViewKind::imageView, drivers::ViewKind::box}) {
     EXPECT_EQ(make(kind)->state(), State::off);
+  }
 }
 
 TEST_F(UnrecognizedSelector, AReferenceToAKindSharesTheView) {

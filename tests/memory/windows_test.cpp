@@ -18,11 +18,13 @@ class WindowsTest : public MemoryTest {
   /// Expects these windows on the screen, back to front, with only the last one key.
   void expectShown(const std::vector<Ref<Window>>& expected) {
     std::vector<Ref<Window>> shown;
-    for (MemoryWindow* const each : toolkit.application().screen()->windows())
+    for (MemoryWindow* const each : toolkit.application().screen()->windows()) {
       shown.emplace_back(each->shared_from_this());
+    }
     EXPECT_TRUE(shown == expected);
-    for (const Ref<Window>& each : expected)
+    for (const Ref<Window>& each : expected) {
       EXPECT_EQ(driver.look(each).key, each == expected.back());
+    }
   }
 };
 

@@ -33,6 +33,11 @@ TEST(Formats, EveryFormatHasOneRow) {
   }
 }
 
+TEST(Formats, ATextThatLooksLikeNoOtherFormatIsOfTheLast) {
+  EXPECT_TRUE(formats().back().isText);
+  EXPECT_TRUE(formats().back().looksLike(""));
+}
+
 TEST(Formats, NamesTitlesAndSuffixesDiffer) {
   std::set<std::string_view> words;
   for (const FormatRow& row : formats()) {

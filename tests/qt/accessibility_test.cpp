@@ -52,8 +52,9 @@ class Accessibility : public ::testing::Test {
   Accessibility() { announcements.clear(); }
 
   static bool wasAnnounced(const QObject& object, QAccessible::Event event) {
-    for (const auto& said : announcements)
+    for (const auto& said : announcements) {
       if (said.object == &object && said.event == event) return true;
+    }
     return false;
   }
   static std::string textOf(QWidget& widget, QAccessible::Text which) {

@@ -37,30 +37,37 @@ struct Receivers : QObject {
 void addTo(Snapshot& snapshot, const QObject& object) {
   const QString name = object.objectName() + '.';
   const QMetaObject& meta = *object.metaObject();
-  for (int i = 0; i < meta.propertyCount(); ++i)
+  for (int i = 0; i < meta.propertyCount(); ++i) {
     snapshot[name + meta.property(i).name()] = meta.property(i).read(&object);
-  for (const QByteArray& property : object.dynamicPropertyNames())
+  }
+  for (const QByteArray& property : object.dynamicPropertyNames()) {
     snapshot[name + property] = object.property(property);
-  for (int i = 0; i < meta.methodCount(); ++i)
-    if (meta.method(i).methodType() == QMetaMethod::Signal)
+  }
+  for (int i = 0; i < meta.methodCount(); ++i) {
+    if (meta.method(i).methodType() == QMetaMethod::Signal) {
       snapshot[name + meta.method(i).methodSignature()] = Receivers::of(object, meta.method(i));
+    }
+  }
   snapshot[name + "children()"] = object.children().size();
 }
 
 Snapshot snapshotOf(const QWidget& window) {
   Snapshot snapshot;
   addTo(snapshot, window);
-  for (const QWidget* widget : window.findChildren<QWidget*>())
+  for (const QWidget* widget : window.findChildren<QWidget*>()) {
     if (!widget->objectName().startsWith("qt_")) addTo(snapshot, *widget);
+  }
   return snapshot;
 }
 
 std::set<QString> differences(const Snapshot& before, const Snapshot& after) {
   std::set<QString> names;
-  for (const auto& [name, value] : before)
+  for (const auto& [name, value] : before) {
     if (!after.contains(name) || after.at(name) != value) names.insert(name);
-  for (const auto& [name, value] : after)
+  }
+  for (const auto& [name, value] : after) {
     if (!before.contains(name)) names.insert(name);
+  }
   return names;
 }
 
@@ -116,9 +123,10 @@ TEST_F(Adoption, LeavesEveryPropertyAsItWas) {
   panel->findChild<QPushButton*>("other")->setFocus();  // the press would focus it anyway
   const Snapshot before = snapshotOf(*panel);
   const std::set<QString> incomparable = differences(before, snapshotOf(*panel));
-  for (const QString& name : incomparable)
+  for (const QString& name : incomparable) {
     EXPECT_TRUE(name.endsWith("Icon") || name.endsWith(".icon") || name.endsWith(".pixmap"))
         << name.toStdString();  // Qt never finds these equal
+  }
 
   walkThrough();
   window = {};

@@ -35,9 +35,11 @@ QRect indicatorOf(const QAbstractButton& button) {
 
 double shareOfEqual(const QImage& a, const QImage& b, const QRect& area) {
   int equal = 0;
-  for (int y = area.top(); y <= area.bottom(); ++y)
-    for (int x = area.left(); x <= area.right(); ++x)
+  for (int y = area.top(); y <= area.bottom(); ++y) {
+    for (int x = area.left(); x <= area.right(); ++x) {
       if (a.pixel(x, y) == b.pixel(x, y)) ++equal;
+    }
+  }
   return equal / static_cast<double>(area.width() * area.height());
 }
 
@@ -45,8 +47,8 @@ TEST(ButtonDetails, FlashesLeaveTheIndicatorToBeSeen) {
   QCheckBox box("Title");
   QRadioButton radio("Title");
   for (QAbstractButton* const button :
-       {static_cast<QAbstractButton*>(&box), static_cast<QAbstractButton*>(&radio)})
-    for (const char* const style : {"Fusion", "Windows"})
+       {static_cast<QAbstractButton*>(&box), static_cast<QAbstractButton*>(&radio)}) {
+    for (const char* const style : {"Fusion", "Windows"}) {
       for (const bool on : {false, true}) {
         SCOPED_TRACE(std::string(button->metaObject()->className()) + ", " + style);
         const std::unique_ptr<QStyle> drawn(QStyleFactory::create(style));
@@ -63,6 +65,8 @@ TEST(ButtonDetails, FlashesLeaveTheIndicatorToBeSeen) {
         setHighlighted(*button, false);
         button->setStyle(nullptr);
       }
+    }
+  }
 }
 
 TEST(ButtonDetails, TitlesOfCommandLinksKeepTheirLetters) {
@@ -106,9 +110,11 @@ double contrastOfTitle(QWidget& widget) {
   const QImage picture = pictureOf(widget);
   const QColor ground = picture.pixelColor(widget.width() - 12, 12);
   double best = 1;
-  for (int y = 6; y < picture.height() - 6; ++y)
-    for (int x = 24; x < picture.width() - 6; ++x)
+  for (int y = 6; y < picture.height() - 6; ++y) {
+    for (int x = 24; x < picture.width() - 6; ++x) {
       best = std::max(best, contrast(picture.pixelColor(x, y), ground));
+    }
+  }
   return best;
 }
 

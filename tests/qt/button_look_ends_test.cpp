@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// What a script added to a button goes away again, and leaves nothing at the button.
+// The button loses everything that a script added to it.
 
 #include <gtest/gtest.h>
 

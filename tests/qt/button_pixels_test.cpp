@@ -71,8 +71,9 @@ const char* const sheets[] = {
 
 QPalette darkPalette() {
   QPalette palette(QColor(53, 53, 53));
-  for (const auto role : {QPalette::WindowText, QPalette::ButtonText, QPalette::Text})
+  for (const auto role : {QPalette::WindowText, QPalette::ButtonText, QPalette::Text}) {
     palette.setColor(role, Qt::white);
+  }
   return palette;
 }
 
@@ -115,10 +116,13 @@ double luminance(QRgb pixel) {
 /// Returns the share of pixels whose luminance changes by at least a seventh of its range.
 double shareOfNoticed(const QImage& before, const QImage& after) {
   int noticed = 0;
-  for (int y = 0; y < before.height(); ++y)
-    for (int x = 0; x < before.width(); ++x)
-      if (std::abs(luminance(before.pixel(x, y)) - luminance(after.pixel(x, y))) >= 1.0 / 7)
+  for (int y = 0; y < before.height(); ++y) {
+    for (int x = 0; x < before.width(); ++x) {
+      if (std::abs(luminance(before.pixel(x, y)) - luminance(after.pixel(x, y))) >= 1.0 / 7) {
         ++noticed;
+      }
+    }
+  }
   return noticed / static_cast<double>(before.width() * before.height());
 }
 
@@ -152,9 +156,9 @@ void expectEachShows(QAbstractButton& button) {
 class ButtonPixels : public testing::TestWithParam<ButtonKind> {};
 
 TEST_P(ButtonPixels, ShowTheHighlightTheBackgroundAndTheTitlesColour) {
-  for (const char* const style : {"Fusion", "Windows"})
-    for (const char* const sheet : sheets)
-      for (const Press press : {Press::off, Press::on, Press::mixed})
+  for (const char* const style : {"Fusion", "Windows"}) {
+    for (const char* const sheet : sheets) {
+      for (const Press press : {Press::off, Press::on, Press::mixed}) {
         for (const bool enabled : {true, false}) {
           SCOPED_TRACE(std::string(style) + ", " + sheet + ", " +
                        std::to_string(static_cast<int>(press)) + (enabled ? "" : ", disabled"));
@@ -163,10 +167,13 @@ TEST_P(ButtonPixels, ShowTheHighlightTheBackgroundAndTheTitlesColour) {
           dressed.button->setEnabled(enabled);
           expectEachShows(*dressed.button);
         }
+      }
+    }
+  }
 }
 
 TEST_P(ButtonPixels, ShowTheHighlightOnDarkGroundAndInEverySize) {
-  for (const QSize size : {QSize(24, 24), QSize(80, 24), QSize(200, 40), QSize(120, 120)})
+  for (const QSize size : {QSize(24, 24), QSize(80, 24), QSize(200, 40), QSize(120, 120)}) {
     for (const bool dark : {false, true}) {
       SCOPED_TRACE(std::to_string(size.width()) + (dark ? " dark" : ""));
       const DressedButton dressed(GetParam(), {"Fusion", "", dark});
@@ -175,6 +182,7 @@ TEST_P(ButtonPixels, ShowTheHighlightOnDarkGroundAndInEverySize) {
       setHighlighted(*dressed.button, true);
       EXPECT_GE(shareOfNoticed(before, pictureOf(*dressed.button)), 0.1);
     }
+  }
 }
 
 INSTANTIATE_TEST_SUITE_P(Qt, ButtonPixels, testing::ValuesIn(buttonKinds),

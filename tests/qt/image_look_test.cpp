@@ -80,8 +80,9 @@ TEST_F(ImageLook, TakesTheFileOfTwiceTheResolutionWhereThePixelsAre) {
 
 TEST_F(ImageLook, IsSharpAtTwoPixelsAPoint) {
   QImage stripes(40, 40, QImage::Format_RGB32);
-  for (int y = 0; y < 40; ++y)
+  for (int y = 0; y < 40; ++y) {
     for (int x = 0; x < 40; ++x) stripes.setPixelColor(x, y, x % 2 == 0 ? Qt::red : Qt::blue);
+  }
   ASSERT_TRUE(stripes.save(directory_.filePath("a@2x.png")));
   write("a.png", {20, 20}, Qt::white);
   QLabel label;

@@ -63,8 +63,9 @@ TEST_F(Kinds, GoByTheClassOfTheWidget) {
                                   "text field", "view"};
   const auto& views = window->contentView()->subviews();
   ASSERT_EQ(views.size(), std::size(expected));
-  for (std::size_t i = 0; i < views.size(); ++i)
+  for (std::size_t i = 0; i < views.size(); ++i) {
     EXPECT_EQ(kindOf(*views[i]), expected[i]) << views[i]->className();
+  }
   EXPECT_EQ(views[2]->className(), "QComboBox");
 }
 

@@ -82,10 +82,11 @@ TEST_F(Lifetime, WidgetsMayBeDeletedWhileAListRuns) {
   label->setProperty(tagProperty, 2);
   next->setProperty(tagProperty, 3);
   QObject::connect(box, &QCheckBox::toggled, [&](bool on) {
-    if (on)
+    if (on) {
       delete label;
-    else
+    } else {
       delete box;
+    }
   });
   const auto engine = walkThrough(
       *this,

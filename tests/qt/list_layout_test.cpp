@@ -47,8 +47,9 @@ struct DrawnLine {
 };
 
 int firstDark(const QImage& band, int from) {
-  for (int x = from; x < band.width(); ++x)
+  for (int x = from; x < band.width(); ++x) {
     if (rendering::countPixels(band, QRect(x, 0, 1, band.height()), isInked) > 0) return x;
+  }
   return band.width();
 }
 
@@ -57,8 +58,9 @@ DrawnLine lineIn(const QImage& band) {
   const int left = firstDark(band, 0);
   int last = left;
   for (int x = firstDark(band, left); x <= last + gap && x < band.width();
-       x = firstDark(band, x + 1))
+       x = firstDark(band, x + 1)) {
     last = x;
+  }
   return {left, firstDark(band, last + 1)};
 }
 

@@ -131,9 +131,11 @@ TEST_F(PlayedByAPerson, WritesDownWhatAPersonDoes) {
   // The person presses each button as soon as it is visible.
   QTimer person;
   person.callOnTimeout([] {
-    for (const char* title : {"2", "End"})
-      if (auto* const button = buttonTitled(title))
+    for (const char* title : {"2", "End"}) {
+      if (auto* const button = buttonTitled(title)) {
         return QTest::mouseClick(button, Qt::LeftButton);
+      }
+    }
   });
   person.start(50);
   session.handOver();

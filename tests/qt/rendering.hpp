@@ -24,9 +24,11 @@ inline QImage pictureOf(QWidget& widget, double ratio = 1) {
 inline int countPixels(const QImage& picture, const QRect& area,
                        const std::function<bool(const QColor&)>& wanted) {
   int count = 0;
-  for (int y = area.top(); y <= area.bottom(); ++y)
-    for (int x = area.left(); x <= area.right(); ++x)
+  for (int y = area.top(); y <= area.bottom(); ++y) {
+    for (int x = area.left(); x <= area.right(); ++x) {
       if (wanted(picture.pixelColor(x, y))) ++count;
+    }
+  }
   return count;
 }
 
@@ -43,9 +45,11 @@ inline bool isDark(const QColor& color) { return color.lightness() < 100; }
 /// Returns the smallest rectangle around the pixels for which `wanted` is true, or an empty one.
 inline QRect boundsOf(const QImage& picture, const std::function<bool(const QColor&)>& wanted) {
   QRect bounds;
-  for (int y = 0; y < picture.height(); ++y)
-    for (int x = 0; x < picture.width(); ++x)
+  for (int y = 0; y < picture.height(); ++y) {
+    for (int x = 0; x < picture.width(); ++x) {
       if (wanted(picture.pixelColor(x, y))) bounds |= QRect(x, y, 1, 1);
+    }
+  }
   return bounds;
 }
 

@@ -58,22 +58,25 @@ TEST(TextDirection, IsThatOfTheTextInBothLayouts) {
   QLineEdit line;
   QCheckBox box;
   for (QWidget* const widget : {static_cast<QWidget*>(&label), static_cast<QWidget*>(&selectable),
-                                static_cast<QWidget*>(&line), static_cast<QWidget*>(&box)})
-    for (const auto direction : {Qt::LeftToRight, Qt::RightToLeft})
+                                static_cast<QWidget*>(&line), static_cast<QWidget*>(&box)}) {
+    for (const auto direction : {Qt::LeftToRight, Qt::RightToLeft}) {
       for (const char* const text : {latinWords, hebrewWord, arabicWord}) {
         widget->setLayoutDirection(direction);
         expectSamePicture(*widget, text);
         expectSamePicture(*widget, text, ParagraphStyle{});
       }
+    }
+  }
 }
 
 TEST(TextDirection, OfAPushButtonsTitleIsThatOfTheText) {
   QPushButton button;
-  for (const auto direction : {Qt::LeftToRight, Qt::RightToLeft})
+  for (const auto direction : {Qt::LeftToRight, Qt::RightToLeft}) {
     for (const char* const text : {latinWords, hebrewWord, arabicWord}) {
       button.setLayoutDirection(direction);
       expectSamePicture(button, text);
     }
+  }
 }
 
 TEST(TextDirection, IsThatOfEachParagraphInAnEdit) {
@@ -86,8 +89,8 @@ TEST(TextDirection, IsThatOfEachParagraphInAnEdit) {
 }
 
 TEST(TextDirection, LeavesExplicitAlignmentsAlone) {
-  for (const auto direction : {Qt::LeftToRight, Qt::RightToLeft})
-    for (const char* const text : {latinWords, hebrewWord, arabicWord})
+  for (const auto direction : {Qt::LeftToRight, Qt::RightToLeft}) {
+    for (const char* const text : {latinWords, hebrewWord, arabicWord}) {
       for (const TextAlignment alignment : {TextAlignment::left, TextAlignment::right}) {
         SCOPED_TRACE(text);
         QLabel label;
@@ -98,6 +101,8 @@ TEST(TextDirection, LeavesExplicitAlignmentsAlone) {
         const QRect place = boundsOf(picture, isInk);
         EXPECT_EQ(place.center().x() < 150, alignment == TextAlignment::left);
       }
+    }
+  }
 }
 
 }  // namespace

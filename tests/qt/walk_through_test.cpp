@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The host's side of a walk-through: however it ends, the host is told and gets its window back.
+// The host's side of a walk-through: however it ends, the host learns of the end and gets its
+// window back.
 
 #include "qz/hosts/qt/walk_through.hpp"
 

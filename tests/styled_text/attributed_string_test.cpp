@@ -155,8 +155,9 @@ struct Modelled {
 
   void addColor(const Color& color, TextRange range) {
     text.addForegroundColor(color, range);
-    for (std::size_t i = 0; i < range.length; ++i)
+    for (std::size_t i = 0; i < range.length; ++i) {
       model[range.location + i].foregroundColor = color;
+    }
   }
 
   AttributedString expected() const {

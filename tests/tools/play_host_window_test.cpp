@@ -70,6 +70,13 @@ TEST(PlayHostWindow, WhatIsAbsentHasADefault) {
   EXPECT_FALSE(host.controls[0].hidden);
 }
 
+// The names of the kinds of view, as the message lists them after another word.
+std::string namesOfKinds() {
+  std::string names;
+  for (const std::string_view name : drivers::viewKindNames()) names += ", " + std::string(name);
+  return names;
+}
+
 TEST(PlayHostWindow, SaysWhatIsWrongWithTheList) {
   const struct {
     std::string text;
@@ -82,8 +89,8 @@ TEST(PlayHostWindow, SaysWhatIsWrongWithTheList) {
        "2:11: entry 2: class: expected a control (the window is the first entry), found the string "
        "“NSWindow”"},
       {"({class = NSButon; frame = (0, 0, 1, 1);})",
-       "1:11: entry 1: class: expected one of NSWindow, NSButton, NSButton:toggle, NSButton:mixed, "
-       "NSPopUpButton, NSTextField, NSImageView, NSBox, NSView, found the string “NSButon”"},
+       "1:11: entry 1: class: expected one of NSWindow" + namesOfKinds() +
+           ", found the string “NSButon”"},
       {"({class = NSWindow; frame = (0, 0, 1, 1); tag = 1;})",
        "1:43: entry 1: unknown key “tag”; expected class, frame, title"},
   };

@@ -8,8 +8,9 @@ namespace qz::tools::play {
 namespace {
 
 std::string words(const Request& request) {
-  if (const auto* press = std::get_if<Press>(&request))
+  if (const auto* press = std::get_if<Press>(&request)) {
     return "press " + std::to_string(press->tag);
+  }
   if (const auto* advance = std::get_if<Advance>(&request)) {
     return "advance " + std::to_string(advance->seconds);
   }

@@ -58,7 +58,7 @@ class ForeignDriver final : public drivers::Driver {
         return "Label";
       case drivers::ViewKind::box:
         return "GroupBox";
-      case drivers::ViewKind::plain:
+      default:
         break;
     }
     return "Widget";

@@ -53,8 +53,9 @@ TEST(ScenarioPage, ItNamesEveryStatementPropertyAndClass) {
   for (const auto* infos : {&vocabulary().engine, &vocabulary().control, &vocabulary().window}) {
     for (const auto& info : *infos) EXPECT_TRUE(names(std::string(info.name) + '`')) << info.name;
   }
-  for (const auto name : drivers::viewKindNames())
+  for (const auto name : drivers::viewKindNames()) {
     EXPECT_TRUE(names(std::string(name) + '`')) << name;
+  }
 }
 
 }  // namespace

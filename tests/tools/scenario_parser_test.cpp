@@ -7,11 +7,17 @@
 
 #include "scenario_support.hpp"
 #include "tools/scenario/parser.hpp"
+#include "tools/support/suggestions.hpp"
 
 namespace qz::tools::scenario {
 namespace {
 
 ScenarioFile parsed(const std::string& text) { return parseScenarios(text, vocabulary()); }
+
+// The names as messages list them.
+std::string listed(const std::vector<std::string_view>& names) {
+  return enumerate({names.begin(), names.end()});
+}
 
 std::vector<std::string> sources(const std::vector<Statement>& statements) {
   std::vector<std::string> all;
@@ -68,16 +74,17 @@ TEST(ScenarioParser, TheResultBelongsToTheInnermostStatement) {
 TEST(ScenarioParser, RefusesUnknownWords) {
   const struct {
     const char* text;
-    const char* refusal;
+    std::string refusal;
   } cases[] = {
       {"engine\n  prss next", "2:3: unknown statement \"prss\"; did you mean \"press\"?"},
       {"scenaro x", "1:1: unknown statement \"scenaro\"; did you mean \"scenario\"?"},
       {"\"engine\"", "1:1: expected a statement, which begins with a bare word"},
       {"[1] x", "1:1: expected a statement, which begins with a bare word"},
       {"control a NSButon 1 in w",
-       "1:11: unknown class \"NSButon\"; did you mean \"NSButton\"?; the classes are NSButton, "
-       "NSButton:toggle, NSButton:mixed, NSPopUpButton, NSTextField, NSImageView, NSBox or NSView"},
-      {"only memry", "1:6: found \"memry\", expected memory, qt or appkit (only TOOLKIT...)"},
+       "1:11: unknown class \"NSButon\"; did you mean \"NSButton\"?; the classes are " +
+           listed(drivers::viewKindNames())},
+      {"only memry",
+       "1:6: found \"memry\", expected " + listed(toolkitNames()) + " (only TOOLKIT...)"},
       {"set constant HIDE_OBJECT x",
        "1:14: unknown command name \"HIDE_OBJECT\"; did you mean "
        "\"QZ_PLIST_STATE_PARSER_HIDE_OBJECT_WITH_ID\"?"},

@@ -25,8 +25,9 @@ constexpr Style styles[] = {
 
 std::string folded(std::string_view name) {
   std::string result;
-  for (const char c : name)
+  for (const char c : name) {
     if (c != ' ') result += text::lowered(c);
+  }
   return result;
 }
 
@@ -36,8 +37,9 @@ std::string_view without(std::string_view name, std::string_view ending) {
 }
 
 const FontFamily* familyNamed(std::string_view foldedName, std::span<const FontFamily> families) {
-  for (const FontFamily& family : families)
+  for (const FontFamily& family : families) {
     if (folded(family.name) == foldedName) return &family;
+  }
   return nullptr;
 }
 
@@ -50,8 +52,9 @@ const FontFamily* familyOfPostScriptName(std::string_view foldedName,
 }
 
 const Style* styleNamed(std::string_view foldedName) {
-  for (const Style& style : styles)
+  for (const Style& style : styles) {
     if (style.folded == foldedName) return &style;
+  }
   return nullptr;
 }
 
@@ -65,8 +68,9 @@ Font font(const FontFamily& family, double size, bool bold, bool italic) {
 std::optional<Font> fontNamed(std::string_view name, double size,
                               std::span<const FontFamily> families) {
   const std::string whole = folded(name);
-  if (const FontFamily* const family = familyOfPostScriptName(whole, families))
+  if (const FontFamily* const family = familyOfPostScriptName(whole, families)) {
     return font(*family, size, false, false);
+  }
 
   const std::size_t hyphen = whole.rfind('-');
   if (hyphen == std::string::npos) return std::nullopt;

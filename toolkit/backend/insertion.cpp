@@ -19,8 +19,9 @@ namespace {
 
 void requireOwnView(std::string_view receiver, const Ref<View>& view, bool isOwn) {
   if (!view) refuse(receiver, "the view is absent");
-  if (!isOwn)
+  if (!isOwn) {
     refuse(receiver, "the view, of class " + view->className() + ", belongs to another toolkit");
+  }
 }
 
 void requireFreeView(std::string_view receiver, bool isContentView, bool isAroundReceiver) {

@@ -17,8 +17,9 @@ bool sendAlongResponderChain(std::string_view action, const std::shared_ptr<Resp
   // NOLINTNEXTLINE(performance-unnecessary-copy-initialization)
   if (const auto receiver = target) return receiver->tryToPerform(selector, sender);
 
-  for (Ref<View> responder = sender; responder; responder = places.superviewOf(responder))
+  for (Ref<View> responder = sender; responder; responder = places.superviewOf(responder)) {
     if (responder->tryToPerform(selector, sender)) return true;
+  }
   const Ref<Window> window = places.window();
   const auto delegate = window ? window->delegate() : nullptr;
   return delegate && delegate->tryToPerform(selector, sender);

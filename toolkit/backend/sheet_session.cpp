@@ -15,8 +15,9 @@ void SheetSession::end(const Ref<Window>& sheet, long returnCode) {
   ends_.push_back(returnCode);
   const auto begun = std::exchange(begun_, std::nullopt);
   if (!begun) return;
-  if (const auto delegate = begun->delegate.lock())
+  if (const auto delegate = begun->delegate.lock()) {
     delegate->sheetDidEnd(sheet, returnCode, begun->contextInfo);
+  }
 }
 
 }  // namespace qz::toolkit

@@ -16,9 +16,9 @@ namespace qz::toolkit {
 class SheetSession {
  public:
   /// The window has become a sheet. If it has not ended since it began before, only the new
-  /// delegate is told of the end.
+  /// delegate learns of the end.
   void begin(const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo);
-  /// Tells the delegate that `sheet`, the window of this session, has ended, unless it was told
+  /// Tells the delegate that `sheet`, the window of this session, has ended, unless it knows
   /// already.
   void end(const Ref<Window>& sheet, long returnCode);
 
@@ -39,8 +39,9 @@ class SheetSession {
 /// window that is attached to itself could never accept input again.
 template <class BackendWindow>
 bool isAttachedTo(const BackendWindow& window, std::shared_ptr<BackendWindow> parent) {
-  for (; parent; parent = parent->sheetParent())
+  for (; parent; parent = parent->sheetParent()) {
     if (parent.get() == &window) return true;
+  }
   return false;
 }
 

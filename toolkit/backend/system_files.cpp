@@ -48,8 +48,9 @@ std::optional<std::string> SystemFiles::contentsAtPath(std::string_view path) co
   if (!file) return std::nullopt;
   std::string contents;
   char block[1 << 16];
-  while (file.read(block, sizeof block) || file.gcount() > 0)
+  while (file.read(block, sizeof block) || file.gcount() > 0) {
     contents.append(block, static_cast<std::size_t>(file.gcount()));
+  }
   if (file.bad()) return std::nullopt;
   return contents;
 }

@@ -114,8 +114,9 @@ Ref<Timer> TimedRunLoop::schedule(double interval, bool repeats, TimerAction act
 }
 
 void TimedRunLoop::fireDue(double until) {
-  while (isInDefaultMode() && !queue_.empty() && queue_.begin()->first.time <= until + slack)
+  while (isInDefaultMode() && !queue_.empty() && queue_.begin()->first.time <= until + slack) {
     Firing(*this).run();
+  }
 }
 
 std::optional<double> TimedRunLoop::nextDue() const {

@@ -32,8 +32,9 @@ Ref<TextField> MemoryApplication::makeTextField(const Rect& frame) {
 void MemoryApplication::beginSheet(const Ref<Window>& sheet, const Ref<Window>& parent,
                                    const std::shared_ptr<SheetDelegate>& delegate,
                                    void* contextInfo) {
-  if (const auto window = MemoryWindow::of(sheet))
+  if (const auto window = MemoryWindow::of(sheet)) {
     window->beginAsSheet(MemoryWindow::of(parent), delegate, contextInfo);
+  }
 }
 
 void MemoryApplication::endSheet(const Ref<Window>& sheet, long returnCode) {

@@ -33,8 +33,9 @@ void Screen::orderFront(const std::shared_ptr<MemoryWindow>& window) {
   shown_.push_back({window.get(), window->isKeptOnScreen() ? window : nullptr});
   key_ = window.get();
   // A copy: bringing the sheets to the front changes the list.
-  for (MemoryWindow* const other : windows())
+  for (MemoryWindow* const other : windows()) {
     if (other->sheetParent() == window) orderFront(other->shared_from_this());
+  }
 }
 
 std::shared_ptr<MemoryWindow> Screen::orderOut(const MemoryWindow& window) {

@@ -47,15 +47,17 @@ std::shared_ptr<MemoryWindow> ViewNode::window() const {
 }
 
 bool ViewNode::takesInput() const {
-  for (auto view = shared_from_this(); view; view = view->superview())
+  for (auto view = shared_from_this(); view; view = view->superview()) {
     if (view->hidden_) return false;
+  }
   const auto window = this->window();
   return window && window->takesInput();
 }
 
 bool ViewNode::isWithin(const ViewNode& view) const {
-  for (auto around = shared_from_this(); around; around = around->superview())
+  for (auto around = shared_from_this(); around; around = around->superview()) {
     if (around.get() == &view) return true;
+  }
   return false;
 }
 

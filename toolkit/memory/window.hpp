@@ -52,7 +52,7 @@ class MemoryWindow final : public Window, public std::enable_shared_from_this<Me
 
   /// Shows the window attached to `parent`, which may be null. If `parent` is this window or
   /// attached to it, the window is shown on its own. If the sheet is begun again before its end,
-  /// only the latest delegate is told of the end.
+  /// only the latest delegate learns of the end.
   void beginAsSheet(const std::shared_ptr<MemoryWindow>& parent,
                     const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo);
   /// Tells the delegate unless the sheet was already ended, even if the window is no longer on the

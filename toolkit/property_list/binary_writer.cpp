@@ -152,8 +152,9 @@ void BinaryWriter::string(std::string_view text) {
     return;
   }
   std::u16string units;
-  for (std::size_t at = 0; at < text.size();)
+  for (std::size_t at = 0; at < text.size();) {
     text::appendUtf16(units, text::nextCodePoint(text, at));
+  }
   markLong(Marker::utf16, units.size());
   for (const char16_t unit : units) binary::appendNumber(bytes_, unit, sizeof unit);
 }

@@ -42,8 +42,9 @@ std::optional<std::string_view> declaredName(std::string_view file) {
   if (!file.starts_with(declaration)) return std::nullopt;
   const std::string_view attributes = file.substr(declaration.size());
   const std::size_t found = attributes.find(attribute);
-  if (found == std::string_view::npos || attributes.find_first_of("?>") < found)
+  if (found == std::string_view::npos || attributes.find_first_of("?>") < found) {
     return std::nullopt;
+  }
   const std::string_view value = attributes.substr(found + attribute.size());
   if (!value.starts_with('"') && !value.starts_with('\'')) return std::nullopt;
   const std::size_t end = value.find(value.front(), 1);

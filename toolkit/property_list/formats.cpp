@@ -1,64 +1,23 @@
 // SPDX-License-Identifier: MIT
-// The rows of the table of formats.
+// The table of formats, made of the constants that the files of the formats define.
 #include "qz/property_list/formats.hpp"
 
-#include <algorithm>
-#include <cassert>
-#include <iterator>
+#include <cstddef>
 
-#include "qz/property_list/binary_writer.hpp"
-#include "qz/property_list/xml_writer.hpp"
+#include "toolkit/property_list/format_rows.hpp"
 
 namespace qz::toolkit {
-namespace {
 
-constexpr std::string_view binarySuffixes[] = {".bplist", ".bin"};
-constexpr std::string_view xmlSuffixes[] = {".plist", ".xml"};
-constexpr std::string_view oldStyleSuffixes[] = {".strings"};
-
-constexpr FormatRow formatRows[] = {
-    {.format = Format::binary,
-     .name = "binary",
-     .title = "binary property list",
-     .isText = false,
-     .looksLike = looksLikeBinary,
-     .read = readBinary,
-     .write = writeBinaryPropertyList,
-     .writesSharedOnce = true,
-     .suffixes = binarySuffixes},
-    {.format = Format::xml,
-     .name = "xml",
-     .title = "XML property list",
-     .isText = true,
-     .looksLike = looksLikeXml,
-     .read = readXml,
-     .write = writeXmlPropertyList,
-     .writesSharedOnce = false,
-     .suffixes = xmlSuffixes},
-    {.format = Format::oldStyle,
-     .name = "old-style",
-     .title = "old-style property list",
-     .isText = true,
-     .looksLike = looksLikeOldStyle,
-     .read = readOldStyle,
-     .write = nullptr,
-     .writesSharedOnce = false,
-     .suffixes = oldStyleSuffixes},
-};
-
-static_assert(std::rbegin(formatRows)->isText,
-              "a text that looks like no other format is of the last");
-
-}  // namespace
-
-std::span<const FormatRow> formats() { return formatRows; }
-
-const FormatRow& formatRow(Format format) {
-  const auto* const row = std::find_if(std::begin(formatRows), std::end(formatRows),
-                                       [&](const FormatRow& one) { return one.format == format; });
-  assert(row != std::end(formatRows));
-  return *row;
+std::span<const FormatRow> formats() {
+  static const FormatRow rows[] = {
+#define QZ_FORMAT(name) name##Format,
+#include "qz/property_list/formats.inc"
+#undef QZ_FORMAT
+  };
+  return rows;
 }
+
+const FormatRow& formatRow(Format format) { return formats()[static_cast<std::size_t>(format)]; }
 
 std::string_view description(Format format) { return formatRow(format).title; }
 

@@ -53,8 +53,9 @@ Ref<TextField> QtApplication::makeTextField(const Rect& frame) {
 
 void QtApplication::beginSheet(const Ref<Window>& sheet, const Ref<Window>& parent,
                                const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo) {
-  if (const auto window = QtWindow::of(sheet))
+  if (const auto window = QtWindow::of(sheet)) {
     window->beginAsSheet(QtWindow::of(parent), delegate, contextInfo);
+  }
 }
 
 void QtApplication::endSheet(const Ref<Window>& sheet, long returnCode) {

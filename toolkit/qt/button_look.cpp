@@ -89,8 +89,9 @@ void ButtonLook::setTitle(const AttributedString& title) {
 
 void ButtonLook::giveToWidget(const TextAttributes& attributes) {
   if (attributes.font) button_.setFont(qFont(*attributes.font));
-  if (attributes.foregroundColor)
+  if (attributes.foregroundColor) {
     colors_.emplace(button_, button_.foregroundRole(), *attributes.foregroundColor);
+  }
 }
 
 void ButtonLook::dropTitle() {

@@ -61,7 +61,7 @@ struct Label {
   QSize iconSize;
   Colors colors;
   Qt::Alignment unasked;
-  QFont font;                // for text without a font of its own
+  QFont font;                // for text that sets no font
   std::optional<int> top{};  // the title begins here if it fits; absent: in the middle
 };
 
@@ -311,16 +311,18 @@ void Painting::paintToggleLabel(const QStyleOptionButton& option, const Label& l
     text.rect = label.place;
     painter_.drawControl(radio ? QStyle::CE_RadioButtonLabel : QStyle::CE_CheckBoxLabel, text);
   }
-  if (appearance_.face)
+  if (appearance_.face) {
     paintFocus(option, radio ? QStyle::SE_RadioButtonFocusRect : QStyle::SE_CheckBoxFocusRect);
+  }
 }
 
 void Painting::paintToolButton(const QToolButton& button) {
   QStyleOptionToolButton option;
   (button.*&ToolButtonStyle::initStyleOption)(&option);
   adapt(option);
-  if (!appearance_.title && !appearance_.face)
+  if (!appearance_.title && !appearance_.face) {
     return painter_.drawComplexControl(QStyle::CC_ToolButton, option);
+  }
   QStyleOptionToolButton panel = option;
   panel.text.clear();
   panel.icon = {};
@@ -336,8 +338,9 @@ void Painting::paintToolButton(const QToolButton& button) {
 void Painting::paintToolLabel(QStyleOptionToolButton option, Label label) {
   const bool opensMenu = option.features & QStyleOptionToolButton::HasMenu;
   const bool hasPart = option.features & QStyleOptionToolButton::MenuButtonPopup;
-  if (opensMenu && !hasPart)
+  if (opensMenu && !hasPart) {
     paintArrow(option, QRect(option.rect.bottomRight() - QPoint(9, 9), QSize(7, 7)));
+  }
   if (!appearance_.title) {
     option.rect.adjust(3, 3, -3, -3);
     return painter_.drawControl(QStyle::CE_ToolButtonLabel, option);

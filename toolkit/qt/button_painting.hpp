@@ -15,7 +15,7 @@ namespace qz::toolkit::qt {
 /// What a button shows that its widget does not support.
 struct ButtonAppearance {
   std::optional<AttributedString> title{};
-  QFont titleFont{};  ///< for text without a font of its own
+  QFont titleFont{};  ///< for text that sets no font
   std::optional<Color> face{};
   BezelStyle bezel = BezelStyle::rounded;
   bool pressed = false;   ///< looks held down

@@ -32,8 +32,9 @@ std::shared_ptr<QtWindow> Desk::knownWindow(const QWidget& widget) const {
 
 std::vector<std::shared_ptr<QtWindow>> Desk::windows() const {
   std::vector<std::shared_ptr<QtWindow>> windows;
-  for (const auto& [key, window] : windows_)
+  for (const auto& [key, window] : windows_) {
     if (auto known = window.lock()) windows.push_back(std::move(known));
+  }
   return windows;
 }
 

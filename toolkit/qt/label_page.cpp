@@ -25,8 +25,9 @@ QRect textAreaOf(const QLabel& label) {
   const int margin = label.margin();
   QRect area = label.contentsRect().adjusted(margin, margin, -margin, -margin);
   int indent = label.indent();
-  if (indent < 0 && label.frameWidth() > 0)
+  if (indent < 0 && label.frameWidth() > 0) {
     indent = label.fontMetrics().horizontalAdvance(u'x') / 2 - margin;
+  }
   if (indent <= 0) return area;
   const auto edges = QStyle::visualAlignment(Qt::LayoutDirectionAuto, label.alignment());
   if (edges & Qt::AlignLeft) area.setLeft(area.left() + indent);
@@ -49,8 +50,9 @@ QAbstractTextDocumentLayout::PaintContext contextOf(const QLabel& label) {
   QAbstractTextDocumentLayout::PaintContext context;
   context.palette = option.palette;
   const QPalette::ColorRole role = label.foregroundRole();
-  if (role != QPalette::Text && label.isEnabled())
+  if (role != QPalette::Text && label.isEnabled()) {
     context.palette.setColor(QPalette::Text, context.palette.color(role));
+  }
   return context;
 }
 

@@ -12,10 +12,11 @@ namespace qz::toolkit::qt {
 void QtLog::write(std::string_view line) {
   static const QLoggingCategory category("qz.walkthrough");
   const Sink sink = sink_;  // a copy: the sink may replace itself
-  if (sink)
+  if (sink) {
     sink(line);
-  else
+  } else {
     qCInfo(category).noquote() << qString(line);
+  }
 }
 
 }  // namespace qz::toolkit::qt

@@ -21,8 +21,9 @@ namespace {
 
 QTextCharFormat formatOf(const TextAttributes& attributes, const TextSetting& setting) {
   QTextCharFormat format;
-  if (attributes.font)
+  if (attributes.font) {
     format.setFont(qFont(*attributes.font), QTextCharFormat::FontPropertiesSpecifiedOnly);
+  }
   if (attributes.link) {
     format.setAnchor(true);
     format.setAnchorHref(qString(attributes.link->address()));
@@ -81,8 +82,9 @@ void showIn(QTextDocument& document, const AttributedString& text, const TextSet
     if (!std::exchange(first, false)) cursor.insertBlock();
     cursor.setBlockFormat(blockFormatOf(paragraph, setting));
     cursor.setBlockCharFormat(formatOf(*paragraph.attributes, setting));
-    for (const Piece& piece : paragraph.pieces)
+    for (const Piece& piece : paragraph.pieces) {
       cursor.insertText(piece.text, formatOf(*piece.attributes, setting));
+    }
   }
   document.setUndoRedoEnabled(undo);
 }

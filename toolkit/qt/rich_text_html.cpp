@@ -85,17 +85,20 @@ void writeCss(QString& html, const Font& font, const QFont& otherwise) {
   writeEscaped(html, drawnFamily(font));
   html += "';"_L1;
   writeCss(html, "font-size:"_L1, QString::number(pixelSize(font)), "px;"_L1);
-  if (font.bold || otherwise.bold())
+  if (font.bold || otherwise.bold()) {
     html += font.bold ? "font-weight:700;"_L1 : "font-weight:400;"_L1;
-  if (font.italic || otherwise.italic())
+  }
+  if (font.italic || otherwise.italic()) {
     html += font.italic ? "font-style:italic;"_L1 : "font-style:normal;"_L1;
+  }
 }
 
 void writeCss(QString& html, const TextAttributes& attributes, const TextSetting& setting) {
   if (attributes.font) writeCss(html, *attributes.font, setting.font);
   if (const auto ink = inkOf(attributes, setting)) writeCss(html, "color:rgba("_L1, *ink);
-  if (const auto& ground = attributes.backgroundColor)
+  if (const auto& ground = attributes.backgroundColor) {
     writeCss(html, "background-color:rgba("_L1, inkOf(*ground, setting));
+  }
   if (attributes.link && !attributes.underline) html += "text-decoration:none;"_L1;
 }
 
@@ -142,11 +145,13 @@ void writePiece(QString& html, const Piece& piece, const std::optional<MarkerSto
   }
   const bool styled = writeBetween("<span style=\""_L1, "\">"_L1, html,
                                    [&] { writeCss(html, attributes, setting); });
-  for (const auto& tag : tags)
+  for (const auto& tag : tags) {
     if (tag.holds) html += tag.opening;
+  }
   writeText(html, stops ? writeMarker(html, piece, *stops, setting) : QStringView(piece.text));
-  for (auto tag = std::rbegin(tags); tag != std::rend(tags); ++tag)
+  for (auto tag = std::rbegin(tags); tag != std::rend(tags); ++tag) {
     if (tag->holds) html += tag->closing;
+  }
   if (styled) html += "</span>"_L1;
   if (attributes.link) html += "</a>"_L1;
 }
@@ -177,8 +182,9 @@ void writeCss(QString& html, const Paragraph& paragraph, const BlockSetting& blo
     writeCss(html, *paragraph.attributes, setting);
   }
   if (std::any_of(paragraph.pieces.begin(), paragraph.pieces.end(),
-                  [](const Piece& piece) { return hasBlanksToKeep(piece.text); }))
+                  [](const Piece& piece) { return hasBlanksToKeep(piece.text); })) {
     html += "white-space:pre-wrap;"_L1;
+  }
   const bool leftwards = directionOf(paragraph, setting) == Qt::RightToLeft;
   writeCss(html, leftwards ? "margin-right:"_L1 : "margin-left:"_L1, block.before);
   writeCss(html, "text-indent:"_L1, block.firstLine);
@@ -202,8 +208,9 @@ void writeParagraph(QString& html, const Paragraph& paragraph, const TextSetting
   html += u'>';
   if (paragraph.pieces.empty()) html += "<br/>"_L1;
   auto stops = markerStopsOf(block);
-  for (const Piece& piece : paragraph.pieces)
+  for (const Piece& piece : paragraph.pieces) {
     writePiece(html, piece, std::exchange(stops, std::nullopt), setting);
+  }
   html += "</div>"_L1;
 }
 
@@ -214,8 +221,9 @@ void writeParagraph(QString& html, const Paragraph& paragraph, const TextSetting
 QString htmlOf(const AttributedString& text, const TextSetting& setting) {
   QString html;
   html.reserve(static_cast<qsizetype>(text.string().size()) + 200);  // enough for a few styles
-  for (const Paragraph& paragraph : paragraphsOf(text, setting.dropsLastLineEnd))
+  for (const Paragraph& paragraph : paragraphsOf(text, setting.dropsLastLineEnd)) {
     writeParagraph(html, paragraph, setting);
+  }
   return html;
 }
 

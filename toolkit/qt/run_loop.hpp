@@ -30,7 +30,8 @@ class QtRunLoop final : public TimedRunLoop {
 
   /// Fires due timers and sets the Qt timer again, as the clock's speed may have changed.
   void wake();
-  /// Sets the Qt timer to the timer that is due first. Must be called when the clock's pace changes.
+  /// Sets the Qt timer to the timer that is due first. Must be called when the clock's pace
+  /// changes.
   void setAlarm();
 
  private:

@@ -26,8 +26,9 @@ namespace {
 /// Returns the document of a text edit or plain text edit; null for other widgets.
 QTextDocument* documentOf(const QWidget& widget) {
   if (const auto* const edit = qobject_cast<const QTextEdit*>(&widget)) return edit->document();
-  if (const auto* const edit = qobject_cast<const QPlainTextEdit*>(&widget))
+  if (const auto* const edit = qobject_cast<const QPlainTextEdit*>(&widget)) {
     return edit->document();
+  }
   return nullptr;
 }
 
@@ -40,8 +41,9 @@ bool endsLine(QChar c) {
 /// Returns the text with no-break spaces, which `toPlainText` would replace.
 QString textOf(const QTextDocument& document) {
   QString text = document.toRawText();
-  for (QChar& c : text)
+  for (QChar& c : text) {
     if (endsLine(c)) c = u'\n';
+  }
   return text;
 }
 
@@ -129,10 +131,12 @@ class TextLook final : public QObject {
 
  private:
   void putOn() {
-    if (auto* const line = qobject_cast<QLineEdit*>(&widget_))
+    if (auto* const line = qobject_cast<QLineEdit*>(&widget_)) {
       dress_.putOn(*line, text_, setting());
-    if (auto* const edit = qobject_cast<QPlainTextEdit*>(&widget_))
+    }
+    if (auto* const edit = qobject_cast<QPlainTextEdit*>(&widget_)) {
       dress_.putOn(*edit, text_, setting());
+    }
   }
 
   void redraw() {
@@ -169,8 +173,9 @@ class TextLook final : public QObject {
     const bool edited = documentOf(widget_);
     setting.link = palette.color(QPalette::Active, QPalette::Link);
     setting.ground = palette.color(edited ? QPalette::Base : widget_.backgroundRole());
-    if (setting.greyed)
+    if (setting.greyed) {
       setting.ink = palette.color(edited ? QPalette::Text : widget_.foregroundRole());
+    }
   }
 
   void draw() {

@@ -69,8 +69,9 @@ bool UserTracking::eventFilter(QObject* receiver, QEvent* event) {
       if (held_ && receiver == held_->window()) letGo();
       break;
     case QEvent::Hide:
-      if (receiver->isWidgetType() && static_cast<const QWidget*>(receiver)->isWindow())
+      if (receiver->isWidgetType() && static_cast<const QWidget*>(receiver)->isWindow()) {
         mayBeOver_();
+      }
       break;
     default:
       break;

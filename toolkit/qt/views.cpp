@@ -90,10 +90,11 @@ State QtButton::state() const {
 
 void QtButton::setState(State state) {
   if (!button()) return;
-  if (button()->isCheckable())
+  if (button()->isCheckable()) {
     setCheckState(*button(), state);
-  else
+  } else {
     heldState_ = state == State::mixed ? State::on : state;
+  }
   changed();
 }
 

@@ -118,8 +118,9 @@ const Subviews& WidgetNode::readSubviews() {
   Subviews fresh;
   listed_.clear();
   if (widget_) {
-    for (QObject* const child : widget_->children())
+    for (QObject* const child : widget_->children()) {
       if (isSubview(child)) listed_.emplace_back(static_cast<QWidget*>(child));
+    }
     for (const auto& child : listed_) fresh.push_back(desk_->viewOf(*child));
   }
   subviews_.swap(fresh);
@@ -174,10 +175,11 @@ bool WidgetNode::isHidden() const {
 void WidgetNode::hide(bool hidden) {
   if (!widget_) return;
   if (hidden) giveFocusAway(*widget_);
-  if (isOutside())
+  if (isOutside()) {
     hiddenOutside_ = hidden;
-  else
+  } else {
     widget_->setVisible(!hidden);
+  }
   changed();
 }
 

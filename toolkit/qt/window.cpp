@@ -36,8 +36,9 @@ Qt::WindowFlags flagsOf(StyleMask style) {
   const auto bits = static_cast<unsigned>(style);
   Qt::WindowFlags flags = Qt::Window | Qt::CustomizeWindowHint;
   if (bits & static_cast<unsigned>(StyleMask::titled)) flags |= Qt::WindowTitleHint;
-  if (bits & static_cast<unsigned>(StyleMask::closable))
+  if (bits & static_cast<unsigned>(StyleMask::closable)) {
     flags |= Qt::WindowSystemMenuHint | Qt::WindowCloseButtonHint;
+  }
   return flags;
 }
 
@@ -55,9 +56,10 @@ class QtWindow::Watch final : public QObject {
         break;
       case QEvent::Hide:
         // Queued, because its effects may delete the window while Qt is still hiding it.
-        if (!event->spontaneous())
+        if (!event->spontaneous()) {
           QMetaObject::invokeMethod(
               this, [this] { window_.wasHidden(); }, Qt::QueuedConnection);
+        }
         break;
       // Before the first painting it is the desktop that moves the window.
       case QEvent::Move:
@@ -131,10 +133,11 @@ void QtWindow::setBackgroundColor(const Color& color) {
 }
 
 void QtWindow::show() {
-  if (widget_->isMinimized())
+  if (widget_->isMinimized()) {
     widget_->showNormal();
-  else
+  } else {
     widget_->show();
+  }
   // Windows off the screen have no order, and Qt prints a warning about raise().
   if (QGuiApplication::platformName() != "offscreen") widget_->raise();
   widget_->activateWindow();
@@ -144,8 +147,9 @@ void QtWindow::makeKeyAndOrderFront() {
   if (!widget_) return;
   if (keptBy_ == KeptBy::application) desk_->keep(shared_from_this());
   show();
-  for (const auto& other : desk_->windows())
+  for (const auto& other : desk_->windows()) {
     if (other->sheetParent().get() == this) other->makeKeyAndOrderFront();
+  }
 }
 
 void QtWindow::orderOut() {

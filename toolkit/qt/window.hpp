@@ -59,7 +59,7 @@ class QtWindow final : public Window, public std::enable_shared_from_this<QtWind
 
   /// Shows the window attached to `parent`, which may be null. If that would attach the window to
   /// itself, even indirectly, shows it unattached. If it begins again before its end, only the
-  /// latest delegate is told.
+  /// latest delegate learns of the end.
   void beginAsSheet(const std::shared_ptr<QtWindow>& parent,
                     const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo);
   /// Ends the sheet and tells the delegate, unless the sheet has ended already. Tells it even if

@@ -10,9 +10,8 @@ class QWidget;
 
 namespace qz::toolkit::qt {
 
-/// Gives the window a background colour. Widgets in it without colours of their own (labels, check
-/// boxes, links) get a text colour that is readable there: contrast at least 4.5 : 1, WCAG level
-/// AA.
+/// Gives the window a background colour. Widgets in it that set no colours (labels, check boxes,
+/// links) get a text colour that is readable there: contrast at least 4.5 : 1, WCAG level AA.
 void setWindowColor(QWidget& window, const Color& color);
 /// Returns the visible background colour.
 Color windowColor(const QWidget& window);

@@ -49,8 +49,9 @@ inline std::optional<double> takeNumber(std::string_view& text) {
   const bool negative = text.starts_with('-');
   const std::string_view digits = negative || text.starts_with('+') ? text.substr(1) : text;
   // Without this check from_chars would accept a second sign, "inf" and "nan".
-  if (digits.empty() || (!text::isDigit(digits.front()) && digits.front() != '.'))
+  if (digits.empty() || (!text::isDigit(digits.front()) && digits.front() != '.')) {
     return std::nullopt;
+  }
   double number = 0;
   const auto [end, error] = std::from_chars(digits.data(), digits.data() + digits.size(), number,
                                             std::chars_format::fixed);

@@ -152,8 +152,9 @@ std::vector<std::string_view> ownWords(const std::vector<std::string>& expected)
     if (mismatch.word != furthest) continue;
     if (mismatch.reason) throw SyntaxError(*mismatch.reason);
     for (const auto& one : mismatch.expected) {
-      if (std::find(expected.begin(), expected.end(), one) == expected.end())
+      if (std::find(expected.begin(), expected.end(), one) == expected.end()) {
         expected.push_back(one);
+      }
     }
   }
   const bool atEnd = furthest == words.size();

@@ -121,8 +121,9 @@ class Lexer {
     if (peek() == '[' || peek() == '{') return json();
     Word word{Word::Kind::bare, {}, {}, at_};
     while (!atWordEnd()) {
-      if (peek() == '"')
+      if (peek() == '"') {
         throw SyntaxError(at_, "a quotation mark inside a word; put a space before it");
+      }
       word.text += take();
     }
     return word;
@@ -163,8 +164,9 @@ class Lexer {
     }
     escape += take();
     for (int digits = 0; escape[1] == 'u' && digits < 4; ++digits) {
-      if (!text::isHexadecimalDigit(peek()))
+      if (!text::isHexadecimalDigit(peek())) {
         throw SyntaxError(at, "expected four hexadecimal digits after \\u");
+      }
       escape += take();
     }
     return escape;

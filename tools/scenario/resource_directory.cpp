@@ -66,8 +66,9 @@ void ResourceDirectory::write(const std::string& name, std::string_view contents
   std::ofstream stream(file, std::ios::binary);
   stream.write(contents.data(), static_cast<std::streamsize>(contents.size()));
   stream.close();
-  if (!stream)
+  if (!stream) {
     throw Unmet("the file " + name + " in the resource directory", "an error writing it");
+  }
 }
 
 void ResourceDirectory::writeImage(const std::string& name) const {

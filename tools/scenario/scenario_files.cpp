@@ -53,8 +53,9 @@ ReadFiles readScenarios(const std::vector<std::string>& paths) {
   for (const auto& path : paths) {
     std::string problem;
     auto found = fs::is_directory(path) ? scenariosBelow(path, problem) : std::vector{path};
-    if (!fs::exists(path))
+    if (!fs::exists(path)) {
       problem = path + ": no such file or directory; expected a scenario file (.walk)";
+    }
     if (!problem.empty()) {
       read.problems.push_back(problem);
       continue;

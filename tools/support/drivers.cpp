@@ -2,77 +2,62 @@
 // The table of the toolkits.
 #include "tools/support/drivers.hpp"
 
+#include <algorithm>
 #include <string>
 
-#include "drivers/memory/memory_driver.hpp"
-#if QZ_QT
-#include "drivers/qt/make_driver.hpp"
-#endif
 #include "tools/support/failure.hpp"
 #include "tools/support/suggestions.hpp"
+#include "tools/support/toolkit_rows.hpp"
 
 namespace qz::tools {
 namespace {
 
-using MakeDriver = std::unique_ptr<drivers::Driver> (*)();
+std::vector<ToolkitRow> rowsByPlace() {
+  auto rows = toolkitRows();
+  std::stable_sort(rows.begin(), rows.end(),
+                   [](const ToolkitRow& a, const ToolkitRow& b) { return a.place < b.place; });
+  return rows;
+}
 
-#if QZ_QT
-constexpr MakeDriver makeQt = drivers::makeQtDriver;
-#else
-constexpr MakeDriver makeQt = nullptr;
-#endif
-
-// The first is the one for tests and programs: every build has it.
-constexpr ToolkitRow toolkitRows[] = {
-    {.name = "memory",
-     .description = "records everything, without a display",
-     .howToGet = "",
-     .hasDisplay = false,
-     .make = drivers::makeMemoryDriver},
-    {.name = "qt",
-     .description = "windows of Qt 6 Widgets",
-     .howToGet = "this build is without Qt; install Qt 6.4 Widgets or later (scripts/setup qt, on "
-                 "Debian), then configure and build again",
-     .hasDisplay = true,
-     .make = makeQt},
-    // Scenarios can name it; no build has it yet.
-    {.name = "appkit",
-     .description = "windows of AppKit",
-     .howToGet = "",
-     .hasDisplay = true,
-     .make = nullptr},
-};
+// The first toolkit of this build with or without a display, or null.
+const ToolkitRow* firstThat(bool hasDisplay) {
+  for (const ToolkitRow& row : toolkits()) {
+    if (row.make && row.hasDisplay == hasDisplay) return &row;
+  }
+  return nullptr;
+}
 
 }  // namespace
 
-std::span<const ToolkitRow> toolkits() { return toolkitRows; }
+std::span<const ToolkitRow> toolkits() {
+  static const std::vector<ToolkitRow> rows = rowsByPlace();
+  return rows;
+}
 
 std::vector<std::string_view> toolkitNames() {
   std::vector<std::string_view> names;
-  for (const ToolkitRow& row : toolkitRows) names.push_back(row.name);
+  for (const ToolkitRow& row : toolkits()) names.push_back(row.name);
   return names;
 }
 
 std::vector<std::string_view> driverNames() {
   std::vector<std::string_view> names;
-  for (const ToolkitRow& row : toolkitRows) {
+  for (const ToolkitRow& row : toolkits()) {
     if (row.make) names.push_back(row.name);
   }
   return names;
 }
 
-std::string testToolkit() { return std::string(toolkitRows[0].name); }
+std::string testToolkit() { return std::string(firstThat(false)->name); }
 
 std::string playerToolkit() {
-  for (const ToolkitRow& row : toolkitRows) {
-    if (row.make && row.hasDisplay) return std::string(row.name);
-  }
-  return testToolkit();
+  const ToolkitRow* row = firstThat(true);
+  return row ? std::string(row->name) : testToolkit();
 }
 
 std::string toolkitHelp() {
   std::string help;
-  for (const ToolkitRow& row : toolkitRows) {
+  for (const ToolkitRow& row : toolkits()) {
     if (!row.make) continue;
     help += help.empty() ? "" : ", ";
     help += std::string(row.name) + " (" + std::string(row.description) + ")";
@@ -81,7 +66,7 @@ std::string toolkitHelp() {
 }
 
 std::unique_ptr<drivers::Driver> makeDriver(std::string_view name) {
-  for (const ToolkitRow& row : toolkitRows) {
+  for (const ToolkitRow& row : toolkits()) {
     if (row.name == name && row.make) return row.make();
   }
   return nullptr;
@@ -89,10 +74,10 @@ std::unique_ptr<drivers::Driver> makeDriver(std::string_view name) {
 
 std::unique_ptr<drivers::Driver> requireDriver(std::string_view name) {
   if (auto driver = makeDriver(name)) return driver;
-  for (const ToolkitRow& row : toolkitRows) {
-    if (row.name != name || row.howToGet.empty()) continue;
-    throw Failure(ExitStatus::badInput,
-                  "no toolkit " + std::string(name) + ": " + std::string(row.howToGet));
+  for (const ToolkitRow& row : toolkits()) {
+    if (row.name != name) continue;
+    throw Failure(ExitStatus::badInput, "this build does not include the toolkit " +
+                                            std::string(name) + ": " + std::string(row.howToGet));
   }
   const auto known = driverNames();
   throw Failure(ExitStatus::badInput,

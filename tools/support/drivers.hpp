@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The table of the toolkits, of which a build of the tool has some. A new toolkit is one row in
-// drivers.cpp.
+// The table of the toolkits, of which a build of the tool has some. The row of a toolkit is in
+// drivers/NAME/toolkit_row.hpp.
 #pragma once
 
 #include <memory>
@@ -10,21 +10,13 @@
 #include <vector>
 
 #include "drivers/driver.hpp"
+#include "drivers/toolkit_row.hpp"
 
 namespace qz::tools {
 
-/// What is known of a toolkit.
-struct ToolkitRow {
-  std::string_view name;         ///< for `--toolkit` and in scenarios
-  std::string_view description;  ///< for the help
-  /// Says how to get the toolkit if this build lacks it; empty if nobody can get it.
-  std::string_view howToGet;
-  bool hasDisplay;  ///< whether its windows have pixels
-  /// Makes a driver with its own toolkit; null if this build is without the toolkit.
-  std::unique_ptr<drivers::Driver> (*make)();
-};
+using drivers::ToolkitRow;
 
-/// Returns all toolkits, also those that this build is without.
+/// Returns all toolkits in the order of their places, also those that this build is without.
 std::span<const ToolkitRow> toolkits();
 
 /// Returns the names of all toolkits, which scenarios accept.

@@ -30,8 +30,9 @@ void readWindow(const PlistEntry& entry, HostWindow& host) {
 
 drivers::ViewKind readKind(const PlistEntry& entry) {
   const std::string name = entry.requiredText("class");
-  if (name == toolkit::class_names::window)
+  if (name == toolkit::class_names::window) {
     entry.fail("class", "a control (the window is the first entry)");
+  }
   const auto kind = drivers::viewKindNamed(name);
   if (!kind) {
     std::string names = "one of " + std::string(toolkit::class_names::window);

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The table of the property-list formats, which readers, writers and tools share. A new format is
-// an enumerator, a row in formats.cpp, and the files of its reader and writer.
+// The table of the property-list formats, which readers, writers and tools share. A new format is a
+// row of formats.inc, and its own files.
 #pragma once
 
 #include <cstdint>
@@ -14,7 +14,12 @@
 
 namespace qz::toolkit {
 
-enum class Format : std::uint8_t { binary, xml, oldStyle };
+/// The formats, in the order in which they are tried.
+enum class Format : std::uint8_t {
+#define QZ_FORMAT(name) name,
+#include "qz/property_list/formats.inc"
+#undef QZ_FORMAT
+};
 
 /// What is known of a format.
 struct FormatRow {

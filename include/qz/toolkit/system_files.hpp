@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Files of the operating system, for toolkits whose platform has no file access of its own.
+// Files of the operating system, for toolkits whose platform has no other file access.
 #pragma once
 
 #include <optional>

@@ -28,8 +28,8 @@ class Toolkit {
   virtual Files& files() = 0;
   virtual Log& log() = 0;
 
-  /// Converts an HTML document to styled text; absent if it cannot be read. A platform with an HTML
-  /// reader of its own overrides this; the default is the reader in styled_text/.
+  /// Converts an HTML document to styled text; absent if it cannot be read. A platform that has an
+  /// HTML reader overrides this; the default is the reader in styled_text/.
   virtual std::optional<AttributedString> attributedStringWithHTML(std::string_view document);
 };
 

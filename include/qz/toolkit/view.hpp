@@ -144,7 +144,7 @@ class TextField : public Control {
   static TextField& nothing();
   TextField* asTextField() override { return this; }
 
-  /// Sets the text: a text field has no title of its own.
+  /// Sets the text: a text field has no separate title.
   virtual void setTitle(std::string_view title) = 0;
   /// Sets the object that is notified of editing. Not kept alive.
   virtual void setDelegate(const std::shared_ptr<Responder>& delegate) = 0;

@@ -1,0 +1,177 @@
+// SPDX-License-Identifier: MIT
+// Writes completion scripts. Each script lists what every command accepts, so that completing does
+// not run the tool.
+#include "tools/completion_scripts.hpp"
+
+#include <utility>
+
+namespace qz::tools {
+namespace {
+
+std::string joined(const std::vector<std::string>& words) {
+  std::string line;
+  for (const std::string& word : words) line += (line.empty() ? "" : " ") + word;
+  return line;
+}
+
+/// Returns the text in single quotes; `quote` is how a quote within it is written.
+std::string quoted(const std::string& text, std::string_view quote) {
+  std::string result = "'";
+  for (const char c : text) result += c == '\'' ? std::string(quote) : std::string(1, c);
+  return result + "'";
+}
+
+std::string replaced(std::string text, std::string_view mark, const std::string& by) {
+  return text.replace(text.find(mark), mark.size(), by);
+}
+
+// --- bash ---
+
+constexpr std::string_view bashScript =
+    R"(# Completes qz-walkthrough:  source <(qz-walkthrough completion bash)
+_qz_walkthrough_words() { mapfile -t COMPREPLY < <(compgen -W "$1" -- "$current"); }
+
+_qz_walkthrough_paths() {  # -f for files, -d for directories
+  compopt -o filenames 2>/dev/null
+  mapfile -t COMPREPLY < <(compgen "$1" -- "$current")
+}
+
+_qz_walkthrough() {
+  local current=${COMP_WORDS[COMP_CWORD]} previous=${COMP_WORDS[COMP_CWORD - 1]}
+  COMPREPLY=()
+  # Bash divides --option=value into three words.
+  if [[ $current == "=" ]]; then
+    current=
+  elif [[ $previous == "=" ]]; then
+    previous=${COMP_WORDS[COMP_CWORD - 2]}
+  fi
+  if ((COMP_CWORD == 1)); then
+    _qz_walkthrough_words "@commands@ --help --version"
+    return
+  fi
+  case "${COMP_WORDS[1]} $previous" in
+@values@  esac
+  case "${COMP_WORDS[1]}" in
+@words@  esac
+}
+complete -F _qz_walkthrough qz-walkthrough
+)";
+
+std::string bashReply(const ValueHint& value) {
+  if (!value.choices.empty()) return "_qz_walkthrough_words \"" + joined(value.choices) + "\"";
+  if (value.isFile) return "_qz_walkthrough_paths -f";
+  return value.isDirectory ? "_qz_walkthrough_paths -d" : ":";
+}
+
+std::string bash(const std::vector<CommandOutline>& commands) {
+  std::vector<std::string> names;
+  std::string values;
+  std::string words;
+  for (const CommandOutline& command : commands) {
+    names.push_back(command.name);
+    std::vector<std::string> options;
+    for (const OptionOutline& option : command.options) {
+      options.push_back(option.name);
+      if (!option.takesValue) continue;
+      values += "    \"" + command.name + " " + option.name + "\") " + bashReply(option.value) +
+                "; return ;;\n";
+    }
+    words += "    " + command.name + ") if [[ $current == -* ]]; then _qz_walkthrough_words \"" +
+             joined(options) + "\"; else " + bashReply(command.arguments) + "; fi ;;\n";
+  }
+  std::string script = replaced(std::string(bashScript), "@commands@", joined(names));
+  script = replaced(std::move(script), "@values@", values);
+  return replaced(std::move(script), "@words@", words);
+}
+
+// --- zsh ---
+
+constexpr std::string_view zshScript =
+    R"(# Completes qz-walkthrough:  source <(qz-walkthrough completion zsh), after compinit
+_qz_walkthrough() {
+  local -a commands=(
+@commands@  )
+  if ((CURRENT == 2)); then
+    _describe command commands
+    return
+  fi
+  shift words
+  ((CURRENT -= 1))
+  case $words[1] in
+@words@  esac
+}
+compdef _qz_walkthrough qz-walkthrough
+)";
+
+std::string zshQuoted(const std::string& text) { return quoted(text, "'\\''"); }
+
+std::string zshAction(const ValueHint& value) {
+  if (!value.choices.empty()) return "(" + joined(value.choices) + ")";
+  if (value.isFile) return "_files";
+  return value.isDirectory ? "_files -/" : " ";
+}
+
+std::string zshOption(const OptionOutline& option) {
+  std::string text = option.isRepeated ? "*" : "";
+  text += option.name + (option.takesValue ? "=" : "") + "[" + option.help + "]";
+  if (option.takesValue) text += ":value:" + zshAction(option.value);
+  return zshQuoted(text);
+}
+
+std::string zsh(const std::vector<CommandOutline>& commands) {
+  std::string names;
+  std::string words;
+  for (const CommandOutline& command : commands) {
+    names += "    " + zshQuoted(command.name + ":" + command.summary) + "\n";
+    words += "    " + command.name + ") _arguments";
+    for (const OptionOutline& option : command.options) words += " " + zshOption(option);
+    words += " " + zshQuoted("*:argument:" + zshAction(command.arguments)) + " ;;\n";
+  }
+  return replaced(replaced(std::string(zshScript), "@commands@", names), "@words@", words);
+}
+
+// --- fish ---
+
+std::string fishQuoted(const std::string& text) { return quoted(text, "\\'"); }
+
+std::string fishValue(const ValueHint& value) {
+  if (!value.choices.empty()) return " -x -a " + fishQuoted(joined(value.choices));
+  if (value.isFile) return " -r -F";
+  return value.isDirectory ? " -x -a '(__fish_complete_directories)'" : " -x";
+}
+
+std::string fishArguments(const ValueHint& value) {
+  if (!value.choices.empty()) return " -a " + fishQuoted(joined(value.choices));
+  return value.isFile ? " -F" : "";
+}
+
+std::string fish(const std::vector<CommandOutline>& commands) {
+  const std::string complete = "complete -c qz-walkthrough";
+  std::string script = "# Completes qz-walkthrough:  qz-walkthrough completion fish | source\n" +
+                       complete + " -f\n" + complete +
+                       " -n __fish_use_subcommand -l help -d 'Print the help'\n" + complete +
+                       " -n __fish_use_subcommand -l version -d 'Print the version'\n";
+  for (const CommandOutline& command : commands) {
+    const std::string here = complete + " -n '__fish_seen_subcommand_from " + command.name + "'";
+    script += complete + " -n __fish_use_subcommand -a " + command.name + " -d " +
+              fishQuoted(command.summary) + "\n" + here + fishArguments(command.arguments) + "\n";
+    for (const OptionOutline& option : command.options) {
+      script += here + " -l " + option.name.substr(2) +
+                (option.takesValue ? fishValue(option.value) : "") + " -d " +
+                fishQuoted(option.help) + "\n";
+    }
+  }
+  return script;
+}
+
+constexpr CompletionShell shells[] = {
+    {.name = "bash", .script = bash},
+    {.name = "zsh", .script = zsh},
+    {.name = "fish", .script = fish},
+};
+
+}  // namespace
+
+std::span<const CompletionShell> completionShells() { return shells; }
+
+}  // namespace qz::tools
