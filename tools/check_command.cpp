@@ -34,15 +34,17 @@ struct CommandOptions {
 
 std::size_t positive(const std::string& option, const std::string& text) {
   const auto number = walkthrough::parseNumber<std::size_t>(text);
-  if (!number || *number == 0)
+  if (!number || *number == 0) {
     throw UsageError(option + ": expected a whole number above 0, found " + quote(text));
+  }
   return *number;
 }
 
 double positiveReal(const std::string& option, const std::string& text) {
   const auto number = walkthrough::parseNumber<double>(text);
-  if (!number || !(*number > 0))
+  if (!number || !(*number > 0)) {
     throw UsageError(option + ": expected a number above 0, found " + quote(text));
+  }
   return *number;
 }
 
@@ -91,8 +93,9 @@ int runCheck(const CommandOptions& options) {
   }
   std::vector<check::Report> reports;
   auto file = files.begin();
-  for (const auto& verdict : verdicts)
+  for (const auto& verdict : verdicts) {
     reports.push_back({verdict, *file++, stageArguments(options.check)});
+  }
   format.write(reports, outputShowsColor(), std::cout);
   return statusOf(verdicts, options.failOn);
 }
@@ -160,8 +163,9 @@ void addExploringOptions(Command& command, CheckOptions& options) {
 
 void setFailOn(CommandOptions& options, const std::string& name) {
   const auto severity = check::severityNamed(name);
-  if (!severity)
+  if (!severity) {
     throw UsageError("--fail-on: expected error, warning or note, found " + quote(name));
+  }
   options.failOn = *severity;
 }
 

@@ -80,22 +80,22 @@ Opinion ours(const naive::Generated& generated, const std::vector<std::string>& 
   plan.host = generated.host;
   const Setting setting = settingOf(script, plan, "/");
   Exploration exploration(setting, keys);
-  exploration.run({.places = 1'000'000, .seconds = {}}, 1, [](const Progress&) {},
-                  [] { return false; });
-  Opinion opinion{.places = {},
-                  .presses = exploration.presses(),
-                  .waits = exploration.waits(),
-                  .findings = {}};
-  for (std::uint32_t i = 0; i < exploration.places(); ++i)
+  exploration.run(
+      {.places = 1'000'000, .seconds = {}}, 1, [](const Progress&) {}, [] { return false; });
+  Opinion opinion{
+      .places = {}, .presses = exploration.presses(), .waits = exploration.waits(), .findings = {}};
+  for (std::uint32_t i = 0; i < exploration.places(); ++i) {
     opinion.places.insert(wordsOf(exploration, i));
+  }
   drivers::MemoryDriver driver;
   auto all = conclude(exploration, readScript(script, driver.toolkit()), false, 1);
   const auto looks = concludeFromLooks(exploration, {});
   all.insert(all.end(), looks.begin(), looks.end());
-  for (const Finding& each : all)
+  for (const Finding& each : all) {
     opinion.findings.emplace(Cause(each.code, each.list.value_or(""),
                                    each.element.value_or(noElement), each.tag.value_or(0)),
                              each.path.size());
+  }
   return opinion;
 }
 
@@ -134,18 +134,19 @@ TEST(Agreement, OnGeneratedScripts) {
     if (!theirs.complete) continue;
     const Opinion own = ours(generated, keys);
     std::map<Cause, std::size_t> others;
-    for (const naive::Finding& each : theirs.findings)
-      if (counts(each, theirs)) others.emplace(Cause(each.code, each.list, each.element.value_or(noElement),
-                           each.tag.value_or(0)),
-                     each.pathLength);
+    for (const naive::Finding& each : theirs.findings) {
+      if (counts(each, theirs))
+        others.emplace(
+            Cause(each.code, each.list, each.element.value_or(noElement), each.tag.value_or(0)),
+            each.pathLength);
+    }
     EXPECT_EQ(own.places, theirs.places) << "seed " << seed;
     EXPECT_EQ(own.presses, theirs.presses) << "seed " << seed;
     EXPECT_EQ(own.waits, theirs.waits) << "seed " << seed;
     if (own.findings == others) continue;
     ++disagreements;
     ADD_FAILURE() << "seed " << seed << "\n"
-                  << generated.script->description()
-                  << "\nours:\n"
+                  << generated.script->description() << "\nours:\n"
                   << words(own.findings) << "second opinion:\n"
                   << words(others);
   }

@@ -34,8 +34,9 @@ inline std::set<std::string> codesOf(const Verdict& verdict, Severity least = Se
 /// Returns the messages of the findings, for a failing test.
 inline std::string messagesOf(const Verdict& verdict) {
   std::string text;
-  for (const Finding& finding : verdict.findings)
+  for (const Finding& finding : verdict.findings) {
     text += finding.list.value_or("-") + ": " + finding.message + " [" + finding.code + "]\n";
+  }
   return text;
 }
 

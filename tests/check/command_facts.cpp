@@ -11,11 +11,13 @@ CommandFacts::CommandFacts(Script script, std::vector<drivers::ViewKind> kinds)
 
 void CommandFacts::note(const Trace& trace, std::size_t pathLength) {
   for (const CommandRun& run : trace.commands) note(run, pathLength);
-  for (const toolkit::Tag tag : trace.sharedPresses)
+  for (const toolkit::Tag tag : trace.sharedPresses) {
     known_.add({"same-tag", "", std::nullopt, tag, pathLength});
+  }
   if (trace.endless) known_.add("endless-chain", *trace.endless, std::nullopt, pathLength);
-  for (const BriefText& text : trace.brief)
+  for (const BriefText& text : trace.brief) {
     known_.add("too-brief", text.site, text.tag, pathLength);
+  }
   lists_.insert(trace.lists.begin(), trace.lists.end());
   for (const TimerStart& start : trace.started) started_[start].add(pathLength);
   for (const TimerStart& start : trace.fired) fired_.insert(start.site);
@@ -40,8 +42,9 @@ void CommandFacts::noteSearch(const CommandRun& run, Element& element,
       run.command->positionOf(ParameterType::controlOrListTag).has_value();  // a list will do
   if (!run.found && isTimer && script_->objectForKey(std::to_string(*run.tag))) return;
   (run.found ? element.found : element.notFound).add(pathLength);
-  if (run.found && !suits(run.command->target, kinds_[*run.found]))
+  if (run.found && !suits(run.command->target, kinds_[*run.found])) {
     element.wrongKind.add(pathLength);
+  }
 }
 
 void CommandFacts::report(bool complete, Findings& findings) const {
@@ -55,13 +58,16 @@ void CommandFacts::report(bool complete, Findings& findings) const {
 // A control that was not found in some runs only is worth a note, which further runs do not refute.
 void CommandFacts::reportElement(const Site& site, const Element& element, bool complete,
                                  Findings& findings) const {
-  if (element.notFound.times > 0 && (complete || element.found.times > 0))
+  if (element.notFound.times > 0 && (complete || element.found.times > 0)) {
     findings.add("no-target", site, element.tag, element.notFound.pathLength);
+  }
   if (!complete) return;
-  if (element.wrongKind.times > 0 && element.wrongKind.times == element.found.times)
+  if (element.wrongKind.times > 0 && element.wrongKind.times == element.found.times) {
     findings.add("wrong-target", site, element.tag, element.wrongKind.pathLength);
-  if (element.refused.times > 0 && element.accepted.times == 0)
+  }
+  if (element.refused.times > 0 && element.accepted.times == 0) {
     findings.add("flash-decided", site, element.tag, element.refused.pathLength);
+  }
 }
 
 void CommandFacts::reportTimers(Findings& findings) const {
@@ -74,8 +80,9 @@ void CommandFacts::reportTimers(Findings& findings) const {
 void CommandFacts::reportLists(Findings& findings) const {
   for (const auto& entry : script_->entries()) {
     const std::string key = entry.key->description();
-    if (toolkit::asArray(entry.value) && !lists_.contains(key))
+    if (toolkit::asArray(entry.value) && !lists_.contains(key)) {
       findings.add({"never-runs", key, std::nullopt, std::nullopt, 0});
+    }
   }
 }
 

@@ -7,8 +7,9 @@ namespace qz::naive {
 Endings::Endings(const Script& script, const HostWindow& host) {
   const World world(script, host);
   before_ = world.pictures();
-  for (std::size_t i = 0; i < before_.size(); ++i)
+  for (std::size_t i = 0; i < before_.size(); ++i) {
     looksBefore_.push_back(world.lookOf(before_[i], i, numbers_));
+  }
   left_.resize(before_.size());
 }
 
@@ -21,8 +22,9 @@ void Endings::note(const World& world, std::size_t pathLength) {
       const auto element = by ? std::optional(by->element) : std::nullopt;
       tags_.add({"tag-left", by ? by->list : "", element, own, pathLength});
     }
-    if (isChanged(world, now[i], i))
+    if (isChanged(world, now[i], i)) {
       left_[i].add({"left-behind", world.history().endList, std::nullopt, own, pathLength});
+    }
   }
 }
 

@@ -19,10 +19,12 @@ std::vector<std::string> otherAspects(const World& world) {
   for (const auto& [key, flag] : world.flashMarks()) flashing += "," + key + (flag ? "=1" : "=0");
   std::vector<std::string> aspects = {flashing};
   const History& history = world.history();
-  for (std::size_t i = 0; i < history.taggedBy.size(); ++i)
+  for (std::size_t i = 0; i < history.taggedBy.size(); ++i) {
     aspects.push_back("tag" + std::to_string(i) + ":" + textOf(history.taggedBy[i]));
-  for (const auto& [key, start] : history.starters)
+  }
+  for (const auto& [key, start] : history.starters) {
     aspects.push_back("timer" + key + ":" + textOf(start.site));
+  }
   const auto controls = world.pictures();
   for (std::size_t i = 0; i < controls.size(); ++i) {
     if (std::isinf(history.textAge[i])) continue;
@@ -51,8 +53,9 @@ bool Looks::note(std::size_t place, const World& world, std::size_t pathLength) 
   const auto [entry, isNew] = seen_.try_emplace({place, world.history().lastWord});
   Seen& seen = entry->second;
   bool anything = isNew;
-  for (const std::string& aspect : otherAspects(world))
+  for (const std::string& aspect : otherAspects(world)) {
     anything = seen.others.insert(aspect).second || anything;
+  }
   return noteControls(seen, world, pathLength) || anything;
 }
 

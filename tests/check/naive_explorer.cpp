@@ -73,8 +73,9 @@ bool Explorer::hasList(toolkit::Tag tag) const {
 }
 
 Exploration Explorer::explore(const std::vector<std::string>& startKeys) {
-  for (const std::string& key : startKeys)
+  for (const std::string& key : startKeys) {
     graph_.starts.push_back(follow({}, {.kind = Move::Kind::start, .key = key}));
+  }
   while (!leads_.empty()) {
     const Lead lead = std::move(leads_.front());
     leads_.pop_front();
@@ -117,8 +118,9 @@ Step Explorer::follow(const Path& before, const Move& move) {
 
 void Explorer::notePressing(const World& world, const Move& move, std::size_t pathLength) {
   if (move.kind != Move::Kind::press || hasList(move.tag)) return;
-  for (const auto& [key, start] : world.history().starters)
+  for (const auto& [key, start] : world.history().starters) {
     presses_.add("timer-lost", start.site, move.tag, pathLength);
+  }
 }
 
 Step Explorer::arrive(const World& world, const Path& path, Step step) {
@@ -158,8 +160,9 @@ Exploration Explorer::result() const {
   exploration.complete = complete_;
   for (const Place& place : graph_.places) {
     exploration.places.insert(place.text);
-    for (const Move& move : place.moves)
+    for (const Move& move : place.moves) {
       ++(move.kind == Move::Kind::wait ? exploration.waits : exploration.presses);
+    }
   }
   Findings findings;
   facts_.report(complete_, findings);

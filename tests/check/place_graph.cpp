@@ -74,8 +74,9 @@ void PlaceGraph::reportDeadEnds(const Marks& lively, Findings& findings) const {
   for (const Step& start : starts) reportDeadStep(start, 1, lively, findings);
   for (std::size_t i = 0; i < places.size(); ++i) {
     if (!lively[i]) continue;
-    for (const Step& step : places[i].steps)
+    for (const Step& step : places[i].steps) {
       reportDeadStep(step, places[i].pathLength + 1, lively, findings);
+    }
   }
 }
 

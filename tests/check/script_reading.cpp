@@ -58,8 +58,9 @@ std::optional<toolkit::Tag> namedTagOf(const Command& command,
   if (!position) return std::nullopt;
   const std::size_t given = element->count() - 1;
   const auto extra = command.extraParameters;
-  if (extra == ExtraParameters::preventTheCommand && given != command.parameters.size())
+  if (extra == ExtraParameters::preventTheCommand && given != command.parameters.size()) {
     return std::nullopt;
+  }
   const bool overridden =
       extra == ExtraParameters::overrideTheTag && given > command.parameters.size();
   const bool isMissing = given <= *position && command.parameters[*position].isOptional;
@@ -80,8 +81,9 @@ const Command* commandOf(const Value& element) {
 std::optional<toolkit::Tag> namedTag(const Value& element, toolkit::Tag own) {
   const Command* const command = commandOf(element);
   if (!command) return std::nullopt;
-  if (asString(element))
+  if (asString(element)) {
     return command->target == TargetKind::none ? std::nullopt : std::optional(own);
+  }
   try {
     return namedTagOf(*command, asArray(element), own);
   } catch (const toolkit::Exception&) {

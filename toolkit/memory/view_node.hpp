@@ -41,7 +41,8 @@ class ViewNode : public std::enable_shared_from_this<ViewNode> {
   const Ref<Image>& layerContents() const { return layerContents_; }
   void setFrame(const Rect& frame) { change(frame_, frame); }
 
-  /// Returns what the view shows now; `restore` shows it again, in this view or another of its kind.
+  /// Returns what the view shows now; `restore` shows it again, in this view or another of its
+  /// kind.
   virtual SavedView save() const;
   virtual void restore(const SavedView& saved);
 

@@ -31,17 +31,19 @@ Allowance parseAllowance(std::string_view text, const std::string& place) {
   if (codeNamed(allowance.code)) return allowance;
   std::vector<std::string_view> names;
   for (const Code& code : codes()) names.push_back(code.name);
-  throw Failure(ExitStatus::badInput, place + ": no finding has the code " +
-                                          quote(allowance.code) + didYouMean(allowance.code, names));
+  throw Failure(ExitStatus::badInput, place + ": no finding has the code " + quote(allowance.code) +
+                                          didYouMean(allowance.code, names));
 }
 
 std::vector<Allowance> readAllowances(const std::string& path) {
   std::vector<Allowance> allowances;
   for (const Line& line : linesOf(path, "allowances")) {
     const std::string place = path + ":" + std::to_string(line.number);
-    if (line.words.size() > 1)
-      throw Failure(ExitStatus::badInput, place + ": expected one CODE or CODE=KEY, then a comment "
-                                                  "that begins with #");
+    if (line.words.size() > 1) {
+      throw Failure(ExitStatus::badInput, place +
+                                              ": expected one CODE or CODE=KEY, then a comment "
+                                              "that begins with #");
+    }
     allowances.push_back(parseAllowance(line.words.front(), place));
   }
   return allowances;

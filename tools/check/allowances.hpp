@@ -18,7 +18,8 @@ struct Allowance {
   std::string place;               ///< "FILE:LINE"; empty for one from the command line
 };
 
-/// Reads `CODE` or `CODE=KEY`. Throws a Failure, which begins with `place`, if no code is called so.
+/// Reads `CODE` or `CODE=KEY`. Throws a Failure, which begins with `place`, if no code is called
+/// so.
 Allowance parseAllowance(std::string_view text, const std::string& place);
 
 /// Reads a file of allowances: one on a line, with comments that begin with `#`.

@@ -18,8 +18,9 @@ namespace {
 std::vector<std::string> startKeysOf(const Script& script, const CheckOptions& options) {
   if (!options.startKeys.empty()) {
     for (const std::string& key : options.startKeys) {
-      if (!script.listUnder(key))
+      if (!script.listUnder(key)) {
         throw Failure(ExitStatus::badInput, "--start: the script has no list " + quote(key));
+      }
     }
     return options.startKeys;
   }
@@ -48,8 +49,9 @@ void sortByPlace(std::vector<Finding>& findings, const InputFile& file) {
   const auto placeOf = [&](const Finding& finding) {
     const auto position = finding.where ? file.positionOf(finding.where) : std::nullopt;
     if (!position) return std::pair<std::size_t, std::size_t>(-1, -1);
-    if (const auto* text = std::get_if<toolkit::TextPosition>(&*position))
+    if (const auto* text = std::get_if<toolkit::TextPosition>(&*position)) {
       return std::pair(text->line, text->column);
+    }
     return std::pair(std::get<toolkit::BytePosition>(*position).offset, std::size_t{0});
   };
   std::stable_sort(findings.begin(), findings.end(), [&](const Finding& a, const Finding& b) {
@@ -85,10 +87,11 @@ Verdict checkScript(const InputFile& file, const CheckOptions& options, const Ch
   }
   auto found = conclude(exploration, verdict.findings, options.standIn, options.threads);
   std::move(found.begin(), found.end(), std::back_inserter(verdict.findings));
-  if (!options.standIn)
+  if (!options.standIn) {
     found = concludeFromLooks(exploration, {options.wordsPerMinute, options.threads});
-  else
+  } else {
     found.clear();
+  }
   std::move(found.begin(), found.end(), std::back_inserter(verdict.findings));
   applyAllowances(verdict.findings, allowancesFor(file, options));
   sortByPlace(verdict.findings, file);

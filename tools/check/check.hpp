@@ -17,8 +17,8 @@
 namespace qz::tools::check {
 
 struct CheckOptions {
-  walkthrough::StageOptions stage;  ///< the window that the script is played in
-  bool standIn = false;             ///< play it in a window made from the script itself
+  walkthrough::StageOptions stage;       ///< the window that the script is played in
+  bool standIn = false;                  ///< play it in a window made from the script itself
   std::vector<std::string> startKeys;    ///< empty: the smallest tag
   std::optional<std::string> resources;  ///< directory of named images; absent: the script's own
   std::string toolkit;                   ///< whose fonts and images the script may use
@@ -40,7 +40,7 @@ struct Explored {
 struct Verdict {
   std::string path;  ///< of the script
   Explored explored{};
-  bool isStandIn = false;  ///< nothing is said about targets
+  bool isStandIn = false;           ///< nothing is said about targets
   std::vector<Finding> findings{};  ///< by place in the file, most severe first
 };
 

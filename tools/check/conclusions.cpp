@@ -23,8 +23,9 @@ class Conclusions {
         isStandIn_(isStandIn),
         threads_(threads) {
     for (const Finding& finding : read) {
-      if (finding.severity == Severity::error && finding.list)
+      if (finding.severity == Severity::error && finding.list) {
         read_.emplace(*finding.list, finding.element.value_or(noElement));
+      }
       if (finding.code == "useless-delay") useless_.emplace(*finding.list, *finding.element);
     }
   }
@@ -55,10 +56,10 @@ class Conclusions {
       const ScriptList& list = script_.lists()[static_cast<std::size_t>(subject)];
       const std::string& loop = chains.loops[chains.loopOf.find(list.key)->second];
       addChainElement(list, entry,
-                 findingOf("endless-chain",
-                           "list " + quote(list.key) + " runs lists without end (" + loop +
-                               "); the host's program crashes",
-                           "take out one PROCESS_COMMANDS_FOR_ID of the loop"));
+                      findingOf("endless-chain",
+                                "list " + quote(list.key) + " runs lists without end (" + loop +
+                                    "); the host's program crashes",
+                                "take out one PROCESS_COMMANDS_FOR_ID of the loop"));
     }
   }
 
@@ -70,9 +71,10 @@ class Conclusions {
       running.insert(list->key);
       const auto next = chainTarget(list->elements[i].value, list->key);
       if (!next || !exploration_.setting().chains.loopOf.contains(*next)) continue;
-      if (running.contains(*next))
+      if (running.contains(*next)) {
         return addForElement(static_cast<Subject>(list->firstElement + i), entry,
                              std::move(finding));
+      }
       list = &script_.lists()[*script_.listUnder(*next)];
       i = static_cast<std::size_t>(-1);  // from its first element
     }
@@ -82,9 +84,8 @@ class Conclusions {
     for (const auto& [subject, entry] : facts_.all(FactKind::elementRaised)) {
       if (wasRead(subject) || isUnsuitedAlways(subject)) continue;
       addForElement(subject, entry,
-                    findingOf("raises",
-                              nameOf(subject) + " raises an exception here: " + entry.detail +
-                                  "; the engine skips it"));
+                    findingOf("raises", nameOf(subject) + " raises an exception here: " +
+                                            entry.detail + "; the engine skips it"));
     }
     for (const auto& [subject, entry] : facts_.all(FactKind::listRaised)) {
       const ScriptList& list = script_.lists()[static_cast<std::size_t>(subject)];
@@ -100,10 +101,10 @@ class Conclusions {
     for (std::size_t i = 0; i < script_.lists().size(); ++i) {
       const ScriptList& list = script_.lists()[i];
       if (ran.contains(list.key) || !list.tag || !toolkit::asArray(list.value)) continue;
-      Finding finding = findingOf("never-runs",
-                                  "nothing runs list " + quote(list.key) +
-                                      ": no press, no timer and no list leads to it",
-                                  "delete the list, or run it from another one");
+      Finding finding = findingOf(
+          "never-runs",
+          "nothing runs list " + quote(list.key) + ": no press, no timer and no list leads to it",
+          "delete the list, or run it from another one");
       finding.list = list.key;
       finding.where = list.keyValue;
       findings_.push_back(std::move(finding));
@@ -113,10 +114,12 @@ class Conclusions {
   /// Returns the keys of the lists that a move runs, also those that only an endless chain runs.
   std::set<std::string> listsThatRun() const {
     std::set<std::string> ran;
-    for (const auto& [subject, entry] : facts_.all(FactKind::listRan))
+    for (const auto& [subject, entry] : facts_.all(FactKind::listRan)) {
       ran.insert(script_.lists()[static_cast<std::size_t>(subject)].key);
-    for (const auto& [subject, entry] : facts_.all(FactKind::endlessChain))
+    }
+    for (const auto& [subject, entry] : facts_.all(FactKind::endlessChain)) {
       addChain(script_.lists()[static_cast<std::size_t>(subject)].key, ran);
+    }
     return ran;
   }
 
@@ -138,9 +141,9 @@ class Conclusions {
     for (const auto& [subject, entry] : facts_.all(FactKind::targetUnsuited)) {
       if (!isUnsuitedAlways(subject) || !exploration_.isComplete()) continue;
       addForElement(subject, entry,
-                    findingOf("wrong-target",
-                              nameOf(subject) + " names a control of another kind every time it "
-                                                "runs, on which it has no effect"));
+                    findingOf("wrong-target", nameOf(subject) +
+                                                  " names a control of another kind every time it "
+                                                  "runs, on which it has no effect"));
     }
   }
 
@@ -159,19 +162,22 @@ class Conclusions {
   void flashing() {
     for (const auto& [subject, entry] : facts_.all(FactKind::flashRefused)) {
       if (facts_.has(FactKind::flashAccepted, subject) || !exploration_.isComplete()) continue;
-      addForElement(subject, entry,
-                    findingOf("flash-decided",
-                              nameOf(subject) + " is refused every time: an earlier one has decided "
-                                                "whether the tag flashes",
-                              "keep only the FLASH_ID that should count; ALLOW_FLASHING turns all "
-                              "flashing on and off"));
+      addForElement(
+          subject, entry,
+          findingOf("flash-decided",
+                    nameOf(subject) + " is refused every time: an earlier one has decided "
+                                      "whether the tag flashes",
+                    "keep only the FLASH_ID that should count; ALLOW_FLASHING turns all "
+                    "flashing on and off"));
     }
   }
 
   void neverFires() {
     for (const auto& [subject, entry] : facts_.all(FactKind::timerStarted)) {
-      if (facts_.has(FactKind::timerFires, subject) || !facts_.has(FactKind::timerBeaten, subject))
+      if (facts_.has(FactKind::timerFires, subject) ||
+          !facts_.has(FactKind::timerBeaten, subject)) {
         continue;
+      }
       const auto [list, element] = placeOf(subject);
       if (useless_.contains({list->key, element})) continue;
       addForElement(subject, entry,
@@ -185,9 +191,9 @@ class Conclusions {
 
   void sharedTags() {
     for (const auto& [subject, entry] : facts_.all(FactKind::sharedTagUsed)) {
-      Finding finding = findingOf(
-          "same-tag", "two controls have the tag that " + nameOf(subject) +
-                          " names; it reaches only the one that is farther back");
+      Finding finding =
+          findingOf("same-tag", "two controls have the tag that " + nameOf(subject) +
+                                    " names; it reaches only the one that is farther back");
       finding.tag = script_.element(static_cast<std::size_t>(subject)).target(ownIdOf(subject));
       addForElement(subject, entry, std::move(finding));
     }
@@ -224,12 +230,11 @@ class Conclusions {
     }
     for (auto& [cause, lost] : found) {
       const auto [list, element] = placeOf(cause.first);
-      Finding finding =
-          findingOf("timer-lost",
-                    "a press of the button with the tag " + std::to_string(cause.second) +
-                        ", which has no list, cancels the timer that " + nameOf(cause.first) +
-                        " starts",
-                    "hide or disable the button while the timer runs");
+      Finding finding = findingOf(
+          "timer-lost",
+          "a press of the button with the tag " + std::to_string(cause.second) +
+              ", which has no list, cancels the timer that " + nameOf(cause.first) + " starts",
+          "hide or disable the button while the timer runs");
       finding.list = list->key;
       finding.element = element;
       finding.where = list->elements[element].value;
@@ -250,8 +255,9 @@ class Conclusions {
       const ControlState state = format.control(bytes, i);
       const bool isSeen = !state.hidden && state.enabled;
       if (isSeen && drivers::isButton(exploration_.setting().kinds[i]) &&
-          !script_.listOfTag(state.tag))
+          !script_.listOfTag(state.tag)) {
         presses.push_back({.tag = state.tag, .control = i});
+      }
     }
     return presses;
   }

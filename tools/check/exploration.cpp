@@ -85,14 +85,16 @@ void Exploration::start() {
 
 void Exploration::expandAll(std::vector<Expansion>& expansions, std::uint32_t first,
                             unsigned threads) {
-  for (std::size_t i = 0; i < expansions.size(); ++i)
+  for (std::size_t i = 0; i < expansions.size(); ++i) {
     expansions[i].visit = first + static_cast<std::uint32_t>(i);
+  }
   if (expansions.size() < worthThreads || threads <= 1) {
     for (Expansion& expansion : expansions) expand(*worlds_.front(), expansion);
     return;
   }
-  while (worlds_.size() < threads)
+  while (worlds_.size() < threads) {
     worlds_.push_back(std::make_unique<World>(setting_, format_, looks_));
+  }
   constexpr std::size_t share = 32;  // visits that a thread takes at a time
   std::atomic<std::size_t> taken = 0;
   const auto work = [&](World& world) {
@@ -103,8 +105,9 @@ void Exploration::expandAll(std::vector<Expansion>& expansions, std::uint32_t fi
     }
   };
   std::vector<std::jthread> running;
-  for (std::size_t i = 1; i < worlds_.size(); ++i)
+  for (std::size_t i = 1; i < worlds_.size(); ++i) {
     running.emplace_back([&work, this, i] { work(*worlds_[i]); });
+  }
   work(*worlds_.front());
 }
 
@@ -133,11 +136,12 @@ void Exploration::merge(const Expansion& expansion) {
   bool runsList = false;
   for (std::size_t i = 0; i < expansion.found.size(); ++i) {
     const auto& [arrival, timers, firstFact] = expansion.found[i];
-    const std::size_t lastFact = i + 1 < expansion.found.size() ? expansion.found[i + 1].firstFact
-                                                                : expansion.facts.size();
-    for (std::size_t fact = firstFact; fact < lastFact; ++fact)
+    const std::size_t lastFact =
+        i + 1 < expansion.found.size() ? expansion.found[i + 1].firstFact : expansion.facts.size();
+    for (std::size_t fact = firstFact; fact < lastFact; ++fact) {
       facts_.add(expansion.facts[fact], {expansion.visit, arrival.move},
                  isFirst ? from.place : noPlace);
+    }
     if (isFirst) ++(arrival.move == waitMove ? waits_ : presses_);
     runsList |= arrival.ranList || arrival.isEndless;
     if (arrival.isEndless) continue;
@@ -162,8 +166,9 @@ std::uint32_t Exploration::arrive(const Arrival& arrival, const PendingTimers& t
   if (!known) firstVisit_.push_back(static_cast<std::uint32_t>(visits_.size()));
   if (isNews(visit.place, visit) || !known) visits_.push_back(visit);
   followTexts(visit);
-  for (const std::uint32_t element : arrival.timerElements)
+  for (const std::uint32_t element : arrival.timerElements) {
     timerStarts_.try_emplace({visit.place, element}, Occasion{visit.parent, visit.move});
+  }
   return visit.place;
 }
 
@@ -209,8 +214,9 @@ std::vector<std::size_t> Exploration::partsWithOtherText(std::uint32_t before,
   const Looks::Parts& old = looks_.parts(before);
   const Looks::Parts& now = looks_.parts(after);
   for (std::size_t i = 0; i < format_.controls(); ++i) {
-    if (old[i] != now[i] && textOf(looks_.look(old[i]).view) != textOf(looks_.look(now[i]).view))
+    if (old[i] != now[i] && textOf(looks_.look(old[i]).view) != textOf(looks_.look(now[i]).view)) {
       found.push_back(i);
+    }
   }
   return found;
 }
@@ -225,15 +231,17 @@ void Exploration::followTexts(const Visit& to) {
     return !format_.control(set_.place(place), part).hidden;
   };
   for (const std::size_t part : changed) {
-    if (to.parent != noVisit && to.move == waitMove && isShown(visits_[to.parent].place, part))
+    if (to.parent != noVisit && to.move == waitMove && isShown(visits_[to.parent].place, part)) {
       replacedTexts_.insert({visits_[to.parent].place, part, old[part]});
-    if (!timers(to.place).empty() && isShown(to.place, part))
+    }
+    if (!timers(to.place).empty() && isShown(to.place, part)) {
       freshTexts_.try_emplace({to.place, part, now[part]},
                               ReplacedText{.place = to.place,
                                            .part = part,
                                            .value = now[part],
                                            .list = to.lastList,
                                            .shown = {to.parent, to.move}});
+    }
   }
 }
 
@@ -265,8 +273,9 @@ std::uint32_t Exploration::numberOf(const PendingTimers& timers) {
 void Exploration::addEdges(const std::vector<std::uint32_t>& targets) {
   edgeStart_.push_back(edges_.size());
   for (const std::uint32_t target : targets) {
-    for (std::size_t byte = 0; byte < edgeBytes; ++byte)
+    for (std::size_t byte = 0; byte < edgeBytes; ++byte) {
       edges_.push_back(static_cast<std::uint8_t>(target >> 8 * byte));
+    }
   }
 }
 
@@ -286,8 +295,9 @@ Step Exploration::stepFrom(std::uint32_t place, Move move) const {
   if (move == waitMove) return WaitMove{timers(place).front().seconds};
   const std::uint8_t* const bytes = set_.place(place);
   PressMove press{.tag = format_.control(bytes, move).tag, .control = move};
-  for (std::size_t i = 0; i < move; ++i)
+  for (std::size_t i = 0; i < move; ++i) {
     press.isShadowed |= format_.control(bytes, i).tag == press.tag;
+  }
   return press;
 }
 

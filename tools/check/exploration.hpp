@@ -60,8 +60,8 @@ struct LookDifference {
 /// A text that the first pending timer of a place replaces.
 struct ReplacedText {
   std::uint32_t place = 0;
-  std::size_t part = 0;  ///< the control
-  LookValue value = 0;   ///< what it shows
+  std::size_t part = 0;    ///< the control
+  LookValue value = 0;     ///< what it shows
   std::uint32_t list = 0;  ///< which showed the text
   Occasion shown;
 };
@@ -153,8 +153,8 @@ class Exploration {
   std::vector<std::unique_ptr<PendingTimers>> timers_;
   /// The further values of the parts of a place's look, beyond those of its first visit.
   std::unordered_map<std::uint32_t, std::vector<std::vector<LookValue>>> furtherLooks_;
-  std::vector<std::size_t> edgeStart_;    // by place, in edges_
-  std::vector<std::uint8_t> edges_;       // three bytes each
+  std::vector<std::size_t> edgeStart_;  // by place, in edges_
+  std::vector<std::uint8_t> edges_;     // three bytes each
   std::vector<bool> runsList_;
   std::vector<std::unique_ptr<World>> worlds_;
   /// The lists that had the last word before a place where that matters for what follows.

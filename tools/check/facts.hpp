@@ -25,13 +25,13 @@ enum class FactKind : std::uint8_t {
   flashAccepted,
   flashRefused,
   timerStarted,
-  timerFires,      ///< the timer that the element started is the first to fire after a move
-  timerBeaten,     ///< another timer replaced it, or fires before it
-  sharedTagUsed,   ///< two controls had the tag that it names
+  timerFires,     ///< the timer that the element started is the first to fire after a move
+  timerBeaten,    ///< another timer replaced it, or fires before it
+  sharedTagUsed,  ///< two controls had the tag that it names
   // of a list
   listRan,
-  listRaised,      ///< running it raised, because it is not an array
-  endlessChain,    ///< a move would run it, and it never ends
+  listRaised,    ///< running it raised, because it is not an array
+  endlessChain,  ///< a move would run it, and it never ends
   // of a tag
   noListPressed,    ///< a button with the tag can be pressed, and no list is under the tag
   sharedTagPressed  ///< a button is pressed while another control has its tag

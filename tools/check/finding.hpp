@@ -38,17 +38,17 @@ const Code* codeNamed(std::string_view name);
 struct Finding {
   std::string code;
   Severity severity = Severity::error;
-  std::string message;            ///< one sentence without a full stop: what is wrong, and its effect
-  std::string help;               ///< how to mend it; may be empty
+  std::string message;  ///< one sentence without a full stop: what is wrong, and its effect
+  std::string help;     ///< how to mend it; may be empty
   std::optional<std::string> list{};     ///< key of the list in which the cause is
   std::optional<std::size_t> element{};  ///< of the list, from 0
   toolkit::ValueRef<> where{};           ///< the value in the script, for its place; may be absent
   std::string place{};  ///< "FILE:LINE" of a finding in another file; empty for one in the script
   std::optional<toolkit::Tag> tag{};
-  Path path{};                 ///< the shortest way to see it; empty for what is read off the script
+  Path path{};  ///< the shortest way to see it; empty for what is read off the script
   std::vector<PlayedMove> played{};  ///< the moves of `path`, and what each changed
-  Path otherPath{};            ///< of `looks-differ`: the way to the other look
-  std::size_t places = 0;    ///< how many places show it
+  Path otherPath{};                  ///< of `looks-differ`: the way to the other look
+  std::size_t places = 0;            ///< how many places show it
 };
 
 /// Returns a finding of the code with its usual severity. The code must exist.

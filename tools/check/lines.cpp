@@ -10,9 +10,10 @@ namespace qz::tools::check {
 
 std::vector<Line> linesOf(const std::string& path, std::string_view what) {
   const auto contents = wholeFile(path);
-  if (!contents)
+  if (!contents) {
     throw Failure(ExitStatus::badInput,
                   path + ": cannot be read; expected a file of " + std::string(what));
+  }
   std::vector<Line> lines;
   std::istringstream text(*contents);
   std::size_t number = 0;

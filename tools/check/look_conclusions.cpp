@@ -50,11 +50,11 @@ class LookConclusions {
   void lookDifferences() {
     for (const LookDifference& difference : exploration_.lookDifferences(options_.threads)) {
       const Tag tag = ownTag(difference.part);
-      Finding finding = findingOf(
-          "looks-differ",
-          "after this list the control with the tag " + std::to_string(tag) +
-              " shows one thing or another, depending on how the user came here",
-          "let the list set everything that it shows");
+      Finding finding =
+          findingOf("looks-differ",
+                    "after this list the control with the tag " + std::to_string(tag) +
+                        " shows one thing or another, depending on how the user came here",
+                    "let the list set everything that it shows");
       finding.tag = tag;
       finding.path = exploration_.path(difference.second);
       finding.otherPath = exploration_.path(difference.first);
@@ -86,11 +86,11 @@ class LookConclusions {
   }
 
   Finding briefText(const ReplacedText& text, double shown, double needed) const {
-    Finding finding = findingOf(
-        "too-brief",
-        "a timer replaces the text " + quote(textOf(looks_.look(text.value).view)) + " after " +
-            inSeconds(shown) + "; reading it takes " + inSeconds(needed),
-        "wait longer, or let the user press a button");
+    Finding finding =
+        findingOf("too-brief",
+                  "a timer replaces the text " + quote(textOf(looks_.look(text.value).view)) +
+                      " after " + inSeconds(shown) + "; reading it takes " + inSeconds(needed),
+                  "wait longer, or let the user press a button");
     finding.tag = ownTag(text.part);
     return finding;
   }
@@ -119,16 +119,19 @@ class LookConclusions {
     const SavedView& before = setting_.before[part];
     const std::string control = "the control with the tag " + std::to_string(ownTag(part));
     if (state.tag != ownTag(part)) {
-      found.push_back(findingOf("tag-left", "after the end " + control + " has the tag " +
-                                                std::to_string(state.tag)));
+      found.push_back(findingOf(
+          "tag-left", "after the end " + control + " has the tag " + std::to_string(state.tag)));
     }
     std::string what;
     if (state.hidden != before.hidden) what = state.hidden ? "hidden" : "shown";
-    if (state.enabled != before.enabled)
+    if (state.enabled != before.enabled) {
       what += std::string(what.empty() ? "" : ", ") + (state.enabled ? "enabled" : "disabled");
-    if (looksElse(visit, part)) what += std::string(what.empty() ? "" : ", ") + "changed in its look";
-    if (!what.empty())
+    }
+    if (looksElse(visit, part))
+      what += std::string(what.empty() ? "" : ", ") + "changed in its look";
+    if (!what.empty()) {
       found.push_back(findingOf("left-behind", "the end leaves " + control + " " + what));
+    }
     return found;
   }
 

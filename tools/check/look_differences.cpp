@@ -3,8 +3,8 @@
 // place can show, but not after which list: so every move is made once more where it may matter.
 #include <algorithm>
 
-#include "tools/check/exploration.hpp"
 #include "tools/check/expansion.hpp"
+#include "tools/check/exploration.hpp"
 
 namespace qz::tools::check {
 namespace {
@@ -34,8 +34,9 @@ class Comparison {
     if (format.isOver(exploration_.place(place))) return;
     const Looks::Parts& parts = exploration_.looks().parts(look);
     for (const std::size_t part : exploration_.partsWithSeveralLooks(place)) {
-      if (!format.control(exploration_.place(place), part).hidden)
+      if (!format.control(exploration_.place(place), part).hidden) {
         seePart(place, list, part, {parts[part], occasion});
+      }
     }
   }
 
@@ -99,8 +100,9 @@ void Exploration::makeAllMoves(unsigned threads, const See& see) {
     const Visit& visit = visits_[number];
     if (visit.parent != noVisit) continue;
     for (const Arrival& start : starts_) {
-      if (start.move == visit.move)
+      if (start.move == visit.move) {
         see({noVisit, visit.move}, start, visit.lastList, visit.place);
+      }
     }
   }
   std::vector<Expansion> expansions;
@@ -117,9 +119,10 @@ void Exploration::seeExpansion(const Expansion& expansion, const See& see) {
   for (std::size_t i = 0; i < expansion.found.size(); ++i) {
     const Arrival& arrival = expansion.found[i].arrival;
     if (arrival.isEndless) continue;
-    if (const auto place = knownPlace(expansion, i))
+    if (const auto place = knownPlace(expansion, i)) {
       see({expansion.visit, arrival.move}, arrival, arrival.lastList.value_or(visit.lastList),
           *place);
+    }
   }
 }
 

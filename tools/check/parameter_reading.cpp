@@ -37,8 +37,8 @@ bool isWholeNumber(std::string_view text) {
   if (begin == std::string_view::npos) return false;
   text.remove_prefix(begin);
   if (text.front() == '+' || text.front() == '-') text.remove_prefix(1);
-  return !text.empty() && std::all_of(text.begin(), text.end(),
-                                      [](char c) { return c >= '0' && c <= '9'; });
+  return !text.empty() &&
+         std::all_of(text.begin(), text.end(), [](char c) { return c >= '0' && c <= '9'; });
 }
 
 std::string plural(std::size_t count, const std::string& noun) {
@@ -78,8 +78,7 @@ class ParameterReader {
     const std::string most =
         command_.parameters.empty() ? "none" : std::to_string(command_.parameters.size());
     std::string message = command_.name + " takes " +
-                          (command_.parameters.empty() ? "no parameter"
-                                                       : "at most " + most) +
+                          (command_.parameters.empty() ? "no parameter" : "at most " + most) +
                           " and has " + std::to_string(given);
     Severity severity = Severity::warning;
     switch (command_.extraParameters) {
@@ -105,9 +104,9 @@ class ParameterReader {
     const auto value = element_.parameter(position);
     if (!isRead(position)) return;
     if (!hasRightType(parameter.type, value)) {
-      addAt(value, findingOf("wrong-type", "the " + std::string(parameter.name) + " of " +
-                                               command_.name + " is " + foundWords(value) +
-                                               "; the command raises an exception",
+      addAt(value, findingOf("wrong-type",
+                             "the " + std::string(parameter.name) + " of " + command_.name +
+                                 " is " + foundWords(value) + "; the command raises an exception",
                              "write " + wanted(parameter.type)));
     } else if (isNumberType(parameter.type)) {
       readNumber(parameter, value);
@@ -126,7 +125,8 @@ class ParameterReader {
 
   static bool hasRightType(ParameterType type, const ValueRef<>& value) {
     if (type == ParameterType::anything || type == ParameterType::html) return true;
-    if (isNumberType(type) || type == ParameterType::flag) return asString(value) || asNumber(value);
+    if (isNumberType(type) || type == ParameterType::flag)
+      return asString(value) || asNumber(value);
     return static_cast<bool>(asString(value));
   }
 
@@ -170,9 +170,9 @@ class ParameterReader {
   void readFont(const ValueRef<>& value) {
     const std::string name = value->description();
     if (toolkit_.fonts().fontWithName(name, anySize)) return;
-    addAt(value, findingOf("unknown-font",
-                           "no font is called " + quote(name) + "; the text is not shown",
-                           "use a font that every user has, such as Helvetica"));
+    addAt(value,
+          findingOf("unknown-font", "no font is called " + quote(name) + "; the text is not shown",
+                    "use a font that every user has, such as Helvetica"));
   }
 
   void readImage(const ValueRef<>& value) {

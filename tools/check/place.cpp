@@ -23,8 +23,9 @@ PlaceFormat::PlaceFormat(std::size_t controls, std::vector<Tag> tags)
   std::sort(tags_.begin(), tags_.end());
   tags_.erase(std::unique(tags_.begin(), tags_.end()), tags_.end());
   width_ = bytesFor(tags_.size() * tagFactor);
-  for (std::size_t i = 0; i < tags_.size(); ++i)
+  for (std::size_t i = 0; i < tags_.size(); ++i) {
     numbers_.emplace(tags_[i], static_cast<std::uint32_t>(i));
+  }
 }
 
 std::uint32_t PlaceFormat::code(const std::uint8_t* place, std::size_t index) const {
@@ -44,8 +45,9 @@ void PlaceFormat::setControl(std::uint8_t* place, std::size_t index,
                              const ControlState& state) const {
   std::uint32_t bits = numbers_.at(state.tag) * tagFactor + (state.hidden ? hiddenBit : 0) +
                        (state.enabled ? 0 : disabledBit);
-  for (std::size_t i = 0; i < width_; ++i, bits >>= 8U)
+  for (std::size_t i = 0; i < width_; ++i, bits >>= 8U) {
     place[index * width_ + i] = static_cast<std::uint8_t>(bits);
+  }
 }
 
 bool PlaceFormat::differs(const std::uint8_t* a, const std::uint8_t* b, std::size_t index) const {

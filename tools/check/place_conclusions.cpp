@@ -55,24 +55,26 @@ class PlaceConclusions {
       const bool isFromDead =
           occasion.visit != noVisit && isDead[exploration_.visits()[occasion.visit].place];
       if (!isDead[place] || isFromDead) return;
-      auto& entry = entries.try_emplace(blameOf(occasion, arrival.firstList), occasion,
-                                        std::set<std::uint32_t>()).first->second;
+      auto& entry = entries
+                        .try_emplace(blameOf(occasion, arrival.firstList), occasion,
+                                     std::set<std::uint32_t>())
+                        .first->second;
       entry.second.insert(place);
     });
     for (const auto& [blame, entry] : entries) {
-      add(findingOf("dead-end",
-                    "after this nothing that the user does, and no timer, runs a list again, but the "
-                    "walk-through has not ended",
-                    "show or enable a button that has a list, start a timer, or end with "
-                    "TERMINATE_PARSER"),
+      add(findingOf(
+              "dead-end",
+              "after this nothing that the user does, and no timer, runs a list again, but the "
+              "walk-through has not ended",
+              "show or enable a button that has a list, start a timer, or end with "
+              "TERMINATE_PARSER"),
           blame, exploration_.path(entry.first), entry.second.size());
     }
   }
 
   Blame blameOf(const Occasion& occasion, std::optional<std::uint32_t> list) const {
     if (list || occasion.visit == noVisit || occasion.move == waitMove) return {list, {}};
-    const auto* const place =
-        exploration_.place(exploration_.visits()[occasion.visit].place);
+    const auto* const place = exploration_.place(exploration_.visits()[occasion.visit].place);
     return {{}, exploration_.format().control(place, occasion.move).tag};
   }
 
@@ -96,24 +98,25 @@ class PlaceConclusions {
     for (const PlaceCircle& circle : circles_) {
       if (!circle.isLast || circle.isEnd || !circle.reachesList) continue;
       const std::uint32_t visit = firstVisitOf(circle);
-      add(findingOf("trap",
-                    "from here the end of the walk-through cannot be reached any more, whatever the "
-                    "user does",
-                    "lead a button or a timer back to a list from which the end can be reached"),
+      add(findingOf(
+              "trap",
+              "from here the end of the walk-through cannot be reached any more, whatever the "
+              "user does",
+              "lead a button or a timer back to a list from which the end can be reached"),
           blameOf(exploration_.visits()[visit]), exploration_.path(visit), circle.places.size());
     }
   }
 
   void noEnd() {
-    findings_.push_back(findingOf("no-end",
-                                  "nothing that the user can do ends the walk-through",
+    findings_.push_back(findingOf("no-end", "nothing that the user can do ends the walk-through",
                                   "run TERMINATE_PARSER in some list"));
   }
 
   std::uint32_t firstVisitOf(const PlaceCircle& circle) const {
     std::uint32_t first = noVisit;
-    for (const std::uint32_t place : circle.places)
+    for (const std::uint32_t place : circle.places) {
       first = std::min(first, exploration_.firstVisit(place));
+    }
     return first;
   }
 

@@ -122,8 +122,9 @@ class Reader {
     std::vector<std::string_view> candidates;
     const auto other = isCompound ? CommandForm::simple : CommandForm::compound;
     for (const Command& command : commandCatalogue()) {
-      if (command.form != CommandForm::none && command.form != other)
+      if (command.form != CommandForm::none && command.form != other) {
         candidates.emplace_back(command.name);
+      }
     }
     std::string raised;
     return nearest(text::uppercased(name, raised), candidates);

@@ -92,8 +92,9 @@ void Recorder::end() {
   });
   bool isFirst = true;
   for (const Timer& timer : timers_) {
-    if (timer.timer.seconds != never && timer.element)
+    if (timer.timer.seconds != never && timer.element) {
       noteOnce(isFirst ? FactKind::timerFires : FactKind::timerBeaten, *timer.element);
+    }
     isFirst = false;
   }
 }
@@ -149,8 +150,9 @@ void Recorder::commandWillRun(const Value&, std::size_t index) {
   noteOnce(FactKind::elementRan, running.element);
   const Command* const command = running.command->command;
   notesMayHaveChanged_ |= command && changesNotes(*command);
-  if (running.target && surroundings_.controlsWithTag(*running.target) > 1)
+  if (running.target && surroundings_.controlsWithTag(*running.target) > 1) {
     note(FactKind::sharedTagUsed, static_cast<Subject>(running.element));
+  }
 }
 
 void Recorder::commandDidRun(const Value&, std::size_t, bool result) {
@@ -158,8 +160,9 @@ void Recorder::commandDidRun(const Value&, std::size_t, bool result) {
   const Running& running = running_.back();
   lastList_ = running.list;
   if (!running.command->command) return;
-  if (!endList_ && running.command->command->flow == CommandFlow::endsWalkThrough)
+  if (!endList_ && running.command->command->flow == CommandFlow::endsWalkThrough) {
     endList_ = running.list;
+  }
   noteTarget(running);
   if (!marksFlashing(*running.command->command)) return;
   if (result) {
@@ -211,8 +214,9 @@ void Recorder::controlSought(Tag tag, const toolkit::Ref<toolkit::View>& control
 void Recorder::timerSet(std::string_view key, double seconds) {
   if (!isRecording_) return;
   for (const Timer& replaced : timers_) {
-    if (replaced.timer.key == key && replaced.element)
+    if (replaced.timer.key == key && replaced.element) {
       noteOnce(FactKind::timerBeaten, *replaced.element);
+    }
   }
   forget(key);
   std::optional<std::size_t> element;

@@ -63,8 +63,9 @@ class Replay {
     const auto& loops = setting_.chains.loopOf;
     if (loops.empty()) return false;
     if (const auto* start = std::get_if<StartMove>(&step)) return loops.contains(start->key);
-    if (const auto* press = std::get_if<PressMove>(&step))
+    if (const auto* press = std::get_if<PressMove>(&step)) {
       return loops.contains(std::to_string(press->tag));
+    }
     const auto timers = picture().timers;
     return !timers.empty() && loops.contains(timers.front().key);
   }
@@ -76,7 +77,8 @@ class Replay {
 
 std::string wordsOf(const Step& step) {
   if (const auto* start = std::get_if<StartMove>(&step)) return "start " + start->key;
-  if (const auto* press = std::get_if<PressMove>(&step)) return "press " + std::to_string(press->tag);
+  if (const auto* press = std::get_if<PressMove>(&step))
+    return "press " + std::to_string(press->tag);
   return "wait " + number(std::get<WaitMove>(step).seconds) + " s";
 }
 
@@ -124,8 +126,9 @@ std::vector<std::string> changesBetween(const StepPicture& before, const StepPic
     std::string line = Changes(before.controls[i], after.controls[i]).line();
     if (!line.empty()) changes.push_back(std::move(line));
   }
-  for (const auto& timer : after.timers)
+  for (const auto& timer : after.timers) {
     changes.push_back("timer " + timer.key + " in " + number(timer.timeLeft) + " s");
+  }
   if (after.ended && !before.ended) changes.emplace_back("the end");
   return changes;
 }

@@ -43,15 +43,15 @@ std::string_view commandOf(Severity severity) {
 void writeGithub(const std::vector<Report>& reports, bool, std::ostream& out) {
   for (const Report& report : reports) {
     for (const Finding& finding : report.verdict.findings) {
-      out << "::" << commandOf(finding.severity)
-          << " file=" << escaped(report.verdict.path, true);
+      out << "::" << commandOf(finding.severity) << " file=" << escaped(report.verdict.path, true);
       const auto position = positionOf(finding, report.file);
       if (position) out << ",line=" << position->line << ",col=" << position->column;
       out << ",title=" << escaped(finding.code, true) << "::" << escaped(finding.message, false);
-      if (!finding.path.empty())
+      if (!finding.path.empty()) {
         out << escaped("\nqz-walkthrough play " + report.verdict.path + report.stageArguments +
                            " " + playArguments(finding.path),
                        false);
+      }
       out << '\n';
     }
   }

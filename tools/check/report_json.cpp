@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // The report as one JSON object.
 #include <nlohmann/json.hpp>
+
 #include <ostream>
 
 #include "tools/check/report.hpp"
@@ -26,9 +27,8 @@ Json jsonOf(const Path& path) {
 }
 
 Json jsonOf(const Finding& finding, const InputFile& file) {
-  Json json = {{"code", finding.code},
-               {"severity", nameOf(finding.severity)},
-               {"message", finding.message}};
+  Json json = {
+      {"code", finding.code}, {"severity", nameOf(finding.severity)}, {"message", finding.message}};
   if (finding.list) json["list"] = *finding.list;
   if (finding.element) json["element"] = *finding.element;
   if (const auto position = positionOf(finding, file)) {
@@ -45,8 +45,9 @@ Json jsonOf(const Finding& finding, const InputFile& file) {
 Json jsonOf(const Report& report) {
   const Explored& explored = report.verdict.explored;
   Json findings = Json::array();
-  for (const Finding& finding : report.verdict.findings)
+  for (const Finding& finding : report.verdict.findings) {
     findings.push_back(jsonOf(finding, report.file));
+  }
   return {{"script", report.verdict.path},
           {"explored",
            {{"places", explored.places},

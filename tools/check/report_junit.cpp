@@ -63,9 +63,10 @@ void writeJunit(const std::vector<Report>& reports, bool, std::ostream& out) {
         << attribute("tests", std::to_string(count))
         << attribute("failures", std::to_string(failures)) << attribute("errors", "0") << ">\n";
     for (const Finding& finding : findings) writeCase(report, finding, out);
-    if (findings.empty())
+    if (findings.empty()) {
       out << "    <testcase" << attribute("classname", report.verdict.path)
           << attribute("name", "nothing is wrong") << "/>\n";
+    }
     out << "  </testsuite>\n";
   }
   out << "</testsuites>\n";

@@ -1,7 +1,8 @@
 // SPDX-License-Identifier: MIT
 // The report in SARIF 2.1.0, the format in which code hosts take the results of checkers.
-#include <algorithm>
 #include <nlohmann/json.hpp>
+
+#include <algorithm>
 #include <ostream>
 
 #include "tools/check/report.hpp"
@@ -20,8 +21,9 @@ Json messageOf(const std::string& text) { return {{"text", text}}; }
 Json locationOf(const Report& report, const Finding* finding) {
   Json physical = {{"artifactLocation", {{"uri", report.verdict.path}}}};
   const auto position = finding ? positionOf(*finding, report.file) : std::nullopt;
-  if (position)
+  if (position) {
     physical["region"] = {{"startLine", position->line}, {"startColumn", position->column}};
+  }
   return {{"physicalLocation", std::move(physical)}};
 }
 
@@ -38,15 +40,17 @@ Json codeFlowOf(const Report& report, const Finding& finding) {
 
 Json resultOf(const Report& report, const Finding& finding) {
   std::string message = finding.message;
-  if (finding.path.size() > mostSteps)
+  if (finding.path.size() > mostSteps) {
     message += " (the path has " + std::to_string(finding.path.size()) + " steps; the first " +
                std::to_string(mostSteps) + " are here)";
+  }
   Json result = {{"ruleId", finding.code},
                  {"level", nameOf(finding.severity)},
                  {"message", messageOf(message)},
                  {"locations", Json::array({locationOf(report, &finding)})}};
-  if (!finding.path.empty())
+  if (!finding.path.empty()) {
     result["codeFlows"] = Json::array({codeFlowOf(report, finding)});
+  }
   return result;
 }
 
@@ -76,9 +80,10 @@ void writeSarif(const std::vector<Report>& reports, bool, std::ostream& out) {
     }
   }
   Json invocation = {{"executionSuccessful", true}};
-  if (total > mostResults)
+  if (total > mostResults) {
     invocation["toolExecutionNotifications"] =
         Json::array({{{"level", "warning"}, {"message", messageOf(notification(total))}}});
+  }
   const Json run = {{"tool", {{"driver", {{"name", "qz-walkthrough check"}, {"rules", rules()}}}}},
                     {"columnKind", "unicodeCodePoints"},
                     {"invocations", Json::array({std::move(invocation)})},

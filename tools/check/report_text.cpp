@@ -78,8 +78,9 @@ class TextReport {
 
   void writeMove(const PlayedMove& move) {
     out_ << "    " << move.words << ": ";
-    for (std::size_t i = 0; i < move.changes.size(); ++i)
+    for (std::size_t i = 0; i < move.changes.size(); ++i) {
       out_ << (i == 0 ? "" : "; ") << move.changes[i];
+    }
     out_ << (move.changes.empty() ? "nothing changes" : "") << '\n';
   }
 
@@ -97,9 +98,10 @@ class TextReport {
       counts += (counts.empty() ? "" : ", ") + counted(count, std::string(nameOf(severity)));
     }
     out_ << counts << '\n';
-    if (report_.verdict.isStandIn)
+    if (report_.verdict.isStandIn) {
       out_ << "  The window was made from the script, so nothing is said about the tags and kinds "
               "of controls; name the host's with --window.\n";
+    }
   }
 
   const Report& report_;

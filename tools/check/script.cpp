@@ -17,8 +17,9 @@ Element elementOf(const ValueRef<>& value) {
   const auto array = toolkit::asArray(value);
   element.isCompound = static_cast<bool>(array);
   if (array->count() == 0) return element;
-  if (const auto name = toolkit::asString(array->objectAtIndex(0)))
+  if (const auto name = toolkit::asString(array->objectAtIndex(0))) {
     element.command = compoundCommandNamed(name->text());
+  }
   return element;
 }
 
@@ -30,7 +31,9 @@ std::optional<Tag> tagOf(const ValueRef<>& key) {
   return tag && std::to_string(*tag) == text ? tag : std::nullopt;
 }
 
-bool isNumeric(const ValueRef<>& value) { return toolkit::asString(value) || toolkit::asNumber(value); }
+bool isNumeric(const ValueRef<>& value) {
+  return toolkit::asString(value) || toolkit::asNumber(value);
+}
 
 /// Whether the engine acts on the list's own control, whatever the parameters say.
 bool ignoresTagParameter(const Element& element) {
@@ -67,8 +70,9 @@ Script::Script(ValueRef<toolkit::Dictionary> dictionary) : dictionary_(std::move
                     .tag = tagOf(key),
                     .value = value,
                     .firstElement = elementCount_};
-    for (const auto& element : toolkit::asArray(value)->elements())
+    for (const auto& element : toolkit::asArray(value)->elements()) {
       list.elements.push_back(elementOf(element));
+    }
     elementCount_ += list.elements.size();
     if (list.tag) byTag_.emplace(*list.tag, lists_.size());
     if (toolkit::asString(key)) byKey_.emplace(list.key, lists_.size());

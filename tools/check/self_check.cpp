@@ -34,8 +34,9 @@ class Likeness {
     const auto& format = exploration_.format();
     if (format.isOver(place) != picture_.ended) return "the end";
     for (std::size_t i = 0; i < format.controls(); ++i) {
-      if (auto found = differenceOf(format.control(place, i), i); !found.empty())
+      if (auto found = differenceOf(format.control(place, i), i); !found.empty()) {
         return "control " + std::to_string(i) + ": " + found;
+      }
     }
     return picture_.ended ? "" : differenceOfTimers();
   }
@@ -62,9 +63,8 @@ class Likeness {
     const PendingTimers& timers = exploration_.timers(visit_.place);
     if (timers.size() != picture_.timers.size()) return "the number of pending timers";
     for (const auto& timer : timers) {
-      const bool isThere = std::any_of(
-          picture_.timers.begin(), picture_.timers.end(),
-          [&](const auto& each) { return each.key == timer.key; });
+      const bool isThere = std::any_of(picture_.timers.begin(), picture_.timers.end(),
+                                       [&](const auto& each) { return each.key == timer.key; });
       if (!isThere) return "timer " + timer.key;
     }
     return "";

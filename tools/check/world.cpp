@@ -58,8 +58,7 @@ const toolkit::Subviews& controlsOf(QZ_Plist_State_Parser& engine) {
 
 }  // namespace
 
-Setting settingOf(const Script& script, const walkthrough::StagePlan& plan,
-                  std::string resources) {
+Setting settingOf(const Script& script, const walkthrough::StagePlan& plan, std::string resources) {
   const auto driver = makeDriver(resources);
   Stage stage(*driver, plan);
   Setting setting{.script = script,
@@ -98,14 +97,16 @@ void World::build(const std::optional<std::string>& startKey) {
   // A tick changes nothing but the pressed-in look, which is not part of a place or a look.
   engine.flashingTimer()->invalidate();
   std::fill(place_.begin(), place_.end(), 0);
-  for (std::size_t i = 0; i < controls_.size(); ++i)
+  for (std::size_t i = 0; i < controls_.size(); ++i) {
     format_.setControl(place_.data(), i, controls_[i].state);
+  }
   if (startKey) recorder_->begin();
   try {
     stage_->load(noFile, startKey);
   } catch (const toolkit::Exception& exception) {
-    if (const auto list = setting_.script.listUnder(*startKey))
+    if (const auto list = setting_.script.listUnder(*startKey)) {
       recorder_->note(FactKind::listRaised, static_cast<Subject>(*list), exception.reason());
+    }
   }
 }
 
@@ -222,8 +223,9 @@ void World::restoreLook(std::uint32_t look) {
   }
   auto& engine = stage_->engine();
   std::size_t part = controls_.size();
-  if (parts[part] != parts_[part])
+  if (parts[part] != parts_[part]) {
     restore(*ViewNode::of(engine.tutorialWindow()->contentView()), parts[part]);
+  }
   ++part;
   if (parts[part] != parts_[part]) engine.setFlashing(parts[part] == notedYes);
   const auto flashing = engine.flashingTagIds();
@@ -251,8 +253,9 @@ void World::press(std::size_t control) {
   try {
     pressed.button->click();
   } catch (const toolkit::Exception& exception) {
-    if (const auto list = setting_.script.listOfTag(pressed.state.tag))
+    if (const auto list = setting_.script.listOfTag(pressed.state.tag)) {
       recorder_->note(FactKind::listRaised, static_cast<Subject>(*list), exception.reason());
+    }
   }
 }
 
@@ -263,8 +266,9 @@ void World::wait(const PendingTimer& first) {
   try {
     driver_->toolkit().advance(first.seconds);
   } catch (const toolkit::Exception& exception) {
-    if (const auto list = setting_.script.listUnder(first.key))
+    if (const auto list = setting_.script.listUnder(first.key)) {
       recorder_->note(FactKind::listRaised, static_cast<Subject>(*list), exception.reason());
+    }
   }
 }
 
@@ -278,8 +282,9 @@ Arrival World::arrive(Move move, PendingTimers& timers, std::uint8_t* place) {
   std::copy(place_.begin(), place_.end(), place);
   Arrival arrival{.move = move, .ranList = recorder_->ranList(), .look = look_};
   arrival.timerElements = recorder_->pendingElements();
-  if (const auto list = recorder_->firstList())
+  if (const auto list = recorder_->firstList()) {
     arrival.firstList = static_cast<std::uint32_t>(*list);
+  }
   const auto last = isOver ? recorder_->endList() : recorder_->lastList();
   if (last) arrival.lastList = static_cast<std::uint32_t>(*last);
   return arrival;
@@ -333,8 +338,9 @@ void World::readEngine() {
   parts[part] = looks_.valueOf({ViewNode::of(content)->save(), false});
   parts[++part] = engine.flashing() ? notedYes : notedNo;
   const auto flashing = engine.flashingTagIds();
-  for (const std::string& key : setting_.flashKeys)
+  for (const std::string& key : setting_.flashKeys) {
     parts[++part] = noteOf(flashing->objectForKey(key));
+  }
   if (parts == parts_) return;
   parts_ = parts;
   look_ = looks_.numberOf(parts_);
@@ -373,9 +379,10 @@ void World::tagMayHaveChanged(const toolkit::Ref<toolkit::View>& view) {
   if (Control* const control = controlOf(view)) {
     const ControlState before = control->state;
     setTag(*control, view->tag());
-    if (!(before == control->state))
+    if (!(before == control->state)) {
       format_.setControl(place_.data(), static_cast<std::size_t>(control - controls_.data()),
                          control->state);
+    }
   }
 }
 

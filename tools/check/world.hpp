@@ -27,9 +27,9 @@ inline constexpr const char* noFile = "/dev/null/no-script";
 struct Setting {
   const Script& script;
   const walkthrough::StagePlan& plan;
-  std::string resources;      ///< the directory of the images
-  EndlessChains chains;       ///< of the script
-  std::vector<Tag> ownTags{};   ///< of the window's controls, before the start
+  std::string resources;            ///< the directory of the images
+  EndlessChains chains;             ///< of the script
+  std::vector<Tag> ownTags{};       ///< of the window's controls, before the start
   std::vector<SavedView> before{};  ///< the window's controls, before the start
   std::vector<drivers::ViewKind> kinds{};
   std::vector<std::string> flashKeys;  ///< the tag keys that the script can make flash
@@ -44,7 +44,7 @@ struct Arrival {
   bool isEndless = false;  ///< the move would run lists without end, and was not made
   bool ranList = false;
   std::optional<std::uint32_t> firstList{};  ///< that the move ran; absent if it ran none
-  std::optional<std::uint32_t> lastList{};  ///< whose command ran last; absent if none ran
+  std::optional<std::uint32_t> lastList{};   ///< whose command ran last; absent if none ran
   std::uint32_t look = 0;
   std::vector<std::uint32_t> timerElements{};  ///< which started the pending timers
 };
@@ -114,10 +114,10 @@ class World final : private Surroundings {
   std::unordered_map<const toolkit::View*, std::size_t> indexOf_;
   std::vector<std::size_t> touched_;
   std::unordered_map<Tag, std::size_t> tagCounts_;
-  std::size_t sharedTags_ = 0;        // how many tags two controls or more have
-  std::vector<std::uint8_t> place_;   // where the world is
-  Looks::Parts parts_;                // of the look that it shows
-  std::uint32_t look_ = 0;            // the number of that
+  std::size_t sharedTags_ = 0;       // how many tags two controls or more have
+  std::vector<std::uint8_t> place_;  // where the world is
+  Looks::Parts parts_;               // of the look that it shows
+  std::uint32_t look_ = 0;           // the number of that
 };
 
 }  // namespace qz::tools::check

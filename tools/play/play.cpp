@@ -18,8 +18,8 @@
 #include "tools/play/session.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/input_file.hpp"
-#include "tools/support/suggestions.hpp"
 #include "tools/support/stack_guard.hpp"
+#include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
 #include "tools/walkthrough/stage.hpp"
 

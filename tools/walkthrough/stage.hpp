@@ -24,7 +24,8 @@ struct StageOptions {
 struct StagePlan {
   HostWindow host;       ///< without a description
   std::string hostFile;  ///< for messages
-  QZ_Plist_State_Parser::Dictionary description;  ///< of the window that the engine builds; or absent
+  QZ_Plist_State_Parser::Dictionary
+      description;  ///< of the window that the engine builds; or absent
   bool sheet = false;
 };
 
