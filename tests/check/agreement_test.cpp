@@ -78,9 +78,9 @@ Opinion ours(const naive::Generated& generated, const std::vector<std::string>& 
   const Script script(generated.script);
   walkthrough::StagePlan plan;
   plan.host = generated.host;
-  const Setting setting = settingOf(script, plan, "/");
-  Exploration exploration(setting, keys);
-  exploration.run({}, 1, {});
+  Setting setting = settingOf(script, plan, "/");
+  const auto explored = explore(setting, keys, {}, 1, {});
+  Exploration& exploration = *explored;
   Opinion opinion{
       .places = {}, .presses = exploration.presses(), .waits = exploration.waits(), .findings = {}};
   for (std::uint32_t i = 0; i < exploration.places(); ++i) {

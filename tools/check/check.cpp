@@ -136,8 +136,9 @@ Verdict checkScript(const InputFile& file, const CheckOptions& options,
   const auto plan = walkthrough::planStage(options.stage, script.dictionary(), file.path());
   Setting setting = settingOf(script, plan, resources);
   watchFor(expectations, setting);
-  Exploration exploration(setting, startKeysOf(script, options));
-  exploration.run(options.limits, options.threads, hooks);
+  const auto explored =
+      explore(setting, startKeysOf(script, options), options.limits, options.threads, hooks);
+  Exploration& exploration = *explored;
   verdict.explored = exploredBy(exploration);
   if (const auto difference = selfCheck(exploration)) {
     throw Failure(ExitStatus::failed, file.path() + ": internal error: the exploration is wrong (" +

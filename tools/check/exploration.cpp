@@ -343,4 +343,34 @@ std::size_t Exploration::depth(std::uint32_t visit) const {
   return depth;
 }
 
+std::optional<std::uint32_t> Exploration::taggerAt(const Visit& visit, std::size_t control) const {
+  if (!setting_.tracksTaggers) return std::nullopt;
+  const Looks::Parts& parts = looks_.parts(visit.look);
+  const LookValue tagger = parts[parts.size() - format_.controls() + control];
+  return tagger == 0 ? std::nullopt : std::optional<std::uint32_t>(tagger - 1);
+}
+
+bool Exploration::leavesTags() const {
+  for (std::uint32_t number = 0; number < places(); ++number) {
+    const std::uint8_t* const bytes = place(number);
+    if (!format_.isOver(bytes)) continue;
+    for (std::size_t i = 0; i < format_.controls(); ++i) {
+      if (format_.control(bytes, i).tag != setting_.ownTags[i]) return true;
+    }
+  }
+  return false;
+}
+
+std::unique_ptr<Exploration> explore(Setting& setting, const std::vector<std::string>& startKeys,
+                                     const ExplorationLimits& limits, unsigned threads,
+                                     const ExplorationHooks& hooks) {
+  auto exploration = std::make_unique<Exploration>(setting, startKeys);
+  exploration->run(limits, threads, hooks);
+  if (!exploration->leavesTags()) return exploration;
+  setting.tracksTaggers = true;
+  exploration = std::make_unique<Exploration>(setting, startKeys);
+  exploration->run(limits, threads, hooks);
+  return exploration;
+}
+
 }  // namespace qz::tools::check

@@ -103,6 +103,11 @@ class Exploration {
   const std::map<std::pair<std::uint32_t, std::uint32_t>, Occasion>& timerStarts() const {
     return timerStarts_;
   }
+  /// Returns the index of the element that gave a control the tag that it has at a visit; absent if
+  /// none did, or if that is not tracked.
+  std::optional<std::uint32_t> taggerAt(const Visit& visit, std::size_t control) const;
+  /// Whether some end leaves a control another tag than its own.
+  bool leavesTags() const;
   /// Returns the first part of a look that says whether a tag flashes; they are in the order of the
   /// setting's keys.
   std::size_t firstFlashPart() const { return format_.controls() + 2; }
@@ -162,5 +167,11 @@ class Exploration {
   ExplorationHooks hooks_;
   Stop stop_ = Stop::none;
 };
+
+/// Explores. If an end leaves a control another tag than its own, explores again with
+/// `setting.tracksTaggers`, so that the element to blame is known.
+std::unique_ptr<Exploration> explore(Setting& setting, const std::vector<std::string>& startKeys,
+                                     const ExplorationLimits& limits, unsigned threads,
+                                     const ExplorationHooks& hooks);
 
 }  // namespace qz::tools::check

@@ -3,8 +3,10 @@
 
 #include <algorithm>
 #include <cmath>
+#include <optional>
 #include <set>
 #include <sstream>
+#include <utility>
 
 #include "tools/check/look_differences.hpp"
 #include "tools/check/reading_times.hpp"
@@ -74,58 +76,73 @@ class LookConclusions {
                                     quote(text.text) + " after " + inSeconds(text.shown) +
                                     "; reading it takes " + inSeconds(text.needed),
                                 "wait longer, or let the user press a button");
-    const auto [list, element] = setting_.script.placeOf(text.element);
-    finding.element = element;
     finding.tag = ownTag(text.control);
     finding.path = text.path;
-    add(std::move(finding), static_cast<std::uint32_t>(list), text.places);
-    findings_.back().where = setting_.script.lists()[list].elements[element].value;
+    addForElement(std::move(finding), text.element, text.places);
   }
 
-  /// What an end leaves behind, one finding for each list that ends and each control.
+  /// What an end leaves behind, one finding for each control and each list that ends.
   void ends() {
-    std::set<std::tuple<std::string, std::uint32_t, std::size_t>> reported;
     for (std::uint32_t number = 0; number < exploration_.visits().size(); ++number) {
       const Visit& visit = exploration_.visits()[number];
-      const std::uint8_t* const place = exploration_.place(visit.place);
-      if (!exploration_.format().isOver(place)) continue;
-      for (std::size_t part = 0; part < setting_.ownTags.size(); ++part) {
-        for (Finding& finding : leftOf(visit, part)) {
-          if (!reported.insert({finding.code, visit.lastList, part}).second) continue;
-          finding.tag = ownTag(part);
-          finding.path = exploration_.path(number);
-          add(std::move(finding), visit.lastList, 1);
-        }
+      if (!exploration_.format().isOver(exploration_.place(visit.place))) continue;
+      for (std::size_t control = 0; control < setting_.ownTags.size(); ++control) {
+        tagLeft(number, control);
+        leftBehind(number, control);
       }
     }
   }
 
-  std::vector<Finding> leftOf(const Visit& visit, std::size_t part) const {
-    std::vector<Finding> found;
-    const ControlState state = exploration_.format().control(exploration_.place(visit.place), part);
-    const SavedView& before = setting_.before[part];
-    const std::string control = "the control with the tag " + std::to_string(ownTag(part));
-    if (state.tag != ownTag(part)) {
-      found.push_back(findingOf(
-          "tag-left", "after the end " + control + " has the tag " + std::to_string(state.tag)));
+  void tagLeft(std::uint32_t number, std::size_t control) {
+    const Visit& visit = exploration_.visits()[number];
+    const Tag tag = exploration_.format().control(exploration_.place(visit.place), control).tag;
+    const auto tagger = exploration_.taggerAt(visit, control);
+    if (tag == ownTag(control) || !tagsLeft_.emplace(tagger, control).second) return;
+    Finding finding = findingOf(
+        "tag-left", "after the end " + nameOf(control) + " has the tag " + std::to_string(tag));
+    finding.tag = ownTag(control);
+    finding.path = exploration_.path(number);
+    if (tagger) {
+      addForElement(std::move(finding), *tagger, 1);
+    } else {
+      add(std::move(finding), visit.lastList, 1);
     }
-    std::string what;
-    if (state.hidden != before.hidden) what = state.hidden ? "hidden" : "shown";
+  }
+
+  void leftBehind(std::uint32_t number, std::size_t control) {
+    const Visit& visit = exploration_.visits()[number];
+    const auto state = exploration_.format().control(exploration_.place(visit.place), control);
+    const SavedView& before = setting_.before[control];
+    std::vector<std::string> changes;
+    if (state.hidden != before.hidden) changes.emplace_back(state.hidden ? "hidden" : "shown");
     if (state.enabled != before.enabled) {
-      what += std::string(what.empty() ? "" : ", ") + (state.enabled ? "enabled" : "disabled");
+      changes.emplace_back(state.enabled ? "enabled" : "disabled");
     }
-    if (looksElse(visit, part))
-      what += std::string(what.empty() ? "" : ", ") + "changed in its look";
-    if (!what.empty()) {
-      found.push_back(findingOf("left-behind", "the end leaves " + control + " " + what));
-    }
-    return found;
+    if (looksElse(visit, control)) changes.emplace_back("changed in its look");
+    if (changes.empty() || !leftBehind_.emplace(visit.lastList, control).second) return;
+    std::string what = changes.front();
+    for (std::size_t i = 1; i < changes.size(); ++i) what += ", " + changes[i];
+    Finding finding = findingOf("left-behind", "the end leaves " + nameOf(control) + " " + what);
+    finding.tag = ownTag(control);
+    finding.path = exploration_.path(number);
+    add(std::move(finding), visit.lastList, 1);
+  }
+
+  std::string nameOf(std::size_t control) const {
+    return "the control with the tag " + std::to_string(ownTag(control));
   }
 
   bool looksElse(const Visit& visit, std::size_t part) const {
     const LookValue value = looks_.parts(visit.look)[part];
     const bool hasUsersState = looks_.look(value).hasUsersState;
     return value != looks_.valueOf({setting_.before[part], hasUsersState});
+  }
+
+  void addForElement(Finding finding, std::size_t number, std::size_t places) {
+    const auto [list, element] = setting_.script.placeOf(number);
+    finding.element = element;
+    add(std::move(finding), static_cast<std::uint32_t>(list), places);
+    findings_.back().where = setting_.script.lists()[list].elements[element].value;
   }
 
   void add(Finding finding, std::uint32_t list, std::size_t places) {
@@ -142,6 +159,8 @@ class LookConclusions {
   const Setting& setting_;
   Looks& looks_;
   const LookOptions& options_;
+  std::set<std::pair<std::optional<std::uint32_t>, std::size_t>> tagsLeft_;  // tagger, control
+  std::set<std::pair<std::uint32_t, std::size_t>> leftBehind_;               // list, control
   std::vector<Finding> findings_;
 };
 

@@ -94,16 +94,24 @@ class PlaceConclusions {
                    list ? std::optional(static_cast<std::uint32_t>(*list)) : std::nullopt);
   }
 
+  // Circles that one cause leads into are one finding, with the shortest path.
   void traps() {
+    std::map<Blame, std::pair<std::uint32_t, std::size_t>> entries;  // first visit, places
     for (const PlaceCircle& circle : circles_) {
       if (!circle.isLast || circle.isEnd || !circle.reachesList) continue;
       const std::uint32_t visit = firstVisitOf(circle);
+      auto& entry =
+          entries.try_emplace(blameOf(exploration_.visits()[visit]), visit, 0).first->second;
+      entry.first = std::min(entry.first, visit);
+      entry.second += circle.places.size();
+    }
+    for (const auto& [blame, entry] : entries) {
       add(findingOf(
               "trap",
               "from here the end of the walk-through cannot be reached any more, whatever the "
               "user does",
               "lead a button or a timer back to a list from which the end can be reached"),
-          blameOf(exploration_.visits()[visit]), exploration_.path(visit), circle.places.size());
+          blame, exploration_.path(entry.first), entry.second);
     }
   }
 

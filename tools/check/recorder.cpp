@@ -165,10 +165,10 @@ void Recorder::commandWillRun(const Value&, std::size_t index) {
 void Recorder::commandDidRun(const Value&, std::size_t, bool result) {
   if (!isRecording_ || !running_.back().list) return;
   const Running& running = running_.back();
-  lastList_ = running.list;
   if (!running.command->command) return;
-  if (!endList_ && running.command->command->flow == CommandFlow::endsWalkThrough) {
-    endList_ = running.list;
+  if (running.command->command->flow == CommandFlow::endsWalkThrough) {
+    if (!endList_) endList_ = running.list;
+    surroundings_.tagsMayBeRestored();
   }
   noteTarget(running);
   if (!marksFlashing(*running.command->command)) return;
@@ -182,7 +182,6 @@ void Recorder::commandDidRun(const Value&, std::size_t, bool result) {
 void Recorder::commandRaised(const Value&, std::size_t, const toolkit::Exception& exception) {
   if (!isRecording_ || !running_.back().list) return;
   const Running& running = running_.back();
-  lastList_ = running.list;
   note(FactKind::elementRaised, static_cast<Subject>(running.element), exception.reason());
   if (running.command->command) noteTarget(running);
 }
@@ -195,7 +194,9 @@ void Recorder::noteTarget(const Running& running) {
   const auto subject = static_cast<Subject>(running.element);
   if (control) {
     noteOnce(FactKind::targetFound, running.element);
-    if (hasParameter(command, ParameterType::newTag)) surroundings_.tagMayHaveChanged(control);
+    if (hasParameter(command, ParameterType::newTag)) {
+      surroundings_.tagMayHaveChanged(control, static_cast<std::uint32_t>(running.element));
+    }
     if (command.target == TargetKind::buttonWithState) surroundings_.stateWasSet(control);
     if (changesLook(command)) surroundings_.lookMayHaveChanged(control);
     if (suits(command.target, surroundings_.kindOf(control))) {

@@ -27,8 +27,11 @@ class Surroundings {
 
   /// The engine has looked up a control, which the move may change from now on.
   virtual void willTouch(const toolkit::Ref<toolkit::View>& control) = 0;
-  /// A command has given a control another tag.
-  virtual void tagMayHaveChanged(const toolkit::Ref<toolkit::View>& control) = 0;
+  /// An element may have given a control another tag.
+  virtual void tagMayHaveChanged(const toolkit::Ref<toolkit::View>& control,
+                                 std::uint32_t element) = 0;
+  /// The end may have given all controls their own tags back.
+  virtual void tagsMayBeRestored() = 0;
   /// The script has set the state of a button.
   virtual void stateWasSet(const toolkit::Ref<toolkit::View>& control) = 0;
   virtual void lookMayHaveChanged(const toolkit::Ref<toolkit::View>& control) = 0;

@@ -85,7 +85,8 @@ World::~World() {
 }
 
 // A new window and engine. The parts of the look that are not controls come behind them: the
-// background, whether flashing is allowed, and the tags that flash.
+// background, whether flashing is allowed, the tags that flash, and, if they are tracked, the
+// numbers of the elements that gave the controls their tags (from 1; 0 for none).
 void World::build(const std::optional<std::string>& startKey) {
   if (stage_) stage_->engine().setObserver(nullptr);
   stage_.reset();
@@ -120,6 +121,7 @@ void World::observe() {
   for (const auto& view : controlsOf(stage_->engine())) {
     Control control{.node = ViewNode::of(view), .view = view};
     control.button = dynamic_cast<MemoryButton*>(control.node.get());
+    control.showsState = drivers::rowOf(driver_->look(view).kind).showsState;
     control.state = stateOf(control);
     control.look = looks_.valueOf(lookOf(control));
     parts_.push_back(control.look);
@@ -127,7 +129,8 @@ void World::observe() {
     if (++tagCounts_[control.state.tag] == 2) ++sharedTags_;
     controls_.push_back(std::move(control));
   }
-  parts_.resize(controls_.size() + 2 + setting_.flashKeys.size(), notedNothing);
+  const std::size_t taggers = setting_.tracksTaggers ? controls_.size() : 0;
+  parts_.resize(controls_.size() + 2 + setting_.flashKeys.size() + taggers, notedNothing);
   const auto content = stage_->engine().tutorialWindow()->contentView();
   parts_[controls_.size()] = looks_.valueOf({ViewNode::of(content)->save(), false});
   parts_[controls_.size() + 1] = notedNo;
@@ -219,7 +222,7 @@ void World::restoreLook(std::uint32_t look) {
     if (parts[i] == parts_[i]) continue;
     restore(*controls_[i].node, parts[i]);
     controls_[i].look = parts[i];
-    controls_[i].hasUsersState = looks_.look(parts[i]).hasUsersState;
+    controls_[i].hasUsersState = controls_[i].showsState && looks_.look(parts[i]).hasUsersState;
   }
   auto& engine = stage_->engine();
   std::size_t part = controls_.size();
@@ -260,8 +263,10 @@ void World::press(std::size_t control) {
   }
 }
 
-// The others need not be set: the first that fires cancels them.
+// Timers of the place where the world was before may be pending. The place's own others need not be
+// set: the first that fires cancels them.
 void World::wait(const PendingTimer& first) {
+  stage_->engine().killAllTimers();
   stage_->engine().startTimerWithValue(wholeSeconds(first.seconds), first.key);
   recorder_->begin();
   try {
@@ -302,9 +307,10 @@ PendingTimers World::pendingAtTheEnd() const {
   return pending;
 }
 
-// The text of other controls than text fields is not seen.
+// The text of other controls than text fields is not seen, nor is the state of a push button.
 ViewLook World::lookOf(const Control& control) const {
-  ViewLook look{control.node->save(), control.hasUsersState};
+  const bool showsState = !control.button || control.showsState;
+  ViewLook look{control.node->save(), control.hasUsersState || !showsState};
   if (!control.view->asTextField()) look.view.text = {};
   return look;
 }
@@ -313,7 +319,7 @@ void World::readTouched(std::uint8_t* place) {
   if (stage_->engine().terminating()) {  // the end restores tags without looking controls up
     for (const Control& control : controls_) willTouch(control.view);
   }
-  bool looksElse = false;
+  bool looksElse = std::exchange(hasNewTaggers_, false);
   for (const std::size_t index : touched_) {
     Control& control = controls_[index];
     control.isTouched = false;
@@ -377,15 +383,27 @@ void World::willTouch(const toolkit::Ref<toolkit::View>& view) {
   touched_.push_back(static_cast<std::size_t>(control - controls_.data()));
 }
 
-void World::tagMayHaveChanged(const toolkit::Ref<toolkit::View>& view) {
-  if (Control* const control = controlOf(view)) {
-    const ControlState before = control->state;
-    setTag(*control, view->tag());
-    if (!(before == control->state)) {
-      format_.setControl(place_.data(), static_cast<std::size_t>(control - controls_.data()),
-                         control->state);
-    }
+void World::tagMayHaveChanged(const toolkit::Ref<toolkit::View>& view, std::uint32_t element) {
+  if (Control* const control = controlOf(view)) updateTag(*control, element + 1);
+}
+
+void World::tagsMayBeRestored() {
+  for (Control& control : controls_) {
+    willTouch(control.view);
+    updateTag(control, 0);
   }
+}
+
+void World::updateTag(Control& control, LookValue tagger) {
+  const ControlState before = control.state;
+  setTag(control, control.view->tag());
+  if (before == control.state) return;
+  const auto index = static_cast<std::size_t>(&control - controls_.data());
+  format_.setControl(place_.data(), index, control.state);
+  if (!setting_.tracksTaggers) return;
+  LookValue& known = parts_[parts_.size() - controls_.size() + index];
+  hasNewTaggers_ |= known != tagger;
+  known = tagger;
 }
 
 void World::stateWasSet(const toolkit::Ref<toolkit::View>& view) {

@@ -34,7 +34,8 @@ struct Setting {
   std::vector<drivers::ViewKind> kinds{};
   std::vector<std::string> flashKeys;  ///< the tag keys that the script can make flash
   std::vector<bool> watchedLists{};    ///< by index: arrivals say whether the move ran it; or empty
-  bool wholeLooks = false;  ///< what two controls show together matters, not only each by itself
+  bool tracksTaggers = false;  ///< which element gave each control its tag is a part of the look
+  bool wholeLooks = false;     ///< what two controls show together matters, not only each by itself
 };
 
 /// Reads from a world of its own what all worlds share.
@@ -76,6 +77,7 @@ class World final : private Surroundings {
     toolkit::memory::MemoryButton* button = nullptr;  // null for another kind
     ControlState state{};
     LookValue look = 0;
+    bool showsState = false;
     bool hasUsersState = false;
     bool isTouched = false;
     bool mayLookDifferent = false;
@@ -83,7 +85,9 @@ class World final : private Surroundings {
 
   // Surroundings:
   void willTouch(const toolkit::Ref<toolkit::View>& control) override;
-  void tagMayHaveChanged(const toolkit::Ref<toolkit::View>& control) override;
+  void tagMayHaveChanged(const toolkit::Ref<toolkit::View>& control,
+                         std::uint32_t element) override;
+  void tagsMayBeRestored() override;
   void stateWasSet(const toolkit::Ref<toolkit::View>& control) override;
   void lookMayHaveChanged(const toolkit::Ref<toolkit::View>& control) override;
   std::size_t controlsWithTag(Tag tag) const override;
@@ -104,6 +108,7 @@ class World final : private Surroundings {
   void readTouched(std::uint8_t* place);
   void readEngine();
   void setTag(Control& control, Tag tag);
+  void updateTag(Control& control, LookValue tagger);
   ControlState stateOf(const Control& control) const;
   Control* controlOf(const toolkit::Ref<toolkit::View>& view);
 
@@ -120,7 +125,8 @@ class World final : private Surroundings {
   std::size_t sharedTags_ = 0;       // how many tags two controls or more have
   std::vector<std::uint8_t> place_;  // where the world is
   Looks::Parts parts_;               // of the look that it shows
-  std::uint32_t look_ = 0;           // the number of that
+  bool hasNewTaggers_ = false;
+  std::uint32_t look_ = 0;  // the number of that
 };
 
 }  // namespace qz::tools::check
