@@ -57,11 +57,15 @@ TEST_F(HostExample, IsGuidedOverItsOwnWindowAndGoesOnAfterwards) {
     EXPECT_TRUE(QTest::qWaitFor([&] { return toolkit::qt::isHighlighted(form->express); }));
     click(form->next);
     EXPECT_TRUE(form->order.isEnabled());
+    EXPECT_FALSE(form->clear.isEnabled());
     EXPECT_EQ(form->next.text(), "Done");
+    click(form->order);
+    EXPECT_TRUE(form->guide.text().contains("after the tour"));
     click(form->next);
     EXPECT_TRUE(form->isVisible());
     EXPECT_FALSE(form->guide.isVisible());
     EXPECT_FALSE(toolkit::qt::isHighlighted(form->express));
+    EXPECT_EQ(form->express.toolTip(), "");
     EXPECT_EQ(form->next.property("qzTag"), 20);
     expectHostWorks();
   }
