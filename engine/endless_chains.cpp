@@ -2,6 +2,8 @@
 #include "engine/endless_chains.hpp"
 
 #include <algorithm>
+#include <set>
+#include <utility>
 
 #include "engine/tag_key.hpp"
 #include "qz/commands.hpp"
@@ -14,6 +16,7 @@ namespace {
 
 using Keys = std::vector<std::string>;
 using Graph = std::map<std::string, Keys, std::less<>>;
+using KeySet = std::set<std::string, std::less<>>;
 
 // The engine has no script after this command: later elements chain to nothing.
 bool endsTheWalkThrough(const toolkit::ValueRef<>& element) {
@@ -24,8 +27,30 @@ bool endsTheWalkThrough(const toolkit::ValueRef<>& element) {
 
 bool runsList(const Command* command) { return command && command->flow == CommandFlow::runsList; }
 
+// Removes the chains that come after one to a list that ends the walk-through. `ending` are the
+// lists that end it themselves.
+void removeChainsAfterTheEnd(Graph& graph, const KeySet& ending) {
+  std::map<std::string, std::vector<std::pair<std::string, std::size_t>>, std::less<>> callers;
+  for (const auto& [key, targets] : graph) {
+    for (std::size_t i = 0; i < targets.size(); ++i) callers[targets[i]].emplace_back(key, i);
+  }
+  KeySet known = ending;
+  Keys open(ending.begin(), ending.end());
+  while (!open.empty()) {
+    const std::string key = open.back();
+    open.pop_back();
+    for (const auto& [caller, index] : callers[key]) {
+      Keys& targets = graph[caller];
+      if (index >= targets.size()) continue;
+      targets.resize(index + 1);
+      if (known.insert(caller).second) open.push_back(caller);
+    }
+  }
+}
+
 Graph chainsOf(const toolkit::ValueRef<toolkit::Dictionary>& script) {
   Graph graph;
+  KeySet ending;
   for (const auto& [key, list] : script->entries()) {
     const auto name = toolkit::asString(key);
     if (!name) continue;
@@ -33,10 +58,14 @@ Graph chainsOf(const toolkit::ValueRef<toolkit::Dictionary>& script) {
     const std::string own = tagKey(key->intValue());  // the list of "07" runs with the id 7
     const auto elements = toolkit::asArray(list);
     for (const auto& element : elements->elements()) {
-      if (endsTheWalkThrough(element)) break;
+      if (endsTheWalkThrough(element)) {
+        ending.emplace(name->text());
+        break;
+      }
       if (auto to = chainTarget(element, own)) targets.push_back(*std::move(to));
     }
   }
+  removeChainsAfterTheEnd(graph, ending);
   return graph;
 }
 

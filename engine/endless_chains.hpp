@@ -4,7 +4,7 @@
 // The engine does not limit chaining, so such a script exhausts the stack. These lists can be found
 // without running the script, because a run executes every list from its first element to its last
 // and only the end of the walk-through cuts it short: a list is endless if it chains to an endless
-// one, and a run stays in the first such list.
+// one before the end, and a run stays in the first such list.
 #pragma once
 
 #include <cstddef>

@@ -4,32 +4,41 @@
 #include <algorithm>
 #include <filesystem>
 
+#include "text/number_conversion.hpp"
 #include "tools/check/conclusions.hpp"
 #include "tools/check/look_conclusions.hpp"
 #include "tools/check/reading.hpp"
 #include "tools/check/replay.hpp"
 #include "tools/check/self_check.hpp"
 #include "tools/support/drivers.hpp"
+#include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
 
 namespace qz::tools::check {
 namespace {
 
-std::vector<std::string> startKeysOf(const Script& script, const CheckOptions& options) {
+std::vector<std::string> startKeysOf(const InputFile& file, const Script& script,
+                                     const CheckOptions& options) {
   if (!options.startKeys.empty()) {
     for (const std::string& key : options.startKeys) {
       if (!script.listUnder(key)) {
-        throw Failure(ExitStatus::badInput, "--start: the script has no list " + quote(key));
+        std::vector<std::string> keys;
+        for (const ScriptList& list : script.lists()) keys.push_back(list.key);
+        throw Failure(ExitStatus::badInput, file.path() + ": no list under the start key " +
+                                                quote(key) + "; expected one of " +
+                                                enumerate(keys));
       }
     }
     return options.startKeys;
   }
-  const ScriptList* smallest = nullptr;
-  for (const ScriptList& list : script.lists()) {
-    if (list.tag && (!smallest || *list.tag < *smallest->tag)) smallest = &list;
+  // As the engine does: the smallest key as a number, then the list under its decimal form.
+  std::optional<std::int32_t> smallest;
+  for (const std::string& key : script.dictionary()->allKeys()) {
+    const std::int32_t number = text::intValueOf(key);
+    if (!smallest || number < *smallest) smallest = number;
   }
   if (!smallest) return {};
-  return {smallest->key};
+  return {std::to_string(*smallest)};
 }
 
 constexpr std::size_t longestShownPath = 100;  // moves
@@ -137,7 +146,7 @@ Verdict checkScript(const InputFile& file, const CheckOptions& options,
   Setting setting = settingOf(script, plan, resources);
   watchFor(expectations, setting);
   const auto explored =
-      explore(setting, startKeysOf(script, options), options.limits, options.threads, hooks);
+      explore(setting, startKeysOf(file, script, options), options.limits, options.threads, hooks);
   Exploration& exploration = *explored;
   verdict.explored = exploredBy(exploration);
   if (const auto difference = selfCheck(exploration)) {

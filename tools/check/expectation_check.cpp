@@ -145,8 +145,9 @@ std::optional<Finding> ExpectationCheck::judge(const Expectation& expectation, E
                      failed + ": it never happens in all the places that can be reached (" +
                          std::to_string(exploration_.places()) + ")");
   }
-  Finding finding = findingOf("expectation", failed + ": the shortest path has " +
-                                                 std::to_string(evidence.depth) + " moves");
+  Finding finding = findingOf("expectation", failed + ": the shortest path needs " +
+                                                 std::to_string(evidence.depth) +
+                                                 (evidence.depth == 1 ? " move" : " moves"));
   finding.path = exploration_.path(*evidence.first);
   return finding;
 }

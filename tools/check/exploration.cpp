@@ -339,7 +339,7 @@ Path Exploration::path(const Occasion& occasion) const {
 
 std::size_t Exploration::depth(std::uint32_t visit) const {
   std::size_t depth = 0;
-  for (; visit != noVisit; visit = visits_[visit].parent) ++depth;
+  for (; visits_[visit].parent != noVisit; visit = visits_[visit].parent) ++depth;
   return depth;
 }
 
@@ -351,6 +351,8 @@ std::optional<std::uint32_t> Exploration::taggerAt(const Visit& visit, std::size
 }
 
 bool Exploration::leavesTags() const {
+  if (setting_.plan.description)
+    return false;  // the engine's own window has no control of the host
   for (std::uint32_t number = 0; number < places(); ++number) {
     const std::uint8_t* const bytes = place(number);
     if (!format_.isOver(bytes)) continue;

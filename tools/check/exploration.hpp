@@ -85,6 +85,7 @@ class Exploration {
   /// Returns the path of a visit, or of a visit and a move out of it.
   Path path(std::uint32_t visit) const;
   Path path(const Occasion& occasion) const;
+  /// Returns the number of moves after the start.
   std::size_t depth(std::uint32_t visit) const;
 
   /// Returns the places to which the moves out of a place lead, in the order of the moves.

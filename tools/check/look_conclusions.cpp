@@ -83,6 +83,7 @@ class LookConclusions {
 
   /// What an end leaves behind, one finding for each control and each list that ends.
   void ends() {
+    if (setting_.plan.description) return;  // the engine's own window has no control of the host
     for (std::uint32_t number = 0; number < exploration_.visits().size(); ++number) {
       const Visit& visit = exploration_.visits()[number];
       if (!exploration_.format().isOver(exploration_.place(visit.place))) continue;

@@ -182,6 +182,7 @@ void Recorder::commandDidRun(const Value&, std::size_t, bool result) {
 void Recorder::commandRaised(const Value&, std::size_t, const toolkit::Exception& exception) {
   if (!isRecording_ || !running_.back().list) return;
   const Running& running = running_.back();
+  if (!running.command) return;  // an entry of a dictionary in place of a list
   note(FactKind::elementRaised, static_cast<Subject>(running.element), exception.reason());
   if (running.command->command) noteTarget(running);
 }

@@ -89,7 +89,7 @@ class Changes {
  public:
   Changes(const ControlPicture& before, const ControlPicture& after)
       : before_(before.view), after_(after.view) {
-    if (before_.tag != after_.tag) add("tag " + std::to_string(after_.tag));
+    if (before_.tag != after_.tag) add("new tag " + std::to_string(after_.tag));
     if (before_.hidden != after_.hidden) add(after_.hidden ? "hidden" : "shown");
     if (before_.enabled != after_.enabled) add(after_.enabled ? "enabled" : "disabled");
     addText("title", before_.title, after_.title);
@@ -101,9 +101,9 @@ class Changes {
     if (before.flashing != after.flashing) add(after.flashing ? "flashes" : "flashes no more");
   }
 
-  /// Returns a line such as "5: hidden, tag 6"; empty if nothing differs.
+  /// Returns a line such as "tag 5: hidden, new tag 6"; empty if nothing differs.
   std::string line() const {
-    return words_.empty() ? words_ : std::to_string(before_.tag) + ": " + words_;
+    return words_.empty() ? words_ : "tag " + std::to_string(before_.tag) + ": " + words_;
   }
 
  private:
@@ -129,7 +129,9 @@ std::vector<std::string> changesBetween(const StepPicture& before, const StepPic
     if (!line.empty()) changes.push_back(std::move(line));
   }
   for (const auto& timer : after.timers) {
-    changes.push_back("timer " + timer.key + " in " + number(timer.timeLeft) + " s");
+    const bool fires = timer.timeLeft <= longestDelay;
+    changes.push_back("timer " + timer.key +
+                      (fires ? " in " + number(timer.timeLeft) + " s" : ", which never fires"));
   }
   if (after.ended && !before.ended) changes.emplace_back("the end");
   return changes;

@@ -99,7 +99,8 @@ class TextReport {
   void writeExpected(const ExpectationCounts& expected) {
     const std::size_t all = expected.hold + expected.fail + expected.open;
     if (all == 0) return;
-    out_ << "  " << expected.hold << " of " << counted(all, "expectation") << " hold";
+    out_ << "  " << expected.hold << " of " << counted(all, "expectation")
+         << (expected.hold == 1 ? " holds" : " hold");
     if (expected.open > 0) {
       out_ << "; whether " << expected.open
            << " do is not known, because not everything was explored";

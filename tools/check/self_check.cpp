@@ -51,7 +51,9 @@ class Likeness {
     if (state.enabled != control.view.enabled) return "enabled";
     if (look.view.toolTip != control.view.toolTip) return "tooltip";
     if (!(look.view.title == control.view.title)) return "title";
-    if (!(look.view.text == control.view.text)) return "text";
+    // Looks have the texts of text fields only.
+    const bool showsText = exploration_.setting().kinds[index] == drivers::ViewKind::textField;
+    if (showsText && !(look.view.text == control.view.text)) return "text";
     if (look.view.background != control.view.background) return "background";
     const auto image = look.view.image ? std::optional(look.view.image->name()) : std::nullopt;
     if (image != control.view.image) return "image";
