@@ -8,16 +8,14 @@
 
 #include <algorithm>
 #include <cstdint>
-#include <map>
 #include <memory>
 #include <string>
 #include <string_view>
 #include <vector>
 
 #include "drivers/memory/memory_driver.hpp"
-#include "engine/endless_chains.hpp"
-#include "engine/tag_key.hpp"
 #include "fuzz/require.hpp"
+#include "fuzz/run_lengths.hpp"
 #include "qz/property_list/reader.hpp"
 
 namespace qz {
@@ -28,48 +26,7 @@ using fuzz::require;
 using Script = toolkit::ValueRef<toolkit::Dictionary>;
 
 constexpr std::size_t mostSteps = 32;
-constexpr std::size_t mostElements = 2'000;  // executed by one list and the lists that it chains to
-constexpr std::size_t deepestChain = 100;
 constexpr double beyondAllTimers = 0x1p65;  // seconds; timers are set in 64 bits
-
-/// Counts the elements that a list executes, including the lists that it chains to.
-class RunLengths {
- public:
-  explicit RunLengths(Script script) : script_(std::move(script)) {}
-
-  /// True if no list runs long or chains deep.
-  bool areSmall() {
-    for (const auto& [key, list] : script_->entries()) {
-      const auto tag = toolkit::asString(key);
-      // A list runs under the number of its key and chains to itself by that number: "07" under 7.
-      if (tag && ofElements(list, tagKey(tag->intValue()), 0) > mostElements) return false;
-    }
-    return true;
-  }
-
- private:
-  std::size_t ofList(const std::string& key, std::size_t depth) {
-    if (depth > deepestChain) return mostElements + 1;
-    const auto known = lengths_.find(key);
-    if (known != lengths_.end()) return known->second;
-    return lengths_[key] = ofElements(script_->objectForKey(key), key, depth);
-  }
-
-  std::size_t ofElements(const toolkit::ValueRef<>& list, const std::string& own,
-                         std::size_t depth) {
-    std::size_t length = 1;
-    const auto elements = toolkit::asArray(list);
-    for (const auto& element : elements->elements()) {
-      const auto next = chainTarget(element, own);
-      length += next ? ofList(*next, depth + 1) : 1;
-      if (length > mostElements) break;
-    }
-    return std::min(length, mostElements + 1);
-  }
-
-  Script script_;
-  std::map<std::string, std::size_t> lengths_;
-};
 
 class Walkthrough {
  public:
@@ -164,7 +121,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   const std::size_t end = input.find('\n');
   if (end == std::string_view::npos) return -1;
   const Script script = qz::toolkit::dictionaryFromPropertyList(input.substr(end + 1));
-  if (!script || !RunLengths(script).areSmall()) return -1;
+  if (!script || !fuzz::RunLengths(script).areSmall()) return -1;
   Walkthrough walkthrough(script);
   for (const char what : input.substr(0, std::min(end, mostSteps))) walkthrough.step(what);
   return 0;
