@@ -1,14 +1,20 @@
 // SPDX-License-Identifier: MIT
-// The command `check`: its options.
+// The command `check`: its options, and the order of its work.
 #include <algorithm>
-#include <charconv>
+#include <atomic>
+#include <filesystem>
 #include <iostream>
 #include <list>
 #include <memory>
+#include <optional>
 #include <thread>
 
+#include "tools/check/baseline.hpp"
 #include "tools/check/check.hpp"
+#include "tools/check/explanations.hpp"
 #include "tools/check/report.hpp"
+#include "tools/check/witness.hpp"
+#include "tools/check_progress.hpp"
 #include "tools/commands.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/suggestions.hpp"
@@ -30,6 +36,17 @@ struct CommandOptions {
   CheckOptions check;
   std::string format = "text";
   Severity failOn = Severity::warning;
+  std::optional<std::string> witness;  // the directory of the scenarios
+  std::optional<std::string> baseline;
+  bool updateBaseline = false;
+  std::optional<std::string> explain;  // a code
+};
+
+/// A script that is checked, and what came of it.
+struct Job {
+  std::optional<InputFile> file;
+  check::Verdict verdict;
+  std::optional<Failure> failure;  // why it could not be checked
 };
 
 std::size_t positive(const std::string& option, const std::string& text) {
@@ -72,32 +89,112 @@ std::string stageArguments(const CheckOptions& options) {
   return arguments;
 }
 
-int statusOf(const std::vector<check::Verdict>& verdicts, Severity failOn) {
+int statusOf(const std::vector<Job>& jobs, Severity failOn) {
   bool complete = true;
-  for (const auto& verdict : verdicts) {
-    complete &= verdict.explored.complete;
-    for (const auto& finding : verdict.findings) {
+  for (const Job& job : jobs) {
+    if (job.failure) return static_cast<int>(job.failure->status());
+  }
+  for (const Job& job : jobs) {
+    complete &= job.verdict.explored.complete;
+    for (const auto& finding : job.verdict.findings) {
       if (finding.severity >= failOn) return static_cast<int>(ExitStatus::failed);
     }
   }
   return complete ? static_cast<int>(ExitStatus::fine) : notComplete;
 }
 
-int runCheck(const CommandOptions& options) {
-  const auto& format = formatNamed(options.format);
-  std::list<InputFile> files;
-  std::vector<check::Verdict> verdicts;
-  for (const std::string& path : options.scripts) {
-    files.emplace_back(path, "a script");
-    verdicts.push_back(check::checkScript(files.back(), options.check, {}));
+void checkOne(const std::string& path, const CheckOptions& options, ProgressLine& line, Job& job) {
+  check::ExplorationHooks hooks;
+  hooks.report = [&](const check::Progress& progress) { line.show(path, progress); };
+  hooks.isCancelled = Interruption::isWanted;
+  try {
+    job.file.emplace(path, "a script");
+    job.verdict = checkScript(*job.file, options, hooks);
+  } catch (const Failure& failure) {
+    job.failure = failure;
   }
+}
+
+/// Checks the scripts, several at once. One that cannot be read does not stop the others.
+std::vector<Job> checkAll(const CommandOptions& options) {
+  const Interruption interruption;
+  ProgressLine line;
+  std::vector<Job> jobs(options.scripts.size());
+  const auto workers =
+      static_cast<unsigned>(std::min<std::size_t>(options.check.threads, jobs.size()));
+  CheckOptions each = options.check;
+  each.threads = std::max(1U, options.check.threads / workers);
+  std::atomic<std::size_t> next = 0;
+  const auto work = [&] {
+    for (std::size_t i = next++; i < jobs.size(); i = next++) {
+      checkOne(options.scripts[i], each, line, jobs[i]);
+    }
+  };
+  std::vector<std::jthread> others;
+  for (unsigned i = 1; i < workers; ++i) others.emplace_back(work);
+  work();
+  return jobs;
+}
+
+void applyBaseline(const CommandOptions& options, std::vector<Job>& jobs) {
+  if (!options.baseline) return;
+  const bool isThere = std::filesystem::exists(*options.baseline);
+  auto baseline = options.updateBaseline && !isThere ? check::Baseline::empty(*options.baseline)
+                                                     : check::Baseline::read(*options.baseline);
+  for (Job& job : jobs) {
+    if (job.failure) continue;
+    if (options.updateBaseline) baseline.replace(job.verdict.path, job.verdict.findings);
+    job.verdict.inBaseline = baseline.takeBack(job.verdict.path, job.verdict.findings);
+  }
+  if (options.updateBaseline) baseline.write();
+}
+
+void writeWitnesses(const CommandOptions& options, const std::vector<Job>& jobs) {
+  if (!options.witness) return;
+  check::WitnessWriter writer(*options.witness);
+  for (const Job& job : jobs) {
+    if (!job.failure) writer.write(job.verdict, *job.file, options.check);
+  }
+}
+
+int explain(const std::string& code) {
+  std::vector<std::string_view> names;
+  for (const check::Code& each : check::codes()) names.push_back(each.name);
+  const auto text = check::explanationOf(code);
+  if (!text) {
+    throw Failure(ExitStatus::badInput,
+                  "--explain: no finding has the code " + quote(code) + didYouMean(code, names));
+  }
+  std::cout << *text;
+  return static_cast<int>(ExitStatus::fine);
+}
+
+void requireSense(const CommandOptions& options) {
+  if (options.scripts.empty()) {
+    throw Failure(ExitStatus::badInput, "SCRIPT is required; see qz-walkthrough check --help");
+  }
+  if (options.updateBaseline && !options.baseline) {
+    throw Failure(ExitStatus::badInput, "--update-baseline requires --baseline FILE");
+  }
+}
+
+int runCheck(const CommandOptions& options) {
+  if (options.explain) return explain(*options.explain);
+  requireSense(options);
+  const auto& format = formatNamed(options.format);
+  auto jobs = checkAll(options);
+  applyBaseline(options, jobs);
+  writeWitnesses(options, jobs);
   std::vector<check::Report> reports;
-  auto file = files.begin();
-  for (const auto& verdict : verdicts) {
-    reports.push_back({verdict, *file++, stageArguments(options.check)});
+  for (const Job& job : jobs) {
+    if (!job.failure) reports.push_back({job.verdict, *job.file, stageArguments(options.check)});
   }
   format.write(reports, outputShowsColor(), std::cout);
-  return statusOf(verdicts, options.failOn);
+  std::cout.flush();
+  for (const Job& job : jobs) {
+    if (job.failure) std::cerr << "qz-walkthrough: " << job.failure->what() << '\n';
+  }
+  return statusOf(jobs, options.failOn);
 }
 
 void addWindowOptions(Command& command, CheckOptions& options) {
@@ -105,8 +202,8 @@ void addWindowOptions(Command& command, CheckOptions& options) {
                                "The host's window, a property list of its controls");
   auto assets = command.option("--assets", options.stage.assets,
                                "A description from which the engine builds the window");
-  window.valueName("HOST.plist").excludes(assets);
-  assets.valueName("DESCRIPTION.plist");
+  window.valueName("HOST.plist").file().excludes(assets);
+  assets.valueName("DESCRIPTION.plist").file();
   auto standIn = command.flag("--stand-in", options.standIn,
                               "Check without a window: make one from the script, and say nothing "
                               "about the tags and kinds of controls");
@@ -114,7 +211,8 @@ void addWindowOptions(Command& command, CheckOptions& options) {
   command
       .option("--resources", options.resources,
               "The directory of the images (default: the script's)")
-      .valueName("DIR");
+      .valueName("DIR")
+      .directory();
   command.flag("--sheet", options.stage.sheet,
                "Show the window as a sheet over another window of the host");
   options.toolkit = testToolkit();
@@ -122,6 +220,7 @@ void addWindowOptions(Command& command, CheckOptions& options) {
       .option("--toolkit", options.toolkit,
               "The toolkit whose fonts and images the script may use: " + toolkitHelp())
       .valueName("NAME")
+      .choices(driverNames())
       .showDefault();
 }
 
@@ -136,6 +235,12 @@ void addExploringOptions(Command& command, CheckOptions& options) {
           "--limit", [&](const std::string& n) { options.limits.places = positive("--limit", n); },
           "Stop after this many places (default: 1000000)")
       .valueName("PLACES");
+  command
+      .taken(
+          "--memory",
+          [&](const std::string& n) { options.limits.bytes = positive("--memory", n) << 20U; },
+          "Stop when the places take this much memory (default: 4096)")
+      .valueName("MEGABYTES");
   command
       .taken(
           "--seconds",
@@ -169,28 +274,63 @@ void setFailOn(CommandOptions& options, const std::string& name) {
   options.failOn = *severity;
 }
 
-void describeCheck(Command& command) {
-  const auto options = std::make_shared<CommandOptions>();
-  command.arguments("SCRIPT", options->scripts, "The scripts, property lists");
-  addWindowOptions(command, options->check);
-  addExploringOptions(command, options->check);
-  command.option("--format", options->format, "The format of the report: " + formatNames())
+void addAnswerOptions(Command& command, CommandOptions& options) {
+  std::vector<std::string_view> formats;
+  for (const auto& format : check::reportFormats()) formats.push_back(format.name);
+  command.option("--format", options.format, "The format of the report: " + formatNames())
       .valueName("FORMAT")
+      .choices(formats)
       .showDefault();
   command
+      .option("--witness", options.witness,
+              "Write a scenario for each finding that has a path, to replay it with `test`")
+      .valueName("DIR")
+      .directory();
+  command
       .taken(
-          "--fail-on", [options](const std::string& name) { setFailOn(*options, name); },
+          "--fail-on", [&](const std::string& name) { setFailOn(options, name); },
           "The least severity that fails: error, warning or note (default: warning)")
-      .valueName("SEVERITY");
+      .valueName("SEVERITY")
+      .choices({"error", "warning", "note"});
+}
+
+void addAuthorsOptions(Command& command, CommandOptions& options) {
+  std::vector<std::string_view> codes;
+  for (const check::Code& code : check::codes()) codes.push_back(code.name);
+  command
+      .option("--expect", options.check.expectations,
+              "What must hold when the script is played (default: check.expect beside the script)")
+      .valueName("FILE")
+      .file();
   command
       .repeated(
           "--allow",
-          [options](const std::string& text) {
-            options->check.allowances.push_back(check::parseAllowance(text, "--allow"));
-            options->check.allowances.back().place.clear();
+          [&](const std::string& text) {
+            options.check.allowances.push_back(check::parseAllowance(text, "--allow"));
           },
           "Take back the findings of a code, or those of one list")
-      .valueName("CODE[=KEY]");
+      .valueName("CODE[=KEY]")
+      .choices(codes);
+  command
+      .option("--baseline", options.baseline,
+              "Take back the findings that this file has, so that only new ones fail")
+      .valueName("FILE")
+      .file();
+  command.flag("--update-baseline", options.updateBaseline,
+               "Write the findings to the file of --baseline");
+  command
+      .option("--explain", options.explain, "Print what a code means and how to mend it, and end")
+      .valueName("CODE")
+      .choices(codes);
+}
+
+void describeCheck(Command& command) {
+  const auto options = std::make_shared<CommandOptions>();
+  command.arguments("SCRIPT", options->scripts, "The scripts, property lists").file().notRequired();
+  addWindowOptions(command, options->check);
+  addExploringOptions(command, options->check);
+  addAnswerOptions(command, *options);
+  addAuthorsOptions(command, *options);
   command.action([options] {
     auto& check = options->check;
     if (!check.stage.window && !check.stage.assets) check.standIn = true;

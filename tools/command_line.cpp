@@ -109,6 +109,11 @@ Command::Option& Command::Option::showDefault() {
   return *this;
 }
 
+Command::Option& Command::Option::notRequired() {
+  option_->required(false);
+  return *this;
+}
+
 Command::Option& Command::Option::path() {
   option_->check(whyNotPath);
   return *this;

@@ -47,6 +47,8 @@ class Command {
     Option& valueName(const std::string& name);
     /// Shows the variable's present value in the help, as the default.
     Option& showDefault();
+    /// Lets the user leave a positional argument out.
+    Option& notRequired();
     /// Refuses an empty text.
     Option& path();
     /// Lets the user give only one of the two.

@@ -76,16 +76,15 @@ bool Looks::noteControls(Seen& seen, const World& world, std::size_t pathLength)
       anything = anything || isNew;
       differ = differ || (isNew && differs(values));
     }
-    if (differ) noteDifference(world, controls[i], pathLength);
+    if (differ && !controls[i].hidden) noteDifference(world, i, pathLength);
   }
   return anything;
 }
 
-void Looks::noteDifference(const World& world, const drivers::ViewPicture& control,
-                           std::size_t pathLength) {
+void Looks::noteDifference(const World& world, std::size_t control, std::size_t pathLength) {
   const std::string& list = world.history().lastWord;
-  if (control.hidden || list.empty() || !world.isOnScreen()) return;
-  differences_.add({"looks-differ", list, std::nullopt, control.tag, pathLength});
+  if (list.empty() || !world.isOnScreen()) return;
+  differences_.add({"looks-differ", list, std::nullopt, world.ownTags()[control], pathLength});
 }
 
 void Looks::report(Findings& findings) const {

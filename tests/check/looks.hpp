@@ -37,8 +37,7 @@ class Looks {
   };
 
   bool noteControls(Seen& seen, const World& world, std::size_t pathLength);
-  void noteDifference(const World& world, const drivers::ViewPicture& control,
-                      std::size_t pathLength);
+  void noteDifference(const World& world, std::size_t control, std::size_t pathLength);
 
   std::map<std::pair<std::size_t, std::string>, Seen> seen_;
   TextNumbers numbers_;

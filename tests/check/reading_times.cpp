@@ -18,8 +18,12 @@ double readingTime(const std::string& text) {
 }
 
 ReadingTimes::ReadingTimes(drivers::Driver& driver, const toolkit::Ref<toolkit::Window>& window,
-                           const History& history)
-    : driver_(driver), window_(window), before_(fields()), ages_(history.textAge) {}
+                           const std::vector<toolkit::Tag>& ownTags, const History& history)
+    : driver_(driver),
+      window_(window),
+      ownTags_(ownTags),
+      before_(fields()),
+      ages_(history.textAge) {}
 
 std::vector<ReadingTimes::Field> ReadingTimes::fields() const {
   std::vector<Field> fields;
@@ -31,7 +35,7 @@ std::vector<ReadingTimes::Field> ReadingTimes::fields() const {
     const auto picture = driver_.look(views[i]);
     const bool isSeen = onScreen && !picture.hidden;
     fields.push_back(
-        {i, picture.tag, isSeen ? std::optional(picture.text.string()) : std::nullopt});
+        {i, ownTags_[i], isSeen ? std::optional(picture.text.string()) : std::nullopt});
   }
   return fields;
 }

@@ -22,7 +22,7 @@ double readingTime(const std::string& text);
 class ReadingTimes {
  public:
   ReadingTimes(drivers::Driver& driver, const toolkit::Ref<toolkit::Window>& window,
-               const History& history);
+               const std::vector<toolkit::Tag>& ownTags, const History& history);
 
   /// The move is a wait of so many seconds, for the timer that this element started.
   void wait(double seconds, const Site& starter);
@@ -40,6 +40,7 @@ class ReadingTimes {
 
   drivers::Driver& driver_;
   const toolkit::Ref<toolkit::Window>& window_;
+  const std::vector<toolkit::Tag>& ownTags_;
   std::vector<Field> before_;
   std::vector<double> ages_;
   std::optional<double> seconds_;

@@ -69,6 +69,7 @@ World::World(const Script& script, const HostWindow& host, const std::string& re
   engine_->flashingTimer()->invalidate();
   tracer_ = std::make_shared<Tracer>(*engine_, script_);
   engine_->setObserver(tracer_);
+  for (const auto& view : views()) ownTags_.push_back(view->tag());
 }
 
 World::~World() {
@@ -78,7 +79,7 @@ World::~World() {
 
 const Trace& World::perform(const Move& move) {
   tracer_->trace = {};
-  ReadingTimes reading(driver_, window_, tracer_->history);
+  ReadingTimes reading(driver_, window_, ownTags_, tracer_->history);
   if (move.kind == Move::Kind::wait) {
     const PendingTimer first = timers().front();
     reading.wait(first.timeLeft, history().starters.at(first.key).site);

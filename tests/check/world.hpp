@@ -70,6 +70,8 @@ class World {
   std::map<std::string, bool> flashMarks() const;
 
   const History& history() const { return tracer_->history; }
+  /// Returns the tags that the controls had before the start, back to front.
+  const std::vector<toolkit::Tag>& ownTags() const { return ownTags_; }
 
  private:
   void start(const std::string& key);
@@ -82,6 +84,7 @@ class World {
   toolkit::Ref<toolkit::Window> window_;
   std::shared_ptr<QZ_Plist_State_Parser> engine_;
   std::shared_ptr<Tracer> tracer_;
+  std::vector<toolkit::Tag> ownTags_;
 };
 
 }  // namespace qz::naive

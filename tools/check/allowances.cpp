@@ -24,27 +24,29 @@ std::string wordsOf(const Allowance& allowance) {
 
 }  // namespace
 
-Allowance parseAllowance(std::string_view text, const std::string& place) {
+Allowance parseAllowance(std::string_view text, const std::string& source) {
   const auto equals = text.find('=');
-  Allowance allowance{.code = std::string(text.substr(0, equals)), .key = {}, .place = place};
+  Allowance allowance{.code = std::string(text.substr(0, equals)), .key = {}};
   if (equals != std::string_view::npos) allowance.key = std::string(text.substr(equals + 1));
   if (codeNamed(allowance.code)) return allowance;
   std::vector<std::string_view> names;
   for (const Code& code : codes()) names.push_back(code.name);
-  throw Failure(ExitStatus::badInput, place + ": no finding has the code " + quote(allowance.code) +
+  throw Failure(ExitStatus::badInput, source + ": no finding has the code " +
+                                          quote(allowance.code) +
                                           didYouMean(allowance.code, names));
 }
 
 std::vector<Allowance> readAllowances(const std::string& path) {
   std::vector<Allowance> allowances;
   for (const Line& line : linesOf(path, "allowances")) {
-    const std::string place = path + ":" + std::to_string(line.number);
+    const FileLine place{path, line.number};
     if (line.words.size() > 1) {
-      throw Failure(ExitStatus::badInput, place +
+      throw Failure(ExitStatus::badInput, place.text() +
                                               ": expected one CODE or CODE=KEY, then a comment "
                                               "that begins with #");
     }
-    allowances.push_back(parseAllowance(line.words.front(), place));
+    allowances.push_back(parseAllowance(line.words.front(), place.text()));
+    allowances.back().place = place;
   }
   return allowances;
 }
@@ -55,11 +57,11 @@ void applyAllowances(std::vector<Finding>& findings, const std::vector<Allowance
     const bool isNeeded = std::any_of(findings.begin(), findings.end(), [&](const Finding& each) {
       return matches(allowance, each);
     });
-    if (isNeeded || allowance.place.empty()) continue;
+    if (isNeeded || !allowance.place) continue;
     unneeded.push_back(findingOf("unneeded-allowance",
                                  "nothing needs the allowance " + wordsOf(allowance) + " any more",
                                  "delete the line"));
-    unneeded.back().place = allowance.place;
+    unneeded.back().elsewhere = allowance.place;
   }
   std::erase_if(findings, [&](const Finding& finding) {
     return std::any_of(allowances.begin(), allowances.end(),

@@ -14,13 +14,13 @@ namespace qz::tools::check {
 /// Takes back the findings of a code: all, or those of one list or tag.
 struct Allowance {
   std::string code;
-  std::optional<std::string> key;  ///< of the list; or the tag, for findings without a list
-  std::string place;               ///< "FILE:LINE"; empty for one from the command line
+  std::optional<std::string> key;   ///< of the list; or the tag, for findings without a list
+  std::optional<FileLine> place{};  ///< absent for one from the command line
 };
 
-/// Reads `CODE` or `CODE=KEY`. Throws a Failure, which begins with `place`, if no code is called
+/// Reads `CODE` or `CODE=KEY`. Throws a Failure, which begins with `source`, if no code is called
 /// so.
-Allowance parseAllowance(std::string_view text, const std::string& place);
+Allowance parseAllowance(std::string_view text, const std::string& source);
 
 /// Reads a file of allowances: one on a line, with comments that begin with `#`.
 std::vector<Allowance> readAllowances(const std::string& path);

@@ -34,14 +34,66 @@ std::vector<std::string> startKeysOf(const Script& script, const CheckOptions& o
 
 constexpr std::size_t longestShownPath = 100;  // moves
 
+/// Returns the path of a file beside the script, if there is one.
+std::optional<std::string> pathBeside(const InputFile& file, const char* name) {
+  auto path = std::filesystem::path(file.path()).replace_filename(name);
+  return std::filesystem::exists(path) ? std::optional(path.string()) : std::nullopt;
+}
+
 /// Returns the allowances of the options, and of the file beside the script.
 std::vector<Allowance> allowancesFor(const InputFile& file, const CheckOptions& options) {
   std::vector<Allowance> allowances = options.allowances;
-  const auto beside = std::filesystem::path(file.path()).replace_filename("check.allow");
-  if (!std::filesystem::exists(beside)) return allowances;
-  const auto more = readAllowances(beside.string());
-  allowances.insert(allowances.end(), more.begin(), more.end());
+  if (const auto path = pathBeside(file, "check.allow")) {
+    const auto more = readAllowances(*path);
+    allowances.insert(allowances.end(), more.begin(), more.end());
+  }
   return allowances;
+}
+
+std::vector<Expectation> expectationsFor(const InputFile& file, const Script& script,
+                                         const CheckOptions& options) {
+  const auto path = options.expectations ? options.expectations : pathBeside(file, "check.expect");
+  return path ? readExpectations(*path, script) : std::vector<Expectation>();
+}
+
+/// Lets the exploration keep what the expectations need.
+void watchFor(const std::vector<Expectation>& expectations, Setting& setting) {
+  setting.wholeLooks = compareLooks(expectations);
+  const auto watch = [&](const Condition& condition) {
+    if (condition.kind != Condition::Kind::listRan) return;
+    setting.watchedLists.resize(setting.script.lists().size());
+    setting.watchedLists[*setting.script.listUnder(condition.word)] = true;
+  };
+  for (const Expectation& expectation : expectations) {
+    watch(expectation.condition);
+    if (expectation.consequence) watch(*expectation.consequence);
+  }
+}
+
+std::vector<Finding> checkExpectations(Exploration& exploration,
+                                       const std::vector<Expectation>& expectations,
+                                       unsigned threads, ExpectationCounts& counts) {
+  if (expectations.empty()) return {};
+  ExpectationCheck check(exploration, expectations);
+  exploration.makeAllMoves(threads,
+                           [&](const Occasion& occasion, const Arrival& arrival, std::uint32_t,
+                               std::uint32_t place) { check.see(occasion, arrival, place); });
+  auto findings = check.findings();
+  counts = check.counts();
+  return findings;
+}
+
+Explored exploredBy(const Exploration& exploration) {
+  return {.places = exploration.places(),
+          .presses = exploration.presses(),
+          .waits = exploration.waits(),
+          .complete = exploration.isComplete(),
+          .stop = exploration.stop(),
+          .frontier = exploration.places() - exploration.expandedPlaces()};
+}
+
+void append(std::vector<Finding>& findings, std::vector<Finding> more) {
+  std::move(more.begin(), more.end(), std::back_inserter(findings));
 }
 
 /// Sorts by place in the script; what belongs to no place comes last.
@@ -65,10 +117,16 @@ void sortByPlace(std::vector<Finding>& findings, const InputFile& file) {
 
 }  // namespace
 
-Verdict checkScript(const InputFile& file, const CheckOptions& options, const CheckHooks& hooks) {
+std::string resourcesFor(const InputFile& file, const CheckOptions& options) {
+  return options.resources.value_or(std::filesystem::absolute(file.path()).parent_path().string());
+}
+
+Verdict checkScript(const InputFile& file, const CheckOptions& options,
+                    const ExplorationHooks& hooks) {
   const Script script(file.dictionary());
-  const auto folder = std::filesystem::absolute(file.path()).parent_path().string();
-  const std::string resources = options.resources.value_or(folder);
+  const std::string resources = resourcesFor(file, options);
+  const auto expectations = expectationsFor(file, script, options);
+  const auto allowances = allowancesFor(file, options);
 
   const auto driver = requireDriver(options.toolkit);
   driver->setResourcePath(resources);
@@ -76,26 +134,24 @@ Verdict checkScript(const InputFile& file, const CheckOptions& options, const Ch
   verdict.findings = readScript(script, driver->toolkit());
 
   const auto plan = walkthrough::planStage(options.stage, script.dictionary(), file.path());
-  const Setting setting = settingOf(script, plan, resources);
+  Setting setting = settingOf(script, plan, resources);
+  watchFor(expectations, setting);
   Exploration exploration(setting, startKeysOf(script, options));
-  exploration.run(options.limits, options.threads, hooks.report, hooks.isCancelled);
-  verdict.explored = {exploration.places(), exploration.presses(), exploration.waits(),
-                      exploration.isComplete()};
+  exploration.run(options.limits, options.threads, hooks);
+  verdict.explored = exploredBy(exploration);
   if (const auto difference = selfCheck(exploration)) {
     throw Failure(ExitStatus::failed, file.path() + ": internal error: the exploration is wrong (" +
                                           *difference + "); please report this with the script");
   }
-  auto found = conclude(exploration, verdict.findings, options.standIn, options.threads);
-  std::move(found.begin(), found.end(), std::back_inserter(verdict.findings));
+  auto& findings = verdict.findings;
+  append(findings, conclude(exploration, findings, options.standIn, options.threads));
   if (!options.standIn) {
-    found = concludeFromLooks(exploration, {options.wordsPerMinute, options.threads});
-  } else {
-    found.clear();
+    append(findings, concludeFromLooks(exploration, {options.wordsPerMinute, options.threads}));
   }
-  std::move(found.begin(), found.end(), std::back_inserter(verdict.findings));
-  applyAllowances(verdict.findings, allowancesFor(file, options));
-  sortByPlace(verdict.findings, file);
-  for (Finding& finding : verdict.findings) {
+  append(findings, checkExpectations(exploration, expectations, options.threads, verdict.expected));
+  applyAllowances(findings, allowances);
+  sortByPlace(findings, file);
+  for (Finding& finding : findings) {
     if (finding.path.size() <= longestShownPath) finding.played = playPath(setting, finding.path);
   }
   return verdict;

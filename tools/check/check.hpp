@@ -9,6 +9,7 @@
 #include <vector>
 
 #include "tools/check/allowances.hpp"
+#include "tools/check/expectation_check.hpp"
 #include "tools/check/exploration.hpp"
 #include "tools/check/finding.hpp"
 #include "tools/support/input_file.hpp"
@@ -26,6 +27,7 @@ struct CheckOptions {
   double wordsPerMinute = 200;
   unsigned threads = 1;
   std::vector<Allowance> allowances;  ///< in addition to the file `check.allow` beside the script
+  std::optional<std::string> expectations;  ///< path; absent: `check.expect` beside the script
 };
 
 /// What was explored, and whether that is everything.
@@ -34,23 +36,25 @@ struct Explored {
   std::size_t presses = 0;
   std::size_t waits = 0;
   bool complete = false;
+  Stop stop = Stop::none;    ///< why it is not everything
+  std::size_t frontier = 0;  ///< how many places are known whose moves were not made
 };
 
 /// What a check has to say of one script.
 struct Verdict {
   std::string path;  ///< of the script
   Explored explored{};
-  bool isStandIn = false;           ///< nothing is said about targets
+  bool isStandIn = false;  ///< nothing is said about targets
+  ExpectationCounts expected{};
+  std::size_t inBaseline = 0;       ///< findings that a baseline took back
   std::vector<Finding> findings{};  ///< by place in the file, most severe first
 };
 
-/// Called while a check works.
-struct CheckHooks {
-  std::function<void(const Progress&)> report = [](const Progress&) {};
-  std::function<bool()> isCancelled = [] { return false; };
-};
+/// Returns the directory of the named images.
+std::string resourcesFor(const InputFile& file, const CheckOptions& options);
 
 /// Checks one script. Throws a Failure if a file does not hold what it should.
-Verdict checkScript(const InputFile& file, const CheckOptions& options, const CheckHooks& hooks);
+Verdict checkScript(const InputFile& file, const CheckOptions& options,
+                    const ExplorationHooks& hooks);
 
 }  // namespace qz::tools::check

@@ -272,13 +272,8 @@ class Conclusions {
   }
 
   std::pair<const ScriptList*, std::size_t> placeOf(Subject subject) const {
-    const auto number = static_cast<std::size_t>(subject);
-    const auto& lists = script_.lists();
-    const auto after = std::upper_bound(
-        lists.begin(), lists.end(), number,
-        [](std::size_t wanted, const ScriptList& each) { return wanted < each.firstElement; });
-    const ScriptList& list = *std::prev(after);
-    return {&list, number - list.firstElement};
+    const auto [list, element] = script_.placeOf(static_cast<std::size_t>(subject));
+    return {&script_.lists()[list], element};
   }
 
   Tag ownIdOf(Subject subject) const { return placeOf(subject).first->tag.value_or(0); }

@@ -10,7 +10,7 @@
 namespace qz::tools::check {
 
 struct Exploration::Expansion {
-  static constexpr std::size_t roundSize = 4096;  // visits that are expanded together
+  static constexpr std::size_t largestRound = 4096;  // visits that are expanded together
 
   struct Found {
     Arrival arrival;

@@ -32,30 +32,51 @@ Exploration::Exploration(const Setting& setting, std::vector<std::string> startK
   numberOf({});
 }
 
-void Exploration::run(const ExplorationLimits& limits, unsigned threads,
-                      const std::function<void(const Progress&)>& report,
-                      const std::function<bool()>& isCancelled) {
+void Exploration::run(const ExplorationLimits& limits, unsigned threads, ExplorationHooks hooks) {
   const auto began = std::chrono::steady_clock::now();
   const auto isLate = [&] {
     const std::chrono::duration<double> passed = std::chrono::steady_clock::now() - began;
     return limits.seconds && passed.count() > *limits.seconds;
   };
+  hooks_ = std::move(hooks);
   const std::size_t most = std::min(limits.places, mostPlaces);
   start();
   std::vector<Expansion> expansions;
   std::uint32_t next = 0;
+  const auto isOverLimit = [&] {
+    if (set_.count() >= most) stop_ = Stop::places;
+    if (isLate()) stop_ = Stop::time;
+    if (bytes() > limits.bytes) stop_ = Stop::memory;
+    if (hooks_.isCancelled()) stop_ = Stop::cancelled;
+    return stop_ != Stop::none;
+  };
   while (next < visits_.size()) {
-    if (set_.count() >= most || isLate() || isCancelled()) return;
-    expansions.resize(std::min(Expansion::roundSize, visits_.size() - next));
+    if (isOverLimit()) return;
+    expansions.resize(std::min(roundSize(), visits_.size() - next));
     expandAll(expansions, next, threads);
     for (const Expansion& expansion : expansions) {
-      if (set_.count() >= most) return;
+      if (set_.count() >= most) break;
       merge(expansion);
       ++next;
     }
-    report({set_.count(), visits_.size() - next});
+    hooks_.report({set_.count(), visits_.size() - next});
   }
-  complete_ = true;
+}
+
+// A round is short where places are large, so that it takes little memory and can be cancelled.
+std::size_t Exploration::roundSize() const {
+  constexpr std::size_t roundBytes = std::size_t{64} << 20U;
+  const std::size_t buttons = static_cast<std::size_t>(
+      std::count_if(setting_.kinds.begin(), setting_.kinds.end(), drivers::isButton));
+  const std::size_t each = (buttons + 1) * (format_.size() + sizeof(Expansion::Found));
+  return std::clamp<std::size_t>(roundBytes / each, 1, Expansion::largestRound);
+}
+
+std::size_t Exploration::bytes() const {
+  const std::size_t perLook = (format_.controls() + 2) * sizeof(LookValue) + sizeof(Looks::Parts);
+  return set_.count() * (format_.size() + 2 * sizeof(std::uint32_t)) + edges_.size() +
+         visits_.size() * sizeof(Visit) + looks_.count() * perLook +
+         furtherLooks_.size() * perLook * sizeof(std::vector<LookValue>) / sizeof(LookValue);
 }
 
 void Exploration::start() {
@@ -165,7 +186,6 @@ std::uint32_t Exploration::arrive(const Arrival& arrival, const PendingTimers& t
   visit.place = known ? *known : set_.add(place.data(), hash);
   if (!known) firstVisit_.push_back(static_cast<std::uint32_t>(visits_.size()));
   if (isNews(visit.place, visit) || !known) visits_.push_back(visit);
-  followTexts(visit);
   for (const std::uint32_t element : arrival.timerElements) {
     timerStarts_.try_emplace({visit.place, element}, Occasion{visit.parent, visit.move});
   }
@@ -181,11 +201,11 @@ bool Exploration::hasNewPart(std::uint32_t place, const Visit& visit) {
   if (firstVisit_[place] == visits_.size()) return true;
   const Visit& first = visits_[firstVisit_[place]];
   if (visit.look == first.look) return false;
+  bool isNew = setting_.wholeLooks && wholeLooks_.insert({place, visit.look}).second;
   const Looks::Parts& parts = looks_.parts(visit.look);
   const Looks::Parts& known = looks_.parts(first.look);
   auto& further = furtherLooks_[place];
   further.resize(parts.size());
-  bool isNew = false;
   for (std::size_t i = 0; i < parts.size(); ++i) {
     if (parts[i] == known[i]) continue;
     auto& values = further[i];
@@ -207,50 +227,47 @@ bool Exploration::hasNewList(std::uint32_t place, const Visit& visit) {
   return true;
 }
 
-std::vector<std::size_t> Exploration::partsWithOtherText(std::uint32_t before,
-                                                         std::uint32_t after) const {
-  std::vector<std::size_t> found;
-  if (before == after) return found;
-  const Looks::Parts& old = looks_.parts(before);
-  const Looks::Parts& now = looks_.parts(after);
-  for (std::size_t i = 0; i < format_.controls(); ++i) {
-    if (old[i] != now[i] && textOf(looks_.look(old[i]).view) != textOf(looks_.look(now[i]).view)) {
-      found.push_back(i);
-    }
+std::vector<std::size_t> Exploration::partsWithSeveralLooks(std::uint32_t place) const {
+  std::vector<std::size_t> parts;
+  const auto further = furtherLooks_.find(place);
+  if (further == furtherLooks_.end()) return parts;
+  for (std::size_t part = 0; part < further->second.size(); ++part) {
+    if (!further->second[part].empty()) parts.push_back(part);
   }
-  return found;
+  return parts;
 }
 
-void Exploration::followTexts(const Visit& to) {
-  const std::uint32_t before = to.parent == noVisit ? firstLook_ : visits_[to.parent].look;
-  const auto changed = partsWithOtherText(before, to.look);
-  if (changed.empty()) return;
-  const Looks::Parts& old = looks_.parts(before);
-  const Looks::Parts& now = looks_.parts(to.look);
-  const auto isShown = [&](std::uint32_t place, std::size_t part) {
-    return !format_.control(set_.place(place), part).hidden;
-  };
-  for (const std::size_t part : changed) {
-    if (to.parent != noVisit && to.move == waitMove && isShown(visits_[to.parent].place, part)) {
-      replacedTexts_.insert({visits_[to.parent].place, part, old[part]});
+void Exploration::makeAllMoves(unsigned threads, const See& see) {
+  if (stop_ == Stop::time || stop_ == Stop::cancelled) return;
+  for (std::uint32_t number = 0; number < visits_.size(); ++number) {
+    const Visit& visit = visits_[number];
+    if (visit.parent != noVisit) continue;
+    for (const Arrival& start : starts_) {
+      if (start.move == visit.move) {
+        see({noVisit, visit.move}, start, visit.lastList, visit.place);
+      }
     }
-    if (!timers(to.place).empty() && isShown(to.place, part)) {
-      freshTexts_.try_emplace({to.place, part, now[part]},
-                              ReplacedText{.place = to.place,
-                                           .part = part,
-                                           .value = now[part],
-                                           .list = to.lastList,
-                                           .shown = {to.parent, to.move}});
-    }
+  }
+  std::vector<Expansion> expansions;
+  for (std::uint32_t next = 0; next < visits_.size();) {
+    if (hooks_.isCancelled()) return;
+    expansions.resize(std::min(roundSize(), visits_.size() - next));
+    expandAll(expansions, next, threads);
+    next += static_cast<std::uint32_t>(expansions.size());
+    for (const Expansion& expansion : expansions) seeExpansion(expansion, see);
   }
 }
 
-std::vector<ReplacedText> Exploration::replacedTexts() const {
-  std::vector<ReplacedText> texts;
-  for (const auto& [key, text] : freshTexts_) {
-    if (replacedTexts_.contains(key)) texts.push_back(text);
+void Exploration::seeExpansion(const Expansion& expansion, const See& see) {
+  const Visit& visit = visits_[expansion.visit];
+  for (std::size_t i = 0; i < expansion.found.size(); ++i) {
+    const Arrival& arrival = expansion.found[i].arrival;
+    if (arrival.isEndless) continue;
+    if (const auto place = knownPlace(expansion, i)) {
+      see({expansion.visit, arrival.move}, arrival, arrival.lastList.value_or(visit.lastList),
+          *place);
+    }
   }
-  return texts;
 }
 
 std::optional<std::uint32_t> Exploration::knownPlace(const Expansion& expansion, std::size_t move) {

@@ -10,7 +10,6 @@
 #include <optional>
 #include <set>
 #include <string>
-#include <tuple>
 #include <unordered_map>
 #include <vector>
 
@@ -39,6 +38,7 @@ inline constexpr std::uint32_t noList = 0xffffffff;
 
 struct ExplorationLimits {
   std::size_t places = 1'000'000;
+  std::size_t bytes = std::size_t{4} << 30U;  ///< of memory that what was explored takes, about
   std::optional<double> seconds;
 };
 
@@ -48,37 +48,29 @@ struct Progress {
   std::size_t frontier = 0;  ///< how many visits wait for their moves
 };
 
-/// A second look on a control at a place where the same list had the last word.
-struct LookDifference {
-  std::uint32_t list = 0;
-  std::size_t part = 0;
-  Occasion first;   ///< after which the place was seen with one look
-  Occasion second;  ///< and with another
-  std::size_t places = 0;
+/// Called while an exploration works, about every tenth of a second.
+struct ExplorationHooks {
+  std::function<void(const Progress&)> report = [](const Progress&) {};
+  std::function<bool()> isCancelled = [] { return false; };
 };
 
-/// A text that the first pending timer of a place replaces.
-struct ReplacedText {
-  std::uint32_t place = 0;
-  std::size_t part = 0;    ///< the control
-  LookValue value = 0;     ///< what it shows
-  std::uint32_t list = 0;  ///< which showed the text
-  Occasion shown;
-};
+/// Why an exploration is not complete.
+enum class Stop : std::uint8_t { none, places, memory, time, cancelled };
 
 class Exploration {
  public:
   Exploration(const Setting& setting, std::vector<std::string> startKeys);
 
-  /// Explores until everything is known, a limit is reached, or `isCancelled` answers YES.
-  void run(const ExplorationLimits& limits, unsigned threads,
-           const std::function<void(const Progress&)>& report,
-           const std::function<bool()>& isCancelled);
+  /// Explores until everything is known, a limit is reached, or `hooks` cancel.
+  void run(const ExplorationLimits& limits, unsigned threads, ExplorationHooks hooks);
 
   const Setting& setting() const { return setting_; }
   const PlaceFormat& format() const { return format_; }
-  bool isComplete() const { return complete_; }
+  bool isComplete() const { return stop_ == Stop::none; }
+  Stop stop() const { return stop_; }
   std::size_t places() const { return set_.count(); }
+  /// Returns how many places have all their moves made.
+  std::size_t expandedPlaces() const { return edgeStart_.size(); }
   std::size_t presses() const { return presses_; }
   std::size_t waits() const { return waits_; }
   const std::uint8_t* place(std::uint32_t number) const { return set_.place(number); }
@@ -103,9 +95,6 @@ class Exploration {
   bool isExpanded(std::uint32_t place) const { return place < edgeStart_.size(); }
   /// Returns the first visit of a place.
   std::uint32_t firstVisit(std::uint32_t place) const { return firstVisit_[place]; }
-  /// Returns the places that look different depending on the way to them. Makes every move once
-  /// more if there may be such places.
-  std::vector<LookDifference> lookDifferences(unsigned threads);
   /// Makes every move once more, starts included, and tells `see` where each leads.
   using See = std::function<void(const Occasion& occasion, const Arrival& arrival,
                                  std::uint32_t lastList, std::uint32_t place)>;
@@ -114,14 +103,21 @@ class Exploration {
   const std::map<std::pair<std::uint32_t, std::uint32_t>, Occasion>& timerStarts() const {
     return timerStarts_;
   }
-  /// Returns the texts that a timer replaces, with the occasions on which they appeared just before
-  /// it started. For each text, control and place, only the first occasion.
-  std::vector<ReplacedText> replacedTexts() const;
-  /// Returns the controls that can show several things at a place.
+  /// Returns the first part of a look that says whether a tag flashes; they are in the order of the
+  /// setting's keys.
+  std::size_t firstFlashPart() const { return format_.controls() + 2; }
+  /// Returns the look of the window before the start.
+  std::uint32_t firstLook() const { return firstLook_; }
+  /// Whether some place can have several looks.
+  bool hasSeveralLooks() const { return !furtherLooks_.empty(); }
+  /// Returns the parts of the look that can have several values at a place.
   std::vector<std::size_t> partsWithSeveralLooks(std::uint32_t place) const;
 
  private:
   struct Expansion;  // of one visit: where its moves lead
+
+  std::size_t roundSize() const;
+  std::size_t bytes() const;
 
   void start();
   void expandAll(std::vector<Expansion>& expansions, std::uint32_t first, unsigned threads);
@@ -132,8 +128,6 @@ class Exploration {
   bool isNews(std::uint32_t place, const Visit& visit);
   bool hasNewPart(std::uint32_t place, const Visit& visit);
   bool hasNewList(std::uint32_t place, const Visit& visit);
-  void followTexts(const Visit& to);
-  std::vector<std::size_t> partsWithOtherText(std::uint32_t before, std::uint32_t after) const;
   void seeExpansion(const Expansion& expansion, const See& see);
   std::optional<std::uint32_t> knownPlace(const Expansion& expansion, std::size_t move);
   std::uint32_t numberOf(const PendingTimers& timers);
@@ -153,21 +147,20 @@ class Exploration {
   std::vector<std::unique_ptr<PendingTimers>> timers_;
   /// The further values of the parts of a place's look, beyond those of its first visit.
   std::unordered_map<std::uint32_t, std::vector<std::vector<LookValue>>> furtherLooks_;
-  std::vector<std::size_t> edgeStart_;  // by place, in edges_
-  std::vector<std::uint8_t> edges_;     // three bytes each
+  std::set<std::pair<std::uint32_t, std::uint32_t>> wholeLooks_;  // place, look; if they matter
+  std::vector<std::size_t> edgeStart_;                            // by place, in edges_
+  std::vector<std::uint8_t> edges_;                               // three bytes each
   std::vector<bool> runsList_;
   std::vector<std::unique_ptr<World>> worlds_;
   /// The lists that had the last word before a place where that matters for what follows.
   std::unordered_map<std::uint32_t, std::vector<std::uint32_t>> lastLists_;
-  using TextPlace = std::tuple<std::uint32_t, std::size_t, LookValue>;
-  std::map<TextPlace, ReplacedText> freshTexts_;
-  std::set<TextPlace> replacedTexts_;
   std::map<std::pair<std::uint32_t, std::uint32_t>, Occasion> timerStarts_;  // place, element
   std::vector<Arrival> starts_;
   std::uint32_t firstLook_ = 0;  // before the start
   std::size_t presses_ = 0;
   std::size_t waits_ = 0;
-  bool complete_ = false;
+  ExplorationHooks hooks_;
+  Stop stop_ = Stop::none;
 };
 
 }  // namespace qz::tools::check

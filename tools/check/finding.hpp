@@ -35,6 +35,15 @@ std::span<const Code> codes();
 /// Returns the code with that name; null for any other name.
 const Code* codeNamed(std::string_view name);
 
+/// A line of a file beside a script.
+struct FileLine {
+  std::string path;
+  std::size_t line = 0;  ///< from 1
+
+  /// Returns "PATH:LINE".
+  std::string text() const { return path + ":" + std::to_string(line); }
+};
+
 struct Finding {
   std::string code;
   Severity severity = Severity::error;
@@ -43,7 +52,7 @@ struct Finding {
   std::optional<std::string> list{};     ///< key of the list in which the cause is
   std::optional<std::size_t> element{};  ///< of the list, from 0
   toolkit::ValueRef<> where{};           ///< the value in the script, for its place; may be absent
-  std::string place{};  ///< "FILE:LINE" of a finding in another file; empty for one in the script
+  std::optional<FileLine> elsewhere{};   ///< the place of a finding that is not in the script
   std::optional<toolkit::Tag> tag{};
   Path path{};  ///< the shortest way to see it; empty for what is read off the script
   std::vector<PlayedMove> played{};  ///< the moves of `path`, and what each changed

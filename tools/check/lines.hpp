@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Small text files with one statement on a line.
+// Small text files with one statement on a line. A word is anything without blanks and commas, or
+// is in double quotes; a comma is a word.
 #pragma once
 
 #include <cstddef>
@@ -11,6 +12,7 @@ namespace qz::tools::check {
 
 struct Line {
   std::size_t number = 0;  ///< from 1
+  std::string text;        ///< as the file has it
   std::vector<std::string> words;
 };
 

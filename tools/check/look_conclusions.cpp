@@ -3,24 +3,15 @@
 
 #include <algorithm>
 #include <cmath>
-#include <map>
 #include <set>
 #include <sstream>
 
+#include "tools/check/look_differences.hpp"
+#include "tools/check/reading_times.hpp"
 #include "tools/support/text_layout.hpp"
 
 namespace qz::tools::check {
 namespace {
-
-constexpr double briefest = 2;  // seconds that every text needs, however short
-
-std::size_t wordsIn(const std::string& text) {
-  std::istringstream words(text);
-  std::string word;
-  std::size_t count = 0;
-  while (words >> word) ++count;
-  return count;
-}
 
 /// Returns a time in seconds with at most one digit behind the point.
 std::string inSeconds(double seconds) {
@@ -38,8 +29,7 @@ class LookConclusions {
         options_(options) {}
 
   std::vector<Finding> findings() {
-    lookDifferences();
-    briefTexts();
+    differencesAndTimes();
     ends();
     return std::move(findings_);
   }
@@ -47,52 +37,49 @@ class LookConclusions {
  private:
   Tag ownTag(std::size_t part) const { return setting_.ownTags[part]; }
 
-  void lookDifferences() {
-    for (const LookDifference& difference : exploration_.lookDifferences(options_.threads)) {
-      const Tag tag = ownTag(difference.part);
-      Finding finding =
-          findingOf("looks-differ",
-                    "after this list the control with the tag " + std::to_string(tag) +
-                        " shows one thing or another, depending on how the user came here",
-                    "let the list set everything that it shows");
-      finding.tag = tag;
-      finding.path = exploration_.path(difference.second);
-      finding.otherPath = exploration_.path(difference.first);
-      add(std::move(finding), difference.list, difference.places);
-    }
+  // The two need every move once more, so they share the work.
+  void differencesAndTimes() {
+    const bool canDiffer = exploration_.hasSeveralLooks();
+    const bool canReplace = exploration_.waits() > 0;
+    if (!canDiffer && !canReplace) return;
+    LookComparison comparison(exploration_);
+    ReadingTimes times(exploration_, options_.wordsPerMinute);
+    exploration_.makeAllMoves(options_.threads,
+                              [&](const Occasion& occasion, const Arrival& arrival,
+                                  std::uint32_t lastList, std::uint32_t place) {
+                                if (canDiffer)
+                                  comparison.see(place, lastList, arrival.look, occasion);
+                                if (canReplace) times.see(occasion, arrival, place);
+                              });
+    for (const LookDifference& difference : comparison.differences()) add(difference);
+    for (const BriefText& text : times.briefTexts()) add(text);
   }
 
-  void briefTexts() {
-    std::map<std::pair<std::uint32_t, std::size_t>, Finding> byCause;
-    for (const ReplacedText& text : exploration_.replacedTexts()) {
-      const double shown = exploration_.timers(text.place).front().seconds;
-      const double words = static_cast<double>(wordsIn(textOf(looks_.look(text.value).view)));
-      const double needed = std::max(briefest, words * 60 / options_.wordsPerMinute);
-      if (words == 0 || shown >= needed) continue;
-      Path path = exploration_.path(text.shown);
-      path.push_back(WaitMove{shown});
-      auto& finding = byCause[{text.list, text.part}];
-      ++finding.places;
-      if (finding.places > 1 && finding.path.size() <= path.size()) continue;
-      const std::size_t places = finding.places;
-      finding = briefText(text, shown, needed);
-      finding.places = places;
-      finding.path = std::move(path);
-    }
-    for (auto& [cause, finding] : byCause) {
-      const std::size_t places = finding.places;
-      add(std::move(finding), cause.first, places);
-    }
-  }
-
-  Finding briefText(const ReplacedText& text, double shown, double needed) const {
+  void add(const LookDifference& difference) {
+    const Tag tag = ownTag(difference.control);
     Finding finding =
-        findingOf("too-brief",
-                  "a timer replaces the text " + quote(textOf(looks_.look(text.value).view)) +
-                      " after " + inSeconds(shown) + "; reading it takes " + inSeconds(needed),
-                  "wait longer, or let the user press a button");
-    finding.tag = ownTag(text.part);
-    return finding;
+        findingOf("looks-differ",
+                  "after this list the control with the tag " + std::to_string(tag) +
+                      " shows one thing or another, depending on how the user came here",
+                  "let the list set everything that it shows");
+    finding.tag = tag;
+    finding.path = exploration_.path(difference.second);
+    finding.otherPath = exploration_.path(difference.first);
+    add(std::move(finding), difference.list, difference.places);
+  }
+
+  void add(const BriefText& text) {
+    Finding finding = findingOf("too-brief",
+                                "the timer that this command starts replaces the text " +
+                                    quote(text.text) + " after " + inSeconds(text.shown) +
+                                    "; reading it takes " + inSeconds(text.needed),
+                                "wait longer, or let the user press a button");
+    const auto [list, element] = setting_.script.placeOf(text.element);
+    finding.element = element;
+    finding.tag = ownTag(text.control);
+    finding.path = text.path;
+    add(std::move(finding), static_cast<std::uint32_t>(list), text.places);
+    findings_.back().where = setting_.script.lists()[list].elements[element].value;
   }
 
   /// What an end leaves behind, one finding for each list that ends and each control.

@@ -97,11 +97,7 @@ std::string keyOf(const ViewLook& look) {
 
 }  // namespace
 
-const std::string& textOf(const SavedView& view) {
-  return view.title.string().empty() ? view.text.string() : view.title.string();
-}
-
-Looks::Looks() : looks_(notedYes + 1) {}
+Looks::Looks() : looks_(flashingAllowed + notedYes + 1) {}
 
 LookValue Looks::valueOf(const ViewLook& look) {
   const std::string key = keyOf(look);
@@ -121,6 +117,11 @@ std::uint32_t Looks::numberOf(const Parts& parts) {
   const auto [place, isNew] = numbers_.emplace(parts, static_cast<std::uint32_t>(wholes_.size()));
   if (isNew) wholes_.push_back(&place->first);
   return place->second;
+}
+
+std::size_t Looks::count() const {
+  const std::lock_guard lock(mutex_);
+  return wholes_.size();
 }
 
 const Looks::Parts& Looks::parts(std::uint32_t number) const {

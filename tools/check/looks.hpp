@@ -28,6 +28,9 @@ using LookValue = std::uint32_t;
 inline constexpr LookValue notedNothing = 0;
 inline constexpr LookValue notedNo = 1;
 inline constexpr LookValue notedYes = 2;
+/// Added to the note about a tag's flashing while all flashing is allowed. The two are one part:
+/// only together do they say whether a button flashes.
+inline constexpr LookValue flashingAllowed = 3;
 
 /// What a view shows, and whether its state is what the user made of it: such a state is the user's
 /// own and tells nothing about the script.
@@ -35,9 +38,6 @@ struct ViewLook {
   SavedView view;
   bool hasUsersState = false;
 };
-
-/// Returns the text that a user reads on a view: a title, or the text of another control.
-const std::string& textOf(const SavedView& view);
 
 /// Gives numbers to what parts show, and to whole looks. Equal ones have equal numbers. Any number
 /// of threads may use it.
@@ -51,6 +51,8 @@ class Looks {
   using Parts = std::vector<LookValue>;
   std::uint32_t numberOf(const Parts& parts);
   const Parts& parts(std::uint32_t number) const;
+  /// Returns the number of whole looks.
+  std::size_t count() const;
 
  private:
   mutable std::mutex mutex_;

@@ -41,6 +41,8 @@ using Path = std::vector<Step>;
 struct PlayedMove {
   std::string words;                 ///< such as "press 2"
   std::vector<std::string> changes;  ///< such as `5: text “Hello”`; in the order of the controls
+  bool raised = false;               ///< an exception reached the host
+  bool isEndless = false;            ///< the move would run lists without end, and was not made
 };
 
 /// A move out of a place, in few bytes: the press of a control by its index, or a wait.

@@ -7,6 +7,8 @@ namespace qz::tools::check {
 namespace {
 
 constexpr std::size_t firstSlots = 1U << 10U;
+constexpr std::size_t blockBytes = std::size_t{1} << 20U;
+constexpr unsigned mostShift = 14;
 
 // The multipliers of MurmurHash3's finalizer, which spread every bit over all others.
 std::uint64_t mixed(std::uint64_t bits) {
@@ -17,7 +19,9 @@ std::uint64_t mixed(std::uint64_t bits) {
 
 }  // namespace
 
-PlaceSet::PlaceSet(std::size_t size) : size_(size), slots_(firstSlots, noPlace) {}
+PlaceSet::PlaceSet(std::size_t size) : size_(size), slots_(firstSlots, noPlace) {
+  while (blockShift_ < mostShift && size << (blockShift_ + 1) <= blockBytes) ++blockShift_;
+}
 
 std::uint64_t PlaceSet::hashOf(const std::uint8_t* place, std::size_t size) {
   std::uint64_t hash = size;
@@ -41,9 +45,9 @@ std::optional<std::uint32_t> PlaceSet::find(const std::uint8_t* place, std::uint
 
 std::uint32_t PlaceSet::add(const std::uint8_t* place, std::uint64_t hash) {
   if ((count_ + 1) * 3 > slots_.size() * 2) grow();
-  if (count_ % blockCount == 0) blocks_.emplace_back(new std::uint8_t[blockCount * size_]);
   const auto number = static_cast<std::uint32_t>(count_++);
-  std::memcpy(blocks_.back().get() + number % blockCount * size_, place, size_);
+  if ((number & blockMask()) == 0) blocks_.emplace_back(new std::uint8_t[size_ << blockShift_]);
+  std::memcpy(blocks_.back().get() + (number & blockMask()) * size_, place, size_);
   const std::size_t mask = slots_.size() - 1;
   std::size_t slot = hash & mask;
   while (slots_[slot] != noPlace) slot = (slot + 1) & mask;

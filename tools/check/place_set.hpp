@@ -19,7 +19,7 @@ class PlaceSet {
 
   std::size_t count() const { return count_; }
   const std::uint8_t* place(std::uint32_t number) const {
-    return blocks_[number / blockCount].get() + number % blockCount * size_;
+    return blocks_[number >> blockShift_].get() + (number & blockMask()) * size_;
   }
   /// Returns the number of a place; absent if it was not added. May be called by several threads
   /// while none adds.
@@ -28,12 +28,13 @@ class PlaceSet {
   std::uint32_t add(const std::uint8_t* place, std::uint64_t hash);
 
  private:
-  static constexpr std::uint32_t blockCount = 1U << 14U;  // places of a block
   static constexpr std::uint32_t noPlace = 0xffffffff;
 
+  std::uint32_t blockMask() const { return (1U << blockShift_) - 1; }
   void grow();
 
   std::size_t size_;
+  unsigned blockShift_ = 0;  // a block has 2 to the power of this places
   std::size_t count_ = 0;
   std::vector<std::unique_ptr<std::uint8_t[]>> blocks_;
   std::vector<std::uint32_t> slots_;  // numbers of places; a power of two, at most two thirds full

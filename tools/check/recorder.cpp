@@ -66,9 +66,11 @@ constexpr double longestDelay = 2147483648.0;
 
 }  // namespace
 
-Recorder::Recorder(const Script& script, Surroundings& surroundings)
+Recorder::Recorder(const Script& script, Surroundings& surroundings,
+                   const std::vector<bool>& watched)
     : script_(script),
       surroundings_(surroundings),
+      watched_(watched),
       noted_(std::max(script.elementCount(), script.lists().size())) {}
 
 void Recorder::begin() {
@@ -76,6 +78,7 @@ void Recorder::begin() {
   running_.clear();
   timers_.clear();
   facts_.clear();
+  watchedLists_.clear();
   firstList_.reset();
   endList_.reset();
   lastList_.reset();
@@ -130,8 +133,12 @@ void Recorder::listWillRun(const Value& list, const ObjectId& id) {
   running_.push_back({.list = script_.runningList(list, tag), .id = tag});
   if (!running_.back().list) return;
   ranList_ = true;
-  if (!firstList_) firstList_ = running_.back().list;
-  noteOnce(FactKind::listRan, *running_.back().list);
+  const std::size_t index = *running_.back().list;
+  if (!firstList_) firstList_ = index;
+  if (!watched_.empty() && watched_[index]) {
+    watchedLists_.push_back(static_cast<std::uint32_t>(index));
+  }
+  noteOnce(FactKind::listRan, index);
 }
 
 void Recorder::listDidRun(const Value&, const ObjectId&) {

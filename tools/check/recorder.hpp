@@ -38,8 +38,8 @@ class Surroundings {
 
 class Recorder final : public Observer {
  public:
-  /// Both must outlive the recorder.
-  Recorder(const Script& script, Surroundings& surroundings);
+  /// Notes of the watched lists, by index, whether a move ran them. All must outlive the recorder.
+  Recorder(const Script& script, Surroundings& surroundings, const std::vector<bool>& watched);
 
   /// Begins a move; what happens before the first move is not recorded.
   void begin();
@@ -59,6 +59,8 @@ class Recorder final : public Observer {
   std::optional<std::size_t> endList() const { return endList_; }
   /// Returns the index of the list whose command ran last; absent if no command ran.
   std::optional<std::size_t> lastList() const { return lastList_; }
+  /// Returns the indices of the watched lists that the move ran.
+  const std::vector<std::uint32_t>& watchedLists() const { return watchedLists_; }
   /// Whether a command ran that can change the background, or what the engine notes of flashing.
   bool notesMayHaveChanged() const { return notesMayHaveChanged_; }
   /// Whether the move ran a list of the script.
@@ -96,11 +98,13 @@ class Recorder final : public Observer {
 
   const Script& script_;
   Surroundings& surroundings_;
+  const std::vector<bool>& watched_;
   bool isRecording_ = false;
   std::vector<Running> running_;
   std::vector<Timer> timers_;
   std::vector<Fact> facts_;
   std::vector<std::uint32_t> noted_;  // bits of FactKind, by the subject
+  std::vector<std::uint32_t> watchedLists_;
   std::optional<std::size_t> firstList_;
   std::optional<std::size_t> endList_;
   std::optional<std::size_t> lastList_;

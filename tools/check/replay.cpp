@@ -35,9 +35,11 @@ class Replay {
         setting.script.dictionary()->copy(toolkit::Mutability::changeable));
   }
 
-  /// Makes a move; NO if it would never end.
-  bool make(const Step& step) {
-    if (runsWithoutEnd(step)) return false;
+  /// What became of a move. A move that would never end is not made.
+  enum class Outcome : std::uint8_t { made, raised, endless };
+
+  Outcome make(const Step& step) {
+    if (runsWithoutEnd(step)) return Outcome::endless;
     try {
       if (const auto* start = std::get_if<StartMove>(&step)) {
         stage_->load(noFile, start->key);
@@ -47,9 +49,9 @@ class Replay {
         driver_.advance(std::get<WaitMove>(step).seconds);
       }
     } catch (const toolkit::Exception&) {
-      // The host would see it; the picture shows what was done until then.
+      return Outcome::raised;  // the picture shows what was done until then
     }
-    return true;
+    return Outcome::made;
   }
 
   StepPicture picture() { return walkthrough::takePicture(driver_, stage_->engine(), ""); }
@@ -140,12 +142,14 @@ std::vector<PlayedMove> playPath(const Setting& setting, const Path& path) {
   std::vector<PlayedMove> played;
   StepPicture before = replay.picture();
   for (const Step& step : path) {
-    if (!replay.make(step)) {
-      played.push_back({wordsOf(step), {"runs lists without end"}});
+    const auto outcome = replay.make(step);
+    if (outcome == Replay::Outcome::endless) {
+      played.push_back({wordsOf(step), {"runs lists without end"}, false, true});
       break;
     }
     StepPicture after = replay.picture();
-    played.push_back({wordsOf(step), changesBetween(before, after)});
+    played.push_back(
+        {wordsOf(step), changesBetween(before, after), outcome == Replay::Outcome::raised, false});
     before = std::move(after);
   }
   return played;
@@ -154,7 +158,7 @@ std::vector<PlayedMove> playPath(const Setting& setting, const Path& path) {
 walkthrough::StepPicture pictureAfter(const Setting& setting, const Path& path) {
   Replay replay(setting);
   for (const Step& step : path) {
-    if (!replay.make(step)) break;
+    if (replay.make(step) == Replay::Outcome::endless) break;
   }
   return replay.picture();
 }

@@ -39,6 +39,11 @@ std::optional<toolkit::TextPosition> positionOf(const Finding& finding, const In
   return text ? std::optional(*text) : std::nullopt;
 }
 
+std::string placeOf(const Finding& finding, const InputFile& file) {
+  if (finding.elsewhere) return finding.elsewhere->text();
+  return finding.where ? file.placeOf(finding.where) : file.path();
+}
+
 std::string playArguments(const Path& path) {
   std::string arguments;
   bool isPressing = false;

@@ -36,6 +36,8 @@ void writeJson(const std::vector<Report>& reports, bool color, std::ostream& out
 
 /// Returns where in the script a finding is; absent for one elsewhere, or in a binary file.
 std::optional<toolkit::TextPosition> positionOf(const Finding& finding, const InputFile& file);
+/// Returns the place of a finding, such as "intro.plist:12:5"; the path alone if that is all.
+std::string placeOf(const Finding& finding, const InputFile& file);
 
 /// Returns the arguments of `play` that walk a path, such as "--start 1 --press 2 3".
 std::string playArguments(const Path& path);

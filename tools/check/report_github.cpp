@@ -38,15 +38,25 @@ std::string_view commandOf(Severity severity) {
   return severity == Severity::note ? "notice" : nameOf(severity);
 }
 
+std::string propertiesOf(const Finding& finding, const Report& report) {
+  if (finding.elsewhere) {
+    return " file=" + escaped(finding.elsewhere->path, true) +
+           ",line=" + std::to_string(finding.elsewhere->line);
+  }
+  const std::string file = " file=" + escaped(report.verdict.path, true);
+  const auto position = positionOf(finding, report.file);
+  if (!position) return file;
+  return file + ",line=" + std::to_string(position->line) +
+         ",col=" + std::to_string(position->column);
+}
+
 }  // namespace
 
 void writeGithub(const std::vector<Report>& reports, bool, std::ostream& out) {
   for (const Report& report : reports) {
     for (const Finding& finding : report.verdict.findings) {
-      out << "::" << commandOf(finding.severity) << " file=" << escaped(report.verdict.path, true);
-      const auto position = positionOf(finding, report.file);
-      if (position) out << ",line=" << position->line << ",col=" << position->column;
-      out << ",title=" << escaped(finding.code, true) << "::" << escaped(finding.message, false);
+      out << "::" << commandOf(finding.severity) << propertiesOf(finding, report)
+          << ",title=" << escaped(finding.code, true) << "::" << escaped(finding.message, false);
       if (!finding.path.empty()) {
         out << escaped("\nqz-walkthrough play " + report.verdict.path + report.stageArguments +
                            " " + playArguments(finding.path),

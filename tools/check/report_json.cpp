@@ -31,7 +31,10 @@ Json jsonOf(const Finding& finding, const InputFile& file) {
       {"code", finding.code}, {"severity", nameOf(finding.severity)}, {"message", finding.message}};
   if (finding.list) json["list"] = *finding.list;
   if (finding.element) json["element"] = *finding.element;
-  if (const auto position = positionOf(finding, file)) {
+  if (finding.elsewhere) {
+    json["file"] = finding.elsewhere->path;
+    json["line"] = finding.elsewhere->line;
+  } else if (const auto position = positionOf(finding, file)) {
     json["line"] = position->line;
     json["column"] = position->column;
   }
@@ -48,13 +51,19 @@ Json jsonOf(const Report& report) {
   for (const Finding& finding : report.verdict.findings) {
     findings.push_back(jsonOf(finding, report.file));
   }
-  return {{"script", report.verdict.path},
-          {"explored",
-           {{"places", explored.places},
-            {"presses", explored.presses},
-            {"waits", explored.waits},
-            {"complete", explored.complete}}},
-          {"findings", std::move(findings)}};
+  Json json = {{"script", report.verdict.path},
+               {"explored",
+                {{"places", explored.places},
+                 {"presses", explored.presses},
+                 {"waits", explored.waits},
+                 {"complete", explored.complete}}}};
+  const ExpectationCounts& expected = report.verdict.expected;
+  if (expected.hold + expected.fail + expected.open > 0) {
+    json["expectations"] = {
+        {"hold", expected.hold}, {"fail", expected.fail}, {"open", expected.open}};
+  }
+  json["findings"] = std::move(findings);
+  return json;
 }
 
 }  // namespace

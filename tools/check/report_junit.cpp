@@ -43,7 +43,7 @@ void writeCase(const Report& report, const Finding& finding, std::ostream& out) 
   out << "    <testcase" << attribute("classname", report.verdict.path)
       << attribute("name", finding.code + ": " + finding.message) << ">\n";
   if (isFailure(finding)) {
-    std::string details = finding.where ? report.file.placeOf(finding.where) : report.verdict.path;
+    std::string details = placeOf(finding, report.file);
     if (!finding.path.empty()) details += ": " + playArguments(finding.path);
     out << "      <failure" << attribute("type", std::string(nameOf(finding.severity)))
         << attribute("message", finding.message) << ">" << xmlText(details) << "</failure>\n";

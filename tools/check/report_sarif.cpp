@@ -19,6 +19,11 @@ constexpr std::size_t mostSteps = 1000;
 Json messageOf(const std::string& text) { return {{"text", text}}; }
 
 Json locationOf(const Report& report, const Finding* finding) {
+  if (finding && finding->elsewhere) {
+    const Json physical = {{"artifactLocation", {{"uri", finding->elsewhere->path}}},
+                           {"region", {{"startLine", finding->elsewhere->line}}}};
+    return {{"physicalLocation", physical}};
+  }
   Json physical = {{"artifactLocation", {{"uri", report.verdict.path}}}};
   const auto position = finding ? positionOf(*finding, report.file) : std::nullopt;
   if (position) {

@@ -44,21 +44,15 @@ class TextReport {
 
  private:
   void writeFinding(const Finding& finding) {
-    const auto place = placeOf(finding);
-    out_ << colors_.bold() << oneLine(place) << ": " << colors_.of(finding.severity)
-         << nameOf(finding.severity) << ":" << colors_.plain() << ' ' << oneLine(finding.message)
-         << " [" << finding.code << "]\n";
+    out_ << colors_.bold() << oneLine(placeOf(finding, report_.file)) << ": "
+         << colors_.of(finding.severity) << nameOf(finding.severity) << ":" << colors_.plain()
+         << ' ' << oneLine(finding.message) << " [" << finding.code << "]\n";
     writeSource(finding);
     writePath(finding.path, "see it");
     for (const PlayedMove& move : finding.played) writeMove(move);
     writePath(finding.otherPath, "and the other");
     if (finding.places > 1) out_ << "  places: " << finding.places << " show it\n";
     if (!finding.help.empty()) out_ << "  help: " << oneLine(finding.help) << '\n';
-  }
-
-  std::string placeOf(const Finding& finding) const {
-    if (!finding.place.empty()) return finding.place;
-    return finding.where ? report_.file.placeOf(finding.where) : report_.verdict.path;
   }
 
   void writeSource(const Finding& finding) {
@@ -86,10 +80,52 @@ class TextReport {
 
   void writeSummary() {
     const Explored& explored = report_.verdict.explored;
-    out_ << colors_.bold() << report_.verdict.path << colors_.plain() << ": explored "
+    out_ << colors_.bold() << oneLine(report_.verdict.path) << colors_.plain() << ": explored "
          << counted(explored.places, "place") << ", " << counted(explored.presses, "press")
          << " and " << counted(explored.waits, "wait") << ", "
-         << (explored.complete ? "which are all" : "and not everything") << "; ";
+         << (explored.complete ? "which are all" : "not everything: " + whyIncomplete(explored))
+         << "; " << findingCounts() << '\n';
+    writeExpected(report_.verdict.expected);
+    if (report_.verdict.inBaseline > 0) {
+      out_ << "  The baseline has taken back " << counted(report_.verdict.inBaseline, "finding")
+           << ".\n";
+    }
+    if (report_.verdict.isStandIn) {
+      out_ << "  The window was made from the script, so nothing is said about the tags and kinds "
+              "of controls; name the host's with --window.\n";
+    }
+  }
+
+  void writeExpected(const ExpectationCounts& expected) {
+    const std::size_t all = expected.hold + expected.fail + expected.open;
+    if (all == 0) return;
+    out_ << "  " << expected.hold << " of " << counted(all, "expectation") << " hold";
+    if (expected.open > 0) {
+      out_ << "; whether " << expected.open
+           << " do is not known, because not everything was explored";
+    }
+    out_ << '\n';
+  }
+
+  static std::string whyIncomplete(const Explored& explored) {
+    const std::string rest =
+        " (the moves of " + counted(explored.frontier, "known place") + " were not made)";
+    switch (explored.stop) {
+      case Stop::places:
+        return "--limit was reached" + rest;
+      case Stop::memory:
+        return "--memory was reached" + rest;
+      case Stop::time:
+        return "--seconds have passed" + rest;
+      case Stop::cancelled:
+        return "you stopped it" + rest;
+      case Stop::none:
+        break;
+    }
+    return rest;
+  }
+
+  std::string findingCounts() const {
     std::string counts;
     for (const auto severity : {Severity::error, Severity::warning, Severity::note}) {
       const auto count = static_cast<std::size_t>(
@@ -97,11 +133,7 @@ class TextReport {
                         [&](const Finding& each) { return each.severity == severity; }));
       counts += (counts.empty() ? "" : ", ") + counted(count, std::string(nameOf(severity)));
     }
-    out_ << counts << '\n';
-    if (report_.verdict.isStandIn) {
-      out_ << "  The window was made from the script, so nothing is said about the tags and kinds "
-              "of controls; name the host's with --window.\n";
-    }
+    return counts;
   }
 
   const Report& report_;

@@ -81,11 +81,16 @@ Script::Script(ValueRef<toolkit::Dictionary> dictionary) : dictionary_(std::move
 }
 
 const Element& Script::element(std::size_t number) const {
-  const auto list = std::upper_bound(
-      lists_.begin(), lists_.end(), number,
+  const auto [list, element] = placeOf(number);
+  return lists_[list].elements[element];
+}
+
+std::pair<std::size_t, std::size_t> Script::placeOf(std::size_t element) const {
+  const auto after = std::upper_bound(
+      lists_.begin(), lists_.end(), element,
       [](std::size_t wanted, const ScriptList& each) { return wanted < each.firstElement; });
-  const auto& found = *std::prev(list);
-  return found.elements[number - found.firstElement];
+  const auto list = static_cast<std::size_t>(after - lists_.begin()) - 1;
+  return {list, element - lists_[list].firstElement};
 }
 
 std::optional<std::size_t> Script::listOfTag(Tag tag) const {

@@ -8,6 +8,7 @@
 #include <string>
 #include <string_view>
 #include <unordered_map>
+#include <utility>
 #include <vector>
 
 #include "qz/commands.hpp"
@@ -53,6 +54,8 @@ class Script {
   /// Returns the number of elements of all lists.
   std::size_t elementCount() const { return elementCount_; }
   const Element& element(std::size_t number) const;
+  /// Returns the index of the list of an element, and the element's index in the list.
+  std::pair<std::size_t, std::size_t> placeOf(std::size_t element) const;
 
   /// Returns the index of the list that a press or a timer finds by a tag; absent if there is none.
   std::optional<std::size_t> listOfTag(Tag tag) const;

@@ -133,7 +133,7 @@ void World::observe() {
   parts_[controls_.size() + 1] = notedNo;
   look_ = looks_.numberOf(parts_);
   Surroundings& surroundings = *this;
-  recorder_ = std::make_shared<Recorder>(setting_.script, surroundings);
+  recorder_ = std::make_shared<Recorder>(setting_.script, surroundings, setting_.watchedLists);
   stage_->engine().setObserver(recorder_);
 }
 
@@ -232,10 +232,11 @@ void World::restoreLook(std::uint32_t look) {
   for (const std::string& key : setting_.flashKeys) {
     ++part;
     if (parts[part] == parts_[part]) continue;
-    if (parts[part] == notedNothing) {
+    const LookValue note = parts[part] % flashingAllowed;
+    if (note == notedNothing) {
       flashing->removeObjectForKey(key);
     } else {
-      flashing->setObject(toolkit::Number::withBool(parts[part] == notedYes), key);
+      flashing->setObject(toolkit::Number::withBool(note == notedYes), key);
     }
   }
   parts_ = parts;
@@ -281,6 +282,7 @@ Arrival World::arrive(Move move, PendingTimers& timers, std::uint8_t* place) {
   timers = isOver ? pendingAtTheEnd() : recorder_->pending();
   std::copy(place_.begin(), place_.end(), place);
   Arrival arrival{.move = move, .ranList = recorder_->ranList(), .look = look_};
+  arrival.watchedLists = recorder_->watchedLists();
   arrival.timerElements = recorder_->pendingElements();
   if (const auto list = recorder_->firstList()) {
     arrival.firstList = static_cast<std::uint32_t>(*list);
@@ -339,7 +341,7 @@ void World::readEngine() {
   parts[++part] = engine.flashing() ? notedYes : notedNo;
   const auto flashing = engine.flashingTagIds();
   for (const std::string& key : setting_.flashKeys) {
-    parts[++part] = noteOf(flashing->objectForKey(key));
+    parts[++part] = noteOf(flashing->objectForKey(key)) + (engine.flashing() ? flashingAllowed : 0);
   }
   if (parts == parts_) return;
   parts_ = parts;

@@ -33,6 +33,8 @@ struct Setting {
   std::vector<SavedView> before{};  ///< the window's controls, before the start
   std::vector<drivers::ViewKind> kinds{};
   std::vector<std::string> flashKeys;  ///< the tag keys that the script can make flash
+  std::vector<bool> watchedLists{};    ///< by index: arrivals say whether the move ran it; or empty
+  bool wholeLooks = false;  ///< what two controls show together matters, not only each by itself
 };
 
 /// Reads from a world of its own what all worlds share.
@@ -43,8 +45,9 @@ struct Arrival {
   Move move = 0;
   bool isEndless = false;  ///< the move would run lists without end, and was not made
   bool ranList = false;
-  std::optional<std::uint32_t> firstList{};  ///< that the move ran; absent if it ran none
-  std::optional<std::uint32_t> lastList{};   ///< whose command ran last; absent if none ran
+  std::optional<std::uint32_t> firstList{};   ///< that the move ran; absent if it ran none
+  std::optional<std::uint32_t> lastList{};    ///< whose command ran last; absent if none ran
+  std::vector<std::uint32_t> watchedLists{};  ///< those of the setting that the move ran
   std::uint32_t look = 0;
   std::vector<std::uint32_t> timerElements{};  ///< which started the pending timers
 };
