@@ -56,8 +56,7 @@ class CheckedScript {
         plan_(planOf(staged)),
         setting_(settingOf(script_, plan_, staged.resources)),
         exploration_(setting_, {startKeyOf(script_)}) {
-    exploration_.run(
-        {.places = placeLimit, .seconds = {}}, 1, [](const Progress&) {}, [] { return false; });
+    exploration_.run({.places = placeLimit, .seconds = {}}, 1, {});
   }
 
   const Exploration& exploration() const { return exploration_; }
