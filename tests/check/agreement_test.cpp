@@ -80,8 +80,7 @@ Opinion ours(const naive::Generated& generated, const std::vector<std::string>& 
   plan.host = generated.host;
   const Setting setting = settingOf(script, plan, "/");
   Exploration exploration(setting, keys);
-  exploration.run(
-      {.places = 1'000'000, .seconds = {}}, 1, [](const Progress&) {}, [] { return false; });
+  exploration.run({}, 1, {});
   Opinion opinion{
       .places = {}, .presses = exploration.presses(), .waits = exploration.waits(), .findings = {}};
   for (std::uint32_t i = 0; i < exploration.places(); ++i) {

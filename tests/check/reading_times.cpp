@@ -18,10 +18,10 @@ double readingTime(const std::string& text) {
 }
 
 ReadingTimes::ReadingTimes(drivers::Driver& driver, const toolkit::Ref<toolkit::Window>& window,
-                           const std::vector<toolkit::Tag>& ownTags, const History& history)
+                           const std::vector<toolkit::Tag>& hostTags, const History& history)
     : driver_(driver),
       window_(window),
-      ownTags_(ownTags),
+      ownTags_(hostTags),
       before_(fields()),
       ages_(history.textAge) {}
 

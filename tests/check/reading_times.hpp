@@ -22,7 +22,7 @@ double readingTime(const std::string& text);
 class ReadingTimes {
  public:
   ReadingTimes(drivers::Driver& driver, const toolkit::Ref<toolkit::Window>& window,
-               const std::vector<toolkit::Tag>& ownTags, const History& history);
+               const std::vector<toolkit::Tag>& hostTags, const History& history);
 
   /// The move is a wait of so many seconds, for the timer that this element started.
   void wait(double seconds, const Site& starter);
