@@ -21,7 +21,7 @@
 
 namespace qz::tools::check::opinions {
 
-using Findings = std::vector<naive::Finding>;  // sorted
+using Findings = std::vector<naive::Finding>;
 
 /// Returns the number in an environment variable; absent if the variable is not set.
 inline std::optional<std::uint64_t> numberInEnvironment(const char* name) {
@@ -38,13 +38,24 @@ inline std::string startKeyOf(const Script& script) {
   return smallest ? smallest->key : "";
 }
 
+/// Sorts the findings and keeps one of each cause, with the shortest path: several controls may
+/// have had the same tag before the start.
+inline void keepCauses(Findings& findings) {
+  std::sort(findings.begin(), findings.end());
+  const auto sameCause = [](naive::Finding one, const naive::Finding& other) {
+    one.pathLength = other.pathLength;
+    return one == other;
+  };
+  findings.erase(std::unique(findings.begin(), findings.end(), sameCause), findings.end());
+}
+
 inline Findings inTheSameWords(const std::vector<Finding>& found) {
   Findings findings;
   for (const Finding& each : found) {
     findings.push_back(
         {each.code, each.list.value_or(""), each.element, each.tag, each.path.size()});
   }
-  std::sort(findings.begin(), findings.end());
+  keepCauses(findings);
   return findings;
 }
 
@@ -139,6 +150,7 @@ inline Findings comparable(const Findings& theirs) {
     if (finding.code == "never-runs") return hasOddKey(finding);
     return finding.code == "raises" && isWrongTarget(finding);
   });
+  keepCauses(findings);
   return findings;
 }
 
