@@ -165,7 +165,6 @@ void Recorder::commandWillRun(const Value&, std::size_t index) {
 void Recorder::commandDidRun(const Value&, std::size_t, bool result) {
   if (!isRecording_ || !running_.back().list) return;
   const Running& running = running_.back();
-  lastList_ = running.list;
   if (!running.command->command) return;
   if (!endList_ && running.command->command->flow == CommandFlow::endsWalkThrough) {
     endList_ = running.list;
@@ -182,7 +181,6 @@ void Recorder::commandDidRun(const Value&, std::size_t, bool result) {
 void Recorder::commandRaised(const Value&, std::size_t, const toolkit::Exception& exception) {
   if (!isRecording_ || !running_.back().list) return;
   const Running& running = running_.back();
-  lastList_ = running.list;
   note(FactKind::elementRaised, static_cast<Subject>(running.element), exception.reason());
   if (running.command->command) noteTarget(running);
 }

@@ -260,8 +260,10 @@ void World::press(std::size_t control) {
   }
 }
 
-// The others need not be set: the first that fires cancels them.
+// The others need not be set: the first that fires cancels them. Those that the move before left
+// are not pending at this place, and could fire first.
 void World::wait(const PendingTimer& first) {
+  stage_->engine().killAllTimers();
   stage_->engine().startTimerWithValue(wholeSeconds(first.seconds), first.key);
   recorder_->begin();
   try {
