@@ -4,8 +4,8 @@
 
 namespace qz::naive {
 
-Endings::Endings(const Script& script, const HostWindow& host) {
-  const World world(script, host);
+Endings::Endings(const Script& script, const HostWindow& host, const std::string& resources) {
+  const World world(script, host, resources);
   before_ = world.pictures();
   for (std::size_t i = 0; i < before_.size(); ++i) {
     looksBefore_.push_back(world.lookOf(before_[i], i, numbers_));

@@ -13,7 +13,8 @@ namespace qz::naive {
 
 class Endings {
  public:
-  Endings(const Script& script, const HostWindow& host);
+  /// `resources` is the directory of the images; if it is empty, the toolkit's own.
+  Endings(const Script& script, const HostWindow& host, const std::string& resources);
 
   /// Takes note of a world that has ended after a path of so many moves.
   void note(const World& world, std::size_t pathLength);

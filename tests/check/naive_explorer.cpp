@@ -29,12 +29,13 @@ std::vector<drivers::ViewKind> kindsOf(const HostWindow& host) {
 
 class Explorer {
  public:
-  Explorer(Script script, const HostWindow& host, std::size_t placeLimit)
+  Explorer(Script script, const HostWindow& host, std::string resources, std::size_t placeLimit)
       : script_(std::move(script)),
         host_(host),
+        resources_(std::move(resources)),
         placeLimit_(placeLimit),
         facts_(script_, kindsOf(host)),
-        endings_(script_, host) {}
+        endings_(script_, host, resources_) {}
 
   Exploration explore(const std::vector<std::string>& startKeys);
 
@@ -57,6 +58,7 @@ class Explorer {
 
   Script script_;
   const HostWindow& host_;
+  std::string resources_;
   std::size_t placeLimit_;
   bool complete_ = true;
   std::map<std::string, std::size_t> indexOf_;
@@ -105,7 +107,7 @@ void Explorer::noteStep(std::size_t place, std::size_t move, const Step& step) {
 
 /// Replays the path in a new world, then makes the move.
 Step Explorer::follow(const Path& before, const Move& move) {
-  World world(script_, host_);
+  World world(script_, host_, resources_);
   for (const Move& earlier : before) world.perform(earlier);
   Path path = before;
   path.push_back(move);
@@ -179,8 +181,9 @@ Exploration Explorer::result() const {
 
 Exploration explore(const toolkit::ValueRef<toolkit::Dictionary>& script,
                     const tools::walkthrough::HostWindow& host,
-                    const std::vector<std::string>& startKeys, std::size_t placeLimit) {
-  Explorer explorer(script, host, placeLimit);
+                    const std::vector<std::string>& startKeys, std::size_t placeLimit,
+                    const std::string& resources) {
+  Explorer explorer(script, host, resources, placeLimit);
   return explorer.explore(startKeys.empty() ? std::vector<std::string>{""} : startKeys);
 }
 

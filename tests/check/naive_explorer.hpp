@@ -27,9 +27,11 @@ struct Exploration {
 };
 
 /// Explores a script over a host's window from each of the keys (an empty one is the smallest tag;
-/// without any key, from the smallest tag), up to so many places.
+/// without any key, from the smallest tag), up to so many places. `resources` is the directory of
+/// the images; if it is empty, the toolkit's own.
 Exploration explore(const toolkit::ValueRef<toolkit::Dictionary>& script,
                     const tools::walkthrough::HostWindow& host,
-                    const std::vector<std::string>& startKeys, std::size_t placeLimit);
+                    const std::vector<std::string>& startKeys, std::size_t placeLimit,
+                    const std::string& resources = "");
 
 }  // namespace qz::naive

@@ -39,6 +39,11 @@ std::string lineOf(const std::vector<PendingTimer>& timers) {
   return line;
 }
 
+drivers::MemoryDriver& withResources(drivers::MemoryDriver& driver, const std::string& path) {
+  if (!path.empty()) driver.setResourcePath(path);
+  return driver;
+}
+
 std::string colorText(const toolkit::Color& color) {
   return std::to_string(color.red) + " " + std::to_string(color.green) + " " +
          std::to_string(color.blue) + " " + std::to_string(color.alpha);
@@ -53,9 +58,9 @@ std::string TextNumbers::numberOf(const toolkit::AttributedString& text) {
   return std::to_string(number);
 }
 
-World::World(const Script& script, const HostWindow& host)
+World::World(const Script& script, const HostWindow& host, const std::string& resources)
     : script_(script),
-      window_(makeHostWindow(driver_, host, "the host's window")),
+      window_(makeHostWindow(withResources(driver_, resources), host, "the host's window")),
       engine_(QZ_Plist_State_Parser::initWithWindow(driver_.toolkit(), window_)) {
   engine_->getGuiAssetsFromWindow(window_);
   // The engine changes its own copy when the walk-through ends.

@@ -42,7 +42,8 @@ struct PendingTimer {
 
 class World {
  public:
-  World(const Script& script, const HostWindow& host);
+  /// `resources` is the directory of the images; if it is empty, the toolkit's own.
+  World(const Script& script, const HostWindow& host, const std::string& resources = "");
   ~World();
   World(const World&) = delete;
   World& operator=(const World&) = delete;

@@ -42,7 +42,7 @@ class ViewNode : public std::enable_shared_from_this<ViewNode> {
   void setFrame(const Rect& frame) { change(frame_, frame); }
 
   /// Returns what the view shows now; `restore` shows it again, in this view or another of its
-  /// kind.
+  /// kind. A view without a role ignores the fields of that role.
   virtual SavedView save() const;
   virtual void restore(const SavedView& saved);
 

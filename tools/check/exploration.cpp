@@ -193,8 +193,24 @@ std::uint32_t Exploration::arrive(const Arrival& arrival, const PendingTimers& t
 }
 
 bool Exploration::isNews(std::uint32_t place, const Visit& visit) {
+  if (format_.isOver(set_.place(place))) return hasNewEnd(place, visit);
   const bool newList = hasNewList(place, visit);
   return hasNewPart(place, visit) || newList;
+}
+
+// What is left behind is a finding of each list that ends. Nothing follows from the rest of the
+// look.
+bool Exploration::hasNewEnd(std::uint32_t place, const Visit& visit) {
+  const Looks::Parts& parts = looks_.parts(visit.look);
+  auto& known = endLooks_[{place, visit.lastList}];
+  bool isNew = known.empty();
+  known.resize(parts.size());
+  for (std::size_t i = 0; i < parts.size(); ++i) {
+    if (std::find(known[i].begin(), known[i].end(), parts[i]) != known[i].end()) continue;
+    known[i].push_back(parts[i]);
+    isNew = true;
+  }
+  return isNew;
 }
 
 bool Exploration::hasNewPart(std::uint32_t place, const Visit& visit) {

@@ -134,6 +134,7 @@ class Exploration {
   bool isNews(std::uint32_t place, const Visit& visit);
   bool hasNewPart(std::uint32_t place, const Visit& visit);
   bool hasNewList(std::uint32_t place, const Visit& visit);
+  bool hasNewEnd(std::uint32_t place, const Visit& visit);
   void seeExpansion(const Expansion& expansion, const See& see);
   std::optional<std::uint32_t> knownPlace(const Expansion& expansion, std::size_t move);
   std::uint32_t numberOf(const PendingTimers& timers);
@@ -153,6 +154,8 @@ class Exploration {
   std::vector<std::unique_ptr<PendingTimers>> timers_;
   /// The further values of the parts of a place's look, beyond those of its first visit.
   std::unordered_map<std::uint32_t, std::vector<std::vector<LookValue>>> furtherLooks_;
+  /// The values of the parts of the look after an end, by place and the list that ended.
+  std::map<std::pair<std::uint32_t, std::uint32_t>, std::vector<std::vector<LookValue>>> endLooks_;
   std::set<std::pair<std::uint32_t, std::uint32_t>> wholeLooks_;  // place, look; if they matter
   std::vector<std::size_t> edgeStart_;                            // by place, in edges_
   std::vector<std::uint8_t> edges_;                               // three bytes each
