@@ -313,15 +313,22 @@ void Exploration::addEdges(const std::vector<std::uint32_t>& targets) {
 }
 
 std::vector<std::uint32_t> Exploration::successors(std::uint32_t place) const {
-  std::vector<std::uint32_t> targets;
-  if (!isExpanded(place)) return targets;
-  const std::size_t end = place + 1 < edgeStart_.size() ? edgeStart_[place + 1] : edges_.size();
-  for (std::size_t at = edgeStart_[place]; at < end; at += edgeBytes) {
-    std::uint32_t target = 0;
-    for (std::size_t byte = edgeBytes; byte-- > 0;) target = target << 8U | edges_[at + byte];
-    targets.push_back(target);
-  }
+  std::vector<std::uint32_t> targets(successorCount(place));
+  for (std::size_t i = 0; i < targets.size(); ++i) targets[i] = successor(place, i);
   return targets;
+}
+
+std::size_t Exploration::successorCount(std::uint32_t place) const {
+  if (!isExpanded(place)) return 0;
+  const std::size_t end = place + 1 < edgeStart_.size() ? edgeStart_[place + 1] : edges_.size();
+  return (end - edgeStart_[place]) / edgeBytes;
+}
+
+std::uint32_t Exploration::successor(std::uint32_t place, std::size_t index) const {
+  const std::uint8_t* const bytes = edges_.data() + edgeStart_[place] + index * edgeBytes;
+  std::uint32_t target = 0;
+  for (std::size_t byte = edgeBytes; byte-- > 0;) target = target << 8U | bytes[byte];
+  return target;
 }
 
 Step Exploration::stepFrom(std::uint32_t place, Move move) const {

@@ -90,6 +90,9 @@ class Exploration {
 
   /// Returns the places to which the moves out of a place lead, in the order of the moves.
   std::vector<std::uint32_t> successors(std::uint32_t place) const;
+  /// Returns how many of them there are, and the one at an index.
+  std::size_t successorCount(std::uint32_t place) const;
+  std::uint32_t successor(std::uint32_t place, std::size_t index) const;
   /// Whether a move out of the place runs a list.
   bool canRunList(std::uint32_t place) const { return runsList_[place]; }
   /// Whether the moves out of the place are known.

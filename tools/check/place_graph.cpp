@@ -26,35 +26,35 @@ class CircleFinder {
   }
 
  private:
+  // Not with the targets themselves: the stack can be as deep as there are places.
   struct Frame {
     std::uint32_t place;
-    std::vector<std::uint32_t> targets;
-    std::size_t next = 0;
+    std::uint32_t next = 0;
   };
 
   void enter(std::uint32_t place) {
     order_[place] = lowest_[place] = entered_++;
     open_.push_back(place);
-    frames_.push_back({place, exploration_.successors(place)});
+    frames_.push_back({place});
   }
 
   void search(std::uint32_t root) {
     enter(root);
     while (!frames_.empty()) {
       Frame& frame = frames_.back();
-      if (frame.next < frame.targets.size()) {
-        follow(frame, frame.targets[frame.next++]);
+      if (frame.next < exploration_.successorCount(frame.place)) {
+        follow(frame.place, exploration_.successor(frame.place, frame.next++));
       } else {
         leave();
       }
     }
   }
 
-  void follow(Frame& frame, std::uint32_t target) {
+  void follow(std::uint32_t place, std::uint32_t target) {
     if (order_[target] == notSeen) {
       enter(target);
     } else if (circleOf_[target] == notSeen) {
-      lowest_[frame.place] = std::min(lowest_[frame.place], order_[target]);
+      lowest_[place] = std::min(lowest_[place], order_[target]);
     }
   }
 
@@ -87,7 +87,9 @@ class CircleFinder {
     circle.isEnd |= exploration_.format().isOver(exploration_.place(place));
     circle.reachesEnd |= circle.isEnd;
     circle.reachesList |= exploration_.canRunList(place);
-    for (const std::uint32_t target : exploration_.successors(place)) {
+    const std::size_t count = exploration_.successorCount(place);
+    for (std::size_t i = 0; i < count; ++i) {
+      const std::uint32_t target = exploration_.successor(place, i);
       if (circleOf_[target] == number) continue;
       const PlaceCircle& next = circles_[circleOf_[target]];
       circle.isLast = false;
