@@ -15,8 +15,9 @@
 namespace qz {
 
 /// The engine calls these functions while it works. By default they do nothing; a subclass
-/// overrides the ones it needs. They run on the engine's thread. They must not raise, nor call the
-/// engine's operations; the engine's getters are allowed.
+/// overrides the ones it needs. They run on the engine's thread. They must not raise a
+/// toolkit::Exception, nor call the engine's operations; the engine's getters are allowed. An
+/// exception of another type stops the operation in its middle and reaches the operation's caller.
 class Observer {
  public:
   using Value = toolkit::ValueRef<>;

@@ -51,32 +51,12 @@ class Conclusions {
   static constexpr std::size_t noElement = static_cast<std::size_t>(-1);
 
   void endlessChains() {
-    const EndlessChains& chains = exploration_.setting().chains;
     for (const auto& [subject, entry] : facts_.all(FactKind::endlessChain)) {
-      const ScriptList& list = script_.lists()[static_cast<std::size_t>(subject)];
-      const std::string& loop = chains.loops[chains.loopOf.find(list.key)->second];
-      addChainElement(list, entry,
-                      findingOf("endless-chain",
-                                "list " + quote(list.key) + " runs lists without end (" + loop +
-                                    "); the host's program crashes",
-                                "take out one PROCESS_COMMANDS_FOR_ID of the loop"));
-    }
-  }
-
-  /// Adds a finding at the element that runs a list which is running already.
-  void addChainElement(const ScriptList& start, const FactTable::Entry& entry, Finding finding) {
-    std::set<std::string> running;
-    const ScriptList* list = &start;
-    for (std::size_t i = 0; i < list->elements.size(); ++i) {
-      running.insert(list->key);
-      const auto next = chainTarget(list->elements[i].value, list->key);
-      if (!next || !exploration_.setting().chains.loopOf.contains(*next)) continue;
-      if (running.contains(*next)) {
-        return addForElement(static_cast<Subject>(list->firstElement + i), entry,
-                             std::move(finding));
-      }
-      list = &script_.lists()[*script_.listUnder(*next)];
-      i = static_cast<std::size_t>(-1);  // from its first element
+      addForElement(subject, entry,
+                    findingOf("endless-chain",
+                              "here the lists run each other without end (" + entry.detail +
+                                  "), so the program crashes",
+                              "take out one PROCESS_COMMANDS_FOR_ID of the loop"));
     }
   }
 
@@ -97,7 +77,7 @@ class Conclusions {
   }
 
   void neverRuns() {
-    const auto ran = listsThatRun();
+    const auto ran = listsThatRan();
     for (std::size_t i = 0; i < script_.lists().size(); ++i) {
       const ScriptList& list = script_.lists()[i];
       if (ran.contains(list.key) || !list.tag || !toolkit::asArray(list.value)) continue;
@@ -111,29 +91,12 @@ class Conclusions {
     }
   }
 
-  /// Returns the keys of the lists that a move runs, also those that only an endless chain runs.
-  std::set<std::string> listsThatRun() const {
+  std::set<std::string> listsThatRan() const {
     std::set<std::string> ran;
     for (const auto& [subject, entry] : facts_.all(FactKind::listRan)) {
       ran.insert(script_.lists()[static_cast<std::size_t>(subject)].key);
     }
-    for (const auto& [subject, entry] : facts_.all(FactKind::endlessChain)) {
-      addChain(script_.lists()[static_cast<std::size_t>(subject)].key, ran);
-    }
     return ran;
-  }
-
-  void addChain(const std::string& start, std::set<std::string>& ran) const {
-    std::vector<std::string> open{start};
-    while (!open.empty()) {
-      const std::string key = open.back();
-      open.pop_back();
-      const auto list = script_.listUnder(key);
-      if (!list || !ran.insert(key).second) continue;
-      for (const Element& element : script_.lists()[*list].elements) {
-        if (auto next = chainTarget(element.value, key)) open.push_back(*std::move(next));
-      }
-    }
   }
 
   void targets() {

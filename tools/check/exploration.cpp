@@ -87,13 +87,9 @@ void Exploration::start() {
     const Occasion occasion{noVisit, static_cast<Move>(i)};
     std::vector<std::uint8_t> place(format_.size());
     PendingTimers timers;
-    const auto list = setting_.script.listUnder(startKeys_[i]);
-    if (setting_.chains.loopOf.contains(startKeys_[i]) && list) {
-      facts_.add({FactKind::endlessChain, static_cast<Subject>(*list), {}}, occasion, noPlace);
-      continue;
-    }
     const Arrival arrival = world.start(startKeys_[i], timers, place.data());
     for (const Fact& fact : world.facts()) facts_.add(fact, occasion, noPlace);
+    if (arrival.isEndless) continue;
     starts_.push_back(arrival);
     starts_.back().move = occasion.move;
     arrive(arrival, timers, std::move(place),

@@ -28,10 +28,10 @@ enum class FactKind : std::uint8_t {
   timerFires,     ///< the timer that the element started is the first to fire after a move
   timerBeaten,    ///< another timer replaced it, or fires before it
   sharedTagUsed,  ///< two controls had the tag that it names
+  endlessChain,   ///< it runs a list that is running already; detail: the loop
   // of a list
   listRan,
-  listRaised,    ///< running it raised, because it is not an array
-  endlessChain,  ///< a move would run it, and it never ends
+  listRaised,  ///< running it raised, because it is not an array
   // of a tag
   noListPressed,    ///< a button with the tag can be pressed, and no list is under the tag
   sharedTagPressed  ///< a button is pressed while another control has its tag
@@ -45,7 +45,7 @@ using Subject = std::int64_t;
 struct Fact {
   FactKind kind = FactKind::elementRan;
   Subject subject = 0;
-  std::string detail;  ///< the reason of an exception; else empty
+  std::string detail;  ///< the reason of an exception, or a loop of lists; else empty
 };
 
 /// A move out of a visit. Visits have numbers in the order in which they were found, so an earlier

@@ -102,6 +102,11 @@ void Recorder::end() {
   }
 }
 
+void Recorder::abandon() {
+  isRecording_ = false;
+  timers_.clear();
+}
+
 std::vector<std::uint32_t> Recorder::pendingElements() const {
   std::vector<std::uint32_t> elements;
   for (const Timer& timer : timers_) {
@@ -130,15 +135,31 @@ void Recorder::noteOnce(FactKind kind, std::size_t subject) {
 void Recorder::listWillRun(const Value& list, const ObjectId& id) {
   if (!isRecording_) return;
   const Tag tag = id->longValue();
-  running_.push_back({.list = script_.runningList(list, tag), .id = tag});
-  if (!running_.back().list) return;
+  const auto running = script_.runningList(list, tag);
+  if (running) throwIfRunning(*running);
+  running_.push_back({.list = running, .id = tag});
+  if (!running) return;
   ranList_ = true;
-  const std::size_t index = *running_.back().list;
+  const std::size_t index = *running;
   if (!firstList_) firstList_ = index;
   if (!watched_.empty() && watched_[index]) {
     watchedLists_.push_back(static_cast<std::uint32_t>(index));
   }
   noteOnce(FactKind::listRan, index);
+}
+
+// A list that begins inside itself does so again and again: scripts have no conditions.
+void Recorder::throwIfRunning(std::size_t list) {
+  const auto outer = std::find_if(running_.begin(), running_.end(),
+                                  [&](const Running& each) { return each.list == list; });
+  if (outer == running_.end()) return;
+  std::string loop;
+  for (auto each = outer; each != running_.end(); ++each) {
+    if (each->list) loop += script_.lists()[*each->list].key + " -> ";
+  }
+  note(FactKind::endlessChain, static_cast<Subject>(running_.back().element),
+       loop + script_.lists()[list].key);
+  throw EndlessRun();
 }
 
 void Recorder::listDidRun(const Value&, const ObjectId&) {
@@ -184,7 +205,10 @@ void Recorder::commandRaised(const Value&, std::size_t, const toolkit::Exception
   const Running& running = running_.back();
   if (!running.command) return;  // an entry of a dictionary in place of a list
   note(FactKind::elementRaised, static_cast<Subject>(running.element), exception.reason());
-  if (running.command->command) noteTarget(running);
+  const Command* const command = running.command->command;
+  if (!command) return;
+  noteTarget(running);
+  if (marksFlashing(*command)) noteOnce(FactKind::flashAccepted, running.element);  // not refused
 }
 
 void Recorder::noteTarget(const Running& running) {

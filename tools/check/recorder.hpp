@@ -39,6 +39,9 @@ class Surroundings {
   virtual drivers::ViewKind kindOf(const toolkit::Ref<toolkit::View>& control) const = 0;
 };
 
+/// Thrown out of a list that would run itself without end: such a run overflows the stack.
+struct EndlessRun {};
+
 class Recorder final : public Observer {
  public:
   /// Notes of the watched lists, by index, whether a move ran them. All must outlive the recorder.
@@ -48,6 +51,8 @@ class Recorder final : public Observer {
   void begin();
   /// Ends the move. A timer that the move has left pending counts as firing if it is the first.
   void end();
+  /// Gives up a move that would never end. Its facts remain; no timer fires after it.
+  void abandon();
   void note(FactKind kind, Subject subject, std::string detail = {});
 
   /// Returns the facts of the move. A fact that is good news is there only the first time.
@@ -97,6 +102,7 @@ class Recorder final : public Observer {
 
   void noteOnce(FactKind kind, std::size_t subject);
   void noteTarget(const Running& running);
+  void throwIfRunning(std::size_t list);
   void forget(std::string_view key);
 
   const Script& script_;

@@ -141,7 +141,11 @@ void World::observe() {
 }
 
 Arrival World::start(const std::string& key, PendingTimers& timers, std::uint8_t* place) {
-  build(key);
+  try {
+    build(key);
+  } catch (const EndlessRun&) {
+    return abandon(0);
+  }
   return arrive(0, timers, place);
 }
 
@@ -161,36 +165,16 @@ Arrival World::make(Move move, const std::uint8_t* from, std::uint32_t look,
                     const PendingTimers& pending, PendingTimers& timers, std::uint8_t* place) {
   goTo(from, look);
   recorder_->begin();
-  if (const auto endless = endlessList(move, from, pending)) {
-    recorder_->note(FactKind::endlessChain, static_cast<Subject>(*endless));
-    recorder_->end();
-    return {.move = move, .isEndless = true};
-  }
-  if (move == waitMove) {
-    wait(pending.front());
-  } else {
-    const Tag tag = controls_[move].state.tag;
-    if (sharedTags_ > 0 && tagCounts_[tag] > 1) recorder_->note(FactKind::sharedTagPressed, tag);
-    if (!setting_.script.listOfTag(tag)) {
-      recorder_->note(FactKind::noListPressed, tag);
+  try {
+    if (move == waitMove) {
+      wait(pending.front());
+    } else {
+      press(move);
     }
-    press(move);
+  } catch (const EndlessRun&) {
+    return abandon(move);
   }
   return arrive(move, timers, place);
-}
-
-std::optional<std::size_t> World::listRunBy(Tag tag) const {
-  const auto list = setting_.script.listOfTag(tag);
-  if (!list || setting_.chains.loopOf.empty()) return std::nullopt;
-  return setting_.chains.loopOf.contains(setting_.script.lists()[*list].key) ? list : std::nullopt;
-}
-
-std::optional<std::size_t> World::endlessList(Move move, const std::uint8_t* from,
-                                              const PendingTimers& pending) const {
-  if (setting_.chains.loopOf.empty()) return std::nullopt;
-  if (move != waitMove) return listRunBy(format_.control(from, move).tag);
-  const auto list = setting_.script.listUnder(pending.front().key);
-  return list ? listRunBy(*setting_.script.lists()[*list].tag) : std::nullopt;
 }
 
 void World::goTo(const std::uint8_t* place, std::uint32_t look) {
@@ -248,6 +232,9 @@ void World::restoreLook(std::uint32_t look) {
 
 void World::press(std::size_t control) {
   Control& pressed = controls_[control];
+  const Tag tag = pressed.state.tag;
+  if (sharedTags_ > 0 && tagCounts_[tag] > 1) recorder_->note(FactKind::sharedTagPressed, tag);
+  if (!setting_.script.listOfTag(tag)) recorder_->note(FactKind::noListPressed, tag);
   willTouch(pressed.view);
   const auto behavior = pressed.button->behavior();
   if (behavior == ButtonBehavior::toggle || behavior == ButtonBehavior::mixed) {
@@ -257,7 +244,7 @@ void World::press(std::size_t control) {
   try {
     pressed.button->click();
   } catch (const toolkit::Exception& exception) {
-    if (const auto list = setting_.script.listOfTag(pressed.state.tag)) {
+    if (const auto list = setting_.script.listOfTag(tag)) {
       recorder_->note(FactKind::listRaised, static_cast<Subject>(*list), exception.reason());
     }
   }
@@ -295,6 +282,13 @@ Arrival World::arrive(Move move, PendingTimers& timers, std::uint8_t* place) {
   const auto last = isOver ? recorder_->endList() : recorder_->lastList();
   if (last) arrival.lastList = static_cast<std::uint32_t>(*last);
   return arrival;
+}
+
+// The engine was stopped in the middle of a list, so the next move is made in a new world.
+Arrival World::abandon(Move move) {
+  recorder_->abandon();
+  format_.setOver(place_.data(), true);
+  return {.move = move, .isEndless = true};
 }
 
 // The end may have taken the engine's table of timers away; what is set then is not pending.

@@ -44,7 +44,7 @@ Setting settingOf(const Script& script, const walkthrough::StagePlan& plan, std:
 /// Where a move has led.
 struct Arrival {
   Move move = 0;
-  bool isEndless = false;  ///< the move would run lists without end, and was not made
+  bool isEndless = false;  ///< the move runs lists without end, and leads nowhere
   bool ranList = false;
   std::optional<std::uint32_t> firstList{};   ///< that the move ran; absent if it ran none
   std::optional<std::uint32_t> lastList{};    ///< whose command ran last; absent if none ran
@@ -99,12 +99,10 @@ class World final : private Surroundings {
   void restoreLook(std::uint32_t look);
   void press(std::size_t control);
   void wait(const PendingTimer& first);
-  std::optional<std::size_t> endlessList(Move move, const std::uint8_t* from,
-                                         const PendingTimers& pending) const;
-  std::optional<std::size_t> listRunBy(Tag tag) const;
   ViewLook lookOf(const Control& control) const;
   PendingTimers pendingAtTheEnd() const;
   Arrival arrive(Move move, PendingTimers& timers, std::uint8_t* place);
+  Arrival abandon(Move move);
   void readTouched(std::uint8_t* place);
   void readEngine();
   void setTag(Control& control, Tag tag);
