@@ -5,6 +5,7 @@
 #include <algorithm>
 #include <cstdio>
 #include <cstdlib>
+#include <memory>
 #include <optional>
 #include <set>
 #include <sstream>
@@ -66,9 +67,9 @@ class CheckedScript {
       : script_(staged.script),
         plan_(planOf(staged)),
         setting_(settingOf(script_, plan_, staged.resources)),
-        exploration_(setting_, {startKeyOf(script_)}) {
-    exploration_.run({.places = placeLimit, .seconds = {}}, 1, {});
-  }
+        explored_(
+            explore(setting_, {startKeyOf(script_)}, {.places = placeLimit, .seconds = {}}, 1, {})),
+        exploration_(*explored_) {}
 
   const Exploration& exploration() const { return exploration_; }
   std::string startKey() const { return startKeyOf(script_); }
@@ -128,7 +129,8 @@ class CheckedScript {
   Script script_;
   walkthrough::StagePlan plan_;
   Setting setting_;
-  Exploration exploration_;
+  std::unique_ptr<Exploration> explored_;
+  Exploration& exploration_;
 };
 
 /// Returns the findings of the second opinion that the check reports as well. The check reports one

@@ -189,34 +189,15 @@ std::uint32_t Exploration::arrive(const Arrival& arrival, const PendingTimers& t
 }
 
 bool Exploration::isNews(std::uint32_t place, const Visit& visit) {
-  if (format_.isOver(set_.place(place))) return hasNewEnd(place, visit);
-  const bool newList = hasNewList(place, visit);
-  return hasNewPart(place, visit) || newList;
-}
-
-// What is left behind is a finding of each list that ends. Nothing follows from the rest of the
-// look.
-bool Exploration::hasNewEnd(std::uint32_t place, const Visit& visit) {
-  const Looks::Parts& parts = looks_.parts(visit.look);
-  auto& known = endLooks_[{place, visit.lastList}];
-  bool isNew = known.empty();
-  known.resize(parts.size());
-  for (std::size_t i = 0; i < parts.size(); ++i) {
-    if (std::find(known[i].begin(), known[i].end(), parts[i]) != known[i].end()) continue;
-    known[i].push_back(parts[i]);
-    isNew = true;
-  }
-  return isNew;
-}
-
-bool Exploration::hasNewPart(std::uint32_t place, const Visit& visit) {
-  if (firstVisit_[place] == visits_.size()) return true;
-  const Visit& first = visits_[firstVisit_[place]];
+  const Situation situation = situationOf(place, visit);
+  const std::uint32_t firstNumber = firstVisitIn(situation);
+  if (firstNumber == visits_.size()) return true;
+  const Visit& first = visits_[firstNumber];
   if (visit.look == first.look) return false;
   bool isNew = setting_.wholeLooks && wholeLooks_.insert({place, visit.look}).second;
   const Looks::Parts& parts = looks_.parts(visit.look);
   const Looks::Parts& known = looks_.parts(first.look);
-  auto& further = furtherLooks_[place];
+  auto& further = furtherLooks_[situation];
   further.resize(parts.size());
   for (std::size_t i = 0; i < parts.size(); ++i) {
     if (parts[i] == known[i]) continue;
@@ -228,25 +209,32 @@ bool Exploration::hasNewPart(std::uint32_t place, const Visit& visit) {
   return isNew;
 }
 
-// Which list had the last word matters after the end, and where a press without a list leads to
+// Which list had the last word matters after an end, and where a press without a list leads to
 // another place because it cancels timers.
-bool Exploration::hasNewList(std::uint32_t place, const Visit& visit) {
+Exploration::Situation Exploration::situationOf(std::uint32_t place, const Visit& visit) const {
   const std::uint8_t* const bytes = set_.place(place);
-  if (!format_.isOver(bytes) && format_.timers(bytes) == 0) return false;
-  auto& lists = lastLists_[place];
-  if (std::find(lists.begin(), lists.end(), visit.lastList) != lists.end()) return false;
-  lists.push_back(visit.lastList);
-  return true;
+  const bool matters = format_.isOver(bytes) || format_.timers(bytes) != 0;
+  return {place, matters ? visit.lastList : noList};
+}
+
+/// Returns the first visit in a situation: a coming one, if there was none.
+std::uint32_t Exploration::firstVisitIn(const Situation& situation) {
+  const auto [place, list] = situation;
+  const auto coming = static_cast<std::uint32_t>(visits_.size());
+  const std::uint32_t first = firstVisit_[place];
+  if (first == coming || list == noList || visits_[first].lastList == list) return first;
+  return otherFirstVisits_.try_emplace(situation, coming).first->second;
 }
 
 std::vector<std::size_t> Exploration::partsWithSeveralLooks(std::uint32_t place) const {
-  std::vector<std::size_t> parts;
-  const auto further = furtherLooks_.find(place);
-  if (further == furtherLooks_.end()) return parts;
-  for (std::size_t part = 0; part < further->second.size(); ++part) {
-    if (!further->second[part].empty()) parts.push_back(part);
+  std::set<std::size_t> several;
+  for (auto further = furtherLooks_.lower_bound({place, 0});
+       further != furtherLooks_.end() && further->first.first == place; ++further) {
+    for (std::size_t part = 0; part < further->second.size(); ++part) {
+      if (!further->second[part].empty()) several.insert(part);
+    }
   }
-  return parts;
+  return {several.begin(), several.end()};
 }
 
 void Exploration::makeAllMoves(unsigned threads, const See& see) {

@@ -117,13 +117,16 @@ class Exploration {
   std::size_t firstFlashPart() const { return format_.controls() + 2; }
   /// Returns the look of the window before the start.
   std::uint32_t firstLook() const { return firstLook_; }
-  /// Whether some place can have several looks.
+  /// Whether some place can have several looks where the same list had the last word.
   bool hasSeveralLooks() const { return !furtherLooks_.empty(); }
-  /// Returns the parts of the look that can have several values at a place.
+  /// Returns the parts of the look that can have several values at a place where the same list had
+  /// the last word.
   std::vector<std::size_t> partsWithSeveralLooks(std::uint32_t place) const;
 
  private:
   struct Expansion;  // of one visit: where its moves lead
+  /// A place, and the list that had the last word, if that matters for what follows.
+  using Situation = std::pair<std::uint32_t, std::uint32_t>;
 
   std::size_t roundSize() const;
   std::size_t bytes() const;
@@ -135,9 +138,8 @@ class Exploration {
   std::uint32_t arrive(const Arrival& arrival, const PendingTimers& timers,
                        std::vector<std::uint8_t> place, Visit visit);
   bool isNews(std::uint32_t place, const Visit& visit);
-  bool hasNewPart(std::uint32_t place, const Visit& visit);
-  bool hasNewList(std::uint32_t place, const Visit& visit);
-  bool hasNewEnd(std::uint32_t place, const Visit& visit);
+  Situation situationOf(std::uint32_t place, const Visit& visit) const;
+  std::uint32_t firstVisitIn(const Situation& situation);
   void seeExpansion(const Expansion& expansion, const See& see);
   std::optional<std::uint32_t> knownPlace(const Expansion& expansion, std::size_t move);
   std::uint32_t numberOf(const PendingTimers& timers);
@@ -155,17 +157,15 @@ class Exploration {
   std::vector<std::uint32_t> firstVisit_;  // by place
   std::map<std::vector<std::pair<std::string, double>>, std::uint32_t> timerNumbers_;
   std::vector<std::unique_ptr<PendingTimers>> timers_;
-  /// The further values of the parts of a place's look, beyond those of its first visit.
-  std::unordered_map<std::uint32_t, std::vector<std::vector<LookValue>>> furtherLooks_;
-  /// The values of the parts of the look after an end, by place and the list that ended.
-  std::map<std::pair<std::uint32_t, std::uint32_t>, std::vector<std::vector<LookValue>>> endLooks_;
+  /// The first visits in situations that differ from that of the place's first visit.
+  std::map<Situation, std::uint32_t> otherFirstVisits_;
+  /// The further values of the parts of a look, beyond those of the first visit.
+  std::map<Situation, std::vector<std::vector<LookValue>>> furtherLooks_;
   std::set<std::pair<std::uint32_t, std::uint32_t>> wholeLooks_;  // place, look; if they matter
   std::vector<std::size_t> edgeStart_;                            // by place, in edges_
   std::vector<std::uint8_t> edges_;                               // three bytes each
   std::vector<bool> runsList_;
   std::vector<std::unique_ptr<World>> worlds_;
-  /// The lists that had the last word before a place where that matters for what follows.
-  std::unordered_map<std::uint32_t, std::vector<std::uint32_t>> lastLists_;
   std::map<std::pair<std::uint32_t, std::uint32_t>, Occasion> timerStarts_;  // place, element
   std::vector<Arrival> starts_;
   std::uint32_t firstLook_ = 0;  // before the start

@@ -9,6 +9,7 @@
 #include <utility>
 
 #include "tools/check/look_differences.hpp"
+#include "tools/check/look_words.hpp"
 #include "tools/check/reading_times.hpp"
 #include "tools/support/text_layout.hpp"
 
@@ -59,11 +60,10 @@ class LookConclusions {
 
   void add(const LookDifference& difference) {
     const Tag tag = ownTag(difference.control);
-    Finding finding =
-        findingOf("looks-differ",
-                  "after this list the control with the tag " + std::to_string(tag) +
-                      " shows one thing or another, depending on how the user came here",
-                  "let the list set everything that it shows");
+    Finding finding = findingOf("looks-differ",
+                                "after this list the control " + std::to_string(tag) + " shows " +
+                                    difference.words + ", depending on how the user came here",
+                                "let this list set what the control shows");
     finding.tag = tag;
     finding.path = exploration_.path(difference.second);
     finding.otherPath = exploration_.path(difference.first);
@@ -100,7 +100,10 @@ class LookConclusions {
     const auto tagger = exploration_.taggerAt(visit, control);
     if (tag == ownTag(control) || !tagsLeft_.emplace(tagger, control).second) return;
     Finding finding = findingOf(
-        "tag-left", "after the end " + nameOf(control) + " has the tag " + std::to_string(tag));
+        "tag-left",
+        "after the end " + nameOf(control) + " keeps the tag " + std::to_string(tag) +
+            ", so the host and the next walk-through do not find it",
+        "give the control the tag " + std::to_string(ownTag(control)) + " again before the end");
     finding.tag = ownTag(control);
     finding.path = exploration_.path(number);
     if (tagger) {
@@ -112,25 +115,37 @@ class LookConclusions {
 
   void leftBehind(std::uint32_t number, std::size_t control) {
     const Visit& visit = exploration_.visits()[number];
-    const auto state = exploration_.format().control(exploration_.place(visit.place), control);
-    const SavedView& before = setting_.before[control];
-    std::vector<std::string> changes;
-    if (state.hidden != before.hidden) changes.emplace_back(state.hidden ? "hidden" : "shown");
-    if (state.enabled != before.enabled) {
-      changes.emplace_back(state.enabled ? "enabled" : "disabled");
-    }
-    if (looksElse(visit, control)) changes.emplace_back("changed in its look");
+    const std::string changes = changesAt(visit, control);
     if (changes.empty() || !leftBehind_.emplace(visit.lastList, control).second) return;
-    std::string what = changes.front();
-    for (std::size_t i = 1; i < changes.size(); ++i) what += ", " + changes[i];
-    Finding finding = findingOf("left-behind", "the end leaves " + nameOf(control) + " " + what);
+    Finding finding =
+        findingOf("left-behind", "the end leaves " + nameOf(control) + " " + changes,
+                  "undo the change before TERMINATE_PARSER, if the host goes on using the control");
     finding.tag = ownTag(control);
     finding.path = exploration_.path(number);
     add(std::move(finding), visit.lastList, 1);
   }
 
+  /// Returns how a control differs from what the host had, such as "hidden, with the text “A”
+  /// instead of no text"; empty if it does not.
+  std::string changesAt(const Visit& visit, std::size_t control) const {
+    const auto state = exploration_.format().control(exploration_.place(visit.place), control);
+    const SavedView& before = setting_.before[control];
+    std::string changes;
+    const auto note = [&](const std::string& change) {
+      changes += (changes.empty() ? "" : ", ") + change;
+    };
+    if (state.hidden != before.hidden) note(state.hidden ? "hidden" : "shown");
+    if (state.enabled != before.enabled) note(state.enabled ? "enabled" : "disabled");
+    if (!looksElse(visit, control)) return changes;
+    const LookValue value = looks_.parts(visit.look)[control];
+    for (const LookWords& words : wordsFor(before, looks_.look(value).view)) {
+      note("with " + words.instead);
+    }
+    return changes;
+  }
+
   std::string nameOf(std::size_t control) const {
-    return "the control with the tag " + std::to_string(ownTag(control));
+    return "the control " + std::to_string(ownTag(control));
   }
 
   bool looksElse(const Visit& visit, std::size_t part) const {

@@ -4,6 +4,8 @@
 #include <algorithm>
 #include <string>
 
+#include "tools/check/look_words.hpp"
+
 namespace qz::tools::check {
 
 LookComparison::LookComparison(const Exploration& exploration) : exploration_(exploration) {
@@ -76,6 +78,12 @@ bool LookComparison::differ(const Appearance& one, const Appearance& other) cons
   return looks.valueOf({a.view, true}) != looks.valueOf({b.view, true});
 }
 
+std::string LookComparison::wordsFor(const Appearance& one, const Appearance& other) const {
+  const Looks& looks = exploration_.looks();
+  const auto words = check::wordsFor(looks.look(one.value).view, looks.look(other.value).view);
+  return words.empty() ? "itself flashing or not" : words.front().either;
+}
+
 void LookComparison::seeControl(std::uint32_t place, std::uint32_t list, std::size_t control,
                                 const Seen& seen) {
   auto& all = seen_[{place, list, control}];
@@ -86,8 +94,11 @@ void LookComparison::seeControl(std::uint32_t place, std::uint32_t list, std::si
     return differ(before.appearance, seen.appearance);
   });
   if (other != all.end()) {
-    add(place,
-        {.list = list, .control = control, .first = other->occasion, .second = seen.occasion});
+    add(place, {.list = list,
+                .control = control,
+                .first = other->occasion,
+                .second = seen.occasion,
+                .words = wordsFor(other->appearance, seen.appearance)});
   }
   all.push_back(seen);
 }

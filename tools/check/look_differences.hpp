@@ -19,8 +19,9 @@ namespace qz::tools::check {
 struct LookDifference {
   std::uint32_t list = 0;
   std::size_t control = 0;
-  Occasion first;   ///< after which the place was seen with one look
-  Occasion second;  ///< and with another
+  Occasion first;     ///< after which the place was seen with one look
+  Occasion second;    ///< and with another
+  std::string words;  ///< such as "the text “A” or the text “B”"
   std::size_t places = 0;
 };
 
@@ -49,6 +50,7 @@ class LookComparison {
   std::vector<std::size_t> controlsWithSeveralLooks(std::uint32_t place) const;
   bool flashes(std::uint32_t place, std::size_t control, const Looks::Parts& parts) const;
   bool differ(const Appearance& one, const Appearance& other) const;
+  std::string wordsFor(const Appearance& one, const Appearance& other) const;
   void seeControl(std::uint32_t place, std::uint32_t list, std::size_t control, const Seen& seen);
   void add(std::uint32_t place, const LookDifference& difference);
 

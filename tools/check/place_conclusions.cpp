@@ -64,12 +64,19 @@ class PlaceConclusions {
     for (const auto& [blame, entry] : entries) {
       add(findingOf(
               "dead-end",
-              "after this nothing that the user does, and no timer, runs a list again, but the "
-              "walk-through has not ended",
+              causeOf(blame) +
+                  " leaves the user stuck: no press and no timer runs a list any more, but the "
+                  "walk-through has not ended",
               "show or enable a button that has a list, start a timer, or end with "
               "TERMINATE_PARSER"),
           blame, exploration_.path(entry.first), entry.second.size());
     }
+  }
+
+  std::string causeOf(const Blame& blame) const {
+    if (blame.list) return "list " + quote(script_.lists()[*blame.list].key);
+    if (blame.tag) return "a press of " + std::to_string(*blame.tag) + ", which has no list,";
+    return "the start";
   }
 
   Blame blameOf(const Occasion& occasion, std::optional<std::uint32_t> list) const {
@@ -108,16 +115,17 @@ class PlaceConclusions {
     for (const auto& [blame, entry] : entries) {
       add(findingOf(
               "trap",
-              "from here the end of the walk-through cannot be reached any more, whatever the "
-              "user does",
+              "after " + causeOf(blame) +
+                  " the end of the walk-through cannot be reached any more, whatever the user does",
               "lead a button or a timer back to a list from which the end can be reached"),
           blame, exploration_.path(entry.first), entry.second);
     }
   }
 
   void noEnd() {
-    findings_.push_back(findingOf("no-end", "nothing that the user can do ends the walk-through",
-                                  "run TERMINATE_PARSER in some list"));
+    findings_.push_back(findingOf("no-end",
+                                  "nothing that the user does, and no timer, ends the walk-through",
+                                  "run TERMINATE_PARSER in a list of a button that closes it"));
   }
 
   std::uint32_t firstVisitOf(const PlaceCircle& circle) const {

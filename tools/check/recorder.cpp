@@ -86,13 +86,14 @@ void Recorder::begin() {
   notesMayHaveChanged_ = false;
 }
 
-void Recorder::end() {
+void Recorder::end(bool isOver) {
   isRecording_ = false;
   // Those that never fire have no order, and are sorted by key.
   std::stable_sort(timers_.begin(), timers_.end(), [](const Timer& a, const Timer& b) {
     if (a.timer.seconds != b.timer.seconds) return a.timer.seconds < b.timer.seconds;
     return a.timer.seconds == never && a.timer.key < b.timer.key;
   });
+  if (isOver) return;
   bool isFirst = true;
   for (const Timer& timer : timers_) {
     if (timer.timer.seconds != never && timer.element) {

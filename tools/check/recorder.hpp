@@ -49,8 +49,9 @@ class Recorder final : public Observer {
 
   /// Begins a move; what happens before the first move is not recorded.
   void begin();
-  /// Ends the move. A timer that the move has left pending counts as firing if it is the first.
-  void end();
+  /// Ends the move. A timer that the move has left pending counts as firing if it is the first,
+  /// unless the walk-through is over.
+  void end(bool isOver);
   /// Gives up a move that would never end. Its facts remain; no timer fires after it.
   void abandon();
   void note(FactKind kind, Subject subject, std::string detail = {});

@@ -14,12 +14,6 @@ namespace {
 using walkthrough::ControlPicture;
 using walkthrough::StepPicture;
 
-constexpr std::size_t longestText = 60;  // characters of a text that are shown
-
-std::string shortened(const std::string& text) {
-  return quote(text.size() <= longestText ? text : text.substr(0, longestText) + "…");
-}
-
 std::string number(double value) {
   std::ostringstream text;
   text << value;
@@ -89,16 +83,16 @@ class Changes {
  public:
   Changes(const ControlPicture& before, const ControlPicture& after)
       : before_(before.view), after_(after.view) {
-    if (before_.tag != after_.tag) add("new tag " + std::to_string(after_.tag));
+    if (before_.tag != after_.tag) add("gets the tag " + std::to_string(after_.tag));
     if (before_.hidden != after_.hidden) add(after_.hidden ? "hidden" : "shown");
     if (before_.enabled != after_.enabled) add(after_.enabled ? "enabled" : "disabled");
     addText("title", before_.title, after_.title);
     addText("text", before_.text, after_.text);
     if (before_.state != after_.state) add(after_.state == toolkit::State::on ? "on" : "off");
     if (before_.image != after_.image) add("image " + after_.image.value_or("none"));
-    if (before_.toolTip != after_.toolTip) add("tooltip " + shortened(after_.toolTip));
+    if (before_.toolTip != after_.toolTip) add("tooltip " + quoteStart(after_.toolTip));
     if (before_.background != after_.background) add("another background");
-    if (before.flashing != after.flashing) add(after.flashing ? "flashes" : "flashes no more");
+    if (before.flashing != after.flashing) add(after.flashing ? "flashes" : "stops flashing");
   }
 
   /// Returns a line such as "tag 5: hidden, new tag 6"; empty if nothing differs.
@@ -110,7 +104,7 @@ class Changes {
   void addText(const std::string& what, const toolkit::AttributedString& before,
                const toolkit::AttributedString& after) {
     if (before.string() != after.string()) {
-      add(what + " " + shortened(after.string()));
+      add(what + " " + quoteStart(after.string()));
     } else if (!(before == after)) {
       add("another look of the " + what);
     }
@@ -146,7 +140,8 @@ std::vector<PlayedMove> playPath(const Setting& setting, const Path& path) {
   for (const Step& step : path) {
     const auto outcome = replay.make(step);
     if (outcome == Replay::Outcome::endless) {
-      played.push_back({wordsOf(step), {"runs lists without end"}, false, true});
+      played.push_back(
+          {wordsOf(step), {"runs lists without end, so the program crashes"}, false, true});
       break;
     }
     StepPicture after = replay.picture();

@@ -233,7 +233,7 @@ void World::restoreLook(std::uint32_t look) {
 void World::press(std::size_t control) {
   Control& pressed = controls_[control];
   const Tag tag = pressed.state.tag;
-  if (sharedTags_ > 0 && tagCounts_[tag] > 1) recorder_->note(FactKind::sharedTagPressed, tag);
+  noteIfShared(tag);
   if (!setting_.script.listOfTag(tag)) recorder_->note(FactKind::noListPressed, tag);
   willTouch(pressed.view);
   const auto behavior = pressed.button->behavior();
@@ -250,12 +250,26 @@ void World::press(std::size_t control) {
   }
 }
 
+void World::noteIfShared(Tag tag) {
+  if (controlsWithTag(tag) > 1) recorder_->note(FactKind::sharedTagPressed, tag);
+}
+
+// A timer presses the backmost control with its tag, if that is a button.
+void World::noteIfTimerPressesShared(const std::string& key) {
+  if (sharedTags_ == 0) return;
+  const auto pressed = std::find_if(controls_.begin(), controls_.end(), [&](const Control& each) {
+    return std::to_string(each.state.tag) == key;
+  });
+  if (pressed != controls_.end() && pressed->button) noteIfShared(pressed->state.tag);
+}
+
 // Timers of the place where the world was before may be pending. The place's own others need not be
 // set: the first that fires cancels them.
 void World::wait(const PendingTimer& first) {
   stage_->engine().killAllTimers();
   stage_->engine().startTimerWithValue(wholeSeconds(first.seconds), first.key);
   recorder_->begin();
+  noteIfTimerPressesShared(first.key);
   try {
     driver_->toolkit().advance(first.seconds);
   } catch (const toolkit::Exception& exception) {
@@ -266,10 +280,10 @@ void World::wait(const PendingTimer& first) {
 }
 
 Arrival World::arrive(Move move, PendingTimers& timers, std::uint8_t* place) {
-  recorder_->end();
+  const bool isOver = stage_->engine().terminating();
+  recorder_->end(isOver);
   readTouched(place_.data());
   if (recorder_->notesMayHaveChanged()) readEngine();
-  const bool isOver = stage_->engine().terminating();
   format_.setOver(place_.data(), isOver);
   timers = isOver ? pendingAtTheEnd() : recorder_->pending();
   std::copy(place_.begin(), place_.end(), place);

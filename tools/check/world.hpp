@@ -99,6 +99,8 @@ class World final : private Surroundings {
   void restoreLook(std::uint32_t look);
   void press(std::size_t control);
   void wait(const PendingTimer& first);
+  void noteIfShared(Tag tag);
+  void noteIfTimerPressesShared(const std::string& key);
   ViewLook lookOf(const Control& control) const;
   PendingTimers pendingAtTheEnd() const;
   Arrival arrive(Move move, PendingTimers& timers, std::uint8_t* place);

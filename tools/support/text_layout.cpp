@@ -155,6 +155,17 @@ std::string oneLine(std::string_view text) {
 
 std::string quote(std::string_view text) { return "“" + oneLine(text) + "”"; }
 
+std::string quoteStart(std::string_view text) {
+  constexpr std::size_t longest = 60;
+  if (text.size() <= longest) return quote(text);
+  std::size_t end = longest;
+  const auto isInside = [&](std::size_t at) {
+    return (static_cast<unsigned char>(text[at]) & 0xc0U) == 0x80U;
+  };
+  while (end > 0 && isInside(end)) --end;  // at the beginning of a character
+  return quote(std::string(text.substr(0, end)) + "…");
+}
+
 std::vector<std::string> wrap(std::string_view text, std::size_t width) {
   std::vector<std::string> lines;
   for (std::size_t end = text.find('\n'); end != std::string_view::npos; end = text.find('\n')) {

@@ -27,6 +27,9 @@ std::string oneLine(std::string_view text);
 /// The same on one line, between “ and ”.
 std::string quote(std::string_view text);
 
+/// The same; of a text longer than 60 bytes only the beginning, with an ellipsis behind it.
+std::string quoteStart(std::string_view text);
+
 /// Breaks `text` into lines of at most `width` columns (1 or more): at line ends, else at spaces,
 /// else anywhere. Returns at least one line.
 std::vector<std::string> wrap(std::string_view text, std::size_t width);
