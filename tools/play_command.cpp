@@ -10,6 +10,7 @@
 #include "tools/commands.hpp"
 #include "tools/play/play.hpp"
 #include "tools/play/prompt.hpp"
+#include "tools/reading_errors.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/terminal.hpp"
 #include "tools/support/text_layout.hpp"
@@ -93,7 +94,13 @@ void describePlay(Command& command) {
   command.argument("SCRIPT", options->script, "The script, a property list").file();
   addWindowOptions(command, *options);
   addStepOptions(command, *options);
-  command.action([options] {
+  const auto noCheck = std::make_shared<bool>(false);
+  command.flag("--no-check", *noCheck, "Do not say what can be read to be wrong in the script");
+  command.action([options, noCheck] {
+    if (!*noCheck) {
+      options->scriptLoaded = [](const InputFile& script, toolkit::Toolkit& toolkit,
+                                 std::ostream& out) { writeReadingErrors(script, toolkit, out); };
+    }
     const bool interactive = ::isatty(STDIN_FILENO) != 0;
     const play::Terminal terminal{std::cin, std::cout, std::cerr, interactive, outputStyle()};
     return static_cast<int>(play::play(*options, terminal));

@@ -4,15 +4,19 @@
 #include <filesystem>
 #include <fstream>
 #include <iostream>
+#include <map>
 #include <memory>
 #include <optional>
+#include <set>
 #include <string>
 #include <vector>
 
 #include "tools/commands.hpp"
+#include "tools/reading_errors.hpp"
 #include "tools/scenario/junit.hpp"
 #include "tools/scenario/runner.hpp"
 #include "tools/scenario/scenario_files.hpp"
+#include "tools/scenario/statements.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/failure.hpp"
 #include "tools/support/text_layout.hpp"
@@ -31,6 +35,7 @@ struct TestOptions {
   std::string filter;  // run only scenarios whose title contains this
   bool list = false;   // name the scenarios instead of running them
   bool verbose = false;
+  bool noCheck = false;
   std::optional<std::string> junit;  // where to write a report
 };
 
@@ -109,6 +114,47 @@ std::vector<Report> run(const TestOptions& options, const std::vector<LoadedFile
   return reports;
 }
 
+/// Adds the files that the statements copy into the resources and load as scripts. `copied` has the
+/// files by their names there.
+void addScripts(const std::string& file, const std::vector<scenario::Statement>& statements,
+                std::map<std::string, std::string>& copied, std::set<std::string>& scripts) {
+  for (const auto& statement : statements) {
+    const auto& arguments = statement.arguments;
+    const std::string_view syntax = scenario::statementKinds()[statement.form].syntax;
+    if (syntax.starts_with("copy ")) {
+      copied[arguments.text("FILE")] =
+          (std::filesystem::path(file).parent_path() / arguments.text("PATH")).string();
+    } else if (syntax.starts_with("load ") && arguments.has("TEXT")) {
+      const auto script = copied.find(arguments.text("TEXT"));
+      if (script != copied.end()) scripts.insert(script->second);
+    }
+  }
+}
+
+/// Writes what is surely wrong in the script files that the scenarios load. Scripts that are
+/// written in a scenario are left out: scenarios try mistakes on purpose. So are images, which
+/// scenarios make.
+void writeScriptErrors(const TestOptions& options, const std::vector<LoadedFile>& files,
+                       std::ostream& out) {
+  std::set<std::string> scripts;
+  for (const LoadedFile& file : files) {
+    std::map<std::string, std::string> common;
+    addScripts(file.path, file.contents.common, common, scripts);
+    for (const Scenario& one : file.contents.scenarios) {
+      auto copied = common;
+      addScripts(file.path, one.statements, copied, scripts);
+    }
+  }
+  const auto driver = requireDriver(options.toolkit);
+  for (const std::string& script : scripts) {
+    try {
+      writeReadingErrors(InputFile(script, "a script"), driver->toolkit(), out, {"unknown-image"});
+    } catch (const Failure&) {
+      // The scenario that loads the file says so.
+    }
+  }
+}
+
 /// Runs the scenarios. Writes their failures and the counts to `out`, and the errors in scenario
 /// files to `problems`. Returns the tool's exit status. Throws a Failure if there is no such
 /// toolkit, no scenario matches the filter, or the report cannot be written.
@@ -122,6 +168,7 @@ int runTests(const TestOptions& options, std::ostream& out, std::ostream& proble
     list(read.files, options.filter, out);
     return static_cast<int>(ExitStatus::fine);
   }
+  if (!options.noCheck) writeScriptErrors(options, read.files, problems);
   auto report = options.junit ? openReport(*options.junit) : std::ofstream();
   const auto reports = run(options, read.files, out);
   printSummary(out, reports);
@@ -146,6 +193,8 @@ void describeTest(Command& command) {
   command.option("--filter", options->filter, "Run only scenarios whose title contains this");
   command.flag("--list", options->list, "Name the scenarios instead of running them");
   command.flag("--verbose", options->verbose, "Print every statement with its result");
+  command.flag("--no-check", options->noCheck,
+               "Do not say what can be read to be wrong in the scripts");
   command.option("--junit", options->junit, "Write a JUnit report to this file").path().file();
   command.action([options] { return runTests(*options, std::cout, std::cerr); });
 }

@@ -133,6 +133,7 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   const auto driver = requireDriver(options.toolkit);
   driver->setResourcePath(options.resources ? *options.resources : path.parent_path().string());
   connectLog(*driver, terminal);
+  if (options.scriptLoaded) options.scriptLoaded(file, driver->toolkit(), terminal.log);
   std::optional<Screenshots> screenshots;
   if (options.screenshots) {
     screenshots.emplace(*driver, *options.screenshots);

@@ -2,6 +2,7 @@
 // Plays a script: what `qz-walkthrough play` does once its command line is read.
 #pragma once
 
+#include <functional>
 #include <iosfwd>
 #include <optional>
 #include <string>
@@ -25,6 +26,8 @@ struct PlayOptions {
   std::vector<Step> steps;               ///< what happens after the start, in order
   std::string toolkit = testToolkit();
   std::optional<std::string> screenshots;  ///< directory for a picture of every step
+  /// Called with the script before it starts, and with where to write what is to be said of it.
+  std::function<void(const InputFile&, toolkit::Toolkit&, std::ostream&)> scriptLoaded{};
 };
 
 /// Where the player reads requests and writes its results.
