@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include "qz/property_list/scalars.hpp"
+#include "qz/toolkit/tag.hpp"
 
 namespace qz {
 
