@@ -82,9 +82,12 @@ const check::ReportFormat& formatNamed(const std::string& name) {
 
 std::string stageArguments(const CheckOptions& options) {
   std::string arguments;
-  if (options.stage.window) arguments += " --window " + *options.stage.window;
-  if (options.stage.assets) arguments += " --assets " + *options.stage.assets;
-  if (options.resources) arguments += " --resources " + *options.resources;
+  const auto add = [&](const char* option, const std::optional<std::string>& value) {
+    if (value) arguments += std::string(" ") + option + " " + check::shellWord(*value);
+  };
+  add("--window", options.stage.window);
+  add("--assets", options.stage.assets);
+  add("--resources", options.resources);
   if (options.stage.sheet) arguments += " --sheet";
   return arguments;
 }
@@ -136,6 +139,14 @@ std::vector<Job> checkAll(const CommandOptions& options) {
   return jobs;
 }
 
+void mergeAllowances(std::vector<Job>& jobs) {
+  std::vector<std::pair<std::string, std::vector<check::Finding>*>> scripts;
+  for (Job& job : jobs) {
+    if (!job.failure) scripts.emplace_back(job.verdict.path, &job.verdict.findings);
+  }
+  check::mergeUnneeded(scripts);
+}
+
 void applyBaseline(const CommandOptions& options, std::vector<Job>& jobs) {
   if (!options.baseline) return;
   const bool isThere = std::filesystem::exists(*options.baseline);
@@ -183,11 +194,14 @@ int runCheck(const CommandOptions& options) {
   requireSense(options);
   const auto& format = formatNamed(options.format);
   auto jobs = checkAll(options);
+  mergeAllowances(jobs);
   applyBaseline(options, jobs);
   writeWitnesses(options, jobs);
   std::vector<check::Report> reports;
   for (const Job& job : jobs) {
-    if (!job.failure) reports.push_back({job.verdict, *job.file, stageArguments(options.check)});
+    if (!job.failure) {
+      reports.push_back({job.verdict, *job.file, stageArguments(options.check), options.failOn});
+    }
   }
   format.write(reports, outputShowsColor(), std::cout);
   std::cout.flush();
@@ -206,7 +220,7 @@ void addWindowOptions(Command& command, CheckOptions& options) {
   assets.valueName("DESCRIPTION.plist").file();
   auto standIn = command.flag("--stand-in", options.standIn,
                               "Check without a window: make one from the script, and say nothing "
-                              "about the tags and kinds of controls");
+                              "about the tags, kinds and looks of its controls");
   standIn.excludes(window).excludes(assets);
   command
       .option("--resources", options.resources,

@@ -2,6 +2,9 @@
 #include "tools/check/allowances.hpp"
 
 #include <algorithm>
+#include <filesystem>
+#include <map>
+#include <set>
 
 #include "tools/check/lines.hpp"
 #include "tools/support/failure.hpp"
@@ -52,6 +55,14 @@ std::vector<Allowance> readAllowances(const std::string& path) {
 }
 
 void applyAllowances(std::vector<Finding>& findings, const std::vector<Allowance>& allowances) {
+  std::erase_if(findings, [&](const Finding& finding) {
+    return std::any_of(allowances.begin(), allowances.end(),
+                       [&](const Allowance& each) { return matches(each, finding); });
+  });
+}
+
+std::vector<Finding> unneededAllowances(const std::vector<Finding>& findings,
+                                        const std::vector<Allowance>& allowances) {
   std::vector<Finding> unneeded;
   for (const Allowance& allowance : allowances) {
     const bool isNeeded = std::any_of(findings.begin(), findings.end(), [&](const Finding& each) {
@@ -59,15 +70,35 @@ void applyAllowances(std::vector<Finding>& findings, const std::vector<Allowance
     });
     if (isNeeded || !allowance.place) continue;
     unneeded.push_back(findingOf("unneeded-allowance",
-                                 "nothing needs the allowance " + wordsOf(allowance) + " any more",
+                                 "the allowance " + wordsOf(allowance) + " takes nothing back",
                                  "delete the line"));
     unneeded.back().elsewhere = allowance.place;
   }
-  std::erase_if(findings, [&](const Finding& finding) {
-    return std::any_of(allowances.begin(), allowances.end(),
-                       [&](const Allowance& each) { return matches(each, finding); });
-  });
-  std::move(unneeded.begin(), unneeded.end(), std::back_inserter(findings));
+  return unneeded;
+}
+
+void mergeUnneeded(const std::vector<std::pair<std::string, std::vector<Finding>*>>& scripts) {
+  const auto directory = [](const std::string& path) {
+    return std::filesystem::path(path).parent_path();
+  };
+  std::map<std::filesystem::path, std::size_t> scriptsIn;
+  std::map<std::string, std::size_t> reports;  // by the line of the allowance
+  const auto isUnneeded = [](const Finding& each) { return each.code == "unneeded-allowance"; };
+  for (const auto& [path, findings] : scripts) {
+    ++scriptsIn[directory(path)];
+    for (const Finding& each : *findings) {
+      if (isUnneeded(each)) ++reports[each.elsewhere->text()];
+    }
+  }
+  std::set<std::string> kept;
+  for (const auto& [path, findings] : scripts) {
+    const std::size_t all = scriptsIn[directory(path)];
+    std::erase_if(*findings, [&](const Finding& each) {
+      if (!isUnneeded(each)) return false;
+      const std::string line = each.elsewhere->text();
+      return reports[line] < all || !kept.insert(line).second;
+    });
+  }
 }
 
 }  // namespace qz::tools::check

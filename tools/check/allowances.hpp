@@ -5,6 +5,7 @@
 #include <optional>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 #include "tools/check/finding.hpp"
@@ -25,8 +26,15 @@ Allowance parseAllowance(std::string_view text, const std::string& source);
 /// Reads a file of allowances: one on a line, with comments that begin with `#`.
 std::vector<Allowance> readAllowances(const std::string& path);
 
-/// Removes the findings that are allowed. Adds a finding for each allowance of a file that no
-/// finding needs.
+/// Removes the findings that are allowed.
 void applyAllowances(std::vector<Finding>& findings, const std::vector<Allowance>& allowances);
+/// Returns a finding for each allowance of a file that takes none of the findings back.
+std::vector<Finding> unneededAllowances(const std::vector<Finding>& findings,
+                                        const std::vector<Allowance>& allowances);
+
+/// Scripts in one directory share a file of allowances. Keeps the finding that an allowance is not
+/// needed only if none of the scripts needs it, and only at the first of them. `scripts` are the
+/// findings by the path of the script.
+void mergeUnneeded(const std::vector<std::pair<std::string, std::vector<Finding>*>>& scripts);
 
 }  // namespace qz::tools::check

@@ -159,7 +159,11 @@ Verdict checkScript(const InputFile& file, const CheckOptions& options,
     append(findings, concludeFromLooks(exploration, {options.wordsPerMinute, options.threads}));
   }
   append(findings, checkExpectations(exploration, expectations, options.threads, verdict.expected));
+  // A code that was not looked for, or not everywhere, says nothing about its allowances.
+  const bool canTell = verdict.explored.complete && !options.standIn;
+  auto unneeded = canTell ? unneededAllowances(findings, allowances) : std::vector<Finding>();
   applyAllowances(findings, allowances);
+  append(findings, std::move(unneeded));
   sortByPlace(findings, file);
   for (Finding& finding : findings) {
     if (finding.path.size() <= longestShownPath) finding.played = playPath(setting, finding.path);

@@ -64,15 +64,14 @@ class Conclusions {
     for (const auto& [subject, entry] : facts_.all(FactKind::elementRaised)) {
       if (wasRead(subject) || isUnsuitedAlways(subject)) continue;
       addForElement(subject, entry,
-                    findingOf("raises", nameOf(subject) + " raises an exception here: " +
-                                            entry.detail + "; the engine skips it"));
+                    findingOf("raises", nameOf(subject) + " fails here: " + entry.detail +
+                                            "; the list goes on with its next element"));
     }
     for (const auto& [subject, entry] : facts_.all(FactKind::listRaised)) {
       const ScriptList& list = script_.lists()[static_cast<std::size_t>(subject)];
       if (read_.contains({list.key, noElement})) continue;
       addForList(list, entry,
-                 findingOf("raises", "running list " + quote(list.key) +
-                                         " raises an exception: " + entry.detail));
+                 findingOf("raises", "list " + quote(list.key) + " fails: " + entry.detail));
     }
   }
 
@@ -84,7 +83,7 @@ class Conclusions {
       Finding finding = findingOf(
           "never-runs",
           "nothing runs list " + quote(list.key) + ": no press, no timer and no list leads to it",
-          "delete the list, or run it from another one");
+          "delete the list, or give a control its tag");
       finding.list = list.key;
       finding.where = list.keyValue;
       findings_.push_back(std::move(finding));
@@ -104,9 +103,10 @@ class Conclusions {
     for (const auto& [subject, entry] : facts_.all(FactKind::targetUnsuited)) {
       if (!isUnsuitedAlways(subject) || !exploration_.isComplete()) continue;
       addForElement(subject, entry,
-                    findingOf("wrong-target", nameOf(subject) +
-                                                  " names a control of another kind every time it "
-                                                  "runs, on which it has no effect"));
+                    findingOf("wrong-target",
+                              nameOf(subject) + " has no effect: its control is a " + entry.detail +
+                                  ", and the command needs " + neededBy(subject),
+                              "correct the tag"));
     }
   }
 
@@ -114,9 +114,14 @@ class Conclusions {
     const bool found = facts_.has(FactKind::targetFound, subject);
     if (!found && !exploration_.isComplete()) return;
     const auto tag = script_.element(static_cast<std::size_t>(subject)).target(ownIdOf(subject));
-    Finding finding = findingOf(
-        "no-target", "no control has the tag " + std::to_string(tag.value_or(0)) + " " +
-                         (found ? "in some of the runs" : "whenever " + nameOf(subject) + " runs"));
+    const Command& command = *script_.element(static_cast<std::size_t>(subject)).command;
+    const bool findsLists = command.positionOf(ParameterType::controlOrListTag).has_value();
+    Finding finding =
+        findingOf("no-target",
+                  (found ? "in some runs " : "") + nameOf(subject) + " finds no control " +
+                      (findsLists ? "and no list " : "") + "with the tag " +
+                      std::to_string(tag.value_or(0)) + ", so nothing happens",
+                  found ? "find out which list gave the control another tag" : "correct the tag");
     if (found) finding.severity = Severity::note;
     finding.tag = tag;
     addForElement(subject, entry, std::move(finding));
@@ -154,16 +159,20 @@ class Conclusions {
 
   void sharedTags() {
     for (const auto& [subject, entry] : facts_.all(FactKind::sharedTagUsed)) {
-      Finding finding =
-          findingOf("same-tag", "two controls have the tag that " + nameOf(subject) +
-                                    " names; it reaches only the one that is farther back");
+      Finding finding = findingOf("same-tag",
+                                  "two controls have the tag that " + nameOf(subject) +
+                                      " names; only the one that is farther back changes",
+                                  "give each control its own tag");
       finding.tag = script_.element(static_cast<std::size_t>(subject)).target(ownIdOf(subject));
       addForElement(subject, entry, std::move(finding));
     }
     for (const auto& [subject, entry] : facts_.all(FactKind::sharedTagPressed)) {
       addForTag(subject, entry,
-                findingOf("same-tag", "a button with the tag " + std::to_string(subject) +
-                                          " is pressed while another control has that tag"));
+                findingOf("same-tag",
+                          "the button " + std::to_string(subject) +
+                              " can be pressed while another control has the same tag; commands "
+                              "reach only the one that is farther back",
+                          "give each control its own tag"));
     }
   }
 
@@ -173,8 +182,9 @@ class Conclusions {
       place.isPlace = true;
       addForTag(subject, place,
                 findingOf("no-list",
-                          "a user can press the button with the tag " + std::to_string(subject) +
-                              ", but there is no list under that tag, so nothing happens",
+                          "a user can press the button " + std::to_string(subject) +
+                              ", but no list is under that tag: nothing happens, and the press "
+                              "cancels every timer",
                           "add a list, or hide or disable the button"));
     }
   }
@@ -193,11 +203,11 @@ class Conclusions {
     }
     for (auto& [cause, lost] : found) {
       const auto [list, element] = placeOf(cause.first);
-      Finding finding = findingOf(
-          "timer-lost",
-          "a press of the button with the tag " + std::to_string(cause.second) +
-              ", which has no list, cancels the timer that " + nameOf(cause.first) + " starts",
-          "hide or disable the button while the timer runs");
+      Finding finding = findingOf("timer-lost",
+                                  "a press of the button " + std::to_string(cause.second) +
+                                      ", which has no list, cancels the timer that " +
+                                      nameOf(cause.first) + " starts",
+                                  "hide or disable the button while the timer runs");
       finding.list = list->key;
       finding.element = element;
       finding.where = list->elements[element].value;
@@ -240,6 +250,25 @@ class Conclusions {
   }
 
   Tag ownIdOf(Subject subject) const { return placeOf(subject).first->tag.value_or(0); }
+
+  std::string neededBy(Subject subject) const {
+    switch (script_.element(static_cast<std::size_t>(subject)).command->target) {
+      case TargetKind::button:
+        return "a button";
+      case TargetKind::buttonWithState:
+        return "a check box";
+      case TargetKind::imageView:
+        return "an image view";
+      case TargetKind::textField:
+        return "a text field";
+      case TargetKind::anyControl:
+        return "a button, a text field or an image view";
+      case TargetKind::none:
+      case TargetKind::anyView:
+        break;
+    }
+    return "another kind of control";
+  }
 
   std::string nameOf(Subject subject) const {
     const Element& element = script_.element(static_cast<std::size_t>(subject));

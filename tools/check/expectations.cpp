@@ -52,7 +52,7 @@ class Parser {
       : line_(line), place_(std::move(place)), script_(script) {}
 
   Expectation parse() {
-    Expectation expectation{.words = wordsOfLine(), .place = place_};
+    Expectation expectation{.words = line_.text, .place = place_};
     expectation.rule = takeRule();
     if (expectation.rule == Rule::within) {
       expectation.moves = takeNumber<std::size_t>("a number of moves");
@@ -110,8 +110,8 @@ class Parser {
       words.emplace_back(each.word);
       candidates.push_back(each.word);
     }
-    wrong("a condition (" + enumerate(words) + ")" +
-          (next_ < line_.words.size() ? didYouMean(line_.words[next_], candidates) : ""));
+    wrong("a condition (" + enumerate(words) + ")",
+          next_ < line_.words.size() ? didYouMean(line_.words[next_], candidates) : "");
   }
 
   template <class Number>
@@ -135,19 +135,11 @@ class Parser {
     return true;
   }
 
-  std::string wordsOfLine() const {
-    std::string words;
-    for (const std::string& word : line_.words) {
-      words += (words.empty() || word == "," ? "" : " ") + word;
-    }
-    return words;
-  }
-
-  [[noreturn]] void wrong(const std::string& expected) const {
+  [[noreturn]] void wrong(const std::string& expected, const std::string& suggestion = "") const {
     const std::string found =
         next_ < line_.words.size() ? quote(line_.words[next_]) : "the end of the line";
     throw Failure(ExitStatus::badInput,
-                  place_.text() + ": expected " + expected + ", found " + found);
+                  place_.text() + ": expected " + expected + ", found " + found + suggestion);
   }
   [[noreturn]] void wrongKey(const std::string& key) const {
     std::vector<std::string_view> keys;

@@ -358,8 +358,9 @@ std::optional<std::uint32_t> Exploration::taggerAt(const Visit& visit, std::size
 }
 
 bool Exploration::leavesTags() const {
-  if (setting_.plan.description)
+  if (setting_.plan.description) {
     return false;  // the engine's own window has no control of the host
+  }
   for (std::uint32_t number = 0; number < places(); ++number) {
     const std::uint8_t* const bytes = place(number);
     if (!format_.isOver(bytes)) continue;

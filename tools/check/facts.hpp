@@ -45,7 +45,7 @@ using Subject = std::int64_t;
 struct Fact {
   FactKind kind = FactKind::elementRan;
   Subject subject = 0;
-  std::string detail;  ///< the reason of an exception, or a loop of lists; else empty
+  std::string detail;  ///< the reason of an exception, a loop, a kind of control; or empty
 };
 
 /// A move out of a visit. Visits have numbers in the order in which they were found, so an earlier

@@ -32,13 +32,22 @@ std::string takeWord(std::string_view& line) {
   return word;
 }
 
-std::vector<std::string> wordsOf(std::string_view line) {
-  std::vector<std::string> words;
-  while (true) {
-    line.remove_prefix(std::min(line.find_first_not_of(blanks), line.size()));
-    if (line.empty() || line.front() == '#') return words;
-    words.push_back(takeWord(line));
+void skipBlanks(std::string_view& line) {
+  line.remove_prefix(std::min(line.find_first_not_of(blanks), line.size()));
+}
+
+Line lineOf(std::size_t number, std::string_view text) {
+  Line line{.number = number, .text = {}, .words = {}};
+  skipBlanks(text);
+  std::string_view rest = text;
+  std::size_t end = 0;  // of the last word
+  while (!rest.empty() && rest.front() != '#') {
+    line.words.push_back(takeWord(rest));
+    end = text.size() - rest.size();
+    skipBlanks(rest);
   }
+  line.text = text.substr(0, end);
+  return line;
 }
 
 }  // namespace
@@ -53,7 +62,7 @@ std::vector<Line> linesOf(const std::string& path, std::string_view what) {
   std::istringstream text(*contents);
   std::size_t number = 0;
   for (std::string line; std::getline(text, line);) {
-    Line found{.number = ++number, .text = line, .words = wordsOf(line)};
+    Line found = lineOf(++number, line);
     if (!found.words.empty()) lines.push_back(std::move(found));
   }
   return lines;

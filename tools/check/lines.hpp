@@ -12,7 +12,7 @@ namespace qz::tools::check {
 
 struct Line {
   std::size_t number = 0;  ///< from 1
-  std::string text;        ///< as the file has it
+  std::string text;        ///< without blanks around it and the comment
   std::vector<std::string> words;
 };
 

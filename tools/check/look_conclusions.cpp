@@ -50,8 +50,9 @@ class LookConclusions {
     exploration_.makeAllMoves(options_.threads,
                               [&](const Occasion& occasion, const Arrival& arrival,
                                   std::uint32_t lastList, std::uint32_t place) {
-                                if (canDiffer)
+                                if (canDiffer) {
                                   comparison.see(place, lastList, arrival.look, occasion);
+                                }
                                 if (canReplace) times.see(occasion, arrival, place);
                               });
     for (const LookDifference& difference : comparison.differences()) add(difference);

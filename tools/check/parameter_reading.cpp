@@ -2,8 +2,11 @@
 #include "tools/check/parameter_reading.hpp"
 
 #include <algorithm>
+#include <filesystem>
+#include <utility>
 
 #include "text/ascii.hpp"
+#include "text/utf8.hpp"
 #include "tools/support/input_file.hpp"
 #include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
@@ -39,6 +42,17 @@ bool isWholeNumber(std::string_view text) {
   if (text.front() == '+' || text.front() == '-') text.remove_prefix(1);
   return !text.empty() &&
          std::all_of(text.begin(), text.end(), [](char c) { return c >= '0' && c <= '9'; });
+}
+
+/// Returns the first character of `text` that is not ASCII, and its number.
+std::pair<std::string, std::uint32_t> firstBeyondAscii(std::string_view text) {
+  std::size_t end = 0;
+  while (end < text.size()) {
+    const std::size_t begin = end;
+    const char32_t character = text::nextCodePoint(text, end);
+    if (character > 0x7f) return {std::string(text.substr(begin, end - begin)), character};
+  }
+  return {"", 0};
 }
 
 std::string plural(std::size_t count, const std::string& noun) {
@@ -93,7 +107,8 @@ class ParameterReader {
         severity = Severity::error;
         break;
     }
-    Finding finding = findingOf("extra-parameter", message, "delete what is too much");
+    Finding finding =
+        findingOf("extra-parameter", message, "delete the parameters from this one on");
     finding.severity = severity;
     finding.where = element_.parameter(command_.parameters.size());
     add(std::move(finding));
@@ -106,7 +121,7 @@ class ParameterReader {
     if (!hasRightType(parameter.type, value)) {
       addAt(value, findingOf("wrong-type",
                              "the " + std::string(parameter.name) + " of " + command_.name +
-                                 " is " + foundWords(value) + "; the command raises an exception",
+                                 " is " + foundWords(value) + ", so the command fails",
                              "write " + wanted(parameter.type)));
     } else if (isNumberType(parameter.type)) {
       readNumber(parameter, value);
@@ -125,8 +140,9 @@ class ParameterReader {
 
   static bool hasRightType(ParameterType type, const ValueRef<>& value) {
     if (type == ParameterType::anything || type == ParameterType::html) return true;
-    if (isNumberType(type) || type == ParameterType::flag)
+    if (isNumberType(type) || type == ParameterType::flag) {
       return asString(value) || asNumber(value);
+    }
     return static_cast<bool>(asString(value));
   }
 
@@ -161,10 +177,13 @@ class ParameterReader {
   }
 
   void readHtml(const ValueRef<>& value) {
-    if (text::asciiBytes(value->description())) return;
+    const std::string html = value->description();
+    if (text::asciiBytes(html)) return;
+    const auto [character, number] = firstBeyondAscii(html);
     addAt(value, findingOf("not-ascii",
-                           "the HTML has a character beyond ASCII, so the engine shows nothing",
-                           "write such characters as references, such as &eacute; or &#233;"));
+                           "the HTML has the character " + quote(character) +
+                               ", which is not ASCII, so the engine shows nothing",
+                           "write &#" + std::to_string(number) + "; instead"));
   }
 
   void readFont(const ValueRef<>& value) {
@@ -178,10 +197,14 @@ class ParameterReader {
   void readImage(const ValueRef<>& value) {
     const std::string name = value->description();
     if (toolkit_.images().imageNamed(name)) return;
+    const std::string stem = std::filesystem::path(name).stem().string();
+    const bool isNamed = stem != name && toolkit_.images().imageNamed(stem);
     addAt(value, findingOf("unknown-image",
                            "no image is called " + quote(name) + " in " +
                                toolkit_.files().resourcePath() + "; nothing is shown in its place",
-                           "put the image there, or name another directory with --resources"));
+                           isNamed ? "write the name only: " + stem
+                                   : "put the image there, or name another directory with "
+                                     "--resources"));
   }
 
   void readColor(const ValueRef<>& value) {

@@ -125,7 +125,7 @@ class PlaceConclusions {
   void noEnd() {
     findings_.push_back(findingOf("no-end",
                                   "nothing that the user does, and no timer, ends the walk-through",
-                                  "run TERMINATE_PARSER in a list of a button that closes it"));
+                                  "run TERMINATE_PARSER in the list of a button or a timer"));
   }
 
   std::uint32_t firstVisitOf(const PlaceCircle& circle) const {

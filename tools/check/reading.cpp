@@ -38,7 +38,7 @@ class Reader {
     if (!toolkit::asArray(list.value)) {
       add(findingOf("not-a-list",
                     "the value under " + quote(list.key) + " is " + foundWords(list.value) +
-                        "; running it raises an exception",
+                        " and not a list of commands, so running it fails",
                     "write an array of commands"),
           list, list.value);
     }
@@ -74,7 +74,7 @@ class Reader {
       return std::nullopt;
     }
     return findingOf("malformed-command",
-                     "an element is " + what + "; the engine raises an exception and skips it",
+                     "this element is " + what + " and not a command, so the engine skips it",
                      "write a string (the command's name), or an array that begins with the name");
   }
 
@@ -127,7 +127,20 @@ class Reader {
       }
     }
     std::string raised;
-    return nearest(text::uppercased(name, raised), candidates);
+    const std::string_view upper = text::uppercased(name, raised);
+    const auto meant = nearest(upper, candidates);
+    return meant ? meant : longestWithin(upper, candidates);
+  }
+
+  /// Returns the longest candidate that is a part of the name, as in RETURN_TO_IDLE_LOOP.
+  static std::optional<std::string> longestWithin(std::string_view name,
+                                                  const std::vector<std::string_view>& candidates) {
+    std::string_view longest;
+    for (const std::string_view candidate : candidates) {
+      const bool isWithin = name.find(candidate) != std::string_view::npos;
+      if (isWithin && candidate.size() > longest.size()) longest = candidate;
+    }
+    return longest.empty() ? std::nullopt : std::optional<std::string>(longest);
   }
 
   void add(Finding finding, const ScriptList& list, const ValueRef<>& where) {

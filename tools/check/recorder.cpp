@@ -228,7 +228,8 @@ void Recorder::noteTarget(const Running& running) {
     if (suits(command.target, surroundings_.kindOf(control))) {
       noteOnce(FactKind::targetSuited, running.element);
     } else {
-      note(FactKind::targetUnsuited, subject);
+      const auto kind = surroundings_.kindOf(control);
+      note(FactKind::targetUnsuited, subject, std::string(drivers::rowOf(kind).word));
     }
   } else if (hasParameter(command, ParameterType::controlOrListTag) &&
              script_.listOfTag(*running.target)) {

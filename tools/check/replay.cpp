@@ -73,8 +73,9 @@ class Replay {
 
 std::string wordsOf(const Step& step) {
   if (const auto* start = std::get_if<StartMove>(&step)) return "start " + start->key;
-  if (const auto* press = std::get_if<PressMove>(&step))
+  if (const auto* press = std::get_if<PressMove>(&step)) {
     return "press " + std::to_string(press->tag);
+  }
   return "wait " + number(std::get<WaitMove>(step).seconds) + " s";
 }
 

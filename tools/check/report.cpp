@@ -12,17 +12,6 @@ std::string shortest(double number) {
   return {std::begin(digits), end};
 }
 
-/// Returns the text as one word of a shell's command line.
-std::string shellWord(const std::string& text) {
-  const bool isPlain = !text.empty() && text.find_first_not_of(
-                                            "abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ"
-                                            "0123456789_-./") == std::string::npos;
-  if (isPlain) return text;
-  std::string quoted = "'";
-  for (const char c : text) quoted += c == '\'' ? std::string("'\\''") : std::string(1, c);
-  return quoted + "'";
-}
-
 }  // namespace
 
 std::vector<ReportFormat> reportFormats() {
@@ -42,6 +31,21 @@ std::optional<toolkit::TextPosition> positionOf(const Finding& finding, const In
 std::string placeOf(const Finding& finding, const InputFile& file) {
   if (finding.elsewhere) return finding.elsewhere->text();
   return finding.where ? file.placeOf(finding.where) : file.path();
+}
+
+std::string shellWord(const std::string& text) {
+  const bool isPlain = !text.empty() && text.find_first_not_of(
+                                            "abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ"
+                                            "0123456789_-./") == std::string::npos;
+  if (isPlain) return text;
+  std::string quoted = "'";
+  for (const char c : text) quoted += c == '\'' ? std::string("'\\''") : std::string(1, c);
+  return quoted + "'";
+}
+
+std::string playCommand(const Report& report, const Path& path) {
+  return "qz-walkthrough play " + shellWord(report.verdict.path) + report.stageArguments + " " +
+         playArguments(path);
 }
 
 std::string playArguments(const Path& path) {

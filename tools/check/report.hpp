@@ -16,6 +16,7 @@ struct Report {
   const Verdict& verdict;
   const InputFile& file;
   std::string stageArguments;  ///< the arguments of `play` that set up the window, or empty
+  Severity failOn;             ///< the least severity that fails
 };
 
 /// A format of the reports.
@@ -39,6 +40,10 @@ std::optional<toolkit::TextPosition> positionOf(const Finding& finding, const In
 /// Returns the place of a finding, such as "intro.plist:12:5"; the path alone if that is all.
 std::string placeOf(const Finding& finding, const InputFile& file);
 
+/// Returns the text as one word of a shell's command line.
+std::string shellWord(const std::string& text);
+/// Returns the command line that plays a path of the report's script.
+std::string playCommand(const Report& report, const Path& path);
 /// Returns the arguments of `play` that walk a path, such as "--start 1 --press 2 3".
 std::string playArguments(const Path& path);
 

@@ -58,9 +58,7 @@ void writeGithub(const std::vector<Report>& reports, bool, std::ostream& out) {
       out << "::" << commandOf(finding.severity) << propertiesOf(finding, report)
           << ",title=" << escaped(finding.code, true) << "::" << escaped(finding.message, false);
       if (!finding.path.empty()) {
-        out << escaped("\nqz-walkthrough play " + report.verdict.path + report.stageArguments +
-                           " " + playArguments(finding.path),
-                       false);
+        out << escaped("\n" + playCommand(report, finding.path), false);
       }
       out << '\n';
     }

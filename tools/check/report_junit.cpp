@@ -37,14 +37,16 @@ std::string attribute(const std::string& name, const std::string& value) {
   return " " + name + "=\"" + xmlText(value) + "\"";
 }
 
-bool isFailure(const Finding& finding) { return finding.severity != Severity::note; }
+bool isFailure(const Report& report, const Finding& finding) {
+  return finding.severity >= report.failOn;
+}
 
 void writeCase(const Report& report, const Finding& finding, std::ostream& out) {
   out << "    <testcase" << attribute("classname", report.verdict.path)
       << attribute("name", finding.code + ": " + finding.message) << ">\n";
-  if (isFailure(finding)) {
+  if (isFailure(report, finding)) {
     std::string details = placeOf(finding, report.file);
-    if (!finding.path.empty()) details += ": " + playArguments(finding.path);
+    if (!finding.path.empty()) details += ": " + playCommand(report, finding.path);
     out << "      <failure" << attribute("type", std::string(nameOf(finding.severity)))
         << attribute("message", finding.message) << ">" << xmlText(details) << "</failure>\n";
   }
@@ -57,7 +59,9 @@ void writeJunit(const std::vector<Report>& reports, bool, std::ostream& out) {
   out << "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<testsuites>\n";
   for (const Report& report : reports) {
     const auto& findings = report.verdict.findings;
-    const auto failures = std::count_if(findings.begin(), findings.end(), isFailure);
+    const auto failures =
+        std::count_if(findings.begin(), findings.end(),
+                      [&](const Finding& finding) { return isFailure(report, finding); });
     const std::size_t count = std::max<std::size_t>(findings.size(), 1);
     out << "  <testsuite" << attribute("name", report.verdict.path)
         << attribute("tests", std::to_string(count))

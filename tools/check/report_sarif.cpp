@@ -18,13 +18,30 @@ constexpr std::size_t mostSteps = 1000;
 
 Json messageOf(const std::string& text) { return {{"text", text}}; }
 
+/// Returns a path as a URI reference.
+std::string uriOf(const std::string& path) {
+  constexpr std::string_view plain =
+      "abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ0123456789-._~/";
+  constexpr std::string_view digits = "0123456789ABCDEF";
+  std::string uri;
+  for (const char c : path) {
+    const auto byte = static_cast<unsigned char>(c);
+    if (plain.find(c) != std::string_view::npos) {
+      uri += c;
+    } else {
+      uri += {'%', digits[byte >> 4U], digits[byte & 0xfU]};
+    }
+  }
+  return uri;
+}
+
 Json locationOf(const Report& report, const Finding* finding) {
   if (finding && finding->elsewhere) {
-    const Json physical = {{"artifactLocation", {{"uri", finding->elsewhere->path}}},
+    const Json physical = {{"artifactLocation", {{"uri", uriOf(finding->elsewhere->path)}}},
                            {"region", {{"startLine", finding->elsewhere->line}}}};
     return {{"physicalLocation", physical}};
   }
-  Json physical = {{"artifactLocation", {{"uri", report.verdict.path}}}};
+  Json physical = {{"artifactLocation", {{"uri", uriOf(report.verdict.path)}}}};
   const auto position = finding ? positionOf(*finding, report.file) : std::nullopt;
   if (position) {
     physical["region"] = {{"startLine", position->line}, {"startColumn", position->column}};

@@ -2,6 +2,7 @@
 // The report for people.
 #include <algorithm>
 #include <ostream>
+#include <set>
 #include <sstream>
 
 #include "tools/check/report.hpp"
@@ -49,7 +50,7 @@ class TextReport {
          << ' ' << oneLine(finding.message) << " [" << finding.code << "]\n";
     writeSource(finding);
     writePath(finding.path, "see it");
-    for (const PlayedMove& move : finding.played) writeMove(move);
+    writeMoves(finding);
     writePath(finding.otherPath, "and the other");
     if (finding.places > 1) out_ << "  places: " << finding.places << " show it\n";
     if (!finding.help.empty()) out_ << "  help: " << oneLine(finding.help) << '\n';
@@ -66,8 +67,17 @@ class TextReport {
 
   void writePath(const Path& path, std::string_view title) {
     if (path.empty()) return;
-    out_ << "  " << title << ": qz-walkthrough play " << report_.verdict.path
-         << report_.stageArguments << ' ' << playArguments(path) << '\n';
+    out_ << "  " << title << ": " << playCommand(report_, path) << '\n';
+  }
+
+  /// Writes the moves of a path, unless an earlier finding has the same path.
+  void writeMoves(const Finding& finding) {
+    if (finding.played.empty()) return;
+    if (!shown_.insert(playArguments(finding.path)).second) {
+      out_ << "    (the moves are above)\n";
+      return;
+    }
+    for (const PlayedMove& move : finding.played) writeMove(move);
   }
 
   void writeMove(const PlayedMove& move) {
@@ -91,19 +101,16 @@ class TextReport {
            << ".\n";
     }
     if (report_.verdict.isStandIn) {
-      out_ << "  The window was made from the script, so nothing is said about the tags and kinds "
-              "of controls; name the host's with --window.\n";
+      out_ << "  The window was made from the script, so nothing is said about the tags, kinds and "
+              "looks of its controls; name the window with --window or --assets.\n";
     }
   }
 
   void writeExpected(const ExpectationCounts& expected) {
-    const std::size_t all = expected.hold + expected.fail + expected.open;
-    if (all == 0) return;
-    out_ << "  " << expected.hold << " of " << counted(all, "expectation")
-         << (expected.hold == 1 ? " holds" : " hold");
+    if (expected.hold + expected.fail + expected.open == 0) return;
+    out_ << "  expectations: " << expected.hold << " hold, " << expected.fail << " fail";
     if (expected.open > 0) {
-      out_ << "; whether " << expected.open
-           << " do is not known, because not everything was explored";
+      out_ << ", " << expected.open << " not known, because not everything was explored";
     }
     out_ << '\n';
   }
@@ -141,6 +148,7 @@ class TextReport {
   Colors colors_;
   std::ostream& out_;
   std::vector<std::string> lines_;
+  std::set<std::string> shown_;  // the paths whose moves were written
 };
 
 }  // namespace

@@ -136,8 +136,9 @@ class Witness {
     if (control.state != toolkit::State::off) {
       out_ << "set " << name << ".state " << static_cast<int>(control.state) << '\n';
     }
-    if (!control.toolTip.empty())
+    if (!control.toolTip.empty()) {
       out_ << "set " << name << ".tooltip " << word(control.toolTip) << '\n';
+    }
   }
 
   void writeMoves() {
