@@ -98,6 +98,18 @@ TEST_F(Allowances, ThatNothingNeedsAreReported) {
   EXPECT_NE(verdict.findings[0].message.find("no-list=5"), std::string::npos);
 }
 
+TEST_F(Allowances, MayBeNeededByWhatIsNotKnown) {
+  directory_.write("check.allow", "never-runs\n");
+  CheckOptions options;
+  options.limits.places = 1;
+  for (const std::string& name : left(options)) EXPECT_FALSE(name.starts_with("unneeded")) << name;
+  directory_.write("check.allow", "never-runs\nno-list\n");
+  std::filesystem::remove("window.plist");
+  for (const std::string& name : left()) {
+    EXPECT_FALSE(name.starts_with("unneeded")) << "without a window no button is known: " << name;
+  }
+}
+
 TEST_F(Allowances, OfOptionsNeedNotBeNeeded) {
   CheckOptions options;
   options.allowances = {parseAllowance("trap", "--allow"), parseAllowance("never-runs", "--allow"),

@@ -75,9 +75,7 @@ class Expectations : public testing::Test {
     EXPECT_EQ(playArguments(failures[0].path), path) << line;
     ASSERT_TRUE(failures[0].elsewhere) << line;
     EXPECT_EQ(failures[0].elsewhere->text(), "check.expect:2");
-    if (line.find('"') == std::string::npos) {
-      EXPECT_NE(failures[0].message.find(line), std::string::npos) << failures[0].message;
-    }
+    EXPECT_NE(failures[0].message.find(line), std::string::npos) << failures[0].message;
   }
 
   /// Returns how the file is refused.
@@ -246,6 +244,12 @@ TEST_F(Expectations, AreRefusedWithLineAndWhatWasExpected) {
     EXPECT_NE(message.find(test.expected), std::string::npos) << message;
     EXPECT_NE(message.find(test.found), std::string::npos) << message;
   }
+}
+
+TEST_F(Expectations, AreNamedAsTheFileHasThem) {
+  const Verdict verdict = check("never text 5 \"Two, three\"  # a comment\n");
+  const std::string message = failuresIn(verdict).at(0).message;
+  EXPECT_NE(message.find("never text 5 \"Two, three\"”"), std::string::npos) << message;
 }
 
 TEST_F(Expectations, AFileThatCannotBeReadIsRefused) {

@@ -64,7 +64,7 @@ class Reports : public testing::Test {
   template <class Write>
   std::string written(Write write, bool color = false) {
     std::ostringstream out;
-    write({Report{verdict_, *file_, " --window window.plist"}}, color, out);
+    write({Report{verdict_, *file_, " --window window.plist", failOn_}}, color, out);
     return out.str();
   }
 
@@ -73,6 +73,7 @@ class Reports : public testing::Test {
   play::WorkingDirectory directory_;
   std::optional<InputFile> file_;
   Verdict verdict_{};
+  Severity failOn_ = Severity::warning;
 };
 
 Json pathOf(int press) { return Json::array({{{"start", "1"}}, {{"press", press}}}); }
@@ -246,7 +247,9 @@ TEST_F(Reports, JunitHasACaseForEachFinding) {
     const char* type;
     const char* details;
   } cases[] = {{"left-behind", "", ""},
-               {"dead-end", "error", "script.plist:4:3: --start 1 --press 3"},
+               {"dead-end", "error",
+                "script.plist:4:3: qz-walkthrough play script.plist --window window.plist --start "
+                "1 --press 3"},
                {"never-runs", "warning", "script.plist:5:3"}};
   auto one = suite.child("testcase");
   for (std::size_t i = 0; i < std::size(cases); ++i, one = one.next_sibling("testcase")) {
@@ -257,6 +260,32 @@ TEST_F(Reports, JunitHasACaseForEachFinding) {
     EXPECT_STREQ(one.child("failure").text().get(), cases[i].details);
   }
   EXPECT_FALSE(one) << "there are more";
+}
+
+TEST_F(Reports, JunitFailsOnWhatTheCommandFailsOn) {
+  checkSmallScript();
+  const std::pair<Severity, int> cases[] = {
+      {Severity::note, 3}, {Severity::warning, 2}, {Severity::error, 1}};
+  for (const auto& [severity, failures] : cases) {
+    failOn_ = severity;
+    const auto document = xmlOf(written(writeJunit));
+    const auto suite = document.child("testsuites").child("testsuite");
+    EXPECT_EQ(suite.attribute("failures").as_int(), failures);
+    EXPECT_EQ(document.select_nodes("//failure").size(), static_cast<std::size_t>(failures));
+  }
+}
+
+TEST_F(Reports, TextShowsTheMovesOfAPathOnce) {
+  makeVerdict("script.plist");
+  for (const char* const words : {"one", "two"}) {
+    addFinding(words);
+    verdict_.findings.back().path = {StartMove{"1"}};
+    verdict_.findings.back().played = {{"start 1", {}, false, false}};
+  }
+  const std::string text = written(writeText);
+  const auto moves = text.find("    start 1: nothing changes\n");
+  EXPECT_NE(moves, std::string::npos) << text;
+  EXPECT_EQ(text.find("    start 1:", moves + 1), std::string::npos) << text;
 }
 
 TEST_F(Reports, JunitHasAPassingCaseForAScriptWithoutFindings) {
@@ -348,11 +377,11 @@ TEST_F(Reports, EachScriptHasItsPart) {
   const InputFile a("a.plist", "a script");
   const InputFile b("b.plist", "a script");
   std::ostringstream json;
-  writeJson({Report{first, a, ""}, Report{verdict_, b, ""}}, false, json);
+  writeJson({Report{first, a, "", failOn_}, Report{verdict_, b, "", failOn_}}, false, json);
   EXPECT_EQ(Json::parse(json.str())["scripts"][0]["script"], "a.plist");
   EXPECT_EQ(Json::parse(json.str())["scripts"][1]["script"], "b.plist");
   std::ostringstream junit;
-  writeJunit({Report{first, a, ""}, Report{verdict_, b, ""}}, false, junit);
+  writeJunit({Report{first, a, "", failOn_}, Report{verdict_, b, "", failOn_}}, false, junit);
   const auto document = xmlOf(junit.str());
   EXPECT_STREQ(document.child("testsuites").last_child().attribute("name").value(), "b.plist");
 }
@@ -426,6 +455,23 @@ TEST_F(OddCharacters, ThatAreNotUnicodeAreReplacedInJson) {
   const std::string replaced = "a\uFFFDb";
   EXPECT_EQ(Json::parse(written(writeJson))["scripts"][0]["findings"][0]["message"], replaced);
   EXPECT_EQ(Json::parse(written(writeSarif))["runs"][0]["results"][0]["message"]["text"], replaced);
+}
+
+TEST_F(OddCharacters, AreEscapedInTheUriOfSarif) {
+  const Json sarif = Json::parse(written(writeSarif));
+  EXPECT_EQ(
+      sarif["runs"][0]["results"][0]["locations"][0]["physicalLocation"]["artifactLocation"]["uri"],
+      "e%1B%5B2J%25%2C%3A%3C%26%22%27%20%0A%C3%A9.plist");
+}
+
+TEST_F(Reports, QuoteThePathOfTheScriptForAShell) {
+  makeVerdict("my script.plist");
+  addFinding("one");
+  verdict_.findings[0].path = {StartMove{"1"}};
+  const std::string play =
+      "qz-walkthrough play 'my script.plist' --window window.plist --start 1\n";
+  EXPECT_NE(written(writeText).find(play), std::string::npos) << written(writeText);
+  EXPECT_NE(written(writeGithub).find(play), std::string::npos) << written(writeGithub);
 }
 
 TEST(PlayArguments, WalkAPath) {

@@ -221,6 +221,18 @@ TEST_F(CheckCommand, TakesBackWhatIsAllowed) {
   EXPECT_EQ(checkInWindow({"warning.plist", "--allow", "trap", "--allow", "never-runs"}).status, 0);
 }
 
+TEST_F(CheckCommand, SharesAllowancesInADirectory) {
+  directory_.write("check.allow", "never-runs\ntrap\n");
+  const Result result = checkInWindow({"clean.plist", "warning.plist"});
+  EXPECT_EQ(result.status, 1);
+  const std::string code = "[unneeded-allowance]";
+  const auto first = result.out.find(code);
+  ASSERT_NE(first, std::string::npos) << "none of the scripts needs trap: " << result.out;
+  EXPECT_EQ(result.out.find(code, first + 1), std::string::npos)
+      << "one of them needs never-runs, and trap is reported once: " << result.out;
+  EXPECT_TRUE(contains(result.out, "check.allow:2: warning: ")) << result.out;
+}
+
 TEST_F(CheckCommand, FailsOnlyOnWhatTheBaselineDoesNotHave) {
   const Result first = checkInWindow({"warning.plist", "--baseline", "known", "--update-baseline"});
   EXPECT_EQ(first.status, 0) << first.out << first.err;
