@@ -100,6 +100,15 @@ TEST_F(Baselines, NameScriptsFromTheirFolder) {
   EXPECT_NE(wholeFile("ci/known")->find("\"../intro.plist\""), std::string::npos);
 }
 
+TEST_F(Baselines, KnowAScriptByEveryPathToIt) {
+  std::filesystem::create_directory("ci");
+  writeBaseline({findingIn("1")}, "ci/../ci/known");
+  for (const char* const path : {"intro.plist", "./intro.plist", "ci/../intro.plist"}) {
+    std::vector<Finding> findings{findingIn("1")};
+    EXPECT_EQ(Baseline::read("ci/known").takeBack(path, findings), 1U) << path;
+  }
+}
+
 TEST_F(Baselines, AreReplacedScriptByScript) {
   writeBaseline({findingIn("1"), findingIn("2")});
   auto baseline = Baseline::read("known");

@@ -4,6 +4,7 @@
 
 #include <gtest/gtest.h>
 
+#include <chrono>
 #include <sstream>
 
 #include "qz/property_list/scalars.hpp"
@@ -122,6 +123,16 @@ TEST_F(HostileScripts, HaveWindowsOfTenThousandControls) {
   EXPECT_TRUE(verdict.explored.complete);
   EXPECT_EQ(verdict.explored.places, 2U);
   EXPECT_EQ(codesOf(verdict), std::set<std::string>()) << messagesOf(verdict);
+}
+
+TEST_F(HostileScripts, HaveAThousandButtonsWithoutLists) {
+  std::string window = "( " + buttonEntry(2);
+  for (int tag = 100; tag < 1100; ++tag) window += ",\n" + buttonEntry(tag);
+  directory_.write("window.plist", window + ")");
+  directory_.write("script.plist", "{ 1 = (IDLE_LOOP); 2 = (TERMINATE_PARSER); }");
+  const auto began = std::chrono::steady_clock::now();
+  EXPECT_EQ(checkFolder("").findings.size(), 1000U);
+  EXPECT_LT(std::chrono::steady_clock::now() - began, std::chrono::seconds(10));
 }
 
 TEST_F(HostileScripts, HaveListsOfAHundredThousandElements) {

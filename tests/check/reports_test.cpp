@@ -464,6 +464,13 @@ TEST_F(OddCharacters, AreEscapedInTheUriOfSarif) {
       "e%1B%5B2J%25%2C%3A%3C%26%22%27%20%0A%C3%A9.plist");
 }
 
+TEST_F(OddCharacters, DoNotReachTheTerminalFromAPath) {
+  verdict_.findings[0].path = {StartMove{"\x1b[2J"}};
+  verdict_.findings[0].played = {{"start \x1b[2J", {"tag 5: image \x1b[2J"}, false, false}};
+  const std::string text = written(writeText);
+  EXPECT_EQ(text.find('\x1b'), std::string::npos) << text;
+}
+
 TEST_F(Reports, QuoteThePathOfTheScriptForAShell) {
   makeVerdict("my script.plist");
   addFinding("one");
@@ -472,6 +479,19 @@ TEST_F(Reports, QuoteThePathOfTheScriptForAShell) {
       "qz-walkthrough play 'my script.plist' --window window.plist --start 1\n";
   EXPECT_NE(written(writeText).find(play), std::string::npos) << written(writeText);
   EXPECT_NE(written(writeGithub).find(play), std::string::npos) << written(writeGithub);
+}
+
+TEST_F(Reports, PutTheCaretBelowWideCharacters) {
+  directory_.write("wide.plist", "{ 1 = (\"日本\", IDLE_LOP); }\n");
+  file_.emplace("wide.plist", "a script");
+  verdict_ = {.path = "wide.plist"};
+  Finding finding = findingOf("unknown-command", "one");
+  finding.where = toolkit::asArray(file_->dictionary()->objectForKey("1"))->objectAtIndex(1);
+  verdict_.findings.push_back(finding);
+  EXPECT_NE(written(writeText).find("  | { 1 = (\"日本\", IDLE_LOP); }\n"
+                                    "  |                ^\n"),
+            std::string::npos)
+      << written(writeText);
 }
 
 TEST(PlayArguments, WalkAPath) {

@@ -149,6 +149,14 @@ TEST_F(Witness, StopsBeforeAnEndlessChain) {
   expectThatAllPass("found", countPaths(verdict));
 }
 
+TEST_F(Witness, MayLogBeforeAnEndlessChain) {
+  directory_.write("script.plist",
+                   "{ 1 = ((DISABLE_OBJECT_WITH_ID, 6)); 2 = (PROCESS_COMMANDS_FOR_ID); }");
+  const Verdict verdict = writeWitnesses(optionsFor("window.plist"));
+  EXPECT_TRUE(codesOf(verdict).contains("endless-chain")) << messagesOf(verdict);
+  expectThatAllPass("found", countPaths(verdict));
+}
+
 TEST_F(Witness, PlaysInASheet) {
   directory_.write("script.plist", manyMistakes);
   CheckOptions options = optionsFor("window.plist");

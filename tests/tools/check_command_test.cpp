@@ -188,6 +188,13 @@ TEST_F(CheckCommand, GivesTheSameBytesWithAnyNumberOfThreads) {
   }
 }
 
+TEST_F(CheckCommand, TakesEveryNumberOfThreadsAndMegabytes) {
+  for (const char* const number : {"4294967296", "4294967297", "17592186044416"}) {
+    EXPECT_EQ(checkInWindow({"clean.plist", "--threads", number}).status, 0) << number;
+    EXPECT_EQ(checkInWindow({"clean.plist", "--memory", number}).status, 0) << number;
+  }
+}
+
 TEST_F(CheckCommand, ChecksAScriptTwiceThatIsGivenTwice) {
   const Result result = checkInWindow({"clean.plist", "clean.plist"});
   EXPECT_EQ(result.status, 0);
