@@ -4,6 +4,7 @@
 #include <atomic>
 #include <filesystem>
 #include <iostream>
+#include <limits>
 #include <list>
 #include <memory>
 #include <optional>
@@ -30,6 +31,9 @@ using check::Severity;
 
 // Nothing was found, but not everything was looked at.
 constexpr int notComplete = 3;
+
+// More would cost more than they save.
+constexpr std::size_t mostThreads = 256;
 
 struct CommandOptions {
   std::vector<std::string> scripts;
@@ -252,7 +256,10 @@ void addExploringOptions(Command& command, CheckOptions& options) {
   command
       .taken(
           "--memory",
-          [&](const std::string& n) { options.limits.bytes = positive("--memory", n) << 20U; },
+          [&](const std::string& n) {
+            constexpr std::size_t most = std::numeric_limits<std::size_t>::max() >> 20U;
+            options.limits.bytes = std::min(positive("--memory", n), most) << 20U;
+          },
           "Stop when the places take this much memory (default: 4096)")
       .valueName("MEGABYTES");
   command
@@ -274,7 +281,8 @@ void addExploringOptions(Command& command, CheckOptions& options) {
       .taken(
           "--threads",
           [&](const std::string& n) {
-            options.threads = static_cast<unsigned>(positive("--threads", n));
+            options.threads =
+                static_cast<unsigned>(std::min(positive("--threads", n), mostThreads));
           },
           "How many threads explore (default: one a processor); the result is the same")
       .valueName("COUNT");

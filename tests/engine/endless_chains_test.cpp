@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include "qz/property_list/scalars.hpp"
+#include "qz/toolkit/tag.hpp"
 
 namespace qz {
 
@@ -65,6 +66,32 @@ TEST(EndlessChains, EndWithTheWalkThrough) {
   EXPECT_TRUE(endlessChains(script).loops.empty());
   script->setObject(Array::make({chain(5), String::make("TERMINATE_PARSER")}), "5");
   EXPECT_EQ(endlessChains(script).loops, std::vector<std::string>{"5 -> 5"});
+}
+
+TEST(EndlessChains, EndWithAListThatEndsTheWalkThrough) {
+  const auto script = Dictionary::make();
+  script->setObject(Array::make({chain(2), chain(3)}), "1");
+  script->setObject(Array::make({String::make("TERMINATE_PARSER")}), "2");
+  script->setObject(Array::make({chain(3)}), "3");
+  const auto chains = endlessChains(script);
+  EXPECT_EQ(chains.loops, std::vector<std::string>{"3 -> 3"});
+  EXPECT_FALSE(chains.loopOf.contains("1")) << "list 2 ends the walk-through before list 3 runs";
+  EXPECT_TRUE(chains.loopOf.contains("3"));
+}
+
+TEST(EndlessChains, EndWithAListThatRunsAListThatEndsTheWalkThrough) {
+  const auto script = Dictionary::make();
+  script->setObject(Array::make({chain(4), chain(1)}), "1");
+  script->setObject(Array::make({String::make("TERMINATE_PARSER")}), "2");
+  script->setObject(Array::make({chain(2), chain(4)}), "4");
+  EXPECT_TRUE(endlessChains(script).loops.empty());
+}
+
+TEST(EndlessChains, BeforeAListThatEndsTheWalkThroughCount) {
+  const auto script = Dictionary::make();
+  script->setObject(Array::make({chain(1), chain(2)}), "1");
+  script->setObject(Array::make({String::make("TERMINATE_PARSER")}), "2");
+  EXPECT_EQ(endlessChains(script).loops, std::vector<std::string>{"1 -> 1"});
 }
 
 TEST(EndlessChains, ASimpleCommandOfAnOddKeyChainsToItsNumber) {

@@ -89,8 +89,9 @@ Baseline::Entry Baseline::entryOf(const Finding& finding) {
 }
 
 std::string Baseline::nameOf(const std::string& script) const {
-  const auto folder = std::filesystem::absolute(path_).parent_path();
-  return std::filesystem::absolute(script).lexically_proximate(folder).generic_string();
+  const auto folder = std::filesystem::absolute(path_).lexically_normal().parent_path();
+  const auto file = std::filesystem::absolute(script).lexically_normal();
+  return file.lexically_proximate(folder).generic_string();
 }
 
 }  // namespace qz::tools::check

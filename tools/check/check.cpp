@@ -124,6 +124,18 @@ void sortByPlace(std::vector<Finding>& findings, const InputFile& file) {
   });
 }
 
+/// Adds what each move of the paths changes. Findings at one place have one path, which is played
+/// once.
+void playPaths(std::vector<Finding>& findings, const Setting& setting) {
+  const Finding* before = nullptr;
+  for (Finding& finding : findings) {
+    if (finding.path.empty() || finding.path.size() > longestShownPath) continue;
+    finding.played =
+        before && before->path == finding.path ? before->played : playPath(setting, finding.path);
+    before = &finding;
+  }
+}
+
 }  // namespace
 
 std::string resourcesFor(const InputFile& file, const CheckOptions& options) {
@@ -165,9 +177,7 @@ Verdict checkScript(const InputFile& file, const CheckOptions& options,
   applyAllowances(findings, allowances);
   append(findings, std::move(unneeded));
   sortByPlace(findings, file);
-  for (Finding& finding : findings) {
-    if (finding.path.size() <= longestShownPath) finding.played = playPath(setting, finding.path);
-  }
+  playPaths(findings, setting);
   return verdict;
 }
 

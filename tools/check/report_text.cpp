@@ -30,6 +30,17 @@ std::string counted(std::size_t count, const std::string& noun) {
   return std::to_string(count) + " " + (count == 1 ? noun : many);
 }
 
+/// Returns how many columns of the terminal the characters of a line before a position take.
+std::size_t widthBefore(const std::string& line, std::size_t column) {
+  std::size_t bytes = 0;
+  for (std::size_t i = 1; i < column && bytes < line.size(); ++i) {
+    do {
+      ++bytes;
+    } while (bytes < line.size() && (static_cast<unsigned char>(line[bytes]) & 0xC0U) == 0x80U);
+  }
+  return displayWidth(oneLine(line.substr(0, bytes)));
+}
+
 class TextReport {
  public:
   TextReport(const Report& report, bool color, std::ostream& out)
@@ -61,13 +72,13 @@ class TextReport {
     if (!text || text->line > lines_.size()) return;
     const std::string& line = lines_[text->line - 1];
     if (displayWidth(line) > widestLine || line.find('\0') != std::string::npos) return;
-    out_ << "  | " << oneLine(line) << "\n  | " << std::string(text->column - 1, ' ')
+    out_ << "  | " << oneLine(line) << "\n  | " << std::string(widthBefore(line, text->column), ' ')
          << colors_.of(finding.severity) << '^' << colors_.plain() << '\n';
   }
 
   void writePath(const Path& path, std::string_view title) {
     if (path.empty()) return;
-    out_ << "  " << title << ": " << playCommand(report_, path) << '\n';
+    out_ << "  " << title << ": " << oneLine(playCommand(report_, path)) << '\n';
   }
 
   /// Writes the moves of a path, unless an earlier finding has the same path.
@@ -81,9 +92,9 @@ class TextReport {
   }
 
   void writeMove(const PlayedMove& move) {
-    out_ << "    " << move.words << ": ";
+    out_ << "    " << oneLine(move.words) << ": ";
     for (std::size_t i = 0; i < move.changes.size(); ++i) {
-      out_ << (i == 0 ? "" : "; ") << move.changes[i];
+      out_ << (i == 0 ? "" : "; ") << oneLine(move.changes[i]);
     }
     out_ << (move.changes.empty() ? "nothing changes" : "") << '\n';
   }

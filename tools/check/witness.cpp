@@ -146,7 +146,7 @@ class Witness {
     const auto played = playPath(setting_, finding_.path);
     for (std::size_t i = 0; i < played.size(); ++i) {
       if (played[i].isEndless) {
-        out_ << "# The next move runs lists without end: " << played[i].words << '\n';
+        out_ << "ignore log\n# The next move runs lists without end: " << played[i].words << '\n';
         return;  // what the window shows then is not known
       }
       writeMove(finding_.path[i]);
