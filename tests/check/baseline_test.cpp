@@ -78,6 +78,18 @@ TEST_F(Baselines, TellTheCodesApart) {
   EXPECT_EQ(Baseline::read("known").takeBack("intro.plist", findings), 0U);
 }
 
+TEST_F(Baselines, TellTheExpectationsApart) {
+  Finding known = findingOf("expectation", "a message");
+  known.expectation = "never hidden 2";
+  writeBaseline({known});
+  Finding other = known;
+  other.expectation = "never hidden 3";
+  std::vector<Finding> findings{other, known};
+  EXPECT_EQ(Baseline::read("known").takeBack("intro.plist", findings), 1U);
+  ASSERT_EQ(findings.size(), 1U);
+  EXPECT_EQ(findings[0].expectation, "never hidden 3");
+}
+
 TEST_F(Baselines, CountFindingsThatAreAlike) {
   writeBaseline({findingIn("1"), findingIn("1")});
   std::vector<Finding> findings{findingIn("1"), findingIn("1"), findingIn("1")};

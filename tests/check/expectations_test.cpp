@@ -246,6 +246,10 @@ TEST_F(Expectations, AreRefusedWithLineAndWhatWasExpected) {
   }
 }
 
+TEST_F(Expectations, ThatNameATagOfNoControlAreRefused) {
+  EXPECT_EQ(refusal("never hidden 77\n"), "check.expect:1: no control ever has the tag 77");
+}
+
 TEST_F(Expectations, AreNamedAsTheFileHasThem) {
   const Verdict verdict = check("never text 5 \"Two, three\"  # a comment\n");
   const std::string message = failuresIn(verdict).at(0).message;

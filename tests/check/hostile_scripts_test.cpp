@@ -147,17 +147,29 @@ TEST_F(HostileScripts, HaveListsOfAHundredThousandElements) {
   EXPECT_EQ(verdict.findings[0].element, 99'999U);
 }
 
-TEST_F(HostileScripts, HaveLongChainsThatEnd) {
-  std::string script = "{ 3000 = (TERMINATE_PARSER);";
-  for (int tag = 1; tag < 3000; ++tag) {
+/// Returns a script whose lists run one inside the other; the last one ends the walk-through.
+std::string chainOf(int lists) {
+  std::string script = "{ " + std::to_string(lists) + " = (TERMINATE_PARSER);";
+  for (int tag = 1; tag < lists; ++tag) {
     script +=
         std::to_string(tag) + " = ((PROCESS_COMMANDS_FOR_ID, " + std::to_string(tag + 1) + "));\n";
   }
-  directory_.write("script.plist", script + "}");
+  return script + "}";
+}
+
+TEST_F(HostileScripts, HaveLongChainsThatEnd) {
+  directory_.write("script.plist", chainOf(1500));
   directory_.write("window.plist", "( " + buttonEntry(2) + " )");
   const Verdict verdict = checkFolder("");
   EXPECT_TRUE(verdict.explored.complete);
   EXPECT_EQ(codesOf(verdict), std::set<std::string>()) << messagesOf(verdict);
+}
+
+TEST_F(HostileScripts, HaveChainsThatOverflowTheStack) {
+  directory_.write("script.plist", chainOf(30'000));
+  directory_.write("window.plist", "( " + buttonEntry(2) + " )");
+  const Verdict verdict = checkFolder("");
+  EXPECT_TRUE(codesOf(verdict).contains("endless-chain")) << messagesOf(verdict);
 }
 
 TEST_F(HostileScripts, HaveNothingButNoise) {

@@ -31,7 +31,8 @@ Baseline Baseline::read(const std::string& path) {
     if (root.at("version") != version) throw std::runtime_error("another version");
     for (const auto& [script, entries] : root.at("scripts").items()) {
       for (const Json& each : entries) {
-        const Entry entry{each.at("code"), each.value("list", ""), each.value("tag", "")};
+        const Entry entry{each.at("code"), each.value("list", ""), each.value("tag", ""),
+                          each.value("expectation", "")};
         baseline.scripts_[script][entry] = {each.value("count", std::size_t{1}),
                                             each.value("message", "")};
       }
@@ -74,6 +75,7 @@ void Baseline::write() const {
       Json each{{"code", entry.code}};
       if (!entry.list.empty()) each["list"] = entry.list;
       if (!entry.tag.empty()) each["tag"] = entry.tag;
+      if (!entry.expectation.empty()) each["expectation"] = entry.expectation;
       if (known.count > 1) each["count"] = known.count;
       each["message"] = known.message;
       list.push_back(std::move(each));
@@ -85,7 +87,7 @@ void Baseline::write() const {
 
 Baseline::Entry Baseline::entryOf(const Finding& finding) {
   return {finding.code, finding.list.value_or(""),
-          finding.tag ? std::to_string(*finding.tag) : std::string()};
+          finding.tag ? std::to_string(*finding.tag) : std::string(), finding.expectation};
 }
 
 std::string Baseline::nameOf(const std::string& script) const {

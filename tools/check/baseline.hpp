@@ -18,7 +18,8 @@ class Baseline {
   static Baseline empty(const std::string& path) { return Baseline(path); }
 
   /// Removes the findings of a script that the baseline has. Returns how many were removed. A
-  /// finding is known again by its code, list and tag, however the lines of the script have moved;
+  /// finding is known again by its code, list, tag and
+  /// expectation, however the lines of the script have moved;
   /// each entry takes back one finding.
   std::size_t takeBack(const std::string& script, std::vector<Finding>& findings) const;
   /// Replaces the entries of a script by its findings.
@@ -32,6 +33,7 @@ class Baseline {
     std::string code;
     std::string list;  // key, or empty
     std::string tag;   // or empty
+    std::string expectation;
     friend auto operator<=>(const Entry&, const Entry&) = default;
   };
   struct Known {

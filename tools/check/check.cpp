@@ -3,6 +3,7 @@
 
 #include <algorithm>
 #include <filesystem>
+#include <set>
 
 #include "text/number_conversion.hpp"
 #include "tools/check/conclusions.hpp"
@@ -63,6 +64,23 @@ std::vector<Expectation> expectationsFor(const InputFile& file, const Script& sc
                                          const CheckOptions& options) {
   const auto path = options.expectations ? options.expectations : pathBeside(file, "check.expect");
   return path ? readExpectations(*path, script) : std::vector<Expectation>();
+}
+
+/// Throws a Failure for a tag that no control ever has: such an expectation says nothing.
+void requireTags(const std::vector<Expectation>& expectations, const Setting& setting) {
+  std::set<Tag> tags(setting.ownTags.begin(), setting.ownTags.end());
+  const auto given = setting.script.newTags();
+  tags.insert(given.begin(), given.end());
+  const auto require = [&](const Condition& condition, const Expectation& expectation) {
+    if (!isAboutControl(condition) || tags.contains(condition.tag)) return;
+    throw Failure(ExitStatus::badInput, expectation.place.text() +
+                                            ": no control ever has the tag " +
+                                            std::to_string(condition.tag));
+  };
+  for (const Expectation& each : expectations) {
+    require(each.condition, each);
+    if (each.consequence) require(*each.consequence, each);
+  }
 }
 
 /// Lets the exploration keep what the expectations need.
@@ -156,6 +174,7 @@ Verdict checkScript(const InputFile& file, const CheckOptions& options,
 
   const auto plan = walkthrough::planStage(options.stage, script.dictionary(), file.path());
   Setting setting = settingOf(script, plan, resources);
+  requireTags(expectations, setting);
   watchFor(expectations, setting);
   const auto explored =
       explore(setting, startKeysOf(file, script, options), options.limits, options.threads, hooks);

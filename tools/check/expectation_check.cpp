@@ -114,6 +114,7 @@ std::vector<Finding> ExpectationCheck::findings() {
     auto finding = judge(expectations_[i], evidence_[i]);
     if (!finding) continue;
     finding->elsewhere = expectations_[i].place;
+    finding->expectation = expectations_[i].words;
     findings.push_back(*std::move(finding));
     ++counts_.fail;
   }

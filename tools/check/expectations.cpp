@@ -169,6 +169,11 @@ std::vector<Expectation> readExpectations(const std::string& path, const Script&
   return expectations;
 }
 
+bool isAboutControl(const Condition& condition) {
+  return condition.kind != Kind::end && condition.kind != Kind::listRan &&
+         condition.kind != Kind::timer;
+}
+
 bool compareLooks(const std::vector<Expectation>& expectations) {
   return std::any_of(expectations.begin(), expectations.end(), [](const Expectation& each) {
     return each.consequence && isLook(each.condition) && isLook(*each.consequence);

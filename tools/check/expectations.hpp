@@ -58,6 +58,9 @@ struct Expectation {
 /// for a line that is not one, or that names a list that the script has not.
 std::vector<Expectation> readExpectations(const std::string& path, const Script& script);
 
+/// Whether the condition names a control by its tag.
+bool isAboutControl(const Condition& condition);
+
 /// Whether some expectation compares what two controls show.
 bool compareLooks(const std::vector<Expectation>& expectations);
 

@@ -52,7 +52,8 @@ void Exploration::run(const ExplorationLimits& limits, unsigned threads, Explora
   };
   while (next < visits_.size()) {
     if (isOverLimit()) return;
-    expansions.resize(std::min(roundSize(), visits_.size() - next));
+    const std::size_t left = std::max<std::size_t>(most - set_.count(), worthThreads);
+    expansions.resize(std::min({roundSize(), visits_.size() - next, left}));
     expandAll(expansions, next, threads);
     for (const Expansion& expansion : expansions) {
       if (set_.count() >= most) break;

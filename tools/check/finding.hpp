@@ -54,7 +54,8 @@ struct Finding {
   toolkit::ValueRef<> where{};           ///< the value in the script, for its place; may be absent
   std::optional<FileLine> elsewhere{};   ///< the place of a finding that is not in the script
   std::optional<toolkit::Tag> tag{};
-  Path path{};  ///< the shortest way to see it; empty for what is read off the script
+  std::string expectation{};  ///< as its file has it; empty for another code
+  Path path{};                ///< the shortest way to see it; empty for what is read off the script
   std::vector<PlayedMove> played{};  ///< the moves of `path`, and what each changed
   Path otherPath{};                  ///< of `looks-differ`: the way to the other look
   std::size_t places = 0;            ///< how many places show it

@@ -3,6 +3,8 @@
 
 #include <algorithm>
 
+#include "tools/check/endless_run.hpp"
+
 namespace qz::tools::check {
 namespace {
 
@@ -137,7 +139,7 @@ void Recorder::listWillRun(const Value& list, const ObjectId& id) {
   if (!isRecording_) return;
   const Tag tag = id->longValue();
   const auto running = script_.runningList(list, tag);
-  if (running) throwIfRunning(*running);
+  throwIfEndless(running);
   running_.push_back({.list = running, .id = tag});
   if (!running) return;
   ranList_ = true;
@@ -150,16 +152,17 @@ void Recorder::listWillRun(const Value& list, const ObjectId& id) {
 }
 
 // A list that begins inside itself does so again and again: scripts have no conditions.
-void Recorder::throwIfRunning(std::size_t list) {
+void Recorder::throwIfEndless(const std::optional<std::size_t>& list) {
   const auto outer = std::find_if(running_.begin(), running_.end(),
-                                  [&](const Running& each) { return each.list == list; });
-  if (outer == running_.end()) return;
+                                  [&](const Running& each) { return list && each.list == list; });
+  if (outer == running_.end() && running_.size() < deepestNesting) return;
   std::string loop;
   for (auto each = outer; each != running_.end(); ++each) {
     if (each->list) loop += script_.lists()[*each->list].key + " -> ";
   }
   note(FactKind::endlessChain, static_cast<Subject>(running_.back().element),
-       loop + script_.lists()[list].key);
+       outer == running_.end() ? std::to_string(deepestNesting) + " lists run inside each other"
+                               : loop + script_.lists()[*list].key);
   throw EndlessRun();
 }
 

@@ -39,9 +39,6 @@ class Surroundings {
   virtual drivers::ViewKind kindOf(const toolkit::Ref<toolkit::View>& control) const = 0;
 };
 
-/// Thrown out of a list that would run itself without end: such a run overflows the stack.
-struct EndlessRun {};
-
 class Recorder final : public Observer {
  public:
   /// Notes of the watched lists, by index, whether a move ran them. All must outlive the recorder.
@@ -103,7 +100,7 @@ class Recorder final : public Observer {
 
   void noteOnce(FactKind kind, std::size_t subject);
   void noteTarget(const Running& running);
-  void throwIfRunning(std::size_t list);
+  void throwIfEndless(const std::optional<std::size_t>& list);
   void forget(std::string_view key);
 
   const Script& script_;

@@ -6,6 +6,7 @@
 
 #include "drivers/memory/memory_driver.hpp"
 #include "qz/toolkit/exception.hpp"
+#include "tools/check/endless_run.hpp"
 #include "tools/support/text_layout.hpp"
 
 namespace qz::tools::check {
@@ -25,15 +26,15 @@ class Replay {
   explicit Replay(const Setting& setting) : setting_(setting) {
     driver_.setResourcePath(setting.resources);
     stage_.emplace(driver_, setting.plan);
+    stage_->engine().setObserver(std::make_shared<EndlessGuard>());
     stage_->engine().setPlistDictionary(
         setting.script.dictionary()->copy(toolkit::Mutability::changeable));
   }
 
-  /// What became of a move. A move that would never end is not made.
+  /// What became of a move. After one that would never end, the window shows nothing of use.
   enum class Outcome : std::uint8_t { made, raised, endless };
 
   Outcome make(const Step& step) {
-    if (runsWithoutEnd(step)) return Outcome::endless;
     try {
       if (const auto* start = std::get_if<StartMove>(&step)) {
         stage_->load(noFile, start->key);
@@ -42,6 +43,8 @@ class Replay {
       } else {
         driver_.advance(std::get<WaitMove>(step).seconds);
       }
+    } catch (const EndlessRun&) {
+      return Outcome::endless;
     } catch (const toolkit::Exception&) {
       return Outcome::raised;  // the picture shows what was done until then
     }
@@ -53,17 +56,6 @@ class Replay {
  private:
   const toolkit::Subviews& controls() {
     return stage_->engine().tutorialWindow()->contentView()->subviews();
-  }
-
-  bool runsWithoutEnd(const Step& step) {
-    const auto& loops = setting_.chains.loopOf;
-    if (loops.empty()) return false;
-    if (const auto* start = std::get_if<StartMove>(&step)) return loops.contains(start->key);
-    if (const auto* press = std::get_if<PressMove>(&step)) {
-      return loops.contains(std::to_string(press->tag));
-    }
-    const auto timers = picture().timers;
-    return !timers.empty() && loops.contains(timers.front().key);
   }
 
   const Setting& setting_;

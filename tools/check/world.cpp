@@ -64,7 +64,6 @@ Setting settingOf(const Script& script, const walkthrough::StagePlan& plan, std:
   Setting setting{.script = script,
                   .plan = plan,
                   .resources = std::move(resources),
-                  .chains = endlessChains(script.dictionary()),
                   .flashKeys = flashKeys(script)};
   for (const auto& view : controlsOf(stage.engine())) {
     setting.ownTags.push_back(view->tag());

@@ -11,7 +11,6 @@
 #include <vector>
 
 #include "drivers/memory/memory_driver.hpp"
-#include "engine/endless_chains.hpp"
 #include "tools/check/looks.hpp"
 #include "tools/check/place.hpp"
 #include "tools/check/recorder.hpp"
@@ -28,7 +27,6 @@ struct Setting {
   const Script& script;
   const walkthrough::StagePlan& plan;
   std::string resources;            ///< the directory of the images
-  EndlessChains chains;             ///< of the script
   std::vector<Tag> ownTags{};       ///< of the window's controls, before the start
   std::vector<SavedView> before{};  ///< the window's controls, before the start
   std::vector<drivers::ViewKind> kinds{};
