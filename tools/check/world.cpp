@@ -9,6 +9,7 @@
 
 #include "qz/toolkit/exception.hpp"
 #include "toolkit/memory/parts.hpp"
+#include "tools/check/endless_run.hpp"
 
 namespace qz::tools::check {
 namespace {
