@@ -101,7 +101,7 @@ TEST_F(Expectations, CanReach) {
   expectToHold("can reach the end");
   expectToHold("can reach hidden 9");
   expectToFail("can reach list 90", "");
-  expectToFail("can reach enabled 77", "");
+  expectToFail("can reach text 5 None", "");
 }
 
 TEST_F(Expectations, CanReachSaysHowManyPlacesItLookedThrough) {

@@ -71,6 +71,22 @@ TEST_F(PlayCommand, ABadFileIsOneLine) {
   EXPECT_EQ(start.status, 1);
 }
 
+TEST_F(PlayCommand, SaysWhatCanBeReadToBeWrong) {
+  directory_.write("wrong.plist",
+                   "{ 1 = ((SHOW_OBJECT_WITH_ID, 5), SHOW_OBJEC); 2 = (TERMINATE_PARSER); }");
+  const auto result =
+      run(playCommand, {"play", "wrong.plist", "--toolkit", "memory", "--press", "2"});
+  EXPECT_EQ(result.status, 0);
+  EXPECT_NE(result.err.find("wrong.plist:1:34: error: no command is called “SHOW_OBJEC”"),
+            std::string::npos)
+      << result.err;
+  EXPECT_NE(result.err.find("[unknown-command]\n"), std::string::npos) << result.err;
+  const auto without = run(
+      playCommand, {"play", "wrong.plist", "--no-check", "--toolkit", "memory", "--press", "2"});
+  EXPECT_EQ(without.err.find("error:"), std::string::npos) << without.err;
+  EXPECT_EQ(without.out, result.out);
+}
+
 TEST_F(PlayCommand, StepsKeepTheOrderOfTheCommandLine) {
   const Result result = run({"play", "--press", "2", "1", "--advance", "0.5", "script.plist",
                              "--press", "2", "--advance=1", "--toolkit", "memory"});

@@ -50,6 +50,21 @@ class ScenarioCommand : public testing::Test {
   play::WorkingDirectory directory_;
 };
 
+TEST_F(ScenarioCommand, SaysWhatCanBeReadToBeWrongInScriptFiles) {
+  write("wrong.plist", "{ 1 = (SHOW_OBJEC); }");
+  write("a.walk", "copy s.plist wrong.plist\nwindow w\nengine w\nload s.plist from 1\n");
+  const auto result = runTest({"test", "a.walk"});
+  EXPECT_EQ(result.err.find("wrong.plist:1:8: error: no command is called “SHOW_OBJEC”"), 0U)
+      << result.err;
+  EXPECT_EQ(runTest({"test", "a.walk", "--no-check"}).err, "");
+}
+
+TEST_F(ScenarioCommand, IgnoresMistakesOfScriptsInScenarios) {
+  write("a.walk",
+        "script s.plist {\"1\": [\"SHOW_OBJEC\"]}\nwindow w\nengine w\nload s.plist from 1\n");
+  EXPECT_EQ(runTest({"test", "a.walk"}).err, "");
+}
+
 TEST_F(ScenarioCommand, PrintsFailuresAndCounts) {
   const auto result = runTest({"test", data + "failing.walk"});
   EXPECT_EQ(result.status, 1);
