@@ -28,7 +28,7 @@ struct KindRow {
 };
 
 // "the end" has two words and no operand, so it is not a row.
-constexpr KindRow kinds[] = {
+constexpr KindRow kindRows[] = {
     {"list", Kind::listRan, Operands::key},
     {"hidden", Kind::hidden, Operands::tag},
     {"shown", Kind::shown, Operands::tag},
@@ -101,12 +101,12 @@ class Parser {
   }
 
   const KindRow* takeKind() {
-    const auto* const row = std::find_if(std::begin(kinds), std::end(kinds),
+    const auto* const row = std::find_if(std::begin(kindRows), std::end(kindRows),
                                          [&](const KindRow& each) { return takes(each.word); });
-    if (row != std::end(kinds)) return row;
+    if (row != std::end(kindRows)) return row;
     std::vector<std::string> words{"the end"};
     std::vector<std::string_view> candidates;
-    for (const KindRow& each : kinds) {
+    for (const KindRow& each : kindRows) {
       words.emplace_back(each.word);
       candidates.push_back(each.word);
     }
@@ -155,7 +155,7 @@ class Parser {
 };
 
 bool isLook(const Condition& condition) {
-  return std::any_of(std::begin(kinds), std::end(kinds),
+  return std::any_of(std::begin(kindRows), std::end(kindRows),
                      [&](const KindRow& row) { return row.kind == condition.kind && row.isLook; });
 }
 

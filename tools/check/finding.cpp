@@ -12,7 +12,7 @@ constexpr std::string_view severityNames[] = {"note", "warning", "error"};
 
 using enum Severity;
 
-constexpr Code table[] = {
+constexpr Code codeTable[] = {
     {"not-a-list", error, "the value under a key is not an array"},
     {"odd-key", warning, "a key that no press and no timer finds"},
     {"unknown-command", error, "no command has this name in this form"},
@@ -59,12 +59,12 @@ std::optional<Severity> severityNamed(std::string_view name) {
   return static_cast<Severity>(found - std::begin(severityNames));
 }
 
-std::span<const Code> codes() { return table; }
+std::span<const Code> codes() { return codeTable; }
 
 const Code* codeNamed(std::string_view name) {
-  const auto* const found = std::find_if(std::begin(table), std::end(table),
+  const auto* const found = std::find_if(std::begin(codeTable), std::end(codeTable),
                                          [&](const Code& code) { return code.name == name; });
-  return found == std::end(table) ? nullptr : found;
+  return found == std::end(codeTable) ? nullptr : found;
 }
 
 Finding findingOf(std::string_view code, std::string message, std::string help) {

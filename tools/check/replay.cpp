@@ -23,7 +23,7 @@ std::string number(double value) {
 
 class Replay {
  public:
-  explicit Replay(const Setting& setting) : setting_(setting) {
+  explicit Replay(const Setting& setting) {
     driver_.setResourcePath(setting.resources);
     stage_.emplace(driver_, setting.plan);
     stage_->engine().setObserver(std::make_shared<EndlessGuard>());
@@ -58,7 +58,6 @@ class Replay {
     return stage_->engine().tutorialWindow()->contentView()->subviews();
   }
 
-  const Setting& setting_;
   drivers::MemoryDriver driver_;
   std::optional<walkthrough::Stage> stage_;
 };
