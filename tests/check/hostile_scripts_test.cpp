@@ -158,7 +158,7 @@ std::string chainOf(int lists) {
 }
 
 TEST_F(HostileScripts, HaveLongChainsThatEnd) {
-  directory_.write("script.plist", chainOf(1500));
+  directory_.write("script.plist", chainOf(900));
   directory_.write("window.plist", "( " + buttonEntry(2) + " )");
   const Verdict verdict = checkFolder("");
   EXPECT_TRUE(verdict.explored.complete);
