@@ -68,7 +68,7 @@ void requireAllPlaces(const Exploration& exploration, std::size_t buttons) {
           "other presses than expected");
 }
 
-/// Draws all conclusions from an exploration, of which the only one is that there is no end.
+/// Draws all conclusions from an exploration. Requires that the only finding is `no-end`.
 void conclude(Exploration& exploration, unsigned threads) {
   const auto found = tools::check::conclude(exploration, {}, false, threads);
   require(found.size() == 1 && found.front().code == "no-end", "other findings than expected");

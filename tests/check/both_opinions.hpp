@@ -167,4 +167,39 @@ inline std::string wordsOf(const Findings& findings) {
   return words.str();
 }
 
+struct BothOpinions {
+  CheckedScript checked;
+  Findings explored;  // the check's findings that need exploring
+  Findings all;       // and with those that are read off the script
+  naive::Exploration theirs;
+  Findings others;  // those of the second opinion that the check reports as well
+
+  /// Explores a script of at most `mostPlaces` places; with more, `theirs` is not complete.
+  BothOpinions(const naive::StagedScript& staged, std::size_t mostPlaces)
+      : checked(staged, mostPlaces + 1),  // at its limit an exploration is not complete
+        explored(inTheSameWords(checked.exploredFindings())),
+        all(inTheSameWords(checked.readFindings())),
+        theirs(naive::explore(staged.script, staged.host, {checked.startKey()}, mostPlaces,
+                              staged.resources)),
+        others(comparable(theirs.findings)) {
+    all.insert(all.end(), explored.begin(), explored.end());
+  }
+
+  bool agree() const {
+    return selfCheck(checked.exploration()) == std::nullopt && checked.places() == theirs.places &&
+           checked.exploration().presses() == theirs.presses &&
+           checked.exploration().waits() == theirs.waits && explored == others;
+  }
+  std::string words() const {
+    const auto& exploration = checked.exploration();
+    return "check: " + std::to_string(exploration.places()) + " places, " +
+           std::to_string(exploration.presses()) + " presses, " +
+           std::to_string(exploration.waits()) + " waits; " +
+           selfCheck(exploration).value_or("self-check passed") + "\n" + wordsOf(explored) +
+           "second opinion: " + std::to_string(theirs.places.size()) + " places, " +
+           std::to_string(theirs.presses) + " presses, " + std::to_string(theirs.waits) +
+           " waits\n" + wordsOf(others);
+  }
+};
+
 }  // namespace qz::tools::check::opinions

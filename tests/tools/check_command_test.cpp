@@ -240,6 +240,12 @@ TEST_F(CheckCommand, SharesAllowancesInADirectory) {
   EXPECT_TRUE(contains(result.out, "check.allow:2: warning: ")) << result.out;
 }
 
+TEST_F(CheckCommand, SharesAllowancesHoweverTheDirectoryIsNamed) {
+  directory_.write("check.allow", "never-runs\n");
+  const Result result = checkInWindow({"clean.plist", "./warning.plist"});
+  EXPECT_EQ(result.status, 0) << result.out;
+}
+
 TEST_F(CheckCommand, FailsOnlyOnWhatTheBaselineDoesNotHave) {
   const Result first = checkInWindow({"warning.plist", "--baseline", "known", "--update-baseline"});
   EXPECT_EQ(first.status, 0) << first.out << first.err;

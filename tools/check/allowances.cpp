@@ -78,24 +78,27 @@ std::vector<Finding> unneededAllowances(const std::vector<Finding>& findings,
 }
 
 void mergeUnneeded(const std::vector<std::pair<std::string, std::vector<Finding>*>>& scripts) {
-  const auto directory = [](const std::string& path) {
-    return std::filesystem::path(path).parent_path();
+  const auto plain = [](const std::string& path) {
+    return std::filesystem::absolute(path).lexically_normal();
+  };
+  const auto lineOf = [&](const Finding& unneeded) {
+    return std::pair(plain(unneeded.elsewhere->path), unneeded.elsewhere->line);
   };
   std::map<std::filesystem::path, std::size_t> scriptsIn;
-  std::map<std::string, std::size_t> reports;  // by the line of the allowance
+  std::map<std::pair<std::filesystem::path, std::size_t>, std::size_t> reports;  // by allowance
   const auto isUnneeded = [](const Finding& each) { return each.code == "unneeded-allowance"; };
   for (const auto& [path, findings] : scripts) {
-    ++scriptsIn[directory(path)];
+    ++scriptsIn[plain(path).parent_path()];
     for (const Finding& each : *findings) {
-      if (isUnneeded(each)) ++reports[each.elsewhere->text()];
+      if (isUnneeded(each)) ++reports[lineOf(each)];
     }
   }
-  std::set<std::string> kept;
+  std::set<std::pair<std::filesystem::path, std::size_t>> kept;
   for (const auto& [path, findings] : scripts) {
-    const std::size_t all = scriptsIn[directory(path)];
+    const std::size_t all = scriptsIn[plain(path).parent_path()];
     std::erase_if(*findings, [&](const Finding& each) {
       if (!isUnneeded(each)) return false;
-      const std::string line = each.elsewhere->text();
+      const auto line = lineOf(each);
       return reports[line] < all || !kept.insert(line).second;
     });
   }

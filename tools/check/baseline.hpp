@@ -18,9 +18,8 @@ class Baseline {
   static Baseline empty(const std::string& path) { return Baseline(path); }
 
   /// Removes the findings of a script that the baseline has. Returns how many were removed. A
-  /// finding is known again by its code, list, tag and
-  /// expectation, however the lines of the script have moved;
-  /// each entry takes back one finding.
+  /// finding is recognised by its code, list, tag and expectation, even if the lines of the script
+  /// have moved. Each entry takes back one finding.
   std::size_t takeBack(const std::string& script, std::vector<Finding>& findings) const;
   /// Replaces the entries of a script by its findings.
   void replace(const std::string& script, const std::vector<Finding>& findings);
@@ -31,9 +30,9 @@ class Baseline {
   /// What a finding is known by.
   struct Entry {
     std::string code;
-    std::string list;  // key, or empty
-    std::string tag;   // or empty
-    std::string expectation;
+    std::string list;         // key, or empty
+    std::string tag;          // or empty
+    std::string expectation;  // or empty
     friend auto operator<=>(const Entry&, const Entry&) = default;
   };
   struct Known {

@@ -5,7 +5,7 @@
 #include <filesystem>
 #include <set>
 
-#include "text/number_conversion.hpp"
+#include "engine/tag_key.hpp"
 #include "tools/check/conclusions.hpp"
 #include "tools/check/look_conclusions.hpp"
 #include "tools/check/reading.hpp"
@@ -32,14 +32,8 @@ std::vector<std::string> startKeysOf(const InputFile& file, const Script& script
     }
     return options.startKeys;
   }
-  // As the engine does: the smallest key as a number, then the list under its decimal form.
-  std::optional<std::int32_t> smallest;
-  for (const std::string& key : script.dictionary()->allKeys()) {
-    const std::int32_t number = text::intValueOf(key);
-    if (!smallest || number < *smallest) smallest = number;
-  }
-  if (!smallest) return {};
-  return {std::to_string(*smallest)};
+  const auto smallest = smallestTagKey(*script.dictionary());
+  return smallest ? std::vector{*smallest} : std::vector<std::string>();
 }
 
 constexpr std::size_t longestShownPath = 100;  // moves

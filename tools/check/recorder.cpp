@@ -93,12 +93,12 @@ void Recorder::end(bool isOver) {
   // Those that never fire have no order, and are sorted by key.
   std::stable_sort(timers_.begin(), timers_.end(), [](const Timer& a, const Timer& b) {
     if (a.timer.seconds != b.timer.seconds) return a.timer.seconds < b.timer.seconds;
-    return a.timer.seconds == never && a.timer.key < b.timer.key;
+    return a.timer.seconds == neverFires && a.timer.key < b.timer.key;
   });
   if (isOver) return;
   bool isFirst = true;
   for (const Timer& timer : timers_) {
-    if (timer.timer.seconds != never && timer.element) {
+    if (timer.timer.seconds != neverFires && timer.element) {
       noteOnce(isFirst ? FactKind::timerFires : FactKind::timerBeaten, *timer.element);
     }
     isFirst = false;
@@ -258,12 +258,12 @@ void Recorder::timerSet(std::string_view key, double seconds) {
   }
   forget(key);
   std::optional<std::size_t> element;
-  if (seconds > longestDelay) seconds = never;
+  if (seconds > longestDelay) seconds = neverFires;
   const Running* const running = running_.empty() ? nullptr : &running_.back();
   if (running && running->list) {
     element = running->element;
-    if (hasParameter(*running->command->command, ParameterType::anything)) seconds = never;
-    if (seconds != never) noteOnce(FactKind::timerStarted, *element);
+    if (hasParameter(*running->command->command, ParameterType::anything)) seconds = neverFires;
+    if (seconds != neverFires) noteOnce(FactKind::timerStarted, *element);
   }
   timers_.push_back({{std::string(key), seconds}, element});
 }

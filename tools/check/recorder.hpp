@@ -18,7 +18,7 @@ namespace qz::tools::check {
 
 /// What stands for the time left of a timer that fires in no user's lifetime: its delay was
 /// negative or an address, and is millions of years or more.
-inline constexpr double never = std::numeric_limits<double>::infinity();
+inline constexpr double neverFires = std::numeric_limits<double>::infinity();
 
 /// What the recorder asks of the world in which the engine works.
 class Surroundings {

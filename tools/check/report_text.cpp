@@ -30,15 +30,9 @@ std::string counted(std::size_t count, const std::string& noun) {
   return std::to_string(count) + " " + (count == 1 ? noun : many);
 }
 
-/// Returns how many columns of the terminal the characters of a line before a position take.
-std::size_t widthBefore(const std::string& line, std::size_t column) {
-  std::size_t bytes = 0;
-  for (std::size_t i = 1; i < column && bytes < line.size(); ++i) {
-    do {
-      ++bytes;
-    } while (bytes < line.size() && (static_cast<unsigned char>(line[bytes]) & 0xC0U) == 0x80U);
-  }
-  return displayWidth(oneLine(line.substr(0, bytes)));
+/// Returns how many columns of the terminal come before a position in a line.
+std::size_t widthBefore(const std::string& line, const toolkit::TextPosition& position) {
+  return displayWidth(oneLine(firstCharacters(line, position.column - 1)));
 }
 
 class TextReport {
@@ -72,7 +66,7 @@ class TextReport {
     if (!text || text->line > lines_.size()) return;
     const std::string& line = lines_[text->line - 1];
     if (displayWidth(line) > widestLine || line.find('\0') != std::string::npos) return;
-    out_ << "  | " << oneLine(line) << "\n  | " << std::string(widthBefore(line, text->column), ' ')
+    out_ << "  | " << oneLine(line) << "\n  | " << std::string(widthBefore(line, *text), ' ')
          << colors_.of(finding.severity) << '^' << colors_.plain() << '\n';
   }
 

@@ -157,7 +157,7 @@ std::vector<Move> World::moves(const std::uint8_t* place, const PendingTimers& p
     const ControlState state = format_.control(place, i);
     if (!state.hidden && state.enabled) moves.push_back(static_cast<Move>(i));
   }
-  if (!pending.empty() && pending.front().seconds != never) moves.push_back(waitMove);
+  if (!pending.empty() && pending.front().seconds != neverFires) moves.push_back(waitMove);
   return moves;
 }
 

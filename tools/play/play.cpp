@@ -9,6 +9,7 @@
 #include <optional>
 #include <ostream>
 
+#include "engine/tag_key.hpp"
 #include "qz/property_list/collections.hpp"
 #include "text/number_conversion.hpp"
 #include "tools/play/pressing.hpp"
@@ -53,8 +54,7 @@ void checkStart(const InputFile& file, std::string key) {
   if (script->allKeys().empty()) {
     file.fail(script, "expected at least one list, found an empty script");
   }
-  // As the engine does: the smallest tag as a number, then the list under its decimal form.
-  if (key.empty()) key = std::to_string(text::intValueOf(sortedKeys(script).front()));
+  if (key.empty()) key = *smallestTagKey(*script);
   const auto list = script->objectForKey(key);
   if (!list) {
     throw Failure(ExitStatus::failed, file.path() + ": no list under the start key " + quote(key) +

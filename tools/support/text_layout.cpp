@@ -157,13 +157,14 @@ std::string quote(std::string_view text) { return "“" + oneLine(text) + "”";
 
 std::string quoteStart(std::string_view text) {
   constexpr std::size_t longest = 60;
-  if (text.size() <= longest) return quote(text);
-  std::size_t end = longest;
-  const auto isInside = [&](std::size_t at) {
-    return (static_cast<unsigned char>(text[at]) & 0xc0U) == 0x80U;
-  };
-  while (end > 0 && isInside(end)) --end;  // at the beginning of a character
-  return quote(std::string(text.substr(0, end)) + "…");
+  const auto start = firstCharacters(text, longest);
+  return quote(start.size() == text.size() ? std::string(text) : std::string(start) + "…");
+}
+
+std::string_view firstCharacters(std::string_view text, std::size_t count) {
+  std::size_t end = 0;
+  for (; count > 0 && end < text.size(); --count) end += firstCharacter(text.substr(end)).length;
+  return text.substr(0, end);
 }
 
 std::vector<std::string> wrap(std::string_view text, std::size_t width) {

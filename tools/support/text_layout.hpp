@@ -27,8 +27,12 @@ std::string oneLine(std::string_view text);
 /// The same on one line, between “ and ”.
 std::string quote(std::string_view text);
 
-/// The same; of a text longer than 60 bytes only the beginning, with an ellipsis behind it.
+/// The same; only the beginning of a text with more than 60 characters, and an ellipsis.
 std::string quoteStart(std::string_view text);
+
+/// Returns the beginning of `text`: at most `count` characters. Each byte of invalid UTF-8 counts
+/// as one.
+std::string_view firstCharacters(std::string_view text, std::size_t count);
 
 /// Breaks `text` into lines of at most `width` columns (1 or more): at line ends, else at spaces,
 /// else anywhere. Returns at least one line.
