@@ -3,20 +3,24 @@
 #pragma once
 
 #include <cstdint>
+#include <optional>
 #include <vector>
 
 #include "tools/check/exploration.hpp"
 
 namespace qz::tools::check {
 
+struct Exploration::Found {
+  Arrival arrival;
+  PendingTimers timers;
+  std::size_t firstFact = 0;             // among those of the expansion
+  std::optional<std::uint64_t> hash{};   // of the place; absent if its timers have no number yet
+  std::optional<std::uint32_t> place{};  // its number, if it was known before
+  bool isNews = true;                    // the visit adds something to what was known before
+};
+
 struct Exploration::Expansion {
   static constexpr std::size_t largestRound = 4096;  // visits that are expanded together
-
-  struct Found {
-    Arrival arrival;
-    PendingTimers timers;
-    std::size_t firstFact = 0;
-  };
 
   std::uint32_t visit = 0;
   std::vector<Found> found;

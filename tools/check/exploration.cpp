@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
-// Visits are expanded in rounds: any number of worlds make the moves, then what they found is added
-// in the order of the visits. So the result does not depend on the number of threads.
+// Visits are expanded in rounds: any number of worlds make the moves and look up what is known of
+// where they lead, then what they found is added in the order of the visits. So the result does not
+// depend on the number of threads.
 #include "tools/check/exploration.hpp"
 
 #include <algorithm>
@@ -12,8 +13,9 @@
 namespace qz::tools::check {
 namespace {
 
-constexpr std::size_t worthThreads = 256;  // visits; below, threads cost more than they save
+constexpr std::size_t worthThreads = 64;  // visits; below, threads cost more than they save
 constexpr std::size_t edgeBytes = 3;
+constexpr std::size_t placesOfABase = 64;
 constexpr std::size_t mostPlaces = (std::size_t{1} << (8 * edgeBytes)) - 1;
 
 std::vector<Tag> allTags(const Setting& setting) {
@@ -55,7 +57,7 @@ void Exploration::run(const ExplorationLimits& limits, unsigned threads, Explora
     const std::size_t left = std::max<std::size_t>(most - set_.count(), worthThreads);
     expansions.resize(std::min({roundSize(), visits_.size() - next, left}));
     expandAll(expansions, next, threads);
-    for (const Expansion& expansion : expansions) {
+    for (Expansion& expansion : expansions) {
       if (set_.count() >= most) break;
       merge(expansion);
       ++next;
@@ -66,10 +68,10 @@ void Exploration::run(const ExplorationLimits& limits, unsigned threads, Explora
 
 // A round is short where places are large, so that it takes little memory and can be cancelled.
 std::size_t Exploration::roundSize() const {
-  constexpr std::size_t roundBytes = std::size_t{64} << 20U;
+  constexpr std::size_t roundBytes = std::size_t{2} << 20U;  // what near caches hold
   const std::size_t buttons = static_cast<std::size_t>(
       std::count_if(setting_.kinds.begin(), setting_.kinds.end(), drivers::isButton));
-  const std::size_t each = (buttons + 1) * (format_.size() + sizeof(Expansion::Found));
+  const std::size_t each = (buttons + 1) * (format_.size() + sizeof(Found));
   return std::clamp<std::size_t>(roundBytes / each, 1, Expansion::largestRound);
 }
 
@@ -87,17 +89,14 @@ void Exploration::start() {
   for (std::size_t i = 0; i < startKeys_.size(); ++i) {
     const Occasion occasion{noVisit, static_cast<Move>(i)};
     std::vector<std::uint8_t> place(format_.size());
-    PendingTimers timers;
-    const Arrival arrival = world.start(startKeys_[i], timers, place.data());
+    Found found;
+    Arrival& arrival = found.arrival;
+    arrival = world.start(startKeys_[i], found.timers, place.data());
     for (const Fact& fact : world.facts()) facts_.add(fact, occasion, noPlace);
     if (arrival.isEndless) continue;
+    arrival.move = occasion.move;
     starts_.push_back(arrival);
-    starts_.back().move = occasion.move;
-    arrive(arrival, timers, std::move(place),
-           {.look = arrival.look,
-            .parent = noVisit,
-            .move = occasion.move,
-            .lastList = arrival.lastList.value_or(noList)});
+    arrive(found, place.data(), noVisit, arrival.lastList.value_or(noList));
   }
 }
 
@@ -113,7 +112,7 @@ void Exploration::expandAll(std::vector<Expansion>& expansions, std::uint32_t fi
   while (worlds_.size() < threads) {
     worlds_.push_back(std::make_unique<World>(setting_, format_, looks_));
   }
-  constexpr std::size_t share = 32;  // visits that a thread takes at a time
+  constexpr std::size_t share = 16;  // visits that a thread takes at a time
   std::atomic<std::size_t> taken = 0;
   const auto work = [&](World& world) {
     for (std::size_t begin = taken.fetch_add(share); begin < expansions.size();
@@ -138,70 +137,98 @@ void Exploration::expand(World& world, Expansion& expansion) const {
   expansion.places.resize(moves.size() * format_.size());
   expansion.facts.clear();
   for (std::size_t i = 0; i < moves.size(); ++i) {
-    Expansion::Found& found = expansion.found[i];
+    Found& found = expansion.found[i];
     std::uint8_t* const place = expansion.places.data() + i * format_.size();
     found.firstFact = expansion.facts.size();
     found.arrival = world.make(moves[i], from, visit.look, pending, found.timers, place);
     const auto& facts = world.facts();
     expansion.facts.insert(expansion.facts.end(), facts.begin(), facts.end());
+    if (!found.arrival.isEndless) lookUp(found, place, visit);
   }
 }
 
-void Exploration::merge(const Expansion& expansion) {
+// Most moves lead to what is known. Timers that were not seen before get their number later.
+void Exploration::lookUp(Found& found, std::uint8_t* place, const Visit& from) const {
+  found.hash.reset();
+  found.place.reset();
+  found.isNews = true;
+  const auto number = knownNumberOf(found.timers);
+  if (!number) return;
+  format_.setTimers(place, *number);
+  found.hash = PlaceSet::hashOf(place, format_.size());
+  found.place = set_.find(place, *found.hash);
+  if (!found.place || !found.timers.empty()) return;
+  const Situation situation =
+      situationOf(*found.place, found.arrival.lastList.value_or(from.lastList));
+  const auto first = knownVisitIn(situation);
+  found.isNews = !first || visits_[*first].look != found.arrival.look;
+}
+
+void Exploration::merge(Expansion& expansion) {
   const Visit from = visits_[expansion.visit];
   const bool isFirst = firstVisit_[from.place] == expansion.visit;
   std::vector<std::uint32_t> targets;
   bool runsList = false;
   for (std::size_t i = 0; i < expansion.found.size(); ++i) {
-    const auto& [arrival, timers, firstFact] = expansion.found[i];
-    const std::size_t lastFact =
-        i + 1 < expansion.found.size() ? expansion.found[i + 1].firstFact : expansion.facts.size();
-    for (std::size_t fact = firstFact; fact < lastFact; ++fact) {
-      facts_.add(expansion.facts[fact], {expansion.visit, arrival.move},
-                 isFirst ? from.place : noPlace);
-    }
+    Found& found = expansion.found[i];
+    const Arrival& arrival = found.arrival;
+    addFacts(expansion, i, isFirst ? from.place : noPlace);
     if (isFirst) ++(arrival.move == waitMove ? waits_ : presses_);
     runsList |= arrival.ranList || arrival.isEndless;
     if (arrival.isEndless) continue;
-    const auto* const bytes = expansion.places.data() + i * format_.size();
-    targets.push_back(arrive(arrival, timers, {bytes, bytes + format_.size()},
-                             {.look = arrival.look,
-                              .parent = expansion.visit,
-                              .move = arrival.move,
-                              .lastList = arrival.lastList.value_or(from.lastList)}));
+    targets.push_back(found.isNews
+                          ? arrive(found, expansion.places.data() + i * format_.size(),
+                                   expansion.visit, arrival.lastList.value_or(from.lastList))
+                          : *found.place);
   }
   if (!isFirst) return;
   runsList_.push_back(runsList);
   addEdges(targets);
 }
 
-std::uint32_t Exploration::arrive(const Arrival& arrival, const PendingTimers& timers,
-                                  std::vector<std::uint8_t> place, Visit visit) {
-  format_.setTimers(place.data(), numberOf(timers));
-  const std::uint64_t hash = PlaceSet::hashOf(place.data(), place.size());
-  const auto known = set_.find(place.data(), hash);
-  visit.place = known ? *known : set_.add(place.data(), hash);
+void Exploration::addFacts(const Expansion& expansion, std::size_t move, std::uint32_t place) {
+  const std::size_t last = move + 1 < expansion.found.size() ? expansion.found[move + 1].firstFact
+                                                             : expansion.facts.size();
+  for (std::size_t fact = expansion.found[move].firstFact; fact < last; ++fact) {
+    facts_.add(expansion.facts[fact], {expansion.visit, expansion.found[move].arrival.move}, place);
+  }
+}
+
+std::uint32_t Exploration::arrive(Found& found, std::uint8_t* place, std::uint32_t parent,
+                                  std::uint32_t lastList) {
+  const Arrival& arrival = found.arrival;
+  if (!found.hash) {
+    format_.setTimers(place, numberOf(found.timers));
+    found.hash = PlaceSet::hashOf(place, format_.size());
+  }
+  const auto known = found.place ? found.place : set_.find(place, *found.hash);
+  const Visit visit{.place = known ? *known : set_.add(place, *found.hash),
+                    .look = arrival.look,
+                    .parent = parent,
+                    .move = arrival.move,
+                    .lastList = lastList};
   if (!known) firstVisit_.push_back(static_cast<std::uint32_t>(visits_.size()));
-  if (isNews(visit.place, visit) || !known) visits_.push_back(visit);
+  if (isNews(visit) || !known) visits_.push_back(visit);
   for (const std::uint32_t element : arrival.timerElements) {
     timerStarts_.try_emplace({visit.place, element}, Occasion{visit.parent, visit.move});
   }
   return visit.place;
 }
 
-bool Exploration::isNews(std::uint32_t place, const Visit& visit) {
-  const Situation situation = situationOf(place, visit);
-  const std::uint32_t firstNumber = firstVisitIn(situation);
-  if (firstNumber == visits_.size()) return true;
-  const Visit& first = visits_[firstNumber];
+bool Exploration::isNews(const Visit& visit) {
+  const Situation situation = situationOf(visit.place, visit.lastList);
+  const auto known = knownVisitIn(situation);
+  if (!known) otherFirstVisits_.emplace(situation, static_cast<std::uint32_t>(visits_.size()));
+  if (!known || *known == visits_.size()) return true;
+  const Visit& first = visits_[*known];
   if (visit.look == first.look) return false;
-  bool isNew = setting_.wholeLooks && wholeLooks_.insert({place, visit.look}).second;
+  bool isNew = setting_.wholeLooks && wholeLooks_.insert({visit.place, visit.look}).second;
   const Looks::Parts& parts = looks_.parts(visit.look);
-  const Looks::Parts& known = looks_.parts(first.look);
+  const Looks::Parts& knownParts = looks_.parts(first.look);
   auto& further = furtherLooks_[situation];
   further.resize(parts.size());
   for (std::size_t i = 0; i < parts.size(); ++i) {
-    if (parts[i] == known[i]) continue;
+    if (parts[i] == knownParts[i]) continue;
     auto& values = further[i];
     if (std::find(values.begin(), values.end(), parts[i]) != values.end()) continue;
     values.push_back(parts[i]);
@@ -212,19 +239,19 @@ bool Exploration::isNews(std::uint32_t place, const Visit& visit) {
 
 // Which list had the last word matters after an end, and where a press without a list leads to
 // another place because it cancels timers.
-Exploration::Situation Exploration::situationOf(std::uint32_t place, const Visit& visit) const {
+Exploration::Situation Exploration::situationOf(std::uint32_t place, std::uint32_t lastList) const {
   const std::uint8_t* const bytes = set_.place(place);
   const bool matters = format_.isOver(bytes) || format_.timers(bytes) != 0;
-  return {place, matters ? visit.lastList : noList};
+  return {place, matters ? lastList : noList};
 }
 
-/// Returns the first visit in a situation: a coming one, if there was none.
-std::uint32_t Exploration::firstVisitIn(const Situation& situation) {
+std::optional<std::uint32_t> Exploration::knownVisitIn(const Situation& situation) const {
   const auto [place, list] = situation;
-  const auto coming = static_cast<std::uint32_t>(visits_.size());
   const std::uint32_t first = firstVisit_[place];
-  if (first == coming || list == noList || visits_[first].lastList == list) return first;
-  return otherFirstVisits_.try_emplace(situation, coming).first->second;
+  const bool isComing = first == visits_.size();
+  if (isComing || list == noList || visits_[first].lastList == list) return first;
+  const auto other = otherFirstVisits_.find(situation);
+  return other == otherFirstVisits_.end() ? std::nullopt : std::optional(other->second);
 }
 
 std::vector<std::size_t> Exploration::partsWithSeveralLooks(std::uint32_t place) const {
@@ -263,33 +290,29 @@ void Exploration::seeExpansion(const Expansion& expansion, const See& see) {
   const Visit& visit = visits_[expansion.visit];
   for (std::size_t i = 0; i < expansion.found.size(); ++i) {
     const Arrival& arrival = expansion.found[i].arrival;
-    if (arrival.isEndless) continue;
-    if (const auto place = knownPlace(expansion, i)) {
-      see({expansion.visit, arrival.move}, arrival, arrival.lastList.value_or(visit.lastList),
-          *place);
-    }
+    const auto place = expansion.found[i].place;
+    if (arrival.isEndless || !place) continue;
+    see({expansion.visit, arrival.move}, arrival, arrival.lastList.value_or(visit.lastList),
+        *place);
   }
 }
 
-std::optional<std::uint32_t> Exploration::knownPlace(const Expansion& expansion, std::size_t move) {
-  const auto* const bytes = expansion.places.data() + move * format_.size();
-  std::vector<std::uint8_t> place(bytes, bytes + format_.size());
-  format_.setTimers(place.data(), numberOf(expansion.found[move].timers));
-  return set_.find(place.data(), PlaceSet::hashOf(place.data(), place.size()));
-}
-
 std::uint32_t Exploration::numberOf(const PendingTimers& timers) {
-  if (timers.empty() && !timers_.empty()) return 0;
-  std::vector<std::pair<std::string, double>> key;
-  for (const PendingTimer& timer : timers) key.emplace_back(timer.key, timer.seconds);
   const auto [place, isNew] =
-      timerNumbers_.emplace(key, static_cast<std::uint32_t>(timers_.size()));
-  if (isNew) timers_.push_back(std::make_unique<PendingTimers>(timers));
+      timerNumbers_.emplace(timers, static_cast<std::uint32_t>(timers_.size()));
+  if (isNew) timers_.push_back(&place->first);
   return place->second;
 }
 
+std::optional<std::uint32_t> Exploration::knownNumberOf(const PendingTimers& timers) const {
+  if (timers.empty()) return 0;
+  const auto number = timerNumbers_.find(timers);
+  return number == timerNumbers_.end() ? std::nullopt : std::optional(number->second);
+}
+
 void Exploration::addEdges(const std::vector<std::uint32_t>& targets) {
-  edgeStart_.push_back(edges_.size());
+  if (edgeOffset_.size() % placesOfABase == 0) edgeBase_.push_back(edges_.size());
+  edgeOffset_.push_back(static_cast<std::uint32_t>(edges_.size() - edgeBase_.back()));
   for (const std::uint32_t target : targets) {
     for (std::size_t byte = 0; byte < edgeBytes; ++byte) {
       edges_.push_back(static_cast<std::uint8_t>(target >> 8 * byte));
@@ -305,12 +328,16 @@ std::vector<std::uint32_t> Exploration::successors(std::uint32_t place) const {
 
 std::size_t Exploration::successorCount(std::uint32_t place) const {
   if (!isExpanded(place)) return 0;
-  const std::size_t end = place + 1 < edgeStart_.size() ? edgeStart_[place + 1] : edges_.size();
-  return (end - edgeStart_[place]) / edgeBytes;
+  const std::size_t end = isExpanded(place + 1) ? edgeStart(place + 1) : edges_.size();
+  return (end - edgeStart(place)) / edgeBytes;
+}
+
+std::size_t Exploration::edgeStart(std::uint32_t place) const {
+  return edgeBase_[place / placesOfABase] + edgeOffset_[place];
 }
 
 std::uint32_t Exploration::successor(std::uint32_t place, std::size_t index) const {
-  const std::uint8_t* const bytes = edges_.data() + edgeStart_[place] + index * edgeBytes;
+  const std::uint8_t* const bytes = edges_.data() + edgeStart(place) + index * edgeBytes;
   std::uint32_t target = 0;
   for (std::size_t byte = edgeBytes; byte-- > 0;) target = target << 8U | bytes[byte];
   return target;

@@ -70,7 +70,7 @@ class Exploration {
   Stop stop() const { return stop_; }
   std::size_t places() const { return set_.count(); }
   /// Returns how many places have all their moves made.
-  std::size_t expandedPlaces() const { return edgeStart_.size(); }
+  std::size_t expandedPlaces() const { return edgeOffset_.size(); }
   std::size_t presses() const { return presses_; }
   std::size_t waits() const { return waits_; }
   const std::uint8_t* place(std::uint32_t number) const { return set_.place(number); }
@@ -96,7 +96,7 @@ class Exploration {
   /// Whether a move out of the place runs a list.
   bool canRunList(std::uint32_t place) const { return runsList_[place]; }
   /// Whether the moves out of the place are known.
-  bool isExpanded(std::uint32_t place) const { return place < edgeStart_.size(); }
+  bool isExpanded(std::uint32_t place) const { return place < expandedPlaces(); }
   /// Returns the first visit of a place.
   std::uint32_t firstVisit(std::uint32_t place) const { return firstVisit_[place]; }
   /// Makes every move once more, starts included, and tells `see` where each leads.
@@ -124,6 +124,7 @@ class Exploration {
   std::vector<std::size_t> partsWithSeveralLooks(std::uint32_t place) const;
 
  private:
+  struct Found;      // where a move leads
   struct Expansion;  // of one visit: where its moves lead
   /// A place, and the list that had the last word, if that matters for what follows.
   using Situation = std::pair<std::uint32_t, std::uint32_t>;
@@ -134,18 +135,22 @@ class Exploration {
   void start();
   void expandAll(std::vector<Expansion>& expansions, std::uint32_t first, unsigned threads);
   void expand(World& world, Expansion& expansion) const;
-  void merge(const Expansion& expansion);
-  std::uint32_t arrive(const Arrival& arrival, const PendingTimers& timers,
-                       std::vector<std::uint8_t> place, Visit visit);
-  bool isNews(std::uint32_t place, const Visit& visit);
-  Situation situationOf(std::uint32_t place, const Visit& visit) const;
-  std::uint32_t firstVisitIn(const Situation& situation);
+  void lookUp(Found& found, std::uint8_t* place, const Visit& from) const;
+  void merge(Expansion& expansion);
+  void addFacts(const Expansion& expansion, std::size_t move, std::uint32_t place);
+  std::uint32_t arrive(Found& found, std::uint8_t* place, std::uint32_t parent,
+                       std::uint32_t lastList);
+  bool isNews(const Visit& visit);
+  Situation situationOf(std::uint32_t place, std::uint32_t lastList) const;
+  /// Returns the first visit in a situation: a coming one, if the place is new.
+  std::optional<std::uint32_t> knownVisitIn(const Situation& situation) const;
   void seeExpansion(const Expansion& expansion, const See& see);
-  std::optional<std::uint32_t> knownPlace(const Expansion& expansion, std::size_t move);
   std::uint32_t numberOf(const PendingTimers& timers);
+  std::optional<std::uint32_t> knownNumberOf(const PendingTimers& timers) const;
   Step step(const Visit& visit) const;
   Step stepFrom(std::uint32_t place, Move move) const;
   void addEdges(const std::vector<std::uint32_t>& targets);
+  std::size_t edgeStart(std::uint32_t place) const;
 
   const Setting& setting_;
   std::vector<std::string> startKeys_;
@@ -155,15 +160,16 @@ class Exploration {
   FactTable facts_;
   std::vector<Visit> visits_;
   std::vector<std::uint32_t> firstVisit_;  // by place
-  std::map<std::vector<std::pair<std::string, double>>, std::uint32_t> timerNumbers_;
-  std::vector<std::unique_ptr<PendingTimers>> timers_;
+  std::map<PendingTimers, std::uint32_t> timerNumbers_;
+  std::vector<const PendingTimers*> timers_;
   /// The first visits in situations that differ from that of the place's first visit.
   std::map<Situation, std::uint32_t> otherFirstVisits_;
   /// The further values of the parts of a look, beyond those of the first visit.
   std::map<Situation, std::vector<std::vector<LookValue>>> furtherLooks_;
   std::set<std::pair<std::uint32_t, std::uint32_t>> wholeLooks_;  // place, look; if they matter
-  std::vector<std::size_t> edgeStart_;                            // by place, in edges_
-  std::vector<std::uint8_t> edges_;                               // three bytes each
+  std::vector<std::uint8_t> edges_;        // three bytes each, in the order of the places
+  std::vector<std::size_t> edgeBase_;      // where those of each 64th place begin
+  std::vector<std::uint32_t> edgeOffset_;  // of each place, from there
   std::vector<bool> runsList_;
   std::vector<std::unique_ptr<World>> worlds_;
   std::map<std::pair<std::uint32_t, std::uint32_t>, Occasion> timerStarts_;  // place, element

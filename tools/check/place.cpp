@@ -43,11 +43,45 @@ ControlState PlaceFormat::control(const std::uint8_t* place, std::size_t index) 
 
 void PlaceFormat::setControl(std::uint8_t* place, std::size_t index,
                              const ControlState& state) const {
-  std::uint32_t bits = numbers_.at(state.tag) * tagFactor + (state.hidden ? hiddenBit : 0) +
-                       (state.enabled ? 0 : disabledBit);
-  for (std::size_t i = 0; i < width_; ++i, bits >>= 8U) {
-    place[index * width_ + i] = static_cast<std::uint8_t>(bits);
+  setCode(place, index,
+          numbers_.at(state.tag) * tagFactor + (state.hidden ? hiddenBit : 0) +
+              (state.enabled ? 0 : disabledBit));
+}
+
+void PlaceFormat::setCode(std::uint8_t* place, std::size_t index, std::uint32_t code) const {
+  for (std::size_t i = 0; i < width_; ++i, code >>= 8U) {
+    place[index * width_ + i] = static_cast<std::uint8_t>(code);
   }
+}
+
+std::optional<std::uint32_t> PlaceFormat::numberOf(Tag tag) const {
+  const auto number = numbers_.find(tag);
+  return number == numbers_.end() ? std::nullopt : std::optional(number->second);
+}
+
+bool PlaceFormat::hasTag(const std::uint8_t* place, std::size_t index,
+                         std::uint32_t tagNumber) const {
+  return code(place, index) / tagFactor == tagNumber;
+}
+
+std::size_t PlaceFormat::controlsWithTag(const std::uint8_t* place, std::uint32_t tagNumber) const {
+  std::size_t count = 0;
+  if (width_ > 1) {
+    for (std::size_t i = 0; i < controls_; ++i) count += hasTag(place, i, tagNumber);
+    return count;
+  }
+  // Counted in bytes, which a compiler adds many at a time.
+  constexpr std::size_t portion = 255;
+  constexpr std::uint8_t tagBits = 0xff - hiddenBit - disabledBit;
+  const auto wanted = static_cast<std::uint8_t>(tagNumber * tagFactor);
+  for (std::size_t i = 0; i < controls_;) {
+    std::uint8_t found = 0;
+    for (const std::size_t end = std::min(i + portion, controls_); i < end; ++i) {
+      found = static_cast<std::uint8_t>(found + ((place[i] & tagBits) == wanted));
+    }
+    count += found;
+  }
+  return count;
 }
 
 bool PlaceFormat::differs(const std::uint8_t* a, const std::uint8_t* b, std::size_t index) const {

@@ -2,8 +2,10 @@
 // Places: all that what happens next in a walk-through can depend on, in few bytes.
 #pragma once
 
+#include <compare>
 #include <cstddef>
 #include <cstdint>
+#include <optional>
 #include <string>
 #include <unordered_map>
 #include <vector>
@@ -26,7 +28,7 @@ struct ControlState {
 struct PendingTimer {
   std::string key;
   double seconds = 0;
-  friend bool operator==(const PendingTimer&, const PendingTimer&) = default;
+  friend auto operator<=>(const PendingTimer&, const PendingTimer&) = default;
 };
 
 /// The pending timers, in the order of their firing.
@@ -49,14 +51,21 @@ class PlaceFormat {
   /// Whether two places differ in a control.
   bool differs(const std::uint8_t* a, const std::uint8_t* b, std::size_t index) const;
 
+  /// A control's code: equal in two places if and only if the control's states are.
+  std::uint32_t code(const std::uint8_t* place, std::size_t index) const;
+  void setCode(std::uint8_t* place, std::size_t index, std::uint32_t code) const;
+  /// Returns the number of a tag, which codes have; absent if no control can have the tag.
+  std::optional<std::uint32_t> numberOf(Tag tag) const;
+  bool hasTag(const std::uint8_t* place, std::size_t index, std::uint32_t tagNumber) const;
+  /// Returns how many controls have the tag with this number.
+  std::size_t controlsWithTag(const std::uint8_t* place, std::uint32_t tagNumber) const;
+
   std::uint32_t timers(const std::uint8_t* place) const;
   void setTimers(std::uint8_t* place, std::uint32_t timers) const;
   bool isOver(const std::uint8_t* place) const { return place[size() - 1] != 0; }
   void setOver(std::uint8_t* place, bool over) const { place[size() - 1] = over ? 1 : 0; }
 
  private:
-  std::uint32_t code(const std::uint8_t* place, std::size_t index) const;
-
   std::size_t controls_;
   std::size_t width_;  // bytes of a control's code
   std::vector<Tag> tags_;

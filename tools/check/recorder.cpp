@@ -63,9 +63,6 @@ bool changesNotes(const Command& command) {
                                                  hasParameter(command, ParameterType::imageName)));
 }
 
-// The longest time that a script can write, in seconds, rounded up as the engine does.
-constexpr double longestDelay = 2147483648.0;
-
 }  // namespace
 
 Recorder::Recorder(const Script& script, Surroundings& surroundings,
@@ -84,6 +81,7 @@ void Recorder::begin() {
   firstList_.reset();
   endList_.reset();
   lastList_.reset();
+  isFirstTime_ = false;
   ranList_ = false;
   notesMayHaveChanged_ = false;
 }
@@ -132,6 +130,7 @@ void Recorder::noteOnce(FactKind kind, std::size_t subject) {
   const std::uint32_t bit = 1U << static_cast<unsigned>(kind);
   if ((noted_[subject] & bit) != 0) return;
   noted_[subject] |= bit;
+  isFirstTime_ = true;
   note(kind, static_cast<Subject>(subject));
 }
 
@@ -243,6 +242,7 @@ void Recorder::noteTarget(const Running& running) {
 }
 
 void Recorder::controlSought(Tag tag, const toolkit::Ref<toolkit::View>& control) {
+  surroundings_.tagWasSought(tag);
   if (control) surroundings_.willTouch(control);
   if (!isRecording_ || running_.empty()) return;
   Running& running = running_.back();

@@ -16,6 +16,9 @@
 
 namespace qz::tools::check {
 
+/// The longest delay that a script can write, in seconds, rounded up as the engine does.
+inline constexpr double longestDelay = 2147483648.0;
+
 /// What stands for the time left of a timer that fires in no user's lifetime: its delay was
 /// negative or an address, and is millions of years or more.
 inline constexpr double neverFires = std::numeric_limits<double>::infinity();
@@ -27,6 +30,8 @@ class Surroundings {
 
   /// The engine has looked up a control, which the move may change from now on.
   virtual void willTouch(const toolkit::Ref<toolkit::View>& control) = 0;
+  /// What the move does depends on which controls have this tag.
+  virtual void tagWasSought(Tag tag) = 0;
   /// An element may have given a control another tag.
   virtual void tagMayHaveChanged(const toolkit::Ref<toolkit::View>& control,
                                  std::uint32_t element) = 0;
@@ -35,7 +40,7 @@ class Surroundings {
   /// The script has set the state of a button.
   virtual void stateWasSet(const toolkit::Ref<toolkit::View>& control) = 0;
   virtual void lookMayHaveChanged(const toolkit::Ref<toolkit::View>& control) = 0;
-  virtual std::size_t controlsWithTag(Tag tag) const = 0;
+  virtual std::size_t controlsWithTag(Tag tag) = 0;
   virtual drivers::ViewKind kindOf(const toolkit::Ref<toolkit::View>& control) const = 0;
 };
 
@@ -55,6 +60,8 @@ class Recorder final : public Observer {
 
   /// Returns the facts of the move. A fact that is good news is there only the first time.
   const std::vector<Fact>& facts() const { return facts_; }
+  /// Whether a fact of the move is there only because it is the first time.
+  bool isFirstTime() const { return isFirstTime_; }
   /// Returns the timers that are pending, in the order of their firing.
   PendingTimers pending() const;
   /// Returns the elements that started those timers.
@@ -115,6 +122,7 @@ class Recorder final : public Observer {
   std::optional<std::size_t> firstList_;
   std::optional<std::size_t> endList_;
   std::optional<std::size_t> lastList_;
+  bool isFirstTime_ = false;
   bool ranList_ = false;
   bool notesMayHaveChanged_ = false;
 };

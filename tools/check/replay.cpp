@@ -7,6 +7,7 @@
 #include "drivers/memory/memory_driver.hpp"
 #include "qz/toolkit/exception.hpp"
 #include "tools/check/endless_run.hpp"
+#include "tools/check/recorder.hpp"
 #include "tools/support/text_layout.hpp"
 
 namespace qz::tools::check {

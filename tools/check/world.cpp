@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Only what a move may have touched is read back afterwards, and only what differs between two
-// places is restored, so that a move costs hardly more than the engine's own work.
+// Only what a move may have touched is read back afterwards, only what differs between two places
+// is restored, and a press that is remembered is not made again.
 #include "tools/check/world.hpp"
 
 #include <algorithm>
@@ -76,7 +76,7 @@ Setting settingOf(const Script& script, const walkthrough::StagePlan& plan, std:
 }
 
 World::World(const Setting& setting, const PlaceFormat& format, Looks& looks)
-    : setting_(setting), format_(format), looks_(looks), place_(format.size()) {
+    : setting_(setting), format_(format), looks_(looks), presses_(format), place_(format.size()) {
   build(std::nullopt);
 }
 
@@ -137,10 +137,12 @@ void World::observe() {
   look_ = looks_.numberOf(parts_);
   Surroundings& surroundings = *this;
   recorder_ = std::make_shared<Recorder>(setting_.script, surroundings, setting_.watchedLists);
+  facts_ = &recorder_->facts();
   stage_->engine().setObserver(recorder_);
 }
 
 Arrival World::start(const std::string& key, PendingTimers& timers, std::uint8_t* place) {
+  trace_.clear();
   try {
     build(key);
   } catch (const EndlessRun&) {
@@ -163,11 +165,28 @@ std::vector<Move> World::moves(const std::uint8_t* place, const PendingTimers& p
 
 Arrival World::make(Move move, const std::uint8_t* from, std::uint32_t look,
                     const PendingTimers& pending, PendingTimers& timers, std::uint8_t* place) {
-  goTo(from, look);
+  const Departure departure{from, look, pending};
+  if (move == waitMove) return makeAnew(move, departure, timers, place);
+  if (const RememberedPress* known = presses_.find(move, departure)) {
+    known->apply(format_, from, place);
+    timers = known->timers;
+    facts_ = &known->facts;
+    return known->arrival;
+  }
+  Arrival arrival = makeAnew(move, departure, timers, place);
+  remember(departure, arrival, timers);
+  return arrival;
+}
+
+Arrival World::makeAnew(Move move, const Departure& from, PendingTimers& timers,
+                        std::uint8_t* place) {
+  goTo(from.place, from.look);
+  trace_.clear();
   recorder_->begin();
+  facts_ = &recorder_->facts();
   try {
     if (move == waitMove) {
-      wait(pending.front());
+      wait(from.pending.front());
     } else {
       press(move);
     }
@@ -175,6 +194,19 @@ Arrival World::make(Move move, const std::uint8_t* from, std::uint32_t look,
     return abandon(move);
   }
   return arrive(move, timers, place);
+}
+
+// An end gives all controls their tags back, and after an endless run the world is of no use.
+void World::remember(const Departure& from, const Arrival& arrival, const PendingTimers& timers) {
+  if (arrival.isEndless || format_.isOver(place_.data()) || trace_.isLong() ||
+      setting_.tracksTaggers || recorder_->isFirstTime()) {
+    return;
+  }
+  RememberedPress press(format_, trace_, from, place_.data());
+  press.arrival = arrival;
+  press.timers = timers;
+  press.facts = recorder_->facts();
+  presses_.add(arrival.move, std::move(press));
 }
 
 void World::goTo(const std::uint8_t* place, std::uint32_t look) {
@@ -389,7 +421,10 @@ void World::willTouch(const toolkit::Ref<toolkit::View>& view) {
   if (!control || control->isTouched) return;
   control->isTouched = true;
   touched_.push_back(static_cast<std::size_t>(control - controls_.data()));
+  trace_.addControl(touched_.back());
 }
+
+void World::tagWasSought(Tag tag) { trace_.addTag(tag); }
 
 void World::tagMayHaveChanged(const toolkit::Ref<toolkit::View>& view, std::uint32_t element) {
   if (Control* const control = controlOf(view)) updateTag(*control, element + 1);
@@ -422,7 +457,8 @@ void World::lookMayHaveChanged(const toolkit::Ref<toolkit::View>& view) {
   if (Control* const control = controlOf(view)) control->mayLookDifferent = true;
 }
 
-std::size_t World::controlsWithTag(Tag tag) const {
+std::size_t World::controlsWithTag(Tag tag) {
+  trace_.addTag(tag);
   if (sharedTags_ == 0) return 1;
   const auto count = tagCounts_.find(tag);
   return count == tagCounts_.end() ? 0 : count->second;

@@ -11,9 +11,11 @@
 #include <vector>
 
 #include "drivers/memory/memory_driver.hpp"
+#include "tools/check/arrival.hpp"
 #include "tools/check/looks.hpp"
 #include "tools/check/place.hpp"
 #include "tools/check/recorder.hpp"
+#include "tools/check/remembered_presses.hpp"
 #include "tools/check/script.hpp"
 #include "tools/walkthrough/stage.hpp"
 
@@ -39,18 +41,6 @@ struct Setting {
 /// Reads from a world of its own what all worlds share.
 Setting settingOf(const Script& script, const walkthrough::StagePlan& plan, std::string resources);
 
-/// Where a move has led.
-struct Arrival {
-  Move move = 0;
-  bool isEndless = false;  ///< the move runs lists without end, and leads nowhere
-  bool ranList = false;
-  std::optional<std::uint32_t> firstList{};   ///< that the move ran; absent if it ran none
-  std::optional<std::uint32_t> lastList{};    ///< whose command ran last; absent if none ran
-  std::vector<std::uint32_t> watchedLists{};  ///< those of the setting that the move ran
-  std::uint32_t look = 0;
-  std::vector<std::uint32_t> timerElements{};  ///< which started the pending timers
-};
-
 class World final : private Surroundings {
  public:
   World(const Setting& setting, const PlaceFormat& format, Looks& looks);
@@ -66,7 +56,8 @@ class World final : private Surroundings {
   std::vector<Move> moves(const std::uint8_t* place, const PendingTimers& pending) const;
   /// Returns the number of the look that the world shows.
   std::uint32_t look() const { return look_; }
-  const std::vector<Fact>& facts() const { return recorder_->facts(); }
+  /// Returns the facts of the last move. A fact that is good news is there only the first time.
+  const std::vector<Fact>& facts() const { return *facts_; }
 
  private:
   struct Control {
@@ -83,17 +74,20 @@ class World final : private Surroundings {
 
   // Surroundings:
   void willTouch(const toolkit::Ref<toolkit::View>& control) override;
+  void tagWasSought(Tag tag) override;
   void tagMayHaveChanged(const toolkit::Ref<toolkit::View>& control,
                          std::uint32_t element) override;
   void tagsMayBeRestored() override;
   void stateWasSet(const toolkit::Ref<toolkit::View>& control) override;
   void lookMayHaveChanged(const toolkit::Ref<toolkit::View>& control) override;
-  std::size_t controlsWithTag(Tag tag) const override;
+  std::size_t controlsWithTag(Tag tag) override;
   drivers::ViewKind kindOf(const toolkit::Ref<toolkit::View>& control) const override;
 
   void build(const std::optional<std::string>& startKey);
   void observe();
+  Arrival makeAnew(Move move, const Departure& from, PendingTimers& timers, std::uint8_t* place);
   void goTo(const std::uint8_t* place, std::uint32_t look);
+  void remember(const Departure& from, const Arrival& arrival, const PendingTimers& timers);
   void restoreLook(std::uint32_t look);
   void press(std::size_t control);
   void wait(const PendingTimer& first);
@@ -120,7 +114,10 @@ class World final : private Surroundings {
   std::unordered_map<const toolkit::View*, std::size_t> indexOf_;
   std::vector<std::size_t> touched_;
   std::unordered_map<Tag, std::size_t> tagCounts_;
-  std::size_t sharedTags_ = 0;       // how many tags two controls or more have
+  std::size_t sharedTags_ = 0;  // how many tags two controls or more have
+  Trace trace_;                 // of the press
+  RememberedPresses presses_;
+  const std::vector<Fact>* facts_ = nullptr;
   std::vector<std::uint8_t> place_;  // where the world is
   Looks::Parts parts_;               // of the look that it shows
   bool hasNewTaggers_ = false;
