@@ -121,7 +121,7 @@ class PlayedByAPerson : public testing::Test {
   const PlayOptions options = optionsOfScript();
   const InputFile file{options.script, "a script"};
   drivers::QtDriver driver;
-  Stage stage{driver, options.stage, file.dictionary(), options.script};
+  Stage stage{driver, planStage(options.stage, file.dictionary(), options.script)};
   std::ostringstream out;
   Transcript transcript{out, {}};
   Session session{driver, stage, transcript};
