@@ -16,10 +16,10 @@ namespace qz::tools::check {
 namespace {
 
 /// One entry of a window's file.
-std::string buttonEntry(int tag) {
+std::string buttonEntry(Tag tag) {
   return "{ class = NSButton; tag = " + std::to_string(tag) + "; frame = (0, 0, 9, 9); }";
 }
-std::string fieldEntry(int tag) {
+std::string fieldEntry(Tag tag) {
   return "{ class = NSTextField; tag = " + std::to_string(tag) + "; frame = (0, 0, 9, 9); }";
 }
 
@@ -123,6 +123,21 @@ TEST_F(HostileScripts, HaveWindowsOfTenThousandControls) {
   EXPECT_TRUE(verdict.explored.complete);
   EXPECT_EQ(verdict.explored.places, 2U);
   EXPECT_EQ(codesOf(verdict), std::set<std::string>()) << messagesOf(verdict);
+}
+
+// The end restores tags as 32-bit numbers.
+TEST_F(HostileScripts, HaveWindowsWithTagsBeyond32Bits) {
+  directory_.write("window.plist", "( " + buttonEntry(2) + ", " + buttonEntry(4294967299) + ", " +
+                                       fieldEntry(3000000000) + " )");
+  directory_.write("script.plist",
+                   "{ 1 = (IDLE_LOOP); 4294967299 = (IDLE_LOOP); 2 = (TERMINATE_PARSER); }");
+  const Verdict verdict = checkFolder("");
+  EXPECT_TRUE(verdict.explored.complete);
+  EXPECT_EQ(codesOf(verdict), std::set<std::string>{"tag-left"}) << messagesOf(verdict);
+  EXPECT_EQ(verdict.findings.size(), 2U);
+  for (const char* const words : {"has the tag 3,", "has the tag -1294967296,"}) {
+    EXPECT_NE(messagesOf(verdict).find(words), std::string::npos) << messagesOf(verdict);
+  }
 }
 
 TEST_F(HostileScripts, HaveAThousandButtonsWithoutLists) {

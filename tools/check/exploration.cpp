@@ -20,7 +20,10 @@ constexpr std::size_t mostPlaces = (std::size_t{1} << (8 * edgeBytes)) - 1;
 
 std::vector<Tag> allTags(const Setting& setting) {
   std::vector<Tag> tags = setting.script.newTags();
-  tags.insert(tags.end(), setting.ownTags.begin(), setting.ownTags.end());
+  for (const Tag tag : setting.ownTags) {
+    tags.push_back(tag);
+    tags.push_back(restoredTag(tag));
+  }
   return tags;
 }
 

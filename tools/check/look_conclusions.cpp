@@ -100,11 +100,14 @@ class LookConclusions {
     const Tag tag = exploration_.format().control(exploration_.place(visit.place), control).tag;
     const auto tagger = exploration_.taggerAt(visit, control);
     if (tag == ownTag(control) || !tagsLeft_.emplace(tagger, control).second) return;
+    const bool isCut = tag == restoredTag(ownTag(control));
     Finding finding = findingOf(
         "tag-left",
-        "after the end " + nameOf(control) + " keeps the tag " + std::to_string(tag) +
-            ", so the host and the next walk-through do not find it",
-        "give the control the tag " + std::to_string(ownTag(control)) + " again before the end");
+        "after the end " + nameOf(control) + (isCut ? " has the tag " : " keeps the tag ") +
+            std::to_string(tag) + ", so the host and the next walk-through do not find it",
+        isCut ? "the end restores tags as 32-bit numbers; give the host's control a smaller tag"
+              : "give the control the tag " + std::to_string(ownTag(control)) +
+                    " again before the end");
     finding.tag = ownTag(control);
     finding.path = exploration_.path(number);
     if (tagger) {

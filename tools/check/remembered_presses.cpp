@@ -8,7 +8,7 @@ namespace qz::tools::check {
 namespace {
 
 constexpr std::size_t longestTrace = 32;
-constexpr std::size_t pressesOfAControl = 16;
+constexpr std::size_t pressesOfAControl = 64;
 constexpr std::size_t mostPresses = 20'000;  // some 10 MB
 
 /// Returns NO if that would make the trace too long.
@@ -32,12 +32,24 @@ void Trace::addControl(std::size_t control) { isLong_ = isLong_ || !addOnce(cont
 
 void Trace::addTag(Tag tag) { isLong_ = isLong_ || !addOnce(tags_, tag); }
 
-RememberedPress::RememberedPress(const PlaceFormat& format, const Trace& trace,
-                                 const Departure& from, const std::uint8_t* to)
-    : look_(from.look), pending_(from.pending) {
+std::optional<std::size_t> PressContext::taggerPart(const Looks::Parts& parts,
+                                                    std::size_t control) const {
+  const std::size_t first = format.controls() + notes;
+  return first < parts.size() ? std::optional(first + control) : std::nullopt;
+}
+
+RememberedPress::RememberedPress(const PressContext& context, const Trace& trace,
+                                 const Station& from, const Station& to)
+    : look_(from.look), ends_(context.format.isOver(to.place)) {
+  const PlaceFormat& format = context.format;
   for (const std::size_t control : trace.controls()) {
-    changes_.push_back({control, format.code(from.place, control), format.code(to, control)});
+    changes_.push_back({control, format.code(from.place, control), format.code(to.place, control)});
+    addLookChange(control, from, to);
+    if (const auto tagger = context.taggerPart(from.parts, control)) {
+      addLookChange(*tagger, from, to);
+    }
   }
+  for (std::size_t i = 0; i < context.notes; ++i) addLookChange(format.controls() + i, from, to);
   for (const Tag tag : trace.tags()) {
     const auto number = format.numberOf(tag);
     if (!number) continue;  // no control has the tag in any place
@@ -49,12 +61,21 @@ RememberedPress::RememberedPress(const PlaceFormat& format, const Trace& trace,
   }
 }
 
-bool RememberedPress::fits(const PlaceFormat& format, const Departure& from) const {
-  return look_ == from.look && pending_ == from.pending &&
-         std::all_of(changes_.begin(), changes_.end(),
+void RememberedPress::addLookChange(std::size_t part, const Station& from, const Station& to) {
+  lookChanges_.push_back({part, from.parts[part], to.parts[part]});
+  changesLook_ = changesLook_ || from.parts[part] != to.parts[part];
+}
+
+bool RememberedPress::fits(const PressContext& context, const Station& from) const {
+  const PlaceFormat& format = context.format;
+  return std::all_of(changes_.begin(), changes_.end(),
                      [&](const Change& each) {
                        return format.code(from.place, each.control) == each.before;
                      }) &&
+         (look_ == from.look || std::all_of(lookChanges_.begin(), lookChanges_.end(),
+                                            [&](const LookChange& each) {
+                                              return from.parts[each.part] == each.before;
+                                            })) &&
          std::all_of(bearers_.begin(), bearers_.end(), [&](const Bearers& each) {
            return std::all_of(each.controls.begin(), each.controls.end(),
                               [&](std::size_t control) {
@@ -64,19 +85,39 @@ bool RememberedPress::fits(const PlaceFormat& format, const Departure& from) con
          });
 }
 
-void RememberedPress::apply(const PlaceFormat& format, const std::uint8_t* from,
-                            std::uint8_t* to) const {
-  std::copy(from, from + format.size(), to);
+void RememberedPress::writePlace(const PressContext& context, const Station& from,
+                                 std::uint8_t* to) const {
+  const PlaceFormat& format = context.format;
+  std::copy(from.place, from.place + format.size(), to);
+  if (ends_) {
+    for (std::size_t i = 0; i < format.controls(); ++i) {
+      ControlState state = format.control(from.place, i);
+      state.tag = context.restoredTags[i].value_or(state.tag);
+      format.setControl(to, i, state);
+    }
+    format.setOver(to, true);
+  }
   for (const Change& change : changes_) format.setCode(to, change.control, change.after);
 }
 
-RememberedPresses::RememberedPresses(const PlaceFormat& format)
-    : format_(format), rings_(format.controls()) {}
+std::uint32_t RememberedPress::lookAfter(const PressContext& context, const Station& from,
+                                         Looks& looks) const {
+  const bool restoresTaggers = ends_ && context.taggerPart(from.parts, 0);
+  if (!restoresTaggers && from.look == look_) return arrival.look;
+  if (!restoresTaggers && !changesLook_) return from.look;
+  Looks::Parts parts = from.parts;
+  for (std::size_t i = 0; restoresTaggers && i < context.format.controls(); ++i) {
+    const Tag tag = context.format.control(from.place, i).tag;
+    if (context.restoredTags[i].value_or(tag) != tag) parts[*context.taggerPart(parts, i)] = 0;
+  }
+  for (const LookChange& change : lookChanges_) parts[change.part] = change.after;
+  return looks.numberOf(parts);
+}
 
-const RememberedPress* RememberedPresses::find(std::size_t control, const Departure& from) const {
+const RememberedPress* RememberedPresses::find(std::size_t control, const Station& from) const {
   const auto& presses = rings_[control].presses;
   const auto found = std::find_if(presses.begin(), presses.end(),
-                                  [&](const auto& each) { return each.fits(format_, from); });
+                                  [&](const auto& each) { return each.fits(context_, from); });
   return found == presses.end() ? nullptr : &*found;
 }
 

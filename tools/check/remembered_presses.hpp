@@ -5,23 +5,39 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <optional>
 #include <vector>
 
 #include "tools/check/arrival.hpp"
 #include "tools/check/facts.hpp"
+#include "tools/check/looks.hpp"
 #include "tools/check/place.hpp"
 
 namespace qz::tools::check {
 
-/// Where a move is made.
-struct Departure {
+/// Where a move is made, or where it has led.
+struct Station {
   const std::uint8_t* place;
   std::uint32_t look;
-  const PendingTimers& pending;
+  const Looks::Parts& parts;  ///< of the look
+};
+
+/// What all presses of an exploration have in common.
+struct PressContext {
+  const PlaceFormat& format;
+  std::size_t
+      notes;  ///< the parts of a look that are notes of the engine; they follow the controls
+  /// The tags that an end gives the controls; absent for a control that keeps its tag.
+  std::vector<std::optional<Tag>> restoredTags{};
+
+  /// Returns the part of a look that says which element gave the control its tag; absent if looks
+  /// do not say that.
+  std::optional<std::size_t> taggerPart(const Looks::Parts& parts, std::size_t control) const;
 };
 
 /// The controls that a press has looked up, and the tags that it has looked for. A press depends on
-/// nothing else but the look and the pending timers, and changes no other control.
+/// nothing else but the engine's notes in the look: it cancels the pending timers first. It changes
+/// no other control, but an end gives all controls their own tags back.
 class Trace {
  public:
   void clear();
@@ -42,14 +58,15 @@ class Trace {
 /// One press, what it depended on and what it did.
 class RememberedPress {
  public:
-  /// `to` is the place to which the press led.
-  RememberedPress(const PlaceFormat& format, const Trace& trace, const Departure& from,
-                  const std::uint8_t* to);
+  RememberedPress(const PressContext& context, const Trace& trace, const Station& from,
+                  const Station& to);
 
   /// Whether the same press does the same here.
-  bool fits(const PlaceFormat& format, const Departure& from) const;
-  /// Writes the place to which the press leads from `from`.
-  void apply(const PlaceFormat& format, const std::uint8_t* from, std::uint8_t* to) const;
+  bool fits(const PressContext& context, const Station& from) const;
+  /// Writes the place to which the press leads.
+  void writePlace(const PressContext& context, const Station& from, std::uint8_t* to) const;
+  /// Returns the number of the look to which the press leads.
+  std::uint32_t lookAfter(const PressContext& context, const Station& from, Looks& looks) const;
 
   Arrival arrival;
   PendingTimers timers;  ///< that are pending afterwards
@@ -61,24 +78,34 @@ class RememberedPress {
     std::uint32_t before;  // codes
     std::uint32_t after;
   };
+  struct LookChange {
+    std::size_t part;
+    LookValue before;
+    LookValue after;
+  };
   struct Bearers {
     std::uint32_t tag;  // its number
     std::vector<std::size_t> controls;
   };
 
-  std::uint32_t look_;
-  PendingTimers pending_;
+  void addLookChange(std::size_t part, const Station& from, const Station& to);
+
+  std::uint32_t look_;  // before
+  bool ends_;
+  bool changesLook_ = false;
   std::vector<Change> changes_;
+  std::vector<LookChange> lookChanges_;
   std::vector<Bearers> bearers_;
 };
 
 /// The last presses of each control.
 class RememberedPresses {
  public:
-  explicit RememberedPresses(const PlaceFormat& format);
+  explicit RememberedPresses(const PressContext& context)
+      : context_(context), rings_(context.format.controls()) {}
 
   /// Returns null if nothing is remembered that fits.
-  const RememberedPress* find(std::size_t control, const Departure& from) const;
+  const RememberedPress* find(std::size_t control, const Station& from) const;
   void add(std::size_t control, RememberedPress press);
 
  private:
@@ -87,7 +114,7 @@ class RememberedPresses {
     std::size_t oldest = 0;
   };
 
-  const PlaceFormat& format_;
+  const PressContext& context_;
   std::vector<Ring> rings_;  // by control
   std::size_t count_ = 0;
 };

@@ -75,8 +75,18 @@ Setting settingOf(const Script& script, const walkthrough::StagePlan& plan, std:
   return setting;
 }
 
+Tag restoredTag(Tag tag) { return toolkit::Number::withLong(tag)->intValue(); }
+
 World::World(const Setting& setting, const PlaceFormat& format, Looks& looks)
-    : setting_(setting), format_(format), looks_(looks), presses_(format), place_(format.size()) {
+    : setting_(setting),
+      format_(format),
+      looks_(looks),
+      context_{.format = format, .notes = 2 + setting.flashKeys.size()},
+      presses_(context_),
+      place_(format.size()) {
+  Surroundings& surroundings = *this;
+  recorder_ = std::make_shared<Recorder>(setting.script, surroundings, setting.watchedLists);
+  facts_ = &recorder_->facts();
   build(std::nullopt);
 }
 
@@ -113,7 +123,7 @@ void World::build(const std::optional<std::string>& startKey) {
 
 void World::observe() {
   controls_.clear();
-  indexOf_.clear();
+  indices_.clear();
   tagCounts_.clear();
   touched_.clear();
   sharedTags_ = 0;
@@ -125,20 +135,28 @@ void World::observe() {
     control.state = stateOf(control);
     control.look = looks_.valueOf(lookOf(control));
     parts_.push_back(control.look);
-    indexOf_.emplace(view.pointer().get(), controls_.size());
+    indices_.emplace(view.pointer().get(), controls_.size());
     if (++tagCounts_[control.state.tag] == 2) ++sharedTags_;
     controls_.push_back(std::move(control));
   }
   const std::size_t taggers = setting_.tracksTaggers ? controls_.size() : 0;
-  parts_.resize(controls_.size() + 2 + setting_.flashKeys.size() + taggers, notedNothing);
+  parts_.resize(controls_.size() + context_.notes + taggers, notedNothing);
   const auto content = stage_->engine().tutorialWindow()->contentView();
   parts_[controls_.size()] = looks_.valueOf({ViewNode::of(content)->save(), false});
   parts_[controls_.size() + 1] = notedNo;
   look_ = looks_.numberOf(parts_);
-  Surroundings& surroundings = *this;
-  recorder_ = std::make_shared<Recorder>(setting_.script, surroundings, setting_.watchedLists);
-  facts_ = &recorder_->facts();
+  readRestoredTags();
   stage_->engine().setObserver(recorder_);
+}
+
+void World::readRestoredTags() {
+  context_.restoredTags.assign(controls_.size(), std::nullopt);
+  for (const auto& [key, asset] : stage_->engine().guiAssets()->entries()) {
+    const Control* const control = controlOf(asset.control.get());
+    if (!control) continue;
+    const std::size_t index = indexOf(*control);
+    context_.restoredTags[index] = restoredTag(setting_.ownTags[index]);
+  }
 }
 
 Arrival World::start(const std::string& key, PendingTimers& timers, std::uint8_t* place) {
@@ -165,28 +183,30 @@ std::vector<Move> World::moves(const std::uint8_t* place, const PendingTimers& p
 
 Arrival World::make(Move move, const std::uint8_t* from, std::uint32_t look,
                     const PendingTimers& pending, PendingTimers& timers, std::uint8_t* place) {
-  const Departure departure{from, look, pending};
-  if (move == waitMove) return makeAnew(move, departure, timers, place);
-  if (const RememberedPress* known = presses_.find(move, departure)) {
-    known->apply(format_, from, place);
+  const Station station{from, look, looks_.parts(look)};
+  if (move == waitMove) return makeAnew(move, station, pending, timers, place);
+  if (const RememberedPress* known = presses_.find(move, station)) {
+    known->writePlace(context_, station, place);
     timers = known->timers;
     facts_ = &known->facts;
-    return known->arrival;
+    Arrival arrival = known->arrival;
+    arrival.look = known->lookAfter(context_, station, looks_);
+    return arrival;
   }
-  Arrival arrival = makeAnew(move, departure, timers, place);
-  remember(departure, arrival, timers);
+  Arrival arrival = makeAnew(move, station, pending, timers, place);
+  remember(station, arrival, timers);
   return arrival;
 }
 
-Arrival World::makeAnew(Move move, const Departure& from, PendingTimers& timers,
-                        std::uint8_t* place) {
+Arrival World::makeAnew(Move move, const Station& from, const PendingTimers& pending,
+                        PendingTimers& timers, std::uint8_t* place) {
   goTo(from.place, from.look);
   trace_.clear();
   recorder_->begin();
   facts_ = &recorder_->facts();
   try {
     if (move == waitMove) {
-      wait(from.pending.front());
+      wait(pending.front());
     } else {
       press(move);
     }
@@ -196,13 +216,10 @@ Arrival World::makeAnew(Move move, const Departure& from, PendingTimers& timers,
   return arrive(move, timers, place);
 }
 
-// An end gives all controls their tags back, and after an endless run the world is of no use.
-void World::remember(const Departure& from, const Arrival& arrival, const PendingTimers& timers) {
-  if (arrival.isEndless || format_.isOver(place_.data()) || trace_.isLong() ||
-      setting_.tracksTaggers || recorder_->isFirstTime()) {
-    return;
-  }
-  RememberedPress press(format_, trace_, from, place_.data());
+// After an endless run the world is of no use.
+void World::remember(const Station& from, const Arrival& arrival, const PendingTimers& timers) {
+  if (arrival.isEndless || trace_.isLong() || recorder_->isFirstTime()) return;
+  RememberedPress press(context_, trace_, from, {place_.data(), look_, parts_});
   press.arrival = arrival;
   press.timers = timers;
   press.facts = recorder_->facts();
@@ -357,7 +374,7 @@ ViewLook World::lookOf(const Control& control) const {
 
 void World::readTouched(std::uint8_t* place) {
   if (stage_->engine().terminating()) {  // the end restores tags without looking controls up
-    for (const Control& control : controls_) willTouch(control.view);
+    for (Control& control : controls_) touch(control);
   }
   bool looksElse = std::exchange(hasNewTaggers_, false);
   for (const std::size_t index : touched_) {
@@ -412,16 +429,19 @@ ControlState World::stateOf(const Control& control) const {
 }
 
 World::Control* World::controlOf(const toolkit::Ref<toolkit::View>& view) {
-  const auto found = indexOf_.find(view.pointer().get());
-  return found == indexOf_.end() ? nullptr : &controls_[found->second];
+  const auto found = indices_.find(view.pointer().get());
+  return found == indices_.end() ? nullptr : &controls_[found->second];
 }
 
 void World::willTouch(const toolkit::Ref<toolkit::View>& view) {
   Control* const control = controlOf(view);
-  if (!control || control->isTouched) return;
-  control->isTouched = true;
-  touched_.push_back(static_cast<std::size_t>(control - controls_.data()));
-  trace_.addControl(touched_.back());
+  if (!control) return;
+  touch(*control);
+  trace_.addControl(indexOf(*control));
+}
+
+void World::touch(Control& control) {
+  if (!std::exchange(control.isTouched, true)) touched_.push_back(indexOf(control));
 }
 
 void World::tagWasSought(Tag tag) { trace_.addTag(tag); }
@@ -432,7 +452,7 @@ void World::tagMayHaveChanged(const toolkit::Ref<toolkit::View>& view, std::uint
 
 void World::tagsMayBeRestored() {
   for (Control& control : controls_) {
-    willTouch(control.view);
+    touch(control);
     updateTag(control, 0);
   }
 }
@@ -441,10 +461,10 @@ void World::updateTag(Control& control, LookValue tagger) {
   const ControlState before = control.state;
   setTag(control, control.view->tag());
   if (before == control.state) return;
-  const auto index = static_cast<std::size_t>(&control - controls_.data());
+  const std::size_t index = indexOf(control);
   format_.setControl(place_.data(), index, control.state);
   if (!setting_.tracksTaggers) return;
-  LookValue& known = parts_[parts_.size() - controls_.size() + index];
+  LookValue& known = parts_[*context_.taggerPart(parts_, index)];
   hasNewTaggers_ |= known != tagger;
   known = tagger;
 }
@@ -465,8 +485,8 @@ std::size_t World::controlsWithTag(Tag tag) {
 }
 
 drivers::ViewKind World::kindOf(const toolkit::Ref<toolkit::View>& view) const {
-  const auto found = indexOf_.find(view.pointer().get());
-  return found == indexOf_.end() ? drivers::ViewKind::plain : setting_.kinds[found->second];
+  const auto found = indices_.find(view.pointer().get());
+  return found == indices_.end() ? drivers::ViewKind::plain : setting_.kinds[found->second];
 }
 
 }  // namespace qz::tools::check

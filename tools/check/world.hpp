@@ -41,6 +41,10 @@ struct Setting {
 /// Reads from a world of its own what all worlds share.
 Setting settingOf(const Script& script, const walkthrough::StagePlan& plan, std::string resources);
 
+/// Returns the tag that the end of a walk-through gives to a control whose own tag is `tag`: the
+/// engine takes it as an `int`.
+Tag restoredTag(Tag tag);
+
 class World final : private Surroundings {
  public:
   World(const Setting& setting, const PlaceFormat& format, Looks& looks);
@@ -85,11 +89,14 @@ class World final : private Surroundings {
 
   void build(const std::optional<std::string>& startKey);
   void observe();
-  Arrival makeAnew(Move move, const Departure& from, PendingTimers& timers, std::uint8_t* place);
+  void readRestoredTags();
+  Arrival makeAnew(Move move, const Station& from, const PendingTimers& pending,
+                   PendingTimers& timers, std::uint8_t* place);
   void goTo(const std::uint8_t* place, std::uint32_t look);
-  void remember(const Departure& from, const Arrival& arrival, const PendingTimers& timers);
+  void remember(const Station& from, const Arrival& arrival, const PendingTimers& timers);
   void restoreLook(std::uint32_t look);
   void press(std::size_t control);
+  void touch(Control& control);
   void wait(const PendingTimer& first);
   void noteIfShared(Tag tag);
   void noteIfTimerPressesShared(const std::string& key);
@@ -103,6 +110,9 @@ class World final : private Surroundings {
   void updateTag(Control& control, LookValue tagger);
   ControlState stateOf(const Control& control) const;
   Control* controlOf(const toolkit::Ref<toolkit::View>& view);
+  std::size_t indexOf(const Control& control) const {
+    return static_cast<std::size_t>(&control - controls_.data());
+  }
 
   const Setting& setting_;
   const PlaceFormat& format_;
@@ -111,11 +121,12 @@ class World final : private Surroundings {
   std::unique_ptr<walkthrough::Stage> stage_;
   std::shared_ptr<Recorder> recorder_;
   std::vector<Control> controls_;
-  std::unordered_map<const toolkit::View*, std::size_t> indexOf_;
+  std::unordered_map<const toolkit::View*, std::size_t> indices_;
   std::vector<std::size_t> touched_;
   std::unordered_map<Tag, std::size_t> tagCounts_;
   std::size_t sharedTags_ = 0;  // how many tags two controls or more have
   Trace trace_;                 // of the press
+  PressContext context_;
   RememberedPresses presses_;
   const std::vector<Fact>* facts_ = nullptr;
   std::vector<std::uint8_t> place_;  // where the world is
