@@ -105,6 +105,14 @@ TEST_F(Processors, AListIsChainedByAllTheBitsOfItsTag) {
   EXPECT_EQ(engine->currentCommandState(), "4294967303");
 }
 
+TEST_F(Processors, ATimerThatZeroSecondsCancelIsNoLongerValid) {
+  engine->QZ_Plist_State_Processor_SET_TIMER(3, Number::withLong(7));
+  const toolkit::Ref<toolkit::Timer> timer = engine->objectIdTimers()->objectForKey("7");
+  ASSERT_TRUE(timer->isValid());
+  engine->QZ_Plist_State_Processor_SET_TIMER(0, Number::withLong(7));
+  EXPECT_FALSE(timer->isValid());
+}
+
 TEST_F(Processors, ATimerValueHas64Bits) {
   engine->QZ_Plist_State_Processor_SET_TIMER(8'589'934'592, Number::withLong(7));
   EXPECT_EQ(engine->objectIdTimers()->objectForKey("7")->interval(), 8'589'934'592.0);

@@ -18,6 +18,7 @@ TEST(ScriptProblem, SaysWhatIsWrong) {
       {"{ 1 = (IDLE_LOOP); }", ""},
       {"{ 1 = (IDLE_LOOP); about = text; \"-3\" = (); }", ""},
       {"{ 1 = (IDLE_LOOP); 2 = text; }", ""},
+      {"{ 4294967303 = (IDLE_LOOP); }", ""},
       {"{}", "no key is a tag (a whole decimal number)"},
       {"{ start = (IDLE_LOOP); 007 = (); }", "no key is a tag (a whole decimal number)"},
       {"{ 1 = (IDLE_LOOP); \"-3\" = text; }",

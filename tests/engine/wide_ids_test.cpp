@@ -74,6 +74,23 @@ TEST_F(WideIds, ReachTheControlWithAllOfThem) {
   EXPECT_EQ(driver.look(nearField).toolTip, "");
 }
 
+TEST_F(WideIds, ReachTheButtonWhoseBackgroundIsSet) {
+  const auto nearButton = view(drivers::ViewKind::button, near);
+  const auto button = view(drivers::ViewKind::button, far);
+  EXPECT_TRUE(engine->QZ_Plist_State_Processor_SET_BACKGROUND_COLOR(0, Number::withLong(far)));
+  EXPECT_EQ(driver.look(button).background, toolkit::colors::red);
+  EXPECT_FALSE(driver.look(nearButton).background);
+}
+
+TEST_F(WideIds, OfAToolTipsTargetCountInTheir32LowBits) {
+  const auto nearField = view(drivers::ViewKind::textField, near);
+  const auto field = view(drivers::ViewKind::textField, far);
+  EXPECT_TRUE(engine->QZ_Plist_State_Processor_SET_TOOL_TIP(
+      Array::make({String::make("tip"), Number::withLong(far)}), Number::withLong(far)));
+  EXPECT_EQ(driver.look(nearField).toolTip, "tip");
+  EXPECT_EQ(driver.look(field).toolTip, "");
+}
+
 TEST_F(WideIds, AreTagsFromTheControlToTheKeyAndBack) {
   constexpr std::pair<toolkit::Tag, const char*> rows[] = {
       {toolkit::Tag{1} << 40, "1099511627776"},

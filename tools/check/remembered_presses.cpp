@@ -8,7 +8,7 @@ namespace qz::tools::check {
 namespace {
 
 constexpr std::size_t longestTrace = 32;
-constexpr std::size_t pressesOfAControl = 64;
+constexpr std::size_t pressesOfARing = 64;
 constexpr std::size_t mostPresses = 20'000;  // some 10 MB
 
 /// Returns NO if that would make the trace too long.
@@ -25,12 +25,15 @@ bool addOnce(std::vector<Each>& all, Each one) {
 void Trace::clear() {
   controls_.clear();
   tags_.clear();
+  tagged_.clear();
   isLong_ = false;
 }
 
 void Trace::addControl(std::size_t control) { isLong_ = isLong_ || !addOnce(controls_, control); }
 
 void Trace::addTag(Tag tag) { isLong_ = isLong_ || !addOnce(tags_, tag); }
+
+void Trace::addTagged(std::size_t control) { isLong_ = isLong_ || !addOnce(tagged_, control); }
 
 std::optional<std::size_t> PressContext::taggerPart(const Looks::Parts& parts,
                                                     std::size_t control) const {
@@ -45,9 +48,10 @@ RememberedPress::RememberedPress(const PressContext& context, const Trace& trace
   for (const std::size_t control : trace.controls()) {
     changes_.push_back({control, format.code(from.place, control), format.code(to.place, control)});
     addLookChange(control, from, to);
-    if (const auto tagger = context.taggerPart(from.parts, control)) {
-      addLookChange(*tagger, from, to);
-    }
+  }
+  for (const std::size_t control : trace.tagged()) {
+    const auto part = context.taggerPart(from.parts, control);
+    if (part) newTaggers_.push_back({*part, to.parts[*part]});
   }
   for (std::size_t i = 0; i < context.notes; ++i) addLookChange(format.controls() + i, from, to);
   for (const Tag tag : trace.tags()) {
@@ -104,31 +108,52 @@ std::uint32_t RememberedPress::lookAfter(const PressContext& context, const Stat
                                          Looks& looks) const {
   const bool restoresTaggers = ends_ && context.taggerPart(from.parts, 0);
   if (!restoresTaggers && from.look == look_) return arrival.look;
-  if (!restoresTaggers && !changesLook_) return from.look;
+  if (!restoresTaggers && !changesLook_ && newTaggers_.empty()) return from.look;
   Looks::Parts parts = from.parts;
   for (std::size_t i = 0; restoresTaggers && i < context.format.controls(); ++i) {
     const Tag tag = context.format.control(from.place, i).tag;
     if (context.restoredTags[i].value_or(tag) != tag) parts[*context.taggerPart(parts, i)] = 0;
   }
   for (const LookChange& change : lookChanges_) parts[change.part] = change.after;
+  for (const NewTagger& tagger : newTaggers_) parts[tagger.part] = tagger.value;
   return looks.numberOf(parts);
 }
 
+std::size_t RememberedPresses::Hash::operator()(const Pressed& pressed) const {
+  std::uint64_t bits = pressed.control;
+  for (const std::uint32_t each : {pressed.code, pressed.look}) {
+    bits = (bits ^ bits >> 32U) * 0x9e3779b97f4a7c15U + each;  // 2^64 by the golden ratio
+  }
+  return bits;
+}
+
+RememberedPresses::Pressed RememberedPresses::pressedAt(std::size_t control,
+                                                        const Station& from) const {
+  return {.control = control,
+          .code = context_.format.code(from.place, control),
+          .look = from.parts[control]};
+}
+
 const RememberedPress* RememberedPresses::find(std::size_t control, const Station& from) const {
-  const auto& presses = rings_[control].presses;
+  const auto ring = rings_.find(pressedAt(control, from));
+  if (ring == rings_.end()) return nullptr;
+  const auto& presses = ring->second.presses;
   const auto found = std::find_if(presses.begin(), presses.end(),
                                   [&](const auto& each) { return each.fits(context_, from); });
   return found == presses.end() ? nullptr : &*found;
 }
 
-void RememberedPresses::add(std::size_t control, RememberedPress press) {
-  Ring& ring = rings_[control];
-  if (ring.presses.size() < pressesOfAControl && count_ < mostPresses) {
+void RememberedPresses::add(std::size_t control, const Station& from, RememberedPress press) {
+  if (count_ == mostPresses) {
+    rings_.clear();
+    count_ = 0;
+  }
+  Ring& ring = rings_[pressedAt(control, from)];
+  if (ring.presses.size() < pressesOfARing) {
     ring.presses.push_back(std::move(press));
     ++count_;
     return;
   }
-  if (ring.presses.empty()) return;
   ring.presses[ring.oldest] = std::move(press);
   ring.oldest = (ring.oldest + 1) % ring.presses.size();
 }

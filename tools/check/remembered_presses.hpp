@@ -6,6 +6,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <optional>
+#include <unordered_map>
 #include <vector>
 
 #include "tools/check/arrival.hpp"
@@ -35,7 +36,8 @@ struct PressContext {
   std::optional<std::size_t> taggerPart(const Looks::Parts& parts, std::size_t control) const;
 };
 
-/// The controls that a press has looked up, and the tags that it has looked for. A press depends on
+/// The controls that a press has looked up, the tags that it has looked for, and the controls to
+/// which an element may have given another tag. A press depends on
 /// nothing else but the engine's notes in the look: it cancels the pending timers first. It changes
 /// no other control, but an end gives all controls their own tags back.
 class Trace {
@@ -43,15 +45,18 @@ class Trace {
   void clear();
   void addControl(std::size_t control);
   void addTag(Tag tag);
+  void addTagged(std::size_t control);
   /// Whether there are so many that finding them again takes as long as the press.
   bool isLong() const { return isLong_; }
 
   const std::vector<std::size_t>& controls() const { return controls_; }
   const std::vector<Tag>& tags() const { return tags_; }
+  const std::vector<std::size_t>& tagged() const { return tagged_; }
 
  private:
   std::vector<std::size_t> controls_;
   std::vector<Tag> tags_;
+  std::vector<std::size_t> tagged_;
   bool isLong_ = false;
 };
 
@@ -83,6 +88,10 @@ class RememberedPress {
     LookValue before;
     LookValue after;
   };
+  struct NewTagger {
+    std::size_t part;
+    LookValue value;
+  };
   struct Bearers {
     std::uint32_t tag;  // its number
     std::vector<std::size_t> controls;
@@ -95,27 +104,39 @@ class RememberedPress {
   bool changesLook_ = false;
   std::vector<Change> changes_;
   std::vector<LookChange> lookChanges_;
+  std::vector<NewTagger> newTaggers_;
   std::vector<Bearers> bearers_;
 };
 
-/// The last presses of each control.
+/// The last presses of each control in each of its states.
 class RememberedPresses {
  public:
-  explicit RememberedPresses(const PressContext& context)
-      : context_(context), rings_(context.format.controls()) {}
+  explicit RememberedPresses(const PressContext& context) : context_(context) {}
 
   /// Returns null if nothing is remembered that fits.
   const RememberedPress* find(std::size_t control, const Station& from) const;
-  void add(std::size_t control, RememberedPress press);
+  void add(std::size_t control, const Station& from, RememberedPress press);
 
  private:
+  /// The control that is pressed, as it is before.
+  struct Pressed {
+    std::size_t control;
+    std::uint32_t code;
+    LookValue look;
+    friend bool operator==(const Pressed&, const Pressed&) = default;
+  };
+  struct Hash {
+    std::size_t operator()(const Pressed& pressed) const;
+  };
   struct Ring {
     std::vector<RememberedPress> presses;
     std::size_t oldest = 0;
   };
 
+  Pressed pressedAt(std::size_t control, const Station& from) const;
+
   const PressContext& context_;
-  std::vector<Ring> rings_;  // by control
+  std::unordered_map<Pressed, Ring, Hash> rings_;
   std::size_t count_ = 0;
 };
 

@@ -223,7 +223,7 @@ void World::remember(const Station& from, const Arrival& arrival, const PendingT
   press.arrival = arrival;
   press.timers = timers;
   press.facts = recorder_->facts();
-  presses_.add(arrival.move, std::move(press));
+  presses_.add(arrival.move, from, std::move(press));
 }
 
 void World::goTo(const std::uint8_t* place, std::uint32_t look) {
@@ -447,7 +447,9 @@ void World::touch(Control& control) {
 void World::tagWasSought(Tag tag) { trace_.addTag(tag); }
 
 void World::tagMayHaveChanged(const toolkit::Ref<toolkit::View>& view, std::uint32_t element) {
-  if (Control* const control = controlOf(view)) updateTag(*control, element + 1);
+  Control* const control = controlOf(view);
+  if (!control) return;
+  if (updateTag(*control, element + 1)) trace_.addTagged(indexOf(*control));
 }
 
 void World::tagsMayBeRestored() {
@@ -457,16 +459,17 @@ void World::tagsMayBeRestored() {
   }
 }
 
-void World::updateTag(Control& control, LookValue tagger) {
+bool World::updateTag(Control& control, LookValue tagger) {
   const ControlState before = control.state;
   setTag(control, control.view->tag());
-  if (before == control.state) return;
+  if (before == control.state) return false;
   const std::size_t index = indexOf(control);
   format_.setControl(place_.data(), index, control.state);
-  if (!setting_.tracksTaggers) return;
+  if (!setting_.tracksTaggers) return true;
   LookValue& known = parts_[*context_.taggerPart(parts_, index)];
   hasNewTaggers_ |= known != tagger;
   known = tagger;
+  return true;
 }
 
 void World::stateWasSet(const toolkit::Ref<toolkit::View>& view) {

@@ -107,7 +107,8 @@ class World final : private Surroundings {
   void readTouched(std::uint8_t* place);
   void readEngine();
   void setTag(Control& control, Tag tag);
-  void updateTag(Control& control, LookValue tagger);
+  /// Returns whether the control has another tag.
+  bool updateTag(Control& control, LookValue tagger);
   ControlState stateOf(const Control& control) const;
   Control* controlOf(const toolkit::Ref<toolkit::View>& view);
   std::size_t indexOf(const Control& control) const {
