@@ -417,6 +417,24 @@ TEST_F(OddCharacters, AreVisibleInJunit) {
                "50% of “a”, b: <c> & \"d\" 'e' é 😀\\n::error::f\\u{d} \\u{1b}[2J");
 }
 
+// Readers of XML refuse a file with these, although they are UTF-8.
+TEST_F(OddCharacters, ThatXmlForbidsAreReplacedInJunit) {
+  makeVerdict("a\uFFFEb.plist");
+  addFinding("c\uFFFFd \uFFFD\uE000\U0001FFFE");
+  verdict_.findings[0].path = {StartMove{"e\uFFFEf"}};
+  const std::string text = written(writeJunit);
+  for (const char* const forbidden : {"\uFFFE", "\uFFFF"}) {
+    EXPECT_EQ(text.find(forbidden), std::string::npos) << text;
+  }
+  const auto document = xmlOf(text);
+  const auto suite = document.child("testsuites").child("testsuite");
+  EXPECT_STREQ(suite.attribute("name").value(), "a\uFFFDb.plist");
+  const auto failure = suite.child("testcase").child("failure");
+  EXPECT_STREQ(failure.attribute("message").value(), "c\uFFFDd \uFFFD\uE000\U0001FFFE");
+  EXPECT_NE(std::string(failure.text().get()).find("--start 'e\uFFFDf'"), std::string::npos)
+      << text;
+}
+
 /// Undoes the escapes of a workflow command.
 std::string unescaped(std::string text) {
   const std::pair<const char*, const char*> escapes[] = {

@@ -6,35 +6,15 @@
 
 #include "tools/check/report.hpp"
 #include "tools/support/text_layout.hpp"
+#include "tools/support/xml_text.hpp"
 
 namespace qz::tools::check {
 namespace {
 
-std::string xmlText(const std::string& text) {
-  std::string result;
-  for (const char c : oneLine(text)) {
-    switch (c) {
-      case '&':
-        result += "&amp;";
-        break;
-      case '<':
-        result += "&lt;";
-        break;
-      case '>':
-        result += "&gt;";
-        break;
-      case '"':
-        result += "&quot;";
-        break;
-      default:
-        result += c;
-    }
-  }
-  return result;
-}
+std::string xmlLine(const std::string& text) { return xmlText(oneLine(text)); }
 
 std::string attribute(const std::string& name, const std::string& value) {
-  return " " + name + "=\"" + xmlText(value) + "\"";
+  return " " + name + "=\"" + xmlLine(value) + "\"";
 }
 
 bool isFailure(const Report& report, const Finding& finding) {
@@ -48,7 +28,7 @@ void writeCase(const Report& report, const Finding& finding, std::ostream& out) 
     std::string details = placeOf(finding, report.file);
     if (!finding.path.empty()) details += ": " + playCommand(report, finding.path);
     out << "      <failure" << attribute("type", std::string(nameOf(finding.severity)))
-        << attribute("message", finding.message) << ">" << xmlText(details) << "</failure>\n";
+        << attribute("message", finding.message) << ">" << xmlLine(details) << "</failure>\n";
   }
   out << "    </testcase>\n";
 }
