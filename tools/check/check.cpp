@@ -67,7 +67,7 @@ void requireTags(const std::vector<Expectation>& expectations, const Setting& se
   tags.insert(given.begin(), given.end());
   const auto require = [&](const Condition& condition, const Expectation& expectation) {
     if (!isAboutControl(condition) || tags.contains(condition.tag)) return;
-    throw Failure(ExitStatus::badInput, expectation.place.text() +
+    throw Failure(ExitStatus::badInput, expectation.place.text(condition.column) +
                                             ": no control ever has the tag " +
                                             std::to_string(condition.tag));
   };
