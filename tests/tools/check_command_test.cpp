@@ -168,6 +168,15 @@ TEST_F(CheckCommand, ReportsTheOtherScriptsIfOneCannotBeRead) {
   EXPECT_EQ(result.err, "qz-walkthrough: none.plist: no such file; expected a script\n");
 }
 
+TEST_F(CheckCommand, RefusesAStartInAScriptWithoutLists) {
+  directory_.write("empty.plist", "{}");
+  const Result result = check({"empty.plist", "--start", "1"});
+  EXPECT_EQ(result.status, 2);
+  EXPECT_EQ(result.err,
+            "qz-walkthrough: empty.plist:1:1: no list under the start key “1”; the script has no "
+            "lists\n");
+}
+
 TEST_F(CheckCommand, GivesTheSameBytesWithAnyNumberOfThreads) {
   const std::vector<std::string> scripts{"warning.plist", "clean.plist", "error.plist",
                                          "note.plist"};
