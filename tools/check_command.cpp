@@ -172,14 +172,23 @@ void writeWitnesses(const CommandOptions& options, const std::vector<Job>& jobs)
   }
 }
 
-int explain(const std::string& code) {
-  std::vector<std::string_view> names;
-  for (const check::Code& each : check::codes()) names.push_back(each.name);
-  const auto text = check::explanationOf(code);
-  if (!text) {
-    throw Failure(ExitStatus::badInput,
-                  "--explain: no finding has the code " + quote(code) + didYouMean(code, names));
+[[noreturn]] void wrongCode(const std::string& code) {
+  std::vector<std::string> names;
+  std::vector<std::string_view> candidates;
+  for (const check::Code& each : check::codes()) {
+    names.emplace_back(each.name);
+    candidates.push_back(each.name);
   }
+  const auto suggestion = didYouMean(code, candidates);
+  throw Failure(ExitStatus::badInput,
+                "--explain: no finding has the code " + quote(code) +
+                    (suggestion.empty() ? "; expected " : suggestion + " Expected ") +
+                    enumerate(names));
+}
+
+int explain(const std::string& code) {
+  const auto text = check::explanationOf(code);
+  if (!text) wrongCode(code);
   std::cout << *text;
   return static_cast<int>(ExitStatus::fine);
 }

@@ -13,7 +13,9 @@
 
 #include "play_files.hpp"
 #include "tool_run.hpp"
+#include "tools/check/finding.hpp"
 #include "tools/commands.hpp"
+#include "tools/support/suggestions.hpp"
 #include "tools/support/whole_file.hpp"
 
 namespace qz::tools {
@@ -297,13 +299,19 @@ TEST_F(CheckCommand, ExplainsACode) {
   EXPECT_TRUE(result.out.starts_with("never-runs\n\nSeverity: warning.\n")) << result.out;
 }
 
-TEST_F(CheckCommand, NamesTheCodeThatIsLikelyMeant) {
-  const Result result = check({"--explain", "never-run"});
-  EXPECT_EQ(result.status, 2);
-  EXPECT_EQ(result.err,
+TEST_F(CheckCommand, NamesTheCodesThatItCanExplain) {
+  std::vector<std::string> names;
+  for (const check::Code& code : check::codes()) names.emplace_back(code.name);
+  const std::string known = enumerate(names) + "\n";
+  const Result near = check({"--explain", "never-run"});
+  EXPECT_EQ(near.status, 2);
+  EXPECT_EQ(near.err,
             "qz-walkthrough: --explain: no finding has the code “never-run”; did you mean "
-            "\"never-runs\"?\n");
-  EXPECT_EQ(check({"--explain", "xyz"}).status, 2);
+            "\"never-runs\"? Expected " +
+                known);
+  const Result far = check({"--explain", "xyz"});
+  EXPECT_EQ(far.status, 2);
+  EXPECT_EQ(far.err, "qz-walkthrough: --explain: no finding has the code “xyz”; expected " + known);
 }
 
 TEST_F(CheckCommand, WritesEveryFormat) {
