@@ -151,24 +151,34 @@ void mergeAllowances(std::vector<Job>& jobs) {
   check::mergeUnneeded(scripts);
 }
 
-void applyBaseline(const CommandOptions& options, std::vector<Job>& jobs) {
-  if (!options.baseline) return;
-  const bool isThere = std::filesystem::exists(*options.baseline);
-  auto baseline = options.updateBaseline && !isThere ? check::Baseline::empty(*options.baseline)
-                                                     : check::Baseline::read(*options.baseline);
-  for (Job& job : jobs) {
-    if (job.failure) continue;
-    if (options.updateBaseline) baseline.replace(job.verdict.path, job.verdict.findings);
-    job.verdict.inBaseline = baseline.takeBack(job.verdict.path, job.verdict.findings);
-  }
-  if (options.updateBaseline) baseline.write();
+check::Baseline newBaseline(const std::string& path) {
+  const auto folder = std::filesystem::absolute(path).parent_path();
+  if (std::filesystem::is_directory(folder)) return check::Baseline::empty(path);
+  throw Failure(ExitStatus::badInput,
+                path + ": cannot be written; expected a path in a directory that is there");
 }
 
-void writeWitnesses(const CommandOptions& options, const std::vector<Job>& jobs) {
-  if (!options.witness) return;
-  check::WitnessWriter writer(*options.witness);
+/// Returns the baseline of the options, if they name one. Throws a Failure if it cannot be read, or
+/// if a new one could not be written.
+std::optional<check::Baseline> baselineOf(const CommandOptions& options) {
+  if (!options.baseline) return std::nullopt;
+  const bool isNew = options.updateBaseline && !std::filesystem::exists(*options.baseline);
+  return isNew ? newBaseline(*options.baseline) : check::Baseline::read(*options.baseline);
+}
+
+void applyBaseline(check::Baseline& baseline, bool isUpdated, std::vector<Job>& jobs) {
+  for (Job& job : jobs) {
+    if (job.failure) continue;
+    if (isUpdated) baseline.replace(job.verdict.path, job.verdict.findings);
+    job.verdict.inBaseline = baseline.takeBack(job.verdict.path, job.verdict.findings);
+  }
+  if (isUpdated) baseline.write();
+}
+
+void writeWitnesses(check::WitnessWriter& writer, const CheckOptions& options,
+                    const std::vector<Job>& jobs) {
   for (const Job& job : jobs) {
-    if (!job.failure) writer.write(job.verdict, *job.file, options.check);
+    if (!job.failure) writer.write(job.verdict, *job.file, options);
   }
 }
 
@@ -205,11 +215,15 @@ void requireSense(const CommandOptions& options) {
 int runCheck(const CommandOptions& options) {
   if (options.explain) return explain(*options.explain);
   requireSense(options);
+  // A mistake in these must not cost the time of the exploration.
   const auto& format = formatNamed(options.format);
+  auto baseline = baselineOf(options);
+  auto witnesses =
+      options.witness ? std::optional<check::WitnessWriter>(*options.witness) : std::nullopt;
   auto jobs = checkAll(options);
   mergeAllowances(jobs);
-  applyBaseline(options, jobs);
-  writeWitnesses(options, jobs);
+  if (baseline) applyBaseline(*baseline, options.updateBaseline, jobs);
+  if (witnesses) writeWitnesses(*witnesses, options.check, jobs);
   std::vector<check::Report> reports;
   for (const Job& job : jobs) {
     if (!job.failure) {

@@ -2,6 +2,7 @@
 // The command line of `qz-walkthrough check`: what it refuses, its exit statuses, and its files.
 #include <gtest/gtest.h>
 #include <signal.h>
+#include <sys/inotify.h>
 #include <sys/socket.h>
 #include <sys/un.h>
 #include <unistd.h>
@@ -285,6 +286,53 @@ TEST_F(CheckCommand, KeepsABaselineThatItCannotRead) {
   EXPECT_EQ(result.status, 2);
   EXPECT_TRUE(contains(result.err, "known: expected a baseline")) << result.err;
   EXPECT_EQ(*wholeFile("known"), "something else");
+}
+
+/// Notes whether anybody opens a file.
+class OpenWatch {
+ public:
+  explicit OpenWatch(const char* path) : descriptor_(::inotify_init1(IN_NONBLOCK | IN_CLOEXEC)) {
+    EXPECT_GE(::inotify_add_watch(descriptor_, path, IN_OPEN), 0) << path;
+  }
+  ~OpenWatch() { ::close(descriptor_); }
+  OpenWatch(const OpenWatch&) = delete;
+  OpenWatch& operator=(const OpenWatch&) = delete;
+
+  /// Whether the file was opened since the last call.
+  bool hasSeenAny() const {
+    alignas(inotify_event) char events[4096];
+    return ::read(descriptor_, events, sizeof events) > 0;
+  }
+
+ private:
+  int descriptor_;
+};
+
+TEST_F(CheckCommand, DoesNotBeginIfItCouldNotTakeBackOrWriteTheFindings) {
+  directory_.write("broken", "{\"version\": 1, \"scripts\": {");
+  const struct {
+    std::vector<std::string> options;
+    const char* words;
+  } cases[] = {
+      {{"--baseline", "none"}, "none: cannot be read; --update-baseline writes a baseline"},
+      {{"--baseline", "broken"}, "broken: expected a baseline, as --update-baseline writes it"},
+      {{"--baseline", "broken", "--update-baseline"}, "broken: expected a baseline"},
+      {{"--baseline", "no/such", "--update-baseline"},
+       "no/such: cannot be written; expected a path in a directory that is there"},
+      {{"--witness", "broken"}, "broken: expected a directory"},
+  };
+  const OpenWatch script("warning.plist");
+  for (const auto& test : cases) {
+    auto arguments = test.options;
+    arguments.insert(arguments.begin(), "warning.plist");
+    const Result result = checkInWindow(arguments);
+    EXPECT_EQ(result.status, 2) << test.words;
+    EXPECT_TRUE(result.err.starts_with("qz-walkthrough: " + std::string(test.words))) << result.err;
+    EXPECT_EQ(result.out, "") << test.words;
+    EXPECT_FALSE(script.hasSeenAny()) << test.words;
+  }
+  checkInWindow({"warning.plist"});
+  EXPECT_TRUE(script.hasSeenAny()) << "otherwise the watch sees nothing";
 }
 
 TEST_F(CheckCommand, WritesScenariosThatPass) {
