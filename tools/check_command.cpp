@@ -182,6 +182,19 @@ void writeWitnesses(check::WitnessWriter& writer, const CheckOptions& options,
   }
 }
 
+check::RunReport reportOf(const CommandOptions& options, const std::vector<Job>& jobs) {
+  check::RunReport run;
+  for (std::size_t i = 0; i < jobs.size(); ++i) {
+    if (const auto& failure = jobs[i].failure) {
+      run.unchecked.push_back({options.scripts[i], failure->what()});
+    } else {
+      run.scripts.push_back(
+          {jobs[i].verdict, *jobs[i].file, stageArguments(options.check), options.failOn});
+    }
+  }
+  return run;
+}
+
 [[noreturn]] void wrongCode(const std::string& code) {
   std::vector<std::string> names;
   std::vector<std::string_view> candidates;
@@ -224,16 +237,11 @@ int runCheck(const CommandOptions& options) {
   mergeAllowances(jobs);
   if (baseline) applyBaseline(*baseline, options.updateBaseline, jobs);
   if (witnesses) writeWitnesses(*witnesses, options.check, jobs);
-  std::vector<check::Report> reports;
-  for (const Job& job : jobs) {
-    if (!job.failure) {
-      reports.push_back({job.verdict, *job.file, stageArguments(options.check), options.failOn});
-    }
-  }
-  format.write(reports, outputShowsColor(), std::cout);
+  const auto run = reportOf(options, jobs);
+  format.write(run, outputShowsColor(), std::cout);
   std::cout.flush();
-  for (const Job& job : jobs) {
-    if (job.failure) std::cerr << "qz-walkthrough: " << job.failure->what() << '\n';
+  for (const auto& each : run.unchecked) {
+    std::cerr << "qz-walkthrough: " << oneLine(each.message) << '\n';
   }
   return statusOf(jobs, options.failOn);
 }

@@ -171,6 +171,34 @@ TEST_F(CheckCommand, ReportsTheOtherScriptsIfOneCannotBeRead) {
   EXPECT_EQ(result.err, "qz-walkthrough: none.plist: no such file; expected a script\n");
 }
 
+TEST_F(CheckCommand, NamesInEveryReportTheScriptsThatItCouldNotCheck) {
+  const std::pair<const char*, const char*> formats[] = {
+      {"text", "\n1 of 2 scripts could not be checked: none.plist\n"},
+      {"json", "\"script\": \"none.plist\""},
+      {"sarif", "\"uri\": \"none.plist\""},
+      {"junit", "<testsuite name=\"none.plist\" tests=\"1\" failures=\"0\" errors=\"1\">"},
+      {"github", "::error file=none.plist,title=not checked::none.plist: no such file"}};
+  for (const auto& [format, words] : formats) {
+    const Result result = checkInWindow({"none.plist", "note.plist", "--format", format});
+    EXPECT_EQ(result.status, 2) << format;
+    EXPECT_TRUE(contains(result.out, words)) << result.out;
+    EXPECT_EQ(result.err, "qz-walkthrough: none.plist: no such file; expected a script\n");
+  }
+}
+
+TEST_F(CheckCommand, SaysInAReportForProgramsThatTheOnlyScriptCouldNotBeChecked) {
+  for (const char* const format : {"json", "sarif", "junit", "github"}) {
+    const Result result = check({"none.plist", "--format", format});
+    EXPECT_TRUE(contains(result.out, "none.plist: no such file; expected a script")) << result.out;
+  }
+}
+
+TEST_F(CheckCommand, DoesNotDisturbTheTerminalWithThePathOfAScript) {
+  const Result result = check({"\x1b[2J.plist", "clean.plist"});
+  EXPECT_EQ(result.err, "qz-walkthrough: \\u{1b}[2J.plist: no such file; expected a script\n");
+  EXPECT_EQ(result.out.find('\x1b'), std::string::npos) << result.out;
+}
+
 TEST_F(CheckCommand, RefusesAStartInAScriptWithoutLists) {
   directory_.write("empty.plist", "{}");
   const Result result = check({"empty.plist", "--start", "1"});
