@@ -163,7 +163,9 @@ std::string reportsOf(const Verdict& verdict, const InputFile& file) {
   std::string reports;
   for (const ReportFormat& format : reportFormats()) {
     std::ostringstream report;
-    format.write({{verdict, file, "", Severity::warning}}, false, report);
+    const RunReport run{.scripts = {{verdict, file, "", Severity::warning}},
+                        .unchecked = {{.script = "none.plist", .message = "none.plist: no file"}}};
+    format.write(run, false, report);
     if (format.name == "json" || format.name == "sarif") {
       require(nlohmann::json::accept(report.str()), std::string(format.name) + " is JSON");
     }

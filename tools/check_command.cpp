@@ -151,35 +151,67 @@ void mergeAllowances(std::vector<Job>& jobs) {
   check::mergeUnneeded(scripts);
 }
 
-void applyBaseline(const CommandOptions& options, std::vector<Job>& jobs) {
-  if (!options.baseline) return;
-  const bool isThere = std::filesystem::exists(*options.baseline);
-  auto baseline = options.updateBaseline && !isThere ? check::Baseline::empty(*options.baseline)
-                                                     : check::Baseline::read(*options.baseline);
-  for (Job& job : jobs) {
-    if (job.failure) continue;
-    if (options.updateBaseline) baseline.replace(job.verdict.path, job.verdict.findings);
-    job.verdict.inBaseline = baseline.takeBack(job.verdict.path, job.verdict.findings);
-  }
-  if (options.updateBaseline) baseline.write();
+check::Baseline newBaseline(const std::string& path) {
+  const auto folder = std::filesystem::absolute(path).parent_path();
+  if (std::filesystem::is_directory(folder)) return check::Baseline::empty(path);
+  throw Failure(ExitStatus::badInput,
+                path + ": cannot be written; expected a path in a directory that is there");
 }
 
-void writeWitnesses(const CommandOptions& options, const std::vector<Job>& jobs) {
-  if (!options.witness) return;
-  check::WitnessWriter writer(*options.witness);
-  for (const Job& job : jobs) {
-    if (!job.failure) writer.write(job.verdict, *job.file, options.check);
+/// Returns the baseline of the options, if they name one. Throws a Failure if it cannot be read, or
+/// if a new one could not be written.
+std::optional<check::Baseline> baselineOf(const CommandOptions& options) {
+  if (!options.baseline) return std::nullopt;
+  const bool isNew = options.updateBaseline && !std::filesystem::exists(*options.baseline);
+  return isNew ? newBaseline(*options.baseline) : check::Baseline::read(*options.baseline);
+}
+
+void applyBaseline(check::Baseline& baseline, bool isUpdated, std::vector<Job>& jobs) {
+  for (Job& job : jobs) {
+    if (job.failure) continue;
+    if (isUpdated) baseline.replace(job.verdict.path, job.verdict.findings);
+    job.verdict.inBaseline = baseline.takeBack(job.verdict.path, job.verdict.findings);
   }
+  if (isUpdated) baseline.write();
+}
+
+void writeWitnesses(check::WitnessWriter& writer, const CheckOptions& options,
+                    const std::vector<Job>& jobs) {
+  for (const Job& job : jobs) {
+    if (!job.failure) writer.write(job.verdict, *job.file, options);
+  }
+}
+
+check::RunReport reportOf(const CommandOptions& options, const std::vector<Job>& jobs) {
+  check::RunReport run;
+  for (std::size_t i = 0; i < jobs.size(); ++i) {
+    if (const auto& failure = jobs[i].failure) {
+      run.unchecked.push_back({options.scripts[i], failure->what()});
+    } else {
+      run.scripts.push_back(
+          {jobs[i].verdict, *jobs[i].file, stageArguments(options.check), options.failOn});
+    }
+  }
+  return run;
+}
+
+[[noreturn]] void wrongCode(const std::string& code) {
+  std::vector<std::string> names;
+  std::vector<std::string_view> candidates;
+  for (const check::Code& each : check::codes()) {
+    names.emplace_back(each.name);
+    candidates.push_back(each.name);
+  }
+  const auto suggestion = didYouMean(code, candidates);
+  throw Failure(ExitStatus::badInput,
+                "--explain: no finding has the code " + quote(code) +
+                    (suggestion.empty() ? "; expected " : suggestion + " Expected ") +
+                    enumerate(names));
 }
 
 int explain(const std::string& code) {
-  std::vector<std::string_view> names;
-  for (const check::Code& each : check::codes()) names.push_back(each.name);
   const auto text = check::explanationOf(code);
-  if (!text) {
-    throw Failure(ExitStatus::badInput,
-                  "--explain: no finding has the code " + quote(code) + didYouMean(code, names));
-  }
+  if (!text) wrongCode(code);
   std::cout << *text;
   return static_cast<int>(ExitStatus::fine);
 }
@@ -196,21 +228,20 @@ void requireSense(const CommandOptions& options) {
 int runCheck(const CommandOptions& options) {
   if (options.explain) return explain(*options.explain);
   requireSense(options);
+  // A mistake in these must not cost the time of the exploration.
   const auto& format = formatNamed(options.format);
+  auto baseline = baselineOf(options);
+  auto witnesses =
+      options.witness ? std::optional<check::WitnessWriter>(*options.witness) : std::nullopt;
   auto jobs = checkAll(options);
   mergeAllowances(jobs);
-  applyBaseline(options, jobs);
-  writeWitnesses(options, jobs);
-  std::vector<check::Report> reports;
-  for (const Job& job : jobs) {
-    if (!job.failure) {
-      reports.push_back({job.verdict, *job.file, stageArguments(options.check), options.failOn});
-    }
-  }
-  format.write(reports, outputShowsColor(), std::cout);
+  if (baseline) applyBaseline(*baseline, options.updateBaseline, jobs);
+  if (witnesses) writeWitnesses(*witnesses, options.check, jobs);
+  const auto run = reportOf(options, jobs);
+  format.write(run, outputShowsColor(), std::cout);
   std::cout.flush();
-  for (const Job& job : jobs) {
-    if (job.failure) std::cerr << "qz-walkthrough: " << job.failure->what() << '\n';
+  for (const auto& each : run.unchecked) {
+    std::cerr << "qz-walkthrough: " << oneLine(each.message) << '\n';
   }
   return statusOf(jobs, options.failOn);
 }

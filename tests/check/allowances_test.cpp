@@ -120,13 +120,13 @@ TEST_F(Allowances, OfOptionsNeedNotBeNeeded) {
 TEST_F(Allowances, WithAnUnknownCodeAreRefused) {
   directory_.write("check.allow", "# one\nnever-run=7\n");
   EXPECT_EQ(refusal(),
-            "check.allow:2: no finding has the code “never-run”; did you mean "
+            "check.allow:2:1: no finding has the code “never-run”; did you mean "
             "\"never-runs\"?");
 }
 
 TEST_F(Allowances, WithMoreWordsAreRefused) {
   directory_.write("check.allow", "never-runs 7\n");
-  EXPECT_EQ(refusal().find("check.allow:1: expected one CODE or CODE=KEY"), 0U) << refusal();
+  EXPECT_EQ(refusal().find("check.allow:1:12: expected one CODE or CODE=KEY"), 0U) << refusal();
 }
 
 TEST_F(Allowances, AreReadAsTheyAreWritten) {

@@ -180,6 +180,11 @@ TEST_F(Baselines, ThatAreNotThereAreRefused) {
   EXPECT_EQ(refusal("none").find("none: "), 0U) << refusal("none");
 }
 
+TEST_F(Baselines, ThatAreDirectoriesAreRefused) {
+  std::filesystem::create_directory("folder");
+  EXPECT_EQ(refusal("folder"), "folder: a directory; expected a baseline");
+}
+
 TEST_F(Baselines, ThatCannotBeWrittenFail) {
   EXPECT_THROW(writeBaseline({findingIn("1")}, "no such folder/known"), Failure);
 }

@@ -215,39 +215,60 @@ TEST_F(Expectations, AreReadFromTheFileOfTheOption) {
   EXPECT_EQ(failuresIn(verdict)[0].elsewhere->text(), "other:1");
 }
 
-TEST_F(Expectations, AreRefusedWithLineAndWhatWasExpected) {
+TEST_F(Expectations, AreRefusedWithThePlaceAndWhatWasExpected) {
   const struct {
     const char* line;
+    int column;
     const char* expected;
     const char* found;
   } cases[] = {
-      {"maybe hidden 9", "\"whenever\"", "“maybe”"},
-      {"can list 3", "\"reach\"", "“list”"},
-      {"can reach", "a condition", "the end of the line"},
-      {"never the start", "\"end\"", "“start”"},
-      {"never hiden 9", "did you mean \"hidden\"", "“hiden”"},
-      {"never hidden nine", "the tag of a control", "“nine”"},
-      {"never hidden 9x", "the tag of a control", "“9x”"},
-      {"never hidden", "the tag of a control", "the end of the line"},
-      {"never text 5", "what it shows", "the end of the line"},
-      {"can reach list", "the key of a list", "the end of the line"},
-      {"within few moves the end", "a number of moves", "“few”"},
-      {"within -1 moves the end", "a number of moves", "“-1”"},
-      {"within 5 the end", "\"moves\"", "“the”"},
-      {"never hidden 9 10", "the end of the line", "“10”"},
-      {"whenever list 3 ran", "a condition", "the end of the line"},
-      {"can reach list 99", "no list", "“99”"},
+      {"maybe hidden 9", 1, "\"whenever\"", "“maybe”"},
+      {"can list 3", 5, "\"reach\"", "“list”"},
+      {"can reach", 10, "a condition", "the end of the line"},
+      {"never the start", 11, "\"end\"", "“start”"},
+      {"never hiden 9", 7, "did you mean \"hidden\"", "“hiden”"},
+      {"never hidden nine", 14, "the tag of a control", "“nine”"},
+      {"never hidden 9x", 14, "the tag of a control", "“9x”"},
+      {"never hidden", 13, "the tag of a control", "the end of the line"},
+      {"never text 5", 13, "what it shows", "the end of the line"},
+      {"can reach list", 15, "the key of a list", "the end of the line"},
+      {"within few moves the end", 8, "a number of moves", "“few”"},
+      {"within -1 moves the end", 8, "a number of moves", "“-1”"},
+      {"within 5 the end", 10, "\"moves\"", "“the”"},
+      {"never hidden 9 10", 16, "the end of the line", "“10”"},
+      {"whenever list 3 ran", 20, "a condition", "the end of the line"},
+      {"can reach list 99", 16, "no list", "“99”"},
   };
   for (const auto& test : cases) {
     const std::string message = refusal("# a comment\n\n" + std::string(test.line) + "\n");
-    EXPECT_EQ(message.find("check.expect:3: "), 0U) << message;
+    const std::string place = "check.expect:3:" + std::to_string(test.column) + ": ";
+    EXPECT_TRUE(message.starts_with(place)) << place << "\n" << message;
     EXPECT_NE(message.find(test.expected), std::string::npos) << message;
     EXPECT_NE(message.find(test.found), std::string::npos) << message;
   }
 }
 
+TEST_F(Expectations, AreRefusedWithTheColumnInCharacters) {
+  const struct {
+    const char* line;
+    const char* place;
+  } cases[] = {
+      {"\tnever text 5 \"é日😀\" more", "check.expect:1:21: "},
+      {"  never hidden  # a comment", "check.expect:1:15: "},
+      {"never hidden  \r", "check.expect:1:13: "},
+      {"never hidden 9,10", "check.expect:1:15: "},
+      {"whenever hidden 9,", "check.expect:1:19: "},
+  };
+  for (const auto& test : cases) {
+    const std::string message = refusal(std::string(test.line) + "\n");
+    EXPECT_TRUE(message.starts_with(test.place)) << test.line << "\n" << message;
+  }
+}
+
 TEST_F(Expectations, ThatNameATagOfNoControlAreRefused) {
-  EXPECT_EQ(refusal("never hidden 77\n"), "check.expect:1: no control ever has the tag 77");
+  EXPECT_EQ(refusal("never hidden 77\n"), "check.expect:1:14: no control ever has the tag 77");
+  EXPECT_EQ(refusal("whenever list 1 ran, not text 78 One\n"),
+            "check.expect:1:31: no control ever has the tag 78");
 }
 
 TEST_F(Expectations, AreNamedAsTheFileHasThem) {

@@ -45,7 +45,7 @@ class HostileScripts : public testing::Test {
   static std::string summaryOf(const Verdict& verdict) {
     std::ostringstream out;
     const InputFile file("script.plist", "a script");
-    writeText({Report{verdict, file, "", Severity::warning}}, false, out);
+    writeText({.scripts = {{verdict, file, "", Severity::warning}}, .unchecked = {}}, false, out);
     const std::string text = out.str();
     const auto lineEnd = text.find_last_not_of('\n');
     return text.substr(text.rfind('\n', lineEnd) + 1);

@@ -64,7 +64,9 @@ class Reports : public testing::Test {
   template <class Write>
   std::string written(Write write, bool color = false) {
     std::ostringstream out;
-    write({Report{verdict_, *file_, " --window window.plist", failOn_}}, color, out);
+    write({.scripts = {{verdict_, *file_, " --window window.plist", failOn_}},
+           .unchecked = unchecked_},
+          color, out);
     return out.str();
   }
 
@@ -74,6 +76,7 @@ class Reports : public testing::Test {
   std::optional<InputFile> file_;
   Verdict verdict_{};
   Severity failOn_ = Severity::warning;
+  std::vector<Unchecked> unchecked_;
 };
 
 Json pathOf(int press) { return Json::array({{{"start", "1"}}, {{"press", press}}}); }
@@ -107,7 +110,8 @@ TEST_F(Reports, JsonHasEveryField) {
                                                            {"message", message(2)},
                                                            {"list", "7"},
                                                            {"line", 5},
-                                                           {"column", 3}}})}}})}};
+                                                           {"column", 3}}})}}})},
+      {"unchecked", Json::array()}};
   EXPECT_EQ(Json::parse(written(writeJson)), expected);
 }
 
@@ -208,7 +212,17 @@ TEST_F(Reports, SarifIsCutAfterWhatItsReadersShow) {
 TEST_F(Reports, SarifSaysNothingOfCutsIfThereIsNone) {
   checkSmallScript();
   const Json run = Json::parse(written(writeSarif))["runs"][0];
-  EXPECT_FALSE(run["invocations"][0].contains("toolExecutionNotifications"));
+  EXPECT_EQ(run["invocations"], Json::array({{{"executionSuccessful", true}}}));
+}
+
+TEST_F(Reports, SarifSaysWhatIsCutAndWhatCouldNotBeChecked) {
+  makeVerdict("script.plist");
+  for (std::size_t i = 0; i <= mostResults; ++i) addFinding("one");
+  unchecked_ = {{.script = "none.plist", .message = "none.plist: no such file"}};
+  const Json invocation = Json::parse(written(writeSarif))["runs"][0]["invocations"][0];
+  ASSERT_EQ(invocation["toolExecutionNotifications"].size(), 2U) << invocation;
+  EXPECT_EQ(invocation["toolExecutionNotifications"][0]["level"], "error");
+  EXPECT_EQ(invocation["toolExecutionNotifications"][1]["level"], "warning");
 }
 
 TEST_F(Reports, SarifCutsLongPathsAndSaysSo) {
@@ -377,11 +391,13 @@ TEST_F(Reports, EachScriptHasItsPart) {
   const InputFile a("a.plist", "a script");
   const InputFile b("b.plist", "a script");
   std::ostringstream json;
-  writeJson({Report{first, a, "", failOn_}, Report{verdict_, b, "", failOn_}}, false, json);
+  const RunReport run{.scripts = {{first, a, "", failOn_}, {verdict_, b, "", failOn_}},
+                      .unchecked = {}};
+  writeJson(run, false, json);
   EXPECT_EQ(Json::parse(json.str())["scripts"][0]["script"], "a.plist");
   EXPECT_EQ(Json::parse(json.str())["scripts"][1]["script"], "b.plist");
   std::ostringstream junit;
-  writeJunit({Report{first, a, "", failOn_}, Report{verdict_, b, "", failOn_}}, false, junit);
+  writeJunit(run, false, junit);
   const auto document = xmlOf(junit.str());
   EXPECT_STREQ(document.child("testsuites").last_child().attribute("name").value(), "b.plist");
 }
@@ -415,6 +431,24 @@ TEST_F(OddCharacters, AreVisibleInJunit) {
   EXPECT_STREQ(suite.attribute("name").value(), "e\\u{1b}[2J%,:<&\"' \\né.plist");
   EXPECT_STREQ(suite.child("testcase").child("failure").attribute("message").value(),
                "50% of “a”, b: <c> & \"d\" 'e' é 😀\\n::error::f\\u{d} \\u{1b}[2J");
+}
+
+// Readers of XML refuse a file with these, although they are UTF-8.
+TEST_F(OddCharacters, ThatXmlForbidsAreReplacedInJunit) {
+  makeVerdict("a\uFFFEb.plist");
+  addFinding("c\uFFFFd \uFFFD\uE000\U0001FFFE");
+  verdict_.findings[0].path = {StartMove{"e\uFFFEf"}};
+  const std::string text = written(writeJunit);
+  for (const char* const forbidden : {"\uFFFE", "\uFFFF"}) {
+    EXPECT_EQ(text.find(forbidden), std::string::npos) << text;
+  }
+  const auto document = xmlOf(text);
+  const auto suite = document.child("testsuites").child("testsuite");
+  EXPECT_STREQ(suite.attribute("name").value(), "a\uFFFDb.plist");
+  const auto failure = suite.child("testcase").child("failure");
+  EXPECT_STREQ(failure.attribute("message").value(), "c\uFFFDd \uFFFD\uE000\U0001FFFE");
+  EXPECT_NE(std::string(failure.text().get()).find("--start 'e\uFFFDf'"), std::string::npos)
+      << text;
 }
 
 /// Undoes the escapes of a workflow command.

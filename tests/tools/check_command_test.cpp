@@ -2,6 +2,7 @@
 // The command line of `qz-walkthrough check`: what it refuses, its exit statuses, and its files.
 #include <gtest/gtest.h>
 #include <signal.h>
+#include <sys/inotify.h>
 #include <sys/socket.h>
 #include <sys/un.h>
 #include <unistd.h>
@@ -13,7 +14,9 @@
 
 #include "play_files.hpp"
 #include "tool_run.hpp"
+#include "tools/check/finding.hpp"
 #include "tools/commands.hpp"
+#include "tools/support/suggestions.hpp"
 #include "tools/support/whole_file.hpp"
 
 namespace qz::tools {
@@ -168,6 +171,43 @@ TEST_F(CheckCommand, ReportsTheOtherScriptsIfOneCannotBeRead) {
   EXPECT_EQ(result.err, "qz-walkthrough: none.plist: no such file; expected a script\n");
 }
 
+TEST_F(CheckCommand, NamesInEveryReportTheScriptsThatItCouldNotCheck) {
+  const std::pair<const char*, const char*> formats[] = {
+      {"text", "\n1 of 2 scripts could not be checked: none.plist\n"},
+      {"json", "\"script\": \"none.plist\""},
+      {"sarif", "\"uri\": \"none.plist\""},
+      {"junit", "<testsuite name=\"none.plist\" tests=\"1\" failures=\"0\" errors=\"1\">"},
+      {"github", "::error file=none.plist,title=not checked::none.plist: no such file"}};
+  for (const auto& [format, words] : formats) {
+    const Result result = checkInWindow({"none.plist", "note.plist", "--format", format});
+    EXPECT_EQ(result.status, 2) << format;
+    EXPECT_TRUE(contains(result.out, words)) << result.out;
+    EXPECT_EQ(result.err, "qz-walkthrough: none.plist: no such file; expected a script\n");
+  }
+}
+
+TEST_F(CheckCommand, SaysInAReportForProgramsThatTheOnlyScriptCouldNotBeChecked) {
+  for (const char* const format : {"json", "sarif", "junit", "github"}) {
+    const Result result = check({"none.plist", "--format", format});
+    EXPECT_TRUE(contains(result.out, "none.plist: no such file; expected a script")) << result.out;
+  }
+}
+
+TEST_F(CheckCommand, DoesNotDisturbTheTerminalWithThePathOfAScript) {
+  const Result result = check({"\x1b[2J.plist", "clean.plist"});
+  EXPECT_EQ(result.err, "qz-walkthrough: \\u{1b}[2J.plist: no such file; expected a script\n");
+  EXPECT_EQ(result.out.find('\x1b'), std::string::npos) << result.out;
+}
+
+TEST_F(CheckCommand, RefusesAStartInAScriptWithoutLists) {
+  directory_.write("empty.plist", "{}");
+  const Result result = check({"empty.plist", "--start", "1"});
+  EXPECT_EQ(result.status, 2);
+  EXPECT_EQ(result.err,
+            "qz-walkthrough: empty.plist:1:1: no list under the start key “1”; the script has no "
+            "lists\n");
+}
+
 TEST_F(CheckCommand, GivesTheSameBytesWithAnyNumberOfThreads) {
   const std::vector<std::string> scripts{"warning.plist", "clean.plist", "error.plist",
                                          "note.plist"};
@@ -276,6 +316,53 @@ TEST_F(CheckCommand, KeepsABaselineThatItCannotRead) {
   EXPECT_EQ(*wholeFile("known"), "something else");
 }
 
+/// Notes whether anybody opens a file.
+class OpenWatch {
+ public:
+  explicit OpenWatch(const char* path) : descriptor_(::inotify_init1(IN_NONBLOCK | IN_CLOEXEC)) {
+    EXPECT_GE(::inotify_add_watch(descriptor_, path, IN_OPEN), 0) << path;
+  }
+  ~OpenWatch() { ::close(descriptor_); }
+  OpenWatch(const OpenWatch&) = delete;
+  OpenWatch& operator=(const OpenWatch&) = delete;
+
+  /// Whether the file was opened since the last call.
+  bool hasSeenAny() const {
+    alignas(inotify_event) char events[4096];
+    return ::read(descriptor_, events, sizeof events) > 0;
+  }
+
+ private:
+  int descriptor_;
+};
+
+TEST_F(CheckCommand, DoesNotBeginIfItCouldNotTakeBackOrWriteTheFindings) {
+  directory_.write("broken", "{\"version\": 1, \"scripts\": {");
+  const struct {
+    std::vector<std::string> options;
+    const char* words;
+  } cases[] = {
+      {{"--baseline", "none"}, "none: cannot be read; --update-baseline writes a baseline"},
+      {{"--baseline", "broken"}, "broken: expected a baseline, as --update-baseline writes it"},
+      {{"--baseline", "broken", "--update-baseline"}, "broken: expected a baseline"},
+      {{"--baseline", "no/such", "--update-baseline"},
+       "no/such: cannot be written; expected a path in a directory that is there"},
+      {{"--witness", "broken"}, "broken: expected a directory"},
+  };
+  const OpenWatch script("warning.plist");
+  for (const auto& test : cases) {
+    auto arguments = test.options;
+    arguments.insert(arguments.begin(), "warning.plist");
+    const Result result = checkInWindow(arguments);
+    EXPECT_EQ(result.status, 2) << test.words;
+    EXPECT_TRUE(result.err.starts_with("qz-walkthrough: " + std::string(test.words))) << result.err;
+    EXPECT_EQ(result.out, "") << test.words;
+    EXPECT_FALSE(script.hasSeenAny()) << test.words;
+  }
+  checkInWindow({"warning.plist"});
+  EXPECT_TRUE(script.hasSeenAny()) << "otherwise the watch sees nothing";
+}
+
 TEST_F(CheckCommand, WritesScenariosThatPass) {
   EXPECT_EQ(checkInWindow({"note.plist", "--witness", "found"}).status, 0);
   const Result result = run(testCommand, {"test", "found", "--toolkit", "memory"});
@@ -288,13 +375,19 @@ TEST_F(CheckCommand, ExplainsACode) {
   EXPECT_TRUE(result.out.starts_with("never-runs\n\nSeverity: warning.\n")) << result.out;
 }
 
-TEST_F(CheckCommand, NamesTheCodeThatIsLikelyMeant) {
-  const Result result = check({"--explain", "never-run"});
-  EXPECT_EQ(result.status, 2);
-  EXPECT_EQ(result.err,
+TEST_F(CheckCommand, NamesTheCodesThatItCanExplain) {
+  std::vector<std::string> names;
+  for (const check::Code& code : check::codes()) names.emplace_back(code.name);
+  const std::string known = enumerate(names) + "\n";
+  const Result near = check({"--explain", "never-run"});
+  EXPECT_EQ(near.status, 2);
+  EXPECT_EQ(near.err,
             "qz-walkthrough: --explain: no finding has the code “never-run”; did you mean "
-            "\"never-runs\"?\n");
-  EXPECT_EQ(check({"--explain", "xyz"}).status, 2);
+            "\"never-runs\"? Expected " +
+                known);
+  const Result far = check({"--explain", "xyz"});
+  EXPECT_EQ(far.status, 2);
+  EXPECT_EQ(far.err, "qz-walkthrough: --explain: no finding has the code “xyz”; expected " + known);
 }
 
 TEST_F(CheckCommand, WritesEveryFormat) {

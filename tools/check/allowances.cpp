@@ -44,11 +44,11 @@ std::vector<Allowance> readAllowances(const std::string& path) {
   for (const Line& line : linesOf(path, "allowances")) {
     const FileLine place{path, line.number};
     if (line.words.size() > 1) {
-      throw Failure(ExitStatus::badInput, place.text() +
+      throw Failure(ExitStatus::badInput, place.text(line.columns[1]) +
                                               ": expected one CODE or CODE=KEY, then a comment "
                                               "that begins with #");
     }
-    allowances.push_back(parseAllowance(line.words.front(), place.text()));
+    allowances.push_back(parseAllowance(line.words.front(), place.text(line.columns.front())));
     allowances.back().place = place;
   }
   return allowances;

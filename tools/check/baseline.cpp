@@ -21,6 +21,9 @@ constexpr int version = 1;
 
 Baseline Baseline::read(const std::string& path) {
   Baseline baseline(path);
+  if (std::filesystem::is_directory(path)) {
+    throw Failure(ExitStatus::badInput, path + ": a directory; expected a baseline");
+  }
   const auto text = wholeFile(path);
   if (!text) {
     throw Failure(ExitStatus::badInput,

@@ -18,20 +18,22 @@
 namespace qz::tools::check {
 namespace {
 
+[[noreturn]] void wrongStartKey(const InputFile& file, const Script& script,
+                                const std::string& key) {
+  const std::string problem = "no list under the start key " + quote(key) + "; ";
+  if (script.lists().empty()) file.fail(file.root(), problem + "the script has no lists");
+  std::vector<std::string> keys;
+  for (const ScriptList& list : script.lists()) keys.push_back(list.key);
+  throw Failure(ExitStatus::badInput,
+                file.path() + ": " + problem + "expected one of " + enumerate(keys));
+}
+
 std::vector<std::string> startKeysOf(const InputFile& file, const Script& script,
                                      const CheckOptions& options) {
-  if (!options.startKeys.empty()) {
-    for (const std::string& key : options.startKeys) {
-      if (!script.listUnder(key)) {
-        std::vector<std::string> keys;
-        for (const ScriptList& list : script.lists()) keys.push_back(list.key);
-        throw Failure(ExitStatus::badInput, file.path() + ": no list under the start key " +
-                                                quote(key) + "; expected one of " +
-                                                enumerate(keys));
-      }
-    }
-    return options.startKeys;
+  for (const std::string& key : options.startKeys) {
+    if (!script.listUnder(key)) wrongStartKey(file, script, key);
   }
+  if (!options.startKeys.empty()) return options.startKeys;
   const auto smallest = smallestTagKey(*script.dictionary());
   return smallest ? std::vector{*smallest} : std::vector<std::string>();
 }
@@ -67,7 +69,7 @@ void requireTags(const std::vector<Expectation>& expectations, const Setting& se
   tags.insert(given.begin(), given.end());
   const auto require = [&](const Condition& condition, const Expectation& expectation) {
     if (!isAboutControl(condition) || tags.contains(condition.tag)) return;
-    throw Failure(ExitStatus::badInput, expectation.place.text() +
+    throw Failure(ExitStatus::badInput, expectation.place.text(condition.column) +
                                             ": no control ever has the tag " +
                                             std::to_string(condition.tag));
   };

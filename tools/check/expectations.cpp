@@ -89,9 +89,10 @@ class Parser {
     }
     const KindRow* const row = takeKind();
     condition.kind = row->kind;
+    condition.column = column();
     if (row->operands == Operands::key) {
       condition.word = takeWord("the key of a list");
-      if (!script_.listUnder(condition.word)) wrongKey(condition.word);
+      if (!script_.listUnder(condition.word)) wrongKey(condition);
       if (row->kind == Kind::listRan) takes("ran");
       return condition;
     }
@@ -135,17 +136,21 @@ class Parser {
     return true;
   }
 
+  /// Returns where the next word begins, or where the line ends.
+  std::size_t column() const { return line_.columns[next_]; }
+
   [[noreturn]] void wrong(const std::string& expected, const std::string& suggestion = "") const {
     const std::string found =
         next_ < line_.words.size() ? quote(line_.words[next_]) : "the end of the line";
-    throw Failure(ExitStatus::badInput,
-                  place_.text() + ": expected " + expected + ", found " + found + suggestion);
+    throw Failure(ExitStatus::badInput, place_.text(column()) + ": expected " + expected +
+                                            ", found " + found + suggestion);
   }
-  [[noreturn]] void wrongKey(const std::string& key) const {
+  [[noreturn]] void wrongKey(const Condition& condition) const {
     std::vector<std::string_view> keys;
     for (const ScriptList& list : script_.lists()) keys.push_back(list.key);
-    throw Failure(ExitStatus::badInput,
-                  place_.text() + ": the script has no list " + quote(key) + didYouMean(key, keys));
+    throw Failure(ExitStatus::badInput, place_.text(condition.column) +
+                                            ": the script has no list " + quote(condition.word) +
+                                            didYouMean(condition.word, keys));
   }
 
   const Line& line_;

@@ -34,6 +34,7 @@ struct Condition {
   bool isNegated = false;
   Tag tag = 0;
   std::string word{};
+  std::size_t column = 0;  ///< where in its line the tag or the key is, from 1; 0 for `end`
 };
 
 struct Expectation {

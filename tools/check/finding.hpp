@@ -42,6 +42,8 @@ struct FileLine {
 
   /// Returns "PATH:LINE".
   std::string text() const { return path + ":" + std::to_string(line); }
+  /// Returns "PATH:LINE:COLUMN".
+  std::string text(std::size_t column) const { return text() + ":" + std::to_string(column); }
 };
 
 struct Finding {

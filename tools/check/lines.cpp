@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "tools/check/lines.hpp"
 
+#include <algorithm>
 #include <sstream>
 
 #include "tools/support/failure.hpp"
@@ -36,17 +37,40 @@ void skipBlanks(std::string_view& line) {
   line.remove_prefix(std::min(line.find_first_not_of(blanks), line.size()));
 }
 
+/// Says in which column of a line a byte is. The bytes must come in their order.
+class Columns {
+ public:
+  explicit Columns(std::string_view line) : line_(line) {}
+
+  std::size_t at(std::size_t byte) {
+    const auto passed = line_.substr(byte_, byte - byte_);
+    column_ += static_cast<std::size_t>(
+        std::count_if(passed.begin(), passed.end(), [](char c) { return (c & 0xC0) != 0x80; }));
+    byte_ = byte;
+    return column_;
+  }
+
+ private:
+  std::string_view line_;
+  std::size_t byte_ = 0;
+  std::size_t column_ = 1;
+};
+
 Line lineOf(std::size_t number, std::string_view text) {
-  Line line{.number = number, .text = {}, .words = {}};
-  skipBlanks(text);
+  Line line{.number = number, .text = {}, .words = {}, .columns = {}};
+  Columns columns(text);
   std::string_view rest = text;
-  std::size_t end = 0;  // of the last word
+  skipBlanks(rest);
+  const std::size_t begin = text.size() - rest.size();
+  std::size_t end = begin;  // of the last word
   while (!rest.empty() && rest.front() != '#') {
+    line.columns.push_back(columns.at(text.size() - rest.size()));
     line.words.push_back(takeWord(rest));
     end = text.size() - rest.size();
     skipBlanks(rest);
   }
-  line.text = text.substr(0, end);
+  line.columns.push_back(columns.at(end));
+  line.text = text.substr(begin, end - begin);
   return line;
 }
 

@@ -14,6 +14,8 @@ struct Line {
   std::size_t number = 0;  ///< from 1
   std::string text;        ///< without blanks around it and the comment
   std::vector<std::string> words;
+  /// Where each word begins, and where the last one ends; in characters, from 1.
+  std::vector<std::size_t> columns;
 };
 
 /// Returns the lines of a file that have words, without comments, which begin with a `#`. Throws a

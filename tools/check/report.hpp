@@ -19,21 +19,33 @@ struct Report {
   Severity failOn;             ///< the least severity that fails
 };
 
+/// A script that could not be checked.
+struct Unchecked {
+  std::string script;   ///< its path
+  std::string message;  ///< where, what is wrong, and what was expected
+};
+
+/// What one run of the command reports. Each part has the order of the command line.
+struct RunReport {
+  std::vector<Report> scripts;       ///< those that were checked
+  std::vector<Unchecked> unchecked;  ///< the others
+};
+
 /// A format of the reports.
 struct ReportFormat {
   std::string_view name;
   std::string_view description;  ///< for the help
-  void (*write)(const std::vector<Report>& reports, bool color, std::ostream& out);
+  void (*write)(const RunReport& run, bool color, std::ostream& out);
 };
 
 /// Returns the formats, the standard one first.
 std::vector<ReportFormat> reportFormats();
 
-void writeText(const std::vector<Report>& reports, bool color, std::ostream& out);
-void writeSarif(const std::vector<Report>& reports, bool color, std::ostream& out);
-void writeJunit(const std::vector<Report>& reports, bool color, std::ostream& out);
-void writeGithub(const std::vector<Report>& reports, bool color, std::ostream& out);
-void writeJson(const std::vector<Report>& reports, bool color, std::ostream& out);
+void writeText(const RunReport& run, bool color, std::ostream& out);
+void writeSarif(const RunReport& run, bool color, std::ostream& out);
+void writeJunit(const RunReport& run, bool color, std::ostream& out);
+void writeGithub(const RunReport& run, bool color, std::ostream& out);
+void writeJson(const RunReport& run, bool color, std::ostream& out);
 
 /// Returns where in the script a finding is; absent for one elsewhere, or in a binary file.
 std::optional<toolkit::TextPosition> positionOf(const Finding& finding, const InputFile& file);

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// The report as annotations of GitHub's workflows: one line for each finding.
+// The report as annotations of GitHub's workflows: one line for each finding, and
+// one for each script that could not be checked.
 #include <ostream>
 
 #include "tools/check/report.hpp"
@@ -50,19 +51,25 @@ std::string propertiesOf(const Finding& finding, const Report& report) {
          ",col=" + std::to_string(position->column);
 }
 
+void writeFinding(const Finding& finding, const Report& report, std::ostream& out) {
+  out << "::" << commandOf(finding.severity) << propertiesOf(finding, report)
+      << ",title=" << escaped(finding.code, true) << "::" << escaped(finding.message, false);
+  if (!finding.path.empty()) out << escaped("\n" + playCommand(report, finding.path), false);
+  out << '\n';
+}
+
+void annotate(const Unchecked& unchecked, std::ostream& out) {
+  out << "::error file=" << escaped(unchecked.script, true)
+      << ",title=not checked::" << escaped(unchecked.message, false) << '\n';
+}
+
 }  // namespace
 
-void writeGithub(const std::vector<Report>& reports, bool, std::ostream& out) {
-  for (const Report& report : reports) {
-    for (const Finding& finding : report.verdict.findings) {
-      out << "::" << commandOf(finding.severity) << propertiesOf(finding, report)
-          << ",title=" << escaped(finding.code, true) << "::" << escaped(finding.message, false);
-      if (!finding.path.empty()) {
-        out << escaped("\n" + playCommand(report, finding.path), false);
-      }
-      out << '\n';
-    }
+void writeGithub(const RunReport& run, bool, std::ostream& out) {
+  for (const Report& report : run.scripts) {
+    for (const Finding& finding : report.verdict.findings) writeFinding(finding, report, out);
   }
+  for (const Unchecked& each : run.unchecked) annotate(each, out);
 }
 
 }  // namespace qz::tools::check

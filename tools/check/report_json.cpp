@@ -66,12 +66,19 @@ Json jsonOf(const Report& report) {
   return json;
 }
 
+Json jsonOf(const Unchecked& unchecked) {
+  return {{"script", unchecked.script}, {"message", unchecked.message}};
+}
+
 }  // namespace
 
-void writeJson(const std::vector<Report>& reports, bool, std::ostream& out) {
+void writeJson(const RunReport& run, bool, std::ostream& out) {
   Json scripts = Json::array();
-  for (const Report& report : reports) scripts.push_back(jsonOf(report));
-  const Json json = {{"version", 1}, {"scripts", std::move(scripts)}};
+  for (const Report& report : run.scripts) scripts.push_back(jsonOf(report));
+  Json unchecked = Json::array();
+  for (const Unchecked& each : run.unchecked) unchecked.push_back(jsonOf(each));
+  const Json json = {
+      {"version", 1}, {"scripts", std::move(scripts)}, {"unchecked", std::move(unchecked)}};
   out << json.dump(2, ' ', false, Json::error_handler_t::replace) << '\n';
 }
 

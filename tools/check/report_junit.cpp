@@ -1,40 +1,27 @@
 // SPDX-License-Identifier: MIT
-// The report in JUnit's XML: one test suite for each script, one test case for each finding, and
-// one that passes where there is none.
+// The report in JUnit's XML: one test suite for each script, one test case for each finding, one
+// that passes where there is none, and one with an error for a script that could not be checked.
 #include <algorithm>
 #include <ostream>
 
 #include "tools/check/report.hpp"
 #include "tools/support/text_layout.hpp"
+#include "tools/support/xml_text.hpp"
 
 namespace qz::tools::check {
 namespace {
 
-std::string xmlText(const std::string& text) {
-  std::string result;
-  for (const char c : oneLine(text)) {
-    switch (c) {
-      case '&':
-        result += "&amp;";
-        break;
-      case '<':
-        result += "&lt;";
-        break;
-      case '>':
-        result += "&gt;";
-        break;
-      case '"':
-        result += "&quot;";
-        break;
-      default:
-        result += c;
-    }
-  }
-  return result;
-}
+std::string xmlLine(const std::string& text) { return xmlText(oneLine(text)); }
 
 std::string attribute(const std::string& name, const std::string& value) {
-  return " " + name + "=\"" + xmlText(value) + "\"";
+  return " " + name + "=\"" + xmlLine(value) + "\"";
+}
+
+std::string suiteOf(const std::string& script, std::size_t tests, std::size_t failures,
+                    std::size_t errors) {
+  return "  <testsuite" + attribute("name", script) + attribute("tests", std::to_string(tests)) +
+         attribute("failures", std::to_string(failures)) +
+         attribute("errors", std::to_string(errors)) + ">\n";
 }
 
 bool isFailure(const Report& report, const Finding& finding) {
@@ -48,31 +35,40 @@ void writeCase(const Report& report, const Finding& finding, std::ostream& out) 
     std::string details = placeOf(finding, report.file);
     if (!finding.path.empty()) details += ": " + playCommand(report, finding.path);
     out << "      <failure" << attribute("type", std::string(nameOf(finding.severity)))
-        << attribute("message", finding.message) << ">" << xmlText(details) << "</failure>\n";
+        << attribute("message", finding.message) << ">" << xmlLine(details) << "</failure>\n";
   }
   out << "    </testcase>\n";
 }
 
+void writeSuite(const Report& report, std::ostream& out) {
+  const auto& findings = report.verdict.findings;
+  const auto failures =
+      std::count_if(findings.begin(), findings.end(),
+                    [&](const Finding& finding) { return isFailure(report, finding); });
+  out << suiteOf(report.verdict.path, std::max<std::size_t>(findings.size(), 1),
+                 static_cast<std::size_t>(failures), 0);
+  for (const Finding& finding : findings) writeCase(report, finding, out);
+  if (findings.empty()) {
+    out << "    <testcase" << attribute("classname", report.verdict.path)
+        << attribute("name", "nothing is wrong") << "/>\n";
+  }
+  out << "  </testsuite>\n";
+}
+
+void writeSuite(const Unchecked& unchecked, std::ostream& out) {
+  out << suiteOf(unchecked.script, 1, 0, 1) << "    <testcase"
+      << attribute("classname", unchecked.script) << attribute("name", "the script is checked")
+      << ">\n      <error" << attribute("type", "not checked")
+      << attribute("message", unchecked.message) << ">" << xmlLine(unchecked.message)
+      << "</error>\n    </testcase>\n  </testsuite>\n";
+}
+
 }  // namespace
 
-void writeJunit(const std::vector<Report>& reports, bool, std::ostream& out) {
+void writeJunit(const RunReport& run, bool, std::ostream& out) {
   out << "<?xml version=\"1.0\" encoding=\"UTF-8\"?>\n<testsuites>\n";
-  for (const Report& report : reports) {
-    const auto& findings = report.verdict.findings;
-    const auto failures =
-        std::count_if(findings.begin(), findings.end(),
-                      [&](const Finding& finding) { return isFailure(report, finding); });
-    const std::size_t count = std::max<std::size_t>(findings.size(), 1);
-    out << "  <testsuite" << attribute("name", report.verdict.path)
-        << attribute("tests", std::to_string(count))
-        << attribute("failures", std::to_string(failures)) << attribute("errors", "0") << ">\n";
-    for (const Finding& finding : findings) writeCase(report, finding, out);
-    if (findings.empty()) {
-      out << "    <testcase" << attribute("classname", report.verdict.path)
-          << attribute("name", "nothing is wrong") << "/>\n";
-    }
-    out << "  </testsuite>\n";
-  }
+  for (const Report& report : run.scripts) writeSuite(report, out);
+  for (const Unchecked& each : run.unchecked) writeSuite(each, out);
   out << "</testsuites>\n";
 }
 

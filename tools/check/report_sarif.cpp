@@ -35,13 +35,16 @@ std::string uriOf(const std::string& path) {
   return uri;
 }
 
+/// Returns a file as a physical location.
+Json physicalOf(const std::string& path) { return {{"artifactLocation", {{"uri", uriOf(path)}}}}; }
+
 Json locationOf(const Report& report, const Finding* finding) {
   if (finding && finding->elsewhere) {
-    const Json physical = {{"artifactLocation", {{"uri", uriOf(finding->elsewhere->path)}}},
-                           {"region", {{"startLine", finding->elsewhere->line}}}};
-    return {{"physicalLocation", physical}};
+    Json physical = physicalOf(finding->elsewhere->path);
+    physical["region"] = {{"startLine", finding->elsewhere->line}};
+    return {{"physicalLocation", std::move(physical)}};
   }
-  Json physical = {{"artifactLocation", {{"uri", uriOf(report.verdict.path)}}}};
+  Json physical = physicalOf(report.verdict.path);
   const auto position = finding ? positionOf(*finding, report.file) : std::nullopt;
   if (position) {
     physical["region"] = {{"startLine", position->line}, {"startColumn", position->column}};
@@ -86,34 +89,49 @@ Json rules() {
   return rules;
 }
 
-std::string notification(std::size_t total) {
-  return std::to_string(total) + " findings; the first " + std::to_string(mostResults) +
-         " are in this report, because its readers show no more";
+Json cutNotification(std::size_t total) {
+  const std::string text = std::to_string(total) + " findings; the first " +
+                           std::to_string(mostResults) +
+                           " are in this report, because its readers show no more";
+  return {{"level", "warning"}, {"message", messageOf(text)}};
+}
+
+Json uncheckedNotification(const Unchecked& unchecked) {
+  return {{"level", "error"},
+          {"message", messageOf(unchecked.message)},
+          {"locations", Json::array({{{"physicalLocation", physicalOf(unchecked.script)}}})}};
+}
+
+/// Says how the run went; `total` is the number of findings.
+Json invocationOf(const RunReport& run, std::size_t total) {
+  Json invocation = {{"executionSuccessful", run.unchecked.empty()}};
+  Json notifications = Json::array();
+  for (const Unchecked& each : run.unchecked) notifications.push_back(uncheckedNotification(each));
+  if (total > mostResults) notifications.push_back(cutNotification(total));
+  if (!notifications.empty()) {
+    invocation["toolExecutionNotifications"] = std::move(notifications);
+  }
+  return invocation;
 }
 
 }  // namespace
 
-void writeSarif(const std::vector<Report>& reports, bool, std::ostream& out) {
+void writeSarif(const RunReport& run, bool, std::ostream& out) {
   Json results = Json::array();
   std::size_t total = 0;
-  for (const Report& report : reports) {
+  for (const Report& report : run.scripts) {
     for (const Finding& finding : report.verdict.findings) {
       if (++total <= mostResults) results.push_back(resultOf(report, finding));
     }
   }
-  Json invocation = {{"executionSuccessful", true}};
-  if (total > mostResults) {
-    invocation["toolExecutionNotifications"] =
-        Json::array({{{"level", "warning"}, {"message", messageOf(notification(total))}}});
-  }
-  const Json run = {{"tool", {{"driver", {{"name", "qz-walkthrough check"}, {"rules", rules()}}}}},
-                    {"columnKind", "unicodeCodePoints"},
-                    {"invocations", Json::array({std::move(invocation)})},
-                    {"results", std::move(results)}};
+  const Json only = {{"tool", {{"driver", {{"name", "qz-walkthrough check"}, {"rules", rules()}}}}},
+                     {"columnKind", "unicodeCodePoints"},
+                     {"invocations", Json::array({invocationOf(run, total)})},
+                     {"results", std::move(results)}};
   const Json json = {
       {"$schema", "https://json.schemastore.org/sarif-2.1.0.json"},
       {"version", "2.1.0"},
-      {"runs", Json::array({run})},
+      {"runs", Json::array({only})},
   };
   out << json.dump(2, ' ', false, Json::error_handler_t::replace) << '\n';
 }

@@ -156,10 +156,24 @@ class TextReport {
   std::set<std::string> shown_;  // the paths whose moves were written
 };
 
+/// Says which of several scripts could not be checked; standard error says why. Of a run with one
+/// script, standard error says everything.
+void writeUncheckedNames(const RunReport& run, const Colors& colors, std::ostream& out) {
+  const std::size_t all = run.scripts.size() + run.unchecked.size();
+  if (run.unchecked.empty() || all == 1) return;
+  out << colors.of(Severity::error) << run.unchecked.size() << " of " << all
+      << " scripts could not be checked" << colors.plain() << ": ";
+  for (std::size_t i = 0; i < run.unchecked.size(); ++i) {
+    out << (i == 0 ? "" : ", ") << oneLine(run.unchecked[i].script);
+  }
+  out << '\n';
+}
+
 }  // namespace
 
-void writeText(const std::vector<Report>& reports, bool color, std::ostream& out) {
-  for (const Report& report : reports) TextReport(report, color, out).write();
+void writeText(const RunReport& run, bool color, std::ostream& out) {
+  for (const Report& report : run.scripts) TextReport(report, color, out).write();
+  writeUncheckedNames(run, Colors{color}, out);
 }
 
 }  // namespace qz::tools::check

@@ -8,67 +8,13 @@
 #include <filesystem>
 #include <string_view>
 
+#include "tools/support/xml_text.hpp"
+
 namespace qz::tools::scenario {
 namespace {
 
-constexpr std::string_view replacement = "\xEF\xBF\xBD";
-
-/// Returns `text` as UTF-8 that XML allows. Logged text may hold anything, even lone surrogates.
-std::string allowed(const std::string& text) {
-  // The JSON library replaces bytes that are not UTF-8; parsing undoes its escapes.
-  const auto valid = Json::parse(Json(text).dump(-1, ' ', false, Json::error_handler_t::replace))
-                         .get<std::string>();
-  std::string result;
-  for (std::size_t i = 0; i < valid.size(); ++i) {
-    const auto c = static_cast<unsigned char>(valid[i]);
-    const auto three = std::string_view(valid).substr(i, 3);
-    if (c < 0x20 && c != '\t' && c != '\n' && c != '\r') {
-      result += replacement;
-    } else if (three == "\xEF\xBF\xBE" || three == "\xEF\xBF\xBF") {
-      result += replacement;  // U+FFFE and U+FFFF
-      i += 2;
-    } else {
-      result += valid[i];
-    }
-  }
-  return result;
-}
-
-std::string escaped(const std::string& text) {
-  std::string result;
-  for (const char c : allowed(text)) {
-    switch (c) {
-      case '&':
-        result += "&amp;";
-        break;
-      case '<':
-        result += "&lt;";
-        break;
-      case '>':
-        result += "&gt;";
-        break;
-      case '"':
-        result += "&quot;";
-        break;
-      // Unescaped, these would be read as blanks in an attribute.
-      case '\n':
-        result += "&#10;";
-        break;
-      case '\r':
-        result += "&#13;";
-        break;
-      case '\t':
-        result += "&#9;";
-        break;
-      default:
-        result += c;
-    }
-  }
-  return result;
-}
-
 std::string attribute(std::string_view name, const std::string& value) {
-  return " " + std::string(name) + "=\"" + escaped(value) + "\"";
+  return " " + std::string(name) + "=\"" + xmlText(value) + "\"";
 }
 
 std::string seconds(double value) {
@@ -116,7 +62,7 @@ std::string testCase(const Report& report) {
   const auto where = report.file + ":" + std::to_string(report.failedLine) + ": ";
   return start + ">\n      <failure" + attribute("message", report.problem) +
          attribute("type", "expectation") + ">" +
-         escaped(where + report.problem + "\n" + report.statement) +
+         xmlText(where + report.problem + "\n" + report.statement) +
          "</failure>\n    </testcase>\n";
 }
 
