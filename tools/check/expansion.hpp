@@ -26,6 +26,11 @@ struct Exploration::Expansion {
   std::vector<Found> found;
   std::vector<std::uint8_t> places;  // of `found`, one after the other
   std::vector<Fact> facts;
+  // By move: where the move leads if that adds nothing to what was known, else `noPlace`. Apart
+  // from `found`, because the merging thread looks at no more of most moves.
+  std::vector<std::uint32_t> known;
+  std::size_t waits = 0;  // among the moves
+  bool runsList = false;  // one of the moves does
 };
 
 }  // namespace qz::tools::check

@@ -146,19 +146,45 @@ void Exploration::expand(World& world, Expansion& expansion) const {
     found.arrival = world.make(moves[i], from, visit.look, pending, found.timers, place);
     const auto& facts = world.facts();
     expansion.facts.insert(expansion.facts.end(), facts.begin(), facts.end());
-    if (!found.arrival.isEndless) lookUp(found, place, visit);
+    hash(found, place);
+  }
+  // Looked up together, so that the processor waits for the memory of many at a time.
+  for (const Found& found : expansion.found) {
+    if (found.hash) set_.prefetchPlace(*found.hash);
+  }
+  for (std::size_t i = 0; i < moves.size(); ++i) {
+    lookUp(expansion.found[i], expansion.places.data() + i * format_.size(), visit);
+  }
+  summarize(expansion);
+}
+
+void Exploration::summarize(Expansion& expansion) {
+  expansion.known.clear();
+  expansion.waits = 0;
+  expansion.runsList = false;
+  for (const Found& found : expansion.found) {
+    expansion.known.push_back(found.isNews ? noPlace : *found.place);
+    expansion.waits += found.arrival.move == waitMove;
+    expansion.runsList |= found.arrival.ranList || found.arrival.isEndless;
   }
 }
 
-// Most moves lead to what is known. Timers that were not seen before get their number later.
-void Exploration::lookUp(Found& found, std::uint8_t* place, const Visit& from) const {
+// Timers that were not seen before get their number later.
+void Exploration::hash(Found& found, std::uint8_t* place) const {
   found.hash.reset();
-  found.place.reset();
-  found.isNews = true;
+  if (found.arrival.isEndless) return;
   const auto number = knownNumberOf(found.timers);
   if (!number) return;
   format_.setTimers(place, *number);
   found.hash = PlaceSet::hashOf(place, format_.size());
+  set_.prefetchSlot(*found.hash);
+}
+
+// Most moves lead to what is known.
+void Exploration::lookUp(Found& found, const std::uint8_t* place, const Visit& from) const {
+  found.place.reset();
+  found.isNews = true;
+  if (!found.hash) return;
   found.place = set_.find(place, *found.hash);
   if (!found.place || !found.timers.empty()) return;
   const Situation situation =
@@ -170,29 +196,29 @@ void Exploration::lookUp(Found& found, std::uint8_t* place, const Visit& from) c
 void Exploration::merge(Expansion& expansion) {
   const Visit from = visits_[expansion.visit];
   const bool isFirst = firstVisit_[from.place] == expansion.visit;
-  std::vector<std::uint32_t> targets;
-  bool runsList = false;
-  for (std::size_t i = 0; i < expansion.found.size(); ++i) {
+  addFacts(expansion, isFirst ? from.place : noPlace);
+  targets_.clear();
+  for (std::size_t i = 0; i < expansion.known.size(); ++i) {
+    if (expansion.known[i] != noPlace) {
+      targets_.push_back(expansion.known[i]);
+      continue;
+    }
     Found& found = expansion.found[i];
-    const Arrival& arrival = found.arrival;
-    addFacts(expansion, i, isFirst ? from.place : noPlace);
-    if (isFirst) ++(arrival.move == waitMove ? waits_ : presses_);
-    runsList |= arrival.ranList || arrival.isEndless;
-    if (arrival.isEndless) continue;
-    targets.push_back(found.isNews
-                          ? arrive(found, expansion.places.data() + i * format_.size(),
-                                   expansion.visit, arrival.lastList.value_or(from.lastList))
-                          : *found.place);
+    if (found.arrival.isEndless) continue;
+    targets_.push_back(arrive(found, expansion.places.data() + i * format_.size(), expansion.visit,
+                              found.arrival.lastList.value_or(from.lastList)));
   }
   if (!isFirst) return;
-  runsList_.push_back(runsList);
-  addEdges(targets);
+  waits_ += expansion.waits;
+  presses_ += expansion.known.size() - expansion.waits;
+  runsList_.push_back(expansion.runsList);
+  addEdges(targets_);
 }
 
-void Exploration::addFacts(const Expansion& expansion, std::size_t move, std::uint32_t place) {
-  const std::size_t last = move + 1 < expansion.found.size() ? expansion.found[move + 1].firstFact
-                                                             : expansion.facts.size();
-  for (std::size_t fact = expansion.found[move].firstFact; fact < last; ++fact) {
+void Exploration::addFacts(const Expansion& expansion, std::uint32_t place) {
+  std::size_t move = 0;
+  for (std::size_t fact = 0; fact < expansion.facts.size(); ++fact) {
+    while (move + 1 < expansion.found.size() && expansion.found[move + 1].firstFact <= fact) ++move;
     facts_.add(expansion.facts[fact], {expansion.visit, expansion.found[move].arrival.move}, place);
   }
 }
@@ -316,9 +342,11 @@ std::optional<std::uint32_t> Exploration::knownNumberOf(const PendingTimers& tim
 void Exploration::addEdges(const std::vector<std::uint32_t>& targets) {
   if (edgeOffset_.size() % placesOfABase == 0) edgeBase_.push_back(edges_.size());
   edgeOffset_.push_back(static_cast<std::uint32_t>(edges_.size() - edgeBase_.back()));
+  edges_.resize(edges_.size() + targets.size() * edgeBytes);
+  std::uint8_t* end = edges_.data() + edges_.size() - targets.size() * edgeBytes;
   for (const std::uint32_t target : targets) {
     for (std::size_t byte = 0; byte < edgeBytes; ++byte) {
-      edges_.push_back(static_cast<std::uint8_t>(target >> 8 * byte));
+      *end++ = static_cast<std::uint8_t>(target >> 8 * byte);
     }
   }
 }

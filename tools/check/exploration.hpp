@@ -135,9 +135,11 @@ class Exploration {
   void start();
   void expandAll(std::vector<Expansion>& expansions, std::uint32_t first, unsigned threads);
   void expand(World& world, Expansion& expansion) const;
-  void lookUp(Found& found, std::uint8_t* place, const Visit& from) const;
+  static void summarize(Expansion& expansion);
+  void hash(Found& found, std::uint8_t* place) const;
+  void lookUp(Found& found, const std::uint8_t* place, const Visit& from) const;
   void merge(Expansion& expansion);
-  void addFacts(const Expansion& expansion, std::size_t move, std::uint32_t place);
+  void addFacts(const Expansion& expansion, std::uint32_t place);
   std::uint32_t arrive(Found& found, std::uint8_t* place, std::uint32_t parent,
                        std::uint32_t lastList);
   bool isNews(const Visit& visit);
@@ -172,6 +174,7 @@ class Exploration {
   std::vector<std::uint32_t> edgeOffset_;  // of each place, from there
   std::vector<bool> runsList_;
   std::vector<std::unique_ptr<World>> worlds_;
+  std::vector<std::uint32_t> targets_;  // of the visit that is being merged
   std::map<std::pair<std::uint32_t, std::uint32_t>, Occasion> timerStarts_;  // place, element
   std::vector<Arrival> starts_;
   std::uint32_t firstLook_ = 0;  // before the start
