@@ -175,6 +175,17 @@ TEST_F(Expectations, KnowEveryCondition) {
   }
 }
 
+// Nothing is true of a tag that no control has at the moment.
+TEST_F(Expectations, KnowTagsThatCome) {
+  directory_.write(
+      "script.plist",
+      "{ 1 = (IDLE_LOOP); 3 = ((SET_TAG_FOR_OBJECT_ID, 7, 5)); 2 = (TERMINATE_PARSER); }");
+  expectToHold("can reach shown 7");
+  const Verdict verdict = check("always shown 7\n");
+  ASSERT_EQ(failuresIn(verdict).size(), 1U);
+  EXPECT_EQ(failuresIn(verdict)[0].path.size(), 1U) << "before the press";
+}
+
 TEST_F(Expectations, KnowAnImage) {
   expectToFail("always image 8 pic", afterPicture);
   expectToHold("whenever list 20 ran, image 8 pic");

@@ -440,5 +440,37 @@ TEST_F(CheckCommand, PrintsWhatIsKnownWhenTheUserInterruptsIt) {
   EXPECT_FALSE(handlesInterruptions()) << "a later Ctrl-C ends the program as usual";
 }
 
+TEST_F(CheckCommand, TakesNumbersThatAreNotWhole) {
+  const Result result =
+      checkInWindow({"clean.plist", "--seconds", "59.5", "--words-per-minute", "180.5"});
+  EXPECT_EQ(result.status, 0) << result.err;
+  EXPECT_TRUE(contains(result.out, "which are all")) << result.out;
+}
+
+TEST_F(CheckCommand, CountsExpectationsInEveryReport) {
+  directory_.write("check.expect", "always can reach the end\nnever shown 5\n");
+  const struct {
+    const char* format;
+    std::vector<const char*> parts;
+  } cases[] = {
+      {"text", {"  expectations: 1 hold, 1 fail\n", "check.expect:2"}},
+      {"json", {"\"expectations\"", "\"hold\": 1", "\"fail\": 1", "\"open\": 0"}},
+      {"sarif", {"\"uri\": \"check.expect\"", "\"startLine\": 2"}},
+      {"github", {"::error file=check.expect,line=2,title=expectation::"}},
+      {"junit", {"check.expect:2"}},
+  };
+  for (const auto& test : cases) {
+    const Result result =
+        checkInWindow({"clean.plist", "--expect", "check.expect", "--format", test.format});
+    EXPECT_EQ(result.status, 1) << result.err;
+    for (const char* const part : test.parts) {
+      EXPECT_TRUE(contains(result.out, part)) << test.format << ": " << part << "\n" << result.out;
+    }
+  }
+  const Result cut = checkInWindow(
+      {"clean.plist", "--expect", "check.expect", "--limit", "1", "--format", "text"});
+  EXPECT_TRUE(contains(cut.out, "not known, because not everything was explored")) << cut.out;
+}
+
 }  // namespace
 }  // namespace qz::tools

@@ -130,6 +130,39 @@ TEST(Completion, BashKnowsEveryCommandAndEveryOption) {
   EXPECT_EQ(bashCompletes(place, {""}), names);
 }
 
+/// Expects the script to name every command, and behind its name every option of it.
+void expectAllNames(const std::string& script, const std::string& before, const std::string& behind,
+                    const std::string& dash) {
+  for (const CommandOutline& command : outlineOf(allCommands())) {
+    const std::size_t name = script.find(before + command.name + behind);
+    ASSERT_NE(name, std::string::npos) << command.name;
+    for (const OptionOutline& option : command.options) {
+      EXPECT_NE(script.find(dash + option.name.substr(2), name), std::string::npos)
+          << command.name << " " << option.name;
+    }
+  }
+}
+
+// What these shells do with the scripts is tested below, where the shells are installed.
+TEST(Completion, FishAndZshAreToldEveryCommandAndEveryOption) {
+  const std::string fish = run(completionCommand, {"completion", "fish"}).out;
+  expectAllNames(fish, "'__fish_seen_subcommand_from ", "'", "' -l ");
+  for (const char* const part :
+       {"completion' -a 'bash zsh fish'", "-l resources -x -a '(__fish_complete_directories)'",
+        "-l window -r -F", "-l press -x -d"}) {
+    EXPECT_NE(fish.find(part), std::string::npos) << part;
+  }
+  const std::string zsh = run(completionCommand, {"completion", "zsh"}).out;
+  expectAllNames(zsh, "    ", ") _arguments", "--");
+  for (const char* const part :
+       {"completion) _arguments '--help[Print this help message and exit]' "
+        "'*:argument:(bash zsh fish)' ;;",
+        "'--resources=[The directory of the images]:value:_files -/'",
+        "'--window=[The host'\\''s window, a property list of its controls]:value:_files'"}) {
+    EXPECT_NE(zsh.find(part), std::string::npos) << part;
+  }
+}
+
 TEST(Completion, FishCompletesCommandsOptionsAndValues) {
   if (!isInstalled("fish")) GTEST_SKIP() << "fish is not installed";
   const CompletionPlace place("fish");

@@ -23,8 +23,8 @@ class Conclusions {
         isStandIn_(isStandIn),
         threads_(threads) {
     for (const Finding& finding : read) {
-      if (finding.severity == Severity::error && finding.list) {
-        read_.emplace(*finding.list, finding.element.value_or(noElement));
+      if (finding.severity == Severity::error && finding.list && finding.element) {
+        read_.emplace(*finding.list, *finding.element);
       }
       if (finding.code == "useless-delay") useless_.emplace(*finding.list, *finding.element);
     }
@@ -48,8 +48,6 @@ class Conclusions {
   }
 
  private:
-  static constexpr std::size_t noElement = static_cast<std::size_t>(-1);
-
   void endlessChains() {
     for (const auto& [subject, entry] : facts_.all(FactKind::endlessChain)) {
       addForElement(subject, entry,
@@ -66,12 +64,6 @@ class Conclusions {
       addForElement(subject, entry,
                     findingOf("raises", nameOf(subject) + " fails here: " + entry.detail +
                                             "; the list goes on with its next element"));
-    }
-    for (const auto& [subject, entry] : facts_.all(FactKind::listRaised)) {
-      const ScriptList& list = script_.lists()[static_cast<std::size_t>(subject)];
-      if (read_.contains({list.key, noElement})) continue;
-      addForList(list, entry,
-                 findingOf("raises", "list " + quote(list.key) + " fails: " + entry.detail));
     }
   }
 
@@ -281,11 +273,6 @@ class Conclusions {
     finding.element = element;
     finding.where = list->elements[element].value;
     if (!finding.tag) finding.tag = list->elements[element].target(list->tag.value_or(0));
-    add(entry, std::move(finding));
-  }
-  void addForList(const ScriptList& list, const FactTable::Entry& entry, Finding finding) {
-    finding.list = list.key;
-    finding.where = list.keyValue;
     add(entry, std::move(finding));
   }
   void addForTag(Subject subject, const FactTable::Entry& entry, Finding finding) {

@@ -31,7 +31,6 @@ enum class FactKind : std::uint8_t {
   endlessChain,   ///< it runs a list that is running already; detail: the loop
   // of a list
   listRan,
-  listRaised,  ///< running it raised, because it is not an array
   // of a tag
   noListPressed,    ///< a button with the tag can be pressed, and no list is under the tag
   sharedTagPressed  ///< a button is pressed while another control has its tag

@@ -26,8 +26,8 @@ struct Station {
 /// What all presses of an exploration have in common.
 struct PressContext {
   const PlaceFormat& format;
-  std::size_t
-      notes;  ///< the parts of a look that are notes of the engine; they follow the controls
+  /// How many parts of a look are notes of the engine. They follow the controls.
+  std::size_t notes;
   /// The tags that an end gives the controls; absent for a control that keeps its tag.
   std::vector<std::optional<Tag>> restoredTags{};
 
@@ -37,9 +37,9 @@ struct PressContext {
 };
 
 /// The controls that a press has looked up, the tags that it has looked for, and the controls to
-/// which an element may have given another tag. A press depends on
-/// nothing else but the engine's notes in the look: it cancels the pending timers first. It changes
-/// no other control, but an end gives all controls their own tags back.
+/// which an element has given another tag. A press depends on nothing else but the engine's notes
+/// in the look: it cancels the pending timers first. It changes no other control, but an end gives
+/// all controls their own tags back.
 class Trace {
  public:
   void clear();

@@ -114,10 +114,8 @@ void World::build(const std::optional<std::string>& startKey) {
   if (startKey) recorder_->begin();
   try {
     stage_->load(noFile, startKey);
-  } catch (const toolkit::Exception& exception) {
-    if (const auto list = setting_.script.listUnder(*startKey)) {
-      recorder_->note(FactKind::listRaised, static_cast<Subject>(*list), exception.reason());
-    }
+  } catch (const toolkit::Exception&) {
+    // The list is not an array, which is found by reading the script.
   }
 }
 
@@ -292,10 +290,8 @@ void World::press(std::size_t control) {
   }
   try {
     pressed.button->click();
-  } catch (const toolkit::Exception& exception) {
-    if (const auto list = setting_.script.listOfTag(tag)) {
-      recorder_->note(FactKind::listRaised, static_cast<Subject>(*list), exception.reason());
-    }
+  } catch (const toolkit::Exception&) {
+    // as at the start
   }
 }
 
@@ -321,10 +317,8 @@ void World::wait(const PendingTimer& first) {
   noteIfTimerPressesShared(first.key);
   try {
     driver_->toolkit().advance(first.seconds);
-  } catch (const toolkit::Exception& exception) {
-    if (const auto list = setting_.script.listUnder(first.key)) {
-      recorder_->note(FactKind::listRaised, static_cast<Subject>(*list), exception.reason());
-    }
+  } catch (const toolkit::Exception&) {
+    // as at the start
   }
 }
 
