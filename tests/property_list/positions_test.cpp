@@ -4,6 +4,8 @@
 
 #include <string>
 #include <string_view>
+#include <utility>
+#include <vector>
 
 #include "tests/property_list/binary_file.hpp"
 #include "tests/property_list/reading.hpp"
@@ -199,6 +201,63 @@ TEST(Refusals, OfOldStyleSayWhatIsWrong) {
       {"\xFE\xFF\xD8\x3D\0'"s, "line 1, column 1: the text is not valid UTF-16"},
   };
   expectRefusals(cases, "old-style property list");
+}
+
+TEST(Refusals, OfBinaryFilesSayWhatIsWrong) {
+  const std::string huge = "\x4F\x13\x7F\xFF\xFF\xFF\xFF\xFF\xFF\xFF";
+  const auto withObjects = [](std::vector<std::string> objects) {
+    return BinaryFile{.objects = std::move(objects)}.bytes();
+  };
+  const auto withTrailer = [](std::size_t at, char byte) {
+    std::string bytes = BinaryFile{.objects = {"\x09"}}.bytes();  // the trailer starts at 11
+    bytes[at] = byte;
+    return bytes;
+  };
+  BinaryFile deep{.objects = {}, .referenceSize = 2};
+  for (std::size_t i = 1; i <= 514; ++i) {
+    deep.objects.emplace_back("\xA1");
+    binary::appendNumber(deep.objects.back(), i, 2);
+  }
+  const RefusedCase cases[] = {
+      {std::string(binary::magic) + std::string(33, '\0'),
+       "byte 40: the file is too short for a header, an object and a trailer"},
+      {withTrailer(17, 0), "byte 17: the offsets' size is not from 1 to 16"},
+      {withTrailer(17, 17), "byte 17: the offsets' size is not from 1 to 16"},
+      {withTrailer(18, 0), "byte 18: the references' size is not from 1 to 16"},
+      {withTrailer(18, 17), "byte 18: the references' size is not from 1 to 16"},
+      {withTrailer(26, 0), "byte 19: there is no object"},
+      {withTrailer(34, 1), "byte 27: the top object does not exist"},
+      {withTrailer(42, 8),
+       "byte 35: the offset table does not lie between the header and the trailer"},
+      {withTrailer(42, 11),
+       "byte 35: the offset table does not lie between the header and the trailer"},
+      {withTrailer(26, 2), "byte 19: the offset table does not fill the space up to the trailer"},
+      {withTrailer(42, 10), "byte 19: the offset table does not fill the space up to the trailer"},
+      {withObjects(std::vector<std::string>(256, "\x09")),
+       "byte 783: the references are too small for the number of objects"},
+      {BinaryFile{.objects = {std::string(248, '\x09')}, .offsetSize = 1}.bytes(),
+       "byte 263: the offsets are too small for the objects' space"},
+      {BinaryFile{.objects = {"\x09", "\x08"}, .offsets = {8, 10}}.bytes(),
+       "byte 12: the offset does not lead to before the offset table"},
+      {BinaryFile{.objects = {"\x09"}, .offsets = {7}}.bytes(),
+       "byte 7: an object cannot lie in the header"},
+      {withObjects({"\xA1\x01", "\xA1\x00"s}), "byte 8: the object holds itself"},
+      {deep.bytes(), "byte 1547: more than 512 nested levels"},
+      {withObjects({"\x01"}), "byte 8: unknown kind of object"},
+      {withObjects({"\x30\x00"s}), "byte 8: unknown kind of object"},
+      {withObjects({huge}), "byte 18: the object reaches beyond the objects' space"},
+      {withObjects({"\x42z"}), "byte 9: the object reaches beyond the objects' space"},
+      {withObjects({"\x4F"}), "byte 9: expected the object's length, an integer"},
+      {withObjects({"\x4F\x23"}), "byte 9: expected the object's length, an integer"},
+      {withObjects({"\x15" + std::string(32, '\0')}), "byte 8: an integer of more than 16 bytes"},
+      {withObjects({"\x21\x00\x00"s}), "byte 8: a real of neither 4 nor 8 bytes"},
+      {withObjects({"\x84\x01\x00\x00\x00\x00"s}), "byte 8: a UID of more than 32 bits"},
+      {withObjects({"\x60"}), "byte 8: a UTF-16 string of no characters"},
+      {withObjects({"\xA2\x01\x02", "\x09"}), "byte 10: the object referred to does not exist"},
+      {withObjects({"\xD1\x01\x02", "\xA0", "\x09"}),
+       "byte 8: a collection as the key of a dictionary"},
+  };
+  expectRefusals(cases, "binary property list");
 }
 
 TEST(Positions, OfTheRootOfAStringsFile) {
