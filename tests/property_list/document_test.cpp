@@ -4,10 +4,14 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
 #include <memory>
 #include <memory_resource>
 #include <utility>
 #include <vector>
+
+#include "qz/property_list/collections.hpp"
+#include "qz/property_list/scalars.hpp"
 
 namespace qz::toolkit {
 namespace {
@@ -36,6 +40,36 @@ TEST(Documents, KeepContainersApart) {
   there = std::move(here);  // copies, because the memory of another document cannot be taken over
   EXPECT_EQ(there, (std::pmr::vector<int>{1, 2, 3}));
   EXPECT_NE(there.data(), elements);
+}
+
+TEST(Documents, HoldValuesSideBySide) {
+  // The sizes are those of the objects; a text and bytes follow theirs, rounded up to whole units.
+  const struct {
+    const char* kind;
+    std::function<void*(Document&)> make;
+    std::size_t size;
+  } cases[] = {
+      {"string", [](Document& in) { return String::make(in, "12345678"); }, sizeof(String) + 8},
+      {"longer string", [](Document& in) { return String::make(in, "123456789"); },
+       sizeof(String) + 16},
+      {"number", [](Document& in) { return Number::make(in, Number::Type::real64, 0); },
+       sizeof(Number)},
+      {"date", [](Document& in) { return Date::make(in, 0); }, sizeof(Date)},
+      {"data", [](Document& in) { return Data::make(in, "1"); }, sizeof(Data) + 8},
+      {"null", [](Document& in) { return Null::make(in); }, sizeof(Null)},
+      {"uid", [](Document& in) { return Uid::make(in, 1); }, sizeof(Uid)},
+      {"array", [](Document& in) { return Array::make(in, {}); }, sizeof(Array)},
+      {"set", [](Document& in) { return Set::make(in, {}); }, sizeof(Set)},
+      {"dictionary",
+       [](Document& in) { return Dictionary::make(in, {}, {}, Dictionary::Duplicates::firstWins); },
+       sizeof(Dictionary)},
+  };
+  for (const auto& [kind, make, size] : cases) {
+    const OwnDocument document(Document::make());
+    const auto* const first = static_cast<std::byte*>(make(*document));
+    const auto* const next = static_cast<std::byte*>(make(*document));
+    EXPECT_EQ(next - first, static_cast<std::ptrdiff_t>(size)) << kind;
+  }
 }
 
 }  // namespace

@@ -9,6 +9,7 @@
 #include <string>
 #include <vector>
 
+#include "tests/end_of_memory.hpp"
 #include "tests/property_list/binary_file.hpp"
 #include "tests/property_list/reading.hpp"
 
@@ -35,7 +36,7 @@ std::vector<std::string> samples(std::size_t most) {
 }
 
 /// Reads arbitrary bytes, and expects either a sound value or a refusal with a description.
-void expectValueOrRefusal(const std::string& bytes) {
+void expectValueOrRefusal(std::string_view bytes) {
   const ReadResult result = readPropertyList(bytes);
   ASSERT_NE(result.value.pointer() == nullptr, !result.refusal) << testing::PrintToString(bytes);
   if (result.value) {
@@ -45,11 +46,43 @@ void expectValueOrRefusal(const std::string& bytes) {
   }
 }
 
+/// Reads every beginning of a file, each where readable memory ends.
+void cutAnywhere(std::string_view file) {
+  EndOfMemory memory;
+  for (std::size_t size = 0; size <= file.size(); ++size) {
+    expectValueOrRefusal(memory.holding(file.substr(0, size)));
+  }
+}
+
 TEST(HostileInput, CutShortAnywhere) {
-  for (const std::string& sample : samples(400)) {
-    for (std::size_t size = 0; size < sample.size(); ++size) {
-      expectValueOrRefusal(sample.substr(0, size));
-    }
+  for (const std::string& sample : samples(400)) cutAnywhere(sample);
+  cutAnywhere(
+      plist("<array> <date>2001-01-01T00:00:00Z</date> <data>AQ==</data> <real>1e5</real>"
+            "<string a=''>\xC3\xA9&#x20;&amp;<![CDATA[ ]]></string > <!-- c --> </array >"));
+  cutAnywhere("{ a = \"\\n\\U0041\\101\"; /* c */ b = <01 02>; // c\n c; }");
+  cutAnywhere("\xFE\xFF\0'\xD8\x3D\xDE\0\0'"s);
+}
+
+TEST(HostileInput, WhatFollowsTheEndDoesNotCount) {
+  const struct {
+    std::string_view file;
+    std::string_view beyond;
+  } cases[] = {
+      {"<array>", " <true/></array>"},
+      {"<array><true/> ", " <true/></array>"},
+      {"<string>a", "b</string>"},
+      {"<string>a</string", " >"},
+      {"<integer>1", "2</integer>"},
+      {"<date>2001", "-01-01T00:00:00Z</date>"},
+      {"{ a = b", "; }"},
+      {"'a", "b'"},
+      {"<01", "02>"},
+      {"\xFF\xFE<\0t\0r\0u\0e\0/\0>\0\x3D\xD8"sv, "\0\xDE"sv},
+  };
+  for (const auto& [file, beyond] : cases) {
+    const std::string whole = std::string(file) + std::string(beyond);
+    EXPECT_NE(dumpOf(whole), refused) << whole;
+    EXPECT_EQ(dumpOf(std::string_view(whole).substr(0, file.size())), refused) << whole;
   }
 }
 

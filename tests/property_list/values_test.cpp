@@ -56,15 +56,27 @@ TEST(Values, RaiseWhatTheyDoNotUnderstand) {
 }
 
 TEST(Values, CountOnlyCollections) {
-  for (const ValueRef<>& value : {ValueRef<>(String::make("abc")), ValueRef<>(Number::withLong(3)),
-                                  ValueRef<>(Date::make(0)), ValueRef<>(Data::make("abc"))}) {
-    const std::string start = "-[" + std::string(value->className()) + " ";
-    const std::string end = "]: unrecognized selector sent to instance";
+  const struct {
+    ValueRef<> value;
+    const char* className;
+  } others[] = {
+      {String::make("abc"), "NSString"},    {Number::withLong(3), "NSNumber"},
+      {Number::withBool(true), "NSNumber"}, {Date::make(0), "NSDate"},
+      {Data::make("abc"), "NSData"},        {Null::make(), "NSNull"},
+      {Uid::make(3), "NSKeyedArchiverUID"},
+  };
+  const std::string end = "]: unrecognized selector sent to instance";
+  for (const auto& other : others) {
+    const auto& value = other.value;
+    const std::string start = std::string("-[") + other.className + " ";
+    EXPECT_EQ(value->className(), other.className);
     EXPECT_EQ(refusal([&] { value->count(); }), start + "count" + end);
     EXPECT_EQ(refusal([&] { value->objectAtIndex(0); }), start + "objectAtIndex:" + end);
   }
   const ValueRef<> dictionary = Dictionary::make();
-  EXPECT_NE(refusal([&] { dictionary->objectAtIndex(0); }), "");
+  EXPECT_EQ(refusal([&] { dictionary->objectAtIndex(0); }), "-[NSDictionary objectAtIndex:" + end);
+  const ValueRef<> set = Set::make({});
+  EXPECT_EQ(refusal([&] { set->objectAtIndex(0); }), "-[NSSet objectAtIndex:" + end);
   EXPECT_EQ(dictionary->count(), 0U);
   EXPECT_EQ(Set::make({Null::make()})->count(), 1U);
 }

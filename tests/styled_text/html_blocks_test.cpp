@@ -62,6 +62,44 @@ TEST(HtmlLists, NumberTheirItems) {
   for (const auto& [html, text] : cases) EXPECT_EQ(read(html).string(), text) << html;
 }
 
+TEST(HtmlLists, CountInRomanNumerals) {
+  const struct {
+    const char* value;
+    const char* marker;
+  } cases[] = {
+      {"1", "i"},
+      {"2", "ii"},
+      {"3", "iii"},
+      {"4", "iv"},
+      {"5", "v"},
+      {"6", "vi"},
+      {"9", "ix"},
+      {"10", "x"},
+      {"39", "xxxix"},
+      {"40", "xl"},
+      {"49", "xlix"},
+      {"50", "l"},
+      {"89", "lxxxix"},
+      {"90", "xc"},
+      {"99", "xcix"},
+      {"100", "c"},
+      {"399", "cccxcix"},
+      {"400", "cd"},
+      {"499", "cdxcix"},
+      {"500", "d"},
+      {"899", "dcccxcix"},
+      {"900", "cm"},
+      {"999", "cmxcix"},
+      {"1000", "m"},
+      {"3888", "mmmdccclxxxviii"},
+      {"3999", "mmmcmxcix"},
+  };
+  for (const auto& [value, marker] : cases) {
+    const std::string html = joined({"<ol type=i><li value=", value, ">a</ol>"});
+    EXPECT_EQ(read(html).string(), joined({"\t", marker, ".\ta\n"})) << html;
+  }
+}
+
 TEST(HtmlLists, PutTheFirstBlockBesideTheMarker) {
   const struct {
     const char* html;

@@ -8,8 +8,10 @@
 #include <ctime>
 #include <random>
 #include <string>
+#include <string_view>
 #include <vector>
 
+#include "tests/end_of_memory.hpp"
 #include "tests/styled_text/reading.hpp"
 
 namespace qz {
@@ -39,7 +41,7 @@ bool isUtf8(std::string_view text) {
   return true;
 }
 
-void expectSound(const std::string& html) {
+void expectSound(std::string_view html) {
   const Catalogue fonts;
   const auto text = toolkit::attributedStringFromHTML(html, fonts);
   if (html.empty()) return;
@@ -160,7 +162,38 @@ TEST(HtmlLimits, ReadEveryBeginningOfADocument) {
       "<!DOCTYPE x><html><head><title>t</title></head><body link='red'><!-- c --><p align=center>"
       "a &eacute; <b>b <i>c</b>d</i><ul><li>e<li value=3>f</ul><table><tr><td>g<td>h</table>"
       "<a href=\"u&amp;v\">l</a><span style=\"color:#f00;font-size:2em\">m</span>&#x201C;</body>";
-  for (std::size_t length = 0; length <= html.size(); ++length) expectSound(html.substr(0, length));
+  EndOfMemory memory;
+  for (std::size_t length = 0; length <= html.size(); ++length) {
+    expectSound(memory.holding(std::string_view(html).substr(0, length)));
+  }
+}
+
+TEST(HtmlLimits, ReadNothingBehindTheEnd) {
+  const struct {
+    std::string_view html;
+    std::string_view behind;
+    std::string_view text;
+  } cases[] = {
+      {"a&", "#65;", "a&"},
+      {"a&#", "65;", "a&#"},
+      {"a&#6", "5;", "a\x06"},
+      {"a&#x", "41;", "a&#x"},
+      {"a&am", "p;", "a&am"},
+      {"a&notin", ";", "a\u00ACin"},
+      {"a<", "b>c", "a<"},
+      {"a</", "b>c", "a</"},
+      {"a<b", ">c", "a"},
+      {"a<b x='", "'>c", "a"},
+      {"a<!--", "-->b", "a"},
+      {"a<!-- --", ">b", "a"},
+      {"a<script>b</", "script>c", "a"},
+      {"<pre>\n", "a", ""},
+  };
+  for (const auto& [html, behind, text] : cases) {
+    const std::string whole = joined({html, behind});
+    EXPECT_EQ(read(std::string_view(whole).substr(0, html.size())).string(), text) << whole;
+    EXPECT_NE(read(whole).string(), text) << whole;
+  }
 }
 
 // However inline elements are opened and closed, the words between them stay.
