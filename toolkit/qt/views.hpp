@@ -15,7 +15,9 @@
 
 #include "qz/toolkit/view.hpp"
 #include "toolkit/qt/accessibility.hpp"
+#include "toolkit/qt/held_action.hpp"
 #include "toolkit/qt/image_look.hpp"
+#include "toolkit/qt/press_gate.hpp"
 #include "toolkit/qt/widget_node.hpp"
 
 namespace qz::toolkit::qt {
@@ -124,7 +126,7 @@ class QtControl : public QtView<Role, ControlNode> {
   }
 
  protected:
-  // Takes the clicks away from the host when a target is set.
+  // Leads the clicks away from the host while there is a target.
   virtual void takeClicks() {}
   // Listens for clicks. An action without a target is sent in addition to the host's reaction.
   virtual void hearClicks() {}
@@ -149,10 +151,13 @@ class QtButton final : public QtControl<Button> {
   QAbstractButton* button() const { return static_cast<QAbstractButton*>(widget()); }
   void takeClicks() override;
   void hearClicks() override;
+  bool takesPress() const;
   void clicked();
 
   State heldState_ = State::off;  // for a button that is not checkable; it is not shown
   QMetaObject::Connection clicks_;
+  std::unique_ptr<HeldAction> heldAction_;
+  std::unique_ptr<PressGate> gate_;
 };
 
 class QtTextField final : public QtControl<TextField> {

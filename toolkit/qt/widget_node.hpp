@@ -28,6 +28,11 @@ inline constexpr const char* tagProperty = "qzTag";
 /// no pixmap.
 inline constexpr const char* imageViewProperty = "qzImageView";
 
+/// The dynamic property of a button, or of a tool button's action, that leads its presses both to
+/// the host and to the button's target if it is "both". Otherwise a press goes to the target, if
+/// there is one.
+inline constexpr const char* pressProperty = "qzPress";
+
 /// True if `child`, a child of a widget, is a subview: a widget that is not a window.
 bool isSubview(const QObject* child);
 

@@ -47,7 +47,7 @@ class WalkThrough {
   void setAdoption(toolkit::qt::Adoption adoption) { adoption_ = std::move(adoption); }
 
   /// Sets a function that is called after the end of every walk-through, when it no longer uses the
-  /// widgets: the host can then reconnect the clicks that the walk-through took over.
+  /// widgets.
   void whenOver(std::function<void()> told) { over_ = std::move(told); }
 
   /// Returns the engine; null if no walk-through is running.
