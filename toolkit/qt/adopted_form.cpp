@@ -146,7 +146,17 @@ std::vector<std::string> AdoptedForm::unreachableTags() const {
   return complaints;
 }
 
-void AdoptedForm::changed(QWidget& widget, Notice notice) {
+std::vector<Sighting> AdoptedForm::look(QWidget& widget) const {
+  if (how_.restoring == Adoption::Restoring::tags) return {};
+  return sightingsAround(widget);
+}
+
+void AdoptedForm::changed(QWidget* widget, Notice notice, const std::vector<Sighting>& before) {
+  if (widget) attend(*widget, notice);
+  trace_.note(before);
+}
+
+void AdoptedForm::attend(QWidget& widget, Notice notice) {
   if (!how_.bringsIntoView || notice == Notice::none || isKeptHidden(widget)) return;
   if (notice == Notice::flash && !flashed_.insert(&widget).second) return;
   bringIntoView(widget);

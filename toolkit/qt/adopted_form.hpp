@@ -11,6 +11,7 @@
 #include <vector>
 
 #include "qz/toolkit/qt/adoption.hpp"
+#include "toolkit/qt/trace.hpp"
 
 class QAction;
 
@@ -38,11 +39,18 @@ class AdoptedForm {
   /// Returns a sentence for each tag in the window that no command can reach.
   std::vector<std::string> unreachableTags() const;
 
+  /// Returns all that a change of `widget` can change, as `changed` needs it; nothing if the
+  /// adoption does not restore it.
+  std::vector<Sighting> look(QWidget& widget) const;
   /// Brings a changed control into view, if the adoption says so. A flash does so only once for
-  /// each control, so that it does not drag back a user who has gone elsewhere.
-  void changed(QWidget& widget, Notice notice);
+  /// each control, so that it does not drag back a user who has gone elsewhere. Remembers what has
+  /// changed since `before`.
+  void changed(QWidget* widget, Notice notice, const std::vector<Sighting>& before);
+  /// Restores what has been remembered.
+  void restore() { trace_.undo(); }
 
  private:
+  void attend(QWidget& widget, Notice notice);
   void addTagged(const QWidget& around, std::vector<QWidget*>& found) const;
   void addTaggedFrom(QWidget& widget, std::vector<QWidget*>& found) const;
   bool isTagged(const QObject& object) const;
@@ -52,6 +60,7 @@ class AdoptedForm {
   QPointer<QWidget> window_;
   Adoption how_;
   std::set<const QWidget*> flashed_;
+  Trace trace_;
 };
 
 }  // namespace qz::toolkit::qt

@@ -18,6 +18,9 @@ AdoptedWindow::AdoptedWindow(QtToolkit& toolkit, QWidget& window, Adoption how)
   for (const std::string& complaint : form_->unreachableTags()) toolkit.log().write(complaint);
 }
 
-AdoptedWindow::~AdoptedWindow() { QtWindow::of(window_)->present(nullptr); }
+AdoptedWindow::~AdoptedWindow() {
+  form_->restore();
+  QtWindow::of(window_)->present(nullptr);
+}
 
 }  // namespace qz::toolkit::qt

@@ -8,10 +8,12 @@
 namespace qz::toolkit::qt {
 
 ViewChange::ViewChange(QWidget* widget, std::shared_ptr<AdoptedForm> form, Notice notice)
-    : widget_(widget), form_(std::move(form)), notice_(notice) {}
+    : widget_(widget), form_(std::move(form)), notice_(notice) {
+  if (form_ && widget) before_ = form_->look(*widget);
+}
 
 ViewChange::~ViewChange() {
-  if (form_ && widget_) form_->changed(*widget_, notice_);
+  if (form_) form_->changed(widget_, notice_, before_);
 }
 
 }  // namespace qz::toolkit::qt

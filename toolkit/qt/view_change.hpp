@@ -22,6 +22,7 @@ class ViewChange {
   const QPointer<QWidget> widget_;
   const std::shared_ptr<AdoptedForm> form_;
   const Notice notice_;
+  std::vector<Sighting> before_;
 };
 
 }  // namespace qz::toolkit::qt

@@ -21,6 +21,10 @@ struct Adoption {
     everyTaggedWidget,  ///< every widget with a tag, however deep, in the order of the widget tree
     directSubviews      ///< the direct children of the content, with and without a tag
   };
+  enum class Restoring : std::uint8_t {
+    everything,  ///< all that commands have changed, unless somebody else has changed it since
+    tags         ///< only the tags, as the engine does on its own
+  };
 
   Reading reading = Reading::everyTaggedWidget;
   /// The tags of widgets and actions by their object names. An object's own tag, the dynamic
@@ -29,6 +33,8 @@ struct Adoption {
   /// Whether a command that shows a control, flashes it or changes what it shows brings it into
   /// view: opens its tab, page, dock or pane, and scrolls to it.
   bool bringsIntoView = true;
+  /// What the end of the adoption restores.
+  Restoring restoring = Restoring::everything;
 };
 
 /// Presents a top-level widget of the host to a walk-through while it lives. An action that a tool
@@ -38,6 +44,7 @@ class AdoptedWindow {
  public:
   /// `toolkit` must outlive this object; `window` need not.
   AdoptedWindow(QtToolkit& toolkit, QWidget& window, Adoption how = {});
+  /// Restores what the adoption is to restore.
   ~AdoptedWindow();
   AdoptedWindow(const AdoptedWindow&) = delete;
   AdoptedWindow& operator=(const AdoptedWindow&) = delete;
