@@ -13,7 +13,6 @@ class GuidedForm final : public OrderForm {
   /// Scripts and images are looked for in the directory.
   explicit GuidedForm(std::string_view resources) {
     toolkit_.files().setResourcePath(resources);
-    walkThrough_.whenOver([this] { connectButtons(); });
     QMenu* const help = menuBar()->addMenu("&Help");
     help->addAction("Show me &around", [this] { walkThrough_.play("tour.plist", *this); });
     help->addAction("&Tips", [this] { walkThrough_.playInSheet("tips.plist", tips, *this); });

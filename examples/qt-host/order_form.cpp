@@ -66,14 +66,10 @@ OrderForm::OrderForm() {
   for (QCheckBox* const box : {&express, &insured}) {
     connect(box, &QCheckBox::toggled, this, &OrderForm::showPrice);
   }
-  connectButtons();
+  connect(&order, &QPushButton::clicked, this, &OrderForm::placeOrder);
+  connect(&clear, &QPushButton::clicked, this, &OrderForm::clearAll);
   showPrice();
   resize(480, 480);
-}
-
-void OrderForm::connectButtons() {
-  connect(&order, &QPushButton::clicked, this, &OrderForm::placeOrder, Qt::UniqueConnection);
-  connect(&clear, &QPushButton::clicked, this, &OrderForm::clearAll, Qt::UniqueConnection);
 }
 
 void OrderForm::showPrice() {

@@ -16,10 +16,6 @@ class OrderForm : public QMainWindow {
  public:
   OrderForm();
 
-  /// Connects the buttons to their actions. A walk-through takes over their clicks, so a host
-  /// connects them again when it ends.
-  void connectButtons();
-
   QLineEdit name;
   QLineEdit street;
   QLineEdit city;

@@ -127,14 +127,14 @@ bool WalkThrough::begin(std::string_view script, QWidget& stage, QWidget& window
   }
   const QScopedValueRollback<bool> beginning(isBeginning_, true);
   end();
-  auto& application = toolkit_.application();
-  const auto over = application.window(window);
+  const auto over = toolkit_.application().window(window);
   const auto engine = load(name, over);
   if (!engine) return false;
   engine_ = engine;
-  windows_ = {over, application.window(stage)};
+  adopted_ = std::make_unique<toolkit::qt::AdoptedWindow>(toolkit_, stage, adoption_);
+  parent_ = over;
   watch_ = std::make_shared<Watch>(*this, stage);
-  engine->getGuiAssetsFromWindow(windows_[1]);
+  engine->getGuiAssetsFromWindow(adopted_->window());
   toolkit_.calls().make([&] { engine->loadPlist(name, "", watch_, &stage != &window); });
   return true;
 }
@@ -144,7 +144,8 @@ void WalkThrough::end() {
   if (!engine_->terminating()) engine_->terminateParser();
   watch_.reset();
   engine_.reset();
-  windows_.clear();
+  adopted_.reset();
+  parent_ = {};
   if (const auto told = over_) told();
 }
 

@@ -5,14 +5,13 @@
 #include <QComboBox>
 #include <QLabel>
 #include <QLineEdit>
-#include <QMetaProperty>
 #include <QPushButton>
 #include <QRadioButton>
 #include <QTextEdit>
-#include <map>
 #include <set>
 
 #include "qz/engine.hpp"
+#include "tests/qt/snapshots.hpp"
 #include "tests/qt/support.hpp"
 #include "toolkit/qt/widget_node.hpp"
 
@@ -24,56 +23,18 @@ using toolkit::Array;
 using toolkit::Number;
 using toolkit::String;
 using Engine = QZ_Plist_State_Parser;
-using Snapshot = std::map<QString, QVariant>;
-
-// `QObject::receivers` is protected.
-struct Receivers : QObject {
-  static int of(const QObject& object, const QMetaMethod& signal) {
-    const QByteArray signature = '2' + signal.methodSignature();
-    return (object.*&Receivers::receivers)(signature);
-  }
-};
-
-void addTo(Snapshot& snapshot, const QObject& object) {
-  const QString name = object.objectName() + '.';
-  const QMetaObject& meta = *object.metaObject();
-  for (int i = 0; i < meta.propertyCount(); ++i) {
-    snapshot[name + meta.property(i).name()] = meta.property(i).read(&object);
-  }
-  for (const QByteArray& property : object.dynamicPropertyNames()) {
-    snapshot[name + property] = object.property(property);
-  }
-  for (int i = 0; i < meta.methodCount(); ++i) {
-    if (meta.method(i).methodType() == QMetaMethod::Signal) {
-      snapshot[name + meta.method(i).methodSignature()] = Receivers::of(object, meta.method(i));
-    }
-  }
-  snapshot[name + "children()"] = object.children().size();
-}
+using hosts::differences;
+using hosts::Snapshot;
+using hosts::without;
 
 Snapshot snapshotOf(const QWidget& window) {
   Snapshot snapshot;
-  addTo(snapshot, window);
+  hosts::addTo(snapshot, window, window.objectName());
   for (const QWidget* widget : window.findChildren<QWidget*>()) {
-    if (!widget->objectName().startsWith("qt_")) addTo(snapshot, *widget);
+    if (!widget->objectName().startsWith("qt_"))
+      hosts::addTo(snapshot, *widget, widget->objectName());
   }
   return snapshot;
-}
-
-std::set<QString> differences(const Snapshot& before, const Snapshot& after) {
-  std::set<QString> names;
-  for (const auto& [name, value] : before) {
-    if (!after.contains(name) || after.at(name) != value) names.insert(name);
-  }
-  for (const auto& [name, value] : after) {
-    if (!before.contains(name)) names.insert(name);
-  }
-  return names;
-}
-
-std::set<QString> without(std::set<QString> names, const std::set<QString>& others) {
-  for (const QString& name : others) names.erase(name);
-  return names;
 }
 
 struct Adoption : hosts::Host {

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Presses by mouse and keyboard, and what adopting a button does to the host's own connections.
+// Presses by mouse and keyboard, and what they do to the host's own connections.
 
 #include <QCheckBox>
 #include <QLineEdit>
@@ -46,7 +46,7 @@ TEST_F(Presses, DoNotReachDisabledButtons) {
   EXPECT_EQ(performer->actions, Actions{});
 }
 
-TEST_F(Presses, ReplaceTheHostsOwnConnectionsToTheClickAndNoOthers) {
+TEST_F(Presses, KeepTheClickFromTheHostAndNoOtherSignal) {
   auto& box = add<QCheckBox>("Box");
   int clicks = 0;
   int toggles = 0;

@@ -64,6 +64,17 @@ TEST_F(WalkThroughs, EndByTheScriptAndLeaveTheWindowOpen) {
   EXPECT_EQ(ends, 1);
 }
 
+TEST_F(WalkThroughs, TakeOverTheirWindowAsTheHostWants) {
+  auto& box = add<QWidget>();
+  next.setParent(&box);
+  ASSERT_TRUE(walkThrough.play("tour.plist", *panel));
+  EXPECT_EQ(next.text(), "Begun");
+  next.setText("Next");
+  walkThrough.setAdoption({.reading = toolkit::qt::Adoption::Reading::directSubviews});
+  ASSERT_TRUE(walkThrough.play("tour.plist", *panel));
+  EXPECT_EQ(next.text(), "Next") << "it is not a direct child";
+}
+
 TEST_F(WalkThroughs, EndWhenTheUserClosesTheWindow) {
   ASSERT_TRUE(walkThrough.play("tour.plist", *panel));
   panel->close();

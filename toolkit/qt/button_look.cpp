@@ -52,6 +52,7 @@ class ButtonLook final : public QObject {
   void setFaceColor(const std::optional<Color>& color) { shown_.face = color; }
   const std::optional<Color>& faceColor() const { return shown_.face; }
   void setBezel(BezelStyle bezel) { shown_.bezel = bezel; }
+  BezelStyle bezel() const { return shown_.bezel; }
 
   /// True if the button looks and reads as it would without this object.
   bool isIdle() const { return shown_.isNothing() && !highlighted_; }
@@ -155,11 +156,20 @@ void changeLook(QAbstractButton& button, const Change& change) {
 
 }  // namespace
 
-void showTitle(QAbstractButton& button, std::string_view title) {
+void restoreTitle(QAbstractButton& button, const QString& text) {
   if (decorationOn<ButtonLook>(button)) {
     changeLook(button, [](ButtonLook& look) { look.dropTitle(); });
   }
-  button.setText(withoutMeaning(qString(title)));
+  button.setText(text);
+}
+
+std::optional<AttributedString> styledTitle(const QAbstractButton& button) {
+  const auto* const look = decorationOn<ButtonLook>(button);
+  return look ? look->title() : std::nullopt;
+}
+
+void showTitle(QAbstractButton& button, std::string_view title) {
+  restoreTitle(button, withoutMeaning(qString(title)));
   announceShownName(button, qString(title));
 }
 
@@ -197,6 +207,11 @@ std::optional<Color> faceColor(const QAbstractButton& button) {
 void setBezel(QAbstractButton& button, BezelStyle style) {
   if (style == BezelStyle::rounded && !decorationOn<ButtonLook>(button)) return;
   changeLook(button, [&](ButtonLook& look) { look.setBezel(style); });
+}
+
+BezelStyle bezelOf(const QAbstractButton& button) {
+  const auto* const look = decorationOn<ButtonLook>(button);
+  return look ? look->bezel() : BezelStyle::rounded;
 }
 
 }  // namespace qz::toolkit::qt

@@ -17,6 +17,7 @@
 #include "qz/toolkit/view.hpp"
 
 class QAbstractButton;
+class QString;
 
 namespace qz::toolkit::qt {
 
@@ -27,6 +28,11 @@ void showTitle(QAbstractButton& button, const AttributedString& title);
 /// Returns the title that was shown last, with its attributes; if the host has set another since,
 /// that one without attributes. Mnemonic markers of a host's title are left out.
 AttributedString shownTitle(const QAbstractButton& button);
+
+/// Returns the title with attributes that was shown last; absent if it was plain.
+std::optional<AttributedString> styledTitle(const QAbstractButton& button);
+/// Shows a text of the host, with its mnemonic.
+void restoreTitle(QAbstractButton& button, const QString& text);
 
 /// Shows or removes the pressed-in look. If the user wants reduced motion, shows an outline
 /// instead, which stays while the button flashes. Nothing else about the button changes.
@@ -40,6 +46,7 @@ void setFaceColor(QAbstractButton& button, const std::optional<Color>& color);
 std::optional<Color> faceColor(const QAbstractButton& button);
 
 void setBezel(QAbstractButton& button, BezelStyle style);
+BezelStyle bezelOf(const QAbstractButton& button);
 
 /// The application's dynamic property and the environment variable that ask for reduced motion when
 /// set to anything but "0". They exist because Qt 6.4 does not report the desktop's own setting.

@@ -122,6 +122,8 @@ Ref<Image> shownImage(const QLabel& label) {
   return look && !look->isStale() ? look->image() : Ref<Image>();
 }
 
+void dropImage(QLabel& label) { delete decorationOn<ImageLook>(label); }
+
 void setLayered(QWidget& widget, bool layered) {
   if (layered) {
     decorated<Layer>(widget);

@@ -16,6 +16,9 @@ void showImage(QLabel& label, const Ref<Image>& image);
 /// pixmap since.
 Ref<Image> shownImage(const QLabel& label);
 
+/// Forgets the image that was shown last. The label keeps its pixmap.
+void dropImage(QLabel& label);
+
 /// Gives the widget a layer or removes the layer with its contents. Only a layer has contents.
 void setLayered(QWidget& widget, bool layered);
 bool isLayered(const QWidget& widget);

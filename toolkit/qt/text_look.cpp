@@ -206,12 +206,21 @@ bool showsText(const QWidget& widget) {
          documentOf(widget);
 }
 
+std::optional<AttributedString> styledText(const QWidget& widget) {
+  const auto* const look = decorationOn<TextLook>(widget);
+  return look ? std::optional(look->text()) : std::nullopt;
+}
+
+void dropStyledText(QWidget& widget) {
+  auto* const look = decorationOn<TextLook>(widget);
+  if (!look) return;
+  look->takeOff();
+  delete look;
+  forgetFormat(widget);
+}
+
 void showText(QWidget& widget, std::string_view text) {
-  if (auto* const look = decorationOn<TextLook>(widget)) {
-    look->takeOff();
-    delete look;
-    forgetFormat(widget);
-  }
+  dropStyledText(widget);
   const QString plain = qString(text);
   if (auto* const label = qobject_cast<QLabel*>(&widget)) {
     showPlain(*label, plain);

@@ -2,6 +2,7 @@
 // What labels, line edits and text edits show.
 #pragma once
 
+#include <optional>
 #include <string_view>
 
 #include "qz/styled_text/attributed_string.hpp"
@@ -24,6 +25,12 @@ void showText(QWidget& widget, const AttributedString& text);
 /// Returns the text that was shown last, with its attributes; if the host or the user has changed
 /// it since, the new text without attributes. Empty for a widget that shows none.
 AttributedString shownText(const QWidget& widget);
+
+/// Returns the text with attributes that was shown last, even if the host or the user has changed
+/// the widget's text since; absent if it was plain.
+std::optional<AttributedString> styledText(const QWidget& widget);
+/// Takes the attributes off the widget. The words stay.
+void dropStyledText(QWidget& widget);
 
 /// Makes a new label lay out its text like an AppKit text field: from the top, in several lines.
 void layOutAsTextField(QLabel& label);

@@ -3,7 +3,9 @@
 
 #include "toolkit/qt/views.hpp"
 
+#include <QAction>
 #include <QCheckBox>
+#include <QToolButton>
 #include <QVariant>
 
 #include "toolkit/backend/responder_chain.hpp"
@@ -21,6 +23,15 @@ bool isImageView(const QWidget& widget) {
   const auto* const label = qobject_cast<const QLabel*>(&widget);
   return label && (widget.property(imageViewProperty).toBool() ||
                    !label->pixmap(Qt::ReturnByValue).isNull());
+}
+
+bool isMarkedForBoth(const QObject& object) { return object.property(pressProperty) == "both"; }
+
+// True if a press of the button goes to the host as well as to the target.
+bool servesBoth(const QAbstractButton& button) {
+  const auto* const tool = qobject_cast<const QToolButton*>(&button);
+  const QAction* const action = tool ? tool->defaultAction() : nullptr;
+  return isMarkedForBoth(button) || (action && isMarkedForBoth(*action));
 }
 
 template <class V>
@@ -51,10 +62,15 @@ bool ControlNode::send(std::string_view action, const std::shared_ptr<Responder>
 
 QtButton::~QtButton() { QObject::disconnect(clicks_); }
 
-// Removes the host's connections to `clicked` for good; those to other signals stay.
 void QtButton::takeClicks() {
-  if (button()) QObject::disconnect(button(), &QAbstractButton::clicked, nullptr, nullptr);
+  if (!button() || gate_) return;
+  if (!servesBoth(*button())) heldAction_ = std::make_unique<HeldAction>(*button());
+  gate_ = std::make_unique<PressGate>(
+      *button(), [this] { return takesPress(); }, [this] { clicked(); });
 }
+
+// Asked at each press: the host may mark the button at any time, and the target may be gone.
+bool QtButton::takesPress() const { return target() && !servesBoth(*button()); }
 
 void QtButton::hearClicks() {
   if (!button() || clicks_) return;
@@ -69,6 +85,7 @@ void QtButton::clicked() {
 }
 
 void QtButton::setTitle(std::string_view title) {
+  const auto noted = change(Notice::shown);
   if (button()) showTitle(*button(), title);
   changed();
 }
@@ -79,6 +96,7 @@ std::optional<AttributedString> QtButton::attributedTitle() const {
 }
 
 void QtButton::setAttributedTitle(const AttributedString& title) {
+  const auto noted = change(Notice::shown);
   if (button()) showTitle(*button(), title);
   changed();
 }
@@ -90,6 +108,7 @@ State QtButton::state() const {
 
 void QtButton::setState(State state) {
   if (!button()) return;
+  const auto noted = change(Notice::shown);
   if (button()->isCheckable()) {
     setCheckState(*button(), state);
   } else {
@@ -101,16 +120,19 @@ void QtButton::setState(State state) {
 bool QtButton::isHighlighted() const { return button() && qt::isHighlighted(*button()); }
 
 void QtButton::highlight(bool highlighted) {
+  const auto noted = change(highlighted ? Notice::flash : Notice::none);
   if (button()) qt::setHighlighted(*button(), highlighted);
   changed();
 }
 
 void QtButton::setBackgroundColor(const Color& color) {
+  const auto noted = change(Notice::shown);
   if (button()) setFaceColor(*button(), color);
   changed();
 }
 
 void QtButton::setBezelStyle(BezelStyle style) {
+  const auto noted = change(Notice::none);
   if (button()) setBezel(*button(), style);
   changed();
 }
@@ -124,10 +146,12 @@ void QtTextField::setValue(const AttributedString& value) { showText(*widget(), 
 // Asked each time, because a host may make a group box checkable later.
 void QtOtherView::setEnabled(bool enabled) {
   if (widget_ && !takesInput(*widget_)) return View::setEnabled(enabled);
+  const auto noted = change(Notice::none);
   enable(enabled);
 }
 
 void QtImageView::setImage(const Ref<Image>& image) {
+  const auto noted = change(Notice::shown);
   if (label()) showImage(*label(), image);
   changed();
 }

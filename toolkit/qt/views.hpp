@@ -15,7 +15,9 @@
 
 #include "qz/toolkit/view.hpp"
 #include "toolkit/qt/accessibility.hpp"
+#include "toolkit/qt/held_action.hpp"
 #include "toolkit/qt/image_look.hpp"
+#include "toolkit/qt/press_gate.hpp"
 #include "toolkit/qt/widget_node.hpp"
 
 namespace qz::toolkit::qt {
@@ -58,22 +60,31 @@ class QtView : public Role, public Node {
 
   std::string className() const final { return this->nameOfClass(); }
   Tag tag() const final { return this->readTag(); }
-  void setTag(Tag tag) final { this->writeTag(tag); }
+  void setTag(Tag tag) final {
+    const auto noted = this->change(Notice::none);
+    this->writeTag(tag);
+  }
   Rect frame() const final { return this->readFrame(); }
   // The list is read from the widgets, which do not report changes.
   const Subviews& subviews() const final { return const_cast<QtView*>(this)->readSubviews(); }
   void addSubview(const Ref<View>& view) final { this->insert(view); }
   bool needsDisplay() const final { return this->isRedrawPending(); }
-  void setHidden(bool hidden) final { this->hide(hidden); }
+  void setHidden(bool hidden) final {
+    const auto noted = this->change(hidden ? Notice::none : Notice::shown);
+    this->hide(hidden);
+  }
 
   void setToolTip(std::string_view text) final {
+    const auto noted = this->change(Notice::none);
     if (this->widget_) showToolTip(*this->widget_, text);
   }
   void setWantsLayer(bool wants) final {
+    const auto noted = this->change(Notice::none);
     if (this->widget_) setLayered(*this->widget_, wants);
     this->changed();
   }
   void setLayerContents(const Ref<Image>& image) final {
+    const auto noted = this->change(Notice::none);
     if (this->widget_) showLayerContents(*this->widget_, image);
     this->changed();
   }
@@ -87,7 +98,10 @@ class QtControl : public QtView<Role, ControlNode> {
  public:
   using QtView<Role, ControlNode>::QtView;
 
-  void setEnabled(bool enabled) final { this->enable(enabled); }
+  void setEnabled(bool enabled) final {
+    const auto noted = this->change(Notice::none);
+    this->enable(enabled);
+  }
   void setTarget(const std::shared_ptr<Responder>& target) final {
     this->target_ = target;
     if (target) takeClicks();
@@ -106,12 +120,13 @@ class QtControl : public QtView<Role, ControlNode> {
   }
   void setAttributedStringValue(const AttributedString& text) final {
     if (!this->widget_) return;
+    const auto noted = this->change(Notice::shown);
     this->setValue(text);
     this->changed();
   }
 
  protected:
-  // Takes the clicks away from the host when a target is set.
+  // Leads the clicks away from the host while there is a target.
   virtual void takeClicks() {}
   // Listens for clicks. An action without a target is sent in addition to the host's reaction.
   virtual void hearClicks() {}
@@ -136,10 +151,13 @@ class QtButton final : public QtControl<Button> {
   QAbstractButton* button() const { return static_cast<QAbstractButton*>(widget()); }
   void takeClicks() override;
   void hearClicks() override;
+  bool takesPress() const;
   void clicked();
 
   State heldState_ = State::off;  // for a button that is not checkable; it is not shown
   QMetaObject::Connection clicks_;
+  std::unique_ptr<HeldAction> heldAction_;
+  std::unique_ptr<PressGate> gate_;
 };
 
 class QtTextField final : public QtControl<TextField> {

@@ -17,10 +17,6 @@ namespace qz::toolkit::qt {
 
 namespace {
 
-bool isSubview(const QObject* child) {
-  return child->isWidgetType() && !static_cast<const QWidget*>(child)->isWindow();
-}
-
 /// True if `widgets` are exactly the subviews of `parent`, in their order.
 bool areSubviewsOf(const QWidget& parent, const std::vector<QPointer<QWidget>>& widgets) {
   auto next = widgets.begin();
@@ -33,6 +29,10 @@ bool areSubviewsOf(const QWidget& parent, const std::vector<QPointer<QWidget>>& 
 }
 
 }  // namespace
+
+bool isSubview(const QObject* child) {
+  return child->isWidgetType() && !static_cast<const QWidget*>(child)->isWindow();
+}
 
 // Watches for changes of the widget that this toolkit does not make.
 class WidgetNode::Watch final : public QObject {
@@ -78,13 +78,16 @@ std::string WidgetNode::nameOfClass() const {
 
 Tag WidgetNode::readTag() const {
   if (!widget_) return 0;
-  if (!tag_) tag_ = Tag{widget_->property(tagProperty).toLongLong()};
+  if (!tag_) {
+    const QVariant own = widget_->property(tagProperty);
+    tag_ = own.isValid() ? Tag{own.toLongLong()} : givenTag_;
+  }
   return *tag_;
 }
 
 void WidgetNode::writeTag(Tag tag) {
   if (!widget_) return;
-  const bool leavesNothing = tag == 0 && !hadTag_;
+  const bool leavesNothing = tag == givenTag_ && !hadTag_;
   widget_->setProperty(tagProperty,
                        leavesNothing ? QVariant() : QVariant(static_cast<qlonglong>(tag)));
 }
@@ -115,17 +118,36 @@ void WidgetNode::place(const Rect& frame) {
 
 const Subviews& WidgetNode::readSubviews() {
   if (widget_ && areSubviewsOf(*widget_, listed_)) return subviews_;
-  Subviews fresh;
-  listed_.clear();
+  std::vector<QWidget*> children;
   if (widget_) {
     for (QObject* const child : widget_->children()) {
-      if (isSubview(child)) listed_.emplace_back(static_cast<QWidget*>(child));
+      if (isSubview(child)) children.push_back(static_cast<QWidget*>(child));
     }
-    for (const auto& child : listed_) fresh.push_back(desk_->viewOf(*child));
   }
-  subviews_.swap(fresh);
+  present(children);
   return subviews_;
 }
+
+void WidgetNode::present(const std::vector<QWidget*>& widgets) {
+  Subviews fresh;
+  for (QWidget* const widget : widgets) fresh.push_back(desk_->viewOf(*widget));
+  listed_.assign(widgets.begin(), widgets.end());
+  subviews_.swap(fresh);
+}
+
+bool WidgetNode::presents(const std::vector<QWidget*>& widgets) const {
+  return std::equal(
+      widgets.begin(), widgets.end(), listed_.begin(), listed_.end(),
+      [](QWidget* widget, const QPointer<QWidget>& listed) { return widget == listed.data(); });
+}
+
+void WidgetNode::joinForm(const std::shared_ptr<AdoptedForm>& form, Tag tag) {
+  form_ = form;
+  givenTag_ = tag;
+  tag_.reset();
+}
+
+ViewChange WidgetNode::change(Notice notice) { return {widget_, form_.lock(), notice}; }
 
 void WidgetNode::insert(const Ref<View>& view) {
   const auto node = of(view);

@@ -18,6 +18,7 @@
 #include "qz/toolkit/view.hpp"
 #include "toolkit/backend/kept_by.hpp"
 #include "toolkit/qt/desk.hpp"
+#include "toolkit/qt/view_change.hpp"
 
 namespace qz::toolkit::qt {
 
@@ -26,6 +27,14 @@ inline constexpr const char* tagProperty = "qzTag";
 /// The dynamic property that makes a label an image view if it is true, even while the label shows
 /// no pixmap.
 inline constexpr const char* imageViewProperty = "qzImageView";
+
+/// The dynamic property of a button, or of a tool button's action, that leads its presses both to
+/// the host and to the button's target if it is "both". Otherwise a press goes to the target, if
+/// there is one.
+inline constexpr const char* pressProperty = "qzPress";
+
+/// True if `child`, a child of a widget, is a subview: a widget that is not a window.
+bool isSubview(const QObject* child);
 
 class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
  public:
@@ -51,6 +60,9 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   bool isHidden() const;
   /// Returns the superview; absent if there is none.
   Ref<View> superview() const;
+  /// Makes the view a control of an adopted window while `form` lives. `tag` is the tag of a widget
+  /// that has no tag of its own.
+  void joinForm(const std::shared_ptr<AdoptedForm>& form, Tag tag);
 
  protected:
   virtual View& role() = 0;
@@ -59,7 +71,13 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   Tag readTag() const;
   void writeTag(Tag tag);
   Rect readFrame() const;
-  const Subviews& readSubviews();
+  /// Returns the subviews: the child widgets, unless a subclass presents others.
+  virtual const Subviews& readSubviews();
+  /// Makes the views of `widgets` the subviews.
+  void present(const std::vector<QWidget*>& widgets);
+  /// True if the subviews are those of `widgets`.
+  bool presents(const std::vector<QWidget*>& widgets) const;
+  const Subviews& presented() const { return subviews_; }
   /// As `View::addSubview`. Raises an invalid-argument exception, and changes nothing, if `view` is
   /// absent, another toolkit's, a window's content view, this view or one of its superviews.
   void insert(const Ref<View>& view);
@@ -68,6 +86,8 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   /// Marks a visible change: a redraw is pending until the next paint event.
   void changed();
   bool isRedrawPending() const { return widget_ && isRedrawPending_; }
+  /// Surrounds a change of the widget by a command.
+  ViewChange change(Notice notice);
   QPointer<QWidget> widget_;
   std::shared_ptr<Desk> desk_;
 
@@ -84,8 +104,10 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
 
   const QWidget* const key_;  // in the desk's table
   KeptBy keptBy_;
-  bool hadTag_;                 // before this view was made
-  bool hiddenOutside_ = false;  // applies when it is inserted again
+  bool hadTag_;                      // before this view was made
+  Tag givenTag_ = 0;                 // that of a widget without the property
+  std::weak_ptr<AdoptedForm> form_;  // owned by its AdoptedWindow
+  bool hiddenOutside_ = false;       // applies when it is inserted again
   std::optional<Placement> placement_;
   Subviews subviews_;
   std::vector<QPointer<QWidget>> listed_;  // the widgets of `subviews_`; null once they are gone

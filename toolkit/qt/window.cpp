@@ -11,6 +11,7 @@
 #include <QScreen>
 #include <utility>
 
+#include "toolkit/qt/adopted_content.hpp"
 #include "toolkit/qt/coordinates.hpp"
 #include "toolkit/qt/sheet_place.hpp"
 #include "toolkit/qt/views.hpp"
@@ -120,12 +121,28 @@ std::shared_ptr<QtWindow> QtWindow::of(const Ref<Window>& window) {
 }
 
 Ref<View> QtWindow::contentView() const {
-  QWidget* const content = widget_ ? contentOf(*widget_) : nullptr;
+  QWidget* const content = contentWidget();
   if (!content || contentWidget_ != content) {
-    content_ = content ? desk_->viewOf(*content) : nullptr;
+    content_ = content ? viewOf(*content) : nullptr;
     contentWidget_ = content;
   }
   return content_;
+}
+
+QWidget* QtWindow::contentWidget() const {
+  if (!widget_) return nullptr;
+  return form_ ? form_->content() : contentOf(*widget_);
+}
+
+Ref<View> QtWindow::viewOf(QWidget& content) const {
+  if (!form_) return desk_->viewOf(content);
+  return std::make_shared<AdoptedContent>(content, desk_, form_)->view();
+}
+
+void QtWindow::present(std::shared_ptr<AdoptedForm> form) {
+  form_ = std::move(form);
+  contentWidget_ = nullptr;
+  content_ = nullptr;
 }
 
 void QtWindow::setBackgroundColor(const Color& color) {

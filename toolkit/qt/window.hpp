@@ -20,6 +20,7 @@
 
 namespace qz::toolkit::qt {
 
+class AdoptedForm;
 class SheetPlace;
 
 class QtWindow final : public Window, public std::enable_shared_from_this<QtWindow> {
@@ -41,10 +42,13 @@ class QtWindow final : public Window, public std::enable_shared_from_this<QtWind
   QWidget* widget() const { return widget_; }
 
   /// Returns the view of a main window's central widget; for other windows, that of the widget
-  /// itself. Absent if that widget is gone.
+  /// itself. Absent if that widget is gone. While the window presents a form, the content view
+  /// holds the form's controls.
   Ref<View> contentView() const override;
   std::shared_ptr<Responder> delegate() const override { return delegate_.lock(); }
   void setDelegate(const std::shared_ptr<Responder>& delegate) override { delegate_ = delegate; }
+  /// Makes the content view hold the controls of `form`; null ends that.
+  void present(std::shared_ptr<AdoptedForm> form);
   void setBackgroundColor(const Color& color) override;
   void makeKeyAndOrderFront() override;
   void orderOut() override;
@@ -74,6 +78,8 @@ class QtWindow final : public Window, public std::enable_shared_from_this<QtWind
   class Watch;
   QtWindow(QWidget& widget, std::shared_ptr<Desk> desk, KeptBy keptBy);
 
+  QWidget* contentWidget() const;
+  Ref<View> viewOf(QWidget& content) const;
   void show();
   void detach();
   void wasHidden();
@@ -85,6 +91,7 @@ class QtWindow final : public Window, public std::enable_shared_from_this<QtWind
   std::unique_ptr<Watch> watch_;
   mutable Ref<View> content_;                // owned, so that the views live as long as the window
   mutable QPointer<QWidget> contentWidget_;  // the widget of `content_`
+  std::shared_ptr<AdoptedForm> form_;        // null unless the window presents one
   std::weak_ptr<Responder> delegate_;        // owned by the code that made it
   std::optional<Rect> asked_;                // the requested content rectangle
   std::optional<QRect> settled_;             // its geometry once first shown

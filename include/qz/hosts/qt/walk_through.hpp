@@ -12,9 +12,10 @@
 #include <memory>
 #include <string>
 #include <string_view>
-#include <vector>
+#include <utility>
 
 #include "qz/engine.hpp"
+#include "qz/toolkit/qt/adoption.hpp"
 #include "qz/toolkit/qt/qt_toolkit.hpp"
 
 namespace qz::hosts::qt {
@@ -41,8 +42,12 @@ class WalkThrough {
   /// destroyed, or when its main window gets another central widget.
   void end();
 
+  /// Sets how the following walk-throughs take over their windows: which widgets are the controls,
+  /// and how they are treated.
+  void setAdoption(toolkit::qt::Adoption adoption) { adoption_ = std::move(adoption); }
+
   /// Sets a function that is called after the end of every walk-through, when it no longer uses the
-  /// widgets: the host can then reconnect the clicks that the walk-through took over.
+  /// widgets.
   void whenOver(std::function<void()> told) { over_ = std::move(told); }
 
   /// Returns the engine; null if no walk-through is running.
@@ -57,7 +62,10 @@ class WalkThrough {
   void refuse(const std::string& script, const std::string& reason);
 
   toolkit::qt::QtToolkit& toolkit_;
-  std::vector<toolkit::Ref<toolkit::Window>> windows_;  // kept alive while the engine runs
+  toolkit::qt::Adoption adoption_;
+  // Kept alive while the engine runs: the window given to it, and the one with the controls.
+  toolkit::Ref<toolkit::Window> parent_;
+  std::unique_ptr<toolkit::qt::AdoptedWindow> adopted_;
   std::shared_ptr<QZ_Plist_State_Parser> engine_;
   std::shared_ptr<Watch> watch_;
   std::function<void()> over_;

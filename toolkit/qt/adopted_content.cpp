@@ -1,0 +1,33 @@
+// SPDX-License-Identifier: MIT
+// Presents the controls of a form as the subviews of one view.
+
+#include "toolkit/qt/adopted_content.hpp"
+
+#include <utility>
+
+namespace qz::toolkit::qt {
+
+AdoptedNode::AdoptedNode(QWidget& content, std::shared_ptr<Desk> desk,
+                         std::shared_ptr<AdoptedForm> form)
+    : WidgetNode(content, std::move(desk), KeptBy::host), form_(std::move(form)) {
+  joinForm(form_, 0);
+}
+
+const Subviews& AdoptedNode::readSubviews() {
+  found_.clear();
+  form_->list(found_);
+  if (!presents(found_)) {
+    present(found_);
+    adoptControls();
+  }
+  return presented();
+}
+
+void AdoptedNode::adoptControls() {
+  for (const auto& view : presented()) {
+    const auto node = of(view);
+    node->joinForm(form_, form_->givenTag(*node->widget()).value_or(0));
+  }
+}
+
+}  // namespace qz::toolkit::qt

@@ -1,0 +1,165 @@
+// SPDX-License-Identifier: MIT
+// Finds the controls of an adopted window. The tree is walked at every search, because widgets do
+// not report changes of their descendants.
+
+#include "toolkit/qt/adopted_form.hpp"
+
+#include <QAction>
+#include <QDockWidget>
+#include <QMainWindow>
+#include <QStackedWidget>
+#include <QToolBar>
+#include <QVariant>
+#include <algorithm>
+#include <utility>
+
+#include "toolkit/qt/bring_into_view.hpp"
+#include "toolkit/qt/strings.hpp"
+#include "toolkit/qt/widget_node.hpp"
+
+namespace qz::toolkit::qt {
+
+namespace {
+
+// Quicker than `property` for the many objects without dynamic properties.
+bool hasTagProperty(const QObject& object) {
+  const auto names = object.dynamicPropertyNames();
+  return std::any_of(names.begin(), names.end(),
+                     [](const QByteArray& name) { return name == tagProperty; });
+}
+
+// Returns the action that a tool bar shows as `widget`; null if there is none.
+const QAction* actionShownBy(const QWidget& widget) {
+  const auto* const bar = qobject_cast<const QToolBar*>(widget.parentWidget());
+  if (!bar) return nullptr;
+  const auto actions = bar->actions();
+  const auto found = std::find_if(actions.begin(), actions.end(), [&](QAction* action) {
+    return bar->widgetForAction(action) == &widget;
+  });
+  return found == actions.end() ? nullptr : *found;
+}
+
+bool showsOneOf(const QAction& action, const std::vector<QWidget*>& controls) {
+  return std::any_of(controls.begin(), controls.end(),
+                     [&](const QWidget* control) { return actionShownBy(*control) == &action; });
+}
+
+bool isReached(const QObject& object, const std::vector<QWidget*>& controls) {
+  if (std::find(controls.begin(), controls.end(), &object) != controls.end()) return true;
+  const auto* const action = qobject_cast<const QAction*>(&object);
+  return action && showsOneOf(*action, controls);
+}
+
+// True if the widget is hidden for itself, and not as a page that is not the current one.
+bool isKeptHidden(const QWidget& widget) {
+  return widget.isHidden() && !qobject_cast<const QStackedWidget*>(widget.parentWidget());
+}
+
+}  // namespace
+
+bool isPartOfForm(const QWidget& widget) {
+  return !widget.isWindow() || qobject_cast<const QDockWidget*>(&widget) ||
+         qobject_cast<const QToolBar*>(&widget);
+}
+
+AdoptedForm::AdoptedForm(QWidget& window, Adoption how) : window_(&window), how_(std::move(how)) {}
+
+QWidget* AdoptedForm::content() const {
+  const auto* const mainWindow = qobject_cast<const QMainWindow*>(window_.data());
+  const bool isWhole = how_.reading == Adoption::Reading::everyTaggedWidget;
+  QWidget* const central = mainWindow ? mainWindow->centralWidget() : window_.data();
+  return central || !isWhole ? central : window_.data();
+}
+
+void AdoptedForm::list(std::vector<QWidget*>& found) const {
+  const QWidget* const around = content();
+  if (!around) return;
+  if (how_.reading == Adoption::Reading::everyTaggedWidget) return addTagged(*window_, found);
+  for (QObject* const child : around->children()) {
+    if (isSubview(child)) found.push_back(static_cast<QWidget*>(child));
+  }
+}
+
+// The pages of a stack come in their own order: Qt puts the current one behind the others in the
+// list of children.
+void AdoptedForm::addTagged(const QWidget& around, std::vector<QWidget*>& found) const {
+  const auto* const stack = qobject_cast<const QStackedWidget*>(&around);
+  const int pages = stack ? stack->count() : 0;
+  for (int i = 0; i < pages; ++i) addTaggedFrom(*stack->widget(i), found);
+  for (QObject* const child : around.children()) {
+    auto* const widget = child->isWidgetType() ? static_cast<QWidget*>(child) : nullptr;
+    const bool isPage = stack && widget && stack->indexOf(widget) >= 0;
+    if (widget && !isPage && isPartOfForm(*widget)) addTaggedFrom(*widget, found);
+  }
+}
+
+void AdoptedForm::addTaggedFrom(QWidget& widget, std::vector<QWidget*>& found) const {
+  if (hasTagProperty(widget) || givenTag(widget)) found.push_back(&widget);
+  addTagged(widget, found);
+}
+
+std::optional<Tag> AdoptedForm::namedTag(const QObject& object) const {
+  if (how_.tags.empty()) return std::nullopt;
+  const auto named = how_.tags.find(object.objectName());
+  return named == how_.tags.end() ? std::nullopt : std::optional(named->second);
+}
+
+std::optional<Tag> AdoptedForm::givenTag(const QWidget& widget) const {
+  if (const auto named = namedTag(widget)) return named;
+  const QAction* const action = actionShownBy(widget);
+  if (!action) return std::nullopt;
+  if (hasTagProperty(*action)) return Tag{action->property(tagProperty).toLongLong()};
+  return namedTag(*action);
+}
+
+bool AdoptedForm::isTagged(const QObject& object) const {
+  return hasTagProperty(object) || namedTag(object);
+}
+
+std::string AdoptedForm::complaintAbout(const QObject& object) const {
+  const Tag tag = hasTagProperty(object) ? Tag{object.property(tagProperty).toLongLong()}
+                                         : namedTag(object).value_or(0);
+  const bool isWhole = how_.reading == Adoption::Reading::everyTaggedWidget;
+  return "No command can reach the tag " + std::to_string(tag) + " of the " +
+         object.metaObject()->className() + " \"" + utf8(object.objectName()) + "\": " +
+         (isWhole ? "only widgets inside the window, and actions in its tool bars, are controls"
+                  : "only the direct children of the window's content are controls");
+}
+
+std::vector<std::string> AdoptedForm::unreachableTags() const {
+  std::vector<std::string> complaints;
+  std::vector<QWidget*> controls;
+  list(controls);
+  QObjectList objects = window_->findChildren<QObject*>();
+  objects.prepend(window_);
+  for (const QObject* const object : objects) {
+    if (isTagged(*object) && !isReached(*object, controls)) {
+      complaints.push_back(complaintAbout(*object));
+    }
+  }
+  for (const auto& [name, tag] : how_.tags) {
+    const auto isNamed = [&named = name](QObject* object) { return object->objectName() == named; };
+    if (std::any_of(objects.begin(), objects.end(), isNamed)) continue;
+    complaints.push_back("No command can reach the tag " + std::to_string(tag) +
+                         ": the window has no object with the name \"" + utf8(name) + "\"");
+  }
+  return complaints;
+}
+
+std::vector<Sighting> AdoptedForm::look(QWidget& widget) const {
+  if (how_.restoring == Adoption::Restoring::tags) return {};
+  return sightingsAround(widget);
+}
+
+void AdoptedForm::changed(QWidget* widget, Notice notice, const std::vector<Sighting>& before) {
+  if (widget) attend(*widget, notice);
+  trace_.note(before);
+}
+
+void AdoptedForm::attend(QWidget& widget, Notice notice) {
+  if (!how_.bringsIntoView || notice == Notice::none || isKeptHidden(widget)) return;
+  if (notice == Notice::flash && !flashed_.insert(&widget).second) return;
+  bringIntoView(widget);
+}
+
+}  // namespace qz::toolkit::qt
