@@ -4,6 +4,7 @@
 #include "toolkit/qt/facets.hpp"
 
 #include <QAbstractScrollArea>
+#include <QAbstractButton>
 #include <QButtonGroup>
 #include <QDockWidget>
 #include <QKeySequence>
