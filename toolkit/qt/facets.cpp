@@ -3,8 +3,8 @@
 
 #include "toolkit/qt/facets.hpp"
 
-#include <QAbstractScrollArea>
 #include <QAbstractButton>
+#include <QAbstractScrollArea>
 #include <QButtonGroup>
 #include <QDockWidget>
 #include <QKeySequence>

@@ -22,7 +22,13 @@ struct Exploration::Found {
 struct Exploration::Expansion {
   static constexpr std::size_t largestRound = 4096;  // visits that are expanded together
 
+  // What the moves depend on: it stays where it is while other visits are merged.
   std::uint32_t visit = 0;
+  std::uint32_t look = 0;
+  const std::uint8_t* from = nullptr;   // the place
+  const Looks::Parts* parts = nullptr;  // of the look
+  const PendingTimers* pending = nullptr;
+
   std::vector<Found> found;
   std::vector<std::uint8_t> places;  // of `found`, one after the other
   std::vector<Fact> facts;

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
-// Visits are expanded in rounds: any number of worlds make the moves and look up what is known of
-// where they lead, then what they found is added in the order of the visits. So the result does not
-// depend on the number of threads.
+// Visits are expanded in rounds: any number of worlds make the moves, and look up what is known of
+// where they lead. Then one thread adds what they found in the order of the visits, so the result
+// does not depend on the number of threads. Meanwhile the others make the moves of the next round.
 #include "tools/check/exploration.hpp"
 
 #include <algorithm>
@@ -46,8 +46,6 @@ void Exploration::run(const ExplorationLimits& limits, unsigned threads, Explora
   hooks_ = std::move(hooks);
   const std::size_t most = std::min(limits.places, mostPlaces);
   start();
-  std::vector<Expansion> expansions;
-  std::uint32_t next = 0;
   const auto isOverLimit = [&] {
     if (set_.count() >= most) stop_ = Stop::places;
     if (isLate()) stop_ = Stop::time;
@@ -55,23 +53,26 @@ void Exploration::run(const ExplorationLimits& limits, unsigned threads, Explora
     if (hooks_.isCancelled()) stop_ = Stop::cancelled;
     return stop_ != Stop::none;
   };
-  while (next < visits_.size()) {
-    if (isOverLimit()) return;
-    const std::size_t left = std::max<std::size_t>(most - set_.count(), worthThreads);
-    expansions.resize(std::min({roundSize(), visits_.size() - next, left}));
-    expandAll(expansions, next, threads);
-    for (Expansion& expansion : expansions) {
-      if (set_.count() >= most) break;
-      merge(expansion);
-      ++next;
+  useThreads(threads);
+  Round round;
+  Round coming;
+  for (std::size_t next = 0; next < visits_.size() && !isOverLimit();) {
+    const std::size_t left = std::max(most - set_.count(), worthThreads);
+    if (round.empty()) {
+      prepare(round, next, left);
+      doAll(round, &Exploration::makeMoves);
     }
+    doAll(round, &Exploration::lookUpAll);
+    prepare(coming, next + round.size(), left);
+    doAll(coming, &Exploration::makeMoves, [&] { next += mergeAll(round, most); });
+    round.swap(coming);
     hooks_.report({set_.count(), visits_.size() - next});
   }
 }
 
 // A round is short where places are large, so that it takes little memory and can be cancelled.
 std::size_t Exploration::roundSize() const {
-  constexpr std::size_t roundBytes = std::size_t{2} << 20U;  // what near caches hold
+  constexpr std::size_t roundBytes = std::size_t{1} << 20U;  // what near caches hold
   const std::size_t buttons = static_cast<std::size_t>(
       std::count_if(setting_.kinds.begin(), setting_.kinds.end(), drivers::isButton));
   const std::size_t each = (buttons + 1) * (format_.size() + sizeof(Found));
@@ -103,39 +104,46 @@ void Exploration::start() {
   }
 }
 
-void Exploration::expandAll(std::vector<Expansion>& expansions, std::uint32_t first,
-                            unsigned threads) {
-  for (std::size_t i = 0; i < expansions.size(); ++i) {
-    expansions[i].visit = first + static_cast<std::uint32_t>(i);
+void Exploration::useThreads(unsigned threads) { threads_ = std::max(threads, 1U); }
+
+void Exploration::prepare(Round& round, std::size_t first, std::size_t most) const {
+  round.resize(std::min({roundSize(), visits_.size() - first, most}));
+  for (std::size_t i = 0; i < round.size(); ++i) {
+    const Visit& visit = visits_[first + i];
+    Expansion& expansion = round[i];
+    expansion.visit = static_cast<std::uint32_t>(first + i);
+    expansion.look = visit.look;
+    expansion.from = set_.place(visit.place);
+    expansion.parts = &looks_.parts(visit.look);
+    expansion.pending = &timers(visit.place);
   }
-  if (expansions.size() < worthThreads || threads <= 1) {
-    for (Expansion& expansion : expansions) expand(*worlds_.front(), expansion);
-    return;
-  }
-  while (worlds_.size() < threads) {
-    worlds_.push_back(std::make_unique<World>(setting_, format_, looks_));
-  }
-  constexpr std::size_t share = 16;  // visits that a thread takes at a time
-  std::atomic<std::size_t> taken = 0;
-  const auto work = [&](World& world) {
-    for (std::size_t begin = taken.fetch_add(share); begin < expansions.size();
-         begin = taken.fetch_add(share)) {
-      const std::size_t end = std::min(begin + share, expansions.size());
-      for (std::size_t i = begin; i < end; ++i) expand(world, expansions[i]);
-    }
-  };
-  std::vector<std::jthread> running;
-  for (std::size_t i = 1; i < worlds_.size(); ++i) {
-    running.emplace_back([&work, this, i] { work(*worlds_[i]); });
-  }
-  work(*worlds_.front());
 }
 
-void Exploration::expand(World& world, Expansion& expansion) const {
-  const Visit& visit = visits_[expansion.visit];
-  const std::uint8_t* const from = set_.place(visit.place);
-  const PendingTimers& pending = timers(visit.place);
-  const auto moves = world.moves(from, pending);
+void Exploration::doAll(Round& round, Job job, const std::function<void()>& meanwhile) {
+  std::atomic<std::size_t> taken = 0;
+  const auto work = [&](World& world) {
+    constexpr std::size_t share = 16;  // visits that a thread takes at a time
+    for (std::size_t begin = taken.fetch_add(share); begin < round.size();
+         begin = taken.fetch_add(share)) {
+      const std::size_t end = std::min(begin + share, round.size());
+      for (std::size_t i = begin; i < end; ++i) (this->*job)(world, round[i]);
+    }
+  };
+  const auto workHere = [&] {
+    meanwhile();
+    work(*worlds_.front());
+  };
+  if (round.size() < worthThreads || threads_ == 1) return workHere();
+  while (worlds_.size() < threads_) {
+    worlds_.push_back(std::make_unique<World>(setting_, format_, looks_));
+  }
+  if (!workers_) workers_.emplace(threads_ - 1);
+  workers_->run([&](std::size_t worker) { work(*worlds_[worker + 1]); }, workHere);
+}
+
+void Exploration::makeMoves(World& world, Expansion& expansion) const {
+  const Station from{expansion.from, expansion.look, *expansion.parts};
+  const auto moves = world.moves(from.place, *expansion.pending);
   expansion.found.resize(moves.size());
   expansion.places.resize(moves.size() * format_.size());
   expansion.facts.clear();
@@ -143,17 +151,22 @@ void Exploration::expand(World& world, Expansion& expansion) const {
     Found& found = expansion.found[i];
     std::uint8_t* const place = expansion.places.data() + i * format_.size();
     found.firstFact = expansion.facts.size();
-    found.arrival = world.make(moves[i], from, visit.look, pending, found.timers, place);
+    found.arrival = world.make(moves[i], from, *expansion.pending, found.timers, place);
     const auto& facts = world.facts();
     expansion.facts.insert(expansion.facts.end(), facts.begin(), facts.end());
-    hash(found, place);
   }
-  // Looked up together, so that the processor waits for the memory of many at a time.
+}
+
+// Places are looked up together, so that the processor waits for the memory of many at a time.
+void Exploration::lookUpAll(World&, Expansion& expansion) const {
+  const auto placeOf = [&](std::size_t i) { return expansion.places.data() + i * format_.size(); };
+  for (std::size_t i = 0; i < expansion.found.size(); ++i) hash(expansion.found[i], placeOf(i));
   for (const Found& found : expansion.found) {
     if (found.hash) set_.prefetchPlace(*found.hash);
   }
-  for (std::size_t i = 0; i < moves.size(); ++i) {
-    lookUp(expansion.found[i], expansion.places.data() + i * format_.size(), visit);
+  const Visit& visit = visits_[expansion.visit];
+  for (std::size_t i = 0; i < expansion.found.size(); ++i) {
+    lookUp(expansion.found[i], placeOf(i), visit);
   }
   summarize(expansion);
 }
@@ -191,6 +204,13 @@ void Exploration::lookUp(Found& found, const std::uint8_t* place, const Visit& f
       situationOf(*found.place, found.arrival.lastList.value_or(from.lastList));
   const auto first = knownVisitIn(situation);
   found.isNews = !first || visits_[*first].look != found.arrival.look;
+}
+
+/// Returns how many visits were merged before there were too many places.
+std::size_t Exploration::mergeAll(Round& round, std::size_t mostPlaces) {
+  std::size_t merged = 0;
+  for (; merged < round.size() && set_.count() < mostPlaces; ++merged) merge(round[merged]);
+  return merged;
 }
 
 void Exploration::merge(Expansion& expansion) {
@@ -305,13 +325,14 @@ void Exploration::makeAllMoves(unsigned threads, const See& see) {
       }
     }
   }
-  std::vector<Expansion> expansions;
-  for (std::uint32_t next = 0; next < visits_.size();) {
+  useThreads(threads);
+  Round round;
+  for (std::size_t next = 0; next < visits_.size(); next += round.size()) {
     if (hooks_.isCancelled()) return;
-    expansions.resize(std::min(roundSize(), visits_.size() - next));
-    expandAll(expansions, next, threads);
-    next += static_cast<std::uint32_t>(expansions.size());
-    for (const Expansion& expansion : expansions) seeExpansion(expansion, see);
+    prepare(round, next, visits_.size());
+    doAll(round, &Exploration::makeMoves);
+    doAll(round, &Exploration::lookUpAll);
+    for (const Expansion& expansion : round) seeExpansion(expansion, see);
   }
 }
 

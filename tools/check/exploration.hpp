@@ -18,6 +18,7 @@
 #include "tools/check/move.hpp"
 #include "tools/check/place.hpp"
 #include "tools/check/place_set.hpp"
+#include "tools/check/workers.hpp"
 #include "tools/check/world.hpp"
 
 namespace qz::tools::check {
@@ -129,15 +130,25 @@ class Exploration {
   /// A place, and the list that had the last word, if that matters for what follows.
   using Situation = std::pair<std::uint32_t, std::uint32_t>;
 
+  /// Visits that are expanded together.
+  using Round = std::vector<Expansion>;
+  /// What is done for each visit of a round.
+  using Job = void (Exploration::*)(World&, Expansion&) const;
+
   std::size_t roundSize() const;
   std::size_t bytes() const;
 
   void start();
-  void expandAll(std::vector<Expansion>& expansions, std::uint32_t first, unsigned threads);
-  void expand(World& world, Expansion& expansion) const;
+  void useThreads(unsigned threads);
+  void prepare(Round& round, std::size_t first, std::size_t most) const;
+  void doAll(
+      Round& round, Job job, const std::function<void()>& meanwhile = [] {});
+  void makeMoves(World& world, Expansion& expansion) const;
+  void lookUpAll(World& world, Expansion& expansion) const;
   static void summarize(Expansion& expansion);
   void hash(Found& found, std::uint8_t* place) const;
   void lookUp(Found& found, const std::uint8_t* place, const Visit& from) const;
+  std::size_t mergeAll(Round& round, std::size_t mostPlaces);
   void merge(Expansion& expansion);
   void addFacts(const Expansion& expansion, std::uint32_t place);
   std::uint32_t arrive(Found& found, std::uint8_t* place, std::uint32_t parent,
@@ -173,8 +184,10 @@ class Exploration {
   std::vector<std::size_t> edgeBase_;      // where those of each 64th place begin
   std::vector<std::uint32_t> edgeOffset_;  // of each place, from there
   std::vector<bool> runsList_;
-  std::vector<std::unique_ptr<World>> worlds_;
-  std::vector<std::uint32_t> targets_;  // of the visit that is being merged
+  unsigned threads_ = 1;
+  std::vector<std::unique_ptr<World>> worlds_;  // one for each thread that is used
+  std::optional<Workers> workers_;              // absent until several threads are used
+  std::vector<std::uint32_t> targets_;          // of the visit that is being merged
   std::map<std::pair<std::uint32_t, std::uint32_t>, Occasion> timerStarts_;  // place, element
   std::vector<Arrival> starts_;
   std::uint32_t firstLook_ = 0;  // before the start

@@ -179,20 +179,19 @@ std::vector<Move> World::moves(const std::uint8_t* place, const PendingTimers& p
   return moves;
 }
 
-Arrival World::make(Move move, const std::uint8_t* from, std::uint32_t look,
-                    const PendingTimers& pending, PendingTimers& timers, std::uint8_t* place) {
-  const Station station{from, look, looks_.parts(look)};
-  if (move == waitMove) return makeAnew(move, station, pending, timers, place);
-  if (const RememberedPress* known = presses_.find(move, station)) {
-    known->writePlace(context_, station, place);
+Arrival World::make(Move move, const Station& from, const PendingTimers& pending,
+                    PendingTimers& timers, std::uint8_t* place) {
+  if (move == waitMove) return makeAnew(move, from, pending, timers, place);
+  if (const RememberedPress* known = presses_.find(move, from)) {
+    known->writePlace(context_, from, place);
     timers = known->timers;
     facts_ = &known->facts;
     Arrival arrival = known->arrival;
-    arrival.look = known->lookAfter(context_, station, looks_);
+    arrival.look = known->lookAfter(context_, from, looks_);
     return arrival;
   }
-  Arrival arrival = makeAnew(move, station, pending, timers, place);
-  remember(station, arrival, timers);
+  Arrival arrival = makeAnew(move, from, pending, timers, place);
+  remember(from, arrival, timers);
   return arrival;
 }
 

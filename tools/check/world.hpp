@@ -53,8 +53,8 @@ class World final : private Surroundings {
   /// The walk-through starts, in a window as the host made it. Writes where that leads to `place`.
   Arrival start(const std::string& key, PendingTimers& timers, std::uint8_t* place);
   /// Makes a move from a place, whose pending timers are `pending`.
-  Arrival make(Move move, const std::uint8_t* from, std::uint32_t look,
-               const PendingTimers& pending, PendingTimers& timers, std::uint8_t* place);
+  Arrival make(Move move, const Station& from, const PendingTimers& pending, PendingTimers& timers,
+               std::uint8_t* place);
 
   /// Returns the moves from a place.
   std::vector<Move> moves(const std::uint8_t* place, const PendingTimers& pending) const;
