@@ -5,6 +5,7 @@
 #include <array>
 #include <string>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/ref.hpp"
 #include "qz/toolkit/view.hpp"
 
@@ -12,7 +13,7 @@ namespace qz {
 
 /// A control at the time of its discovery: its class name (a list of one), its frame (x, y, width,
 /// height, in single precision) and the control itself, which its window owns.
-struct AssetRecord {
+struct QZ_API AssetRecord {
   std::array<std::string, 1> classNames;
   std::array<float, 4> frame{};
   toolkit::StoredRef<toolkit::View> control;

@@ -9,6 +9,8 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
+
 namespace qz {
 
 /// What a parameter of a command means, which decides the values that it may have.
@@ -29,7 +31,7 @@ enum class ParameterType {
   anything,          ///< any value: it must be there, but its meaning does not matter
 };
 
-struct CommandParameter {
+struct QZ_API CommandParameter {
   std::string_view name;  ///< what the documentation calls the parameter
   ParameterType type;
   std::string_view meaning;  ///< one line in plain English
@@ -71,7 +73,7 @@ enum class CommandFlow {
   endsWalkThrough,  ///< the list continues without a script, so that it runs no other list
 };
 
-struct Command {
+struct QZ_API Command {
   /// Returns the position of the first parameter of this type, counted from 0 after the name;
   /// absent if there is none.
   ///
@@ -92,21 +94,21 @@ struct Command {
 
 /// Returns all commands, in the order in which the engine compares their names. Each constant has
 /// exactly one entry. The entries live until the program ends.
-std::span<const Command> commandCatalogue();
+QZ_API std::span<const Command> commandCatalogue();
 
 /// Returns the command that the engine runs for an array with this name, in any case; null if there
 /// is none. If a host has given two commands the same name, the engine runs the first one.
-const Command* compoundCommandNamed(std::string_view name);
+QZ_API const Command* compoundCommandNamed(std::string_view name);
 
 /// Returns the command that the engine runs for this string, which is compared as written; null if
 /// there is none.
-const Command* simpleCommandNamed(std::string_view name);
+QZ_API const Command* simpleCommandNamed(std::string_view name);
 
 /// Returns the command of a constant, such as "QZ_PLIST_STATE_PARSER_FLASH_ID". A new name of the
 /// command changes nothing here. Null if no constant has this name.
-const Command* commandOfConstant(std::string_view constant);
+QZ_API const Command* commandOfConstant(std::string_view constant);
 
 /// Returns the values that a parameter of the type `colorName` may have.
-std::span<const std::string_view> titleColorNames();
+QZ_API std::span<const std::string_view> titleColorNames();
 
 }  // namespace qz

@@ -24,6 +24,7 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/asset_record.hpp"
 #include "qz/observer.hpp"
 #include "qz/property_list/collections.hpp"
@@ -42,47 +43,48 @@ inline namespace command_names {
 // Assigning another string to one renames the command for
 // every script from then on. The names of compound commands are upper-cased before they are
 // compared; those of simple commands are not.
-extern std::string QZ_PLIST_STATE_PARSER_TERMINATE_PARSER;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_TERMINATE_PARSER;
 /// Holds "IDLE_LOOP", the one value that differs from its constant's name.
-extern std::string QZ_PLIST_STATE_PARSER_RETURN_TO_IDLE_LOOP;
-extern std::string QZ_PLIST_STATE_PARSER_HIDE_OBJECT_WITH_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SHOW_OBJECT_WITH_ID;
-extern std::string QZ_PLIST_STATE_PARSER_ENABLE_OBJECT_WITH_ID;
-extern std::string QZ_PLIST_STATE_PARSER_DISABLE_OBJECT_WITH_ID;
-extern std::string QZ_PLIST_STATE_PARSER_LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID;
-extern std::string QZ_PLIST_STATE_PARSER_PROCESS_COMMANDS_FOR_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_TOOL_TIP_FOR_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_TEXT_FOR_OBJECT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_LOAD_BACKGROUND_WITH_IMAGE;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_RETURN_TO_IDLE_LOOP;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_HIDE_OBJECT_WITH_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SHOW_OBJECT_WITH_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_ENABLE_OBJECT_WITH_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_DISABLE_OBJECT_WITH_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_PROCESS_COMMANDS_FOR_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_TOOL_TIP_FOR_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_TEXT_FOR_OBJECT_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_LOAD_BACKGROUND_WITH_IMAGE;
 /// Declared for hosts only: no command of this name is recognised.
-extern std::string QZ_PLIST_STATE_PARSER_BUTTON_WITH_ID_AT;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_BUTTON_WITH_ID_AT;
 /// Declared for hosts only: no command of this name is recognised.
-extern std::string QZ_PLIST_STATE_PARSER_IMAGE_WITH_ID_AND_PATH_AT;
-extern std::string QZ_PLIST_STATE_PARSER_ALLOW_FLASHING;
-extern std::string QZ_PLIST_STATE_PARSER_FLASH_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_IMAGE_WITH_ID_AND_PATH_AT;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_ALLOW_FLASHING;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_FLASH_ID;
 /// Declared for hosts only: no command of this name is recognised.
-extern std::string QZ_PLIST_STATE_PARSER_HIGHLIGHT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_STATE_ON_FOR_OBJECT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_STATE_OFF_FOR_OBJECT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_BACKGROUND_COLOR_FOR_OBJECT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_FOREGROUND_COLOR_FOR_OBJECT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_TITLE_FOR_OBJECT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_TAG_FOR_OBJECT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_TAG_FOR_OBJECT_ID_WITH_TIMER;
-extern std::string QZ_PLIST_STATE_PARSER_SET_TIMER_FOR_ID;
-extern std::string
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_HIGHLIGHT_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_STATE_ON_FOR_OBJECT_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_STATE_OFF_FOR_OBJECT_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_BACKGROUND_COLOR_FOR_OBJECT_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_FOREGROUND_COLOR_FOR_OBJECT_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_TITLE_FOR_OBJECT_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_TAG_FOR_OBJECT_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_TAG_FOR_OBJECT_ID_WITH_TIMER;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_TIMER_FOR_ID;
+extern QZ_API std::string
     QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID;
-extern std::string
+extern QZ_API std::string
     QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID;
-extern std::string
+extern QZ_API std::string
     QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID;
 
 }  // namespace command_names
 
 class KeepAlive;
 
-class QZ_Plist_State_Parser final : public toolkit::Responder,
-                                    public std::enable_shared_from_this<QZ_Plist_State_Parser> {
+class QZ_API QZ_Plist_State_Parser final
+    : public toolkit::Responder,
+      public std::enable_shared_from_this<QZ_Plist_State_Parser> {
  public:
   using ObjectId = toolkit::ValueRef<toolkit::Number>;
   using Parameters = toolkit::ValueRef<toolkit::Array>;

@@ -4,6 +4,7 @@
 
 #include <string>
 
+#include "qz/api.hpp"
 #include "qz/property_list/value.hpp"
 
 namespace qz::toolkit {
@@ -13,6 +14,6 @@ namespace qz::toolkit {
 /// (%.17g, since 2001-01-01), {"data":"hex"}, {"uid":n}, {"null":0}, [array], {"set":[…]},
 /// {"dict":[[key,value],…]}. Sets and dictionaries are sorted by the dump of the element or key.
 /// Empty for an absent value.
-std::string canonicalDump(const Value& value);
+QZ_API std::string canonicalDump(const Value& value);
 
 }  // namespace qz::toolkit

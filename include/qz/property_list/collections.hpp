@@ -14,13 +14,14 @@
 #include <string_view>
 #include <vector>
 
+#include "qz/api.hpp"
 #include "qz/property_list/key_index.hpp"
 #include "qz/property_list/value.hpp"
 
 namespace qz::toolkit {
 
 /// The base of arrays, sets and dictionaries.
-class Collection : public Value {
+class QZ_API Collection : public Value {
  protected:
   Collection(Kind kind, Mutability mutability) : Value(kind), mutability_(mutability) {}
   /// Raises if the collection is immutable. False if changes are ignored.
@@ -39,7 +40,7 @@ class Collection : public Value {
   Collection* nextToDestroy_ = nullptr;
 };
 
-class Array final : public Collection {
+class QZ_API Array final : public Collection {
  public:
   static Array& nothing();
   static ValueRef<Array> make(std::vector<ValueRef<>> elements = {},
@@ -80,7 +81,7 @@ class Array final : public Collection {
 };
 
 /// An unordered set of values, from a binary property list; it keeps the order of the file.
-class Set final : public Collection {
+class QZ_API Set final : public Collection {
  public:
   static Set& nothing();
   static ValueRef<Set> make(std::vector<ValueRef<>> elements);
@@ -103,7 +104,7 @@ class Set final : public Collection {
 /// Values under keys. Scripts and tables use string keys; a binary property list may hold other
 /// keys, which no look-up by string finds. Entries keep the order in which their keys were first
 /// added.
-class Dictionary final : public Collection {
+class QZ_API Dictionary final : public Collection {
  public:
   struct Entry {
     ValueRef<> key;
@@ -166,7 +167,7 @@ class Dictionary final : public Collection {
 };
 
 /// Return `value` as the named kind; absent if it is absent or of another kind.
-ValueRef<Array> asArray(const ValueRef<>& value);
-ValueRef<Dictionary> asDictionary(const ValueRef<>& value);
+QZ_API ValueRef<Array> asArray(const ValueRef<>& value);
+QZ_API ValueRef<Dictionary> asDictionary(const ValueRef<>& value);
 
 }  // namespace qz::toolkit

@@ -12,9 +12,11 @@
 #include <cstdint>
 #include <memory_resource>
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
-class Document final : public std::pmr::memory_resource {
+class QZ_API Document final : public std::pmr::memory_resource {
  public:
   /// The alignment of values, in bytes, and the unit of distances within a block.
   static constexpr std::size_t unit = 8;

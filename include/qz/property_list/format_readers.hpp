@@ -11,6 +11,7 @@
 #include <utility>
 #include <vector>
 
+#include "qz/api.hpp"
 #include "qz/property_list/document.hpp"
 #include "qz/property_list/refusal.hpp"
 #include "qz/property_list/value.hpp"
@@ -24,14 +25,14 @@ using ValueOffsets = std::vector<std::pair<const Value*, std::size_t>>;
 constexpr std::size_t deepestNesting = 512;
 
 /// `bytes` is the whole file.
-bool looksLikeBinary(std::string_view bytes);
-Value* readBinary(std::string_view bytes, Document& document, ValueOffsets* offsets);
+QZ_API bool looksLikeBinary(std::string_view bytes);
+QZ_API Value* readBinary(std::string_view bytes, Document& document, ValueOffsets* offsets);
 /// `text` is the file in UTF-8, not checked yet.
-bool looksLikeXml(std::string_view text);
-Value* readXml(std::string_view text, Document& document, ValueOffsets* offsets);
+QZ_API bool looksLikeXml(std::string_view text);
+QZ_API Value* readXml(std::string_view text, Document& document, ValueOffsets* offsets);
 /// `text` is the file in UTF-8, not checked yet. Any text looks like this format, even a single
 /// word.
-bool looksLikeOldStyle(std::string_view text);
-Value* readOldStyle(std::string_view text, Document& document, ValueOffsets* offsets);
+QZ_API bool looksLikeOldStyle(std::string_view text);
+QZ_API Value* readOldStyle(std::string_view text, Document& document, ValueOffsets* offsets);
 
 }  // namespace qz::toolkit

@@ -8,6 +8,7 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/property_list/document.hpp"
 #include "qz/property_list/format_readers.hpp"
 #include "qz/property_list/value.hpp"
@@ -22,7 +23,7 @@ enum class Format : std::uint8_t {
 };
 
 /// What is known of a format.
-struct FormatRow {
+struct QZ_API FormatRow {
   Format format;
   std::string_view name;   ///< for options, such as "xml"
   std::string_view title;  ///< for messages, such as "XML property list"
@@ -42,12 +43,12 @@ struct FormatRow {
 };
 
 /// Returns all formats, in the order in which they are tried. The last row is a text format.
-std::span<const FormatRow> formats();
+QZ_API std::span<const FormatRow> formats();
 
 /// Returns the row of the format.
-const FormatRow& formatRow(Format format);
+QZ_API const FormatRow& formatRow(Format format);
 
 /// Returns the title of the format, such as "XML property list".
-std::string_view description(Format format);
+QZ_API std::string_view description(Format format);
 
 }  // namespace qz::toolkit

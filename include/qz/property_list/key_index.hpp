@@ -13,22 +13,23 @@
 #include <string_view>
 #include <vector>
 
+#include "qz/api.hpp"
 #include "qz/property_list/value.hpp"
 
 namespace qz::toolkit {
 
-std::uint64_t hashOf(std::string_view text);
+QZ_API std::uint64_t hashOf(std::string_view text);
 /// Returns the same hash for keys that are the same (see `sameKey`).
-std::uint64_t hashOfKey(const Value& key);
+QZ_API std::uint64_t hashOfKey(const Value& key);
 
 /// Whether two keys are the same. Strings are compared by text, numbers by value (a boolean equals
 /// only a boolean), data by bytes, dates and UIDs by number. A collection is the same only as
 /// itself.
-bool sameKey(const Value& a, const Value& b);
+QZ_API bool sameKey(const Value& a, const Value& b);
 
 /// An open-addressing table of positions. It does not know the entries: the caller compares the key
 /// at a position.
-class KeyIndex {
+class QZ_API KeyIndex {
  public:
   static constexpr std::size_t none = std::numeric_limits<std::size_t>::max();
 

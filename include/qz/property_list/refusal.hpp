@@ -5,11 +5,13 @@
 #include <cstddef>
 #include <string>
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
 /// Thrown by a reader: the reason for refusal, and the offset in bytes in the text that it was
 /// given.
-struct RefusedAt {
+struct QZ_API RefusedAt {
   std::size_t offset;
   std::string reason;
 };

@@ -9,13 +9,14 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/property_list/value.hpp"
 
 namespace qz::toolkit {
 
 /// Text in generalised UTF-8: an unpaired surrogate is encoded like any other code point, so that
 /// every string of UTF-16 units has exactly one encoding.
-class String final : public Value {
+class QZ_API String final : public Value {
  public:
   static String& nothing();
   static ValueRef<String> make(std::string_view text);
@@ -41,7 +42,7 @@ class String final : public Value {
 };
 
 /// A boolean, a signed or unsigned 64-bit integer, or a real.
-class Number final : public Value {
+class QZ_API Number final : public Value {
  public:
   enum class Type : std::uint8_t { boolean, signedInteger, unsignedInteger, real32, real64 };
 
@@ -79,7 +80,7 @@ class Number final : public Value {
 };
 
 /// A point in time, in seconds since 2001-01-01 00:00:00 UTC.
-class Date final : public Value {
+class QZ_API Date final : public Value {
  public:
   static Date& nothing();
   static ValueRef<Date> make(double secondsSinceReferenceDate);
@@ -95,7 +96,7 @@ class Date final : public Value {
 };
 
 /// Binary data.
-class Data final : public Value {
+class QZ_API Data final : public Value {
  public:
   static Data& nothing();
   static ValueRef<Data> make(std::string_view bytes);
@@ -112,7 +113,7 @@ class Data final : public Value {
 };
 
 /// The null of binary property lists.
-class Null final : public Value {
+class QZ_API Null final : public Value {
  public:
   static Null& nothing();
   static ValueRef<Null> make();
@@ -124,7 +125,7 @@ class Null final : public Value {
 };
 
 /// The reference number of keyed archives.
-class Uid final : public Value {
+class QZ_API Uid final : public Value {
  public:
   static Uid& nothing();
   static ValueRef<Uid> make(std::uint32_t number);
@@ -140,7 +141,7 @@ class Uid final : public Value {
 };
 
 /// Return `value` as the named kind; absent if it is absent or of another kind.
-ValueRef<String> asString(const ValueRef<>& value);
-ValueRef<Number> asNumber(const ValueRef<>& value);
+QZ_API ValueRef<String> asString(const ValueRef<>& value);
+QZ_API ValueRef<Number> asNumber(const ValueRef<>& value);
 
 }  // namespace qz::toolkit

@@ -18,6 +18,7 @@
 #include <string_view>
 #include <utility>
 
+#include "qz/api.hpp"
 #include "qz/property_list/document.hpp"
 #include "qz/toolkit/ref.hpp"
 
@@ -67,7 +68,7 @@ class Value;
 template <class T = Value>
 using ValueRef = Ref<T, Counted>;
 
-class Value {
+class QZ_API Value {
  public:
   enum class Kind : std::uint8_t {
     nothing,  ///< only for the object behind absent values

@@ -14,6 +14,7 @@
 #include <utility>
 #include <vector>
 
+#include "qz/api.hpp"
 #include "qz/styled_text/color.hpp"
 #include "qz/styled_text/fonts.hpp"
 
@@ -22,7 +23,7 @@ namespace qz::toolkit {
 enum class TextAlignment : int { left = 0, right = 1, center = 2, justified = 3, natural = 4 };
 
 /// Layout of whole paragraphs. Lengths are points.
-struct ParagraphStyle {
+struct QZ_API ParagraphStyle {
   TextAlignment alignment = TextAlignment::natural;
   double firstLineHeadIndent = 0;
   double headIndent = 0;  ///< of the other lines; if greater, the first line hangs
@@ -32,7 +33,7 @@ struct ParagraphStyle {
 
 /// The address that a click on a link opens. Copies share one text, so splitting a link into runs
 /// costs nothing extra, however long the address.
-class Link {
+class QZ_API Link {
  public:
   // Implicit, so that an address can be assigned to a link.
   Link(std::string address) : address_(std::make_shared<const std::string>(std::move(address))) {}
@@ -50,7 +51,7 @@ class Link {
 };
 
 /// The attributes of a run. The widget that draws the text chooses the absent ones.
-struct TextAttributes {
+struct QZ_API TextAttributes {
   std::optional<Font> font{};
   std::optional<Color> foregroundColor{};
   std::optional<Color> backgroundColor{};
@@ -63,21 +64,21 @@ struct TextAttributes {
   friend bool operator==(const TextAttributes&, const TextAttributes&) = default;
 };
 
-struct TextRange {
+struct QZ_API TextRange {
   std::size_t location = 0;
   std::size_t length = 0;
 
   friend bool operator==(const TextRange&, const TextRange&) = default;
 };
 
-struct TextRun {
+struct QZ_API TextRun {
   TextRange range;
   TextAttributes attributes;
 
   friend bool operator==(const TextRun&, const TextRun&) = default;
 };
 
-class AttributedString {
+class QZ_API AttributedString {
  public:
   AttributedString() = default;
   explicit AttributedString(std::string text, const TextAttributes& attributes = {});

@@ -2,10 +2,12 @@
 // Colours, and the standard ones by name.
 #pragma once
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
 /// Red, green, blue and alpha, each from 0 to 1, in sRGB.
-struct Color {
+struct QZ_API Color {
   double red = 0;
   double green = 0;
   double blue = 0;

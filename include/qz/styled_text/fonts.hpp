@@ -6,10 +6,12 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
 /// The font that a text requests.
-struct Font {
+struct QZ_API Font {
   std::string family;  ///< such as "Times"
   double size = 12;    ///< points
   bool bold = false;
@@ -20,7 +22,7 @@ struct Font {
 };
 
 /// The catalogue of the fonts that a toolkit can draw.
-class Fonts {
+class QZ_API Fonts {
  public:
   virtual ~Fonts() = default;
 

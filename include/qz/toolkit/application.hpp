@@ -4,6 +4,7 @@
 
 #include <memory>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/geometry.hpp"
 #include "qz/toolkit/ref.hpp"
 #include "qz/toolkit/view.hpp"
@@ -12,7 +13,7 @@
 namespace qz::toolkit {
 
 /// Notified when a sheet ends.
-class SheetDelegate {
+class QZ_API SheetDelegate {
  public:
   virtual ~SheetDelegate() = default;
 
@@ -21,7 +22,7 @@ class SheetDelegate {
   virtual void sheetDidEnd(const Ref<Window>& sheet, long returnCode, void* contextInfo) = 0;
 };
 
-class Application {
+class QZ_API Application {
  public:
   virtual ~Application() = default;
 

@@ -9,10 +9,12 @@
 #include <string_view>
 #include <utility>
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
 /// A raised exception, modelled on Foundation's `NSException`.
-class Exception : public std::exception {
+class QZ_API Exception : public std::exception {
  public:
   Exception(std::string name, std::string reason)
       : name_(std::move(name)), reason_(std::move(reason)) {}
@@ -29,13 +31,13 @@ class Exception : public std::exception {
 };
 
 /// A position or range is out of bounds.
-class RangeException : public Exception {
+class QZ_API RangeException : public Exception {
  public:
   explicit RangeException(std::string reason) : Exception("NSRangeException", std::move(reason)) {}
 };
 
 /// An argument is absent or of the wrong kind, or a receiver does not understand a message.
-class InvalidArgumentException : public Exception {
+class QZ_API InvalidArgumentException : public Exception {
  public:
   explicit InvalidArgumentException(std::string reason)
       : Exception("NSInvalidArgumentException", std::move(reason)) {}

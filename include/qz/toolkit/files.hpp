@@ -6,9 +6,11 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
-class Files {
+class QZ_API Files {
  public:
   virtual ~Files() = default;
 

@@ -2,9 +2,11 @@
 // Rectangles. Lengths are points; the origin is at the lower left, y grows upwards.
 #pragma once
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
-struct Rect {
+struct QZ_API Rect {
   double x = 0;
   double y = 0;
   double width = 0;

@@ -5,12 +5,13 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/ref.hpp"
 
 namespace qz::toolkit {
 
 /// An image. Only the toolkit that made it can draw it.
-class Image {
+class QZ_API Image {
  public:
   virtual ~Image() = default;
   static Image& nothing();
@@ -19,7 +20,7 @@ class Image {
   virtual std::string name() const = 0;
 };
 
-class Images {
+class QZ_API Images {
  public:
   virtual ~Images() = default;
 

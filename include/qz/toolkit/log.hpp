@@ -4,9 +4,11 @@
 
 #include <string_view>
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
-class Log {
+class QZ_API Log {
  public:
   virtual ~Log() = default;
 

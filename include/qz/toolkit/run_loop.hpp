@@ -14,12 +14,13 @@
 
 #include <functional>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/ref.hpp"
 
 namespace qz::toolkit {
 
 /// A scheduled call, modelled on `NSTimer`.
-class Timer {
+class QZ_API Timer {
  public:
   virtual ~Timer() = default;
   static Timer& nothing();
@@ -41,7 +42,7 @@ class Timer {
 /// Called when a timer fires, with the timer itself.
 using TimerAction = std::function<void(const Ref<Timer>&)>;
 
-class RunLoop {
+class QZ_API RunLoop {
  public:
   virtual ~RunLoop() = default;
 

@@ -5,6 +5,7 @@
 #include <optional>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/styled_text/attributed_string.hpp"
 #include "qz/styled_text/fonts.hpp"
 #include "qz/toolkit/application.hpp"
@@ -17,7 +18,7 @@ namespace qz::toolkit {
 
 /// Passed to an engine at its construction; must outlive every engine that uses it. All of it is
 /// used on one thread, the application's event thread.
-class Toolkit {
+class QZ_API Toolkit {
  public:
   virtual ~Toolkit() = default;
 

@@ -13,6 +13,7 @@
 #include <string_view>
 #include <vector>
 
+#include "qz/api.hpp"
 #include "qz/styled_text/attributed_string.hpp"
 #include "qz/toolkit/geometry.hpp"
 #include "qz/toolkit/image.hpp"
@@ -34,7 +35,7 @@ using Subviews = std::vector<Ref<View>>;
 /// A button's state. The `state` of a view without one is `off`.
 enum class State : int { mixed = -1, off = 0, on = 1 };
 
-class View : public Responder {
+class QZ_API View : public Responder {
  public:
   static View& nothing();
 
@@ -92,7 +93,7 @@ class View : public Responder {
 };
 
 /// A view that the user can act on.
-class Control : public View {
+class QZ_API Control : public View {
  public:
   /// Sets whether the control accepts the user's input.
   void setEnabled(bool enabled) override = 0;
@@ -115,7 +116,7 @@ class Control : public View {
 enum class BezelStyle : int { rounded = 1, texturedSquare = 8 };
 
 /// A push button, on/off button or three-state button.
-class Button : public Control {
+class QZ_API Button : public Control {
  public:
   static Button& nothing();
   Button* asButton() override { return this; }
@@ -139,7 +140,7 @@ class Button : public Control {
 };
 
 /// A text field, editable or used as a label.
-class TextField : public Control {
+class QZ_API TextField : public Control {
  public:
   static TextField& nothing();
   TextField* asTextField() override { return this; }
@@ -158,7 +159,7 @@ enum class ImageScaling : int { proportionallyDown = 0 };
 enum class ImageAlignment : int { center = 0 };
 
 /// A view that shows one image.
-class ImageView : public Control {
+class QZ_API ImageView : public Control {
  public:
   static ImageView& nothing();
   ImageView* asImageView() override { return this; }
@@ -172,14 +173,14 @@ class ImageView : public Control {
 
 /// A painted surface that a host uses like a button (the kind `NSGradient`). `setAction` raises, as
 /// for a plain view, unless the toolkit overrides it.
-class Gradient : public View {
+class QZ_API Gradient : public View {
  public:
   Gradient* asGradient() override { return this; }
 };
 
 /// Return `view` as the named kind; absent if it is absent or of another kind.
-Ref<Button> asButton(Ref<View> view);
-Ref<TextField> asTextField(Ref<View> view);
-Ref<ImageView> asImageView(Ref<View> view);
+QZ_API Ref<Button> asButton(Ref<View> view);
+QZ_API Ref<TextField> asTextField(Ref<View> view);
+QZ_API Ref<ImageView> asImageView(Ref<View> view);
 
 }  // namespace qz::toolkit

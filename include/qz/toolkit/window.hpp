@@ -4,6 +4,7 @@
 
 #include <memory>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/ref.hpp"
 #include "qz/toolkit/responder.hpp"
 #include "qz/toolkit/view.hpp"
@@ -15,7 +16,7 @@ enum class StyleMask : unsigned { titled = 1, closable = 2, titledAndClosable = 
 /// How a window's pixels are stored (`NSBackingStoreType`).
 enum class BackingStore : unsigned { buffered = 2 };
 
-class Window {
+class QZ_API Window {
  public:
   virtual ~Window() = default;
   static Window& nothing();

@@ -4,13 +4,14 @@
 
 #include <memory>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/application.hpp"
 
 namespace qz::toolkit::memory {
 
 class Screen;
 
-class MemoryApplication final : public Application {
+class QZ_API MemoryApplication final : public Application {
  public:
   MemoryApplication();
   MemoryApplication(const MemoryApplication&) = delete;

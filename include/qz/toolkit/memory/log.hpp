@@ -7,11 +7,12 @@
 #include <string_view>
 #include <utility>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/log.hpp"
 
 namespace qz::toolkit::memory {
 
-class MemoryLog final : public Log {
+class QZ_API MemoryLog final : public Log {
  public:
   using Sink = std::function<void(std::string_view)>;
 

@@ -6,6 +6,7 @@
 
 #include <memory>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/memory/application.hpp"
 #include "qz/toolkit/memory/log.hpp"
 #include "qz/toolkit/system_files.hpp"
@@ -13,7 +14,7 @@
 
 namespace qz::toolkit::memory {
 
-class MemoryToolkit final : public Toolkit {
+class QZ_API MemoryToolkit final : public Toolkit {
  public:
   MemoryToolkit();
   ~MemoryToolkit() override;

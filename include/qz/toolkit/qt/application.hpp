@@ -4,6 +4,7 @@
 
 #include <memory>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/application.hpp"
 #include "qz/toolkit/log.hpp"
 
@@ -13,7 +14,7 @@ namespace qz::toolkit::qt {
 
 class Desk;
 
-class QtApplication final : public Application {
+class QZ_API QtApplication final : public Application {
  public:
   explicit QtApplication(Log& log);
   /// Ends the windows that only the application keeps alive.

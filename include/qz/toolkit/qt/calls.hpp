@@ -6,11 +6,12 @@
 #include <functional>
 #include <utility>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/log.hpp"
 
 namespace qz::toolkit::qt {
 
-class Calls {
+class QZ_API Calls {
  public:
   /// Receives the exception that a callback threw. An exception from the handler ends the program.
   using Handler = std::function<void(std::exception_ptr)>;

@@ -6,11 +6,12 @@
 #include <string_view>
 #include <utility>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/log.hpp"
 
 namespace qz::toolkit::qt {
 
-class QtLog final : public Log {
+class QZ_API QtLog final : public Log {
  public:
   using Sink = std::function<void(std::string_view)>;
 

@@ -5,6 +5,7 @@
 
 #include <memory>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/qt/application.hpp"
 #include "qz/toolkit/qt/calls.hpp"
 #include "qz/toolkit/qt/clock.hpp"
@@ -14,7 +15,7 @@
 
 namespace qz::toolkit::qt {
 
-class QtToolkit final : public Toolkit {
+class QZ_API QtToolkit final : public Toolkit {
  public:
   QtToolkit();
   /// Uses another clock, which must outlive the toolkit.

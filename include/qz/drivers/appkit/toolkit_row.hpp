@@ -2,7 +2,7 @@
 // The row of AppKit, so that scenarios can name it. There is no such toolkit yet.
 #pragma once
 
-#include "drivers/toolkit_row.hpp"
+#include "qz/drivers/toolkit_row.hpp"
 
 namespace qz::drivers {
 

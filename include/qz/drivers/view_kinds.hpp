@@ -12,7 +12,8 @@
 #include <string_view>
 #include <vector>
 
-#include "toolkit/class_names.hpp"
+#include "qz/api.hpp"
+#include "qz/toolkit/class_names.hpp"
 
 namespace qz::drivers {
 
@@ -32,7 +33,7 @@ enum class ViewKind : std::uint8_t {
 enum class Caption : std::uint8_t { none, title, text, imageName };
 
 /// What is known of a kind on every toolkit.
-struct ViewKindRow {
+struct QZ_API ViewKindRow {
   ViewKind kind;
   std::string_view name;       ///< in scenarios and host windows, such as "NSButton:toggle"
   std::string_view className;  ///< the standard name of its class, such as "NSButton"

@@ -2,7 +2,8 @@
 // The row of the Qt toolkit. This header uses nothing of Qt.
 #pragma once
 
-#include "drivers/toolkit_row.hpp"
+#include "qz/api.hpp"
+#include "qz/drivers/toolkit_row.hpp"
 
 namespace qz::drivers {
 
@@ -17,6 +18,6 @@ inline constexpr ToolkitRow qtRow = {
 };
 
 /// Makes a driver with its own Qt toolkit. Makes the application object if there is none.
-std::unique_ptr<Driver> makeQtDriver();
+QZ_API std::unique_ptr<Driver> makeQtDriver();
 
 }  // namespace qz::drivers

@@ -10,7 +10,8 @@
 #include <string_view>
 #include <vector>
 
-#include "drivers/view_kinds.hpp"
+#include "qz/api.hpp"
+#include "qz/drivers/view_kinds.hpp"
 #include "qz/toolkit/geometry.hpp"
 #include "qz/toolkit/toolkit.hpp"
 
@@ -19,7 +20,7 @@ namespace qz::drivers {
 using namespace toolkit;
 
 /// A snapshot of a view.
-struct ViewPicture {
+struct QZ_API ViewPicture {
   ViewKind kind = ViewKind::plain;  // button, toggle or mixed, by the button's behaviour
   std::string className;
   Tag tag = 0;
@@ -40,7 +41,7 @@ struct ViewPicture {
 };
 
 /// A snapshot of a window.
-struct WindowPicture {
+struct QZ_API WindowPicture {
   bool visible = false;
   bool key = false;
   int closes = 0;  // how often it was closed
@@ -57,7 +58,7 @@ struct WindowPicture {
 };
 
 /// What the program does whose windows these are.
-class HostActions {
+class QZ_API HostActions {
  public:
   virtual ~HostActions() = default;
 
@@ -80,7 +81,7 @@ class HostActions {
 };
 
 /// What a user does.
-class UserActions {
+class QZ_API UserActions {
  public:
   virtual ~UserActions() = default;
 
@@ -103,7 +104,7 @@ class UserActions {
 };
 
 /// The display, and the person in front of it.
-class Display {
+class QZ_API Display {
  public:
   virtual ~Display() = default;
 
@@ -125,7 +126,7 @@ class Display {
 };
 
 /// Reads back what the windows show.
-class Inspector {
+class QZ_API Inspector {
  public:
   virtual ~Inspector() = default;
 
@@ -136,7 +137,7 @@ class Inspector {
   virtual void setLogSink(std::function<void(std::string_view)> sink) = 0;
 };
 
-class Driver : public HostActions, public UserActions, public Display, public Inspector {
+class QZ_API Driver : public HostActions, public UserActions, public Display, public Inspector {
  public:
   /// Returns the name for `--toolkit`, such as "memory".
   virtual std::string_view name() const = 0;
