@@ -149,8 +149,18 @@ write_basic_package_version_file(qz-config-version.cmake COMPATIBILITY SameMajor
 install(FILES ${PROJECT_BINARY_DIR}/qz-config.cmake ${PROJECT_BINARY_DIR}/qz-config-version.cmake
   DESTINATION ${qz_cmake_dir})
 
+# The tool, and what scripts/tool-files makes of what the tool says of itself.
 if(TARGET qz-walkthrough)
   install(TARGETS qz-walkthrough)
+  set(files ${PROJECT_BINARY_DIR}/tool-files)
+  add_custom_command(OUTPUT ${files}/qz-walkthrough.fish
+    COMMAND ${PROJECT_SOURCE_DIR}/scripts/tool-files $<TARGET_FILE:qz-walkthrough> ${files}
+    DEPENDS qz-walkthrough scripts/tool-files VERBATIM)
+  add_custom_target(tool-files ALL DEPENDS ${files}/qz-walkthrough.fish)
+  install(FILES ${files}/qz-walkthrough DESTINATION ${CMAKE_INSTALL_DATADIR}/bash-completion/completions)
+  install(FILES ${files}/_qz-walkthrough DESTINATION ${CMAKE_INSTALL_DATADIR}/zsh/site-functions)
+  install(FILES ${files}/qz-walkthrough.fish DESTINATION ${CMAKE_INSTALL_DATADIR}/fish/vendor_completions.d)
+  install(DIRECTORY ${files}/ DESTINATION ${CMAKE_INSTALL_MANDIR}/man1 FILES_MATCHING PATTERN *.1)
 endif()
 install(FILES README.md CHANGELOG.md LICENSE DESTINATION ${CMAKE_INSTALL_DOCDIR})
 install(DIRECTORY docs examples DESTINATION ${CMAKE_INSTALL_DOCDIR})
