@@ -31,11 +31,12 @@ enum class ParameterType {
   anything,          ///< any value: it must be there, but its meaning does not matter
 };
 
+/// A parameter of a command.
 struct QZ_API CommandParameter {
-  std::string_view name;  ///< what the documentation calls the parameter
-  ParameterType type;
+  std::string_view name;     ///< what the documentation calls the parameter
+  ParameterType type;        ///< what the engine converts it to
   std::string_view meaning;  ///< one line in plain English
-  bool isOptional = false;
+  bool isOptional = false;   ///< whether a list may leave it out
 };
 
 /// How a script may write a command: as a string (simple), or as an array of the name and the
@@ -73,6 +74,7 @@ enum class CommandFlow {
   endsWalkThrough,  ///< the list continues without a script, so that it runs no other list
 };
 
+/// A command, as `commandCatalogue` lists it.
 struct QZ_API Command {
   /// Returns the position of the first parameter of this type, counted from 0 after the name;
   /// absent if there is none.
@@ -85,11 +87,11 @@ struct QZ_API Command {
   std::string_view constant;  ///< the name of the constant, such as QZ_PLIST_STATE_PARSER_FLASH_ID
   std::string& name;          ///< the constant: the current name of the command in scripts
   std::string_view summary;   ///< what the command does, in one line of plain English
-  CommandForm form;
+  CommandForm form;           ///< whether a list writes it as a string or as an array
   std::span<const CommandParameter> parameters;  ///< of the compound form
-  TargetKind target;
-  ExtraParameters extraParameters;
-  CommandFlow flow;
+  TargetKind target;                             ///< the kind of control that it works on
+  ExtraParameters extraParameters;               ///< what it does with more parameters
+  CommandFlow flow;                              ///< what happens to its list afterwards
 };
 
 /// Returns all commands, in the order in which the engine compares their names. Each constant has

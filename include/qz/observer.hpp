@@ -21,8 +21,8 @@ namespace qz {
 /// exception of another type stops the operation in its middle and reaches the operation's caller.
 class QZ_API Observer {
  public:
-  using Value = toolkit::ValueRef<>;
-  using ObjectId = toolkit::ValueRef<toolkit::Number>;
+  using Value = toolkit::ValueRef<>;                    ///< a value of a script
+  using ObjectId = toolkit::ValueRef<toolkit::Number>;  ///< the number of a control
 
   virtual ~Observer() = default;
 

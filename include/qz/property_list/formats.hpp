@@ -24,7 +24,7 @@ enum class Format : std::uint8_t {
 
 /// What is known of a format.
 struct QZ_API FormatRow {
-  Format format;
+  Format format;           ///< the format of the row
   std::string_view name;   ///< for options, such as "xml"
   std::string_view title;  ///< for messages, such as "XML property list"
   /// Whether files are text, which has lines and an encoding. Then `looksLike` and `read` receive
@@ -33,6 +33,7 @@ struct QZ_API FormatRow {
   /// Whether a file was probably meant as this format. Bytes are read only as a format that they
   /// look like. A text is read as every text format; this chooses the one that messages are about.
   bool (*looksLike)(std::string_view contents);
+  /// Makes the values in the document, and returns the root; throws RefusedAt.
   Value* (*read)(std::string_view contents, Document& document, ValueOffsets* offsets);
   /// Returns the value as a whole file; raises an invalid-argument exception for a value that the
   /// format cannot hold. Null if the format has no writer.

@@ -18,6 +18,7 @@
 
 namespace qz::toolkit {
 
+/// Returns the hash of a string key.
 QZ_API std::uint64_t hashOf(std::string_view text);
 /// Returns the same hash for keys that are the same (see `sameKey`).
 QZ_API std::uint64_t hashOfKey(const Value& key);
@@ -31,10 +32,12 @@ QZ_API bool sameKey(const Value& a, const Value& b);
 /// at a position.
 class QZ_API KeyIndex {
  public:
-  static constexpr std::size_t none = std::numeric_limits<std::size_t>::max();
+  static constexpr std::size_t none =
+      std::numeric_limits<std::size_t>::max();  ///< the position of a key that is not in the index
 
   /// Makes an index with room for `count` keys.
   KeyIndex(std::size_t count, std::pmr::memory_resource* memory);
+  /// Copies an index into other memory.
   KeyIndex(const KeyIndex& other, std::pmr::memory_resource* memory)
       : slots_(other.slots_, memory), used_(other.used_) {}
 
@@ -50,6 +53,7 @@ class QZ_API KeyIndex {
     return none;
   }
 
+  /// Whether `append` needs a larger index.
   bool isFull() const { return used_ >= slots_.size() / 4 * 3; }
   /// Adds a new key, whose position is one after the last. The index must not be full.
   void append(std::uint64_t hash);

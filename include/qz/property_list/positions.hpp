@@ -17,17 +17,18 @@ namespace qz::toolkit {
 
 /// A position in a text. Both count from 1; a column is one character, whatever its display width.
 struct QZ_API TextPosition {
-  std::size_t line;
-  std::size_t column;
+  std::size_t line;    ///< from 1
+  std::size_t column;  ///< from 1, in characters
   friend bool operator==(const TextPosition&, const TextPosition&) = default;
 };
 
 /// A position in a binary file, counted from 0.
 struct QZ_API BytePosition {
-  std::size_t offset;
+  std::size_t offset;  ///< from 0
   friend bool operator==(const BytePosition&, const BytePosition&) = default;
 };
 
+/// A position in a file of any format.
 using Position = std::variant<TextPosition, BytePosition>;
 
 /// Returns text such as "line 3, column 7" or "byte 42".

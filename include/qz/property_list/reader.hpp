@@ -20,18 +20,19 @@ namespace qz::toolkit {
 
 /// Why bytes are not a property list.
 struct QZ_API Refusal {
-  Format format;  ///< the most likely format; `reason` is that reader's
-  Position position;
-  std::string reason;
+  Format format;       ///< the most likely format; `reason` is that reader's
+  Position position;   ///< where the reader stopped
+  std::string reason;  ///< what it expected and found, in words
 
   /// Returns text such as "line 3, column 7: expected </dict> (read as XML property list)".
   std::string description() const;
 };
 
+/// What came of reading a file.
 struct QZ_API ReadResult {
-  ValueRef<> value;  ///< the root, of any kind; absent if there is a refusal
-  Format format;     ///< the format that was read or refused
-  std::optional<Refusal> refusal;
+  ValueRef<> value;                ///< the root, of any kind; absent if there is a refusal
+  Format format;                   ///< the format that was read or refused
+  std::optional<Refusal> refusal;  ///< why there is no value; absent if there is one
 };
 
 /// Reads a whole file. `bytes` need not outlive the call. `positions`, if given, receives the

@@ -12,10 +12,10 @@ namespace qz::toolkit {
 
 /// The font that a text requests.
 struct QZ_API Font {
-  std::string family;  ///< such as "Times"
-  double size = 12;    ///< points
-  bool bold = false;
-  bool italic = false;
+  std::string family;       ///< such as "Times"
+  double size = 12;         ///< points
+  bool bold = false;        ///< whether it is a bold face
+  bool italic = false;      ///< whether it is an italic face
   bool fixedPitch = false;  ///< all characters have the same width
 
   friend bool operator==(const Font&, const Font&) = default;

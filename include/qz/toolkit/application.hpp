@@ -22,6 +22,7 @@ class QZ_API SheetDelegate {
   virtual void sheetDidEnd(const Ref<Window>& sheet, long returnCode, void* contextInfo) = 0;
 };
 
+/// Makes windows and controls, and shows sheets.
 class QZ_API Application {
  public:
   virtual ~Application() = default;
@@ -35,7 +36,9 @@ class QZ_API Application {
   /// Make controls that are not yet in a window: a push button, an image view without an image, an
   /// empty text field. Their tags are the toolkit's default.
   virtual Ref<Button> makeButton(const Rect& frame) = 0;
+  /// Makes an image view. It has no superview yet.
   virtual Ref<ImageView> makeImageView(const Rect& frame) = 0;
+  /// Makes a text field. It has no superview yet.
   virtual Ref<TextField> makeTextField(const Rect& frame) = 0;
 
   /// Shows `sheet` attached to `parent`, whose input is blocked until the sheet is ordered out. An

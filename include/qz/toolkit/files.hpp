@@ -10,6 +10,7 @@
 
 namespace qz::toolkit {
 
+/// Reads files, and knows the resource directory.
 class QZ_API Files {
  public:
   virtual ~Files() = default;

@@ -14,12 +14,15 @@ namespace qz::toolkit {
 class QZ_API Image {
  public:
   virtual ~Image() = default;
+  /// Returns the object behind absent references: it answers zero, NO or absent, and changes do
+  /// nothing.
   static Image& nothing();
 
   /// The name under which the image was found.
   virtual std::string name() const = 0;
 };
 
+/// Finds images by name.
 class QZ_API Images {
  public:
   virtual ~Images() = default;

@@ -8,6 +8,7 @@
 
 namespace qz::toolkit {
 
+/// Writes diagnostic lines.
 class QZ_API Log {
  public:
   virtual ~Log() = default;

@@ -23,6 +23,8 @@ namespace qz::toolkit {
 class QZ_API Timer {
  public:
   virtual ~Timer() = default;
+  /// Returns the object behind absent references: it answers zero, NO or absent, and changes do
+  /// nothing.
   static Timer& nothing();
 
   /// Whether the timer can still fire. A one-shot timer becomes invalid after its firing.
@@ -42,6 +44,7 @@ class QZ_API Timer {
 /// Called when a timer fires, with the timer itself.
 using TimerAction = std::function<void(const Ref<Timer>&)>;
 
+/// Schedules timers.
 class QZ_API RunLoop {
  public:
   virtual ~RunLoop() = default;

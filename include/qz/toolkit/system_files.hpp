@@ -11,6 +11,7 @@
 
 namespace qz::toolkit {
 
+/// Reads files of the operating system.
 class QZ_API SystemFiles final : public Files {
  public:
   /// Starts with the working directory as the resource directory.

@@ -6,6 +6,7 @@
 
 namespace qz::drivers {
 
+/// AppKit.
 inline constexpr ToolkitRow appkitRow = {
     .name = "appkit",
     .description = "windows of AppKit",

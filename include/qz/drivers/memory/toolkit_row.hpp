@@ -7,6 +7,7 @@
 
 namespace qz::drivers {
 
+/// The memory toolkit.
 inline constexpr ToolkitRow memoryRow = {
     .name = "memory",
     .description = "records everything, without a display",

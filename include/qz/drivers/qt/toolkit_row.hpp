@@ -7,6 +7,7 @@
 
 namespace qz::drivers {
 
+/// The Qt toolkit.
 inline constexpr ToolkitRow qtRow = {
     .name = "qt",
     .description = "windows of Qt 6 Widgets",

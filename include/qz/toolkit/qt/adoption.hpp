@@ -18,15 +18,18 @@ class AdoptedForm;
 
 /// How a walk-through takes over a window.
 struct QZ_API Adoption {
+  /// Which widgets are controls.
   enum class Reading : std::uint8_t {
     everyTaggedWidget,  ///< every widget with a tag, however deep, in the order of the widget tree
     directSubviews      ///< the direct children of the content, with and without a tag
   };
+  /// What the end of an adoption restores.
   enum class Restoring : std::uint8_t {
     everything,  ///< all that commands have changed, unless somebody else has changed it since
     tags         ///< only the tags, as the engine does on its own
   };
 
+  /// Which widgets are controls.
   Reading reading = Reading::everyTaggedWidget;
   /// The tags of widgets and actions by their object names. An object's own tag, the dynamic
   /// property `qzTag`, counts more.

@@ -11,6 +11,7 @@
 
 namespace qz::toolkit::qt {
 
+/// Makes calls from Qt's event loop, through which no exception may pass.
 class QZ_API Calls {
  public:
   /// Receives the exception that a callback threw. An exception from the handler ends the program.
@@ -19,8 +20,10 @@ class QZ_API Calls {
   /// By default a toolkit exception is logged and the application continues, as AppKit's does; any
   /// other exception ends the program with its own message.
   explicit Calls(Log& log);
+  /// Sets who gets the exceptions of calls.
   void setHandler(Handler handler) { handler_ = std::move(handler); }
 
+  /// Makes the call, and hands its exception to the handler.
   template <class Call>
   void make(Call call) noexcept {
     try {
