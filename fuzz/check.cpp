@@ -21,9 +21,9 @@
 #include <variant>
 
 #include "drivers/memory/memory_driver.hpp"
-#include "drivers/view_kinds.hpp"
 #include "fuzz/require.hpp"
 #include "fuzz/run_lengths.hpp"
+#include "qz/drivers/view_kinds.hpp"
 #include "qz/toolkit/exception.hpp"
 #include "tools/check/report.hpp"
 #include "tools/check/world.hpp"

@@ -8,7 +8,7 @@
 #include <string>
 #include <vector>
 
-#include "drivers/view_kinds.hpp"
+#include "qz/drivers/view_kinds.hpp"
 #include "qz/observer.hpp"
 #include "tools/check/facts.hpp"
 #include "tools/check/place.hpp"

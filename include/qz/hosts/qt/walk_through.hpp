@@ -14,6 +14,7 @@
 #include <string_view>
 #include <utility>
 
+#include "qz/api.hpp"
 #include "qz/engine.hpp"
 #include "qz/toolkit/qt/adoption.hpp"
 #include "qz/toolkit/qt/qt_toolkit.hpp"
@@ -21,7 +22,7 @@
 namespace qz::hosts::qt {
 
 /// Plays one walk-through at a time: beginning another ends the previous one.
-class WalkThrough {
+class QZ_API WalkThrough {
  public:
   /// `toolkit` must outlive this object.
   explicit WalkThrough(toolkit::qt::QtToolkit& toolkit);

@@ -6,11 +6,13 @@
 #include <functional>
 #include <utility>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/log.hpp"
 
 namespace qz::toolkit::qt {
 
-class Calls {
+/// Makes calls from Qt's event loop, through which no exception may pass.
+class QZ_API Calls {
  public:
   /// Receives the exception that a callback threw. An exception from the handler ends the program.
   using Handler = std::function<void(std::exception_ptr)>;
@@ -18,8 +20,10 @@ class Calls {
   /// By default a toolkit exception is logged and the application continues, as AppKit's does; any
   /// other exception ends the program with its own message.
   explicit Calls(Log& log);
+  /// Sets who gets the exceptions of calls.
   void setHandler(Handler handler) { handler_ = std::move(handler); }
 
+  /// Makes the call, and hands its exception to the handler.
   template <class Call>
   void make(Call call) noexcept {
     try {

@@ -12,7 +12,8 @@
 #include <string_view>
 #include <vector>
 
-#include "toolkit/class_names.hpp"
+#include "qz/api.hpp"
+#include "qz/toolkit/class_names.hpp"
 
 namespace qz::drivers {
 
@@ -32,16 +33,16 @@ enum class ViewKind : std::uint8_t {
 enum class Caption : std::uint8_t { none, title, text, imageName };
 
 /// What is known of a kind on every toolkit.
-struct ViewKindRow {
-  ViewKind kind;
-  std::string_view name;       ///< in scenarios and host windows, such as "NSButton:toggle"
-  std::string_view className;  ///< the standard name of its class, such as "NSButton"
-  std::string_view word;       ///< the everyday word, such as "check box"
-  Caption caption = Caption::none;
-  bool isControl = false;      ///< can be disabled, and has a target and an action
-  bool isButton = false;       ///< a control that a user presses; it has a title and a state
-  bool showsState = false;     ///< a button that looks different when it is on
-  bool hasMixedState = false;  ///< a button whose state may be neither on nor off
+struct QZ_API ViewKindRow {
+  ViewKind kind;                    ///< what the row is about
+  std::string_view name;            ///< in scenarios and host windows, such as "NSButton:toggle"
+  std::string_view className;       ///< the standard name of its class, such as "NSButton"
+  std::string_view word;            ///< the everyday word, such as "check box"
+  Caption caption = Caption::none;  ///< what a user reads on it
+  bool isControl = false;           ///< can be disabled, and has a target and an action
+  bool isButton = false;            ///< a control that a user presses; it has a title and a state
+  bool showsState = false;          ///< a button that looks different when it is on
+  bool hasMixedState = false;       ///< a button whose state may be neither on nor off
 };
 
 /// The rows, in the order of the enumerators and of the documentation.

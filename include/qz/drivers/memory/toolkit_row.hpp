@@ -2,10 +2,12 @@
 // The row of the memory toolkit, which every build has.
 #pragma once
 
-#include "drivers/toolkit_row.hpp"
+#include "qz/api.hpp"
+#include "qz/drivers/toolkit_row.hpp"
 
 namespace qz::drivers {
 
+/// The memory toolkit.
 inline constexpr ToolkitRow memoryRow = {
     .name = "memory",
     .description = "records everything, without a display",
@@ -15,6 +17,6 @@ inline constexpr ToolkitRow memoryRow = {
 };
 
 /// Makes a driver with its own memory toolkit.
-std::unique_ptr<Driver> makeMemoryDriver();
+QZ_API std::unique_ptr<Driver> makeMemoryDriver();
 
 }  // namespace qz::drivers

@@ -10,7 +10,8 @@
 #include <string_view>
 #include <vector>
 
-#include "drivers/view_kinds.hpp"
+#include "qz/api.hpp"
+#include "qz/drivers/view_kinds.hpp"
 #include "qz/toolkit/geometry.hpp"
 #include "qz/toolkit/toolkit.hpp"
 
@@ -19,45 +20,46 @@ namespace qz::drivers {
 using namespace toolkit;
 
 /// A snapshot of a view.
-struct ViewPicture {
-  ViewKind kind = ViewKind::plain;  // button, toggle or mixed, by the button's behaviour
-  std::string className;
-  Tag tag = 0;
-  Rect frame;
-  bool hidden = false;
-  bool enabled = true;  // YES for a view that cannot be disabled
-  State state = State::off;
-  bool highlighted = false;
-  AttributedString title;  // buttons
-  AttributedString text;   // any other control
-  std::string toolTip;
-  std::optional<std::string> image;  // the name of an image view's image
-  std::shared_ptr<Responder> target;
-  std::optional<std::string> action;
-  std::optional<Color> background;  // of a button, within its bezel
+struct QZ_API ViewPicture {
+  ViewKind kind = ViewKind::plain;  ///< button, toggle or mixed, by the button's behaviour
+  std::string className;            ///< the toolkit's own class name
+  Tag tag = 0;                      ///< by which scripts find it
+  Rect frame;                       ///< in the coordinates of its superview
+  bool hidden = false;              ///< whether it is hidden itself
+  /// YES for a view that cannot be disabled
+  bool enabled = true;
+  State state = State::off;           ///< whether a button is on
+  bool highlighted = false;           ///< whether a button looks pressed in
+  AttributedString title;             ///< of a button
+  AttributedString text;              ///< of any other control
+  std::string toolTip;                ///< empty if it has none
+  std::optional<std::string> image;   ///< the name of an image view's image
+  std::shared_ptr<Responder> target;  ///< who receives its action
+  std::optional<std::string> action;  ///< the message that it sends
+  std::optional<Color> background;    ///< of a button, within its bezel
 
   friend bool operator==(const ViewPicture&, const ViewPicture&) = default;
 };
 
 /// A snapshot of a window.
-struct WindowPicture {
-  bool visible = false;
-  bool key = false;
-  int closes = 0;  // how often it was closed
-  Rect content;
-  unsigned style = 0;  // bits of StyleMask
-  Color background;
-  std::shared_ptr<Responder> delegate;
-  bool layered = false;                   // the content view draws through a layer
-  std::optional<std::string> layerImage;  // the name of its layer's contents
-  Ref<Window> sheetOf;                    // the window it is attached to as a sheet
-  std::vector<long> sheetEnds;            // return codes of all requests to end it, in order
+struct QZ_API WindowPicture {
+  bool visible = false;                   ///< whether it is on the screen
+  bool key = false;                       ///< whether it receives keys
+  int closes = 0;                         ///< how often it was closed
+  Rect content;                           ///< the frame of its content, on the screen
+  unsigned style = 0;                     ///< bits of StyleMask
+  Color background;                       ///< behind the content
+  std::shared_ptr<Responder> delegate;    ///< who hears of its events
+  bool layered = false;                   ///< whether the content view draws through a layer
+  std::optional<std::string> layerImage;  ///< the name of its layer's contents
+  Ref<Window> sheetOf;                    ///< the window it is attached to as a sheet
+  std::vector<long> sheetEnds;            ///< return codes of all requests to end it, in order
 
   friend bool operator==(const WindowPicture&, const WindowPicture&) = default;
 };
 
 /// What the program does whose windows these are.
-class HostActions {
+class QZ_API HostActions {
  public:
   virtual ~HostActions() = default;
 
@@ -66,7 +68,9 @@ class HostActions {
   /// Makes a view of the kind, in front of the other views in `parent`. `parent` owns it.
   virtual Ref<View> makeView(ViewKind kind, Tag tag, const Rect& frame,
                              const Ref<View>& parent) = 0;
+  /// Takes the view out of its superview.
   virtual void removeFromSuperview(const Ref<View>& view) = 0;
+  /// Moves and resizes the view, in the coordinates of its superview.
   virtual void setFrame(const Ref<View>& view, const Rect& frame) = 0;
   /// Sets the text of a text field, the title of a button, or the image of an image view by its
   /// name.
@@ -80,7 +84,7 @@ class HostActions {
 };
 
 /// What a user does.
-class UserActions {
+class QZ_API UserActions {
  public:
   virtual ~UserActions() = default;
 
@@ -103,7 +107,7 @@ class UserActions {
 };
 
 /// The display, and the person in front of it.
-class Display {
+class QZ_API Display {
  public:
   virtual ~Display() = default;
 
@@ -125,21 +129,25 @@ class Display {
 };
 
 /// Reads back what the windows show.
-class Inspector {
+class QZ_API Inspector {
  public:
   virtual ~Inspector() = default;
 
+  /// Returns what the view shows and how it is wired.
   virtual ViewPicture look(const Ref<View>& view) = 0;
+  /// Returns what the window shows and how it is wired.
   virtual WindowPicture look(const Ref<Window>& window) = 0;
   /// Passes every log line to `sink` as it is written. Without a sink, as at first, log lines are
   /// discarded.
   virtual void setLogSink(std::function<void(std::string_view)> sink) = 0;
 };
 
-class Driver : public HostActions, public UserActions, public Display, public Inspector {
+/// Acts as the user and the host of a toolkit of its own, and inspects the result.
+class QZ_API Driver : public HostActions, public UserActions, public Display, public Inspector {
  public:
   /// Returns the name for `--toolkit`, such as "memory".
   virtual std::string_view name() const = 0;
+  /// Returns the driver's own toolkit, for engines.
   virtual Toolkit& toolkit() = 0;
 };
 

@@ -2,10 +2,12 @@
 // The row of the Qt toolkit. This header uses nothing of Qt.
 #pragma once
 
-#include "drivers/toolkit_row.hpp"
+#include "qz/api.hpp"
+#include "qz/drivers/toolkit_row.hpp"
 
 namespace qz::drivers {
 
+/// The Qt toolkit.
 inline constexpr ToolkitRow qtRow = {
     .name = "qt",
     .description = "windows of Qt 6 Widgets",
@@ -17,6 +19,6 @@ inline constexpr ToolkitRow qtRow = {
 };
 
 /// Makes a driver with its own Qt toolkit. Makes the application object if there is none.
-std::unique_ptr<Driver> makeQtDriver();
+QZ_API std::unique_ptr<Driver> makeQtDriver();
 
 }  // namespace qz::drivers

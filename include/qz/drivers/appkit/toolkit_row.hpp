@@ -2,10 +2,11 @@
 // The row of AppKit, so that scenarios can name it. There is no such toolkit yet.
 #pragma once
 
-#include "drivers/toolkit_row.hpp"
+#include "qz/drivers/toolkit_row.hpp"
 
 namespace qz::drivers {
 
+/// AppKit.
 inline constexpr ToolkitRow appkitRow = {
     .name = "appkit",
     .description = "windows of AppKit",

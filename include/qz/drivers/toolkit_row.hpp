@@ -1,17 +1,19 @@
 // SPDX-License-Identifier: MIT
-// What tools know of a toolkit. drivers/NAME/toolkit_row.hpp defines the row of a toolkit, also for
-// builds that are without it, and declares the function that makes its driver.
+// What tools know of a toolkit. qz/drivers/NAME/toolkit_row.hpp defines the row of a toolkit, also
+// for builds that are without it, and declares the function that makes its driver.
 #pragma once
 
 #include <memory>
 #include <string_view>
+
+#include "qz/api.hpp"
 
 namespace qz::drivers {
 
 class Driver;
 
 /// What is known of a toolkit.
-struct ToolkitRow {
+struct QZ_API ToolkitRow {
   std::string_view name;         ///< for `--toolkit` and in scenarios; the name of its folders
   std::string_view description;  ///< for the help
   /// Says how to get the toolkit if this build lacks it. Ends a message that names the toolkit.
