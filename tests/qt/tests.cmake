@@ -5,3 +5,12 @@ qz_tests(qt qz::qt_driver qz::engine qz::tools qt-host-forms Qt6::Test)
 target_sources(qt-tests PRIVATE qt/main.cpp)
 set_target_properties(qt-tests PROPERTIES AUTOUIC ON)
 qz_scenario_tests(qt QT_QPA_PLATFORM=offscreen)
+
+# Needs forms and Qt's form loader, which scripts/foreign-forms installs.
+find_package(Qt6 6.4 QUIET OPTIONAL_COMPONENTS UiTools)
+if(TARGET Qt6::UiTools)
+  add_executable(foreign-forms foreign_forms/form_script.cpp foreign_forms/form_trial.cpp
+    foreign_forms/main.cpp)
+  set_target_properties(foreign-forms PROPERTIES AUTOMOC ON)
+  target_link_libraries(foreign-forms PRIVATE qz::qt_host Qt6::UiTools Qt6::Test qz_private)
+endif()

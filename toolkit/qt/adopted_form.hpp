@@ -18,15 +18,18 @@ class QAction;
 namespace qz::toolkit::qt {
 
 /// True if `widget`, a child of a widget of a form, belongs to the form too: if it is not a window,
-/// or if it is a dock or a tool bar, which may float as a window.
+/// or if it is a dock, a tool bar or a menu.
 bool isPartOfForm(const QWidget& widget);
 
 /// How much of a control's change the user is to see.
 enum class Notice : std::uint8_t { none, shown, flash };
 
-class AdoptedForm {
+class AdoptedForm final : public QObject {
  public:
   AdoptedForm(QWidget& window, Adoption how);
+
+  /// Remembers the size of the window when its layout enlarges it.
+  bool eventFilter(QObject* receiver, QEvent* event) override;
 
   /// Returns the widget that holds the window's controls; null if it is gone. The central widget of
   /// a main window that has one, otherwise the window.
@@ -40,8 +43,9 @@ class AdoptedForm {
   std::vector<std::string> unreachableTags() const;
 
   /// Returns all that a change of `widget` can change, as `changed` needs it; nothing if the
-  /// adoption does not restore it.
-  std::vector<Sighting> look(QWidget& widget) const;
+  /// adoption does not restore it. A change that is shown also changes what the host changes in
+  /// return: it may enable a button when a text is no longer empty.
+  std::vector<Sighting> look(QWidget& widget, Notice notice) const;
   /// Brings a changed control into view, if the adoption says so. A flash does so only once for
   /// each control, so that it does not drag back a user who has gone elsewhere. Remembers what has
   /// changed since `before`.
