@@ -1,0 +1,73 @@
+// SPDX-License-Identifier: MIT
+// Qt 6.8 can announce a text. Before that, a changed dialog is announced as an alert, as Qt's own
+// message boxes are.
+
+#include "hosts/qt/guide_announcement.hpp"
+
+#include <QAccessible>
+#include <QCoreApplication>
+
+#include "hosts/qt/guide_panel.hpp"
+
+namespace qz::hosts::qt {
+
+namespace {
+
+QString nameOf(QWidget& control) {
+  const QAccessibleInterface* const known = QAccessible::queryAccessibleInterface(&control);
+  return known ? known->text(QAccessible::Name) : QString();
+}
+
+QString wordsOf(const GuideLabel& label) { return label.speaks() ? label.words() : QString(); }
+
+bool endsSentence(const QString& text) {
+  const QChar last = text.back();
+  return last.isPunct() && last != '"' && last != '\'' && last != ')';
+}
+
+QString asSentence(const QString& text) { return endsSentence(text) ? text : text + '.'; }
+
+void alert(QWidget& widget, [[maybe_unused]] const QString& spoken) {
+#if QT_VERSION >= QT_VERSION_CHECK(6, 8, 0)
+  QAccessibleAnnouncementEvent event(&widget, spoken);
+#else
+  QAccessibleEvent event(&widget, QAccessible::Alert);
+#endif
+  QAccessible::updateAccessibility(&event);
+}
+
+}  // namespace
+
+QString GuideMessage::spoken() const {
+  QStringList sentences;
+  const QString pointing = control.isEmpty() ? QString()
+                                             : QCoreApplication::translate("qz::Guide", "Points at: %1")
+                                                   .arg(control);
+  for (const QString& part : {heading, text, pointing, progress}) {
+    const QString words = part.simplified();
+    if (!words.isEmpty()) sentences.push_back(asSentence(words));
+  }
+  return sentences.join(' ');
+}
+
+GuideMessage messageOf(const GuidePanel& panel, QWidget* control) {
+  return {wordsOf(panel.heading), wordsOf(panel.text), wordsOf(panel.progress),
+          control ? nameOf(*control) : QString()};
+}
+
+void describe(GuidePanel& panel, const GuideMessage& message) {
+  GuideMessage rest = message;
+  rest.heading.clear();
+  panel.setAccessibleName(message.heading);
+  panel.setAccessibleDescription(rest.spoken());
+  for (QPushButton* const button : {&panel.skip, &panel.back, &panel.next}) {
+    button->setAccessibleDescription(button->hasFocus() ? message.spoken() : QString());
+  }
+}
+
+void announceStep(GuidePanel& panel, const GuideMessage& message) {
+  describe(panel, message);
+  alert(panel, message.spoken());
+}
+
+}  // namespace qz::hosts::qt
