@@ -8,6 +8,7 @@
 #include <QGuiApplication>
 #include <QPointer>
 #include <QScreen>
+#include <utility>
 
 #include "hosts/qt/guide_announcement.hpp"
 #include "hosts/qt/guide_panel.hpp"
@@ -52,6 +53,7 @@ class Guide::Stage final : public QObject {
   void moved();
   void beginStep(const GuideMessage& message);
   void appear();
+  void leadFocus();
   void disappear();
   void arrange(bool glides);
   void place(const QRect& target);
@@ -68,6 +70,7 @@ class Guide::Stage final : public QObject {
   Follower targetFollower_{[this] { moved(); }};
   GuideMessage told_;         // empty while there is no step
   QPointer<QWidget> toldOf_;  // the target at that time
+  bool hasLentFocus_ = false;
 };
 
 Guide::Stage::Stage(toolkit::qt::QtToolkit& toolkit, QWidget& form, const GuideOptions& options)
@@ -129,6 +132,7 @@ void Guide::Stage::beginStep(const GuideMessage& message) {
   if (target_) bringControlIntoView(toolkit_, *target_);
   arrange(true);
   appear();
+  leadFocus();
   announceStep(*panel_, message);
 }
 
@@ -146,7 +150,18 @@ void Guide::Stage::appear() {
   if (wasActive && !takesFocus) form_->activateWindow();
 }
 
+// A step without Next asks the user to act on its control. The next step takes the focus back.
+void Guide::Stage::leadFocus() {
+  const bool asksForControl = !panel_->canGoOn() && target_ && toolkit::qt::takesFocus(*target_);
+  if (std::exchange(hasLentFocus_, false) && !asksForControl) return panel_->focus(false);
+  hasLentFocus_ = asksForControl && panel_->hasFocusInside();
+  if (!hasLentFocus_) return;
+  target_->window()->activateWindow();
+  target_->setFocus(Qt::OtherFocusReason);
+}
+
 void Guide::Stage::disappear() {
+  hasLentFocus_ = false;
   told_ = {};
   if (spotlight_) spotlight_->deleteLater();
   spotlight_ = nullptr;
@@ -178,7 +193,8 @@ void Guide::Stage::arrange(bool glides) {
 
 void Guide::Stage::place(const QRect& target) {
   const QRect window(form_->mapToGlobal(QPoint()), form_->size());
-  const QScreen* const shown = QGuiApplication::screenAt((target.isEmpty() ? window : target).center());
+  const QScreen* const shown =
+      QGuiApplication::screenAt((target.isEmpty() ? window : target).center());
   const QScreen& screen = shown ? *shown : *form_->screen();
   const QRect area = panel_->isWindow() ? screen.availableGeometry() : window;
   panel_->setLayoutDirection(form_->layoutDirection());

@@ -40,9 +40,9 @@ void alert(QWidget& widget, [[maybe_unused]] const QString& spoken) {
 
 QString GuideMessage::spoken() const {
   QStringList sentences;
-  const QString pointing = control.isEmpty() ? QString()
-                                             : QCoreApplication::translate("qz::Guide", "Points at: %1")
-                                                   .arg(control);
+  const QString pointing =
+      control.isEmpty() ? QString()
+                        : QCoreApplication::translate("qz::Guide", "Points at: %1").arg(control);
   for (const QString& part : {heading, text, pointing, progress}) {
     const QString words = part.simplified();
     if (!words.isEmpty()) sentences.push_back(asSentence(words));

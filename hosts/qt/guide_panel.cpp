@@ -3,8 +3,7 @@
 
 #include "hosts/qt/guide_panel.hpp"
 
-#include <QCoreApplication>
-#include <QGuiApplication>
+#include <QApplication>
 #include <QPainter>
 #include <algorithm>
 
@@ -18,8 +17,9 @@ namespace qz::hosts::qt {
 
 namespace {
 
-constexpr int letters = 44;      // of the average width, in a line
-constexpr int margin = 14;       // in points
+constexpr int letters = 44;       // of the average width, in a line
+constexpr int panelMargin = 14;   // in points
+constexpr int buttonGap = 8;      // between the buttons
 constexpr int largestImage = 96;  // in points
 
 bool isInside(const GuideOptions& options) {
@@ -84,9 +84,9 @@ void GuidePanel::layOut() {
   for (GuideLabel* const label : {&heading, &text}) {
     label->setWordWrap(true);
     label->setAlignment(Qt::AlignTop | Qt::AlignLeading);
-    label->setContentsMargins(0, 0, 0, margin / 2);
+    label->setContentsMargins(0, 0, 0, panelMargin / 2);
   }
-  grid_.setContentsMargins(margin, margin, margin, margin);
+  grid_.setContentsMargins(panelMargin, panelMargin, panelMargin, panelMargin);
   grid_.setVerticalSpacing(0);
   grid_.addWidget(&picture, 0, 0, 2, 1, Qt::AlignTop);
   grid_.addWidget(&heading, 0, 1);
@@ -94,6 +94,7 @@ void GuidePanel::layOut() {
   grid_.addLayout(&buttons_, 2, 0, 1, 2);
   grid_.setColumnStretch(1, 1);
   grid_.setRowStretch(1, 1);
+  buttons_.setSpacing(buttonGap);
   buttons_.addWidget(&skip);
   buttons_.addWidget(&progress, 1, Qt::AlignCenter);
   buttons_.addWidget(&back);
@@ -114,13 +115,13 @@ void GuidePanel::retire() {
 }
 
 int GuidePanel::widthFor(int bound) const {
-  return std::min(bound, std::max(letters * fontMetrics().averageCharWidth() + 2 * margin,
+  return std::min(bound, std::max(letters * fontMetrics().averageCharWidth() + 2 * panelMargin,
                                   minimumSizeHint().width()));
 }
 
 // A text that is too long for a panel of the usual width makes the panel wider.
 void GuidePanel::fit(const QSize& bounds) {
-  grid_.setHorizontalSpacing(picture.speaks() ? margin : 0);
+  grid_.setHorizontalSpacing(picture.speaks() ? panelMargin : 0);
   grid_.activate();
   int width = widthFor(bounds.width());
   while (grid_.totalHeightForWidth(width) > bounds.height() && width < bounds.width()) {
@@ -144,6 +145,11 @@ void GuidePanel::focus(bool first) {
   (first ? buttons.front() : buttons.back())->setFocus(Qt::TabFocusReason);
 }
 
+bool GuidePanel::hasFocusInside() const {
+  const QWidget* const focused = QApplication::focusWidget();
+  return focused && (focused == this || isAncestorOf(focused));
+}
+
 bool GuidePanel::focusNextPrevChild(bool forward) {
   auto buttons = stops();
   if (!forward) std::reverse(buttons.begin(), buttons.end());
@@ -164,7 +170,8 @@ void GuidePanel::paintEvent(QPaintEvent* event) {
   QDialog::paintEvent(event);
   const int width = toolkit::qt::prefersHighContrast() ? 3 : 2;
   QPainter painter(this);
-  painter.setPen(QPen(guideLineColor(palette()), width, Qt::SolidLine, Qt::SquareCap, Qt::MiterJoin));
+  painter.setPen(
+      QPen(guideLineColor(palette()), width, Qt::SolidLine, Qt::SquareCap, Qt::MiterJoin));
   const double half = width / 2.0;
   painter.drawRect(QRectF(rect()).adjusted(half, half, -half, -half));
 }

@@ -44,6 +44,8 @@ class GuidePanel final : public QDialog {
 
   /// True if the panel has something to show.
   bool speaks() const { return heading.speaks() || text.speaks() || picture.speaks(); }
+  /// True if the user can press Next.
+  bool canGoOn() const { return !next.isHidden() && next.isEnabled(); }
   /// Takes all contents off.
   void clear();
   /// Hides the panel for ever. Commands no longer find its controls.
@@ -52,6 +54,7 @@ class GuidePanel final : public QDialog {
   void fit(const QSize& bounds);
   /// Gives the focus to the first or the last button that takes it, or else to the panel.
   void focus(bool first);
+  bool hasFocusInside() const;
 
   GuideLabel heading{this};
   GuideLabel text{this};

@@ -11,7 +11,7 @@ namespace qz::hosts::qt {
 
 namespace {
 
-constexpr int gap = 8;  // between the target and the panel, in points
+constexpr int distance = 8;  // between the target and the panel, in points
 
 enum class Side : std::uint8_t { right, below, left, above };
 
@@ -29,10 +29,10 @@ QRect placeAt(Side side, const Surroundings& around, const QSize& size) {
   const QRect& target = around.target;
   QRect place(target.topLeft(), size);
   if (around.direction == Qt::RightToLeft) place.moveRight(target.right());
-  if (side == Side::right) place.moveLeft(target.right() + 1 + gap);
-  if (side == Side::below) place.moveTop(target.bottom() + 1 + gap);
-  if (side == Side::left) place.moveRight(target.left() - 1 - gap);
-  if (side == Side::above) place.moveBottom(target.top() - 1 - gap);
+  if (side == Side::right) place.moveLeft(target.right() + 1 + distance);
+  if (side == Side::below) place.moveTop(target.bottom() + 1 + distance);
+  if (side == Side::left) place.moveRight(target.left() - 1 - distance);
+  if (side == Side::above) place.moveBottom(target.top() - 1 - distance);
   return movedInto(around.area, place);
 }
 
@@ -59,9 +59,8 @@ QRect placeBeside(const Surroundings& around, const QSize& size) {
   const auto cost = [&](const QRect& place) {
     return std::tuple(commonArea(place, around.target), commonArea(place, around.window));
   };
-  return *std::min_element(places.begin(), places.end(), [&](const QRect& a, const QRect& b) {
-    return cost(a) < cost(b);
-  });
+  return *std::min_element(places.begin(), places.end(),
+                           [&](const QRect& a, const QRect& b) { return cost(a) < cost(b); });
 }
 
 }  // namespace qz::hosts::qt

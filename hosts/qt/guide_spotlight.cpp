@@ -15,10 +15,10 @@ namespace {
 
 using toolkit::qt::prefersHighContrast;
 
-constexpr int glideTime = 200;           // milliseconds
-constexpr double corner = 4;             // radius in points
-constexpr double visibleContrast = 3;    // that WCAG requires of graphics
-constexpr QColor shade(0, 0, 0, 90);     // over what is dimmed
+constexpr int glideTime = 200;         // milliseconds
+constexpr double corner = 4;           // radius in points
+constexpr double visibleContrast = 3;  // that WCAG requires of graphics
+constexpr QColor shade(0, 0, 0, 90);   // over what is dimmed
 
 int lineWidth() { return prefersHighContrast() ? 5 : 3; }
 

@@ -53,14 +53,15 @@ bool isAt(const QWidget& focused, const QWidget* place) {
 
 GuideTabOrder::GuideTabOrder(QWidget& form, GuidePanel& panel) : form_(&form), panel_(&panel) {
   panel.leave = [this](bool next) { return leave(next); };
-  connect(qApp, &QApplication::focusChanged, this, [this](QWidget*, QWidget* now) { listenTo(now); });
+  connect(qApp, &QApplication::focusChanged, this,
+          [this](QWidget*, QWidget* now) { listenTo(now); });
   listenTo(QApplication::focusWidget());
 }
 
 void GuideTabOrder::listenTo(QWidget* focused) {
   if (focused_) focused_->removeEventFilter(this);
-  const bool isInForm = focused && form_ && panel_ && focused->window() == form_ &&
-                        !panel_->isAncestorOf(focused);
+  const bool isInForm =
+      focused && form_ && panel_ && focused->window() == form_ && !panel_->isAncestorOf(focused);
   focused_ = isInForm ? focused : nullptr;
   if (focused_) focused_->installEventFilter(this);
 }

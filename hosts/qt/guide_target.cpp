@@ -26,8 +26,9 @@ QWidget* controlWithTag(toolkit::Tag tag, toolkit::qt::QtToolkit& toolkit, QWidg
 
 bool isMove(QEvent::Type type) {
   return type == QEvent::Move || type == QEvent::Resize || type == QEvent::Show ||
-         type == QEvent::Hide || type == QEvent::ParentChange || type == QEvent::WindowStateChange ||
-         type == QEvent::LayoutDirectionChange || type == QEvent::FontChange;
+         type == QEvent::Hide || type == QEvent::ParentChange ||
+         type == QEvent::WindowStateChange || type == QEvent::LayoutDirectionChange ||
+         type == QEvent::FontChange;
 }
 
 }  // namespace

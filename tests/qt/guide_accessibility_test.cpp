@@ -44,7 +44,8 @@ struct GuideAccessibility : hosts::Guided {
     for (const auto& said : hosts::announcements) {
       const std::string called = '"' + utf8(said.name) + '"';
       if (said.event == QAccessible::Alert) {
-        lines.push_back("alert: " + roleName(said.role) + ' ' + called + ": " + utf8(said.description));
+        lines.push_back("alert: " + roleName(said.role) + ' ' + called + ": " +
+                        utf8(said.description));
       } else if (said.event == QAccessible::Focus && said.object == QApplication::focusWidget()) {
         lines.push_back("focus: " + roleName(said.role) + ' ' + called);
       } else if (said.event == QAccessible::DescriptionChanged && !said.description.isEmpty() &&
@@ -87,21 +88,21 @@ TEST_F(GuideAccessibility, TellsAStepToAUserWhoIsInTheForm) {
 
 TEST_F(GuideAccessibility, HasNamesAndRoles) {
   show();
-  play((std::string(threeSteps) + "2000 = ((SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_"
-                                  "WITH_SIZE_FOR_OBJECT_ID, YES, \"<b>Now</b> <i>send</i> it\", \"\", 0, 902),"
-                                  "(DISABLE_OBJECT_WITH_ID, 1000), (HIDE_OBJECT_WITH_ID, 906));")
+  play((std::string(threeSteps) +
+        "2000 = ((SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_"
+        "WITH_SIZE_FOR_OBJECT_ID, YES, \"<b>Now</b> <i>send</i> it\", \"\", 0, 902),"
+        "(DISABLE_OBJECT_WITH_ID, 1000), (HIDE_OBJECT_WITH_ID, 906));")
            .c_str());
   EXPECT_EQ(readPanel(),
             (Lines{"Dialog \"Name\": Type your name. Points at: Your name. 1 of 2.",
                    "StaticText \"Name\"", "StaticText \"Type your name\"", "StaticText \"1 of 2\"",
-                   "Button \"Skip\"", "Button \"Back\"",
-                   "Button \"Next\" (focused)"}));
+                   "Button \"Skip\"", "Button \"Back\"", "Button \"Next\" (focused)"}));
   click(panel().next);
-  EXPECT_EQ(readPanel(),
-            (Lines{"Dialog \"Name\": Now send it. Points at: Your name. 1 of 2.",
-                   "StaticText \"Name\"", "StaticText \"Now send it\"", "StaticText \"1 of 2\"",
-                   "Button \"Back\" (disabled)",
-                   "Button \"Next\": Name. Now send it. Points at: Your name. 1 of 2. (focused)"}));
+  EXPECT_EQ(
+      readPanel(),
+      (Lines{"Dialog \"Name\": Now send it. Points at: Your name. 1 of 2.", "StaticText \"Name\"",
+             "StaticText \"Now send it\"", "StaticText \"1 of 2\"", "Button \"Back\" (disabled)",
+             "Button \"Next\": Name. Now send it. Points at: Your name. 1 of 2. (focused)"}));
 }
 
 TEST_F(GuideAccessibility, LeavesNothingBehind) {

@@ -44,6 +44,39 @@ TEST_F(GuideKeyboard, StaysWhereTheUserHasPutItInLaterSteps) {
   EXPECT_EQ(focused(), &remark);
 }
 
+TEST_F(GuideKeyboard, GoesToTheControlThatTheUserIsToPressAndBack) {
+  show();
+  play(
+      "0 = ((SET_TEXT_FOR_OBJECT_ID, Hi, 901));"
+      "2000 = ((SET_TEXT_FOR_OBJECT_ID, \"Press Send\", 901), (SET_TEXT_FOR_OBJECT_ID, 2, 905),"
+      "        (HIDE_OBJECT_WITH_ID, 2000));"
+      "2 = ((SET_TEXT_FOR_OBJECT_ID, Done, 901), (SHOW_OBJECT_WITH_ID, 2000));");
+  press(Qt::Key_Return);
+  EXPECT_EQ(focused(), &send);
+  EXPECT_TRUE(form->isActiveWindow());
+  press(Qt::Key_Space);
+  EXPECT_EQ(panel().heading.text(), "Done");
+  EXPECT_EQ(focused(), &panel().next);
+}
+
+TEST_F(GuideKeyboard, StaysInTheFormWhenTheUserIsToPressAControl) {
+  show();
+  play(
+      "0 = ((SET_TEXT_FOR_OBJECT_ID, Hi, 901));"
+      "2000 = ((SET_TEXT_FOR_OBJECT_ID, \"Press Send\", 901), (SET_TEXT_FOR_OBJECT_ID, 2, 905),"
+      "        (HIDE_OBJECT_WITH_ID, 2000));"
+      "2 = ((SET_TEXT_FOR_OBJECT_ID, Done, 901), (SHOW_OBJECT_WITH_ID, 2000));");
+  form->activateWindow();
+  remark.setFocus();
+  settle();
+  panel().next.click();
+  settle();
+  EXPECT_EQ(focused(), &remark);
+  send.click();
+  settle();
+  EXPECT_EQ(focused(), &remark);
+}
+
 TEST_F(GuideKeyboard, GoesOnWithEnterAndEndsWithEscape) {
   show();
   play(threeSteps);

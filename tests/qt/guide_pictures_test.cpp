@@ -7,6 +7,7 @@
 #include <QPainter>
 #include <QScreen>
 #include <QStyle>
+#include <utility>
 
 #include "examples/qt-host/guided_form.hpp"
 #include "hosts/qt/guide_panel.hpp"
@@ -47,7 +48,7 @@ struct Variant {
 struct GuidePictures : testing::Test {
   std::unique_ptr<GuidedForm> form;
   const QPalette before = QApplication::palette();
-  std::map<int, std::vector<QImage>> taken;  // by their ratios
+  std::vector<QImage> steps;  // of one walk-through
 
   GuidePictures() { qApp->setProperty(toolkit::qt::reducedMotionProperty, true); }
   ~GuidePictures() override {
@@ -93,44 +94,47 @@ struct GuidePictures : testing::Test {
     image.setDevicePixelRatio(ratio);
     image.fill(QColor(96, 125, 139));
     QPainter painter(&image);
-    for (QWidget* const window : {static_cast<QWidget*>(form.get()), static_cast<QWidget*>(&panel())}) {
+    for (QWidget* const window :
+         {static_cast<QWidget*>(form.get()), static_cast<QWidget*>(&panel())}) {
       painter.save();
       painter.translate(window->mapToGlobal(QPoint()) - screen.topLeft());
-      window->render(&painter, QPoint(), QRegion(), QWidget::DrawWindowBackground | QWidget::DrawChildren);
+      window->render(&painter, QPoint(), QRegion(),
+                     QWidget::DrawWindowBackground | QWidget::DrawChildren);
       painter.restore();
     }
     return image;
   }
 
-  /// Remembers what is around the form and the panel.
-  void take(int ratio) {
+  /// Returns what is around the form and the panel.
+  QImage pictureAround(int ratio) const {
     const QRect screen = form->screen()->geometry();
     const QRect part = (onScreen(*form) | onScreen(panel())).adjusted(-20, -20, 20, 20) & screen;
-    const QRect pixels(part.topLeft() * ratio, part.size() * ratio);
-    taken[ratio].push_back(picture(ratio).copy(pixels));
+    QImage image =
+        picture(ratio).copy({(part.topLeft() - screen.topLeft()) * ratio, part.size() * ratio});
+    image.setDevicePixelRatio(1);
+    return image;
   }
 
-  /// Writes all pictures of a ratio side by side into one file.
-  void save(const QString& name, int ratio) {
-    int width = 0;
-    int height = 0;
-    for (const QImage& image : taken[ratio]) {
-      width += image.width();
-      height = std::max(height, image.height());
+  static void save(const QImage& image, const QString& name) {
+    const QDir folder(QT_TESTCASE_BUILDDIR "/guide-pictures");
+    QDir().mkpath(folder.path());
+    EXPECT_TRUE(image.save(folder.filePath(name + ".png")));
+  }
+
+  /// Returns the pictures side by side.
+  static QImage sheetOf(const std::vector<QImage>& images) {
+    QSize size;
+    for (const QImage& image : images) {
+      size = QSize(size.width() + image.width(), std::max(size.height(), image.height()));
     }
-    QImage sheet(width, height, QImage::Format_RGB32);
+    QImage sheet(size, QImage::Format_RGB32);
     sheet.fill(Qt::black);
     QPainter painter(&sheet);
     int x = 0;
-    for (QImage& image : taken[ratio]) {
-      image.setDevicePixelRatio(1);
-      painter.drawImage(x, 0, image);
-      x += image.width();
+    for (const QImage& image : images) {
+      painter.drawImage(std::exchange(x, x + image.width()), 0, image);
     }
-    const QDir folder(QT_TESTCASE_BUILDDIR "/guide-pictures");
-    QDir().mkpath(folder.path());
-    EXPECT_TRUE(sheet.save(folder.filePath(QString("%1-%2x.png").arg(name).arg(ratio))));
-    taken[ratio].clear();
+    return sheet;
   }
 
   /// Expects what must hold at every step; returns whether the guide points at a control.
@@ -154,13 +158,16 @@ struct GuidePictures : testing::Test {
     EXPECT_GE(toolkit::qt::contrast(line, form->palette().color(QPalette::Window)), 3);
   }
 
+  /// Pictures the present step at 1 pixel a point for the sheet, and at 2 as a file of its own.
   void look(const QString& name) {
     if (expectWellPlaced(name)) expectFrame(name);
-    for (const int ratio : {1, 2}) take(ratio);
+    save(pictureAround(2), QString("%1-step-%2-2x").arg(name).arg(steps.size()));
+    steps.push_back(pictureAround(1));
   }
 
   /// Goes through all steps; each is pictured.
   void walk(const QString& name) {
+    steps.clear();
     for (int step = 0; step < 3; ++step) {
       look(name);
       click(panel().next);
@@ -170,7 +177,7 @@ struct GuidePictures : testing::Test {
     look(name);
     click(panel().next);
     EXPECT_FALSE(panel().isVisible());
-    for (const int ratio : {1, 2}) save(name, ratio);
+    save(sheetOf(steps), name + "-1x");
   }
 
   static void click(QWidget& widget) {

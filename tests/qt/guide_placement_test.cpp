@@ -79,7 +79,8 @@ TEST(GuidePlacement, NeverCoversATargetThatLeavesRoom) {
                          area;
     if (target.isEmpty()) continue;
     const QRect window(area.left() + upTo(area.width()), area.top(), 1 + upTo(500), 1 + upTo(500));
-    const QRect place = placeBeside({area, window, target, i % 2 ? Qt::LeftToRight : Qt::RightToLeft}, panel);
+    const QRect place =
+        placeBeside({area, window, target, i % 2 ? Qt::LeftToRight : Qt::RightToLeft}, panel);
     ASSERT_TRUE(area.contains(place));
     ASSERT_EQ(place.size(), panel);
     const int beside = std::max(target.left() - area.left(), area.right() - target.right());

@@ -28,7 +28,8 @@ struct Guides : hosts::Guided {
     const QRect near = onScreen(control).adjusted(-20, -20, 20, 20);
     EXPECT_TRUE(place.intersects(near)) << "it is next to the control";
     ASSERT_TRUE(spotlight());
-    EXPECT_TRUE(spotlight()->lit().contains({control.mapTo(control.window(), QPoint()), control.size()}));
+    EXPECT_TRUE(
+        spotlight()->lit().contains({control.mapTo(control.window(), QPoint()), control.size()}));
   }
 };
 
@@ -79,8 +80,9 @@ TEST_F(Guides, DoNotAppearInAWalkThroughThatDoesNotUseThem) {
 
 TEST_F(Guides, HaveTheTagsThatTheHostChooses) {
   show({.tags = {.heading = 50, .target = 51, .next = 52}});
-  play("0 = ((SET_TEXT_FOR_OBJECT_ID, Hello, 50), (SET_TEXT_FOR_OBJECT_ID, 2, 51));"
-       "52 = ((SET_TEXT_FOR_OBJECT_ID, Bye, 50), (HIDE_OBJECT_WITH_ID, 1000));");
+  play(
+      "0 = ((SET_TEXT_FOR_OBJECT_ID, Hello, 50), (SET_TEXT_FOR_OBJECT_ID, 2, 51));"
+      "52 = ((SET_TEXT_FOR_OBJECT_ID, Bye, 50), (HIDE_OBJECT_WITH_ID, 1000));");
   EXPECT_EQ(panel().heading.text(), "Hello");
   EXPECT_EQ(guide->target(), &send);
   click(panel().next);
@@ -122,17 +124,19 @@ TEST_F(Guides, GoToTheMiddleWhileTheirControlIsHiddenOrGone) {
 
 TEST_F(Guides, PointAtTheControlThatHasTheTagAtThatMoment) {
   show();
-  play("0 = ((SET_TEXT_FOR_OBJECT_ID, Hi, 901), (SET_TAG_FOR_OBJECT_ID, 7, 2),"
-       "     (SET_TAG_FOR_OBJECT_ID, 2, 3), (SET_TEXT_FOR_OBJECT_ID, 2, 905),"
-       "     (SET_TAG_FOR_OBJECT_ID, 8, 2));");
+  play(
+      "0 = ((SET_TEXT_FOR_OBJECT_ID, Hi, 901), (SET_TAG_FOR_OBJECT_ID, 7, 2),"
+      "     (SET_TAG_FOR_OBJECT_ID, 2, 3), (SET_TEXT_FOR_OBJECT_ID, 2, 905),"
+      "     (SET_TAG_FOR_OBJECT_ID, 8, 2));");
   EXPECT_EQ(guide->target(), &remark);
 }
 
 TEST_F(Guides, SayInTheLogWhyTheyPointAtNothing) {
   show();
-  play("0 = ((SET_TEXT_FOR_OBJECT_ID, Hi, 901), (SET_TEXT_FOR_OBJECT_ID, 2, 905));"
-       "2000 = ((SET_TEXT_FOR_OBJECT_ID, send, 905)); 1000 = ((SET_TEXT_FOR_OBJECT_ID, 77, 905));"
-       "906 = ((SET_TEXT_FOR_OBJECT_ID, 901, 905));");
+  play(
+      "0 = ((SET_TEXT_FOR_OBJECT_ID, Hi, 901), (SET_TEXT_FOR_OBJECT_ID, 2, 905));"
+      "2000 = ((SET_TEXT_FOR_OBJECT_ID, send, 905)); 1000 = ((SET_TEXT_FOR_OBJECT_ID, 77, 905));"
+      "906 = ((SET_TEXT_FOR_OBJECT_ID, 901, 905));");
   for (QPushButton* const button : {&panel().next, &panel().back, &panel().skip}) {
     click(*button);
     EXPECT_EQ(guide->target(), nullptr);
@@ -181,7 +185,8 @@ TEST_F(Guides, MoveNothingInASplitterThatIsTheForm) {
     splitter.show();
     settle();
     const auto before = geometriesIn(splitter);
-    guide = std::make_unique<hosts::qt::Guide>(toolkit, splitter, GuideOptions{.insideWindow = inside});
+    guide =
+        std::make_unique<hosts::qt::Guide>(toolkit, splitter, GuideOptions{.insideWindow = inside});
     std::ofstream(directory.filePath("script.plist").toStdString()) << "{" << threeSteps << "}";
     ASSERT_TRUE(walkThrough.play("script.plist", splitter));
     settle();
@@ -278,7 +283,8 @@ TEST_F(Guides, GrowWiderForLongTextsAndStayOnTheScreen) {
   show();
   std::string text;
   for (int i = 0; i < 300; ++i) text += "sentence ";
-  play(("0 = ((SET_TEXT_FOR_OBJECT_ID, \"" + text + "\", 902), (SET_TEXT_FOR_OBJECT_ID, 1, 905));").c_str());
+  play(("0 = ((SET_TEXT_FOR_OBJECT_ID, \"" + text + "\", 902), (SET_TEXT_FOR_OBJECT_ID, 1, 905));")
+           .c_str());
   EXPECT_TRUE(panel().screen()->availableGeometry().contains(onScreen(panel())));
   EXPECT_GE(panel().text.height(), panel().text.heightForWidth(panel().text.width()))
       << "all of it is visible";

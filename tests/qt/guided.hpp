@@ -22,9 +22,9 @@ struct Guided : testing::Test {
   QTemporaryDir directory;
   toolkit::qt::QtToolkit toolkit;
   std::unique_ptr<QWidget> form = std::make_unique<QWidget>();
-  QLineEdit& name = *new QLineEdit(form.get());      // tag 1
+  QLineEdit& name = *new QLineEdit(form.get());               // tag 1
   QPushButton& send = *new QPushButton("&Send", form.get());  // tag 2
-  QLineEdit& remark = *new QLineEdit(form.get());    // tag 3
+  QLineEdit& remark = *new QLineEdit(form.get());             // tag 3
   std::vector<std::string> log;
   std::unique_ptr<qt::Guide> guide;
   qt::WalkThrough walkThrough{toolkit};
@@ -37,8 +37,8 @@ struct Guided : testing::Test {
     });
     auto* const column = new QVBoxLayout(form.get());
     int tag = 0;
-    for (QWidget* const widget :
-         {static_cast<QWidget*>(&name), static_cast<QWidget*>(&send), static_cast<QWidget*>(&remark)}) {
+    for (QWidget* const widget : {static_cast<QWidget*>(&name), static_cast<QWidget*>(&send),
+                                  static_cast<QWidget*>(&remark)}) {
       column->addWidget(widget);
       widget->setProperty("qzTag", ++tag);
     }

@@ -5,3 +5,9 @@ qz_tests(qt qz::qt_driver qz::engine qz::tools qt-host-forms Qt6::Test)
 target_sources(qt-tests PRIVATE qt/main.cpp qt/announcements.cpp)
 set_target_properties(qt-tests PROPERTIES AUTOUIC ON)
 qz_scenario_tests(qt QT_QPA_PLATFORM=offscreen)
+
+# The guide on a screen that is hardly larger than the example's form, with room for a panel beside its fields.
+add_test(NAME qt:GuidePictures.OnASmallScreen
+  COMMAND qt-tests --gtest_filter=GuidePictures.ShowTheEdgesOfTheScreen)
+set_tests_properties(qt:GuidePictures.OnASmallScreen PROPERTIES ENVIRONMENT
+  "QT_QPA_PLATFORM=offscreen:configfile=${CMAKE_CURRENT_SOURCE_DIR}/data/small-screen.json;${qz_leaks}")

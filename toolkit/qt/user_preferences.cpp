@@ -10,7 +10,7 @@ namespace qz::toolkit::qt {
 
 namespace {
 
-bool isSet(const QByteArray& value) { return !value.isEmpty() && value != "0"; }
+bool isSet(const QByteArray& value) { return !value.isEmpty() && value != "0" && value != "false"; }
 
 bool isWanted(const char* property, const char* variable) {
   return isSet(qApp->property(property).toByteArray()) || isSet(qgetenv(variable));

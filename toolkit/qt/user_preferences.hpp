@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // What users want of every program. Qt 6.4 does not report these settings of the desktop, so the
 // host or the user sets a dynamic property of the application or an environment variable to
-// anything but "0".
+// anything but 0 or false.
 #pragma once
 
 namespace qz::toolkit::qt {

@@ -37,7 +37,8 @@ struct GuideOptions {
   /// Whether the rest of the window is dimmed. With high contrast nothing is dimmed.
   bool dimming = true;
   /// Whether the panel takes the keyboard focus when it appears, if the form is the active window.
-  /// Later steps leave the focus where the user has put it.
+  /// Later steps leave the focus where the user has put it. But while a step has no Next, because
+  /// the user is to press the control itself, the control has the focus that the panel had.
   bool takesFocus = true;
   /// Whether the panel comes right after the control in the order of the Tab key. Otherwise Tab
   /// stays within the panel or within the form.
