@@ -52,8 +52,9 @@ class Guide::Stage final : public QObject {
   void update();
   void moved();
   void beginStep(const GuideMessage& message);
-  void appear();
-  void leadFocus();
+  bool appear();
+  void leadFocus(bool isInPanel);
+  void returnFocus();
   void disappear();
   void arrange(bool glides);
   void place(const QRect& target);
@@ -68,9 +69,11 @@ class Guide::Stage final : public QObject {
   std::unique_ptr<GuideTabOrder> tabOrder_;  // null if the host does not want it
   Follower formFollower_{[this] { moved(); }};
   Follower targetFollower_{[this] { moved(); }};
-  GuideMessage told_;         // empty while there is no step
-  QPointer<QWidget> toldOf_;  // the target at that time
-  bool hasLentFocus_ = false;
+  GuideMessage told_;            // empty while there is no step
+  QPointer<QWidget> toldOf_;     // the target at that time
+  QPointer<QWidget> formFocus_;  // the widget that had the form's focus before the guide appeared
+  QPointer<QWidget> lentTo_;     // the control that last got the focus from the panel
+  bool hasLentFocus_ = false;    // in the present step
 };
 
 Guide::Stage::Stage(toolkit::qt::QtToolkit& toolkit, QWidget& form, const GuideOptions& options)
@@ -131,43 +134,54 @@ void Guide::Stage::beginStep(const GuideMessage& message) {
   toldOf_ = target_;
   if (target_) bringControlIntoView(toolkit_, *target_);
   arrange(true);
-  appear();
-  leadFocus();
+  leadFocus(appear());
   announceStep(*panel_, message);
 }
 
-// Some desktops activate every new window.
-void Guide::Stage::appear() {
+// Gives YES if the panel is about to have the focus. Some desktops activate every new window.
+bool Guide::Stage::appear() {
   spotlight_->show();
   spotlight_->raise();
-  if (panel_->isVisible()) return;
+  if (panel_->isVisible()) return panel_->hasFocusInside();
   const bool wasActive = form_->isActiveWindow();
   const bool takesFocus = options_.takesFocus && wasActive;
+  formFocus_ = form_->focusWidget();
   panel_->setAttribute(Qt::WA_ShowWithoutActivating, !takesFocus);
   panel_->show();
   if (!panel_->isWindow()) panel_->raise();
   if (takesFocus) panel_->focus(false);
   if (wasActive && !takesFocus) form_->activateWindow();
+  return takesFocus;
 }
 
 // A step without Next asks the user to act on its control. The next step takes the focus back.
-void Guide::Stage::leadFocus() {
+void Guide::Stage::leadFocus(bool isInPanel) {
   const bool asksForControl = !panel_->canGoOn() && target_ && toolkit::qt::takesFocus(*target_);
   if (std::exchange(hasLentFocus_, false) && !asksForControl) return panel_->focus(false);
-  hasLentFocus_ = asksForControl && panel_->hasFocusInside();
+  hasLentFocus_ = asksForControl && isInPanel;
   if (!hasLentFocus_) return;
   target_->window()->activateWindow();
   target_->setFocus(Qt::OtherFocusReason);
+  lentTo_ = target_;
+}
+
+// The user's own choice of a control with the focus stays.
+void Guide::Stage::returnFocus() {
+  const QWidget* const now = form_ ? form_->focusWidget() : nullptr;
+  const bool isOurs = now && (now == lentTo_ || panel_->isAncestorOf(now));
+  if (isOurs && formFocus_) formFocus_->setFocus(Qt::OtherFocusReason);
+  toolkit::qt::giveFocusAway(*panel_);  // if the form has no other
+  lentTo_ = nullptr;
+  hasLentFocus_ = false;
 }
 
 void Guide::Stage::disappear() {
-  hasLentFocus_ = false;
   told_ = {};
   if (spotlight_) spotlight_->deleteLater();
   spotlight_ = nullptr;
   if (!panel_ || panel_->isHidden()) return;
   const bool wasActive = panel_->isWindow() && panel_->isActiveWindow();
-  toolkit::qt::giveFocusAway(*panel_);
+  returnFocus();
   panel_->hide();
   describe(*panel_, {});
   if (wasActive && form_ && form_->isVisible()) form_->activateWindow();

@@ -30,7 +30,11 @@ QString translated(const char* word) { return QCoreApplication::translate("qz::G
 
 QFont headingFont(QFont font) {
   font.setBold(true);
-  font.setPointSizeF(font.pointSizeF() * 1.2);
+  if (font.pixelSize() > 0) {
+    font.setPixelSize(font.pixelSize() * 6 / 5);
+  } else {
+    font.setPointSizeF(font.pointSizeF() * 1.2);
+  }
   return font;
 }
 
@@ -78,7 +82,6 @@ void GuidePanel::setUp(QWidget& widget, const char* name, toolkit::Tag tag) {
 
 void GuidePanel::layOut() {
   target.hide();
-  heading.setFont(headingFont(font()));
   picture.setProperty(toolkit::qt::imageViewProperty, true);
   picture.setMaximumSize(largestImage, largestImage);
   for (GuideLabel* const label : {&heading, &text}) {
@@ -121,6 +124,7 @@ int GuidePanel::widthFor(int bound) const {
 
 // A text that is too long for a panel of the usual width makes the panel wider.
 void GuidePanel::fit(const QSize& bounds) {
+  heading.setFont(headingFont(font()));
   grid_.setHorizontalSpacing(picture.speaks() ? panelMargin : 0);
   grid_.activate();
   int width = widthFor(bounds.width());

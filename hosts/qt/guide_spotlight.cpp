@@ -54,9 +54,9 @@ QRect Spotlight::around(const QRect& control, const QRect& window) {
 
 void Spotlight::light(const QRect& rect, bool glides) {
   setGeometry(parentWidget()->rect());
+  if (rect == lit_) return;
   const bool jumps = !glides || now_.isEmpty() || rect.isEmpty() ||
                      toolkit::qt::prefersReducedMotion() || !isVisible();
-  if (rect == lit_ && !jumps) return;
   lit_ = rect;
   glide_.stop();
   if (jumps) {

@@ -140,6 +140,24 @@ TEST_F(GuideKeyboard, FindsThePanelRightAfterTheControlInTheTabOrder) {
   }
 }
 
+TEST_F(GuideKeyboard, IsWhereItWasAtTheEnd) {
+  for (const bool inside : {false, true}) {
+    show({.insideWindow = inside});
+    remark.setFocus();
+    play(
+        "0 = ((SET_TEXT_FOR_OBJECT_ID, Hi, 901), (SET_TEXT_FOR_OBJECT_ID, 2, 905),"
+        "     (HIDE_OBJECT_WITH_ID, 2000)); 2 = (TERMINATE_PARSER); 906 = (TERMINATE_PARSER);");
+    EXPECT_EQ(focused(), &send) << "the user is to press it";
+    press(Qt::Key_Space);
+    EXPECT_FALSE(walkThrough.engine());
+    EXPECT_EQ(focused(), &remark);
+    play("0 = ((SET_TEXT_FOR_OBJECT_ID, Hi, 901)); 906 = (TERMINATE_PARSER);");
+    press(Qt::Key_Escape);
+    EXPECT_FALSE(walkThrough.engine());
+    EXPECT_EQ(focused(), &remark);
+  }
+}
+
 TEST_F(GuideKeyboard, LeavesOutButtonsThatCannotBePressed) {
   show();
   play(threeSteps);

@@ -250,10 +250,13 @@ TEST_F(Guides, FollowAControlIntoAFloatingDock) {
 
 TEST_F(Guides, KeepTheirControlsWhenOnlyDirectSubviewsAreAdopted) {
   walkThrough.setAdoption({.reading = toolkit::qt::Adoption::Reading::directSubviews});
-  show();
-  play(threeSteps);
-  expectBeside(name);
-  EXPECT_EQ(log, Lines{});
+  for (const bool inside : {false, true}) {
+    show({.insideWindow = inside});
+    play(threeSteps);
+    EXPECT_EQ(panel().heading.text(), "Name");
+    EXPECT_EQ(guide->target(), &name);
+    EXPECT_EQ(log, Lines{});
+  }
 }
 
 TEST_F(Guides, AreClearedByAHostThatRestoresOnlyTags) {
@@ -298,6 +301,110 @@ TEST_F(Guides, MirrorThemselvesInRightToLeftForms) {
   EXPECT_EQ(panel().layoutDirection(), Qt::RightToLeft);
   EXPECT_LT(panel().next.x(), panel().skip.x());
   EXPECT_LT(onScreen(panel()).right(), onScreen(name).left());
+}
+
+int differingPixels(const QImage& a, const QImage& b) {
+  int count = 0;
+  for (int y = 0; y < a.height(); ++y) {
+    for (int x = 0; x < a.width(); ++x) count += a.pixel(x, y) != b.pixel(x, y);
+  }
+  return count;
+}
+
+TEST_F(Guides, DimAndFrameOnlyAsTheHostWantsIt) {
+  const struct {
+    bool frame;
+    bool dimming;
+    bool hasHighContrast;
+    bool isDimmed;
+  } cases[] = {{true, true, false, true},  {true, false, false, false},
+               {false, true, false, true}, {false, false, false, false},
+               {true, true, true, false},  {false, true, true, false}};
+  for (const auto& c : cases) {
+    qApp->setProperty(toolkit::qt::highContrastProperty, c.hasHighContrast);
+    show({.frame = c.frame, .dimming = c.dimming, .takesFocus = false});
+    walkThrough.end();
+    settle();
+    const QImage before = form->grab().toImage();
+    play(threeSteps);
+    const QImage after = form->grab().toImage();
+    const QPoint corner(2, form->height() - 3);
+    const QPoint edge(spotlight()->lit().left(), spotlight()->lit().center().y());
+    EXPECT_EQ(after.pixelColor(corner).lightness() < before.pixelColor(corner).lightness() - 40,
+              c.isDimmed);
+    EXPECT_EQ(after.pixelColor(edge) == hosts::qt::guideLineColor(form->palette()), c.frame);
+    EXPECT_EQ(after.pixelColor(name.geometry().center()),
+              before.pixelColor(name.geometry().center()));
+    EXPECT_EQ(differingPixels(before, after) == 0, !c.frame && !c.isDimmed);
+  }
+  qApp->setProperty(toolkit::qt::highContrastProperty, QVariant());
+}
+
+TEST_F(Guides, LetTheLightGlideUnlessTheUserWantsNoMotion) {
+  const auto edgeOf = [this](const QRect& lit) {
+    return form->grab().toImage().pixelColor(lit.left(), lit.center().y());
+  };
+  const QColor line = hosts::qt::guideLineColor(form->palette());
+  for (const bool moves : {true, false}) {
+    qApp->setProperty(toolkit::qt::reducedMotionProperty, !moves);
+    show();
+    play(threeSteps);
+    const QRect first = spotlight()->lit();
+    EXPECT_EQ(edgeOf(first), line);
+    click(panel().next);
+    const QRect second = spotlight()->lit();
+    EXPECT_NE(first, second);
+    EXPECT_EQ(edgeOf(second) == line, !moves) << "it is on its way";
+    EXPECT_TRUE(QTest::qWaitFor([&] { return edgeOf(second) == line; }));
+  }
+}
+
+TEST_F(Guides, LetClicksThroughToTheForm) {
+  show();
+  play(
+      "0 = ((SET_TEXT_FOR_OBJECT_ID, Hi, 901), (SET_TEXT_FOR_OBJECT_ID, 1, 905));"
+      "2 = ((SET_TEXT_FOR_OBJECT_ID, Sent, 901));");
+  QWidget* const hit = form->childAt(send.geometry().center());
+  EXPECT_EQ(hit, &send);
+  QTest::mouseClick(form->windowHandle(), Qt::LeftButton, {}, send.geometry().center());
+  settle();
+  EXPECT_EQ(panel().heading.text(), "Sent");
+}
+
+TEST_F(Guides, BelongToASheetToo) {
+  QWidget host;
+  host.show();
+  guide = std::make_unique<hosts::qt::Guide>(toolkit, *form);
+  std::ofstream(directory.filePath("script.plist").toStdString()) << "{" << threeSteps << "}";
+  ASSERT_TRUE(walkThrough.playInSheet("script.plist", *form, host));
+  settle();
+  expectBeside(name);
+  click(panel().next);
+  expectBeside(send);
+  click(panel().skip);
+  EXPECT_FALSE(form->isVisible());
+  EXPECT_FALSE(panel().isVisible());
+}
+
+TEST_F(Guides, SkipWhenTheUserClosesTheirPanel) {
+  show();
+  play(threeSteps);
+  EXPECT_FALSE(panel().close());
+  settle();
+  EXPECT_FALSE(walkThrough.engine());
+  EXPECT_FALSE(panel().isVisible());
+}
+
+TEST_F(Guides, AreHiddenWhileTheFormIsMinimized) {
+  show();
+  play(threeSteps);
+  form->setWindowState(Qt::WindowMinimized);
+  settle();
+  EXPECT_FALSE(panel().isVisible());
+  form->setWindowState(Qt::WindowNoState);
+  settle();
+  EXPECT_TRUE(panel().isVisible());
+  EXPECT_TRUE(walkThrough.engine());
 }
 
 TEST_F(Guides, HideWithTheForm) {

@@ -50,9 +50,7 @@ bool isReached(const QObject& object, const std::vector<QWidget*>& controls) {
   return action && showsOneOf(*action, controls);
 }
 
-bool isPanel(const QWidget& widget) {
-  return widget.isWindow() && widget.property(panelProperty).toBool();
-}
+bool isPanel(const QWidget& widget) { return widget.property(panelProperty).toBool(); }
 
 // True if the widget is hidden for itself, and not as a page that is not the current one.
 bool isKeptHidden(const QWidget& widget) {

@@ -33,8 +33,8 @@ inline constexpr const char* imageViewProperty = "qzImageView";
 /// there is one.
 inline constexpr const char* pressProperty = "qzPress";
 
-/// The dynamic property that makes a child window of a window a part of it, if it is true: the
-/// child window's controls are controls of the adopted window.
+/// The dynamic property that makes a child of a window a part of the adopted window if it is true,
+/// even if the child is a window too: its widgets with tags are controls.
 inline constexpr const char* panelProperty = "qzPanel";
 
 /// True if `child`, a child of a widget, is a subview: a widget that is not a window.
