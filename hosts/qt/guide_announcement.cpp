@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // Qt 6.8 can announce a text. Before that, a changed dialog is announced as an alert, as Qt's own
-// message boxes are.
+// message boxes are. On Linux Qt passes no alerts on, but all changes of descriptions.
 
 #include "hosts/qt/guide_announcement.hpp"
 
@@ -26,6 +26,11 @@ bool endsSentence(const QString& text) {
 }
 
 QString asSentence(const QString& text) { return endsSentence(text) ? text : text + '.'; }
+
+// Qt announces even a description that stays the same.
+void describeWidget(QWidget& widget, const QString& description) {
+  if (widget.accessibleDescription() != description) widget.setAccessibleDescription(description);
+}
 
 void alert(QWidget& widget, [[maybe_unused]] const QString& spoken) {
 #if QT_VERSION >= QT_VERSION_CHECK(6, 8, 0)
@@ -59,9 +64,9 @@ void describe(GuidePanel& panel, const GuideMessage& message) {
   GuideMessage rest = message;
   rest.heading.clear();
   panel.setAccessibleName(message.heading);
-  panel.setAccessibleDescription(rest.spoken());
+  describeWidget(panel, rest.spoken());
   for (QPushButton* const button : {&panel.skip, &panel.back, &panel.next}) {
-    button->setAccessibleDescription(button->hasFocus() ? message.spoken() : QString());
+    describeWidget(*button, button->hasFocus() ? message.spoken() : QString());
   }
 }
 

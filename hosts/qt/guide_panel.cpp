@@ -59,9 +59,9 @@ GuidePanel::GuidePanel(QWidget& form, const GuideOptions& options)
   setUp(skip, "qz-guide-skip", tags.skip);
   setUp(back, "qz-guide-back", tags.back);
   setUp(next, "qz-guide-next", tags.next);
-  skip.setText(translated("Skip"));
-  back.setText(translated("Back"));
-  next.setText(translated("Next"));
+  skip.setText(translated(QT_TRANSLATE_NOOP("qz::Guide", "Skip")));
+  back.setText(translated(QT_TRANSLATE_NOOP("qz::Guide", "Back")));
+  next.setText(translated(QT_TRANSLATE_NOOP("qz::Guide", "Next")));
   for (QPushButton* const button : {&skip, &back, &next}) button->setAutoDefault(options.enter);
   next.setDefault(options.enter);
   layOut();
