@@ -11,9 +11,9 @@
 #include <QPushButton>
 #include <QTemporaryDir>
 #include <QTextEdit>
-#include <vector>
 
 #include "qz/toolkit/system_files.hpp"
+#include "tests/qt/announcements.hpp"
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/image_look.hpp"
 #include "toolkit/qt/images.hpp"
@@ -27,25 +27,7 @@ namespace {
 using namespace toolkit;
 using namespace toolkit::qt;
 
-struct Announcement {
-  QObject* object;
-  QAccessible::Event event;
-};
-std::vector<Announcement> announcements;
-
-}  // namespace
-
-}  // namespace qz
-
-// Replaces Qt's own function in this program. Qt passes announcements on only while assistive
-// technology is connected, which needs a desktop's message bus.
-void QAccessible::updateAccessibility(QAccessibleEvent* event) {
-  qz::announcements.push_back({event->object(), event->type()});
-}
-
-namespace qz {
-
-namespace {
+using hosts::announcements;
 
 class Accessibility : public ::testing::Test {
  protected:

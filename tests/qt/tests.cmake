@@ -2,7 +2,7 @@
 # The tests of the Qt toolkit.
 find_package(Qt6 6.4 REQUIRED COMPONENTS Test)
 qz_tests(qt qz::qt_driver qz::engine qz::tools qt-host-forms Qt6::Test)
-target_sources(qt-tests PRIVATE qt/main.cpp)
+target_sources(qt-tests PRIVATE qt/main.cpp qt/announcements.cpp)
 set_target_properties(qt-tests PROPERTIES AUTOUIC ON)
 qz_scenario_tests(qt QT_QPA_PLATFORM=offscreen)
 
@@ -14,3 +14,8 @@ if(TARGET Qt6::UiTools)
   set_target_properties(foreign-forms PROPERTIES AUTOMOC ON)
   target_link_libraries(foreign-forms PRIVATE qz::qt_host Qt6::UiTools Qt6::Test qz_private)
 endif()
+# The guide on a screen that is hardly larger than the example's form, with room for a panel beside its fields.
+add_test(NAME qt:GuidePictures.OnASmallScreen
+  COMMAND qt-tests --gtest_filter=GuidePictures.ShowTheEdgesOfTheScreen)
+set_tests_properties(qt:GuidePictures.OnASmallScreen PROPERTIES ENVIRONMENT
+  "QT_QPA_PLATFORM=offscreen:configfile=${CMAKE_CURRENT_SOURCE_DIR}/data/small-screen.json;${qz_leaks}")

@@ -42,6 +42,8 @@ bool isReached(const QObject& object, const std::vector<QWidget*>& controls) {
   return action && showsOneOf(*action, controls);
 }
 
+bool isPanel(const QWidget& widget) { return widget.property(panelProperty).toBool(); }
+
 // True if the widget is hidden for itself, and not as a page that is not the current one.
 bool isKeptHidden(const QWidget& widget) {
   return widget.isHidden() && !qobject_cast<const QStackedWidget*>(widget.parentWidget());
@@ -51,7 +53,8 @@ bool isKeptHidden(const QWidget& widget) {
 
 bool isPartOfForm(const QWidget& widget) {
   return !widget.isWindow() || qobject_cast<const QDockWidget*>(&widget) ||
-         qobject_cast<const QToolBar*>(&widget) || qobject_cast<const QMenu*>(&widget);
+         qobject_cast<const QToolBar*>(&widget) || qobject_cast<const QMenu*>(&widget) ||
+         isPanel(widget);
 }
 
 AdoptedForm::AdoptedForm(QWidget& window, Adoption how) : window_(&window), how_(std::move(how)) {
@@ -83,6 +86,14 @@ void AdoptedForm::list(std::vector<QWidget*>& found) const {
   if (how_.reading == Adoption::Reading::everyTaggedWidget) return addTagged(*window_, found);
   for (QObject* const child : around->children()) {
     if (isSubview(child)) found.push_back(static_cast<QWidget*>(child));
+  }
+  addTaggedInPanels(found);
+}
+
+void AdoptedForm::addTaggedInPanels(std::vector<QWidget*>& found) const {
+  for (const QObject* const child : window_->children()) {
+    const auto* const panel = child->isWidgetType() ? static_cast<const QWidget*>(child) : nullptr;
+    if (panel && isPanel(*panel)) addTagged(*panel, found);
   }
 }
 

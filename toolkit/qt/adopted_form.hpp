@@ -18,7 +18,7 @@ class QAction;
 namespace qz::toolkit::qt {
 
 /// True if `widget`, a child of a widget of a form, belongs to the form too: if it is not a window,
-/// or if it is a dock, a tool bar or a menu.
+/// if it is a dock, a tool bar or a menu, or if it is marked as a panel.
 bool isPartOfForm(const QWidget& widget);
 
 /// How much of a control's change the user is to see.
@@ -57,6 +57,7 @@ class AdoptedForm final : public QObject {
   void attend(QWidget& widget, Notice notice);
   void addTagged(const QWidget& around, std::vector<QWidget*>& found) const;
   void addTaggedFrom(QWidget& widget, std::vector<QWidget*>& found) const;
+  void addTaggedInPanels(std::vector<QWidget*>& found) const;
   bool isTagged(const QObject& object) const;
   std::optional<Tag> namedTag(const QObject& object) const;
   std::string complaintAbout(const QObject& object) const;
