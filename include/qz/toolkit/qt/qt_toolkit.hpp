@@ -8,8 +8,8 @@
 #include "qz/toolkit/qt/application.hpp"
 #include "qz/toolkit/qt/calls.hpp"
 #include "qz/toolkit/qt/clock.hpp"
+#include "qz/toolkit/qt/files.hpp"
 #include "qz/toolkit/qt/log.hpp"
-#include "qz/toolkit/system_files.hpp"
 #include "qz/toolkit/toolkit.hpp"
 
 namespace qz::toolkit::qt {
@@ -27,7 +27,7 @@ class QtToolkit final : public Toolkit {
   RunLoop& runLoop() override;
   Images& images() override;
   Fonts& fonts() override;
-  SystemFiles& files() override;
+  QtFiles& files() override;
   QtLog& log() override;
 
   /// Handles exceptions that escape from an action, a timer or a sheet's delegate.
