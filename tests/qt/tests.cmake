@@ -2,8 +2,8 @@
 # The tests of the Qt toolkit.
 find_package(Qt6 6.4 REQUIRED COMPONENTS Test)
 qz_tests(qt qz::qt_driver qz::engine qz::tools qt-host-forms Qt6::Test)
-target_sources(qt-tests PRIVATE qt/main.cpp qt/announcements.cpp)
-set_target_properties(qt-tests PROPERTIES AUTOUIC ON)
+target_sources(qt-tests PRIVATE qt/main.cpp qt/announcements.cpp qt/resources/resources.qrc)
+set_target_properties(qt-tests PROPERTIES AUTOUIC ON AUTORCC ON)
 qz_scenario_tests(qt QT_QPA_PLATFORM=offscreen)
 
 # Needs forms and Qt's form loader, which scripts/foreign-forms installs.

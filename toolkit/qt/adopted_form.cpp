@@ -169,8 +169,14 @@ std::vector<Sighting> AdoptedForm::look(QWidget& widget, Notice notice) const {
 }
 
 void AdoptedForm::changed(QWidget* widget, Notice notice, const std::vector<Sighting>& before) {
-  if (widget) attend(*widget, notice);
+  if (widget && !isOver_) attend(*widget, notice);
   trace_.note(before);
+  if (isOver_) trace_.undo();
+}
+
+void AdoptedForm::restore() {
+  isOver_ = true;
+  trace_.undo();
 }
 
 void AdoptedForm::attend(QWidget& widget, Notice notice) {

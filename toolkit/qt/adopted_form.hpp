@@ -50,8 +50,9 @@ class AdoptedForm final : public QObject {
   /// each control, so that it does not drag back a user who has gone elsewhere. Remembers what has
   /// changed since `before`.
   void changed(QWidget* widget, Notice notice, const std::vector<Sighting>& before);
-  /// Restores what has been remembered.
-  void restore() { trace_.undo(); }
+  /// Restores what has been remembered, and from now on every change at once: a list may still
+  /// run.
+  void restore();
 
  private:
   void attend(QWidget& widget, Notice notice);
@@ -66,6 +67,7 @@ class AdoptedForm final : public QObject {
   Adoption how_;
   std::set<const QWidget*> flashed_;
   Trace trace_;
+  bool isOver_ = false;
 };
 
 }  // namespace qz::toolkit::qt

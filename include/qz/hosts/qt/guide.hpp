@@ -10,6 +10,7 @@
 #include <memory>
 #include <optional>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/qt/qt_toolkit.hpp"
 #include "qz/toolkit/tag.hpp"
 
@@ -55,7 +56,7 @@ struct GuideOptions {
 /// A panel over a form. It appears when a command gives it a heading, a text or a picture, and
 /// disappears when it has none, as at the end of a walk-through, which restores what it was. It
 /// moves with the form and the control, and never changes the form's layout.
-class Guide {
+class QZ_API Guide {
  public:
   /// Makes the panel, hidden. `toolkit` must outlive this object, and `form`, a top-level widget,
   /// need not. Make it before the walk-through begins.
