@@ -10,6 +10,8 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
+
 namespace qz::hosts::qt {
 
 /// A script to play: where its file is, or the bytes of the file. Made from what a host has:
