@@ -459,8 +459,8 @@ struct Tour {
   hosts::qt::WalkThrough walkThrough{toolkit};
   std::unique_ptr<hosts::qt::Guide> guide;
 
-  Tour(toolkit::qt::QtToolkit& toolkit, std::string script, bool inside)
-      : toolkit(toolkit), script(std::move(script)) {
+  Tour(toolkit::qt::QtToolkit& used, std::string played, bool inside)
+      : toolkit(used), script(std::move(played)) {
     first->setProperty("qzTag", 1);
     second->setProperty("qzTag", 2);
     second->move(0, 50);
@@ -469,7 +469,7 @@ struct Tour {
     form->activateWindow();
     guide =
         std::make_unique<hosts::qt::Guide>(toolkit, *form, GuideOptions{.insideWindow = inside});
-    walkThrough.play(this->script, *form);
+    walkThrough.play(script, *form);
     hosts::settle();
   }
 
