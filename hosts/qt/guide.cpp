@@ -188,8 +188,8 @@ void Guide::Stage::disappear() {
 }
 
 Spotlight& Guide::Stage::spotlightOn(QWidget& window) {
-  if (spotlight_ && spotlight_->parentWidget() != &window) delete spotlight_;
-  if (!spotlight_) {
+  if (!spotlight_ || spotlight_->parentWidget() != &window) {
+    delete spotlight_;
     spotlight_ = addUnnoticed<Spotlight>(window, options_.frame, options_.dimming);
     spotlight_->setVisible(panel_->isVisible());
   }

@@ -4,6 +4,8 @@
 
 #include <QString>
 
+class QWidget;
+
 namespace qz::hosts::qt {
 
 class GuidePanel;

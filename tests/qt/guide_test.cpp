@@ -5,6 +5,8 @@
 #include <QScrollBar>
 #include <QSplitter>
 #include <map>
+#include <random>
+#include <utility>
 
 #include "tests/qt/crowded_form.hpp"
 #include "tests/qt/guided.hpp"
@@ -445,6 +447,85 @@ TEST_F(Guides, MayEndInTheMiddleOfAWalkThrough) {
   EXPECT_FALSE(spotlight());
   EXPECT_TRUE(walkThrough.engine());
   EXPECT_EQ(form->findChildren<QDialog*>().size(), 0);
+}
+
+// What can happen to a form with a guide, in a form of its own.
+struct Tour {
+  toolkit::qt::QtToolkit& toolkit;
+  const std::string script;
+  std::unique_ptr<QWidget> form = std::make_unique<QWidget>();
+  QPointer<QPushButton> first = new QPushButton("First", form.get());
+  QPointer<QPushButton> second = new QPushButton("Second", form.get());
+  hosts::qt::WalkThrough walkThrough{toolkit};
+  std::unique_ptr<hosts::qt::Guide> guide;
+
+  Tour(toolkit::qt::QtToolkit& used, std::string played, bool inside)
+      : toolkit(used), script(std::move(played)) {
+    first->setProperty("qzTag", 1);
+    second->setProperty("qzTag", 2);
+    second->move(0, 50);
+    form->resize(300, 200);
+    form->show();
+    form->activateWindow();
+    guide =
+        std::make_unique<hosts::qt::Guide>(toolkit, *form, GuideOptions{.insideWindow = inside});
+    walkThrough.play(script, *form);
+    hosts::settle();
+  }
+
+  void press(const char* name) const {
+    if (guide && guide->panel()) guide->panel()->findChild<QPushButton*>(name)->click();
+  }
+  void act(unsigned what) {
+    switch (what) {
+      case 0:
+        return press("qz-guide-skip");
+      case 1:
+        return walkThrough.end();
+      case 2:
+        delete first;
+        return;
+      case 3:
+        return guide.reset();
+      case 4:
+        return form.reset();
+      case 5:
+        if (form) form->close();
+        return;
+      case 6:
+        if (form) walkThrough.play(script, *form);
+        return;
+      case 7:
+        if (form && second) second->setParent(nullptr), second->deleteLater();
+        return;
+      case 8:
+        if (form) form->move(form->pos() + QPoint(10, 10));
+        return;
+      case 9:
+        return walkThrough.whenOver([this] { guide.reset(); });
+      case 10:
+        return press("qz-guide-back");
+      default:
+        return press("qz-guide-next");
+    }
+  }
+};
+
+TEST_F(Guides, SurviveWhateverHappensAtAnyMoment) {
+  std::ofstream(directory.filePath("script.plist").toStdString()) << "{" << threeSteps << "}";
+  std::mt19937 random(11);
+  for (int round = 0; round < 300; ++round) {
+    Tour tour(toolkit, "script.plist", round % 2 == 0);
+    const QPointer<QWidget> panelOfTour = tour.guide->panel();
+    for (int i = 0; i < 6; ++i) {
+      tour.act(static_cast<unsigned>(random() % 14));
+      if (random() % 2) hosts::settle();
+    }
+    tour.walkThrough.end();
+    settle();
+    const bool isOn = panelOfTour && panelOfTour->isVisible();
+    EXPECT_FALSE(isOn) << round;
+  }
 }
 
 }  // namespace
