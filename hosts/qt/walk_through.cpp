@@ -11,6 +11,7 @@
 #include <QMainWindow>
 
 #include "hosts/qt/journal.hpp"
+#include "hosts/qt/outline.hpp"
 #include "hosts/qt/resource_fonts.hpp"
 #include "hosts/qt/resumption.hpp"
 #include "hosts/qt/script_reading.hpp"
@@ -121,7 +122,8 @@ WalkThrough::WalkThrough(std::shared_ptr<toolkit::qt::QtToolkit> toolkit, QObjec
 WalkThrough::WalkThrough(toolkit::qt::QtToolkit& toolkit, QObject* parent)
     : QObject(parent), toolkit_(toolkit) {
   if (auto* const application = QCoreApplication::instance()) {
-    connect(application, &QCoreApplication::aboutToQuit, this, [this] { finish(Reason::hostGone); });
+    connect(application, &QCoreApplication::aboutToQuit, this,
+            [this] { finish(Reason::hostGone); });
   }
 }
 
@@ -134,7 +136,8 @@ WalkThrough::~WalkThrough() {
   removeFonts(fonts_);
   auto* const application = QCoreApplication::instance();
   if (own_ && isInsideStep && application) {
-    QMetaObject::invokeMethod(application, [kept = own_] {}, Qt::QueuedConnection);
+    QMetaObject::invokeMethod(
+        application, [kept = own_] {}, Qt::QueuedConnection);
   }
 }
 
@@ -209,14 +212,16 @@ void WalkThrough::run(const ReadScript& script, const std::vector<JournalStep>& 
   const auto engine = engine_;
   const auto watch = watch_;
   journal_ = std::make_shared<Journal>(
-      Journal::Listener{.stepped = [this](toolkit::Tag key) { noteStep(key); },
+      Journal::Listener{.pressed = [this] { measureSoon(); },
+                        .stepped = [this](toolkit::Tag key) { noteStep(key); },
                         .failed = [this](const std::string& what) { noteFailure(what); }});
   engine->getGuiAssetsFromWindow(adopted_->window());
   engine->setPlistDictionary(script.lists->copy(toolkit::Mutability::changeable));
   engine->setObserver(journal_);
   if (meter_) {
-    meter_->begin(script.bytes, adopted_->window(), [context = watch.get(), this] {
-      QMetaObject::invokeMethod(context, [this] { measure(); }, Qt::QueuedConnection);
+    meter_->begin(script.bytes, outlineOf(*engine), [context = watch.get(), this] {
+      QMetaObject::invokeMethod(
+          context, [this] { measure(); }, Qt::QueuedConnection);
     });
   }
   toolkit_.calls().make([&] {
@@ -249,8 +254,16 @@ void WalkThrough::noteFailure(const std::string& what) {
   QMetaObject::invokeMethod(watch_.get(), tell, Qt::QueuedConnection);
 }
 
+// After the press of a button without a list, which cancels the timers.
+void WalkThrough::measureSoon() {
+  if (!watch_ || !meter_) return;
+  QMetaObject::invokeMethod(
+      watch_.get(), [this] { measure(); }, Qt::QueuedConnection);
+}
+
 void WalkThrough::measure() {
-  if (engine_ && meter_) setProgress(meter_->share(*engine_).value_or(-1));
+  if (!engine_ || engine_->terminating() || !meter_) return;
+  setProgress(meter_->share(outlineOf(*engine_)).value_or(-1));
 }
 
 void WalkThrough::setProgress(double progress) {

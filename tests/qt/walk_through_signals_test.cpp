@@ -127,8 +127,8 @@ TEST_F(ToldHost, LearnsWhatFails) {
   EXPECT_FALSE(walkThrough->play("/missing.plist", *form));
   EXPECT_EQ(news(), QStringList{"failed: The walk-through /missing.plist is not played: the file "
                                 "does not exist"});
-  ASSERT_TRUE(walkThrough->play(QByteArray("{ 0 = (IDLE_LOOP); 1 = (IDLE_LOOP, (FLASH_ID)); }"),
-                                *form));
+  ASSERT_TRUE(
+      walkThrough->play(QByteArray("{ 0 = (IDLE_LOOP); 1 = (IDLE_LOOP, (FLASH_ID)); }"), *form));
   news();
   click(*next);
   const QStringList failures = news();

@@ -134,6 +134,7 @@ class WalkThrough : public QObject {
   void tellStep();
   void noteStep(toolkit::Tag key);
   void noteFailure(const std::string& what);
+  void measureSoon();
   void measure();
   void setProgress(double progress);
 
