@@ -10,6 +10,7 @@
 #include <QEvent>
 #include <QMainWindow>
 
+#include "hosts/qt/description.hpp"
 #include "hosts/qt/journal.hpp"
 #include "hosts/qt/outline.hpp"
 #include "hosts/qt/resource_fonts.hpp"
@@ -42,6 +43,8 @@ class WalkThrough::Watch final : public QObject, public toolkit::SheetDelegate {
     watch(stage);
     if (content_ && content_ != &stage) watch(*content_);
   }
+
+  bool isFor(const QWidget& window) const { return stage_ == &window; }
 
   void sheetDidEnd(const toolkit::Ref<toolkit::Window>& sheet, long, void*) override {
     sheet->orderOut();
@@ -171,6 +174,14 @@ bool WalkThrough::resume(const QVariantMap& state, QWidget& window) {
 bool WalkThrough::resumeInSheet(const QVariantMap& state, QWidget& panel, QWidget& window) {
   if (state.isEmpty()) return refuse("(none)", "there is no state to resume");
   return begin(ScriptSource::fromVariant(state["script"]), panel, window, &state);
+}
+
+// A window can be adopted only once.
+QByteArray WalkThrough::describe(QWidget& window) {
+  const bool isAdopted = watch_ && watch_->isFor(*window.window());
+  if (isAdopted) return descriptionOf(adopted_->window());
+  const toolkit::qt::AdoptedWindow adopted(toolkit_, window, adoption_);
+  return descriptionOf(adopted.window());
 }
 
 // Says why the walk-through is not played; gives NO.

@@ -100,21 +100,19 @@ TEST_F(Progress, IsNotKnownIfThereIsNoEnd) {
   EXPECT_FALSE(QTest::qWaitFor([this] { return walkThrough.progress() >= 0; }, 300));
 }
 
-// The buttons of the script count in binary: 2 to the power of 12 places.
-QByteArray counter() {
+// Each of the buttons can be pressed or not: 2 to the power of `buttons` places.
+QByteArray counter(QWidget& window, int buttons) {
   QByteArray script = "{ 0 = (); 1 = ((SET_TAG_FOR_OBJECT_ID, 2, 1)); 2 = (TERMINATE_PARSER);";
-  for (int i = 100; i < 112; ++i) {
+  for (int i = 100; i < 100 + buttons; ++i) {
+    (new QPushButton("Count", &window))->setProperty("qzTag", i);
     script += QString(" %1 = ((SET_TAG_FOR_OBJECT_ID, %2, %1));").arg(i).arg(i + 100).toUtf8();
   }
   return script + " }";
 }
 
 TEST_F(Progress, IsExploredWithinBoundsAndKnownOnlyWhereItIsCertain) {
-  for (int i = 100; i < 112; ++i) {
-    (new QPushButton("Count", &window))->setProperty("qzTag", i);
-  }
   walkThrough.setProgressMeter(exploringMeter({.places = 600}));
-  ASSERT_TRUE(walkThrough.play(counter(), window));
+  ASSERT_TRUE(walkThrough.play(counter(window, 12), window));
   ASSERT_TRUE(isKnown());
   const auto buttons = window.findChildren<QPushButton*>();
   EXPECT_EQ(walkThrough.progress(), 0);
@@ -125,12 +123,10 @@ TEST_F(Progress, IsExploredWithinBoundsAndKnownOnlyWhereItIsCertain) {
 }
 
 TEST_F(Progress, IsLeftUnknownByTheEndOfTheWalkThrough) {
-  for (int i = 100; i < 112; ++i) {
-    (new QPushButton("Count", &window))->setProperty("qzTag", i);
-  }
   walkThrough.setProgressMeter(exploringMeter({.places = 10'000'000, .seconds = 600}));
+  const QByteArray script = counter(window, 30);
   for (int i = 0; i < 20; ++i) {
-    ASSERT_TRUE(walkThrough.play(counter(), window));
+    ASSERT_TRUE(walkThrough.play(script, window));
     if (i % 2) hosts::settle();
   }
   walkThrough.end();

@@ -6,6 +6,7 @@
 // the walk-through when the user closes the window or dismisses the sheet, and tells how it goes.
 #pragma once
 
+#include <QByteArray>
 #include <QLocale>
 #include <QObject>
 #include <QPointer>
@@ -91,6 +92,11 @@ class WalkThrough : public QObject {
   /// start anew. Fails like `play`, and if the script no longer has a list that the state needs.
   bool resume(const QVariantMap& state, QWidget& window);
   bool resumeInSheet(const QVariantMap& state, QWidget& panel, QWidget& window);
+
+  /// Returns a description of a top-level widget, as a walk-through sees it, for the option
+  /// `--window` of `qz-walkthrough`: an XML property list that docs/host-windows.md explains. The
+  /// widget may be in a walk-through.
+  QByteArray describe(QWidget& window);
 
   /// Ends the walk-through, if one is running. A walk-through also ends when its window is closed,
   /// hidden (as a dialog is by its buttons and Escape, even if it is shown again at once) or
