@@ -9,6 +9,8 @@
 #include <QCoreApplication>
 #include <QEvent>
 #include <QMainWindow>
+#include <set>
+#include <utility>
 
 #include "hosts/qt/description.hpp"
 #include "hosts/qt/journal.hpp"
@@ -28,6 +30,12 @@ constexpr const char* noFile = "/dev/null/no-script";
 QWidget* contentOf(QWidget& window) {
   const auto* const mainWindow = qobject_cast<const QMainWindow*>(&window);
   return mainWindow ? mainWindow->centralWidget() : &window;
+}
+
+// All that live. They end with the application, which may be destroyed before them.
+std::set<WalkThrough*>& livingWalkThroughs() {
+  static std::set<WalkThrough*> all;
+  return all;
 }
 
 }  // namespace
@@ -124,16 +132,24 @@ WalkThrough::WalkThrough(std::shared_ptr<toolkit::qt::QtToolkit> toolkit, QObjec
 
 WalkThrough::WalkThrough(toolkit::qt::QtToolkit& toolkit, QObject* parent)
     : QObject(parent), toolkit_(toolkit) {
-  if (auto* const application = QCoreApplication::instance()) {
-    connect(application, &QCoreApplication::aboutToQuit, this,
-            [this] { finish(Reason::hostGone); });
-  }
+  // Qt forgets the routine when it has called it.
+  if (livingWalkThroughs().empty()) qAddPostRoutine(endWithApplication);
+  livingWalkThroughs().insert(this);
+  connect(qApp, &QCoreApplication::aboutToQuit, this, [this] { finish(Reason::hostGone); });
+}
+
+// The end of one may destroy another.
+void WalkThrough::endWithApplication() {
+  auto& living = livingWalkThroughs();
+  while (!living.empty()) living.extract(living.begin()).value()->finish(Reason::hostGone);
 }
 
 // A list that is running still uses the toolkit.
 WalkThrough::~WalkThrough() {
   over_ = nullptr;  // the callback's object may be half destroyed
   blockSignals(true);
+  livingWalkThroughs().erase(this);
+  if (livingWalkThroughs().empty()) qRemovePostRoutine(endWithApplication);
   const bool isInsideStep = journal_ && journal_->isInsideStep();
   end();
   removeFonts(fonts_);

@@ -7,6 +7,7 @@
 #include <QPushButton>
 #include <QSettings>
 #include <QTemporaryDir>
+#include <QTimer>
 
 #include "qz/hosts/qt/walk_through.hpp"
 #include "qz/property_list/scalars.hpp"
@@ -107,7 +108,11 @@ TEST_F(ToldHost, LearnsWhyAWalkThroughIsOver) {
       {"closedByUser", [this] { form->hide(); }},
       {"replaced", [this] { walkThrough->play(tour, *form); }},
       {"endedByHost", [this] { walkThrough->end(); }},
-      {"hostGone", [this] { Q_EMIT qApp->aboutToQuit({}); }},
+      {"hostGone",
+       [] {
+         QTimer::singleShot(0, qApp, [] { QCoreApplication::quit(); });
+         QCoreApplication::exec();
+       }},
       {"hostGone", [this] { form->setCentralWidget(new QWidget); }},
       {"hostGone", [this] { form.reset(); }},
   };

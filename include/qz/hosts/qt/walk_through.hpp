@@ -137,6 +137,7 @@ class WalkThrough : public QObject {
   void run(const ReadScript& script, const std::vector<JournalStep>& steps, bool isSheet);
   bool refuse(const QString& script, const std::string& reason);
   void finish(Reason reason);
+  static void endWithApplication();
   void tellStep();
   void noteStep(toolkit::Tag key);
   void noteFailure(const std::string& what);
