@@ -25,10 +25,10 @@ std::optional<JournalStep> JournalStep::of(const QString& text) {
 }
 
 void Journal::controlPressed(const toolkit::Ref<toolkit::View>& control) {
-  steps_.push_back({.tag = control->tag(),
-                    .isPress = true,
-                    .isOn = control->state() == toolkit::State::on});
+  steps_.push_back(
+      {.tag = control->tag(), .isPress = true, .isOn = control->state() == toolkit::State::on});
   isPressed_ = true;
+  listener_.pressed();
 }
 
 void Journal::timerFired(std::string_view) { isPressed_ = false; }

@@ -31,6 +31,7 @@ class Journal final : public Observer {
  public:
   /// What the journal tells while the engine works.
   struct Listener {
+    std::function<void()> pressed;                        ///< a control
     std::function<void(toolkit::Tag key)> stepped;        ///< the list of a step begins to run
     std::function<void(const std::string& what)> failed;  ///< a command has raised
   };
@@ -51,9 +52,9 @@ class Journal final : public Observer {
  private:
   Listener listener_;
   std::vector<JournalStep> steps_;
-  int depth_ = 0;            // of running lists
-  bool isPressed_ = false;   // a press whose list has not begun
-  toolkit::Tag running_ = 0; // the key of the step
+  int depth_ = 0;             // of running lists
+  bool isPressed_ = false;    // a press whose list has not begun
+  toolkit::Tag running_ = 0;  // the key of the step
 };
 
 /// Makes a step again.

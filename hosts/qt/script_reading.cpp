@@ -42,8 +42,8 @@ void readFile(const QString& path, const toolkit::Files& files, const QLocale& l
   const std::string found = translated(whole, files, locale);
   const auto bytes = files.contentsAtPath(found);
   if (!bytes) {
-    script.problem = files.fileExistsAtPath(found) ? "the file cannot be read"
-                                                   : "the file does not exist";
+    script.problem =
+        files.fileExistsAtPath(found) ? "the file cannot be read" : "the file does not exist";
   } else {
     script.bytes = *bytes;
   }

@@ -23,7 +23,8 @@ bool isUrl(const QString& text) {
 ScriptSource::ScriptSource(const QString& path)
     : path_(isUrl(path) ? pathOf(QUrl(path)) : path), given_(path) {}
 
-ScriptSource::ScriptSource(const QUrl& url) : path_(pathOf(url)), given_(url.isRelative() ? path_ : url.toString()) {}
+ScriptSource::ScriptSource(const QUrl& url)
+    : path_(pathOf(url)), given_(url.isRelative() ? path_ : url.toString()) {}
 
 ScriptSource::ScriptSource(std::string_view path)
     : ScriptSource(QString::fromUtf8(path.data(), static_cast<qsizetype>(path.size()))) {}

@@ -9,8 +9,12 @@
 #include <QCoreApplication>
 #include <QEvent>
 #include <QMainWindow>
+#include <set>
+#include <utility>
 
+#include "hosts/qt/description.hpp"
 #include "hosts/qt/journal.hpp"
+#include "hosts/qt/outline.hpp"
 #include "hosts/qt/resource_fonts.hpp"
 #include "hosts/qt/resumption.hpp"
 #include "hosts/qt/script_reading.hpp"
@@ -28,6 +32,12 @@ QWidget* contentOf(QWidget& window) {
   return mainWindow ? mainWindow->centralWidget() : &window;
 }
 
+// All that live. They end with the application, which may be destroyed before them.
+std::set<WalkThrough*>& livingWalkThroughs() {
+  static std::set<WalkThrough*> all;
+  return all;
+}
+
 }  // namespace
 
 class WalkThrough::Watch final : public QObject, public toolkit::SheetDelegate {
@@ -41,6 +51,8 @@ class WalkThrough::Watch final : public QObject, public toolkit::SheetDelegate {
     watch(stage);
     if (content_ && content_ != &stage) watch(*content_);
   }
+
+  bool isFor(const QWidget& window) const { return stage_ == &window; }
 
   void sheetDidEnd(const toolkit::Ref<toolkit::Window>& sheet, long, void*) override {
     sheet->orderOut();
@@ -120,21 +132,31 @@ WalkThrough::WalkThrough(std::shared_ptr<toolkit::qt::QtToolkit> toolkit, QObjec
 
 WalkThrough::WalkThrough(toolkit::qt::QtToolkit& toolkit, QObject* parent)
     : QObject(parent), toolkit_(toolkit) {
-  if (auto* const application = QCoreApplication::instance()) {
-    connect(application, &QCoreApplication::aboutToQuit, this, [this] { finish(Reason::hostGone); });
-  }
+  // Qt forgets the routine when it has called it.
+  if (livingWalkThroughs().empty()) qAddPostRoutine(endWithApplication);
+  livingWalkThroughs().insert(this);
+  connect(qApp, &QCoreApplication::aboutToQuit, this, [this] { finish(Reason::hostGone); });
+}
+
+// The end of one may destroy another.
+void WalkThrough::endWithApplication() {
+  auto& living = livingWalkThroughs();
+  while (!living.empty()) living.extract(living.begin()).value()->finish(Reason::hostGone);
 }
 
 // A list that is running still uses the toolkit.
 WalkThrough::~WalkThrough() {
   over_ = nullptr;  // the callback's object may be half destroyed
   blockSignals(true);
+  livingWalkThroughs().erase(this);
+  if (livingWalkThroughs().empty()) qRemovePostRoutine(endWithApplication);
   const bool isInsideStep = journal_ && journal_->isInsideStep();
   end();
   removeFonts(fonts_);
   auto* const application = QCoreApplication::instance();
   if (own_ && isInsideStep && application) {
-    QMetaObject::invokeMethod(application, [kept = own_] {}, Qt::QueuedConnection);
+    QMetaObject::invokeMethod(
+        application, [kept = own_] {}, Qt::QueuedConnection);
   }
 }
 
@@ -168,6 +190,14 @@ bool WalkThrough::resume(const QVariantMap& state, QWidget& window) {
 bool WalkThrough::resumeInSheet(const QVariantMap& state, QWidget& panel, QWidget& window) {
   if (state.isEmpty()) return refuse("(none)", "there is no state to resume");
   return begin(ScriptSource::fromVariant(state["script"]), panel, window, &state);
+}
+
+// A window can be adopted only once.
+QByteArray WalkThrough::describe(QWidget& window) {
+  const bool isAdopted = watch_ && watch_->isFor(*window.window());
+  if (isAdopted) return descriptionOf(adopted_->window());
+  const toolkit::qt::AdoptedWindow adopted(toolkit_, window, adoption_);
+  return descriptionOf(adopted.window());
 }
 
 // Says why the walk-through is not played; gives NO.
@@ -209,14 +239,16 @@ void WalkThrough::run(const ReadScript& script, const std::vector<JournalStep>& 
   const auto engine = engine_;
   const auto watch = watch_;
   journal_ = std::make_shared<Journal>(
-      Journal::Listener{.stepped = [this](toolkit::Tag key) { noteStep(key); },
+      Journal::Listener{.pressed = [this] { measureSoon(); },
+                        .stepped = [this](toolkit::Tag key) { noteStep(key); },
                         .failed = [this](const std::string& what) { noteFailure(what); }});
   engine->getGuiAssetsFromWindow(adopted_->window());
   engine->setPlistDictionary(script.lists->copy(toolkit::Mutability::changeable));
   engine->setObserver(journal_);
   if (meter_) {
-    meter_->begin(script.bytes, adopted_->window(), [context = watch.get(), this] {
-      QMetaObject::invokeMethod(context, [this] { measure(); }, Qt::QueuedConnection);
+    meter_->begin(script.bytes, outlineOf(*engine), [context = watch.get(), this] {
+      QMetaObject::invokeMethod(
+          context, [this] { measure(); }, Qt::QueuedConnection);
     });
   }
   toolkit_.calls().make([&] {
@@ -249,8 +281,16 @@ void WalkThrough::noteFailure(const std::string& what) {
   QMetaObject::invokeMethod(watch_.get(), tell, Qt::QueuedConnection);
 }
 
+// After the press of a button without a list, which cancels the timers.
+void WalkThrough::measureSoon() {
+  if (!watch_ || !meter_) return;
+  QMetaObject::invokeMethod(
+      watch_.get(), [this] { measure(); }, Qt::QueuedConnection);
+}
+
 void WalkThrough::measure() {
-  if (engine_ && meter_) setProgress(meter_->share(*engine_).value_or(-1));
+  if (!engine_ || engine_->terminating() || !meter_) return;
+  setProgress(meter_->share(outlineOf(*engine_)).value_or(-1));
 }
 
 void WalkThrough::setProgress(double progress) {

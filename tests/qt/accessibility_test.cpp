@@ -31,7 +31,7 @@ using hosts::announcements;
 
 class Accessibility : public ::testing::Test {
  protected:
-  Accessibility() { announcements.clear(); }
+  Accessibility() { hosts::listen(); }
 
   static bool wasAnnounced(const QObject& object, QAccessible::Event event) {
     for (const auto& said : announcements) {
@@ -51,11 +51,11 @@ TEST_F(Accessibility, TitlesAreNamesAndAnnounced) {
   QCheckBox box("Before");
   for (QAbstractButton* const each :
        {static_cast<QAbstractButton*>(&button), static_cast<QAbstractButton*>(&box)}) {
-    announcements.clear();
+    hosts::listen();
     showTitle(*each, "A & B");
     EXPECT_TRUE(wasAnnounced(*each, QAccessible::NameChanged));
     EXPECT_EQ(textOf(*each, QAccessible::Name), "A & B");
-    announcements.clear();
+    hosts::listen();
     showTitle(*each, styled);
     EXPECT_TRUE(wasAnnounced(*each, QAccessible::NameChanged));
     EXPECT_EQ(textOf(*each, QAccessible::Name), "Styled");
@@ -71,11 +71,11 @@ TEST_F(Accessibility, ReplacesANameThatTheHostGave) {
 
 TEST_F(Accessibility, TextsOfLabelsAreNamesAndAnnounced) {
   QLabel label("Before");
-  announcements.clear();
+  hosts::listen();
   showText(label, "Plain");
   EXPECT_TRUE(wasAnnounced(label, QAccessible::NameChanged));
   EXPECT_EQ(textOf(label, QAccessible::Name), "Plain");
-  announcements.clear();
+  hosts::listen();
   showText(label, styled);
   EXPECT_TRUE(wasAnnounced(label, QAccessible::NameChanged));
   EXPECT_EQ(textOf(label, QAccessible::Name), "Styled");
@@ -102,7 +102,7 @@ TEST_F(Accessibility, ImagesAreNamedByTheirNames) {
   QtImages images(files);
   QLabel label;
   for (const char* name : {"disk", "done"}) {
-    announcements.clear();
+    hosts::listen();
     showImage(label, images.imageNamed(name));
     EXPECT_TRUE(wasAnnounced(label, QAccessible::NameChanged));
     EXPECT_EQ(textOf(label, QAccessible::Name), name);

@@ -12,6 +12,7 @@ bool isOfWholeObject(QAccessible::Event event) {
 }  // namespace
 
 void QAccessible::updateAccessibility(QAccessibleEvent* event) {
+  if (!qz::hosts::isListening) return;
   qz::hosts::Announcement said{event->object(), event->type()};
   const bool canBeRead = event->object() && isOfWholeObject(event->type());
   const auto* const known = canBeRead ? event->accessibleInterface() : nullptr;

@@ -18,7 +18,16 @@ struct Announcement {
   QString description = {};
 };
 
-/// Everything that has been announced since a test emptied the list.
+/// Everything that has been announced since a test last called `listen`.
 inline std::vector<Announcement> announcements;
+
+/// Nothing is recorded before the first call of `listen`: recording asks Qt for an object's
+/// accessible interface, for which Qt connects to the object's signal `destroyed`.
+inline bool isListening = false;
+
+inline void listen() {
+  isListening = true;
+  announcements.clear();
+}
 
 }  // namespace qz::hosts

@@ -53,14 +53,14 @@ struct GuideAccessibility : hosts::Guided {
         lines.push_back("at the focus: " + utf8(said.description));
       }
     }
-    hosts::announcements.clear();
+    hosts::listen();
     return lines;
   }
 };
 
 TEST_F(GuideAccessibility, TellsEachStepOnce) {
   show();
-  hosts::announcements.clear();
+  hosts::listen();
   play(threeSteps);
   EXPECT_EQ(hear(), (Lines{"alert: Dialog \"Name\": Type your name. Points at: Your name. 1 of 2.",
                            "focus: Button \"Next\""}));
@@ -78,7 +78,7 @@ TEST_F(GuideAccessibility, TellsEachStepOnce) {
 
 TEST_F(GuideAccessibility, TellsAStepToAUserWhoIsInTheForm) {
   show({.takesFocus = false});
-  hosts::announcements.clear();
+  hosts::listen();
   play(threeSteps);
   EXPECT_EQ(hear(), (Lines{"alert: Dialog \"Name\": Type your name. Points at: Your name. 1 of 2.",
                            "focus: EditableText \"Your name\""}))

@@ -7,6 +7,7 @@
 #include <QPushButton>
 #include <QSettings>
 #include <QTemporaryDir>
+#include <QTimer>
 
 #include "qz/hosts/qt/walk_through.hpp"
 #include "qz/property_list/scalars.hpp"
@@ -107,7 +108,11 @@ TEST_F(ToldHost, LearnsWhyAWalkThroughIsOver) {
       {"closedByUser", [this] { form->hide(); }},
       {"replaced", [this] { walkThrough->play(tour, *form); }},
       {"endedByHost", [this] { walkThrough->end(); }},
-      {"hostGone", [this] { Q_EMIT qApp->aboutToQuit({}); }},
+      {"hostGone",
+       [] {
+         QTimer::singleShot(0, qApp, [] { QCoreApplication::quit(); });
+         QCoreApplication::exec();
+       }},
       {"hostGone", [this] { form->setCentralWidget(new QWidget); }},
       {"hostGone", [this] { form.reset(); }},
   };
@@ -127,8 +132,8 @@ TEST_F(ToldHost, LearnsWhatFails) {
   EXPECT_FALSE(walkThrough->play("/missing.plist", *form));
   EXPECT_EQ(news(), QStringList{"failed: The walk-through /missing.plist is not played: the file "
                                 "does not exist"});
-  ASSERT_TRUE(walkThrough->play(QByteArray("{ 0 = (IDLE_LOOP); 1 = (IDLE_LOOP, (FLASH_ID)); }"),
-                                *form));
+  ASSERT_TRUE(
+      walkThrough->play(QByteArray("{ 0 = (IDLE_LOOP); 1 = (IDLE_LOOP, (FLASH_ID)); }"), *form));
   news();
   click(*next);
   const QStringList failures = news();

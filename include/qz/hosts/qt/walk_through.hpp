@@ -6,6 +6,7 @@
 // the walk-through when the user closes the window or dismisses the sheet, and tells how it goes.
 #pragma once
 
+#include <QByteArray>
 #include <QLocale>
 #include <QObject>
 #include <QPointer>
@@ -93,6 +94,11 @@ class QZ_API WalkThrough : public QObject {
   bool resume(const QVariantMap& state, QWidget& window);
   bool resumeInSheet(const QVariantMap& state, QWidget& panel, QWidget& window);
 
+  /// Returns a description of a top-level widget, as a walk-through sees it, for the option
+  /// `--window` of `qz-walkthrough`: an XML property list that docs/host-windows.md explains. The
+  /// widget may be in a walk-through.
+  QByteArray describe(QWidget& window);
+
   /// Ends the walk-through, if one is running. A walk-through also ends when its window is closed,
   /// hidden (as a dialog is by its buttons and Escape, even if it is shown again at once) or
   /// destroyed, when its main window gets another central widget, and when the application quits.
@@ -132,9 +138,11 @@ class QZ_API WalkThrough : public QObject {
   void run(const ReadScript& script, const std::vector<JournalStep>& steps, bool isSheet);
   bool refuse(const QString& script, const std::string& reason);
   void finish(Reason reason);
+  static void endWithApplication();
   void tellStep();
   void noteStep(toolkit::Tag key);
   void noteFailure(const std::string& what);
+  void measureSoon();
   void measure();
   void setProgress(double progress);
 

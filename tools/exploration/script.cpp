@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "tools/check/script.hpp"
+#include "tools/exploration/script.hpp"
 
 #include <algorithm>
 

@@ -2,13 +2,13 @@
 // Visits are expanded in rounds: any number of worlds make the moves, and look up what is known of
 // where they lead. Then one thread adds what they found in the order of the visits, so the result
 // does not depend on the number of threads. Meanwhile the others make the moves of the next round.
-#include "tools/check/exploration.hpp"
+#include "tools/exploration/exploration.hpp"
 
 #include <algorithm>
 #include <chrono>
 #include <thread>
 
-#include "tools/check/expansion.hpp"
+#include "tools/exploration/expansion.hpp"
 
 namespace qz::tools::check {
 namespace {

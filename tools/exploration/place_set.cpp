@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "tools/check/place_set.hpp"
+#include "tools/exploration/place_set.hpp"
 
 #include <cstring>
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "tools/check/place.hpp"
+#include "tools/exploration/place.hpp"
 
 #include <algorithm>
 #include <cstring>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "tools/check/workers.hpp"
+#include "tools/exploration/workers.hpp"
 
 namespace qz::tools::check {
 

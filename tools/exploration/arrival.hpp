@@ -5,7 +5,7 @@
 #include <optional>
 #include <vector>
 
-#include "tools/check/move.hpp"
+#include "tools/exploration/move.hpp"
 
 namespace qz::tools::check {
 

@@ -9,10 +9,10 @@
 #include <unordered_map>
 #include <vector>
 
-#include "tools/check/arrival.hpp"
-#include "tools/check/facts.hpp"
-#include "tools/check/looks.hpp"
-#include "tools/check/place.hpp"
+#include "tools/exploration/arrival.hpp"
+#include "tools/exploration/facts.hpp"
+#include "tools/exploration/looks.hpp"
+#include "tools/exploration/place.hpp"
 
 namespace qz::tools::check {
 

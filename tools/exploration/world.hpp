@@ -11,12 +11,12 @@
 #include <vector>
 
 #include "drivers/memory/memory_driver.hpp"
-#include "tools/check/arrival.hpp"
-#include "tools/check/looks.hpp"
-#include "tools/check/place.hpp"
-#include "tools/check/recorder.hpp"
-#include "tools/check/remembered_presses.hpp"
-#include "tools/check/script.hpp"
+#include "tools/exploration/arrival.hpp"
+#include "tools/exploration/looks.hpp"
+#include "tools/exploration/place.hpp"
+#include "tools/exploration/recorder.hpp"
+#include "tools/exploration/remembered_presses.hpp"
+#include "tools/exploration/script.hpp"
 #include "tools/walkthrough/stage.hpp"
 
 namespace qz::tools::check {

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // Only what a move may have touched is read back afterwards, only what differs between two places
 // is restored, and a press that is remembered is not made again.
-#include "tools/check/world.hpp"
+#include "tools/exploration/world.hpp"
 
 #include <algorithm>
 #include <limits>
@@ -9,7 +9,7 @@
 
 #include "qz/toolkit/exception.hpp"
 #include "toolkit/memory/parts.hpp"
-#include "tools/check/endless_run.hpp"
+#include "tools/exploration/endless_run.hpp"
 
 namespace qz::tools::check {
 namespace {

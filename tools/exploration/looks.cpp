@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "tools/check/looks.hpp"
+#include "tools/exploration/looks.hpp"
 
 #include <cstring>
 

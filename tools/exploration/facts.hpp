@@ -10,7 +10,7 @@
 #include <utility>
 #include <vector>
 
-#include "tools/check/move.hpp"
+#include "tools/exploration/move.hpp"
 
 namespace qz::tools::check {
 

@@ -13,13 +13,13 @@
 #include <unordered_map>
 #include <vector>
 
-#include "tools/check/facts.hpp"
-#include "tools/check/looks.hpp"
-#include "tools/check/move.hpp"
-#include "tools/check/place.hpp"
-#include "tools/check/place_set.hpp"
-#include "tools/check/workers.hpp"
-#include "tools/check/world.hpp"
+#include "tools/exploration/facts.hpp"
+#include "tools/exploration/looks.hpp"
+#include "tools/exploration/move.hpp"
+#include "tools/exploration/place.hpp"
+#include "tools/exploration/place_set.hpp"
+#include "tools/exploration/workers.hpp"
+#include "tools/exploration/world.hpp"
 
 namespace qz::tools::check {
 

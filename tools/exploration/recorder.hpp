@@ -10,9 +10,9 @@
 
 #include "qz/drivers/view_kinds.hpp"
 #include "qz/observer.hpp"
-#include "tools/check/facts.hpp"
-#include "tools/check/place.hpp"
-#include "tools/check/script.hpp"
+#include "tools/exploration/facts.hpp"
+#include "tools/exploration/place.hpp"
+#include "tools/exploration/script.hpp"
 
 namespace qz::tools::check {
 

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "tools/check/facts.hpp"
+#include "tools/exploration/facts.hpp"
 
 namespace qz::tools::check {
 

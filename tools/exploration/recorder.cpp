@@ -1,9 +1,9 @@
 // SPDX-License-Identifier: MIT
-#include "tools/check/recorder.hpp"
+#include "tools/exploration/recorder.hpp"
 
 #include <algorithm>
 
-#include "tools/check/endless_run.hpp"
+#include "tools/exploration/endless_run.hpp"
 
 namespace qz::tools::check {
 namespace {

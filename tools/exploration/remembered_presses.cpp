@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-#include "tools/check/remembered_presses.hpp"
+#include "tools/exploration/remembered_presses.hpp"
 
 #include <algorithm>
 #include <utility>
