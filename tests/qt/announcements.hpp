@@ -18,6 +18,9 @@ struct Announcement {
   QString description = {};
 };
 
+/// Whether objects are read. Qt then connects to each object, which other tests would count.
+inline bool announcementsAreRead = false;
+
 /// Everything that has been announced since a test emptied the list.
 inline std::vector<Announcement> announcements;
 
