@@ -20,6 +20,9 @@ std::string roleName(QAccessible::Role role) {
 }
 
 struct GuideAccessibility : hosts::Guided {
+  GuideAccessibility() { hosts::announcementsAreRead = true; }
+  ~GuideAccessibility() override { hosts::announcementsAreRead = false; }
+
   /// Lists what the panel shows, as a screen reader that explores it reads it.
   static void read(QAccessibleInterface& object, Lines& lines) {
     if (object.state().invisible || object.rect().isEmpty()) return;
