@@ -12,7 +12,7 @@
 #include "qz/property_list/collections.hpp"
 #include "qz/property_list/scalars.hpp"
 #include "qz/property_list/xml_writer.hpp"
-#include "toolkit/class_names.hpp"
+#include "qz/toolkit/class_names.hpp"
 #include "toolkit/qt/accessibility.hpp"
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/coordinates.hpp"

@@ -13,7 +13,9 @@ namespace qz::hosts::qt {
 
 namespace {
 
+// For Qt's own notes about the control, Qt connects to it: only if somebody listens.
 QString nameOf(QWidget& control) {
+  if (!QAccessible::isActive()) return {};
   const QAccessibleInterface* const known = QAccessible::queryAccessibleInterface(&control);
   return known ? known->text(QAccessible::Name) : QString();
 }

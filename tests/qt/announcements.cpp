@@ -14,8 +14,7 @@ bool isOfWholeObject(QAccessible::Event event) {
 void QAccessible::updateAccessibility(QAccessibleEvent* event) {
   if (!qz::hosts::isListening) return;
   qz::hosts::Announcement said{event->object(), event->type()};
-  const bool canBeRead =
-      qz::hosts::announcementsAreRead && event->object() && isOfWholeObject(event->type());
+  const bool canBeRead = event->object() && isOfWholeObject(event->type());
   const auto* const known = canBeRead ? event->accessibleInterface() : nullptr;
   if (known) {
     said.role = known->role();

@@ -20,8 +20,8 @@ std::string roleName(QAccessible::Role role) {
 }
 
 struct GuideAccessibility : hosts::Guided {
-  GuideAccessibility() { hosts::announcementsAreRead = true; }
-  ~GuideAccessibility() override { hosts::announcementsAreRead = false; }
+  GuideAccessibility() { QAccessible::setActive(true); }
+  ~GuideAccessibility() override { QAccessible::setActive(false); }
 
   /// Lists what the panel shows, as a screen reader that explores it reads it.
   static void read(QAccessibleInterface& object, Lines& lines) {
