@@ -13,6 +13,8 @@
 #include <QLayout>
 #include <QLineEdit>
 #include <QMainWindow>
+#include <QMdiArea>
+#include <QMdiSubWindow>
 #include <QPixmap>
 #include <QPlainTextEdit>
 #include <QPointer>
@@ -460,6 +462,16 @@ void writeFrontDock(QWidget&, const QVariant& value) {
   if (QWidget* const front = picked(value)) front->raise();
 }
 
+QVariant readSubWindow(QWidget& widget) {
+  const auto* const area = qobject_cast<QMdiArea*>(&widget);
+  return area ? pick(area->currentSubWindow()) : QVariant();
+}
+
+void writeSubWindow(QWidget& widget, const QVariant& value) {
+  auto* const window = qobject_cast<QMdiSubWindow*>(picked(value));
+  if (window) static_cast<QMdiArea&>(widget).setActiveSubWindow(window);
+}
+
 }  // namespace
 
 std::span<const Facet> facets() {
@@ -487,6 +499,7 @@ std::span<const Facet> facets() {
       {readPanes, writePanes},
       {readPageShown, writePageShown},
       {readFrontDock, writeFrontDock},
+      {readSubWindow, writeSubWindow},
   };
   return table;
 }
