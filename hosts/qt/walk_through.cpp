@@ -227,10 +227,13 @@ bool WalkThrough::begin(const ScriptSource& source, QWidget& stage, QWidget& win
   watch_ = std::make_shared<Watch>(*this, stage);
   step_.clear();
   run(script, resumption.steps, &stage != &window);
-  if (beginning.owner) setProgress(-1);
-  if (beginning.owner) Q_EMIT runningChanged();
-  if (beginning.owner) Q_EMIT started();
-  if (beginning.owner) tellStep();
+  const auto goesOn = [&] {
+    return beginning.owner && engine_;
+  };  // a list can make the host end it
+  if (goesOn()) setProgress(-1);
+  if (goesOn()) Q_EMIT runningChanged();
+  if (goesOn()) Q_EMIT started();
+  if (goesOn()) tellStep();
   return true;
 }
 

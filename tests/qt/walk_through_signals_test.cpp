@@ -289,6 +289,14 @@ TEST_F(ToldHost, MayDestroyTheFormWhileItsOwnListRuns) {
   EXPECT_FALSE(walkThrough->isRunning());
 }
 
+TEST_F(ToldHost, MayEndTheWalkThroughInItsFirstList) {
+  QObject::connect(field, &QLineEdit::textChanged, form.get(), [this] { walkThrough->end(); });
+  ASSERT_TRUE(
+      walkThrough->play(QByteArray("{ 0 = ((SET_TEXT_FOR_OBJECT_ID, Begun, 6)); }"), *form));
+  EXPECT_EQ(news(), QStringList{"finished: endedByHost"});
+  EXPECT_EQ(field->text(), "");
+}
+
 TEST_F(ToldHost, MayOwnItsWalkThrough) {
   QPointer<WalkThrough> owned = new WalkThrough(form.get());
   owned->toolkit().log().setSink([](std::string_view) {});
