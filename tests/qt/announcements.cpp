@@ -11,6 +11,8 @@ bool isOfWholeObject(QAccessible::Event event) {
 
 }  // namespace
 
+bool QAccessible::isActive() { return qz::hosts::isListening; }
+
 void QAccessible::updateAccessibility(QAccessibleEvent* event) {
   if (!qz::hosts::isListening) return;
   qz::hosts::Announcement said{event->object(), event->type()};

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // What Qt tells assistive technology. Qt passes it on only while such technology is connected,
-// which needs a desktop's message bus, so this program replaces Qt's own function.
+// which needs a desktop's message bus, so this program replaces Qt's own functions.
 #pragma once
 
 #include <QAccessible>
@@ -22,7 +22,8 @@ struct Announcement {
 inline std::vector<Announcement> announcements;
 
 /// Nothing is recorded before the first call of `listen`: recording asks Qt for an object's
-/// accessible interface, for which Qt connects to the object's signal `destroyed`.
+/// accessible interface, for which Qt connects to the object's signal `destroyed`. Until then
+/// `QAccessible::isActive` says that no assistive technology is connected.
 inline bool isListening = false;
 
 inline void listen() {

@@ -20,8 +20,7 @@ std::string roleName(QAccessible::Role role) {
 }
 
 struct GuideAccessibility : hosts::Guided {
-  GuideAccessibility() { QAccessible::setActive(true); }
-  ~GuideAccessibility() override { QAccessible::setActive(false); }
+  GuideAccessibility() { hosts::listen(); }
 
   /// Lists what the panel shows, as a screen reader that explores it reads it.
   static void read(QAccessibleInterface& object, Lines& lines) {

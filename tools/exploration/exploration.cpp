@@ -207,9 +207,9 @@ void Exploration::lookUp(Found& found, const std::uint8_t* place, const Visit& f
 }
 
 /// Returns how many visits were merged before there were too many places.
-std::size_t Exploration::mergeAll(Round& round, std::size_t mostPlaces) {
+std::size_t Exploration::mergeAll(Round& round, std::size_t limit) {
   std::size_t merged = 0;
-  for (; merged < round.size() && set_.count() < mostPlaces; ++merged) merge(round[merged]);
+  for (; merged < round.size() && set_.count() < limit; ++merged) merge(round[merged]);
   return merged;
 }
 

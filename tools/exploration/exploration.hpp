@@ -148,7 +148,7 @@ class Exploration {
   static void summarize(Expansion& expansion);
   void hash(Found& found, std::uint8_t* place) const;
   void lookUp(Found& found, const std::uint8_t* place, const Visit& from) const;
-  std::size_t mergeAll(Round& round, std::size_t mostPlaces);
+  std::size_t mergeAll(Round& round, std::size_t limit);
   void merge(Expansion& expansion);
   void addFacts(const Expansion& expansion, std::uint32_t place);
   std::uint32_t arrive(Found& found, std::uint8_t* place, std::uint32_t parent,
