@@ -40,7 +40,8 @@ struct ChangesInReturn : testing::Test {
   }
 };
 
-const std::string enlargingCommand = "(SET_TITLE_FOR_OBJECT_ID, \"" + std::string(300, 'm') + "\", 2)";
+const std::string enlargingCommand =
+    "(SET_TITLE_FOR_OBJECT_ID, \"" + std::string(300, 'm') + "\", 2)";
 
 TEST_F(ChangesInReturn, AreTheSizeOfAWindowThatNeedsMoreRoom) {
   const QSize size = form.size();
@@ -74,8 +75,9 @@ TEST_F(ChangesInReturn, AreWhatASlotOfTheHostEnables) {
   QObject::connect(&form.check, &QCheckBox::toggled, &form.line, &QWidget::setEnabled);
   QObject::connect(&form.edit, &QTextEdit::textChanged, &form.inBox, &QWidget::hide);
   form.line.setEnabled(false);
-  play("(SET_STATE_ON_FOR_OBJECT_ID, 9), (DISABLE_OBJECT_WITH_ID, 11), "
-       "(SET_TEXT_FOR_OBJECT_ID, New, 12)");
+  play(
+      "(SET_STATE_ON_FOR_OBJECT_ID, 9), (DISABLE_OBJECT_WITH_ID, 11), "
+      "(SET_TEXT_FOR_OBJECT_ID, New, 12)");
   EXPECT_TRUE(form.inBox.isHidden());
   walkThrough.end();
   EXPECT_FALSE(form.check.isChecked());
@@ -85,8 +87,9 @@ TEST_F(ChangesInReturn, AreWhatASlotOfTheHostEnables) {
 
 // Qt draws the text of a disabled label in another colour, so the toolkit gives it another text.
 TEST_F(ChangesInReturn, AreTheLookOfALabelThatTheHostDisables) {
-  play("(SET_ATTRIBUTED_STRING_AS_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID, \"<b>Bold</b>\", "
-       "Times, 30, 10)");
+  play(
+      "(SET_ATTRIBUTED_STRING_AS_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID, \"<b>Bold</b>\", "
+      "Times, 30, 10)");
   form.box->setEnabled(false);
   walkThrough.end();
   EXPECT_EQ(form.label.text(), "Label");

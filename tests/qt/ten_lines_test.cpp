@@ -71,7 +71,7 @@ TEST_F(TenLines, AreAllThatAnApplicationNeeds) {
 }
 
 TEST_F(TenLines, LeaveEveryConnectionAsItWasBeforeDuringAndAfterTheTour) {
-  const Reactions heard = {{"save", 1}, {"saveAs", 1}, {"bold", 1},
+  const Reactions heard = {{"save", 1},  {"saveAs", 1}, {"bold", 1},
                            {"apply", 1}, {"open", 1},   {"print", 1}};
   EXPECT_EQ(pressAll(), heard);
   const auto before = receiversIn(application);
