@@ -17,6 +17,7 @@
 #include "tools/check/witness.hpp"
 #include "tools/check_progress.hpp"
 #include "tools/commands.hpp"
+#include "tools/steps/script_file.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/suggestions.hpp"
 #include "tools/support/terminal.hpp"
@@ -115,8 +116,14 @@ void checkOne(const std::string& path, const CheckOptions& options, ProgressLine
   hooks.report = [&](const check::Progress& progress) { line.show(path, progress); };
   hooks.isCancelled = Interruption::isWanted;
   try {
-    job.file.emplace(path, "a script");
-    job.verdict = checkScript(*job.file, options, hooks);
+    steps::ScriptFile script = steps::openScript(path);
+    job.file.emplace(std::move(script.file));
+    CheckOptions own = options;
+    if (script.from && !own.stage.window && !own.stage.assets) {
+      own.stage = script.from->source.stage;
+      own.standIn = false;
+    }
+    job.verdict = checkScript(*job.file, own, hooks);
   } catch (const Failure& failure) {
     job.failure = failure;
   }

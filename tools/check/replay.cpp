@@ -24,12 +24,10 @@ std::string number(double value) {
 
 class Replay {
  public:
-  explicit Replay(const Setting& setting) {
+  explicit Replay(const Setting& setting) : script_(setting.script.dictionary()) {
     driver_.setResourcePath(setting.resources);
     stage_.emplace(driver_, setting.plan);
     stage_->engine().setObserver(std::make_shared<EndlessGuard>());
-    stage_->engine().setPlistDictionary(
-        setting.script.dictionary()->copy(toolkit::Mutability::changeable));
   }
 
   /// What became of a move. After one that would never end, the window shows nothing of use.
@@ -38,7 +36,7 @@ class Replay {
   Outcome make(const Step& step) {
     try {
       if (const auto* start = std::get_if<StartMove>(&step)) {
-        stage_->load(noFile, start->key);
+        stage_->start(script_, start->key);
       } else if (const auto* press = std::get_if<PressMove>(&step)) {
         driver_.click(controls()[press->control]);
       } else {
@@ -59,6 +57,7 @@ class Replay {
     return stage_->engine().tutorialWindow()->contentView()->subviews();
   }
 
+  QZ_Plist_State_Parser::Dictionary script_;
   drivers::MemoryDriver driver_;
   std::optional<walkthrough::Stage> stage_;
 };

@@ -104,7 +104,6 @@ void World::build(const std::optional<std::string>& startKey) {
   stage_ = std::make_unique<Stage>(*driver_, setting_.plan);
   observe();
   auto& engine = stage_->engine();
-  engine.setPlistDictionary(setting_.script.dictionary()->copy(toolkit::Mutability::changeable));
   // A tick changes nothing but the pressed-in look, which is not part of a place or a look.
   engine.flashingTimer()->invalidate();
   std::fill(place_.begin(), place_.end(), 0);
@@ -113,7 +112,7 @@ void World::build(const std::optional<std::string>& startKey) {
   }
   if (startKey) recorder_->begin();
   try {
-    stage_->load(noFile, startKey);
+    stage_->start(setting_.script.dictionary(), startKey);
   } catch (const toolkit::Exception&) {
     // The list is not an array, which is found by reading the script.
   }

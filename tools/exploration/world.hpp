@@ -21,9 +21,6 @@
 
 namespace qz::tools::check {
 
-/// No file can have this path: an engine that loads it keeps the script that it has.
-inline constexpr const char* noFile = "/dev/null/no-script";
-
 /// What all worlds of one check share. The references must outlive the worlds.
 struct Setting {
   const Script& script;

@@ -17,6 +17,7 @@
 #include "tools/play/raised_places.hpp"
 #include "tools/play/screenshots.hpp"
 #include "tools/play/session.hpp"
+#include "tools/steps/script_file.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/input_file.hpp"
 #include "tools/support/stack_guard.hpp"
@@ -122,11 +123,21 @@ void connectLog(drivers::Driver& driver, const Terminal& terminal) {
   });
 }
 
+/// Returns the window of the options, else that which a source names.
+StageOptions stageOf(const PlayOptions& options, const steps::ScriptFile& script) {
+  if (!script.from || options.stage.window || options.stage.assets) return options.stage;
+  StageOptions stage = script.from->source.stage;
+  stage.sheet = options.stage.sheet;
+  return stage;
+}
+
 }  // namespace
 
 ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
-  const InputFile file(options.script, "a script");
-  checkStart(file, options.startKey);
+  const steps::ScriptFile script = steps::openScript(options.script, options.startKey);
+  const InputFile& file = script.file;
+  const std::string startKey = script.from ? script.from->built.startKeys.front() : options.startKey;
+  checkStart(file, startKey);
   const fs::path path = fs::absolute(options.script);
   if (options.resources) checkDirectory(*options.resources);
 
@@ -140,13 +151,17 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   } else if (driver->hasPerson()) {
     driver->useRealTime();
   }
-  Stage stage(*driver, planStage(options.stage, file.dictionary(), options.script));
+  Stage stage(*driver, planStage(stageOf(options, script), file.dictionary(), options.script));
   const ScriptGuard guard(stage.engine(), options.script, file.dictionary());
   stage.engine().setObserver(std::make_shared<RaisedPlaces>(file, stage.engine(), terminal.log));
   Transcript transcript(terminal.out, terminal.style);
   Session session(*driver, stage, transcript, screenshots ? &*screenshots : nullptr);
 
-  session.start(path.string(), options.startKey);
+  if (script.from) {
+    session.start(file.dictionary(), startKey);
+  } else {
+    session.start(path.string(), startKey);
+  }
   for (const Step& step : options.steps) session.perform(step);
   if (options.steps.empty()) leaveToTheUser(*driver, session, terminal);
   session.conclude();

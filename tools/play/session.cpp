@@ -37,6 +37,10 @@ void Session::start(const std::string& script, const std::string& startKey) {
   run("start", "start", [&] { stage_.load(script, startKey); });
 }
 
+void Session::start(const QZ_Plist_State_Parser::Dictionary& script, const std::string& startKey) {
+  run("start", "start", [&] { stage_.start(script, startKey); });
+}
+
 void Session::perform(const Step& step) {
   if (const auto* pressed = std::get_if<Press>(&step)) {
     press(pressed->tag);

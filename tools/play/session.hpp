@@ -29,6 +29,8 @@ class Session {
 
   /// Loads the script at an absolute path and runs its list under `startKey`.
   void start(const std::string& script, const std::string& startKey);
+  /// The same with a script that is not in a file.
+  void start(const QZ_Plist_State_Parser::Dictionary& script, const std::string& startKey);
 
   /// Makes the step, or says in the transcript why a user could not make it.
   void perform(const Step& step);

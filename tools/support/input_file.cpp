@@ -49,6 +49,14 @@ InputFile::InputFile(std::string path, std::string_view what, ExitStatus refusal
   }
 }
 
+InputFile::InputFile(std::string path, std::string_view what, toolkit::ValueRef<> root,
+                     toolkit::ValueOffsets offsets, std::string_view text)
+    : path_(std::move(path)),
+      what_(what),
+      refusal_(ExitStatus::badInput),
+      root_(std::move(root)),
+      positions_(std::move(offsets), text) {}
+
 void InputFile::read() {
   const std::string contents = contentsOf(path_, what_);
   if (contents.empty()) throw Failure(refusal_, path_ + ": an empty file; expected " + what_);

@@ -19,6 +19,10 @@ class InputFile {
   /// hold, such as "a script"; `refusal` is the Failure's status if it holds something else.
   InputFile(std::string path, std::string_view what, ExitStatus refusal = ExitStatus::badInput);
 
+  /// Takes a property list that was made of a text: of `text`, at `offsets`.
+  InputFile(std::string path, std::string_view what, toolkit::ValueRef<> root,
+            toolkit::ValueOffsets offsets, std::string_view text);
+
   const std::string& path() const { return path_; }
   const toolkit::ValueRef<>& root() const { return root_; }
   /// Returns the root; throws a Failure if it is not a dictionary.

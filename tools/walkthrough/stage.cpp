@@ -72,4 +72,10 @@ bool Stage::load(const std::string& script, const std::optional<std::string>& st
   return engine_->loadPlist(script, startKey, delegate_, sheet_);
 }
 
+bool Stage::start(const QZ_Plist_State_Parser::Dictionary& script,
+                  const std::optional<std::string>& startKey) {
+  engine_->setPlistDictionary(script->copy(toolkit::Mutability::changeable));
+  return load(noFile, startKey);
+}
+
 }  // namespace qz::tools::walkthrough

@@ -12,6 +12,9 @@
 
 namespace qz::tools::walkthrough {
 
+/// No file can have this path: an engine that loads it keeps the script that it has.
+inline constexpr const char* noFile = "/dev/null/no-script";
+
 /// What a walk-through is played on. Without a window and a description, its window is made from
 /// the script itself.
 struct StageOptions {
@@ -52,6 +55,9 @@ class Stage {
   /// Loads the script at an absolute path and runs its list under `startKey`, if there is a key.
   /// Passes exceptions on.
   bool load(const std::string& script, const std::optional<std::string>& startKey);
+  /// The same with a script that is not in a file.
+  bool start(const QZ_Plist_State_Parser::Dictionary& script,
+             const std::optional<std::string>& startKey);
 
  private:
   void buildFrom(const QZ_Plist_State_Parser::Dictionary& description);

@@ -1,0 +1,194 @@
+// SPDX-License-Identifier: MIT
+// What every control shows at a step.
+#include "tools/steps/looks.hpp"
+
+#include "tools/support/text_layout.hpp"
+
+namespace qz::tools::steps {
+namespace {
+
+using drivers::Caption;
+using drivers::ViewKind;
+
+constexpr const char* setText = "SET_TEXT_FOR_OBJECT_ID";
+constexpr const char* setTitle = "SET_TITLE_FOR_OBJECT_ID";
+constexpr const char* setStyled =
+    "SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID";
+constexpr const char* setCentered =
+    "SET_ATTRIBUTED_STRING_AS_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID";
+constexpr const char* setInFont =
+    "SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID";
+
+// Of styled text that names no font. The reader of HTML would use Times.
+const Font standardFont{"Helvetica", 12};
+
+template <class T>
+void overlay(std::optional<T>& below, const std::optional<T>& above) {
+  if (above) below = above;
+}
+
+/// Returns what a step says of a control, or else what every step says.
+ControlWords merged(ControlWords words, const ControlWords& own) {
+  overlay(words.content, own.content);
+  overlay(words.font, own.font);
+  overlay(words.isCentered, own.isCentered);
+  overlay(words.toolTip, own.toolTip);
+  overlay(words.color, own.color);
+  overlay(words.isRed, own.isRed);
+  overlay(words.isOn, own.isOn);
+  overlay(words.isEnabled, own.isEnabled);
+  overlay(words.flashes, own.flashes);
+  overlay(words.press, own.press);
+  // A step shows what it mentions, also if every step hides it.
+  if (own.isMentioned) words.isShown = true;
+  overlay(words.isShown, own.isShown);
+  if (own.place != 0) words.place = own.place;
+  return words;
+}
+
+std::string inFont(const std::string& html, const Font& font, bool isCentered) {
+  const std::string size =
+      font.size == standardFont.size ? "" : " style=\"font-size: " + std::to_string(font.size) + "pt\"";
+  const std::string text = "<font face=\"" + font.name + "\"" + size + ">" + html + "</font>";
+  return isCentered ? "<div style=\"text-align: center\">" + text + "</div>" : text;
+}
+
+/// Returns the commands for a text or title.
+Commands textCommands(const Control& control, const ControlWords& words) {
+  const bool isTitle = rowOf(control.kind).caption == Caption::title;
+  const Markup content = words.content.value_or(Markup{true, control.caption.value_or("")});
+  const bool isCentered = words.isCentered.value_or(false);
+  Commands commands;
+  if (!content.isPlain || (isCentered && !words.font)) {
+    const std::string html = content.isPlain ? asHtml(content.text) : content.text;
+    const std::string text = inFont(html, words.font.value_or(standardFont), isCentered);
+    commands.push_back({setStyled, {true, text, standardFont.name, 0}, words.place});
+  } else if (words.font) {
+    commands.push_back({isCentered ? setCentered : setInFont,
+                        {asHtml(content.text), words.font->name, words.font->size},
+                        words.place});
+  } else {
+    commands.push_back({isTitle ? setTitle : setText, {content.text}, words.place});
+  }
+  if (words.color) commands.push_back({"SET_FOREGROUND_COLOR_FOR_OBJECT_ID", {*words.color}, words.place});
+  return commands;
+}
+
+Commands contentCommands(const Control& control, const ControlWords& words) {
+  switch (rowOf(control.kind).caption) {
+    case Caption::title:
+    case Caption::text:
+      return textCommands(control, words);
+    case Caption::imageName:
+      break;
+    case Caption::none:
+      return {};
+  }
+  const auto image = words.content ? words.content->text : control.caption;
+  if (!image) return {};
+  return {{"LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID", {*image}, words.place}};
+}
+
+Commands flagCommand(bool on, const char* yes, const char* no, Place place) {
+  return {{on ? yes : no, {}, place}};
+}
+
+/// Whether a control is seen if the source does not say so: a button needs something to do, an image
+/// view an image.
+bool isShownByItself(const Control& control, const ControlWords& words) {
+  if (rowOf(control.kind).caption == Caption::imageName) {
+    return control.isShown && (words.content || control.caption);
+  }
+  const bool isIdle = control.kind == ViewKind::button && !control.name.empty() && !words.press;
+  return control.isShown && !isIdle;
+}
+
+ControlLook controlLook(const Control& control, const ControlWords& words, bool canGoBack) {
+  const drivers::ViewKindRow& row = rowOf(control.kind);
+  const bool isShown = words.isShown.value_or(isShownByItself(control, words));
+  const bool isInVain = words.press && words.press->kind == Lead::Kind::back && !canGoBack;
+  const bool isEnabled = words.isEnabled.value_or(control.isEnabled && !isInVain);
+  ControlLook look;
+  look[Property::content] = contentCommands(control, words);
+  look[Property::toolTip] = {
+      {"SET_TOOL_TIP_FOR_ID", {words.toolTip.value_or(control.toolTip)}, words.place}};
+  look[Property::shown] =
+      flagCommand(isShown, "SHOW_OBJECT_WITH_ID", "HIDE_OBJECT_WITH_ID", words.place);
+  if (row.isControl) {
+    look[Property::enabled] =
+        flagCommand(isEnabled, "ENABLE_OBJECT_WITH_ID", "DISABLE_OBJECT_WITH_ID", words.place);
+  }
+  if (row.isButton) {
+    look[Property::state] = flagCommand(words.isOn.value_or(control.isOn),
+                                        "SET_STATE_ON_FOR_OBJECT_ID", "SET_STATE_OFF_FOR_OBJECT_ID",
+                                        words.place);
+    if (words.isRed) {
+      look[Property::background] = {{"SET_BACKGROUND_COLOR_FOR_OBJECT_ID", {0}, words.place}};
+    }
+    look.canBePressed = isShown && isEnabled;
+    look.flashes = look.canBePressed && words.flashes.value_or(false);
+    if (words.press) look.press = *words.press;
+    if (isInVain) look.press = {};
+  }
+  return look;
+}
+
+}  // namespace
+
+Look initialLook(const Tour& tour) {
+  Look look;
+  for (const Control& control : tour.controls) {
+    Control unnamed = control;  // what the source calls it changes nothing
+    unnamed.name.clear();
+    ControlWords words;
+    words.isShown = control.isShown;
+    look.controls.push_back(controlLook(unnamed, words, true));
+  }
+  return look;
+}
+
+Look lookOf(const Tour& tour, StepIndex step, bool canGoBack) {
+  const StepWords& own = tour.steps[step].words;
+  Look look;
+  for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
+    const ControlWords words = merged(tour.everyStep.controls[i], own.controls[i]);
+    look.controls.push_back(controlLook(tour.controls[i], words, canGoBack));
+  }
+  const auto background = own.background ? own.background : tour.everyStep.background;
+  if (background) look.background = {{"LOAD_BACKGROUND_WITH_IMAGE", {*background}, 0}};
+  return look;
+}
+
+void judgeLooks(const Tour& tour, Mistakes& mistakes) {
+  std::vector<Place> redAt(tour.controls.size(), 0);
+  std::vector<bool> plainSomewhere(tour.controls.size(), false);
+  for (StepIndex step = 0; step < tour.steps.size(); ++step) {
+    Look look = lookOf(tour, step, true);
+    for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
+      const ControlWords words =
+          merged(tour.everyStep.controls[i], tour.steps[step].words.controls[i]);
+      const Control& control = tour.controls[i];
+      const bool isDead = !control.name.empty() && control.kind == ViewKind::button && !words.press &&
+                          look.controls[i].canBePressed;
+      if (isDead) {
+        const Place place = words.isMentioned || words.place != 0 ? words.place : tour.steps[step].place;
+        mistakes.add(place, "at the step " + quote(tour.steps[step].name) + " a press of " +
+                                quote(control.name) +
+                                " leads nowhere; expected “press” with a step, “back”, “end” or "
+                                "“nothing”");
+      }
+      if (words.isRed) {
+        redAt[i] = words.place;
+      } else {
+        plainSomewhere[i] = true;
+      }
+    }
+  }
+  for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
+    if (redAt[i] == 0 || !plainSomewhere[i]) continue;
+    mistakes.add(redAt[i], "no command takes the red from a button again; expected “background: red” "
+                           "under “every step”, or at none");
+  }
+}
+
+}  // namespace qz::tools::steps

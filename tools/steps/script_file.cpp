@@ -1,0 +1,36 @@
+// SPDX-License-Identifier: MIT
+// Opens scripts and sources alike.
+#include "tools/steps/script_file.hpp"
+
+#include "tools/support/suggestions.hpp"
+#include "tools/support/text_layout.hpp"
+
+namespace qz::tools::steps {
+namespace {
+
+constexpr const char* expectedFile = "a script";
+
+StepIndex stepNamed(const Source& source, const std::string& name) {
+  std::vector<std::string_view> names;
+  for (StepIndex i = 0; i < source.tour.steps.size(); ++i) {
+    if (source.tour.steps[i].name == name) return i;
+    names.push_back(source.tour.steps[i].name);
+  }
+  throw Failure(ExitStatus::failed,
+                source.path + ": no step is called " + quote(name) + didYouMean(name, names));
+}
+
+}  // namespace
+
+ScriptFile openScript(const std::string& path, const std::string& start) {
+  if (!isSourcePath(path)) return {InputFile(path, expectedFile), std::nullopt};
+  BuiltSource from{.source = readSource(path), .built = {}};
+  const StepIndex first = start.empty() ? 0 : stepNamed(from.source, start);
+  Mistakes mistakes;
+  from.built = build(from.source.tour, {first}, mistakes);
+  mistakes.throwIfAny(path, from.source.text);
+  InputFile file(path, expectedFile, from.built.script, from.built.offsets, from.source.text);
+  return {std::move(file), std::move(from)};
+}
+
+}  // namespace qz::tools::steps

@@ -1,0 +1,31 @@
+// SPDX-License-Identifier: MIT
+// Opens what a command plays or checks: a script, or the source of one.
+#pragma once
+
+#include <optional>
+#include <string>
+
+#include "tools/steps/compiler.hpp"
+#include "tools/steps/source.hpp"
+#include "tools/support/input_file.hpp"
+
+namespace qz::tools::steps {
+
+/// A script that was built of a source.
+struct BuiltSource {
+  Source source{};
+  Built built{};
+};
+
+/// A script as a file, or built in memory.
+struct ScriptFile {
+  InputFile file;                   ///< the script; its positions are those of the source
+  std::optional<BuiltSource> from;  ///< absent for a script that is a file
+};
+
+/// Reads the script at `path`, or builds it if this is a source, which can then be started at the
+/// step `start` too, if that is not empty. Throws a SourceRefused if the source has mistakes, another
+/// Failure if a file cannot be read or does not hold what it should.
+ScriptFile openScript(const std::string& path, const std::string& start = {});
+
+}  // namespace qz::tools::steps

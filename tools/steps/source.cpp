@@ -1,0 +1,210 @@
+// SPDX-License-Identifier: MIT
+// Reads a source from its top: the window, the names of its controls, and then the steps.
+#include "tools/steps/source.hpp"
+
+#include <algorithm>
+#include <filesystem>
+#include <map>
+
+#include "drivers/memory/memory_driver.hpp"
+#include "tools/steps/fragments.hpp"
+#include "tools/steps/step_reader.hpp"
+#include "tools/steps/words.hpp"
+#include "tools/support/suggestions.hpp"
+#include "tools/support/text_layout.hpp"
+#include "tools/support/whole_file.hpp"
+#include "tools/walkthrough/step_picture.hpp"
+
+namespace qz::tools::steps {
+namespace {
+
+namespace fs = std::filesystem;
+using drivers::Caption;
+
+constexpr int greatestTag = 2147483647;  // the engine reads tags as an int
+constexpr std::string_view sourceWords[] = {"window", "assets",     "controls", "back over",
+                                            "every step", "fragments", "steps"};
+
+Control controlOf(const drivers::ViewPicture& view) {
+  Control control{.tag = view.tag, .kind = view.kind};
+  const Caption caption = rowOf(view.kind).caption;
+  if (caption == Caption::title) control.caption = view.title.string();
+  if (caption == Caption::text) control.caption = view.text.string();
+  if (caption == Caption::imageName) control.caption = view.image;
+  control.toolTip = view.toolTip;
+  control.isShown = !view.hidden;
+  control.isEnabled = view.enabled;
+  control.isOn = view.state == toolkit::State::on;
+  return control;
+}
+
+/// Returns the controls of the window that the options name, back to front.
+std::vector<Control> controlsOf(const walkthrough::StageOptions& options, const std::string& path) {
+  drivers::MemoryDriver driver;
+  driver.setResourcePath(fs::path(path).parent_path().string());
+  const auto plan = walkthrough::planStage(options, {}, path);
+  walkthrough::Stage stage(driver, plan);
+  const auto picture = walkthrough::takePicture(driver, stage.engine(), stage.title());
+  std::vector<Control> controls;
+  for (const auto& control : picture.controls) controls.push_back(controlOf(control.view));
+  return controls;
+}
+
+/// Reads the parts of a source in the order in which they need each other, which is not always that
+/// of the file.
+class SourceReader {
+ public:
+  explicit SourceReader(Source& source) : source_(source), tour_(source.tour) {}
+
+  void read() {
+    const NodeRef root = readYaml(source_.text, source_.path);
+    for (const auto& [key, value] : entriesOf(root, "a walk-through in steps (a table)", mistakes_)) {
+      const auto known = std::find(std::begin(sourceWords), std::end(sourceWords), key->text);
+      if (known == std::end(sourceWords)) {
+        mistakes_.add(key->place,
+                      "expected one of " + enumerate({std::begin(sourceWords), std::end(sourceWords)}) +
+                          ", found " + foundWords(*key) +
+                          didYouMean(key->text, {std::begin(sourceWords), std::end(sourceWords)}));
+      }
+      parts_[key->text] = value;
+    }
+    require("steps", *root);
+    require("controls", *root);
+    if (!part("window") && !part("assets")) {
+      mistakes_.add(root->place, "expected “window”, the file of the host's window, or “assets”");
+    }
+    mistakes_.throwIfAny(source_.path, source_.text);
+    readWindow();
+    readControls();
+    readSteps();
+    mistakes_.throwIfAny(source_.path, source_.text);
+  }
+
+ private:
+  NodeRef part(const std::string& word) const {
+    const auto found = parts_.find(word);
+    return found == parts_.end() ? nullptr : found->second;
+  }
+
+  void require(const std::string& word, const Node& root) {
+    if (!part(word)) mistakes_.add(root.place, "expected an entry " + quote(word));
+  }
+
+  std::optional<std::string> fileIn(const std::string& word) {
+    const NodeRef node = part(word);
+    if (!node) return std::nullopt;
+    const auto name = textOf(*node, "the name of a file", mistakes_);
+    if (!name) return std::nullopt;
+    return (fs::path(source_.path).parent_path() / *name).string();
+  }
+
+  void readWindow() {
+    source_.stage.window = fileIn("window");
+    source_.stage.assets = fileIn("assets");
+    mistakes_.throwIfAny(source_.path, source_.text);
+    tour_.controls = controlsOf(source_.stage, source_.path);
+  }
+
+  void readControls() {
+    for (const auto& [name, value] : entriesOf(part("controls"), "names with tags", mistakes_)) {
+      const auto tag = numberOf(*value, -greatestTag, greatestTag, "the tag of a control", mistakes_);
+      if (!tag) continue;
+      Control* found = nullptr;  // the back-most, as commands find it
+      for (Control& control : tour_.controls) {
+        if (control.tag == *tag && !found) found = &control;
+      }
+      if (!found) {
+        mistakes_.add(value->place, "the window has no control with the tag " + value->text);
+      } else if (!found->name.empty()) {
+        mistakes_.add(name->place, "the control with the tag " + value->text + " is called " +
+                                       quote(found->name) + " already");
+      } else {
+        found->name = name->text;
+      }
+    }
+  }
+
+  void readSteps() {
+    Fragments fragments(mistakes_);
+    if (const NodeRef table = part("fragments")) fragments.read(table);
+    const auto entries = entriesOf(part("steps"), "the steps, by name", mistakes_);
+    std::map<std::string, StepIndex> names;
+    std::map<std::string, NodeRef> bodies;
+    for (const auto& [name, body] : entries) {
+      if (name->text == words::back || name->text == words::end || name->text == words::nothing) {
+        mistakes_.add(name->place, quote(name->text) + " means something else to a press; expected "
+                                                       "another name for the step");
+      }
+      names.emplace(name->text, names.size());
+      bodies[name->text] = fragments.expand(body);
+    }
+    if (entries.empty()) mistakes_.add(part("steps")->place, "expected at least one step");
+    const StepReader reader(tour_.controls, names, mistakes_);
+    tour_.everyStep.controls.resize(tour_.controls.size());
+    if (const NodeRef every = part("every step")) {
+      const NodeRef body = fragments.expand(every);
+      reader.read(*tableOf(body), tour_.everyStep);
+    }
+    for (const auto& [name, body] : entries) {
+      Step step{.name = name->text, .place = name->place};
+      readLike(name->text, *name, bodies, reader, step.words, 0);
+      tour_.steps.push_back(std::move(step));
+    }
+    if (const NodeRef depth = part("back over")) {
+      tour_.mostStepsBack = static_cast<std::size_t>(
+          numberOf(*depth, 0, 1000, "how many steps Back can go", mistakes_).value_or(0));
+    }
+  }
+
+  /// Returns a table that can be read: a step may also be empty.
+  NodeRef tableOf(const NodeRef& body) {
+    if (body->kind == Node::Kind::table) return body;
+    if (body->kind != Node::Kind::nothing) {
+      mistakes_.add(body->place, "expected what the step shows (a table), found " + foundWords(*body));
+    }
+    return std::make_shared<Node>(Node{.kind = Node::Kind::table, .place = body->place});
+  }
+
+  /// Reads a step, after the step that it is like.
+  void readLike(const std::string& name, const Node& at, const std::map<std::string, NodeRef>& bodies,
+                const StepReader& reader, StepWords& words, std::size_t depth) {
+    const auto found = bodies.find(name);
+    if (found == bodies.end()) {
+      std::vector<std::string_view> names;
+      for (const auto& [known, body] : bodies) names.push_back(known);
+      mistakes_.add(at.place,
+                    "no step is called " + foundWords(at) + didYouMean(name, names));
+      return;
+    }
+    if (depth > bodies.size()) {
+      mistakes_.add(at.place, "the step " + quote(name) + " is like itself");
+      return;
+    }
+    const NodeRef body = tableOf(found->second);
+    for (const auto& [key, value] : body->entries) {
+      if (key->text == words::like) readLike(value->text, *value, bodies, reader, words, depth + 1);
+    }
+    reader.read(*body, words);
+  }
+
+  Source& source_;
+  Tour& tour_;
+  Mistakes mistakes_;
+  std::map<std::string, NodeRef> parts_;
+};
+
+}  // namespace
+
+bool isSourcePath(const std::string& path) {
+  return path.ends_with(".yaml") || path.ends_with(".yml");
+}
+
+Source readSource(const std::string& path) {
+  auto text = wholeFile(path);
+  if (!text) throw Failure(ExitStatus::badInput, path + ": cannot be read; expected a walk-through in steps");
+  Source source{.path = path, .text = *std::move(text)};
+  SourceReader(source).read();
+  return source;
+}
+
+}  // namespace qz::tools::steps
