@@ -117,7 +117,8 @@ const StepReader::PropertyRow StepReader::properties[] = {
     {"background", "buttons", isButtonKind, &StepReader::readRed},
     {"state", "buttons", isButtonKind, &StepReader::readState},
     {"shown", "all controls", isAnything, &StepReader::readFlag<&ControlWords::isShown>},
-    {"enabled", "controls that take input", takesInput, &StepReader::readFlag<&ControlWords::isEnabled>},
+    {"enabled", "controls that take input", takesInput,
+     &StepReader::readFlag<&ControlWords::isEnabled>},
     {"flash", "buttons", isButtonKind, &StepReader::readFlag<&ControlWords::flashes>},
     {"press", "buttons", isButtonKind, &StepReader::readPress},
 };
@@ -234,8 +235,9 @@ void StepReader::readFont(ControlIndex /*control*/, const Node& value, ControlWo
   if (size && *size >= 1 && *size <= mostPoints) {
     words.font = Font{value.text.substr(0, space), *size};
   } else {
-    mistakes_.add(value.place, "expected a font and its size in points, such as Helvetica 13, found " +
-                                   foundWords(value));
+    mistakes_.add(
+        value.place,
+        "expected a font and its size in points, such as Helvetica 13, found " + foundWords(value));
   }
 }
 
@@ -290,11 +292,13 @@ std::optional<Lead> StepReader::readLead(const Node& value) const {
 void StepReader::readWait(const Node& key, const NodeRef& value, StepWords& words) const {
   const auto seconds = secondsOf(key.text);
   if (!seconds) {
-    mistakes_.add(key.place, "expected whole seconds, such as “after 5 s”, found " + foundWords(key));
+    mistakes_.add(key.place,
+                  "expected whole seconds, such as “after 5 s”, found " + foundWords(key));
     return;
   }
   Wait wait{.seconds = *seconds, .place = key.place};
-  const auto lead = value->kind == Node::Kind::table ? readWaitTable(value, wait) : readLead(*value);
+  const auto lead =
+      value->kind == Node::Kind::table ? readWaitTable(value, wait) : readLead(*value);
   if (!lead) return;
   wait.lead = *lead;
   words.wait = wait;

@@ -16,8 +16,8 @@ class StepReader {
   StepReader(const std::vector<Control>& controls, const std::map<std::string, StepIndex>& steps,
              Mistakes& mistakes);
 
-  /// Adds what `body` says to `words`; what it says replaces what was said before. `body` is a table
-  /// without fragments; a name may occur in it several times.
+  /// Adds what `body` says to `words`; what it says replaces what was said before. `body` is a
+  /// table without fragments; a name may occur in it several times.
   void read(const Node& body, StepWords& words) const;
 
  private:
