@@ -74,8 +74,21 @@ void checkDirectory(const std::string& path) {
   throw Failure(ExitStatus::badInput, path + what + "; expected one with images");
 }
 
+/// Throws a Failure for a press by name, in a script without names.
+void requireTags(const std::vector<Step>& steps) {
+  for (const Step& step : steps) {
+    const auto* const press = std::get_if<Press>(&step);
+    if (!press || press->name.empty()) continue;
+    throw Failure(ExitStatus::badInput,
+                  "--press: expected a tag (a whole number), found " + quote(press->name));
+  }
+}
+
 void pressIfPossible(Session& session, const Press& press, std::ostream& out) {
-  if (const auto reason = whyNotPress(session.picture(), press.tag)) {
+  const auto tag = tagOf(session.picture(), press);
+  if (!tag) {
+    out << "  " << noSuchName(session.picture(), press.name) << '\n';
+  } else if (const auto reason = whyNotPress(session.picture(), *tag)) {
     out << "  " << *reason << '\n';
   } else {
     session.perform(press);
@@ -91,7 +104,7 @@ void playInteractively(Session& session, const Terminal& terminal) {
       terminal.out << '\n';
       return;
     }
-    const Request request = parseRequest(line);
+    const Request request = parseRequest(line, session.hasNames());
     if (std::holds_alternative<Quit>(request)) return;
     if (const auto* pressed = std::get_if<Press>(&request)) {
       pressIfPossible(session, *pressed, terminal.out);
@@ -141,6 +154,7 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   checkStart(file, startKey);
   const fs::path path = fs::absolute(options.script);
   if (options.resources) checkDirectory(*options.resources);
+  if (!script.from) requireTags(options.steps);
 
   const auto driver = requireDriver(options.toolkit);
   driver->setResourcePath(options.resources ? *options.resources : path.parent_path().string());
@@ -156,7 +170,8 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   const ScriptGuard guard(stage.engine(), options.script, file.dictionary());
   stage.engine().setObserver(std::make_shared<RaisedPlaces>(file, stage.engine(), terminal.log));
   Transcript transcript(terminal.out, terminal.style);
-  Session session(*driver, stage, transcript, screenshots ? &*screenshots : nullptr);
+  Session session(*driver, stage, transcript, screenshots ? &*screenshots : nullptr,
+                  script.names());
 
   if (script.from) {
     session.start(file.dictionary(), startKey);

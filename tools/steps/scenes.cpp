@@ -121,7 +121,9 @@ class Finder {
     }
     situations_[from].scene.presses = std::move(exits);
     const auto& wait = waitAt(tour_, step);
-    if (wait) situations_[from].scene.wait = follow(from, wait->lead);
+    if (!wait) return;
+    const Exit exit = follow(from, wait->lead);
+    if (exit.kind != Exit::Kind::nowhere) situations_[from].scene.wait = exit;
   }
 
   Exit follow(SceneIndex from, const Lead& lead) {

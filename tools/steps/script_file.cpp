@@ -22,6 +22,17 @@ StepIndex stepNamed(const Source& source, const std::string& name) {
 
 }  // namespace
 
+walkthrough::Names ScriptFile::names() const {
+  walkthrough::Names names;
+  if (!from) return names;
+  const Tour& tour = from->source.tour;
+  for (const auto& [tag, control] : from->built.controlOfTag) {
+    if (!tour.controls[control].name.empty()) names.controls[tag] = tour.controls[control].name;
+  }
+  for (const auto& [key, step] : from->built.stepOfKey) names.steps[key] = tour.steps[step].name;
+  return names;
+}
+
 ScriptFile openScript(const std::string& path, const std::string& start) {
   if (!isSourcePath(path)) return {InputFile(path, expectedFile), std::nullopt};
   BuiltSource from{.source = readSource(path), .built = {}};
