@@ -76,7 +76,9 @@ class Compiler {
   std::string nameOf(SceneIndex index) const {
     const Scene& scene = scenes_.list[index];
     std::string name = tour_.steps[scene.step].name;
-    for (const StepIndex step : scene.cameFrom) name += '\n' + tour_.steps[step].name;
+    if (!scene.cameFrom) return name;
+    name += "\tfrom";
+    for (const StepIndex step : *scene.cameFrom) name += '\n' + tour_.steps[step].name;
     return name;
   }
 
