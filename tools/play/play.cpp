@@ -136,14 +136,6 @@ void connectLog(drivers::Driver& driver, const Terminal& terminal) {
   });
 }
 
-/// Returns the window of the options, else that which a source names.
-StageOptions stageOf(const PlayOptions& options, const steps::ScriptFile& script) {
-  if (!script.from || options.stage.window || options.stage.assets) return options.stage;
-  StageOptions stage = script.from->source.stage;
-  stage.sheet = options.stage.sheet;
-  return stage;
-}
-
 }  // namespace
 
 ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
@@ -166,7 +158,7 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   } else if (driver->hasPerson()) {
     driver->useRealTime();
   }
-  Stage stage(*driver, planStage(stageOf(options, script), file.dictionary(), options.script));
+  Stage stage(*driver, planStage(script.stage(options.stage), file.dictionary(), options.script));
   const ScriptGuard guard(stage.engine(), options.script, file.dictionary());
   stage.engine().setObserver(std::make_shared<RaisedPlaces>(file, stage.engine(), terminal.log));
   Transcript transcript(terminal.out, terminal.style);

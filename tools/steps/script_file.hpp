@@ -25,6 +25,8 @@ struct ScriptFile {
 
   /// Returns the names of the source; none for a script that is a file.
   walkthrough::Names names() const;
+  /// Returns what the script is played on: the window of the options, else that of the source.
+  walkthrough::StageOptions stage(walkthrough::StageOptions options) const;
 };
 
 /// Reads the script at `path`, or builds it if this is a source, which can then be started at the

@@ -2,6 +2,7 @@
 // Puts names into pictures.
 #include "tools/walkthrough/names.hpp"
 
+#include "tools/support/text_layout.hpp"
 #include "tools/walkthrough/parse_number.hpp"
 
 namespace qz::tools::walkthrough {
@@ -14,6 +15,13 @@ std::string nameIn(const std::map<Key, std::string>& names, const Key& key) {
 }
 
 }  // namespace
+
+std::string Names::controlWords(toolkit::Tag tag) const {
+  const std::string name = nameIn(controls, tag);
+  return name.empty() ? std::to_string(tag) : quote(name);
+}
+
+std::string Names::stepOf(const std::string& key) const { return nameIn(steps, key); }
 
 std::string Naming::controlName(const std::string& tag) const {
   const auto number = parseNumber<toolkit::Tag>(tag);

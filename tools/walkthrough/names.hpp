@@ -15,6 +15,10 @@ struct Names {
   std::map<std::string, std::string> steps{};      ///< by the key of each list that leads to a step
 
   bool isEmpty() const { return controls.empty(); }
+  /// Returns the name of the control that has the tag, between “ and ”; the tag if it has no name.
+  std::string controlWords(toolkit::Tag tag) const;
+  /// Returns the name of the step to which the list leads; empty if it leads to none.
+  std::string stepOf(const std::string& key) const;
 };
 
 /// Puts names into pictures. Pictures must come in the order in which they were taken: a list that

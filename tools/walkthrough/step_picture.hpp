@@ -31,7 +31,7 @@ class Identity {
 };
 
 struct ControlPicture {
-  Identity identity;  ///< of the control, even after its tag has changed
+  Identity identity;   ///< of the control, even after its tag has changed
   std::string name{};  ///< what the script's source calls it; empty: it has no name
   drivers::ViewPicture view;
   bool flashing = false;  ///< every tick of the flasher toggles its highlight
