@@ -57,4 +57,9 @@ ScriptFile openScript(const std::string& path, const std::string& start) {
   return {std::move(file), std::move(from)};
 }
 
+InputFile openPropertyList(const std::string& path) {
+  if (isSourcePath(path)) return openScript(path).file;
+  return {path, "a property list", ExitStatus::failed};
+}
+
 }  // namespace qz::tools::steps

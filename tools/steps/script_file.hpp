@@ -34,4 +34,7 @@ struct ScriptFile {
 /// another Failure if a file cannot be read or does not hold what it should.
 ScriptFile openScript(const std::string& path, const std::string& start = {});
 
+/// Reads any property list; of a source, the script that is built of it.
+InputFile openPropertyList(const std::string& path);
+
 }  // namespace qz::tools::steps
