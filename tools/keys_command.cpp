@@ -51,6 +51,7 @@ void describeKeys(Command& command) {
 
 }  // namespace
 
-constexpr CommandEntry keysCommand{"keys", "Print the keys of a script's lists, or the names of a source's steps", describeKeys};
+constexpr CommandEntry keysCommand{
+    "keys", "Print the keys of a script's lists, or the names of a source's steps", describeKeys};
 
 }  // namespace qz::tools

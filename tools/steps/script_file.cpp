@@ -43,9 +43,10 @@ walkthrough::StageOptions ScriptFile::stage(walkthrough::StageOptions options) c
   return options;
 }
 
-ScriptFile openScript(const std::string& path, const std::string& start) {
+ScriptFile openScript(const std::string& path, const std::string& start,
+                      const Translate& translate) {
   if (!isSourcePath(path)) return {InputFile(path, expectedFile), std::nullopt};
-  BuiltSource from{.source = readSource(path), .built = {}};
+  BuiltSource from{.source = readSource(path, translate), .built = {}};
   // The first step stays a start, so that the others are reached as ever.
   std::vector<StepIndex> starts = {0};
   const StepIndex first = start.empty() ? 0 : stepNamed(from.source, start);
