@@ -119,6 +119,7 @@ TEST(Mistakes, OfYamlHavePlaces) {
   EXPECT_EQ(first("[]"), "1:1: expected a walk-through in steps (a table), found a list");
   EXPECT_EQ(first("a: *b"), "1:4: nothing before this has the anchor “b”");
   EXPECT_TRUE(first("--- a\n--- b\n").starts_with("2:"));
+  EXPECT_EQ(first("a: b\n%\x80"), "2:1: expected no directive at the beginning of a line");
   std::string deep;
   for (int i = 0; i < 100000; ++i) deep += "- ";
   for (const std::string& text : {deep, std::string(100000, '['), std::string(100000, '{')}) {

@@ -55,8 +55,8 @@ std::vector<Control> controlsOf(const walkthrough::StageOptions& options, const 
 /// of the file.
 class SourceReader {
  public:
-  SourceReader(Source& source, const Translate& translate)
-      : source_(source), tour_(source.tour), texts_(translate) {}
+  SourceReader(Source& source, const ReadControls& readControls, const Translate& translate)
+      : source_(source), tour_(source.tour), readControls_(readControls), texts_(translate) {}
 
   void read() {
     const NodeRef root = readYaml(source_.text, source_.path);
@@ -107,7 +107,7 @@ class SourceReader {
     source_.stage.window = fileIn("window");
     source_.stage.assets = fileIn("assets");
     mistakes_.throwIfAny(source_.path, source_.text);
-    tour_.controls = controlsOf(source_.stage, source_.path);
+    tour_.controls = readControls_(source_.stage);
   }
 
   void readControls() {
@@ -199,6 +199,7 @@ class SourceReader {
 
   Source& source_;
   Tour& tour_;
+  const ReadControls& readControls_;
   Texts texts_;
   Mistakes mistakes_;
   std::map<std::string, NodeRef> parts_;
@@ -215,8 +216,15 @@ Source readSource(const std::string& path, const Translate& translate) {
   if (!text)
     throw Failure(ExitStatus::badInput,
                   path + ": cannot be read; expected a walk-through in steps");
-  Source source{.path = path, .text = *std::move(text)};
-  SourceReader(source, translate).read();
+  return readSourceText(
+      path, *std::move(text),
+      [&](const walkthrough::StageOptions& stage) { return controlsOf(stage, path); }, translate);
+}
+
+Source readSourceText(const std::string& path, std::string text, const ReadControls& readControls,
+                      const Translate& translate) {
+  Source source{.path = path, .text = std::move(text)};
+  SourceReader(source, readControls, translate).read();
   return source;
 }
 

@@ -2,6 +2,7 @@
 // The source of a walk-through: a YAML file.
 #pragma once
 
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -21,6 +22,13 @@ struct Source {
 
 /// Whether the file's name is that of a source: it ends with .yaml or .yml.
 bool isSourcePath(const std::string& path);
+
+/// Returns the controls of the window that the options name, back to front.
+using ReadControls = std::function<std::vector<Control>(const walkthrough::StageOptions&)>;
+
+/// Reads a source from its text. Throws a SourceRefused if there are mistakes in it.
+Source readSourceText(const std::string& path, std::string text, const ReadControls& readControls,
+                      const Translate& translate = {});
 
 /// Reads a source, and the window that it names. With `translate` its texts are in another
 /// language. Throws a SourceRefused if there are mistakes in it, another Failure if a file cannot
