@@ -186,8 +186,8 @@ class YamlParser {
   std::unique_ptr<fy_parser, Destroyer> parser_;
 };
 
-/// Refuses lines that begin with a percent sign: a source needs no directives, and the parser does not
-/// come back from some that are wrong.
+/// Refuses lines that begin with a percent sign: a source needs no directives, and the parser does
+/// not come back from some that are wrong.
 void refuseDirectives(std::string_view text) {
   for (std::size_t i = 0; i < text.size(); i = text.find('\n', i) + 1) {
     if (text[i] == '%') throw YamlRefusal{i, "expected no directive at the beginning of a line"};
