@@ -26,7 +26,7 @@
 #include "qz/drivers/view_kinds.hpp"
 #include "qz/toolkit/exception.hpp"
 #include "tools/check/report.hpp"
-#include "tools/check/world.hpp"
+#include "tools/exploration/world.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/walkthrough/stand_in.hpp"
 #include "tools/walkthrough/step_picture.hpp"

@@ -45,6 +45,10 @@ class QZ_API Observer {
   virtual void controlSought(toolkit::Tag /*tag*/, const toolkit::Ref<toolkit::View>& /*control*/) {
   }
 
+  /// The user or a timer has pressed a control; the list under its tag, if there is one, follows.
+  /// Pending timers are cancelled before.
+  virtual void controlPressed(const toolkit::Ref<toolkit::View>& /*control*/) {}
+
   /// An object timer of `seconds` has started under a tag key. It replaces a pending timer under
   /// that key.
   virtual void timerSet(std::string_view /*key*/, double /*seconds*/) {}

@@ -9,8 +9,8 @@
 #include "qz/toolkit/qt/application.hpp"
 #include "qz/toolkit/qt/calls.hpp"
 #include "qz/toolkit/qt/clock.hpp"
+#include "qz/toolkit/qt/files.hpp"
 #include "qz/toolkit/qt/log.hpp"
-#include "qz/toolkit/system_files.hpp"
 #include "qz/toolkit/toolkit.hpp"
 
 namespace qz::toolkit::qt {
@@ -33,8 +33,8 @@ class QZ_API QtToolkit final : public Toolkit {
   Images& images() override;
   /// Returns what finds fonts by name.
   Fonts& fonts() override;
-  /// Returns what reads files, and knows the resource directory.
-  SystemFiles& files() override;
+  /// Returns what reads files and Qt resources, and knows the resource directory.
+  QtFiles& files() override;
   /// Returns what writes diagnostic lines.
   QtLog& log() override;
 
