@@ -13,7 +13,10 @@ namespace qz {
 
 namespace {
 
-bool isAbsolutePath(std::string_view path) {
+bool isAbsolutePath(std::string path) {
+  // Windows cannot convert what is not UTF-8, and only the ASCII characters matter here.
+  std::replace_if(
+      path.begin(), path.end(), [](char c) { return static_cast<unsigned char>(c) >= 0x80; }, 'x');
   return path.starts_with('~') || std::filesystem::path(path).is_absolute();
 }
 

@@ -4,6 +4,8 @@
 #include <algorithm>
 #include <charconv>
 #include <limits>
+#include <locale>
+#include <sstream>
 #include <string>
 #include <system_error>
 
@@ -66,7 +68,7 @@ Integer truncated(double value) {
 }
 
 /// Whether a decimal real that does not fit in a double is too large rather than too small.
-bool isHuge(std::string_view unsignedDecimal) {
+[[maybe_unused]] bool isHuge(std::string_view unsignedDecimal) {
   const std::size_t mantissa = unsignedDecimal.find_first_of("eE");
   const bool negativeExponent =
       mantissa != std::string_view::npos && unsignedDecimal.substr(mantissa + 1).starts_with('-');
@@ -80,6 +82,21 @@ bool isHuge(std::string_view unsignedDecimal) {
   if (first == std::string_view::npos) return false;
   exponent += static_cast<std::int64_t>(point) - static_cast<std::int64_t>(first);
   return exponent > 0;
+}
+
+double unsignedDecimalValue(std::string_view text) {
+  double value = 0;
+#if defined(__cpp_lib_to_chars)
+  const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
+  if (error != std::errc::result_out_of_range) return value;
+  return isHuge(text) ? std::numeric_limits<double>::infinity() : 0;
+#else
+  // libc++ before version 20 has no such function for reals. This one sets infinity or 0 by itself.
+  std::istringstream stream{std::string(text)};
+  stream.imbue(std::locale::classic());
+  stream >> value;
+  return value;
+#endif
 }
 
 }  // namespace
@@ -114,18 +131,18 @@ std::string_view withoutLeadingAsciiSpace(std::string_view text) {
   return text;
 }
 
-std::size_t decimalLength(std::string_view text) {
-  std::size_t at = !text.empty() && isSign(text.front()) ? 1 : 0;
-  const std::size_t whole = digitCount(text.substr(at));
-  at += whole;
-  std::size_t fraction = 0;
-  if (text.substr(at).starts_with('.')) {
-    fraction = digitCount(text.substr(at + 1));
-    if (whole + fraction == 0) return 0;
-    at += 1 + fraction;
-  }
+std::size_t fixedDecimalLength(std::string_view text) {
+  const std::size_t sign = !text.empty() && isSign(text.front()) ? 1 : 0;
+  const std::size_t whole = digitCount(text.substr(sign));
+  const std::string_view rest = text.substr(sign + whole);
+  const std::size_t fraction = rest.starts_with('.') ? digitCount(rest.substr(1)) : 0;
   if (whole + fraction == 0) return 0;
-  if (at == text.size() || (text[at] != 'e' && text[at] != 'E')) return at;
+  return sign + whole + (rest.starts_with('.') ? 1 + fraction : 0);
+}
+
+std::size_t decimalLength(std::string_view text) {
+  const std::size_t at = fixedDecimalLength(text);
+  if (at == 0 || at == text.size() || (text[at] != 'e' && text[at] != 'E')) return at;
   std::size_t exponent = at + 1;
   if (exponent < text.size() && isSign(text[exponent])) ++exponent;
   const std::size_t digits = digitCount(text.substr(exponent));
@@ -135,11 +152,7 @@ std::size_t decimalLength(std::string_view text) {
 double decimalValue(std::string_view text) {
   const bool negative = text.starts_with('-');
   if (!text.empty() && isSign(text.front())) text.remove_prefix(1);
-  double value = 0;
-  const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), value);
-  if (error == std::errc::result_out_of_range) {
-    value = isHuge(text) ? std::numeric_limits<double>::infinity() : 0;
-  }
+  const double value = unsignedDecimalValue(text);
   return negative ? -value : value;
 }
 

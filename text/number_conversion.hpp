@@ -38,6 +38,8 @@ std::string_view withoutLeadingAsciiSpace(std::string_view text);
 /// with or without a point (at least one digit) and an optional exponent with digits. 0 if there is
 /// none.
 std::size_t decimalLength(std::string_view text);
+/// The same without an exponent.
+std::size_t fixedDecimalLength(std::string_view text);
 /// Converts `text`, all of which `decimalLength` must accept, to the nearest double; infinity if it
 /// is too large. Zero keeps its sign.
 double decimalValue(std::string_view text);

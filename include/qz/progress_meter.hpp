@@ -15,18 +15,19 @@ namespace qz {
 
 /// What the further course of a walk-through can depend on in one control.
 struct ControlOutline {
+  /// The kinds that commands treat in different ways.
   enum class Kind : std::uint8_t { button, textField, imageView, other };
 
-  Kind kind = Kind::other;
-  toolkit::Tag tag = 0;
-  bool isHidden = false;
-  bool isEnabled = true;
+  Kind kind = Kind::other;  ///< which commands act on the control
+  toolkit::Tag tag = 0;     ///< the tag that it has now
+  bool isHidden = false;    ///< by itself, not by what contains it
+  bool isEnabled = true;    ///< by itself, not by what contains it
 };
 
-/// The controls of a walk-through window from back to front, and the keys of its pending timers.
+/// The controls of a walk-through window, and what its timers will run.
 struct WindowOutline {
-  std::vector<ControlOutline> controls;
-  std::vector<std::string> timers = {};
+  std::vector<ControlOutline> controls;  ///< from back to front
+  std::vector<std::string> timers = {};  ///< the keys of the pending timers' lists
 };
 
 /// Accompanies one walk-through at a time.

@@ -55,6 +55,18 @@ TEST_F(ScriptLoading, NoNameIsTheNameOfNothing) {
   EXPECT_TRUE(load(std::nullopt, "1"));
 }
 
+TEST_F(ScriptLoading, AnAbsoluteNameIsNotLookedForInTheResources) {
+  write("intro.plist", "{ 1 = ( IDLE_LOOP ); }");
+  driver.setResourcePath((resources / "elsewhere").generic_string());
+  EXPECT_FALSE(load("intro.plist", "1"));
+  EXPECT_TRUE(load((resources / "intro.plist").generic_string(), "1"));
+}
+
+TEST_F(ScriptLoading, ANameThatIsNotUtf8IsMissing) {
+  EXPECT_FALSE(load("\xFF.plist", "1"));
+  EXPECT_FALSE(load((resources / "intro").generic_string() + "\xFF", "1"));
+}
+
 TEST_F(ScriptLoading, AScriptCanBeChangedItsListsCannot) {
   write("intro.plist", "{ 1 = ( IDLE_LOOP ); }");
   ASSERT_TRUE(load("intro.plist", "1"));

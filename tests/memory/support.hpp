@@ -3,12 +3,12 @@
 #pragma once
 
 #include <gtest/gtest.h>
-#include <unistd.h>
 
 #include <filesystem>
 #include <fstream>
 #include <functional>
 #include <memory>
+#include <random>
 #include <string>
 #include <string_view>
 #include <utility>
@@ -64,17 +64,16 @@ class SheetRecorder : public SheetDelegate {
 class Directory {
  public:
   Directory() {
-    static int made = 0;
     path_ = std::filesystem::temp_directory_path() /
-            ("memory-toolkit-" + std::to_string(::getpid()) + "-" + std::to_string(made++));
+            ("memory-toolkit-" + std::to_string(std::random_device()()));
     std::filesystem::create_directories(path_);
   }
   ~Directory() { std::filesystem::remove_all(path_); }
   Directory(const Directory&) = delete;
   Directory& operator=(const Directory&) = delete;
 
-  std::string path() const { return path_.string(); }
-  std::string path(const std::string& name) const { return (path_ / name).string(); }
+  std::string path() const { return path_.generic_string(); }
+  std::string path(const std::string& name) const { return (path_ / name).generic_string(); }
   void write(const std::string& name, std::string_view contents) const {
     std::filesystem::create_directories((path_ / name).parent_path());
     std::ofstream(path_ / name, std::ios::binary) << contents;

@@ -31,8 +31,8 @@ class OutOfMemory : public testing::Test {
 
 TEST_F(OutOfMemory, LoadingAScriptEndsAndCanBeTriedAgain) {
   engine->getGuiAssetsFromWindow(window);
-  const std::optional<std::string> scripts[] = {QZ_TEST_DATA "/mixed-script.plist",
-                                                QZ_TEST_DATA "/mixed-script-binary.plist"};
+  driver.setResourcePath(QZ_TEST_DATA);
+  const std::optional<std::string> scripts[] = {"mixed-script.plist", "mixed-script-binary.plist"};
   for (const auto& script : scripts) {
     bool loaded = false;
     const int failures = failuresOf([&] {

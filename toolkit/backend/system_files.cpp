@@ -14,11 +14,17 @@ namespace fs = std::filesystem;
 
 namespace {
 
-// Converts from UTF-8, which the interface uses, to the system's encoding.
-fs::path systemPath(std::string_view path) { return std::u8string(path.begin(), path.end()); }
+// Converts from UTF-8, which the interface uses, to the system's encoding. Windows has no file
+// whose name is not UTF-8.
+fs::path systemPath(std::string_view path) try {
+  return std::u8string(path.begin(), path.end());
+} catch (const std::system_error&) {
+  return {};
+}
 
+// Returns the path in UTF-8, with slashes on every system, so that code may append to it.
 std::string utf8(const fs::path& path) {
-  const std::u8string text = path.u8string();
+  const std::u8string text = path.generic_u8string();
   return {text.begin(), text.end()};
 }
 

@@ -30,6 +30,11 @@ class TimedRunLoop : public RunLoop {
   /// Whether timers may fire; NO while the user is busy.
   virtual bool isInDefaultMode() const = 0;
 
+  /// Invalidates every timer. This destroys the objects held by their actions, which may still use
+  /// the run loop and its toolkit. Therefore the destructors of derived classes and of toolkits
+  /// must call it: this class's destructor runs too late.
+  void invalidateAll();
+
  protected:
   /// Called before each firing with the time at which the timer was due. The timer is already off
   /// the queue.
@@ -42,10 +47,6 @@ class TimedRunLoop : public RunLoop {
   void fireDue(double until);
   /// Returns the time at which the next timer is due; absent if there is no timer.
   std::optional<double> nextDue() const;
-  /// Invalidates every timer. This destroys the objects held by their actions, which may still use
-  /// the run loop. Therefore the destructors of derived classes must call it: this class's
-  /// destructor runs too late.
-  void invalidateAll();
 
  private:
   class ScheduledTimer;

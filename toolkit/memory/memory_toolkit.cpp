@@ -8,7 +8,8 @@
 namespace qz::toolkit::memory {
 
 MemoryToolkit::MemoryToolkit() : parts_(std::make_unique<Parts>()) {}
-MemoryToolkit::~MemoryToolkit() = default;
+// The engines that timers hold end while `parts_` still leads to the parts that they use.
+MemoryToolkit::~MemoryToolkit() { parts_->runLoop.invalidateAll(); }
 
 MemoryApplication& MemoryToolkit::application() { return parts_->application; }
 RunLoop& MemoryToolkit::runLoop() { return parts_->runLoop; }

@@ -9,7 +9,8 @@ namespace qz::toolkit::qt {
 
 QtToolkit::QtToolkit() : parts_(std::make_unique<Parts>()) {}
 QtToolkit::QtToolkit(Clock& clock) : parts_(std::make_unique<Parts>(clock)) {}
-QtToolkit::~QtToolkit() = default;
+// The engines that timers hold end while `parts_` still leads to the parts that they use.
+QtToolkit::~QtToolkit() { parts_->runLoop.invalidateAll(); }
 
 QtApplication& QtToolkit::application() { return parts_->application; }
 RunLoop& QtToolkit::runLoop() { return parts_->runLoop; }

@@ -4,12 +4,14 @@
 #pragma once
 
 #include <charconv>
+#include <cmath>
 #include <cstdint>
 #include <optional>
 #include <string>
 #include <string_view>
 
 #include "text/ascii.hpp"
+#include "text/number_conversion.hpp"
 
 namespace qz::toolkit::html {
 
@@ -46,18 +48,11 @@ constexpr std::string_view takeWord(std::string_view& text) {
 
 /// Cuts off and returns the decimal number at the start of `text`, as in "-1.5em".
 inline std::optional<double> takeNumber(std::string_view& text) {
-  const bool negative = text.starts_with('-');
-  const std::string_view digits = negative || text.starts_with('+') ? text.substr(1) : text;
-  // Without this check from_chars would accept a second sign, "inf" and "nan".
-  if (digits.empty() || (!text::isDigit(digits.front()) && digits.front() != '.')) {
-    return std::nullopt;
-  }
-  double number = 0;
-  const auto [end, error] = std::from_chars(digits.data(), digits.data() + digits.size(), number,
-                                            std::chars_format::fixed);
-  if (error != std::errc()) return std::nullopt;
-  text.remove_prefix(static_cast<std::size_t>(end - text.data()));
-  return negative ? -number : number;
+  const std::size_t length = text::fixedDecimalLength(text);
+  const double number = text::decimalValue(text.substr(0, length));
+  if (length == 0 || std::isinf(number)) return std::nullopt;
+  text.remove_prefix(length);
+  return number;
 }
 
 /// Returns the integer at the start of an attribute's value; absent if there is none or it exceeds

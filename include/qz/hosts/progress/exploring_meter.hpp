@@ -11,9 +11,9 @@ namespace qz::hosts::progress {
 
 /// How far a meter explores. Beyond that the progress is not known.
 struct ExplorationBounds {
-  std::size_t places = 100'000;
+  std::size_t places = 100'000;                ///< states of the walk-through
   std::size_t bytes = std::size_t{64} << 20U;  ///< of memory, about
-  double seconds = 10;
+  double seconds = 10;                         ///< of real time
 };
 
 /// Returns a meter that explores each script on a thread of its own, once for each walk-through. A

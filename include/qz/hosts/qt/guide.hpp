@@ -24,15 +24,15 @@ struct GuideTags {
   toolkit::Tag progress = 904;  ///< a text field, such as "2 of 5"
   toolkit::Tag target = 905;    ///< a hidden text field: the tag of the control to point at
   toolkit::Tag skip = 906;      ///< a button
-  /// Buttons. The tags after each are free for a script that gives the button another tag for each
-  /// step.
+  /// A button. The tags after it are free for a script that gives it another tag for each step.
   toolkit::Tag back = 1000;
+  /// A button. The tags after it are free for a script that gives it another tag for each step.
   toolkit::Tag next = 2000;
 };
 
 /// What a guide looks like, and which keys it has.
 struct GuideOptions {
-  GuideTags tags = {};
+  GuideTags tags = {};  ///< of the panel's controls
   /// Whether the control has a frame around it.
   bool frame = true;
   /// Whether the rest of the window is dimmed. With high contrast nothing is dimmed.

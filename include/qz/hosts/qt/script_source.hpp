@@ -23,11 +23,17 @@ class QZ_API ScriptSource {
  public:
   // Implicit on purpose: these are arguments of `WalkThrough::play`.
   // NOLINTBEGIN(google-explicit-constructor)
+  /// Takes a path or the text of a URL.
   ScriptSource(const QString& path);
+  /// Takes the URL of a file or a resource.
   ScriptSource(const QUrl& url);
+  /// Takes the property list itself.
   ScriptSource(const QByteArray& bytes) : bytes_(bytes) {}
+  /// Takes a path or the text of a URL, in UTF-8.
   ScriptSource(const char* path) : ScriptSource(QString(path)) {}
+  /// Takes a path or the text of a URL, in UTF-8.
   ScriptSource(std::string_view path);
+  /// Takes a path or the text of a URL, in UTF-8.
   ScriptSource(const std::string& path) : ScriptSource(std::string_view(path)) {}
   // NOLINTEND(google-explicit-constructor)
 
@@ -38,8 +44,9 @@ class QZ_API ScriptSource {
   /// Returns the name of the script for messages.
   QString name() const;
 
-  /// Returns the source as a value that settings can keep, and the source of such a value.
+  /// Returns the source as a value that settings can keep.
   QVariant toVariant() const;
+  /// Returns the source of such a value.
   static ScriptSource fromVariant(const QVariant& value);
 
  private:

@@ -37,8 +37,11 @@ struct ReadScript;
 /// at any moment, and so may the windows.
 class QZ_API WalkThrough : public QObject {
   Q_OBJECT
+  /// Whether a walk-through is running.
   Q_PROPERTY(bool running READ isRunning NOTIFY runningChanged)
+  /// The key of the list that ran last; see `step()`.
   Q_PROPERTY(QString step READ step NOTIFY stepChanged)
+  /// How much is done; see `progress()`.
   Q_PROPERTY(double progress READ progress NOTIFY progressChanged)
 
  public:
@@ -92,6 +95,7 @@ class QZ_API WalkThrough : public QObject {
   /// Plays the script of a state, and makes its steps again at once. The timers of the last step
   /// start anew. Fails like `play`, and if the script no longer has a list that the state needs.
   bool resume(const QVariantMap& state, QWidget& window);
+  /// The same in `panel`, a top-level widget, which is shown as a sheet over `window`.
   bool resumeInSheet(const QVariantMap& state, QWidget& panel, QWidget& window);
 
   /// Returns a description of a top-level widget, as a walk-through sees it, for the option
@@ -104,6 +108,7 @@ class QZ_API WalkThrough : public QObject {
   /// destroyed, when its main window gets another central widget, and when the application quits.
   void end() { finish(Reason::endedByHost); }
 
+  /// Whether a walk-through is running.
   bool isRunning() const { return engine_ != nullptr; }
   /// Returns the key of the list that the start, a press or a timer ran last; empty before the
   /// first.
@@ -113,6 +118,7 @@ class QZ_API WalkThrough : public QObject {
   double progress() const { return progress_; }
   /// Returns the engine; null if no walk-through is running. Its observer is this object's.
   const std::shared_ptr<QZ_Plist_State_Parser>& engine() const { return engine_; }
+  /// Returns the toolkit of the walk-throughs: the host's, or else this object's own.
   toolkit::qt::QtToolkit& toolkit() { return toolkit_; }
 
  Q_SIGNALS:
@@ -124,7 +130,9 @@ class QZ_API WalkThrough : public QObject {
   void finished(qz::hosts::qt::WalkThrough::Reason reason);
   /// A script was not played, or a command of the running one has raised. The log says the same.
   void failed(const QString& what);
+  /// The property `progress` has another value.
   void progressChanged(double progress);
+  /// A walk-through has begun, or the running one is over.
   void runningChanged();
 
  private:
