@@ -44,6 +44,7 @@ void describeBuild(Command& command) {
 
 }  // namespace
 
-constexpr CommandEntry buildCommand{"build", "Make a script of a walk-through in steps", describeBuild};
+constexpr CommandEntry buildCommand{"build", "Make a script of a walk-through in steps",
+                                    describeBuild};
 
 }  // namespace qz::tools

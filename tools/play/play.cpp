@@ -136,7 +136,8 @@ StageOptions stageOf(const PlayOptions& options, const steps::ScriptFile& script
 ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   const steps::ScriptFile script = steps::openScript(options.script, options.startKey);
   const InputFile& file = script.file;
-  const std::string startKey = script.from ? script.from->built.startKeys.front() : options.startKey;
+  const std::string startKey =
+      script.from ? script.from->built.startKeys.front() : options.startKey;
   checkStart(file, startKey);
   const fs::path path = fs::absolute(options.script);
   if (options.resources) checkDirectory(*options.resources);

@@ -23,24 +23,33 @@ constexpr const char* setTag = "SET_TAG_FOR_OBJECT_ID";
 constexpr const char* setTimer = "SET_TIMER_FOR_ID";
 constexpr const char* terminate = "TERMINATE_PARSER";
 
+// About what the command that runs a shared list takes in a file.
+constexpr std::size_t sizeOfProcess = 70;
+
 /// What a press does in every scene, so that the button can have one tag in all of them.
 enum class Everywhere { ends, doesNothing };
 
 class Compiler {
  public:
   Compiler(const Tour& tour, Scenes scenes)
-      : tour_(tour), scenes_(std::move(scenes)), initial_(initialLook(tour)) {
+      : tour_(tour),
+        scenes_(std::move(scenes)),
+        initial_(initialLook(tour)),
+        everyStep_(everyStepLook(tour)) {
     for (const Control& control : tour.controls) numbers_.reserve(control.tag);
-    for (const Scene& scene : scenes_.list) looks_.push_back(lookOf(tour, scene.step, scene.canGoBack));
+    for (const Scene& scene : scenes_.list) addLook(scene);
     findWhatChanges();
     chooseOwnTags();
     chooseTags();
+    chooseShared();
   }
 
   Built run() {
     for (std::size_t i = 0; i < scenes_.starts.size(); ++i) addStart(i);
     for (SceneIndex i = 0; i < scenes_.list.size(); ++i) addScene(i);
-    for (const auto& [scene, key] : bodies_) writer_.add(key, placeOf(scene), body(scene));
+    for (const auto& [look, list] : shared_) {
+      writer_.add(list.second, placeOf(list.first), sharedValues(list.first));
+    }
     built_.script = writer_.script();
     built_.offsets = writer_.offsets();
     return std::move(built_);
@@ -52,12 +61,21 @@ class Compiler {
     Property property;
   };
 
+  void addLook(const Scene& scene) {
+    const auto [known, isNew] =
+        lookNumbers_.try_emplace({scene.step, scene.canGoBack}, looks_.size());
+    if (isNew) looks_.push_back(lookOf(tour_, scene.step, scene.canGoBack));
+    lookOfScene_.push_back(known->second);
+  }
+
+  const Look& lookAt(SceneIndex scene) const { return looks_[lookOfScene_[scene]]; }
+
   Place placeOf(SceneIndex scene) const { return tour_.steps[scenes_.list[scene].step].place; }
 
   std::string nameOf(SceneIndex index) const {
     const Scene& scene = scenes_.list[index];
     std::string name = tour_.steps[scene.step].name;
-    for (const StepIndex step : scene.way) name += '\n' + tour_.steps[step].name;
+    for (const StepIndex step : scene.cameFrom) name += '\n' + tour_.steps[step].name;
     return name;
   }
 
@@ -67,8 +85,7 @@ class Compiler {
   }
 
   const std::optional<Wait>& waitOf(SceneIndex scene) const {
-    const auto& own = tour_.steps[scenes_.list[scene].step].words.wait;
-    return own ? own : tour_.everyStep.wait;
+    return waitAt(tour_, scenes_.list[scene].step);
   }
 
   /// Finds which properties are not the same in every scene and in the host's window.
@@ -102,7 +119,7 @@ class Compiler {
     for (SceneIndex scene = 0; scene < scenes_.list.size(); ++scene) {
       for (ControlIndex i = 0; i < tour_.controls.size(); ++i) {
         const auto use = everywhere(scene, i);
-        if (!use || looks_[scene].controls[i].flashes) continue;
+        if (!use || lookAt(scene).controls[i].flashes) continue;
         if (ownUse_[i] != Everywhere::ends) ownUse_[i] = use;
       }
     }
@@ -115,9 +132,16 @@ class Compiler {
         const Tag tag = tagFor(scene, i);
         tags_[scene].push_back(tag);
         built_.controlOfTag[tag] = i;
-        if (looks_[scene].controls[i].flashes) addOnce(flashing_, tag);
+        if (lookAt(scene).controls[i].flashes) addOnce(flashing_, tag);
       }
     }
+    for (ControlIndex i = 0; i < tour_.controls.size(); ++i) keepsTag_.push_back(keepsTag(i));
+  }
+
+  bool keepsTag(ControlIndex control) const {
+    return std::all_of(tags_.begin(), tags_.end(), [&](const std::vector<Tag>& tags) {
+      return tags[control] == tour_.controls[control].tag;
+    });
   }
 
   static void addOnce(std::vector<Tag>& tags, Tag tag) {
@@ -127,17 +151,19 @@ class Compiler {
   Tag tagFor(SceneIndex scene, ControlIndex control) {
     const Tag own = tour_.controls[control].tag;
     if (!scenes_.list[scene].presses[control]) return own;
-    const bool flashes = looks_[scene].controls[control].flashes;
+    const bool flashes = lookAt(scene).controls[control].flashes;
     const auto use = everywhere(scene, control);
     if (use && !flashes && ownUse_[control] == use) return own;
-    const std::string what = use ? (use == Everywhere::ends ? "ends" : "does nothing") : nameOf(scene);
+    const std::string what =
+        use ? (use == Everywhere::ends ? "ends" : "does nothing") : nameOf(scene);
     return numbers_.of(nameOfControl(control) + (flashes ? "\tflashing\t" : "\t") + what);
   }
 
   Tag timerKey(SceneIndex scene) { return numbers_.of("after\t" + nameOf(scene)); }
 
-  static TaggedCommand tagged(const char* name, std::vector<std::variant<std::string, int, bool>> parameters,
-                              Tag tag, Place place) {
+  static TaggedCommand tagged(const char* name,
+                              std::vector<std::variant<std::string, int, bool>> parameters, Tag tag,
+                              Place place) {
     return {{name, std::move(parameters), place}, tag};
   }
 
@@ -152,31 +178,70 @@ class Compiler {
     }
   }
 
-  /// Sets everything that changes, in a window whose controls have their own tags.
-  List body(SceneIndex scene) const {
+  /// Whether the value is not what every step has, in a control that keeps its tag: such a value
+  /// can be set by a list that all moves to the step share.
+  bool canBeShared(SceneIndex scene, const Varying& varying) const {
+    const auto& [control, property] = varying;
+    return keepsTag_[control] &&
+           lookAt(scene).controls[control][property] != everyStep_.controls[control][property];
+  }
+
+  List sharedValues(SceneIndex scene) const {
     List list;
-    for (const auto& [control, property] : varying_) {
-      setValues(list, looks_[scene].controls[control][property], tour_.controls[control].tag, placeOf(scene));
+    for (const Varying& each : varying_) {
+      if (!canBeShared(scene, each)) continue;
+      setValues(list, lookAt(scene).controls[each.control][each.property],
+                tour_.controls[each.control].tag, placeOf(scene));
     }
-    if (changesBackground_) setValues(list, looks_[scene].background, std::nullopt, placeOf(scene));
     return list;
   }
 
-  Tag bodyKey(SceneIndex scene) {
-    const auto same = std::find_if(bodies_.begin(), bodies_.end(), [&](const auto& known) {
-      return scenes_.list[known.first].step == scenes_.list[scene].step &&
-             scenes_.list[known.first].canGoBack == scenes_.list[scene].canGoBack;
-    });
-    if (same != bodies_.end()) return same->second;
-    const bool canGoBack = scenes_.list[scene].canGoBack;
-    const Tag key = numbers_.of("look\t" + tour_.steps[scenes_.list[scene].step].name +
-                                (canGoBack ? "\tback" : ""));
-    bodies_.emplace_back(scene, key);
-    return key;
+  /// Whether the value is not known to be there already when the user comes from another scene.
+  bool mustBeSet(SceneIndex from, SceneIndex to, const Varying& varying) const {
+    const auto& [control, property] = varying;
+    if (property == Property::state) return true;  // the user may have changed it since
+    return lookAt(from).controls[control][property] != lookAt(to).controls[control][property];
+  }
+
+  /// Chooses the steps whose values are in a list of their own, because several moves lead there.
+  void chooseShared() {
+    struct Sizes {
+      std::size_t direct = 0;
+      std::size_t shared = 0;
+    };
+    std::map<std::size_t, Sizes> sizes;  // by look
+    for (SceneIndex from = 0; from < scenes_.list.size(); ++from) {
+      for (const auto& exit : exitsOf(from)) {
+        if (exit.kind != Exit::Kind::scene) continue;
+        auto& [direct, shared] = sizes[lookOfScene_[exit.scene]];
+        if (shared == 0) shared = sizeOf(sharedValues(exit.scene));
+        direct += sizeOf(differences(from, exit.scene, true)) -
+                  sizeOf(differences(from, exit.scene, false));
+        shared += sizeOfProcess;
+      }
+    }
+    for (SceneIndex scene = 0; scene < scenes_.list.size(); ++scene) {
+      const auto& [direct, shared] = sizes[lookOfScene_[scene]];
+      if (direct > shared) shared_.try_emplace(lookOfScene_[scene], scene, sharedKey(scene));
+    }
+  }
+
+  Tag sharedKey(SceneIndex scene) {
+    return numbers_.of("look\t" + tour_.steps[scenes_.list[scene].step].name +
+                       (scenes_.list[scene].canGoBack ? "\tback" : ""));
+  }
+
+  std::vector<Exit> exitsOf(SceneIndex scene) const {
+    std::vector<Exit> exits;
+    for (const auto& press : scenes_.list[scene].presses) {
+      if (press) exits.push_back(*press);
+    }
+    if (scenes_.list[scene].wait) exits.push_back(*scenes_.list[scene].wait);
+    return exits;
   }
 
   bool flashesIn(SceneIndex scene) const {
-    const auto& controls = looks_[scene].controls;
+    const auto& controls = lookAt(scene).controls;
     return std::any_of(controls.begin(), controls.end(), [](const auto& c) { return c.flashes; });
   }
 
@@ -187,33 +252,14 @@ class Compiler {
     if (wait) list.push_back(tagged(setTimer, {wait->seconds}, timerKey(scene), wait->place));
   }
 
-  /// Leads from one scene to another by what both have in common with the host's window.
-  List throughOwnTags(SceneIndex from, SceneIndex to, Tag key, Place place) const {
+  /// Sets what is different in another scene, whose controls have their tags already. `withShared`
+  /// says whether that includes what can be shared.
+  List differences(SceneIndex from, SceneIndex to, bool withShared) const {
     List list;
-    for (ControlIndex i = 0; i < tour_.controls.size(); ++i) {
-      retag(list, tags_[from][i], tour_.controls[i].tag, place);
-    }
-    list.push_back(tagged(process, {}, key, place));
-    for (ControlIndex i = 0; i < tour_.controls.size(); ++i) {
-      retag(list, tour_.controls[i].tag, tags_[to][i], place);
-    }
-    return list;
-  }
-
-  /// Leads from one scene to another by what is different.
-  List directly(SceneIndex from, SceneIndex to, Place place) {
-    List list;
-    for (ControlIndex i = 0; i < tour_.controls.size(); ++i) {
-      retag(list, tags_[from][i], tags_[to][i], place);
-    }
-    for (const auto& [control, property] : varying_) {
-      const Commands& values = looks_[to].controls[control][property];
-      // The user may have changed the state since.
-      if (property != Property::state && values == looks_[from].controls[control][property]) continue;
-      setValues(list, values, tags_[to][control], placeOf(to));
-    }
-    if (looks_[to].background != looks_[from].background) {
-      setValues(list, looks_[to].background, std::nullopt, placeOf(to));
+    for (const Varying& each : varying_) {
+      if (!mustBeSet(from, to, each) || (!withShared && canBeShared(to, each))) continue;
+      setValues(list, lookAt(to).controls[each.control][each.property], tags_[to][each.control],
+                placeOf(to));
     }
     return list;
   }
@@ -222,15 +268,17 @@ class Compiler {
     List list;
     // Ends the pressed-in look, which would stay when the button gets another tag.
     if (flashesIn(from)) list.push_back({{"ALLOW_FLASHING", {false}, place}, std::nullopt});
-    List way = directly(from, to, place);
-    const bool isKnown = std::any_of(bodies_.begin(), bodies_.end(), [&](const auto& known) {
-      return known.first == to;
-    });
-    if (isKnown || sizeOf(way) > sizeOf(body(to)) + 200) {
-      List shared = throughOwnTags(from, to, bodyKey(to), place);
-      if (sizeOf(shared) < sizeOf(way)) way = std::move(shared);
+    for (ControlIndex i = 0; i < tour_.controls.size(); ++i) {
+      retag(list, tags_[from][i], tags_[to][i], place);
     }
-    list.insert(list.end(), way.begin(), way.end());
+    const auto shared = shared_.find(lookOfScene_[to]);
+    const bool usesShared = shared != shared_.end() && lookOfScene_[from] != lookOfScene_[to];
+    if (usesShared) list.push_back(tagged(process, {}, shared->second.second, place));
+    const List values = differences(from, to, !usesShared);
+    list.insert(list.end(), values.begin(), values.end());
+    if (lookAt(to).background != lookAt(from).background) {
+      setValues(list, lookAt(to).background, std::nullopt, placeOf(to));
+    }
     begin(list, to, place);
     return list;
   }
@@ -242,11 +290,13 @@ class Compiler {
     for (const Tag tag : flashing_) {
       list.push_back(tagged("FLASH_ID", {true}, tag, place));
     }
-    const List look = body(scene);
-    list.insert(list.end(), look.begin(), look.end());
     for (ControlIndex i = 0; i < tour_.controls.size(); ++i) {
       retag(list, tour_.controls[i].tag, tags_[scene][i], place);
     }
+    for (const auto& [control, property] : varying_) {
+      setValues(list, lookAt(scene).controls[control][property], tags_[scene][control], place);
+    }
+    if (changesBackground_) setValues(list, lookAt(scene).background, std::nullopt, place);
     begin(list, scene, place);
     list.push_back({{"IDLE_LOOP", {}, place}, std::nullopt});
     const Tag key = startKey(number);
@@ -257,7 +307,8 @@ class Compiler {
 
   /// The smallest key of the script is that of the first start.
   Tag startKey(std::size_t number) {
-    if (number > 0) return numbers_.of("start\t" + tour_.steps[scenes_.list[scenes_.starts[number]].step].name);
+    if (number > 0)
+      return numbers_.of("start\t" + tour_.steps[scenes_.list[scenes_.starts[number]].step].name);
     Tag least = 1;
     for (const Control& control : tour_.controls) least = std::min(least, control.tag);
     return least - 1;
@@ -282,7 +333,7 @@ class Compiler {
     for (ControlIndex i = 0; i < tour_.controls.size(); ++i) {
       const Tag tag = tags_[index][i];
       if (!scene.presses[i] || !written_.insert(tag).second) continue;
-      const Lead& press = looks_[index].controls[i].press;
+      const Lead& press = lookAt(index).controls[i].press;
       const Place place = press.place == 0 ? placeOf(index) : press.place;
       writer_.add(tag, place, exitList(index, *scene.presses[i], place));
       if (scene.presses[i]->kind == Exit::Kind::scene) {
@@ -301,14 +352,18 @@ class Compiler {
   const Tour& tour_;
   const Scenes scenes_;
   Look initial_;
-  std::vector<Look> looks_;  // of the scenes
+  Look everyStep_;
+  std::map<std::pair<StepIndex, bool>, std::size_t> lookNumbers_;
+  std::vector<Look> looks_;
+  std::vector<std::size_t> lookOfScene_;
   std::vector<Varying> varying_;
   bool changesBackground_ = false;
   Numbers numbers_;
   std::vector<std::optional<Everywhere>> ownUse_;  // of each control's own tag
   std::vector<std::vector<Tag>> tags_;             // of the controls, in each scene
   std::vector<Tag> flashing_;
-  std::vector<std::pair<SceneIndex, Tag>> bodies_;  // lists that set a whole look
+  std::vector<bool> keepsTag_;  // of each control: it has its own tag in every scene
+  std::map<std::size_t, std::pair<SceneIndex, Tag>> shared_;  // by look: one of its scenes, the key
   std::set<Tag> written_;
   ScriptWriter writer_;
   Built built_;

@@ -20,8 +20,9 @@ std::string filledIn(const std::string& text, const std::map<std::string, NodeRe
   std::string filled;
   for (std::size_t i = 0; i < text.size();) {
     const std::size_t end = text[i] == '{' ? text.find('}', i) : std::string::npos;
-    const auto argument =
-        end == std::string::npos ? arguments.end() : arguments.find(text.substr(i + 1, end - i - 1));
+    const auto argument = end == std::string::npos
+                              ? arguments.end()
+                              : arguments.find(text.substr(i + 1, end - i - 1));
     if (argument == arguments.end()) {
       filled += text[i++];
     } else {
@@ -48,8 +49,8 @@ NodeRef withArguments(const NodeRef& node, const std::map<std::string, NodeRef>&
 void Fragments::read(const NodeRef& table) {
   for (const auto& [key, body] : entriesOf(table, "a table of fragments", mistakes_)) {
     if (body->kind != Node::Kind::table) {
-      mistakes_.add(body->place, "expected what steps have in common (a table), found " +
-                                     foundWords(*body));
+      mistakes_.add(body->place,
+                    "expected what steps have in common (a table), found " + foundWords(*body));
     } else {
       bodies_[key->text] = body;
     }
@@ -58,7 +59,8 @@ void Fragments::read(const NodeRef& table) {
 
 NodeRef Fragments::expand(const NodeRef& body) const {
   if (body->kind != Node::Kind::table) return body;
-  const auto expanded = std::make_shared<Node>(Node{.kind = Node::Kind::table, .place = body->place});
+  const auto expanded =
+      std::make_shared<Node>(Node{.kind = Node::Kind::table, .place = body->place});
   expandInto(body, 0, *expanded);
   return expanded;
 }
@@ -95,8 +97,8 @@ void Fragments::useOne(const NodeRef& name, const NodeRef& arguments, std::size_
   if (found == bodies_.end()) {
     std::vector<std::string_view> names;
     for (const auto& [known, body] : bodies_) names.push_back(known);
-    mistakes_.add(name->place, "no fragment is called " + quote(name->text) +
-                                   didYouMean(name->text, names));
+    mistakes_.add(name->place,
+                  "no fragment is called " + quote(name->text) + didYouMean(name->text, names));
     return;
   }
   if (depth == deepestUse) {

@@ -47,8 +47,9 @@ ControlWords merged(ControlWords words, const ControlWords& own) {
 }
 
 std::string inFont(const std::string& html, const Font& font, bool isCentered) {
-  const std::string size =
-      font.size == standardFont.size ? "" : " style=\"font-size: " + std::to_string(font.size) + "pt\"";
+  const std::string size = font.size == standardFont.size
+                               ? ""
+                               : " style=\"font-size: " + std::to_string(font.size) + "pt\"";
   const std::string text = "<font face=\"" + font.name + "\"" + size + ">" + html + "</font>";
   return isCentered ? "<div style=\"text-align: center\">" + text + "</div>" : text;
 }
@@ -70,7 +71,8 @@ Commands textCommands(const Control& control, const ControlWords& words) {
   } else {
     commands.push_back({isTitle ? setTitle : setText, {content.text}, words.place});
   }
-  if (words.color) commands.push_back({"SET_FOREGROUND_COLOR_FOR_OBJECT_ID", {*words.color}, words.place});
+  if (words.color)
+    commands.push_back({"SET_FOREGROUND_COLOR_FOR_OBJECT_ID", {*words.color}, words.place});
   return commands;
 }
 
@@ -93,8 +95,8 @@ Commands flagCommand(bool on, const char* yes, const char* no, Place place) {
   return {{on ? yes : no, {}, place}};
 }
 
-/// Whether a control is seen if the source does not say so: a button needs something to do, an image
-/// view an image.
+/// Whether a control is seen if the source does not say so: a button needs something to do, an
+/// image view an image.
 bool isShownByItself(const Control& control, const ControlWords& words) {
   if (rowOf(control.kind).caption == Caption::imageName) {
     return control.isShown && (words.content || control.caption);
@@ -119,9 +121,9 @@ ControlLook controlLook(const Control& control, const ControlWords& words, bool 
         flagCommand(isEnabled, "ENABLE_OBJECT_WITH_ID", "DISABLE_OBJECT_WITH_ID", words.place);
   }
   if (row.isButton) {
-    look[Property::state] = flagCommand(words.isOn.value_or(control.isOn),
-                                        "SET_STATE_ON_FOR_OBJECT_ID", "SET_STATE_OFF_FOR_OBJECT_ID",
-                                        words.place);
+    look[Property::state] =
+        flagCommand(words.isOn.value_or(control.isOn), "SET_STATE_ON_FOR_OBJECT_ID",
+                    "SET_STATE_OFF_FOR_OBJECT_ID", words.place);
     if (words.isRed) {
       look[Property::background] = {{"SET_BACKGROUND_COLOR_FOR_OBJECT_ID", {0}, words.place}};
     }
@@ -130,6 +132,17 @@ ControlLook controlLook(const Control& control, const ControlWords& words, bool 
     if (words.press) look.press = *words.press;
     if (isInVain) look.press = {};
   }
+  return look;
+}
+
+Look completeLook(const Tour& tour, const StepWords& own, bool canGoBack) {
+  Look look;
+  for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
+    const ControlWords words = merged(tour.everyStep.controls[i], own.controls[i]);
+    look.controls.push_back(controlLook(tour.controls[i], words, canGoBack));
+  }
+  const auto background = own.background ? own.background : tour.everyStep.background;
+  if (background) look.background = {{"LOAD_BACKGROUND_WITH_IMAGE", {*background}, 0}};
   return look;
 }
 
@@ -148,15 +161,13 @@ Look initialLook(const Tour& tour) {
 }
 
 Look lookOf(const Tour& tour, StepIndex step, bool canGoBack) {
-  const StepWords& own = tour.steps[step].words;
-  Look look;
-  for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
-    const ControlWords words = merged(tour.everyStep.controls[i], own.controls[i]);
-    look.controls.push_back(controlLook(tour.controls[i], words, canGoBack));
-  }
-  const auto background = own.background ? own.background : tour.everyStep.background;
-  if (background) look.background = {{"LOAD_BACKGROUND_WITH_IMAGE", {*background}, 0}};
-  return look;
+  return completeLook(tour, tour.steps[step].words, canGoBack);
+}
+
+Look everyStepLook(const Tour& tour) {
+  StepWords nothing;
+  nothing.controls.resize(tour.controls.size());
+  return completeLook(tour, nothing, true);
 }
 
 void judgeLooks(const Tour& tour, Mistakes& mistakes) {
@@ -168,10 +179,11 @@ void judgeLooks(const Tour& tour, Mistakes& mistakes) {
       const ControlWords words =
           merged(tour.everyStep.controls[i], tour.steps[step].words.controls[i]);
       const Control& control = tour.controls[i];
-      const bool isDead = !control.name.empty() && control.kind == ViewKind::button && !words.press &&
-                          look.controls[i].canBePressed;
+      const bool isDead = !control.name.empty() && control.kind == ViewKind::button &&
+                          !words.press && look.controls[i].canBePressed;
       if (isDead) {
-        const Place place = words.isMentioned || words.place != 0 ? words.place : tour.steps[step].place;
+        const Place place =
+            words.isMentioned || words.place != 0 ? words.place : tour.steps[step].place;
         mistakes.add(place, "at the step " + quote(tour.steps[step].name) + " a press of " +
                                 quote(control.name) +
                                 " leads nowhere; expected “press” with a step, “back”, “end” or "
@@ -186,8 +198,9 @@ void judgeLooks(const Tour& tour, Mistakes& mistakes) {
   }
   for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
     if (redAt[i] == 0 || !plainSomewhere[i]) continue;
-    mistakes.add(redAt[i], "no command takes the red from a button again; expected “background: red” "
-                           "under “every step”, or at none");
+    mistakes.add(redAt[i],
+                 "no command takes the red from a button again; expected “background: red” "
+                 "under “every step”, or at none");
   }
 }
 

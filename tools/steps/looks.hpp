@@ -53,6 +53,9 @@ Look initialLook(const Tour& tour);
 /// Returns what it shows at a step. A button that leads back is disabled if `canGoBack` is NO.
 Look lookOf(const Tour& tour, StepIndex step, bool canGoBack);
 
+/// Returns what it would show at a step that says nothing.
+Look everyStepLook(const Tour& tour);
+
 /// Adds a mistake for every button that a user can press in vain, and for every look that cannot be
 /// left again.
 void judgeLooks(const Tour& tour, Mistakes& mistakes);

@@ -23,7 +23,8 @@ std::string render(std::string_view markdown) {
   return html;
 }
 
-/// Removes the paragraph around a text that is nothing but one: the reader of HTML would add a line.
+/// Removes the paragraph around a text that is nothing but one: the reader of HTML would add a
+/// line.
 std::string withoutOnlyParagraph(std::string html) {
   const bool isOne = html.starts_with(paragraphStart) && html.ends_with(paragraphEnd) &&
                      html.find(paragraphStart, 1) == std::string::npos;
@@ -58,7 +59,8 @@ unsigned long codePoint(std::string_view character) {
                        : character.size() == 2 ? first & 0x1FU
                        : character.size() == 3 ? first & 0x0FU
                                                : first & 0x07U;
-  for (const char c : character.substr(1)) code = code << 6U | (static_cast<unsigned char>(c) & 0x3FU);
+  for (const char c : character.substr(1))
+    code = code << 6U | (static_cast<unsigned char>(c) & 0x3FU);
   return code;
 }
 
@@ -79,11 +81,20 @@ std::string asHtml(std::string_view plain) {
   std::string html;
   for (const char c : plain) {
     switch (c) {
-      case '<': html += "&lt;"; break;
-      case '>': html += "&gt;"; break;
-      case '&': html += "&amp;"; break;
-      case '\n': html += "<br>"; break;
-      default: html += c;
+      case '<':
+        html += "&lt;";
+        break;
+      case '>':
+        html += "&gt;";
+        break;
+      case '&':
+        html += "&amp;";
+        break;
+      case '\n':
+        html += "<br>";
+        break;
+      default:
+        html += c;
     }
   }
   return inAscii(html);

@@ -13,8 +13,8 @@ struct Markup {
   std::string text{};  ///< plain text, or a fragment of HTML in ASCII
 };
 
-/// Reads Markdown: emphasis, links, lists, headings and line breaks. The result is plain if the text
-/// is one paragraph without any of these. HTML in the text is shown as it is written.
+/// Reads Markdown: emphasis, links, lists, headings and line breaks. The result is plain if the
+/// text is one paragraph without any of these. HTML in the text is shown as it is written.
 Markup readMarkdown(std::string_view text);
 
 /// Returns plain text as a fragment of HTML in ASCII.

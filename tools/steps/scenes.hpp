@@ -22,9 +22,9 @@ struct Exit {
 /// Two scenes of one step differ in where their moves lead.
 struct Scene {
   StepIndex step = 0;
-  /// The shortest way here of those that make no difference: the steps to which Back leads, the last
-  /// one first asked.
-  std::vector<StepIndex> way{};
+  /// What tells the scene from the others of its step: the steps that the user last came from, the
+  /// latest last. Empty for the first scene of a step.
+  std::vector<StepIndex> cameFrom{};
   bool canGoBack = false;
   std::vector<std::optional<Exit>> presses{};  ///< of each control that can be pressed
   std::optional<Exit> wait{};
@@ -36,8 +36,8 @@ struct Scenes {
   std::vector<SceneIndex> starts{};
 };
 
-/// Finds all scenes that can be reached from the steps `starts`, to which no way leads. Too many are
-/// a mistake.
+/// Finds all scenes that can be reached from the steps `starts`, to which no way leads. Too many
+/// are a mistake.
 Scenes findScenes(const Tour& tour, const std::vector<StepIndex>& starts, Mistakes& mistakes);
 
 }  // namespace qz::tools::steps

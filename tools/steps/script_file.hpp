@@ -24,8 +24,8 @@ struct ScriptFile {
 };
 
 /// Reads the script at `path`, or builds it if this is a source, which can then be started at the
-/// step `start` too, if that is not empty. Throws a SourceRefused if the source has mistakes, another
-/// Failure if a file cannot be read or does not hold what it should.
+/// step `start` too, if that is not empty. Throws a SourceRefused if the source has mistakes,
+/// another Failure if a file cannot be read or does not hold what it should.
 ScriptFile openScript(const std::string& path, const std::string& start = {});
 
 }  // namespace qz::tools::steps

@@ -22,7 +22,7 @@ namespace fs = std::filesystem;
 using drivers::Caption;
 
 constexpr int greatestTag = 2147483647;  // the engine reads tags as an int
-constexpr std::string_view sourceWords[] = {"window", "assets",     "controls", "back over",
+constexpr std::string_view sourceWords[] = {"window",     "assets",    "controls", "back over",
                                             "every step", "fragments", "steps"};
 
 Control controlOf(const drivers::ViewPicture& view) {
@@ -58,12 +58,14 @@ class SourceReader {
 
   void read() {
     const NodeRef root = readYaml(source_.text, source_.path);
-    for (const auto& [key, value] : entriesOf(root, "a walk-through in steps (a table)", mistakes_)) {
+    for (const auto& [key, value] :
+         entriesOf(root, "a walk-through in steps (a table)", mistakes_)) {
       const auto known = std::find(std::begin(sourceWords), std::end(sourceWords), key->text);
       if (known == std::end(sourceWords)) {
         mistakes_.add(key->place,
-                      "expected one of " + enumerate({std::begin(sourceWords), std::end(sourceWords)}) +
-                          ", found " + foundWords(*key) +
+                      "expected one of " +
+                          enumerate({std::begin(sourceWords), std::end(sourceWords)}) + ", found " +
+                          foundWords(*key) +
                           didYouMean(key->text, {std::begin(sourceWords), std::end(sourceWords)}));
       }
       parts_[key->text] = value;
@@ -107,7 +109,8 @@ class SourceReader {
 
   void readControls() {
     for (const auto& [name, value] : entriesOf(part("controls"), "names with tags", mistakes_)) {
-      const auto tag = numberOf(*value, -greatestTag, greatestTag, "the tag of a control", mistakes_);
+      const auto tag =
+          numberOf(*value, -greatestTag, greatestTag, "the tag of a control", mistakes_);
       if (!tag) continue;
       Control* found = nullptr;  // the back-most, as commands find it
       for (Control& control : tour_.controls) {
@@ -132,8 +135,9 @@ class SourceReader {
     std::map<std::string, NodeRef> bodies;
     for (const auto& [name, body] : entries) {
       if (name->text == words::back || name->text == words::end || name->text == words::nothing) {
-        mistakes_.add(name->place, quote(name->text) + " means something else to a press; expected "
-                                                       "another name for the step");
+        mistakes_.add(name->place, quote(name->text) +
+                                       " means something else to a press; expected "
+                                       "another name for the step");
       }
       names.emplace(name->text, names.size());
       bodies[name->text] = fragments.expand(body);
@@ -160,20 +164,21 @@ class SourceReader {
   NodeRef tableOf(const NodeRef& body) {
     if (body->kind == Node::Kind::table) return body;
     if (body->kind != Node::Kind::nothing) {
-      mistakes_.add(body->place, "expected what the step shows (a table), found " + foundWords(*body));
+      mistakes_.add(body->place,
+                    "expected what the step shows (a table), found " + foundWords(*body));
     }
     return std::make_shared<Node>(Node{.kind = Node::Kind::table, .place = body->place});
   }
 
   /// Reads a step, after the step that it is like.
-  void readLike(const std::string& name, const Node& at, const std::map<std::string, NodeRef>& bodies,
-                const StepReader& reader, StepWords& words, std::size_t depth) {
+  void readLike(const std::string& name, const Node& at,
+                const std::map<std::string, NodeRef>& bodies, const StepReader& reader,
+                StepWords& words, std::size_t depth) {
     const auto found = bodies.find(name);
     if (found == bodies.end()) {
       std::vector<std::string_view> names;
       for (const auto& [known, body] : bodies) names.push_back(known);
-      mistakes_.add(at.place,
-                    "no step is called " + foundWords(at) + didYouMean(name, names));
+      mistakes_.add(at.place, "no step is called " + foundWords(at) + didYouMean(name, names));
       return;
     }
     if (depth > bodies.size()) {
@@ -201,7 +206,9 @@ bool isSourcePath(const std::string& path) {
 
 Source readSource(const std::string& path) {
   auto text = wholeFile(path);
-  if (!text) throw Failure(ExitStatus::badInput, path + ": cannot be read; expected a walk-through in steps");
+  if (!text)
+    throw Failure(ExitStatus::badInput,
+                  path + ": cannot be read; expected a walk-through in steps");
   Source source{.path = path, .text = *std::move(text)};
   SourceReader(source).read();
   return source;

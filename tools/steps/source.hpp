@@ -19,8 +19,8 @@ struct Source {
 /// Whether the file's name is that of a source: it ends with .yaml or .yml.
 bool isSourcePath(const std::string& path);
 
-/// Reads a source, and the window that it names. Throws a SourceRefused if there are mistakes in it,
-/// another Failure if a file cannot be read.
+/// Reads a source, and the window that it names. Throws a SourceRefused if there are mistakes in
+/// it, another Failure if a file cannot be read.
 Source readSource(const std::string& path);
 
 }  // namespace qz::tools::steps

@@ -19,15 +19,6 @@ using drivers::Caption;
 constexpr int mostSeconds = 604800;
 constexpr int mostPoints = 1000;
 
-constexpr std::string_view stepWords[] = {"show",  "hide", "enable",     "disable",
-                                          "flash", "font", "align",      "background",
-                                          "use",   "like", "back passes over"};
-
-constexpr std::string_view propertyWords[] = {"text",  "title",      "picture", "html",
-                                              "font",  "align",      "tooltip", "color",
-                                              "state", "background", "shown",   "enabled",
-                                              "flash", "press"};
-
 constexpr std::string_view colors[] = {"red", "white", "blue", "green", "black", "orange", "gray"};
 
 std::string_view captionWord(Caption caption) {
@@ -44,6 +35,26 @@ std::string_view captionWord(Caption caption) {
   return "";
 }
 
+/// Reads the seconds of words such as "after 5 s".
+std::optional<int> secondsOf(std::string_view key) {
+  if (!key.ends_with(" s")) return std::nullopt;
+  key.remove_prefix(words::after.size());
+  key.remove_suffix(std::min<std::size_t>(2, key.size()));
+  const auto seconds = walkthrough::parseNumber<int>(key);
+  return seconds && *seconds >= 1 && *seconds <= mostSeconds ? seconds : std::nullopt;
+}
+
+template <Caption caption>
+bool shows(const drivers::ViewKindRow& kind) {
+  return kind.caption == caption;
+}
+bool showsText(const drivers::ViewKindRow& kind) {
+  return kind.caption == Caption::text || kind.caption == Caption::title;
+}
+bool isAnything(const drivers::ViewKindRow& /*kind*/) { return true; }
+bool isButtonKind(const drivers::ViewKindRow& kind) { return kind.isButton; }
+bool takesInput(const drivers::ViewKindRow& kind) { return kind.isControl; }
+
 }  // namespace
 
 StepReader::StepReader(const std::vector<Control>& controls,
@@ -59,22 +70,6 @@ void StepReader::read(const Node& body, StepWords& words) const {
   for (const auto& [key, value] : body.entries) readEntry(*key, value, words);
 }
 
-template <class Set>
-void StepReader::forEachName(const Node& value, const Set& set) const {
-  if (value.kind == Node::Kind::list) {
-    for (const NodeRef& element : value.elements) forEachName(*element, set);
-  } else if (const auto control = controlNamed(value)) {
-    set(*control);
-  }
-}
-
-template <class Set>
-void StepReader::forEachEntry(const NodeRef& value, const Set& set) const {
-  for (const auto& [name, each] : entriesOf(value, "a value for each control", mistakes_)) {
-    if (const auto control = controlNamed(*name)) set(*control, *each);
-  }
-}
-
 std::optional<ControlIndex> StepReader::controlNamed(const Node& name) const {
   const auto found = names_.find(name.text);
   if (name.kind == Node::Kind::scalar && found != names_.end()) return found->second;
@@ -85,48 +80,112 @@ std::optional<ControlIndex> StepReader::controlNamed(const Node& name) const {
   return std::nullopt;
 }
 
+/// A word of steps, which gives a property to the controls that it names.
+struct StepReader::StepWordRow {
+  std::string_view word;
+  std::string_view property;
+  void (StepReader::*read)(const NodeRef& value, const PropertyRow& row, StepWords& words) const;
+};
+
+const StepReader::StepWordRow StepReader::stepWords[] = {
+    {"show", "shown", &StepReader::readNames<&ControlWords::isShown, true>},
+    {"hide", "shown", &StepReader::readNames<&ControlWords::isShown, false>},
+    {"enable", "enabled", &StepReader::readNames<&ControlWords::isEnabled, true>},
+    {"disable", "enabled", &StepReader::readNames<&ControlWords::isEnabled, false>},
+    {"flash", "flash", &StepReader::readNames<&ControlWords::flashes, true>},
+    {"font", "font", &StepReader::readEach},
+    {"align", "align", &StepReader::readEach},
+};
+
+/// A property of controls.
+struct StepReader::PropertyRow {
+  std::string_view word;
+  std::string_view owners;  // for messages
+  bool (*isOf)(const drivers::ViewKindRow& kind);
+  void (StepReader::*read)(ControlIndex control, const Node& value, ControlWords& words) const;
+};
+
+const StepReader::PropertyRow StepReader::properties[] = {
+    {"text", "text fields", shows<Caption::text>, &StepReader::readContent},
+    {"title", "buttons", shows<Caption::title>, &StepReader::readContent},
+    {"picture", "images", shows<Caption::imageName>, &StepReader::readContent},
+    {"html", "text fields and buttons", showsText, &StepReader::readHtml},
+    {"font", "text fields and buttons", showsText, &StepReader::readFont},
+    {"align", "text fields and buttons", showsText, &StepReader::readAlign},
+    {"tooltip", "all controls", isAnything, &StepReader::readToolTip},
+    {"color", "buttons", isButtonKind, &StepReader::readColor},
+    {"background", "buttons", isButtonKind, &StepReader::readRed},
+    {"state", "buttons", isButtonKind, &StepReader::readState},
+    {"shown", "all controls", isAnything, &StepReader::readFlag<&ControlWords::isShown>},
+    {"enabled", "controls that take input", takesInput,
+     &StepReader::readFlag<&ControlWords::isEnabled>},
+    {"flash", "buttons", isButtonKind, &StepReader::readFlag<&ControlWords::flashes>},
+    {"press", "buttons", isButtonKind, &StepReader::readPress},
+};
+
 void StepReader::readEntry(const Node& key, const NodeRef& value, StepWords& words) const {
-  const std::string& word = key.text;
-  const auto setFlag = [&](std::optional<bool> ControlWords::*flag, bool on) {
-    forEachName(*value, [&](ControlIndex i) { words.controls[i].*flag = on; });
-  };
-  if (word == "show") return setFlag(&ControlWords::isShown, true);
-  if (word == "hide") return setFlag(&ControlWords::isShown, false);
-  if (word == "enable") return setFlag(&ControlWords::isEnabled, true);
-  if (word == "disable") return setFlag(&ControlWords::isEnabled, false);
-  if (word == "flash") return setFlag(&ControlWords::flashes, true);
-  if (word == "font") {
-    return forEachEntry(
-        value, [&](ControlIndex i, const Node& font) { readFont(font, words.controls[i]); });
-  }
-  if (word == "align") {
-    return forEachEntry(value, [&](ControlIndex i, const Node& align) {
-      static constexpr std::string_view choices[] = {"natural", "center"};
-      if (const auto choice = choiceOf(align, choices, mistakes_)) {
-        words.controls[i].isCentered = *choice == 1;
-      }
-    });
-  }
-  if (word == "background") {
+  if (key.text == words::like || key.text == words::use) return;  // put in place already
+  if (key.text.starts_with(words::after)) return readWait(key, value, words);
+  if (key.text == words::background) {
     words.background = textOf(*value, "the name of an image", mistakes_);
     return;
   }
-  if (word == "back passes over") {
+  if (key.text == words::passedOver) {
     words.isPassedOver = flagOf(*value, mistakes_);
     return;
   }
-  if (word == words::like || word == words::use) return;  // put in place already
-  if (word.starts_with(words::after)) return readWait(key, value, words);
-  if (const auto control = names_.find(word); control != names_.end()) {
-    ControlWords& said = words.controls[control->second];
-    said.isMentioned = true;
-    said.place = key.place;
-    return readControl(control->second, value, words);
+  for (const StepWordRow& row : stepWords) {
+    if (row.word == key.text) return (this->*row.read)(value, *propertyNamed(row.property), words);
   }
-  std::vector<std::string_view> known(std::begin(stepWords), std::end(stepWords));
+  const auto control = names_.find(key.text);
+  if (control == names_.end()) return refuseEntry(key);
+  ControlWords& said = words.controls[control->second];
+  said.isMentioned = true;
+  said.place = key.place;
+  readControl(control->second, value, words);
+}
+
+void StepReader::refuseEntry(const Node& key) const {
+  std::vector<std::string_view> known = {words::like, words::use, words::background,
+                                         words::passedOver};
+  for (const StepWordRow& row : stepWords) known.push_back(row.word);
   for (const auto& [name, control] : names_) known.push_back(name);
   mistakes_.add(key.place, "expected the name of a control or a word such as “show”, found " +
-                               foundWords(key) + didYouMean(word, known));
+                               foundWords(key) + didYouMean(key.text, known));
+}
+
+template <std::optional<bool> ControlWords::*flag, bool value>
+void StepReader::readNames(const NodeRef& names, const PropertyRow& row, StepWords& words) const {
+  if (names->kind == Node::Kind::list) {
+    for (const NodeRef& name : names->elements) readNames<flag, value>(name, row, words);
+    return;
+  }
+  const auto control = controlNamed(*names);
+  if (control && has(*control, row, *names)) words.controls[*control].*flag = value;
+}
+
+void StepReader::readEach(const NodeRef& values, const PropertyRow& row, StepWords& words) const {
+  for (const auto& [name, value] : entriesOf(values, "a value for each control", mistakes_)) {
+    const auto control = controlNamed(*name);
+    if (control && has(*control, row, *name)) {
+      (this->*row.read)(*control, *value, words.controls[*control]);
+    }
+  }
+}
+
+const StepReader::PropertyRow* StepReader::propertyNamed(std::string_view word) {
+  const auto* const found = std::find_if(std::begin(properties), std::end(properties),
+                                         [&](const PropertyRow& row) { return row.word == word; });
+  return found == std::end(properties) ? nullptr : found;
+}
+
+bool StepReader::has(ControlIndex control, const PropertyRow& row, const Node& at) const {
+  const drivers::ViewKindRow& kind = rowOf(controls_[control].kind);
+  if (row.isOf(kind)) return true;
+  mistakes_.add(at.place, quote(row.word) + " is a property of " + std::string(row.owners) +
+                              "; the control " + quote(controls_[control].name) + " is a " +
+                              std::string(kind.word));
+  return false;
 }
 
 void StepReader::readControl(ControlIndex control, const NodeRef& value, StepWords& words) const {
@@ -134,7 +193,7 @@ void StepReader::readControl(ControlIndex control, const NodeRef& value, StepWor
   if (value->kind == Node::Kind::nothing) return;  // `control:` alone shows it
   if (value->kind == Node::Kind::scalar) return readContent(control, *value, said);
   for (const auto& [key, property] : entriesOf(value, "a text or a table", mistakes_)) {
-    readProperty(control, *key, property, said);
+    readProperty(control, *key, *property, said);
   }
 }
 
@@ -150,86 +209,69 @@ void StepReader::readContent(ControlIndex control, const Node& value, ControlWor
   words.content = caption == Caption::text ? readMarkdown(*text) : Markup{true, *text};
 }
 
-void StepReader::readFont(const Node& value, ControlWords& words) const {
+void StepReader::readProperty(ControlIndex control, const Node& key, const Node& value,
+                              ControlWords& words) const {
+  if (const PropertyRow* const row = propertyNamed(key.text)) {
+    if (has(control, *row, key)) (this->*row->read)(control, value, words);
+    return;
+  }
+  std::vector<std::string_view> known;
+  for (const PropertyRow& row : properties) known.push_back(row.word);
+  mistakes_.add(key.place,
+                "no property is called " + foundWords(key) + didYouMean(key.text, known));
+}
+
+void StepReader::readHtml(ControlIndex /*control*/, const Node& value, ControlWords& words) const {
+  if (const auto html = textOf(value, "HTML", mistakes_)) {
+    words.content = Markup{false, inAscii(*html)};
+  }
+}
+
+void StepReader::readFont(ControlIndex /*control*/, const Node& value, ControlWords& words) const {
   const std::size_t space = value.text.rfind(' ');
   const auto size = space == std::string::npos
                         ? std::nullopt
                         : walkthrough::parseNumber<int>(value.text.substr(space + 1));
-  if (!size || *size < 1 || *size > mostPoints) {
-    mistakes_.add(value.place, "expected a font and its size in points, such as Helvetica 13, found " +
-                                   foundWords(value));
-    return;
+  if (size && *size >= 1 && *size <= mostPoints) {
+    words.font = Font{value.text.substr(0, space), *size};
+  } else {
+    mistakes_.add(
+        value.place,
+        "expected a font and its size in points, such as Helvetica 13, found " + foundWords(value));
   }
-  words.font = Font{value.text.substr(0, space), *size};
 }
 
-void StepReader::readProperty(ControlIndex control, const Node& key, const NodeRef& value,
-                              ControlWords& words) const {
-  const drivers::ViewKindRow& row = rowOf(controls_[control].kind);
-  const std::string& word = key.text;
-  const auto refuse = [&](std::string_view kinds) {
-    mistakes_.add(key.place, quote(word) + " is a property of " + std::string(kinds) +
-                                 "; the control " + quote(controls_[control].name) + " is a " +
-                                 std::string(row.word));
-  };
-  const bool isContent = word == "text" || word == "title" || word == "picture";
-  if (isContent) {
-    if (word != captionWord(row.caption)) {
-      return refuse(word == "text"    ? "text fields"
-                    : word == "title" ? "buttons"
-                                      : "images");
-    }
-    return readContent(control, *value, words);
-  }
-  if (word == "html") {
-    if (row.caption != Caption::text && row.caption != Caption::title) {
-      return refuse("text fields and buttons");
-    }
-    if (const auto html = textOf(*value, "HTML", mistakes_)) {
-      words.content = Markup{false, inAscii(*html)};
-    }
-    return;
-  }
-  if (word == "font") return readFont(*value, words);
-  if (word == "align") {
-    static constexpr std::string_view choices[] = {"natural", "center"};
-    if (const auto choice = choiceOf(*value, choices, mistakes_)) words.isCentered = *choice == 1;
-    return;
-  }
-  if (word == "tooltip") {
-    words.toolTip = textOf(*value, "a text", mistakes_);
-    return;
-  }
-  if (word == "shown") {
-    words.isShown = flagOf(*value, mistakes_);
-    return;
-  }
-  if (word == "enabled") {
-    if (!row.isControl) return refuse("controls that take input");
-    words.isEnabled = flagOf(*value, mistakes_);
-    return;
-  }
-  const bool isForButtons = word == "color" || word == "state" || word == "background" ||
-                            word == "flash" || word == "press";
-  if (!isForButtons) {
-    mistakes_.add(key.place, "no property is called " + foundWords(key) +
-                                 didYouMean(word, {std::begin(propertyWords), std::end(propertyWords)}));
-    return;
-  }
-  if (!row.isButton) return refuse("buttons");
-  if (word == "flash") words.flashes = flagOf(*value, mistakes_);
-  if (word == "press") words.press = readLead(*value);
-  if (word == "color") {
-    if (const auto choice = choiceOf(*value, colors, mistakes_)) words.color = colors[*choice];
-  }
-  if (word == "state") {
-    static constexpr std::string_view choices[] = {"off", "on"};
-    if (const auto choice = choiceOf(*value, choices, mistakes_)) words.isOn = *choice == 1;
-  }
-  if (word == "background") {
-    static constexpr std::string_view choices[] = {"red"};
-    if (choiceOf(*value, choices, mistakes_)) words.isRed = true;
-  }
+void StepReader::readAlign(ControlIndex /*control*/, const Node& value, ControlWords& words) const {
+  static constexpr std::string_view choices[] = {"natural", "center"};
+  if (const auto choice = choiceOf(value, choices, mistakes_)) words.isCentered = *choice == 1;
+}
+
+void StepReader::readToolTip(ControlIndex /*control*/, const Node& value,
+                             ControlWords& words) const {
+  words.toolTip = textOf(value, "a text", mistakes_);
+}
+
+void StepReader::readColor(ControlIndex /*control*/, const Node& value, ControlWords& words) const {
+  if (const auto choice = choiceOf(value, colors, mistakes_)) words.color = colors[*choice];
+}
+
+void StepReader::readState(ControlIndex /*control*/, const Node& value, ControlWords& words) const {
+  static constexpr std::string_view choices[] = {"off", "on"};
+  if (const auto choice = choiceOf(value, choices, mistakes_)) words.isOn = *choice == 1;
+}
+
+void StepReader::readRed(ControlIndex /*control*/, const Node& value, ControlWords& words) const {
+  static constexpr std::string_view choices[] = {"red"};
+  if (choiceOf(value, choices, mistakes_)) words.isRed = true;
+}
+
+template <std::optional<bool> ControlWords::*flag>
+void StepReader::readFlag(ControlIndex /*control*/, const Node& value, ControlWords& words) const {
+  words.*flag = flagOf(value, mistakes_);
+}
+
+void StepReader::readPress(ControlIndex /*control*/, const Node& value, ControlWords& words) const {
+  words.press = readLead(value);
 }
 
 std::optional<Lead> StepReader::readLead(const Node& value) const {
@@ -248,32 +290,34 @@ std::optional<Lead> StepReader::readLead(const Node& value) const {
 }
 
 void StepReader::readWait(const Node& key, const NodeRef& value, StepWords& words) const {
-  std::string_view seconds = std::string_view(key.text).substr(words::after.size());
-  if (seconds.ends_with(" s")) seconds.remove_suffix(2);
-  const auto number = walkthrough::parseNumber<int>(seconds);
-  if (!key.text.ends_with(" s") || !number || *number < 1 || *number > mostSeconds) {
-    mistakes_.add(key.place, "expected whole seconds, such as “after 5 s”, found " + foundWords(key));
+  const auto seconds = secondsOf(key.text);
+  if (!seconds) {
+    mistakes_.add(key.place,
+                  "expected whole seconds, such as “after 5 s”, found " + foundWords(key));
     return;
   }
-  Wait wait{.seconds = *number, .place = key.place};
-  std::optional<Lead> lead;
-  if (value->kind == Node::Kind::table) {
-    for (const auto& [word, each] : entriesOf(value, "a table", mistakes_)) {
-      static constexpr std::string_view choices[] = {"give up", "start again"};
-      if (word->text == "go") {
-        lead = readLead(*each);
-      } else if (word->text == "other presses") {
-        if (const auto choice = choiceOf(*each, choices, mistakes_)) wait.startsAgain = *choice == 1;
-      } else {
-        mistakes_.add(word->place, "expected “go” or “other presses”, found " + foundWords(*word));
-      }
-    }
-  } else {
-    lead = readLead(*value);
-  }
+  Wait wait{.seconds = *seconds, .place = key.place};
+  const auto lead =
+      value->kind == Node::Kind::table ? readWaitTable(value, wait) : readLead(*value);
   if (!lead) return;
   wait.lead = *lead;
   words.wait = wait;
+}
+
+std::optional<Lead> StepReader::readWaitTable(const NodeRef& table, Wait& wait) const {
+  static constexpr std::string_view choices[] = {"give up", "start again"};
+  std::optional<Lead> lead;
+  for (const auto& [word, value] : entriesOf(table, "a table", mistakes_)) {
+    if (word->text == "go") {
+      lead = readLead(*value);
+    } else if (word->text == "other presses") {
+      if (const auto choice = choiceOf(*value, choices, mistakes_)) wait.startsAgain = *choice == 1;
+    } else {
+      mistakes_.add(word->place, "expected “go” or “other presses”, found " + foundWords(*word));
+    }
+  }
+  if (!lead) mistakes_.add(table->place, "expected “go” with where the wait leads");
+  return lead;
 }
 
 }  // namespace qz::tools::steps

@@ -16,27 +16,48 @@ class StepReader {
   StepReader(const std::vector<Control>& controls, const std::map<std::string, StepIndex>& steps,
              Mistakes& mistakes);
 
-  /// Adds what `body` says to `words`; what it says replaces what was said before. `body` is a table
-  /// without fragments; a name may occur in it several times.
+  /// Adds what `body` says to `words`; what it says replaces what was said before. `body` is a
+  /// table without fragments; a name may occur in it several times.
   void read(const Node& body, StepWords& words) const;
 
  private:
+  struct StepWordRow;
+  struct PropertyRow;
+  static const StepWordRow stepWords[];
+  static const PropertyRow properties[];
+
   void readEntry(const Node& key, const NodeRef& value, StepWords& words) const;
+  void refuseEntry(const Node& key) const;
+  /// Reads names of controls: `hide: [usb, wifi]`.
+  template <std::optional<bool> ControlWords::*flag, bool value>
+  void readNames(const NodeRef& names, const PropertyRow& row, StepWords& words) const;
+  /// Reads a value for each control: `font: {heading: Helvetica 18}`.
+  void readEach(const NodeRef& values, const PropertyRow& row, StepWords& words) const;
+  void readWait(const Node& key, const NodeRef& value, StepWords& words) const;
+  std::optional<Lead> readWaitTable(const NodeRef& table, Wait& wait) const;
+
   void readControl(ControlIndex control, const NodeRef& value, StepWords& words) const;
-  void readProperty(ControlIndex control, const Node& key, const NodeRef& value,
+  void readProperty(ControlIndex control, const Node& key, const Node& value,
                     ControlWords& words) const;
   void readContent(ControlIndex control, const Node& value, ControlWords& words) const;
-  void readFont(const Node& value, ControlWords& words) const;
-  void readWait(const Node& key, const NodeRef& value, StepWords& words) const;
+  void readHtml(ControlIndex control, const Node& value, ControlWords& words) const;
+  void readFont(ControlIndex control, const Node& value, ControlWords& words) const;
+  void readAlign(ControlIndex control, const Node& value, ControlWords& words) const;
+  void readToolTip(ControlIndex control, const Node& value, ControlWords& words) const;
+  void readColor(ControlIndex control, const Node& value, ControlWords& words) const;
+  void readRed(ControlIndex control, const Node& value, ControlWords& words) const;
+  void readState(ControlIndex control, const Node& value, ControlWords& words) const;
+  template <std::optional<bool> ControlWords::*flag>
+  void readFlag(ControlIndex control, const Node& value, ControlWords& words) const;
+  void readPress(ControlIndex control, const Node& value, ControlWords& words) const;
+
   std::optional<Lead> readLead(const Node& value) const;
   /// Returns the control with that name; absent, and a mistake, if there is none.
   std::optional<ControlIndex> controlNamed(const Node& name) const;
-
-  /// A word that names controls: `hide: [usb, wifi]`, or with a value for each: `font: {title: …}`.
-  template <class Set>
-  void forEachName(const Node& value, const Set& set) const;
-  template <class Set>
-  void forEachEntry(const NodeRef& value, const Set& set) const;
+  /// Returns the row of a property; null if no property has this name.
+  static const PropertyRow* propertyNamed(std::string_view word);
+  /// Whether controls of this kind have the property. If not, that is a mistake at `at`.
+  bool has(ControlIndex control, const PropertyRow& row, const Node& at) const;
 
   const std::vector<Control>& controls_;
   const std::map<std::string, StepIndex>& steps_;

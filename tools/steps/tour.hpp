@@ -3,6 +3,7 @@
 #pragma once
 
 #include <cstddef>
+#include <limits>
 #include <optional>
 #include <string>
 #include <vector>
@@ -85,7 +86,13 @@ struct Tour {
   std::vector<Control> controls{};  ///< back to front
   StepWords everyStep{};
   std::vector<Step> steps{};  ///< at least one; the first is the start
-  std::size_t mostStepsBack = 50;
+  std::size_t mostStepsBack = std::numeric_limits<std::size_t>::max();
 };
+
+/// Returns the wait of a step: its own, or that of every step.
+inline const std::optional<Wait>& waitAt(const Tour& tour, StepIndex step) {
+  const auto& own = tour.steps[step].words.wait;
+  return own ? own : tour.everyStep.wait;
+}
 
 }  // namespace qz::tools::steps

@@ -70,9 +70,9 @@ std::optional<int> numberOf(const Node& node, int least, int most, std::string_v
   const auto number = walkthrough::parseNumber<int>(node.text);
   if (number && *number >= least && *number <= most) return number;
   expect(node,
-           std::string(what) + " (a whole number from " + std::to_string(least) + " to " +
-               std::to_string(most) + ")",
-           mistakes);
+         std::string(what) + " (a whole number from " + std::to_string(least) + " to " +
+             std::to_string(most) + ")",
+         mistakes);
   return std::nullopt;
 }
 

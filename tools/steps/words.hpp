@@ -17,6 +17,8 @@ namespace words {
 inline constexpr std::string_view use = "use";
 inline constexpr std::string_view like = "like";
 inline constexpr std::string_view after = "after ";  // and the seconds
+inline constexpr std::string_view background = "background";
+inline constexpr std::string_view passedOver = "back passes over";
 inline constexpr std::string_view back = "back";
 inline constexpr std::string_view end = "end";
 inline constexpr std::string_view nothing = "nothing";

@@ -10,8 +10,8 @@
 namespace qz::tools::steps {
 namespace {
 
-/// How many nodes there may be for each byte of the text, once aliases are followed. Without aliases
-/// there is hardly more than one node for two bytes.
+/// How many nodes there may be for each byte of the text, once aliases are followed. Without
+/// aliases there is hardly more than one node for two bytes.
 constexpr std::size_t mostNodesForAByte = 4;
 
 struct YamlRefusal {
@@ -39,7 +39,8 @@ class TreeBuilder {
   void addScalar(std::string text, bool isPlain, Place place, const std::string& anchor) {
     const bool isNothing = isPlain && (text.empty() || text == "~" || text == "null");
     const auto kind = isNothing ? Node::Kind::nothing : Node::Kind::scalar;
-    keep(std::make_shared<Node>(Node{.kind = kind, .place = place, .text = std::move(text)}), anchor);
+    keep(std::make_shared<Node>(Node{.kind = kind, .place = place, .text = std::move(text)}),
+         anchor);
   }
 
   void addAlias(const std::string& anchor, Place place) {
@@ -106,10 +107,8 @@ class YamlParser {
     diagnostics_.reset(fy_diag_create(&quiet));
     if (!diagnostics_) throw std::bad_alloc();
     fy_diag_set_collect_errors(diagnostics_.get(), true);
-    const fy_parse_cfg options = {.search_path = "",
-                                  .flags = FYPCF_QUIET,
-                                  .userdata = nullptr,
-                                  .diag = diagnostics_.get()};
+    const fy_parse_cfg options = {
+        .search_path = "", .flags = FYPCF_QUIET, .userdata = nullptr, .diag = diagnostics_.get()};
     parser_.reset(fy_parser_create(&options));
     if (!parser_ || fy_parser_set_string(parser_.get(), text.data(), text.size()) != 0) {
       throw std::bad_alloc();
