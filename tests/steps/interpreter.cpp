@@ -90,11 +90,12 @@ Interpreter::Interpreter(const Tour& tour)
   for (const auto& [name, part] : tour_.steps) steps_[name] = completed(part, {});
 }
 
-// "What the step itself says replaces what fragments say, and both replace what `like` says."
+// "A later fragment replaces what an earlier one says, the step itself replaces what fragments say, and
+// all replace what `like` says."
 Part Interpreter::completed(const Part& part, const Arguments& arguments) const {
   Part whole = filledIn(part, arguments);
-  for (const Use& use : whole.uses) {
-    whole = joined(whole, completed(tour_.fragments.at(use.fragment), use.arguments));
+  for (auto use = part.uses.rbegin(); use != part.uses.rend(); ++use) {
+    whole = joined(whole, completed(tour_.fragments.at(use->fragment), use->arguments));
   }
   if (part.like.empty()) return whole;
   const auto other = std::find_if(tour_.steps.begin(), tour_.steps.end(),
@@ -135,7 +136,7 @@ bool Interpreter::isShown(const std::string& step, std::size_t control) const {
 bool Interpreter::isEnabled(const State& state, std::size_t control) const {
   const Words words = wordsOf(state.step, control);
   if (words.isEnabled) return *words.isEnabled;
-  if (words.press == "back") return !state.way.empty();
+  if (words.press == "back" && state.way.empty()) return false;
   return tour_.controls[control].isEnabled;
 }
 

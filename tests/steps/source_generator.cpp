@@ -78,7 +78,7 @@ void Maker::addControl(ViewKind kind, const std::string& name) {
   }
   if (dice_.oneIn(5)) control.toolTip = some(plain);
   control.isShown = !dice_.oneIn(6);
-  control.isEnabled = !rowOf(kind).isControl || !dice_.oneIn(7) || drivers::isButton(kind);//TODO
+  control.isEnabled = !rowOf(kind).isControl || !dice_.oneIn(7);
   if (rowOf(kind).showsState && dice_.oneIn(3)) control.state = toolkit::State::on;
   if (rowOf(kind).hasMixedState && name.empty() && dice_.oneIn(2)) {
     control.state = toolkit::State::mixed;  // no command gives a box this state
@@ -203,7 +203,7 @@ Use Maker::useOf(const std::string& fragment) {
 void Maker::addSharing() {
   for (auto& [name, part] : tour_.steps) {
     for (const auto& fragment : tour_.fragments) {
-      if (dice_.oneIn(3) && part.uses.empty()) part.uses.push_back(useOf(fragment.first));
+      if (dice_.oneIn(3)) part.uses.push_back(useOf(fragment.first));
     }
     const std::string& other = some(names_);
     if (dice_.oneIn(5) && other < name) part.like = other;
@@ -212,7 +212,8 @@ void Maker::addSharing() {
   std::erase_if(tour_.fragments, [&](const auto& fragment) {
     return std::none_of(tour_.steps.begin(), tour_.steps.end(), [&](const auto& step) {
       const auto& uses = step.second.uses;
-      return !uses.empty() && uses[0].fragment == fragment.first;
+      return std::any_of(uses.begin(), uses.end(),
+                         [&](const Use& use) { return use.fragment == fragment.first; });
     });
   });
 }
