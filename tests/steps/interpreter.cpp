@@ -8,35 +8,32 @@ namespace qz::meaning {
 
 namespace {
 
-template <class T>
-void orElse(std::optional<T>& said, const std::optional<T>& otherwise) {
+template <class Option>
+void orElse(Option& said, const Option& otherwise) {
   if (!said) said = otherwise;
 }
 
-/// What is said, and otherwise the other words.
-Words joined(Words said, const Words& otherwise) {
+/// Adds what is said only otherwise.
+template <class Said>
+void orElseEach(Said& said, Said& otherwise) {
+  std::apply(
+      [&](auto&... mine) {
+        std::apply([&](auto&... others) { (orElse(mine, others), ...); }, otherwise.options());
+      },
+      said.options());
+}
+
+Words joined(Words said, Words otherwise) {
   said.isEntry |= otherwise.isEntry;
-  orElse(said.content, otherwise.content);
-  orElse(said.font, otherwise.font);
-  orElse(said.isCentered, otherwise.isCentered);
-  orElse(said.toolTip, otherwise.toolTip);
-  orElse(said.color, otherwise.color);
-  orElse(said.isRed, otherwise.isRed);
-  orElse(said.isOn, otherwise.isOn);
-  orElse(said.isShown, otherwise.isShown);
-  orElse(said.isEnabled, otherwise.isEnabled);
-  orElse(said.flashes, otherwise.flashes);
-  orElse(said.press, otherwise.press);
+  orElseEach(said, otherwise);
   return said;
 }
 
-Part joined(Part said, const Part& otherwise) {
+Part joined(Part said, Part otherwise) {
   for (const auto& [name, words] : otherwise.controls) {
     said.controls[name] = joined(said.controls[name], words);
   }
-  orElse(said.background, otherwise.background);
-  orElse(said.wait, otherwise.wait);
-  orElse(said.isPassedOver, otherwise.isPassedOver);
+  orElseEach(said, otherwise);
   return said;
 }
 

@@ -10,12 +10,12 @@ namespace qz::meaning {
 
 using tools::walkthrough::StepPicture;
 
-JointWalk::JointWalk(const Tour& tour, const BuiltSource& source)
-    : tour_(tour), source_(source), meaning_(tour) {}
+JointWalk::JointWalk(const Tour& tour, const BuiltSource& source, const std::string& step)
+    : tour_(tour), source_(source), meaning_(tour), start_(meaning_.startAt(step)) {}
 
 std::string JointWalk::run() {
   Play first(source_);
-  std::string wrong = arrive(meaning_.start(), first.picture(), {});
+  std::string wrong = arrive(start_, first.picture(), {});
   for (std::size_t i = 0; i < pending_.size() && wrong.empty(); ++i) {
     const Arrival from = pending_[i];
     for (const Move& move : movesOf(meaning_, from.state)) {
@@ -97,7 +97,7 @@ std::string JointWalk::passTime(const State& state, Play& play, double seconds) 
 }
 
 void JointWalk::play(Play& play, const Path& path) const {
-  State state = meaning_.start();
+  State state = start_;
   for (const Move& move : path) {
     if (move) {
       play.click(*move);
@@ -109,7 +109,7 @@ void JointWalk::play(Play& play, const Path& path) const {
 }
 
 std::string JointWalk::words(const Path& path) const {
-  State state = meaning_.start();
+  State state = start_;
   std::string words = " the start at “" + state.step + "”";
   for (const Move& move : path) {
     state = after(meaning_, state, move);

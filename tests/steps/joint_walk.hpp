@@ -19,7 +19,8 @@ using Path = std::vector<Move>;
 /// lead, after a second path too. Presses are made when half of a pending wait is over.
 class JointWalk {
  public:
-  JointWalk(const Tour& tour, const BuiltSource& source);
+  /// `step` is where the source starts.
+  JointWalk(const Tour& tour, const BuiltSource& source, const std::string& step);
 
   /// Walks. Returns what differs and after which path; empty if nothing does.
   std::string run();
@@ -46,6 +47,7 @@ class JointWalk {
   const Tour& tour_;
   const BuiltSource& source_;
   const Interpreter meaning_;
+  const State start_;
   std::map<std::pair<State, std::string>, int> arrivals_{};  // how often each place was reached
   std::map<std::string, std::string> seenAt_{};              // the steps, except what is the user's
   std::vector<Arrival> pending_{};

@@ -52,7 +52,7 @@ class Maker {
   void addWait(Part& part);
   // Sharing
   void addFragments();
-  Use useOf(const std::string& fragment);
+  Use useOf(const std::string& fragment, bool isNested = false);
   void addSharing();
   // The ways between the steps
   void addSteps();
@@ -64,6 +64,7 @@ class Maker {
   Dice& dice_;
   Tour tour_{};
   std::vector<std::string> names_{};  // of the steps
+  std::size_t backgrounds_ = 0;       // one step in so many has its own; 0: none has one
 };
 
 void Maker::addControl(ViewKind kind, const std::string& name) {
@@ -126,18 +127,18 @@ void Maker::sayOfContent(ViewKind kind, Words& words) {
 
 void Maker::sayOfButton(ViewKind kind, Words& words) {
   if (dice_.oneIn(5)) words.color = some(colors);
-  if (rowOf(kind).showsState && dice_.oneIn(4) && getenv("Q")) words.isOn = dice_.oneIn(2);
+  if (rowOf(kind).showsState && dice_.oneIn(4)) words.isOn = dice_.oneIn(2);
   if (dice_.oneIn(4)) words.flashes = !dice_.oneIn(4);
   if (dice_.oneIn(rowOf(kind).showsState ? 5 : 2)) words.press = target();
 }
 
 Words Maker::wordsFor(ViewKind kind) {
   Words words;
-  if (kind==ViewKind::imageView||!dice_.oneIn(3)) sayOfContent(kind, words);
+  if (!dice_.oneIn(3)) sayOfContent(kind, words);
   if (drivers::isButton(kind)) sayOfButton(kind, words);
   if (rowOf(kind).isControl && kind != ViewKind::imageView) {
     if (dice_.oneIn(7)) words.font = some(fonts);
-    if (dice_.oneIn(9)) words.isCentered = getenv("Q") != nullptr;
+    if (dice_.oneIn(9)) words.isCentered = dice_.oneIn(2);
   }
   if (dice_.oneIn(8)) words.toolTip = dice_.oneIn(4) ? "" : some(plain);
   if (dice_.oneIn(8)) words.isShown = dice_.oneIn(2);
@@ -169,7 +170,7 @@ void Maker::addWait(Part& part) {
 
 // Fragments have the parameters "word" and "place".
 void Maker::addFragments() {
-  for (const char* name : {"question", "part 2"}) {
+  for (const char* name : {"part 2", "question"}) {
     if (!dice_.oneIn(3)) continue;
     Part part = partOf(3);
     for (auto& [control, words] : part.controls) {
@@ -179,24 +180,36 @@ void Maker::addFragments() {
       if (words.press && dice_.oneIn(2)) words.press = "{place}";
     }
     if (dice_.oneIn(6)) part.wait = Wait{3, "{place}", dice_.oneIn(2)};
+    if (!tour_.fragments.empty() && dice_.oneIn(3)) part.uses.push_back(useOf("part 2", true));
     tour_.fragments[name] = part;
   }
 }
 
-/// Gives exactly the arguments that the fragment takes.
-Use Maker::useOf(const std::string& fragment) {
+/// Whether the part has the parameter.
+bool takes(const Part& part, const std::string& parameter) {
+  const auto has = [&](const std::string& text) { return text.find(parameter) != text.npos; };
+  return (part.wait && has(part.wait->go)) ||
+         std::any_of(part.controls.begin(), part.controls.end(),
+                     [&](const auto& said) {
+                       const Words& words = said.second;
+                       return (words.content && has(words.content->written)) ||
+                              (words.press && has(*words.press));
+                     }) ||
+         std::any_of(part.uses.begin(), part.uses.end(), [&](const Use& use) {
+           return std::any_of(use.arguments.begin(), use.arguments.end(),
+                              [&](const auto& argument) { return has(argument.second); });
+         });
+}
+
+/// Gives exactly the arguments that the fragment takes; `isNested`: from another fragment.
+Use Maker::useOf(const std::string& fragment, bool isNested) {
   Use use{fragment};
+  const bool passesOn = isNested && dice_.oneIn(2);
   const Part& part = tour_.fragments.at(fragment);
-  const auto takes = [&](const char* parameter) {
-    return std::any_of(part.controls.begin(), part.controls.end(), [&](const auto& said) {
-      const Words& words = said.second;
-      return (words.content && words.content->written.find(parameter) != std::string::npos) ||
-             words.press == parameter;
-    });
-  };
-  if (takes("{word}")) use.arguments["word"] = dice_.oneIn(2) ? "Größe" : "two words";
-  const bool waits = part.wait && part.wait->go == "{place}";
-  if (takes("{place}") || waits) use.arguments["place"] = some(names_);
+  if (takes(part, "{word}")) {
+    use.arguments["word"] = passesOn ? "{word}" : dice_.oneIn(2) ? "Größe" : "two words";
+  }
+  if (takes(part, "{place}")) use.arguments["place"] = passesOn ? "{place}" : some(names_);
   return use;
 }
 
@@ -208,14 +221,9 @@ void Maker::addSharing() {
     const std::string& other = some(names_);
     if (dice_.oneIn(5) && other < name) part.like = other;
   }
-  // A fragment that nothing uses is of no use.
-  std::erase_if(tour_.fragments, [&](const auto& fragment) {
-    return std::none_of(tour_.steps.begin(), tour_.steps.end(), [&](const auto& step) {
-      const auto& uses = step.second.uses;
-      return std::any_of(uses.begin(), uses.end(),
-                         [&](const Use& use) { return use.fragment == fragment.first; });
-    });
-  });
+  if (dice_.oneIn(6) && tour_.fragments.contains("part 2")) {
+    tour_.everyStep.uses.push_back(useOf("part 2"));
+  }
 }
 
 void Maker::addSteps() {
@@ -223,7 +231,7 @@ void Maker::addSteps() {
     Part part = partOf(2);
     if (dice_.oneIn(4)) addWait(part);
     if (dice_.oneIn(8)) part.isPassedOver = !dice_.oneIn(4);
-    if (tour_.everyStep.background && dice_.oneIn(3)) part.background = dice_.oneOf(pictures);
+    if (backgrounds_ > 0 && dice_.oneIn(backgrounds_)) part.background = dice_.oneOf(pictures);
     tour_.steps.emplace_back(name, part);
   }
 }
@@ -285,7 +293,8 @@ Tour Maker::make() {
     back.press = "back";
   }
   if (dice_.oneIn(12)) addWait(tour_.everyStep);
-  if (dice_.oneIn(8)) tour_.everyStep.background = dice_.oneOf(pictures);
+  if (dice_.oneIn(8)) backgrounds_ = 1 + dice_.below(2);
+  if (backgrounds_ > 1) tour_.everyStep.background = dice_.oneOf(pictures);
   if (dice_.oneIn(12)) {
     Words& red = tour_.everyStep.controls[anyPushButton().name];
     red.isEntry = red.isRed.emplace(true);
@@ -307,13 +316,16 @@ bool reachesEveryStep(const Tour& tour, const Places& places) {
 
 }  // namespace
 
+std::optional<Generated> sourceOf(const Tour& tour, Dice& dice) {
+  const auto places = placesOf(Interpreter(tour), mostPlaces);
+  if (!places || !reachesEveryStep(tour, *places)) return std::nullopt;
+  return Generated{tour, *places, yamlOf(tour, dice), windowOf(tour)};
+}
+
 Generated generate(std::uint64_t seed) {
   Dice dice(seed);
   for (;;) {
-    const Tour tour = Maker(dice).make();
-    const auto places = placesOf(Interpreter(tour), mostPlaces);
-    if (!places || !reachesEveryStep(tour, *places)) continue;
-    return {tour, *places, yamlOf(tour, dice), windowOf(tour)};
+    if (auto source = sourceOf(Maker(dice).make(), dice)) return *source;
   }
 }
 

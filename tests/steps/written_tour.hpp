@@ -6,6 +6,7 @@
 #include <map>
 #include <optional>
 #include <string>
+#include <tuple>
 #include <utility>
 #include <vector>
 
@@ -48,6 +49,12 @@ struct Words {
   std::optional<bool> isEnabled{};
   std::optional<bool> flashes{};
   std::optional<std::string> press{};  ///< a step, back, end or nothing
+
+  /// Everything that can be said or not.
+  auto options() {
+    return std::tie(content, font, isCentered, toolTip, color, isRed, isOn, isShown, isEnabled,
+                    flashes, press);
+  }
 };
 
 struct Wait {
@@ -71,6 +78,9 @@ struct Part {
   std::optional<bool> isPassedOver{};
   std::vector<Use> uses{};
   std::string like{};  ///< empty: like no other
+
+  /// The same, except of controls.
+  auto options() { return std::tie(background, wait, isPassedOver); }
 };
 
 struct Tour {
