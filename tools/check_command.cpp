@@ -116,13 +116,11 @@ void checkOne(const std::string& path, const CheckOptions& options, ProgressLine
   hooks.report = [&](const check::Progress& progress) { line.show(path, progress); };
   hooks.isCancelled = Interruption::isWanted;
   try {
-    steps::ScriptFile script = steps::openScript(path);
-    job.file.emplace(std::move(script.file));
+    const steps::ScriptFile script = steps::openScript(path);
+    job.file.emplace(script.file);
     CheckOptions own = options;
-    if (script.from && !own.stage.window && !own.stage.assets) {
-      own.stage = script.from->source.stage;
-      own.standIn = false;
-    }
+    own.stage = script.stage(own.stage);
+    if (script.from) own.standIn = false;
     job.verdict = checkScript(*job.file, own, hooks);
   } catch (const Failure& failure) {
     job.failure = failure;

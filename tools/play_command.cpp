@@ -35,8 +35,7 @@ play::Style outputStyle() {
 
 void addPress(play::PlayOptions& options, const std::string& text) {
   const auto tag = play::parseTag(text);
-  if (!tag) throw UsageError("--press: expected a tag (a whole number), found " + quote(text));
-  options.steps.emplace_back(play::Press{*tag});
+  options.steps.emplace_back(tag ? play::Press{*tag, {}} : play::Press{0, text});
 }
 
 void addAdvance(play::PlayOptions& options, const std::string& text) {

@@ -6,6 +6,7 @@
 #include <iostream>
 #include <new>
 
+#include "tools/steps/place.hpp"
 #include "tools/support/failure.hpp"
 #include "tools/support/text_layout.hpp"
 
@@ -36,6 +37,9 @@ int runReporting(const std::vector<std::string>& arguments,
                  const std::vector<CommandEntry>& commands) {
   try {
     return runCommandLine(toolHelp(), commands, arguments);
+  } catch (const steps::SourceRefused& refused) {
+    for (const std::string& message : refused.messages()) report(refused.status(), message);
+    return static_cast<int>(refused.status());
   } catch (const Failure& failure) {
     return report(failure.status(), failure.what());
   } catch (const std::bad_alloc&) {

@@ -165,7 +165,7 @@ Verdict checkScript(const InputFile& file, const CheckOptions& options,
 
   const auto driver = requireDriver(options.toolkit);
   driver->setResourcePath(resources);
-  Verdict verdict{.path = file.path(), .isStandIn = options.standIn};
+  Verdict verdict{.path = file.path(), .isStandIn = options.standIn, .names = options.stage.names};
   verdict.findings = readScript(script, driver->toolkit());
 
   const auto plan = walkthrough::planStage(options.stage, script.dictionary(), file.path());

@@ -44,7 +44,8 @@ struct Explored {
 struct Verdict {
   std::string path;  ///< of the script
   Explored explored{};
-  bool isStandIn = false;  ///< nothing is said about targets
+  bool isStandIn = false;      ///< nothing is said about targets
+  walkthrough::Names names{};  ///< of the script's source
   ExpectationCounts expected{};
   std::size_t inBaseline = 0;       ///< findings that a baseline took back
   std::vector<Finding> findings{};  ///< by place in the file, most severe first

@@ -161,12 +161,14 @@ class Conclusions {
     for (const auto& [subject, entry] : facts_.all(FactKind::sharedTagPressed)) {
       addForTag(subject, entry,
                 findingOf("same-tag",
-                          "the button " + std::to_string(subject) +
+                          "the button " + names().controlWords(static_cast<Tag>(subject)) +
                               " can be pressed while another control has the same tag; commands "
                               "reach only the one that is farther back",
                           "give each control its own tag"));
     }
   }
+
+  const walkthrough::Names& names() const { return exploration_.setting().plan.names; }
 
   void buttonsWithoutList() {
     for (const auto& [subject, entry] : facts_.all(FactKind::noListPressed)) {
@@ -174,7 +176,8 @@ class Conclusions {
       place.isPlace = true;
       addForTag(subject, place,
                 findingOf("no-list",
-                          "a user can press the button " + std::to_string(subject) +
+                          "a user can press the button " +
+                              names().controlWords(static_cast<Tag>(subject)) +
                               ", but no list is under that tag: nothing happens, and the press "
                               "cancels every timer",
                           "add a list, or hide or disable the button"));
@@ -196,7 +199,7 @@ class Conclusions {
     for (auto& [cause, lost] : found) {
       const auto [list, element] = placeOf(cause.first);
       Finding finding = findingOf("timer-lost",
-                                  "a press of the button " + std::to_string(cause.second) +
+                                  "a press of the button " + names().controlWords(cause.second) +
                                       ", which has no list, cancels the timer that " +
                                       nameOf(cause.first) + " starts",
                                   "hide or disable the button while the timer runs");

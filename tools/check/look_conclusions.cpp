@@ -62,7 +62,7 @@ class LookConclusions {
   void add(const LookDifference& difference) {
     const Tag tag = ownTag(difference.control);
     Finding finding = findingOf("looks-differ",
-                                "after this list the control " + std::to_string(tag) + " shows " +
+                                "after this list " + nameOf(difference.control) + " shows " +
                                     difference.words + ", depending on how the user came here",
                                 "let this list set what the control shows");
     finding.tag = tag;
@@ -149,7 +149,7 @@ class LookConclusions {
   }
 
   std::string nameOf(std::size_t control) const {
-    return "the control " + std::to_string(ownTag(control));
+    return "the control " + setting_.plan.names.controlWords(ownTag(control));
   }
 
   bool looksElse(const Visit& visit, std::size_t part) const {

@@ -73,9 +73,16 @@ class PlaceConclusions {
     }
   }
 
+  const walkthrough::Names& names() const { return exploration_.setting().plan.names; }
+
+  std::string nameOfList(const std::string& key) const {
+    const std::string step = names().stepOf(key);
+    return step.empty() ? "list " + quote(key) : "the step " + quote(step);
+  }
+
   std::string causeOf(const Blame& blame) const {
-    if (blame.list) return "list " + quote(script_.lists()[*blame.list].key);
-    if (blame.tag) return "a press of " + std::to_string(*blame.tag) + ", which has no list,";
+    if (blame.list) return nameOfList(script_.lists()[*blame.list].key);
+    if (blame.tag) return "a press of " + names().controlWords(*blame.tag) + ", which has no list,";
     return "the start";
   }
 

@@ -24,7 +24,8 @@ std::string number(double value) {
 
 class Replay {
  public:
-  explicit Replay(const Setting& setting) : script_(setting.script.dictionary()) {
+  explicit Replay(const Setting& setting)
+      : script_(setting.script.dictionary()), naming_(setting.plan.names) {
     driver_.setResourcePath(setting.resources);
     stage_.emplace(driver_, setting.plan);
     stage_->engine().setObserver(std::make_shared<EndlessGuard>());
@@ -50,7 +51,11 @@ class Replay {
     return Outcome::made;
   }
 
-  StepPicture picture() { return walkthrough::takePicture(driver_, stage_->engine(), ""); }
+  StepPicture picture() {
+    StepPicture picture = walkthrough::takePicture(driver_, stage_->engine(), "");
+    naming_.apply(picture);
+    return picture;
+  }
 
  private:
   const toolkit::Subviews& controls() {
@@ -58,14 +63,18 @@ class Replay {
   }
 
   QZ_Plist_State_Parser::Dictionary script_;
+  walkthrough::Naming naming_;
   drivers::MemoryDriver driver_;
   std::optional<walkthrough::Stage> stage_;
 };
 
-std::string wordsOf(const Step& step) {
-  if (const auto* start = std::get_if<StartMove>(&step)) return "start " + start->key;
+std::string wordsOf(const Step& step, const walkthrough::Names& names) {
+  if (const auto* start = std::get_if<StartMove>(&step)) {
+    const std::string name = names.stepOf(start->key);
+    return "start " + (name.empty() ? start->key : quote(name));
+  }
   if (const auto* press = std::get_if<PressMove>(&step)) {
-    return "press " + std::to_string(press->tag);
+    return "press " + names.controlWords(press->tag);
   }
   return "wait " + number(std::get<WaitMove>(step).seconds) + " s";
 }
@@ -74,8 +83,9 @@ std::string wordsOf(const Step& step) {
 class Changes {
  public:
   Changes(const ControlPicture& before, const ControlPicture& after)
-      : before_(before.view), after_(after.view) {
-    if (before_.tag != after_.tag) add("gets the tag " + std::to_string(after_.tag));
+      : before_(before.view), after_(after.view), name_(before.name) {
+    if (name_.empty() && before_.tag != after_.tag)
+      add("gets the tag " + std::to_string(after_.tag));
     if (before_.hidden != after_.hidden) add(after_.hidden ? "hidden" : "shown");
     if (before_.enabled != after_.enabled) add(after_.enabled ? "enabled" : "disabled");
     addText("title", before_.title, after_.title);
@@ -89,7 +99,8 @@ class Changes {
 
   /// Returns a line such as "tag 5: hidden, new tag 6"; empty if nothing differs.
   std::string line() const {
-    return words_.empty() ? words_ : "tag " + std::to_string(before_.tag) + ": " + words_;
+    if (words_.empty()) return words_;
+    return (name_.empty() ? "tag " + std::to_string(before_.tag) : name_) + ": " + words_;
   }
 
  private:
@@ -105,6 +116,7 @@ class Changes {
 
   const drivers::ViewPicture& before_;
   const drivers::ViewPicture& after_;
+  const std::string& name_;  // empty: the control has none
   std::string words_;
 };
 
@@ -116,7 +128,7 @@ std::vector<std::string> changesBetween(const StepPicture& before, const StepPic
   }
   for (const auto& timer : after.timers) {
     const bool fires = timer.timeLeft <= longestDelay;
-    changes.push_back("timer " + timer.key +
+    changes.push_back((timer.step.empty() ? "timer " + timer.key : quote(timer.step)) +
                       (fires ? " in " + number(timer.timeLeft) + " s" : ", which never fires"));
   }
   if (after.ended && !before.ended) changes.emplace_back("the end");
@@ -126,6 +138,7 @@ std::vector<std::string> changesBetween(const StepPicture& before, const StepPic
 }  // namespace
 
 std::vector<PlayedMove> playPath(const Setting& setting, const Path& path) {
+  const auto& names = setting.plan.names;
   Replay replay(setting);
   std::vector<PlayedMove> played;
   StepPicture before = replay.picture();
@@ -133,12 +146,12 @@ std::vector<PlayedMove> playPath(const Setting& setting, const Path& path) {
     const auto outcome = replay.make(step);
     if (outcome == Replay::Outcome::endless) {
       played.push_back(
-          {wordsOf(step), {"runs lists without end, so the program crashes"}, false, true});
+          {wordsOf(step, names), {"runs lists without end, so the program crashes"}, false, true});
       break;
     }
     StepPicture after = replay.picture();
-    played.push_back(
-        {wordsOf(step), changesBetween(before, after), outcome == Replay::Outcome::raised, false});
+    played.push_back({wordsOf(step, names), changesBetween(before, after),
+                      outcome == Replay::Outcome::raised, false});
     before = std::move(after);
   }
   return played;

@@ -45,22 +45,25 @@ std::string shellWord(const std::string& text) {
 
 std::string playCommand(const Report& report, const Path& path) {
   return "qz-walkthrough play " + shellWord(report.verdict.path) + report.stageArguments + " " +
-         playArguments(path);
+         playArguments(path, report.verdict.names);
 }
 
-std::string playArguments(const Path& path) {
+std::string playArguments(const Path& path, const walkthrough::Names& names) {
   std::string arguments;
   bool isPressing = false;
   for (const Step& step : path) {
     if (const auto* press = std::get_if<PressMove>(&step)) {
       arguments += isPressing ? " " : " --press ";
-      arguments += std::to_string(press->tag);
+      const auto name = names.controls.find(press->tag);
+      arguments +=
+          name == names.controls.end() ? std::to_string(press->tag) : shellWord(name->second);
       isPressing = true;
       continue;
     }
     isPressing = false;
     if (const auto* start = std::get_if<StartMove>(&step)) {
-      arguments += " --start " + shellWord(start->key);
+      const std::string name = names.stepOf(start->key);
+      arguments += " --start " + shellWord(name.empty() ? start->key : name);
     } else {
       arguments += " --advance " + shortest(std::get<WaitMove>(step).seconds);
     }

@@ -57,6 +57,6 @@ std::string shellWord(const std::string& text);
 /// Returns the command line that plays a path of the report's script.
 std::string playCommand(const Report& report, const Path& path);
 /// Returns the arguments of `play` that walk a path, such as "--start 1 --press 2 3".
-std::string playArguments(const Path& path);
+std::string playArguments(const Path& path, const walkthrough::Names& names = {});
 
 }  // namespace qz::tools::check

@@ -57,7 +57,7 @@ Json codeFlowOf(const Report& report, const Finding& finding) {
   const std::size_t shown = std::min(finding.path.size(), mostSteps);
   for (std::size_t i = 0; i < shown; ++i) {
     Json location = locationOf(report, nullptr);
-    location["message"] = messageOf(playArguments({finding.path[i]}));
+    location["message"] = messageOf(playArguments({finding.path[i]}, report.verdict.names));
     locations.push_back({{"location", std::move(location)}});
   }
   return {{"threadFlows", Json::array({{{"locations", std::move(locations)}}})}};

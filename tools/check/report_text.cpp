@@ -78,7 +78,7 @@ class TextReport {
   /// Writes the moves of a path, unless an earlier finding has the same path.
   void writeMoves(const Finding& finding) {
     if (finding.played.empty()) return;
-    if (!shown_.insert(playArguments(finding.path)).second) {
+    if (!shown_.insert(playArguments(finding.path, report_.verdict.names)).second) {
       out_ << "    (the moves are above)\n";
       return;
     }

@@ -36,7 +36,8 @@ std::string rectWords(const toolkit::Rect& rect) {
 
 Facts factsOf(const ControlPicture& control) {
   const drivers::ViewPicture& view = control.view;
-  return {{"tag", std::to_string(view.tag)},
+  // The tags of controls with names are not the author's.
+  return {{"tag", control.name.empty() ? std::to_string(view.tag) : control.name},
           {"frame", rectWords(view.frame)},
           {"title", quote(view.title.string())},
           {"text", quote(view.text.string())},
@@ -62,7 +63,8 @@ Facts factsOf(const std::optional<drivers::WindowPicture>& window) {
 }
 
 Facts factsOf(const StepPicture& picture) {
-  return {{"list started last", picture.lastList.value_or("none")},
+  return {picture.step.empty() ? Fact{"list started last", picture.lastList.value_or("none")}
+                               : Fact{"step", quote(picture.step)},
           {"flashing allowed", yesOrNo(picture.flashingAllowed)},
           {"walk-through ended", yesOrNo(picture.ended)}};
 }
@@ -146,7 +148,9 @@ void compareTimers(const StepPicture& before, const StepPicture& now,
       return timer ? "fires " + whenWords(timer->timeLeft) : "none";
     };
     const std::string anew = old && current ? "armed again, " : "";
-    changes.push_back({"timer of list " + key, words(old), anew + words(current)});
+    const std::string& step = (current ? current : old)->step;
+    const std::string what = step.empty() ? "timer of list " + key : "wait for " + quote(step);
+    changes.push_back({what, words(old), anew + words(current)});
   }
 }
 

@@ -49,8 +49,14 @@ Row rowOf(const ControlPicture& control, char mark) {
   std::string content = contentOf(control);
   // The line end that closes a paragraph would only leave an empty line in the table.
   content.erase(content.find_last_not_of('\n') + 1);
-  return {mark,    std::to_string(control.view.tag), std::string(rowOf(control.view.kind).word),
-          content, joined(remarksOn(control)),       control.view.hidden};
+  const std::string name =
+      control.name.empty() ? std::to_string(control.view.tag) : printable(control.name);
+  return {mark,
+          name,
+          std::string(rowOf(control.view.kind).word),
+          content,
+          joined(remarksOn(control)),
+          control.view.hidden};
 }
 
 char markOf(const ControlChanges& changes) {
@@ -92,7 +98,7 @@ class Renderer {
     for (const ControlPicture& control : changes_.gone) rows.push_back(rowOf(control, '-'));
     measure(rows);
 
-    addRow({' ', "tag", "kind", "shows", "details", false}, faint);
+    addRow({' ', picture_.step.empty() ? "tag" : "name", "kind", "shows", "details", false}, faint);
     for (std::size_t i = 0; i < rows.size(); ++i) {
       addRow(rows[i], rows[i].hidden ? faint : "");
       if (i >= picture_.controls.size()) continue;
@@ -103,15 +109,22 @@ class Renderer {
   }
 
   void addEngine() {
-    std::string words = picture_.lastList ? "List " + *picture_.lastList + " was started last"
-                                          : "No list was started";
+    std::string words = place();
     if (picture_.flashingAllowed) words += "; flashing is allowed";
     for (const TimerPicture& timer : picture_.timers) {
-      words += "; list " + timer.key + " runs " + whenWords(timer.timeLeft);
+      words += timer.step.empty() ? "; list " + timer.key + " runs "
+                                  : "; the step " + quote(timer.step) + " comes ";
+      words += whenWords(timer.timeLeft);
     }
     if (picture_.ended) words += "; the walk-through has ended";
     addParagraph(words + ".", "");
     addChanges(changes_.engine, margin.size());
+  }
+
+  std::string place() const {
+    if (!picture_.step.empty()) return "Step " + quote(picture_.step);
+    if (picture_.lastList) return "List " + *picture_.lastList + " was started last";
+    return "No list was started";
   }
 
   /// Computes how wide the columns must be.

@@ -74,8 +74,21 @@ void checkDirectory(const std::string& path) {
   throw Failure(ExitStatus::badInput, path + what + "; expected one with images");
 }
 
+/// Throws a Failure for a press by name, in a script without names.
+void requireTags(const std::vector<Step>& steps) {
+  for (const Step& step : steps) {
+    const auto* const press = std::get_if<Press>(&step);
+    if (!press || press->name.empty()) continue;
+    throw Failure(ExitStatus::badInput,
+                  "--press: expected a tag (a whole number), found " + quote(press->name));
+  }
+}
+
 void pressIfPossible(Session& session, const Press& press, std::ostream& out) {
-  if (const auto reason = whyNotPress(session.picture(), press.tag)) {
+  const auto tag = tagOf(session.picture(), press);
+  if (!tag) {
+    out << "  " << noSuchName(session.picture(), press.name) << '\n';
+  } else if (const auto reason = whyNotPress(session.picture(), *tag)) {
     out << "  " << *reason << '\n';
   } else {
     session.perform(press);
@@ -91,7 +104,7 @@ void playInteractively(Session& session, const Terminal& terminal) {
       terminal.out << '\n';
       return;
     }
-    const Request request = parseRequest(line);
+    const Request request = parseRequest(line, session.hasNames());
     if (std::holds_alternative<Quit>(request)) return;
     if (const auto* pressed = std::get_if<Press>(&request)) {
       pressIfPossible(session, *pressed, terminal.out);
@@ -123,14 +136,6 @@ void connectLog(drivers::Driver& driver, const Terminal& terminal) {
   });
 }
 
-/// Returns the window of the options, else that which a source names.
-StageOptions stageOf(const PlayOptions& options, const steps::ScriptFile& script) {
-  if (!script.from || options.stage.window || options.stage.assets) return options.stage;
-  StageOptions stage = script.from->source.stage;
-  stage.sheet = options.stage.sheet;
-  return stage;
-}
-
 }  // namespace
 
 ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
@@ -141,6 +146,7 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   checkStart(file, startKey);
   const fs::path path = fs::absolute(options.script);
   if (options.resources) checkDirectory(*options.resources);
+  if (!script.from) requireTags(options.steps);
 
   const auto driver = requireDriver(options.toolkit);
   driver->setResourcePath(options.resources ? *options.resources : path.parent_path().string());
@@ -152,11 +158,12 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   } else if (driver->hasPerson()) {
     driver->useRealTime();
   }
-  Stage stage(*driver, planStage(stageOf(options, script), file.dictionary(), options.script));
+  Stage stage(*driver, planStage(script.stage(options.stage), file.dictionary(), options.script));
   const ScriptGuard guard(stage.engine(), options.script, file.dictionary());
   stage.engine().setObserver(std::make_shared<RaisedPlaces>(file, stage.engine(), terminal.log));
   Transcript transcript(terminal.out, terminal.style);
-  Session session(*driver, stage, transcript, screenshots ? &*screenshots : nullptr);
+  Session session(*driver, stage, transcript, screenshots ? &*screenshots : nullptr,
+                  script.names());
 
   if (script.from) {
     session.start(file.dictionary(), startKey);

@@ -29,16 +29,38 @@ std::vector<std::string> waysOn(const StepPicture& picture) {
   }
   if (!buttons.empty()) ways.push_back("a press of " + enumerate(buttons));
   for (const TimerPicture& timer : picture.timers) {
-    ways.push_back("list " + timer.key + " to run " + whenWords(timer.timeLeft));
+    ways.push_back(timer.step.empty()
+                       ? "list " + timer.key + " to run " + whenWords(timer.timeLeft)
+                       : "the step " + quote(timer.step) + " " + whenWords(timer.timeLeft));
   }
   return ways;
 }
 
+std::string nameOf(const ControlPicture* control, toolkit::Tag tag) {
+  return control && !control->name.empty() ? control->name : std::to_string(tag);
+}
+
 }  // namespace
 
+std::optional<toolkit::Tag> tagOf(const StepPicture& picture, const Press& press) {
+  if (press.name.empty()) return press.tag;
+  for (const ControlPicture& control : picture.controls) {
+    if (control.name == press.name) return control.view.tag;
+  }
+  return std::nullopt;
+}
+
+std::string noSuchName(const StepPicture& picture, const std::string& name) {
+  std::vector<std::string_view> known;
+  for (const ControlPicture& control : picture.controls) {
+    if (!control.name.empty()) known.push_back(control.name);
+  }
+  return "no control is called " + quote(name) + didYouMean(name, known) + pressableWords(picture);
+}
+
 std::string pressWords(const StepPicture& picture, toolkit::Tag tag) {
-  std::string words = std::to_string(tag);
   const ControlPicture* control = controlWithTag(picture, tag);
+  std::string words = nameOf(control, tag);
   if (!control || !isButton(control->view.kind)) return words;
   const std::string title = contentOf(*control);
   const std::string firstLine = title.substr(0, title.find('\n'));
@@ -48,8 +70,8 @@ std::string pressWords(const StepPicture& picture, toolkit::Tag tag) {
 std::optional<std::string> whyNotPress(const StepPicture& picture, toolkit::Tag tag) {
   if (picture.ended) return "the walk-through has ended";
   if (!picture.window || !picture.window->visible) return "the window is not on the screen";
-  const std::string name = std::to_string(tag);
   const ControlPicture* control = controlWithTag(picture, tag);
+  const std::string name = nameOf(control, tag);
   if (!control) return "no control has the tag " + name + pressableWords(picture);
   if (canBePressed(*control)) return std::nullopt;
   const auto is = [&](std::string_view what) {

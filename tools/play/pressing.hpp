@@ -6,12 +6,20 @@
 #include <string>
 
 #include "tools/walkthrough/possible_steps.hpp"
+#include "tools/walkthrough/steps.hpp"
 
 namespace qz::tools::play {
 
 using namespace walkthrough;
 
-/// Returns the tag, with the first line of the title if its control is a button: "3 (Next)".
+/// Returns the tag of the control that is pressed; absent if no control has the name of the press.
+std::optional<toolkit::Tag> tagOf(const StepPicture& picture, const Press& press);
+
+/// Says that no control has the name, and what the controls are called.
+std::string noSuchName(const StepPicture& picture, const std::string& name);
+
+/// Returns the name of the control, or else the tag, with the first line of the title if its
+/// control is a button: "3 (Next)".
 std::string pressWords(const StepPicture& picture, toolkit::Tag tag);
 
 /// Says why a user cannot press the control with this tag; absent if they can.

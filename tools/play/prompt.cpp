@@ -28,14 +28,16 @@ const std::string_view promptHelp =
     "  ?         this help\n"
     "  q         quit\n";
 
-Request parseRequest(std::string_view line) {
+Request parseRequest(std::string_view line, bool hasNames) {
   const std::string_view text = trimmed(line);
   if (text == "?") return Help{};
   if (text == "q") return Quit{};
   if (text.starts_with('+')) return parseAdvance(text.substr(1));
-  if (const auto tag = parseTag(text)) return Press{*tag};
+  if (const auto tag = parseTag(text)) return Press{*tag, {}};
+  if (hasNames && !text.empty()) return Press{0, std::string(text)};
+  const std::string_view expected = hasNames ? "a control" : "a tag";
   const std::string found = text.empty() ? "an empty line" : quote(text);
-  return Unclear{"expected a tag, +seconds, ? or q, found " + found};
+  return Unclear{"expected " + std::string(expected) + ", +seconds, ? or q, found " + found};
 }
 
 std::optional<toolkit::Tag> parseTag(std::string_view text) {

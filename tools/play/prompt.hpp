@@ -22,7 +22,7 @@ struct Unclear {
 using Request = std::variant<Press, Advance, Help, Quit, Unclear>;
 
 /// Returns what a line asks for: a tag, "+SECONDS", "?", or "q". Ignores spaces around it.
-Request parseRequest(std::string_view line);
+Request parseRequest(std::string_view line, bool hasNames = false);
 
 /// Printed before each line is read.
 inline constexpr std::string_view promptText = "tag, +seconds, ? or q: ";

@@ -3,6 +3,7 @@
 #include "tools/play/session.hpp"
 
 #include <algorithm>
+#include <set>
 #include <utility>
 
 #include "tools/play/pressing.hpp"
@@ -27,8 +28,12 @@ const TimerPicture* firedBetween(const StepPicture& before, const StepPicture& a
 }  // namespace
 
 Session::Session(drivers::Driver& driver, Stage& stage, Transcript& transcript,
-                 Screenshots* screenshots)
-    : driver_(driver), stage_(stage), transcript_(transcript), screenshots_(screenshots) {
+                 Screenshots* screenshots, Names names)
+    : driver_(driver),
+      stage_(stage),
+      naming_(std::move(names)),
+      transcript_(transcript),
+      screenshots_(screenshots) {
   transcript_.startFrom(look());
   if (screenshots_) screenshots_->keep(transcript_);
 }
@@ -43,17 +48,25 @@ void Session::start(const QZ_Plist_State_Parser::Dictionary& script, const std::
 
 void Session::perform(const Step& step) {
   if (const auto* pressed = std::get_if<Press>(&step)) {
-    press(pressed->tag);
+    press(*pressed);
   } else {
     advance(std::get<Advance>(step).seconds);
   }
 }
 
-void Session::press(toolkit::Tag tag) {
-  const std::string heading = "press " + pressWords(picture(), tag);
-  if (const auto reason = whyNotPress(picture(), tag)) return refuse(heading, *reason);
-  run(heading, "press-" + std::to_string(tag),
-      [&] { driver_.click(stage_.engine().findObjectWithTag(tag)); });
+StepPicture Session::look() {
+  StepPicture picture = takePicture(driver_, stage_.engine(), stage_.title());
+  naming_.apply(picture);
+  return picture;
+}
+
+void Session::press(const Press& press) {
+  const auto tag = tagOf(picture(), press);
+  if (!tag) return refuse("press " + press.name, noSuchName(picture(), press.name));
+  const std::string heading = "press " + pressWords(picture(), *tag);
+  if (const auto reason = whyNotPress(picture(), *tag)) return refuse(heading, *reason);
+  run(heading, "press-" + std::to_string(*tag),
+      [&] { driver_.click(stage_.engine().findObjectWithTag(*tag)); });
 }
 
 void Session::advance(double seconds) {
@@ -159,9 +172,12 @@ void Session::conclude() {
 std::string Session::recordedStates() {
   const auto states = stage_.engine().buttonStates();
   std::string words;
+  std::set<std::string> said;  // a control with a name has had several tags
   for (const std::string& key : states->allKeys()) {
+    const std::string name = naming_.controlName(key);
+    if (!said.insert(name).second) continue;
     if (!words.empty()) words += ", ";
-    words += key + (states->objectForKey(key)->boolValue() ? " on" : " off");
+    words += name + (states->objectForKey(key)->boolValue() ? " on" : " off");
   }
   return words;
 }

@@ -14,6 +14,7 @@
 #include "tools/play/play.hpp"
 #include "tools/play/screenshots.hpp"
 #include "tools/play/transcript.hpp"
+#include "tools/walkthrough/names.hpp"
 #include "tools/walkthrough/stage.hpp"
 
 namespace qz::tools::play {
@@ -25,7 +26,7 @@ class Session {
   /// The arguments must outlive the session. `screenshots` may be null; else it gets a picture
   /// after each step, and after each list that a timer runs within one.
   Session(drivers::Driver& driver, Stage& stage, Transcript& transcript,
-          Screenshots* screenshots = nullptr);
+          Screenshots* screenshots = nullptr, Names names = {});
 
   /// Loads the script at an absolute path and runs its list under `startKey`.
   void start(const std::string& script, const std::string& startKey);
@@ -42,13 +43,15 @@ class Session {
   /// Says how the walk-through ended or what it waits for, and which button states it recorded.
   void conclude();
 
+  /// Whether the controls have names by which the user can press them.
+  bool hasNames() const { return naming_.hasNames(); }
   const StepPicture& picture() const { return transcript_.latest(); }
   /// Returns a line for each step that could not be made and each list that raised; after
   /// `conclude`, also one if the walk-through is stuck.
   const std::vector<std::string>& problems() const { return problems_; }
 
  private:
-  void press(toolkit::Tag tag);
+  void press(const Press& press);
   void advance(double seconds);
   void pass(double seconds);
   void run(const std::string& heading, const std::string& name,
@@ -59,11 +62,12 @@ class Session {
   void takeScreenshot(const std::string& name);
   bool watch();
   void refuse(const std::string& heading, const std::string& reason);
-  StepPicture look() { return takePicture(driver_, stage_.engine(), stage_.title()); }
+  StepPicture look();
   std::string recordedStates();
 
   drivers::Driver& driver_;
   Stage& stage_;
+  Naming naming_;
   Transcript& transcript_;
   Screenshots* screenshots_;
   struct Begun {

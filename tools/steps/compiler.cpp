@@ -49,6 +49,7 @@ class Compiler {
     for (SceneIndex i = 0; i < scenes_.list.size(); ++i) addScene(i);
     for (const auto& [look, list] : shared_) {
       writer_.add(list.second, placeOf(list.first), sharedValues(list.first));
+      built_.stepOfKey[std::to_string(list.second)] = scenes_.list[list.first].step;
     }
     built_.script = writer_.script();
     built_.offsets = writer_.offsets();
@@ -75,7 +76,9 @@ class Compiler {
   std::string nameOf(SceneIndex index) const {
     const Scene& scene = scenes_.list[index];
     std::string name = tour_.steps[scene.step].name;
-    for (const StepIndex step : scene.cameFrom) name += '\n' + tour_.steps[step].name;
+    if (!scene.cameFrom) return name;
+    name += "\tfrom";
+    for (const StepIndex step : *scene.cameFrom) name += '\n' + tour_.steps[step].name;
     return name;
   }
 
@@ -84,17 +87,28 @@ class Compiler {
     return known.name.empty() ? std::to_string(known.tag) : known.name;
   }
 
-  const std::optional<Wait>& waitOf(SceneIndex scene) const {
-    return waitAt(tour_, scenes_.list[scene].step);
+  std::optional<Wait> waitOf(SceneIndex scene) const {
+    return scenes_.list[scene].wait ? waitAt(tour_, scenes_.list[scene].step) : std::nullopt;
+  }
+
+  bool isStateSaid(ControlIndex control) const {
+    const auto says = [&](const StepWords& words) {
+      return words.controls[control].isOn.has_value();
+    };
+    return says(tour_.everyStep) || std::any_of(tour_.steps.begin(), tour_.steps.end(),
+                                                [&](const Step& step) { return says(step.words); });
   }
 
   /// Finds which properties are not the same in every scene and in the host's window.
   void findWhatChanges() {
     for (ControlIndex i = 0; i < tour_.controls.size(); ++i) {
       for (std::size_t p = 0; p < propertyCount; ++p) {
-        const bool changes = std::any_of(looks_.begin(), looks_.end(), [&](const Look& look) {
-          return look.controls[i].values[p] != initial_.controls[i].values[p];
-        });
+        const bool changes =
+            static_cast<Property>(p) == Property::state
+                ? isStateSaid(i)  // the user changes it too
+                : std::any_of(looks_.begin(), looks_.end(), [&](const Look& look) {
+                    return look.controls[i].values[p] != initial_.controls[i].values[p];
+                  });
         if (changes) varying_.push_back({i, static_cast<Property>(p)});
       }
     }
@@ -108,7 +122,7 @@ class Compiler {
     const auto& press = scenes_.list[scene].presses[control];
     if (!press || press->kind == Exit::Kind::scene) return std::nullopt;
     if (press->kind == Exit::Kind::end) return Everywhere::ends;
-    const auto& wait = waitOf(scene);
+    const auto wait = waitOf(scene);
     if (wait && wait->startsAgain) return std::nullopt;
     return Everywhere::doesNothing;
   }
@@ -248,7 +262,7 @@ class Compiler {
   /// Enters a scene whose controls show and have what they should, but for flashing and the timer.
   void begin(List& list, SceneIndex scene, Place place) {
     if (flashesIn(scene)) list.push_back({{"ALLOW_FLASHING", {true}, place}, std::nullopt});
-    const auto& wait = waitOf(scene);
+    const auto wait = waitOf(scene);
     if (wait) list.push_back(tagged(setTimer, {wait->seconds}, timerKey(scene), wait->place));
   }
 
@@ -323,7 +337,7 @@ class Compiler {
       case Exit::Kind::nowhere:
         break;
     }
-    const auto& wait = waitOf(from);
+    const auto wait = waitOf(from);
     if (!wait || !wait->startsAgain) return {};
     return {tagged(setTimer, {wait->seconds}, timerKey(from), wait->place)};
   }
@@ -340,7 +354,7 @@ class Compiler {
         built_.stepOfKey[std::to_string(tag)] = scenes_.list[scene.presses[i]->scene].step;
       }
     }
-    const auto& wait = waitOf(index);
+    const auto wait = waitOf(index);
     if (!wait) return;
     const Tag key = timerKey(index);
     writer_.add(key, wait->place, exitList(index, *scene.wait, wait->place));

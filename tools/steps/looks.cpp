@@ -2,6 +2,8 @@
 // What every control shows at a step.
 #include "tools/steps/looks.hpp"
 
+#include <algorithm>
+
 #include "tools/support/text_layout.hpp"
 
 namespace qz::tools::steps {
@@ -46,12 +48,12 @@ ControlWords merged(ControlWords words, const ControlWords& own) {
   return words;
 }
 
+/// Returns styled text in a font. Only a block can be centred.
 std::string inFont(const std::string& html, const Font& font, bool isCentered) {
-  const std::string size = font.size == standardFont.size
-                               ? ""
-                               : " style=\"font-size: " + std::to_string(font.size) + "pt\"";
-  const std::string text = "<font face=\"" + font.name + "\"" + size + ">" + html + "</font>";
-  return isCentered ? "<div style=\"text-align: center\">" + text + "</div>" : text;
+  const std::string style =
+      "font-family: " + font.name + "; font-size: " + std::to_string(font.size) + "pt";
+  if (isCentered) return "<div style=\"text-align: center; " + style + "\">" + html + "</div>";
+  return "<font style=\"" + style + "\">" + html + "</font>";
 }
 
 /// Returns the commands for a text or title.
@@ -60,13 +62,13 @@ Commands textCommands(const Control& control, const ControlWords& words) {
   const Markup content = words.content.value_or(Markup{true, control.caption.value_or("")});
   const bool isCentered = words.isCentered.value_or(false);
   Commands commands;
-  if (!content.isPlain || (isCentered && !words.font)) {
-    const std::string html = content.isPlain ? asHtml(content.text) : content.text;
-    const std::string text = inFont(html, words.font.value_or(standardFont), isCentered);
+  const Font font = words.font.value_or(standardFont);
+  if (!content.isPlain) {
+    const std::string text = inFont(content.text, font, isCentered);
     commands.push_back({setStyled, {true, text, standardFont.name, 0}, words.place});
-  } else if (words.font) {
+  } else if (words.font || isCentered) {
     commands.push_back({isCentered ? setCentered : setInFont,
-                        {asHtml(content.text), words.font->name, words.font->size},
+                        {asHtml(content.text), font.name, font.size},
                         words.place});
   } else {
     commands.push_back({isTitle ? setTitle : setText, {content.text}, words.place});
@@ -108,8 +110,9 @@ bool isShownByItself(const Control& control, const ControlWords& words) {
 ControlLook controlLook(const Control& control, const ControlWords& words, bool canGoBack) {
   const drivers::ViewKindRow& row = rowOf(control.kind);
   const bool isShown = words.isShown.value_or(isShownByItself(control, words));
-  const bool isInVain = words.press && words.press->kind == Lead::Kind::back && !canGoBack;
-  const bool isEnabled = words.isEnabled.value_or(control.isEnabled && !isInVain);
+  const bool leadsBack = words.press && words.press->kind == Lead::Kind::back;
+  const bool isInVain = leadsBack && !canGoBack;
+  const bool isEnabled = words.isEnabled.value_or(leadsBack ? canGoBack : control.isEnabled);
   ControlLook look;
   look[Property::content] = contentCommands(control, words);
   look[Property::toolTip] = {
@@ -170,7 +173,59 @@ Look everyStepLook(const Tour& tour) {
   return completeLook(tour, nothing, true);
 }
 
+void judgeBackgrounds(const Tour& tour, Mistakes& mistakes) {
+  const bool isEverywhere = tour.everyStep.background.has_value();
+  const auto hasNone = [](const Step& step) { return !step.words.background; };
+  const auto without = std::find_if(tour.steps.begin(), tour.steps.end(), hasNone);
+  const bool isSomewhere = !std::all_of(tour.steps.begin(), tour.steps.end(), hasNone);
+  if (isEverywhere || !isSomewhere || without == tour.steps.end()) return;
+  mistakes.add(without->place,
+               "the step " + quote(without->name) +
+                   " would keep the background of the step before, because no command "
+                   "takes it away; expected “background” here or under “every step”");
+}
+
+/// A state that the host made neither on nor off cannot be set again.
+void judgeStates(const Tour& tour, Mistakes& mistakes) {
+  for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
+    if (!tour.controls[i].isMixed || tour.everyStep.controls[i].isOn) continue;
+    const auto isSaid = [&](const Step& step) { return step.words.controls[i].isOn.has_value(); };
+    const auto silent = std::find_if_not(tour.steps.begin(), tour.steps.end(), isSaid);
+    if (silent == tour.steps.end() || std::none_of(tour.steps.begin(), tour.steps.end(), isSaid)) {
+      continue;
+    }
+    mistakes.add(silent->place, "at the step " + quote(silent->name) + " the state of " +
+                                    quote(tour.controls[i].name) +
+                                    " is mixed, as in the host's window, which no command sets; "
+                                    "expected “state” here or under “every step”");
+  }
+}
+
+/// A picture cannot be taken out of an image view that the user sees.
+void judgePictures(const Tour& tour, Mistakes& mistakes) {
+  for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
+    if (rowOf(tour.controls[i].kind).caption != Caption::imageName || tour.controls[i].caption)
+      continue;
+    const auto hasPicture = [&](const Step& step) {
+      return merged(tour.everyStep.controls[i], step.words.controls[i]).content.has_value();
+    };
+    if (std::none_of(tour.steps.begin(), tour.steps.end(), hasPicture)) continue;
+    for (const Step& step : tour.steps) {
+      const ControlWords words = merged(tour.everyStep.controls[i], step.words.controls[i]);
+      if (hasPicture(step) || !words.isShown.value_or(false)) continue;
+      mistakes.add(
+          words.place == 0 ? step.place : words.place,
+          "at the step " + quote(step.name) + " " + quote(tour.controls[i].name) +
+              " is shown without a picture, but no command takes the picture of another step "
+              "out; expected “picture” or “hide”");
+    }
+  }
+}
+
 void judgeLooks(const Tour& tour, Mistakes& mistakes) {
+  judgeBackgrounds(tour, mistakes);
+  judgeStates(tour, mistakes);
+  judgePictures(tour, mistakes);
   std::vector<Place> redAt(tour.controls.size(), 0);
   std::vector<bool> plainSomewhere(tour.controls.size(), false);
   for (StepIndex step = 0; step < tour.steps.size(); ++step) {

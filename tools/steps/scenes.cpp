@@ -121,7 +121,9 @@ class Finder {
     }
     situations_[from].scene.presses = std::move(exits);
     const auto& wait = waitAt(tour_, step);
-    if (wait) situations_[from].scene.wait = follow(from, wait->lead);
+    if (!wait) return;
+    const Exit exit = follow(from, wait->lead);
+    if (exit.kind != Exit::Kind::nowhere) situations_[from].scene.wait = exit;
   }
 
   Exit follow(SceneIndex from, const Lead& lead) {
@@ -193,7 +195,7 @@ Classes classesOf(const std::vector<Situation>& all) {
   return classes;
 }
 
-/// Gives each way the shortest end that no other of the ways has; the first gets none.
+/// Gives each way the shortest end that no other of the ways has.
 std::vector<std::vector<StepIndex>> distinctEnds(const Ways& ways,
                                                  const std::vector<WayIndex>& all) {
   std::vector<std::vector<StepIndex>> ends(all.size());
@@ -204,7 +206,6 @@ std::vector<std::vector<StepIndex>> distinctEnds(const Ways& ways,
     for (const std::size_t i : shared) ++counts[ends[i] = ways.end(all[i], length)];
     std::erase_if(shared, [&](std::size_t i) { return counts[ends[i]] == 1; });
   }
-  ends.front().clear();
   return ends;
 }
 
@@ -228,7 +229,7 @@ Scenes joined(std::vector<Situation> all, const Ways& ways, std::size_t starts) 
     std::vector<WayIndex> waysHere;
     for (const auto& [scene, way] : scenes) waysHere.push_back(way);
     auto ends = distinctEnds(ways, waysHere);
-    for (std::size_t i = 0; i < scenes.size(); ++i) {
+    for (std::size_t i = 1; i < scenes.size(); ++i) {
       result.list[scenes[i].first].cameFrom = std::move(ends[i]);
     }
   }

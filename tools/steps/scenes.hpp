@@ -23,8 +23,8 @@ struct Exit {
 struct Scene {
   StepIndex step = 0;
   /// What tells the scene from the others of its step: the steps that the user last came from, the
-  /// latest last. Empty for the first scene of a step.
-  std::vector<StepIndex> cameFrom{};
+  /// latest last. Absent for the first scene of a step.
+  std::optional<std::vector<StepIndex>> cameFrom{};
   bool canGoBack = false;
   std::vector<std::optional<Exit>> presses{};  ///< of each control that can be pressed
   std::optional<Exit> wait{};

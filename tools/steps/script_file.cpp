@@ -22,12 +22,36 @@ StepIndex stepNamed(const Source& source, const std::string& name) {
 
 }  // namespace
 
+walkthrough::Names ScriptFile::names() const {
+  walkthrough::Names names;
+  if (!from) return names;
+  const Tour& tour = from->source.tour;
+  for (const auto& [tag, control] : from->built.controlOfTag) {
+    if (!tour.controls[control].name.empty()) names.controls[tag] = tour.controls[control].name;
+  }
+  for (const auto& [key, step] : from->built.stepOfKey) names.steps[key] = tour.steps[step].name;
+  return names;
+}
+
+walkthrough::StageOptions ScriptFile::stage(walkthrough::StageOptions options) const {
+  if (!from) return options;
+  if (!options.window && !options.assets) {
+    options.window = from->source.stage.window;
+    options.assets = from->source.stage.assets;
+  }
+  options.names = names();
+  return options;
+}
+
 ScriptFile openScript(const std::string& path, const std::string& start) {
   if (!isSourcePath(path)) return {InputFile(path, expectedFile), std::nullopt};
   BuiltSource from{.source = readSource(path), .built = {}};
+  // The first step stays a start, so that the others are reached as ever.
+  std::vector<StepIndex> starts = {0};
   const StepIndex first = start.empty() ? 0 : stepNamed(from.source, start);
+  if (first != 0) starts.insert(starts.begin(), first);
   Mistakes mistakes;
-  from.built = build(from.source.tour, {first}, mistakes);
+  from.built = build(from.source.tour, starts, mistakes);
   mistakes.throwIfAny(path, from.source.text);
   InputFile file(path, expectedFile, from.built.script, from.built.offsets, from.source.text);
   return {std::move(file), std::move(from)};

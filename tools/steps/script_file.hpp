@@ -8,6 +8,7 @@
 #include "tools/steps/compiler.hpp"
 #include "tools/steps/source.hpp"
 #include "tools/support/input_file.hpp"
+#include "tools/walkthrough/names.hpp"
 
 namespace qz::tools::steps {
 
@@ -21,6 +22,11 @@ struct BuiltSource {
 struct ScriptFile {
   InputFile file;                   ///< the script; its positions are those of the source
   std::optional<BuiltSource> from;  ///< absent for a script that is a file
+
+  /// Returns the names of the source; none for a script that is a file.
+  walkthrough::Names names() const;
+  /// Returns what the script is played on: the window of the options, else that of the source.
+  walkthrough::StageOptions stage(walkthrough::StageOptions options) const;
 };
 
 /// Reads the script at `path`, or builds it if this is a source, which can then be started at the

@@ -35,6 +35,7 @@ Control controlOf(const drivers::ViewPicture& view) {
   control.isShown = !view.hidden;
   control.isEnabled = view.enabled;
   control.isOn = view.state == toolkit::State::on;
+  control.isMixed = view.state == toolkit::State::mixed;
   return control;
 }
 

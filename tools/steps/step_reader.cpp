@@ -53,6 +53,7 @@ bool showsText(const drivers::ViewKindRow& kind) {
 }
 bool isAnything(const drivers::ViewKindRow& /*kind*/) { return true; }
 bool isButtonKind(const drivers::ViewKindRow& kind) { return kind.isButton; }
+bool hasState(const drivers::ViewKindRow& kind) { return kind.showsState; }
 bool takesInput(const drivers::ViewKindRow& kind) { return kind.isControl; }
 
 }  // namespace
@@ -115,7 +116,7 @@ const StepReader::PropertyRow StepReader::properties[] = {
     {"tooltip", "all controls", isAnything, &StepReader::readToolTip},
     {"color", "buttons", isButtonKind, &StepReader::readColor},
     {"background", "buttons", isButtonKind, &StepReader::readRed},
-    {"state", "buttons", isButtonKind, &StepReader::readState},
+    {"state", "check boxes", hasState, &StepReader::readState},
     {"shown", "all controls", isAnything, &StepReader::readFlag<&ControlWords::isShown>},
     {"enabled", "controls that take input", takesInput,
      &StepReader::readFlag<&ControlWords::isEnabled>},

@@ -28,6 +28,7 @@ struct Control {
   bool isShown = true;
   bool isEnabled = true;
   bool isOn = false;
+  bool isMixed = false;  ///< a check box that is neither on nor off
 };
 
 struct Font {

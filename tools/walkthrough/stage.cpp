@@ -26,6 +26,7 @@ StagePlan planStage(const StageOptions& options, const QZ_Plist_State_Parser::Di
   StagePlan plan;
   plan.hostFile = path;
   plan.sheet = options.sheet;
+  plan.names = options.names;
   if (options.assets) {
     const InputFile file(*options.assets, "a description of a window");
     checkGuiDescription(file);

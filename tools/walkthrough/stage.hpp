@@ -9,6 +9,7 @@
 #include "qz/drivers/driver.hpp"
 #include "qz/engine.hpp"
 #include "tools/walkthrough/host_window.hpp"
+#include "tools/walkthrough/names.hpp"
 
 namespace qz::tools::walkthrough {
 
@@ -21,6 +22,7 @@ struct StageOptions {
   std::optional<std::string> window;  ///< path of the host's window; or
   std::optional<std::string> assets;  ///< path of a description from which the engine builds one
   bool sheet = false;                 ///< show it as a sheet over another window of the host
+  Names names{};                      ///< of the script's source
 };
 
 /// What the options name, read from its files, so that any number of stages can be set up from it.
@@ -30,6 +32,7 @@ struct StagePlan {
   QZ_Plist_State_Parser::Dictionary
       description;  ///< of the window that the engine builds; or absent
   bool sheet = false;
+  Names names{};
 };
 
 /// Reads the host's window or the description that the options name; without either, makes a window

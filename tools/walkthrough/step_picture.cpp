@@ -40,7 +40,7 @@ std::vector<TimerPicture> lookAtTimers(const QZ_Plist_State_Parser& engine) {
   std::vector<TimerPicture> timers;
   const auto table = engine.objectIdTimers();
   for (const auto& [key, timer] : table->entries()) {
-    timers.push_back({timer.pointer(), key, timer->timeLeft()});
+    timers.push_back({.identity = timer.pointer(), .key = key, .timeLeft = timer->timeLeft()});
   }
   std::stable_sort(timers.begin(), timers.end(), [](const TimerPicture& a, const TimerPicture& b) {
     return a.timeLeft < b.timeLeft;

@@ -31,7 +31,8 @@ class Identity {
 };
 
 struct ControlPicture {
-  Identity identity;  ///< of the control, even after its tag has changed
+  Identity identity;   ///< of the control, even after its tag has changed
+  std::string name{};  ///< what the script's source calls it; empty: it has no name
   drivers::ViewPicture view;
   bool flashing = false;  ///< every tick of the flasher toggles its highlight
   bool hasList = false;   ///< the script has a list under its tag
@@ -44,6 +45,7 @@ struct TimerPicture {
   Identity identity;
   std::string key;      ///< of the list that it runs
   double timeLeft = 0;  ///< seconds
+  std::string step{};   ///< to which the list leads; empty: it has no name
 
   friend bool operator==(const TimerPicture&, const TimerPicture&) = default;
 };
@@ -54,6 +56,7 @@ struct StepPicture {
   std::vector<ControlPicture> controls;          ///< directly in the window, back to front
   std::vector<TimerPicture> timers;              ///< pending, in the order of their firing
   std::optional<std::string> lastList;           ///< key of the list that was started last
+  std::string step{};  ///< the name of the step in the script's source; empty: it has none
   bool flashingAllowed = false;
   bool ended = false;  ///< the walk-through is over
 

@@ -2,15 +2,17 @@
 // The steps of a walk-through.
 #pragma once
 
+#include <string>
 #include <variant>
 
 #include "qz/toolkit/tag.hpp"
 
 namespace qz::tools::walkthrough {
 
-/// The user presses the control with this tag.
+/// The user presses the control with this tag, or with this name.
 struct Press {
   toolkit::Tag tag = 0;
+  std::string name{};  ///< empty: the tag says which control
 };
 
 /// Time passes.
