@@ -80,6 +80,12 @@ Reading readingOf(ViewKind kind, const Content& content) {
   return asItIs(content.written);
 }
 
+bool isStyled(const Reading& reading) {
+  return std::any_of(reading.begin(), reading.end(), [](const Span& span) {
+    return span.isBold || span.isItalic || !span.link.empty();
+  });
+}
+
 }  // namespace
 
 Interpreter::Interpreter(const Tour& tour)
@@ -90,8 +96,9 @@ Interpreter::Interpreter(const Tour& tour)
 // "A later fragment replaces what an earlier one says, the step itself replaces what fragments say, and
 // all replace what `like` says."
 Part Interpreter::completed(const Part& part, const Arguments& arguments) const {
-  Part whole = filledIn(part, arguments);
-  for (auto use = part.uses.rbegin(); use != part.uses.rend(); ++use) {
+  const Part own = filledIn(part, arguments);
+  Part whole = own;
+  for (auto use = own.uses.rbegin(); use != own.uses.rend(); ++use) {
     whole = joined(whole, completed(tour_.fragments.at(use->fragment), use->arguments));
   }
   if (part.like.empty()) return whole;
@@ -133,7 +140,7 @@ bool Interpreter::isShown(const std::string& step, std::size_t control) const {
 bool Interpreter::isEnabled(const State& state, std::size_t control) const {
   const Words words = wordsOf(state.step, control);
   if (words.isEnabled) return *words.isEnabled;
-  if (words.press == "back" && state.way.empty()) return false;
+  if (words.press == "back") return !state.way.empty();
   return tour_.controls[control].isEnabled;
 }
 
@@ -142,8 +149,10 @@ ControlLook Interpreter::lookOf(const State& state, std::size_t control) const {
   const Words words = wordsOf(state.step, control);
   ControlLook look;
   look.reading = words.content ? readingOf(host.kind, *words.content) : asItIs(host.caption);
-  look.font = words.font;
   look.isCentered = words.isCentered.value_or(false);
+  const bool isHtml = words.content && words.content->isHtml;
+  look.font = words.font;
+  if (!look.font && (isHtml || look.isCentered || isStyled(look.reading))) look.font = "Helvetica 12";
   look.toolTip = words.toolTip.value_or(host.toolTip);
   look.color = words.color.value_or("");
   look.isRed = words.isRed.value_or(false);

@@ -28,7 +28,7 @@ struct State {
 /// What a control looks like.
 struct ControlLook {
   Reading reading{};                  ///< text, title, or name of the image
-  std::optional<std::string> font{};  ///< family and size; absent: no step says it
+  std::optional<std::string> font{};  ///< absent: the control's own
   bool isCentered = false;
   std::string toolTip{};
   std::string color{};  ///< of a title; empty: the control's own

@@ -56,7 +56,7 @@ class Folder {
 /// The source, built so that it starts with the last of its start keys.
 BuiltSource builtOf(const tools::steps::ScriptFile& opened, const Folder& folder) {
   const auto& [source, built] = *opened.from;
-  return {folder.path(), built.script, built.startKeys.back(),
+  return {folder.path(), built.script, built.startKeys.front(),
           planStage(source.stage, built.script, source.path)};
 }
 
@@ -191,7 +191,7 @@ TEST(Meaning, OfGeneratedSourcesIsWhatTheirScriptsDo) {
     const std::size_t start = seed % 4;  // a quarter of the sources starts only with its first step
     const std::string wrong = disagreement(generated, start, totals);
     if (wrong.empty()) continue;
-    const Generated small = smallest(generated, start);
+    const Generated small = getenv("QZ_NOSHRINK") ? generated : smallest(generated, start);
     ADD_FAILURE() << "seed " << seed << ": " << disagreement(small, start, totals) << "\n"
                   << small.yaml << small.window;
     if (++disagreements == mostDisagreements) break;

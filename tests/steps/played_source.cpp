@@ -44,8 +44,14 @@ Reading readingOf(const ControlPicture& control) {
     append(reading, {caption.string().substr(run.range.location, run.range.length),
                      font && font->bold, font && font->italic, link ? link->address() : ""});
   }
-  if (!reading.empty() && reading.back().text.ends_with("\n")) {reading.back().text.pop_back();if(reading.back().text.empty()) reading.pop_back();}  // TODO
   return reading;
+}
+
+// "Styled text that is centred is a block, which ends with a line break."
+void dropLineBreak(Reading& reading) {
+  if (reading.empty() || !reading.back().text.ends_with('\n')) return;
+  reading.back().text.pop_back();
+  if (reading.back().text.empty()) reading.pop_back();
 }
 
 /// The font of the whole text; absent if there are several.
@@ -86,6 +92,7 @@ ControlLook seen(const ControlPicture& control, const ControlLook& expected) {
   look.isShown = !control.view.hidden;
   if (!look.isShown && !expected.isShown) return look;  // nobody sees the rest
   look.reading = readingOf(control);
+  if (expected.isCentered) dropLineBreak(look.reading);
   const bool isEmpty = captionOf(control).string().empty();  // and so has neither font nor color
   look.font = isEmpty || !expected.font ? expected.font : fontOf(control);
   look.isCentered = isEmpty ? expected.isCentered : isCentered(control);

@@ -314,11 +314,29 @@ bool reachesEveryStep(const Tour& tour, const Places& places) {
   return steps.size() == tour.steps.size();
 }
 
+/// Whether an image view is shown without a picture somewhere, and has one elsewhere: no command
+/// takes a picture away.
+bool losesPicture(const Tour& tour) {
+  const Interpreter meaning(tour);
+  for (std::size_t i = 0; i < tour.controls.size(); ++i) {
+    if (tour.controls[i].kind != ViewKind::imageView) continue;
+    bool hasSome = false;
+    bool lacksOne = false;
+    for (const auto& step : tour.steps) {
+      const ControlLook look = meaning.look(meaning.startAt(step.first)).controls[i];
+      hasSome |= !look.reading.empty();
+      lacksOne |= look.reading.empty() && look.isShown;
+    }
+    if (hasSome && lacksOne) return true;
+  }
+  return false;
+}
+
 }  // namespace
 
 std::optional<Generated> sourceOf(const Tour& tour, Dice& dice) {
   const auto places = placesOf(Interpreter(tour), mostPlaces);
-  if (!places || !reachesEveryStep(tour, *places)) return std::nullopt;
+  if (!places || !reachesEveryStep(tour, *places) || losesPicture(tour)) return std::nullopt;
   return Generated{tour, *places, yamlOf(tour, dice), windowOf(tour)};
 }
 
