@@ -47,7 +47,9 @@ void fillIn(std::string& text, const Arguments& arguments) {
 }
 
 Part filledIn(Part part, const Arguments& arguments) {
-  const auto fill = [&](auto& text) { if (text) fillIn(*text, arguments); };
+  const auto fill = [&](auto& text) {
+    if (text) fillIn(*text, arguments);
+  };
   for (auto& [name, words] : part.controls) {
     if (words.content) fillIn(words.content->written, arguments);
     for (auto* text : {&words.font, &words.toolTip, &words.color, &words.press}) fill(*text);
@@ -93,8 +95,8 @@ Interpreter::Interpreter(const Tour& tour)
   for (const auto& [name, part] : tour_.steps) steps_[name] = completed(part, {});
 }
 
-// "A later fragment replaces what an earlier one says, the step itself replaces what fragments say, and
-// all replace what `like` says."
+// "A later fragment replaces what an earlier one says, the step itself replaces what fragments say,
+// and all replace what `like` says."
 Part Interpreter::completed(const Part& part, const Arguments& arguments) const {
   const Part own = filledIn(part, arguments);
   Part whole = own;
@@ -129,8 +131,7 @@ bool Interpreter::isShown(const std::string& step, std::size_t control) const {
   if (host.kind == ViewKind::button && !host.name.empty() && !own.press && !common.press) {
     return false;
   }
-  if (host.kind == ViewKind::imageView && !own.content && !common.content &&
-      host.caption.empty()) {
+  if (host.kind == ViewKind::imageView && !own.content && !common.content && host.caption.empty()) {
     return false;
   }
   return host.isShown;
@@ -152,7 +153,8 @@ ControlLook Interpreter::lookOf(const State& state, std::size_t control) const {
   look.isCentered = words.isCentered.value_or(false);
   const bool isHtml = words.content && words.content->isHtml;
   look.font = words.font;
-  if (!look.font && (isHtml || look.isCentered || isStyled(look.reading))) look.font = "Helvetica 12";
+  if (!look.font && (isHtml || look.isCentered || isStyled(look.reading)))
+    look.font = "Helvetica 12";
   look.toolTip = words.toolTip.value_or(host.toolTip);
   look.color = words.color.value_or("");
   look.isRed = words.isRed.value_or(false);
@@ -237,8 +239,8 @@ State Interpreter::go(State state, const std::string& target) const {
     return enter(state, last);
   }
   if (target == state.step) return enter(state, target);
-  const bool isPassedOver = steps_.at(state.step)
-                                .isPassedOver.value_or(everyStep_.isPassedOver.value_or(false));
+  const bool isPassedOver =
+      steps_.at(state.step).isPassedOver.value_or(everyStep_.isPassedOver.value_or(false));
   if (!isPassedOver) state.way.push_back(state.step);
   state.way.erase(std::find(state.way.begin(), state.way.end(), target), state.way.end());
   if (state.way.size() > tour_.backOver.value_or(50)) state.way.erase(state.way.begin());

@@ -10,7 +10,14 @@ namespace qz::meaning {
 
 using tools::walkthrough::StepPicture;
 
-JointWalk::JointWalk(const Tour& tour, const BuiltSource& source, const std::string& step)
+namespace {
+
+// In this time flashing buttons become pressed in, and no wait is over.
+constexpr double untilPressed = 0.6;
+
+}  // namespace
+
+JointWalk::JointWalk(const Tour& tour, const PlayableSource& source, const std::string& step)
     : tour_(tour), source_(source), meaning_(tour), start_(meaning_.startAt(step)) {}
 
 std::string JointWalk::run() {
@@ -30,12 +37,9 @@ std::string JointWalk::makeMove(const Arrival& from, const Move& move) {
   Play play(source_);
   this->play(play, from.path);
   if (everythingKept(play.picture()) != from.kept) return "it does not play twice the same";
-  const auto wait = meaning_.waitOf(from.state);
-  if (from.state.waits) {
-    const std::string wrong = passTime(from.state, play, move ? wait->seconds * 0.5
-                                                              : wait->seconds - 0.25);
-    if (!wrong.empty()) return wrong + " while time passes after" + words(from.path);
-  }
+  const double early = move ? untilPressed : meaning_.waitOf(from.state)->seconds - 0.25;
+  const std::string wrong = passTime(from.state, play, early);
+  if (!wrong.empty()) return wrong + "\nwhile time passes after" + words(from.path);
   if (move) {
     play.click(*move);
   } else {
@@ -100,6 +104,7 @@ void JointWalk::play(Play& play, const Path& path) const {
   State state = start_;
   for (const Move& move : path) {
     if (move) {
+      play.letPass(untilPressed);
       play.click(*move);
     } else {
       play.letPass(meaning_.waitOf(state)->seconds);

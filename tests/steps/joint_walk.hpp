@@ -16,11 +16,11 @@ namespace qz::meaning {
 using Path = std::vector<Move>;
 
 /// Every place of both is visited, and every move made from it; from places to which several moves
-/// lead, after a second path too. Presses are made when half of a pending wait is over.
+/// lead, after a second path too.
 class JointWalk {
  public:
   /// `step` is where the source starts.
-  JointWalk(const Tour& tour, const BuiltSource& source, const std::string& step);
+  JointWalk(const Tour& tour, const PlayableSource& source, const std::string& step);
 
   /// Walks. Returns what differs and after which path; empty if nothing does.
   std::string run();
@@ -45,7 +45,7 @@ class JointWalk {
   std::string words(const Path& path) const;
 
   const Tour& tour_;
-  const BuiltSource& source_;
+  const PlayableSource& source_;
   const Interpreter meaning_;
   const State start_;
   std::map<std::pair<State, std::string>, int> arrivals_{};  // how often each place was reached

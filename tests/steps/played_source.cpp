@@ -73,9 +73,9 @@ bool isCentered(const ControlPicture& control) {
 
 std::string colorOf(const ControlPicture& control) {
   constexpr std::pair<const char*, toolkit::Color> colors[] = {
-      {"red", toolkit::colors::red},       {"white", toolkit::colors::white},
-      {"blue", toolkit::colors::blue},     {"green", toolkit::colors::green},
-      {"black", toolkit::colors::black},   {"orange", toolkit::colors::orange},
+      {"red", toolkit::colors::red},     {"white", toolkit::colors::white},
+      {"blue", toolkit::colors::blue},   {"green", toolkit::colors::green},
+      {"black", toolkit::colors::black}, {"orange", toolkit::colors::orange},
       {"gray", toolkit::colors::gray}};
   std::string found;
   for (const auto& run : captionOf(control).runs()) {
@@ -86,7 +86,7 @@ std::string colorOf(const ControlPicture& control) {
   return found;
 }
 
-ControlLook seen(const ControlPicture& control, const ControlLook& expected) {
+ControlLook seen(const ControlPicture& control, const ControlLook& expected, bool flashingAllowed) {
   ControlLook look = expected;
   look.state = control.view.state;
   look.isShown = !control.view.hidden;
@@ -100,7 +100,8 @@ ControlLook seen(const ControlPicture& control, const ControlLook& expected) {
   look.color = !drivers::isButton(control.view.kind) || isEmpty ? expected.color : colorOf(control);
   look.isRed = control.view.background == toolkit::colors::red;
   look.isEnabled = control.view.enabled;
-  look.isFlashing = control.flashing;
+  look.isFlashing = (control.flashing && flashingAllowed) ||
+                    control.view.highlighted;  // no button stays pressed in
   return look;
 }
 
@@ -138,13 +139,15 @@ ControlLook inTheSameTerms(ControlLook look) {
 
 }  // namespace
 
-Play::Play(const BuiltSource& source) {
+Play::Play(const PlayableSource& source) {
   driver_.setResourcePath(source.folder);
   stage_ = std::make_unique<tools::walkthrough::Stage>(driver_, source.plan);
   stage_->start(source.script, source.startKey);
 }
 
-StepPicture Play::picture() { return tools::walkthrough::takePicture(driver_, stage_->engine(), stage_->title()); }
+StepPicture Play::picture() {
+  return tools::walkthrough::takePicture(driver_, stage_->engine(), stage_->title());
+}
 
 void Play::click(std::size_t control) {
   driver_.click(stage_->engine().tutorialWindow()->contentView()->subviews().at(control));
@@ -153,8 +156,8 @@ void Play::click(std::size_t control) {
 Look seen(const StepPicture& picture, const Look& expected) {
   Look look;
   for (std::size_t i = 0; i < picture.controls.size() && i < expected.controls.size(); ++i) {
-    look.controls.push_back(seen(picture.controls[i], inTheSameTerms(expected.controls[i])));
-    look.controls.back().isFlashing &= picture.flashingAllowed;
+    look.controls.push_back(
+        seen(picture.controls[i], inTheSameTerms(expected.controls[i]), picture.flashingAllowed));
   }
   if (picture.window) look.background = picture.window->layerImage.value_or("");
   return look;
@@ -185,8 +188,9 @@ std::string everythingKept(const StepPicture& picture) {
   std::ostringstream out;
   out << everythingSeen(picture) << picture.ended << picture.flashingAllowed;
   for (const ControlPicture& control : picture.controls) {
-    out << '\n' << control.view.tag << control.flashing << control.hasList << control.shadowed;
-    out << words(seen(control, {}));
+    ControlLook look = seen(control, {}, false);
+    look.isFlashing = control.flashing;  // whatever its phase
+    out << '\n' << control.view.tag << control.hasList << control.shadowed << words(look);
   }
   for (const auto& timer : picture.timers) out << '\n' << timer.key << ' ' << timer.timeLeft;
   return out.str();

@@ -17,7 +17,7 @@
 namespace qz::meaning {
 
 /// A built source with all that is needed to play it.
-struct BuiltSource {
+struct PlayableSource {
   std::string folder{};  ///< of the images
   toolkit::ValueRef<toolkit::Dictionary> script{};
   std::string startKey{};
@@ -27,7 +27,7 @@ struct BuiltSource {
 /// One play from its start, with the user's clicks.
 class Play {
  public:
-  explicit Play(const BuiltSource& source);
+  explicit Play(const PlayableSource& source);
 
   tools::walkthrough::StepPicture picture();
   void click(std::size_t control);

@@ -15,7 +15,8 @@ class Smaller {
   explicit Smaller(const Tour& tour) : tour_(tour) {}
 
   std::vector<Tour> all() {
-    for (std::size_t i = 1; i < tour_.steps.size(); ++i) without([&](Tour& t) { removeStep(t, i); });
+    for (std::size_t i = 1; i < tour_.steps.size(); ++i)
+      without([&](Tour& t) { removeStep(t, i); });
     for (std::size_t i = 0; i < tour_.controls.size(); ++i) {
       without([&](Tour& t) { removeControl(t, i); });
     }

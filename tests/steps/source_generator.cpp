@@ -16,15 +16,26 @@ constexpr std::size_t mostPlaces = 120;
 
 const std::vector<std::string> stepNames = {"hello", "plug in", "größe",      "copy",  "ask me",
                                             "done",  "step 7",  "a-b (c), d", "sheet", "Later: 2"};
-const std::vector<std::string> markdown = {
-    "Hello",          "*look* here", "**All** of it", "Größe",  "R&D",           "a < b",
-    "<b>tags</b>",    "2 \\* 3",     "日本 😀",       "it's \"so\"", "back\\\\slash", "100 %",
-    "snake_case_too", "**two *kinds* here**", "[more](https://example.org/a?b=1&c=2)"};
+const std::vector<std::string> markdown = {"Hello",
+                                           "*look* here",
+                                           "**All** of it",
+                                           "Größe",
+                                           "R&D",
+                                           "a < b",
+                                           "<b>tags</b>",
+                                           "2 \\* 3",
+                                           "日本 😀",
+                                           "it's \"so\"",
+                                           "back\\\\slash",
+                                           "100 %",
+                                           "snake_case_too",
+                                           "**two *kinds* here**",
+                                           "[more](https://example.org/a?b=1&c=2)"};
 const std::vector<std::string> html = {
-    "<b>bold</b>", "plain", "<i>it</i>", "caf&eacute;", "R&amp;D", "1 &lt; 2", "Größe 😀",
-    "<a href=\"https://example.org/\">link</a>"};
-const std::vector<std::string> plain = {"Next",      "*not* here", "<b>",  "R&amp;D", "Größe",
-                                        "日本 😀",   "a\\b",       "“Y”",  "1. x",    "# no",
+    "<b>bold</b>", "plain",    "<i>it</i>", "caf&eacute;",
+    "R&amp;D",     "1 &lt; 2", "Größe 😀",   "<a href=\"https://example.org/\">link</a>"};
+const std::vector<std::string> plain = {"Next",       "*not* here", "<b>",  "R&amp;D", "Größe",
+                                        "日本 😀",     "a\\b",       "“Y”",  "1. x",    "# no",
                                         "it's \"x\"", "a: b",       "- no", "Stop"};
 const std::vector<std::string> fonts = {"Helvetica 13", "Helvetica-Bold 18", "Times New Roman 14",
                                         "Georgia-Italic 11"};
@@ -171,7 +182,7 @@ void Maker::addWait(Part& part) {
 // Fragments have the parameters "word" and "place".
 void Maker::addFragments() {
   for (const char* name : {"part 2", "question"}) {
-    if (!dice_.oneIn(3)) continue;
+    if (!dice_.oneIn(2)) continue;
     Part part = partOf(3);
     for (auto& [control, words] : part.controls) {
       if (words.content && words.content->written.size() > 6 && dice_.oneIn(2)) {
