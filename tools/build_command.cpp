@@ -2,22 +2,32 @@
 // The command `build`.
 #include <algorithm>
 #include <filesystem>
+#include <iostream>
+#include <map>
 #include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
 
 #include "qz/property_list/formats.hpp"
+#include "qz/property_list/positions.hpp"
 #include "tools/commands.hpp"
+#include "tools/steps/po.hpp"
 #include "tools/steps/script_file.hpp"
 #include "tools/support/replace_file.hpp"
+#include "tools/support/text_layout.hpp"
+#include "tools/support/whole_file.hpp"
 
 namespace qz::tools {
 namespace {
 
+// No language: shows which texts have no room to grow.
+constexpr std::string_view longLanguage = "x-long";
+
 struct BuildOptions {
   std::string source;
   std::optional<std::string> output;
+  std::optional<std::string> language;
 };
 
 toolkit::Format formatFor(const std::string& path) {
@@ -30,17 +40,53 @@ toolkit::Format formatFor(const std::string& path) {
   return toolkit::Format::xml;
 }
 
+/// Returns the translations of the file LANGUAGE.po beside the source.
+steps::Translate translationTo(const std::string& language, const std::string& source) {
+  if (language == longLanguage) return steps::lengthened;
+  const auto path = std::filesystem::path(source).replace_filename(language + ".po").string();
+  const auto text = wholeFile(path);
+  if (!text) {
+    throw Failure(ExitStatus::badInput, path + ": cannot be read; expected the translations to " +
+                                            quote(language) + " beside the source");
+  }
+  std::map<std::string, std::string> known;
+  for (const steps::PoEntry& entry : steps::readPo(*text, path)) {
+    if (!entry.isFuzzy && !entry.translation.empty()) known[entry.text] = entry.translation;
+  }
+  return [known](const std::string& original) -> std::optional<std::string> {
+    const auto found = known.find(original);
+    return found == known.end() ? std::nullopt : std::optional(found->second);
+  };
+}
+
+void sayUntranslated(const steps::Source& source, const steps::Text& text,
+                     const std::string& language) {
+  const steps::TextUse& use = text.uses.front();
+  const auto [line, column] = toolkit::TextCursor(source.text).at(use.place);
+  std::cerr << source.path << ":" << line << ":" << column << ": warning: no text in "
+            << quote(language) << " for " << quoteStart(text.text) << " (" << use.step << ", "
+            << use.control << "); it stays as it is\n";
+}
+
 void buildSource(const BuildOptions& options) {
   if (!steps::isSourcePath(options.source)) {
     throw Failure(ExitStatus::badInput, options.source +
                                             ": expected a walk-through in steps, a file "
                                             "whose name ends with .yaml or .yml");
   }
-  const steps::ScriptFile script = steps::openScript(options.source);
+  const auto translate =
+      options.language ? translationTo(*options.language, options.source) : steps::Translate();
+  const steps::ScriptFile script = steps::openScript(options.source, {}, translate);
   const std::string output = options.output.value_or(
-      std::filesystem::path(options.source).replace_extension(".plist").string());
+      std::filesystem::path(options.source)
+          .replace_extension()
+          .concat(options.language ? "_" + *options.language + ".plist" : ".plist")
+          .string());
   const auto& format = toolkit::formatRow(formatFor(output));
   replaceFile(output, format.write(script.file.dictionary()));
+  for (const steps::Text& text : script.from->source.texts) {
+    if (!text.isTranslated) sayUntranslated(script.from->source, text, *options.language);
+  }
 }
 
 void describeBuild(Command& command) {
@@ -52,6 +98,11 @@ void describeBuild(Command& command) {
       .valueName("SCRIPT.plist")
       .path()
       .file();
+  command
+      .option("--language", options->language,
+              "Write the script of a language, with the translations of LANG.po beside the source; "
+              "x-long makes all texts longer")
+      .valueName("LANG");
   command.action([options] {
     buildSource(*options);
     return static_cast<int>(ExitStatus::fine);

@@ -12,6 +12,7 @@
 #include "qz/toolkit/exception.hpp"
 #include "tools/commands.hpp"
 #include "tools/shared_values.hpp"
+#include "tools/steps/script_file.hpp"
 #include "tools/support/failure.hpp"
 #include "tools/support/input_file.hpp"
 #include "tools/support/replace_file.hpp"
@@ -81,7 +82,7 @@ std::string written(const InputFile& file, const FormatRow& row) {
 }
 
 void convert(const ConvertOptions& options) {
-  const InputFile file(options.in, "a property list", ExitStatus::failed);
+  const InputFile file = steps::openPropertyList(options.in);
   const FormatRow& row = toolkit::formatRow(options.format.value_or(formatBySuffix(options.out)));
   try {
     replaceFile(options.out, written(file, row));

@@ -8,7 +8,7 @@
 #include "tools/commands.hpp"
 #include "tools/readable_dump.hpp"
 #include "tools/shared_values.hpp"
-#include "tools/support/failure.hpp"
+#include "tools/steps/script_file.hpp"
 #include "tools/support/input_file.hpp"
 #include "tools/support/terminal.hpp"
 
@@ -22,7 +22,7 @@ struct DumpOptions {
 };
 
 void dump(const DumpOptions& options) {
-  const InputFile file(options.file, "a property list", ExitStatus::failed);
+  const InputFile file = steps::openPropertyList(options.file);
   if (options.dictionary) file.dictionary();
   requireWritableInFull(file);
   if (options.canonical) {

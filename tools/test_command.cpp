@@ -17,6 +17,7 @@
 #include "tools/scenario/runner.hpp"
 #include "tools/scenario/scenario_files.hpp"
 #include "tools/scenario/statements.hpp"
+#include "tools/steps/script_file.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/failure.hpp"
 #include "tools/support/text_layout.hpp"
@@ -148,7 +149,7 @@ void writeScriptErrors(const TestOptions& options, const std::vector<LoadedFile>
   const auto driver = requireDriver(options.toolkit);
   for (const std::string& script : scripts) {
     try {
-      writeReadingErrors(InputFile(script, "a script"), driver->toolkit(), out, {"unknown-image"});
+      writeReadingErrors(steps::openScript(script).file, driver->toolkit(), out, {"unknown-image"});
     } catch (const Failure&) {
       // The scenario that loads the file says so.
     }

@@ -4,63 +4,11 @@
 
 #include <algorithm>
 
+#include "tests/steps/sharing.hpp"
+
 namespace qz::meaning {
 
 namespace {
-
-template <class Option>
-void orElse(Option& said, const Option& otherwise) {
-  if (!said) said = otherwise;
-}
-
-/// Adds what is said only otherwise.
-template <class Said>
-void orElseEach(Said& said, Said& otherwise) {
-  std::apply(
-      [&](auto&... mine) {
-        std::apply([&](auto&... others) { (orElse(mine, others), ...); }, otherwise.options());
-      },
-      said.options());
-}
-
-Words joined(Words said, Words otherwise) {
-  said.isEntry |= otherwise.isEntry;
-  orElseEach(said, otherwise);
-  return said;
-}
-
-Part joined(Part said, Part otherwise) {
-  for (const auto& [name, words] : otherwise.controls) {
-    said.controls[name] = joined(said.controls[name], words);
-  }
-  orElseEach(said, otherwise);
-  return said;
-}
-
-void fillIn(std::string& text, const Arguments& arguments) {
-  for (const auto& [name, value] : arguments) {
-    const std::string parameter = "{" + name + "}";
-    for (std::size_t at = 0; (at = text.find(parameter, at)) != text.npos; at += value.size()) {
-      text.replace(at, parameter.size(), value);
-    }
-  }
-}
-
-Part filledIn(Part part, const Arguments& arguments) {
-  const auto fill = [&](auto& text) {
-    if (text) fillIn(*text, arguments);
-  };
-  for (auto& [name, words] : part.controls) {
-    if (words.content) fillIn(words.content->written, arguments);
-    for (auto* text : {&words.font, &words.toolTip, &words.color, &words.press}) fill(*text);
-  }
-  fill(part.background);
-  if (part.wait) fillIn(part.wait->go, arguments);
-  for (Use& use : part.uses) {
-    for (auto& [name, value] : use.arguments) fillIn(value, arguments);
-  }
-  return part;
-}
 
 toolkit::State stateAfterClick(ViewKind kind, toolkit::State state) {
   using toolkit::State;
@@ -91,22 +39,11 @@ bool isStyled(const Reading& reading) {
 }  // namespace
 
 Interpreter::Interpreter(const Tour& tour)
-    : tour_(tour), everyStep_(completed(tour.everyStep, {})) {
-  for (const auto& [name, part] : tour_.steps) steps_[name] = completed(part, {});
-}
-
-// "A later fragment replaces what an earlier one says, the step itself replaces what fragments say,
-// and all replace what `like` says."
-Part Interpreter::completed(const Part& part, const Arguments& arguments) const {
-  const Part own = filledIn(part, arguments);
-  Part whole = own;
-  for (auto use = own.uses.rbegin(); use != own.uses.rend(); ++use) {
-    whole = joined(whole, completed(tour_.fragments.at(use->fragment), use->arguments));
+    : tour_(tour), everyStep_(completed(tour, tour.everyStep)) {
+  for (const auto& [name, part] : tour_.steps) {
+    own_[name] = completed(tour, part);
+    steps_[name] = joined(own_[name], everyStep_);
   }
-  if (part.like.empty()) return whole;
-  const auto other = std::find_if(tour_.steps.begin(), tour_.steps.end(),
-                                  [&](const auto& step) { return step.first == part.like; });
-  return joined(whole, completed(other->second, {}));
 }
 
 Words Interpreter::said(const Part& part, std::size_t control) const {
@@ -115,15 +52,14 @@ Words Interpreter::said(const Part& part, std::size_t control) const {
   return name.empty() || found == part.controls.end() ? Words{} : found->second;
 }
 
-// "What a step does not say of a control, `every step` says."
 Words Interpreter::wordsOf(const std::string& step, std::size_t control) const {
-  return joined(said(steps_.at(step), control), said(everyStep_, control));
+  return said(steps_.at(step), control);
 }
 
 // "What is shown"
 bool Interpreter::isShown(const std::string& step, std::size_t control) const {
   const HostControl& host = tour_.controls[control];
-  const Words own = said(steps_.at(step), control);
+  const Words own = said(own_.at(step), control);
   const Words common = said(everyStep_, control);
   if (own.isShown) return *own.isShown;
   if (own.isEntry) return true;
@@ -152,9 +88,8 @@ ControlLook Interpreter::lookOf(const State& state, std::size_t control) const {
   look.reading = words.content ? readingOf(host.kind, *words.content) : asItIs(host.caption);
   look.isCentered = words.isCentered.value_or(false);
   const bool isHtml = words.content && words.content->isHtml;
-  look.font = words.font;
-  if (!look.font && (isHtml || look.isCentered || isStyled(look.reading)))
-    look.font = "Helvetica 12";
+  const bool hasStyle = isHtml || look.isCentered || isStyled(look.reading);
+  look.font = words.font || !hasStyle ? words.font : "Helvetica 12";
   look.toolTip = words.toolTip.value_or(host.toolTip);
   look.color = words.color.value_or("");
   look.isRed = words.isRed.value_or(false);
@@ -170,7 +105,7 @@ Look Interpreter::look(const State& state) const {
   for (std::size_t i = 0; i < tour_.controls.size(); ++i) {
     look.controls.push_back(lookOf(state, i));
   }
-  look.background = steps_.at(state.step).background.value_or(everyStep_.background.value_or(""));
+  look.background = steps_.at(state.step).background.value_or("");
   return look;
 }
 
@@ -184,8 +119,7 @@ std::vector<std::size_t> Interpreter::pressable(const State& state) const {
 }
 
 std::optional<Wait> Interpreter::waitOf(const State& state) const {
-  std::optional<Wait> wait = steps_.at(state.step).wait;
-  orElse(wait, everyStep_.wait);
+  const std::optional<Wait>& wait = steps_.at(state.step).wait;
   return wait && leadsNowhere(state, wait->go) ? std::nullopt : wait;
 }
 
@@ -239,9 +173,7 @@ State Interpreter::go(State state, const std::string& target) const {
     return enter(state, last);
   }
   if (target == state.step) return enter(state, target);
-  const bool isPassedOver =
-      steps_.at(state.step).isPassedOver.value_or(everyStep_.isPassedOver.value_or(false));
-  if (!isPassedOver) state.way.push_back(state.step);
+  if (!steps_.at(state.step).isPassedOver.value_or(false)) state.way.push_back(state.step);
   state.way.erase(std::find(state.way.begin(), state.way.end(), target), state.way.end());
   if (state.way.size() > tour_.backOver.value_or(50)) state.way.erase(state.way.begin());
   return enter(state, target);

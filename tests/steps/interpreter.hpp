@@ -67,12 +67,11 @@ class Interpreter {
   /// Returns the wait of the step, pending or not; absent if it has none, or if that leads nowhere.
   std::optional<Wait> waitOf(const State& state) const;
   /// Whether the step has a wait at all.
-  bool hasWait(const std::string& step) const { return steps_.at(step).wait || everyStep_.wait; }
+  bool hasWait(const std::string& step) const { return steps_.at(step).wait.has_value(); }
   /// Returns the press of the control at the step; absent if nothing says it.
   std::optional<std::string> pressOf(const std::string& step, std::size_t control) const;
 
  private:
-  Part completed(const Part& part, const Arguments& arguments) const;
   bool leadsNowhere(const State& state, const std::string& target) const;
   State go(State state, const std::string& target) const;
   State enter(State state, const std::string& step) const;
@@ -84,7 +83,8 @@ class Interpreter {
 
   const Tour tour_;
   const Part everyStep_;
-  std::map<std::string, Part> steps_;
+  std::map<std::string, Part> own_{};    // what each step says itself
+  std::map<std::string, Part> steps_{};  // what it does not say, `every step` says
 };
 
 }  // namespace qz::meaning

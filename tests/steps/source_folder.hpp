@@ -1,38 +1,39 @@
 // SPDX-License-Identifier: MIT
-// The files of a generated source.
+// A directory with a host's window, for the tests of sources.
 #pragma once
 
-#include <filesystem>
-#include <fstream>
 #include <string>
 
-#include "tests/steps/source_generator.hpp"
+#include "tests/tools/play_files.hpp"
+#include "tools/steps/script_file.hpp"
 
-namespace qz::meaning {
+namespace qz::tools::steps {
 
-/// A directory for one source, which is gone afterwards.
-class SourceFolder {
+/// Sources in it can have the controls that `head` names.
+class SourceFolder : public play::WorkingDirectory {
  public:
-  explicit SourceFolder(const Generated& generated) {
-    std::string name = (std::filesystem::temp_directory_path() / "qz-source-XXXXXX").string();
-    path_ = ::mkdtemp(name.data());
-    write("tour.yaml", generated.yaml);
-    write("host.plist", generated.window);
-    for (const char* picture : pictures) write(std::string(picture) + ".png", "");
-  }
-  ~SourceFolder() { std::filesystem::remove_all(path_); }
-  SourceFolder(const SourceFolder&) = delete;
-  SourceFolder& operator=(const SourceFolder&) = delete;
-
-  std::string source() const { return (path_ / "tour.yaml").string(); }
-  std::string path() const { return path_.string(); }
-
- private:
-  void write(const std::string& name, const std::string& text) const {
-    std::ofstream(path_ / name) << text;
+  SourceFolder() {
+    write("host.plist", R"((
+      { class = NSTextField; tag = 1; frame = (10, 90, 300, 30); title = "Text"; },
+      { class = NSImageView; tag = 2; frame = (10, 90, 30, 30); },
+      { class = "NSButton:toggle"; tag = 3; frame = (10, 50, 300, 30); title = "Box"; },
+      { class = NSButton; tag = 4; frame = (10, 10, 90, 30); title = "Next"; },
+      { class = NSButton; tag = 5; frame = (110, 10, 90, 30); title = "Back"; },
+      { class = NSBox; tag = 6; frame = (0, 0, 300, 300); }
+    ))");
   }
 
-  std::filesystem::path path_;
+  /// The first two lines of a source; what follows begins in line 3.
+  static constexpr const char* head =
+      "window: host.plist\n"
+      "controls: {text: 1, picture: 2, box: 3, next: 4, back: 5, frame: 6}\n";
+
+  /// Writes a source that begins with `head` to tour.yaml.
+  void writeSource(const std::string& rest) const { write("tour.yaml", head + rest); }
+  ScriptFile open(const std::string& rest) const {
+    writeSource(rest);
+    return openScript("tour.yaml");
+  }
 };
 
-}  // namespace qz::meaning
+}  // namespace qz::tools::steps

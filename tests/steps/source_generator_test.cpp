@@ -1,12 +1,12 @@
 // SPDX-License-Identifier: MIT
 // Generated sources have everything that the language has, often enough that a mistake shows.
 
+#include "tests/steps/source_generator.hpp"
+
 #include <gtest/gtest.h>
 
 #include <algorithm>
 #include <functional>
-
-#include "tests/steps/source_generator.hpp"
 
 namespace qz::meaning {
 namespace {
@@ -70,16 +70,21 @@ const std::vector<std::pair<const char*, Says>>& features() {
       {"a fork", forks},
       {"boxes that are the user's", leavesBoxes},
       {"boxes that steps set", said(&Words::isOn)},
-      {"a wait that is given up", inSomePart([](const Part& p) { return p.wait && p.wait->givesUp; })},
-      {"a wait that starts again", inSomePart([](const Part& p) { return p.wait && !p.wait->givesUp; })},
-      {"a wait that leads back", inSomePart([](const Part& p) { return p.wait && p.wait->go == "back"; })},
+      {"a wait that is given up",
+       inSomePart([](const Part& p) { return p.wait && p.wait->givesUp; })},
+      {"a wait that starts again",
+       inSomePart([](const Part& p) { return p.wait && !p.wait->givesUp; })},
+      {"a wait that leads back",
+       inSomePart([](const Part& p) { return p.wait && p.wait->go == "back"; })},
       {"a full way",
        [](const Generated& source) {
-         return somePlace(source, [&](const State& s) { return s.way.size() == source.tour.backOver; });
+         return somePlace(source,
+                          [&](const State& s) { return s.way.size() == source.tour.backOver; });
        }},
       {"back passes over", inSomePart([](const Part& p) { return p.isPassedOver == true; })},
       {"like", inSomePart([](const Part& p) { return !p.like.empty(); })},
-      {"arguments", inSomePart([](const Part& p) { return !p.uses.empty() && !p.uses[0].arguments.empty(); })},
+      {"arguments",
+       inSomePart([](const Part& p) { return !p.uses.empty() && !p.uses[0].arguments.empty(); })},
       {"several fragments", inSomePart([](const Part& p) { return p.uses.size() > 1; })},
       {"an image behind all", inSomePart([](const Part& p) { return p.background.has_value(); })},
       {"contents", said(&Words::content)},
@@ -91,7 +96,10 @@ const std::vector<std::pair<const char*, Says>>& features() {
       {"show and hide", said(&Words::isShown)},
       {"enable and disable", said(&Words::isEnabled)},
       {"flash", said(&Words::flashes)},
-      {"an end", [](const Generated& source) { return source.places.contains({"", {}, {}, false, true}); }},
+      {"an end",
+       [](const Generated& source) {
+         return source.places.contains({"", {}, {}, false, true});
+       }},
   };
   return all;
 }

@@ -10,6 +10,7 @@
 #include "tools/scenario/statements.hpp"
 #include "tools/scenario/unmet.hpp"
 #include "tools/scenario/values.hpp"
+#include "tools/steps/script_file.hpp"
 #include "tools/support/failure.hpp"
 #include "tools/support/input_file.hpp"
 #include "tools/walkthrough/host_window.hpp"
@@ -34,6 +35,11 @@ Outcome file(Stage& stage, const Arguments& a) {
 Outcome copy(Stage& stage, const Arguments& a) {
   const auto folder = std::filesystem::absolute(stage.file).parent_path();
   const auto path = folder / a.text("PATH");
+  if (steps::isSourcePath(path.string())) {
+    const auto script = steps::openScript(path.string());
+    stage.resources.write(a.text("FILE"), toolkit::writeXmlPropertyList(script.file.root()));
+    return {};
+  }
   std::ifstream source(path, std::ios::binary);
   std::ostringstream contents;
   // An empty file is fine: copying it sets the fail bit of `contents`, not of `source`.

@@ -43,9 +43,10 @@ walkthrough::StageOptions ScriptFile::stage(walkthrough::StageOptions options) c
   return options;
 }
 
-ScriptFile openScript(const std::string& path, const std::string& start) {
+ScriptFile openScript(const std::string& path, const std::string& start,
+                      const Translate& translate) {
   if (!isSourcePath(path)) return {InputFile(path, expectedFile), std::nullopt};
-  BuiltSource from{.source = readSource(path), .built = {}};
+  BuiltSource from{.source = readSource(path, translate), .built = {}};
   // The first step stays a start, so that the others are reached as ever.
   std::vector<StepIndex> starts = {0};
   const StepIndex first = start.empty() ? 0 : stepNamed(from.source, start);
@@ -55,6 +56,11 @@ ScriptFile openScript(const std::string& path, const std::string& start) {
   mistakes.throwIfAny(path, from.source.text);
   InputFile file(path, expectedFile, from.built.script, from.built.offsets, from.source.text);
   return {std::move(file), std::move(from)};
+}
+
+InputFile openPropertyList(const std::string& path) {
+  if (isSourcePath(path)) return openScript(path).file;
+  return {path, "a property list", ExitStatus::failed};
 }
 
 }  // namespace qz::tools::steps

@@ -32,6 +32,10 @@ struct ScriptFile {
 /// Reads the script at `path`, or builds it if this is a source, which can then be started at the
 /// step `start` too, if that is not empty. Throws a SourceRefused if the source has mistakes,
 /// another Failure if a file cannot be read or does not hold what it should.
-ScriptFile openScript(const std::string& path, const std::string& start = {});
+ScriptFile openScript(const std::string& path, const std::string& start = {},
+                      const Translate& translate = {});
+
+/// Reads any property list; of a source, the script that is built of it.
+InputFile openPropertyList(const std::string& path);
 
 }  // namespace qz::tools::steps

@@ -55,7 +55,8 @@ std::vector<Control> controlsOf(const walkthrough::StageOptions& options, const 
 /// of the file.
 class SourceReader {
  public:
-  explicit SourceReader(Source& source) : source_(source), tour_(source.tour) {}
+  SourceReader(Source& source, const ReadControls& readControls, const Translate& translate)
+      : source_(source), tour_(source.tour), readControls_(readControls), texts_(translate) {}
 
   void read() {
     const NodeRef root = readYaml(source_.text, source_.path);
@@ -80,6 +81,7 @@ class SourceReader {
     readWindow();
     readControls();
     readSteps();
+    source_.texts = texts_.list();
     mistakes_.throwIfAny(source_.path, source_.text);
   }
 
@@ -105,7 +107,7 @@ class SourceReader {
     source_.stage.window = fileIn("window");
     source_.stage.assets = fileIn("assets");
     mistakes_.throwIfAny(source_.path, source_.text);
-    tour_.controls = controlsOf(source_.stage, source_.path);
+    tour_.controls = readControls_(source_.stage);
   }
 
   void readControls() {
@@ -144,14 +146,16 @@ class SourceReader {
       bodies[name->text] = fragments.expand(body);
     }
     if (entries.empty()) mistakes_.add(part("steps")->place, "expected at least one step");
-    const StepReader reader(tour_.controls, names, mistakes_);
+    const StepReader reader(tour_.controls, names, texts_, mistakes_);
     tour_.everyStep.controls.resize(tour_.controls.size());
     if (const NodeRef every = part("every step")) {
       const NodeRef body = fragments.expand(every);
+      texts_.enterStep("every step");
       reader.read(*tableOf(body), tour_.everyStep);
     }
     for (const auto& [name, body] : entries) {
       Step step{.name = name->text, .place = name->place};
+      texts_.enterStep(name->text);
       readLike(name->text, *name, bodies, reader, step.words, 0);
       tour_.steps.push_back(std::move(step));
     }
@@ -195,6 +199,8 @@ class SourceReader {
 
   Source& source_;
   Tour& tour_;
+  const ReadControls& readControls_;
+  Texts texts_;
   Mistakes mistakes_;
   std::map<std::string, NodeRef> parts_;
 };
@@ -205,13 +211,20 @@ bool isSourcePath(const std::string& path) {
   return path.ends_with(".yaml") || path.ends_with(".yml");
 }
 
-Source readSource(const std::string& path) {
+Source readSource(const std::string& path, const Translate& translate) {
   auto text = wholeFile(path);
   if (!text)
     throw Failure(ExitStatus::badInput,
                   path + ": cannot be read; expected a walk-through in steps");
-  Source source{.path = path, .text = *std::move(text)};
-  SourceReader(source).read();
+  return readSourceText(
+      path, *std::move(text),
+      [&](const walkthrough::StageOptions& stage) { return controlsOf(stage, path); }, translate);
+}
+
+Source readSourceText(const std::string& path, std::string text, const ReadControls& readControls,
+                      const Translate& translate) {
+  Source source{.path = path, .text = std::move(text)};
+  SourceReader(source, readControls, translate).read();
   return source;
 }
 

@@ -2,8 +2,11 @@
 // The source of a walk-through: a YAML file.
 #pragma once
 
+#include <functional>
 #include <string>
+#include <vector>
 
+#include "tools/steps/texts.hpp"
 #include "tools/steps/tour.hpp"
 #include "tools/walkthrough/stage.hpp"
 
@@ -14,13 +17,22 @@ struct Source {
   std::string text{};
   walkthrough::StageOptions stage{};  ///< the window that the source names
   Tour tour{};
+  std::vector<Text> texts{};  ///< for translators, in the order of the file
 };
 
 /// Whether the file's name is that of a source: it ends with .yaml or .yml.
 bool isSourcePath(const std::string& path);
 
-/// Reads a source, and the window that it names. Throws a SourceRefused if there are mistakes in
-/// it, another Failure if a file cannot be read.
-Source readSource(const std::string& path);
+/// Returns the controls of the window that the options name, back to front.
+using ReadControls = std::function<std::vector<Control>(const walkthrough::StageOptions&)>;
+
+/// Reads a source from its text. Throws a SourceRefused if there are mistakes in it.
+Source readSourceText(const std::string& path, std::string text, const ReadControls& readControls,
+                      const Translate& translate = {});
+
+/// Reads a source, and the window that it names. With `translate` its texts are in another
+/// language. Throws a SourceRefused if there are mistakes in it, another Failure if a file cannot
+/// be read.
+Source readSource(const std::string& path, const Translate& translate = {});
 
 }  // namespace qz::tools::steps

@@ -59,8 +59,9 @@ bool takesInput(const drivers::ViewKindRow& kind) { return kind.isControl; }
 }  // namespace
 
 StepReader::StepReader(const std::vector<Control>& controls,
-                       const std::map<std::string, StepIndex>& steps, Mistakes& mistakes)
-    : controls_(controls), steps_(steps), mistakes_(mistakes) {
+                       const std::map<std::string, StepIndex>& steps, Texts& texts,
+                       Mistakes& mistakes)
+    : controls_(controls), steps_(steps), texts_(texts), mistakes_(mistakes) {
   for (ControlIndex i = 0; i < controls.size(); ++i) {
     if (!controls[i].name.empty()) names_.emplace(controls[i].name, i);
   }
@@ -205,9 +206,22 @@ void StepReader::readContent(ControlIndex control, const Node& value, ControlWor
                                    " shows no text; expected properties such as “shown”");
     return;
   }
-  const auto text = textOf(value, captionWord(caption), mistakes_);
+  // The name of an image is for no translator.
+  const auto text = caption == Caption::imageName
+                        ? textOf(value, captionWord(caption), mistakes_)
+                        : translatedText(control, captionWord(caption), value);
   if (!text) return;
   words.content = caption == Caption::text ? readMarkdown(*text) : Markup{true, *text};
+}
+
+std::optional<std::string> StepReader::translatedText(ControlIndex control,
+                                                      std::string_view property,
+                                                      const Node& value) const {
+  const auto text = textOf(value, property, mistakes_);
+  if (!text) return std::nullopt;
+  return texts_.translated(*text, {.place = value.place,
+                                   .control = controls_[control].name,
+                                   .property = std::string(property)});
 }
 
 void StepReader::readProperty(ControlIndex control, const Node& key, const Node& value,
@@ -222,8 +236,8 @@ void StepReader::readProperty(ControlIndex control, const Node& key, const Node&
                 "no property is called " + foundWords(key) + didYouMean(key.text, known));
 }
 
-void StepReader::readHtml(ControlIndex /*control*/, const Node& value, ControlWords& words) const {
-  if (const auto html = textOf(value, "HTML", mistakes_)) {
+void StepReader::readHtml(ControlIndex control, const Node& value, ControlWords& words) const {
+  if (const auto html = translatedText(control, "html", value)) {
     words.content = Markup{false, inAscii(*html)};
   }
 }
@@ -247,9 +261,8 @@ void StepReader::readAlign(ControlIndex /*control*/, const Node& value, ControlW
   if (const auto choice = choiceOf(value, choices, mistakes_)) words.isCentered = *choice == 1;
 }
 
-void StepReader::readToolTip(ControlIndex /*control*/, const Node& value,
-                             ControlWords& words) const {
-  words.toolTip = textOf(value, "a text", mistakes_);
+void StepReader::readToolTip(ControlIndex control, const Node& value, ControlWords& words) const {
+  words.toolTip = translatedText(control, "tooltip", value);
 }
 
 void StepReader::readColor(ControlIndex /*control*/, const Node& value, ControlWords& words) const {

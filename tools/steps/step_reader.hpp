@@ -5,6 +5,7 @@
 #include <map>
 #include <string>
 
+#include "tools/steps/texts.hpp"
 #include "tools/steps/tour.hpp"
 #include "tools/steps/yaml.hpp"
 
@@ -14,7 +15,7 @@ class StepReader {
  public:
   /// `steps` are the names of all steps.
   StepReader(const std::vector<Control>& controls, const std::map<std::string, StepIndex>& steps,
-             Mistakes& mistakes);
+             Texts& texts, Mistakes& mistakes);
 
   /// Adds what `body` says to `words`; what it says replaces what was said before. `body` is a
   /// table without fragments; a name may occur in it several times.
@@ -51,6 +52,10 @@ class StepReader {
   void readFlag(ControlIndex control, const Node& value, ControlWords& words) const;
   void readPress(ControlIndex control, const Node& value, ControlWords& words) const;
 
+  /// Returns a text in the language of the script; absent, and a mistake, if the node is not a
+  /// text.
+  std::optional<std::string> translatedText(ControlIndex control, std::string_view property,
+                                            const Node& value) const;
   std::optional<Lead> readLead(const Node& value) const;
   /// Returns the control with that name; absent, and a mistake, if there is none.
   std::optional<ControlIndex> controlNamed(const Node& name) const;
@@ -62,6 +67,7 @@ class StepReader {
   const std::vector<Control>& controls_;
   const std::map<std::string, StepIndex>& steps_;
   std::map<std::string, ControlIndex> names_;
+  Texts& texts_;
   Mistakes& mistakes_;
 };
 

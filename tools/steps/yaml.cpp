@@ -14,6 +14,9 @@ namespace {
 /// aliases there is hardly more than one node for two bytes.
 constexpr std::size_t mostNodesForAByte = 4;
 
+/// How deeply lists and tables can be nested. A walk-through needs less than ten levels.
+constexpr std::size_t deepestNesting = 100;
+
 struct YamlRefusal {
   Place place;
   std::string message;
@@ -27,6 +30,10 @@ class TreeBuilder {
   NodeRef root() const { return root_; }
 
   void begin(Node::Kind kind, Place place, const std::string& anchor) {
+    if (open_.size() == deepestNesting) {
+      throw YamlRefusal{place, "lists and tables are nested too deeply; expected at most " +
+                                   std::to_string(deepestNesting) + " levels"};
+    }
     open_.push_back({std::make_shared<Node>(Node{.kind = kind, .place = place}), anchor, nullptr});
   }
 
@@ -163,7 +170,7 @@ class YamlParser {
         return builder.addScalar(tokenText(value), isPlain, place, tokenText(event.scalar.anchor));
       }
       case FYET_ALIAS:
-        return builder.addAlias(tokenText(event.alias.anchor), place);
+        return builder.addAlias(tokenText(event.alias.anchor), place - 1);  // at the star
       default:
         return;
     }
@@ -179,11 +186,21 @@ class YamlParser {
   std::unique_ptr<fy_parser, Destroyer> parser_;
 };
 
+/// Refuses lines that begin with a percent sign: a source needs no directives, and the parser does
+/// not come back from some that are wrong.
+void refuseDirectives(std::string_view text) {
+  for (std::size_t i = 0; i < text.size(); i = text.find('\n', i) + 1) {
+    if (text[i] == '%') throw YamlRefusal{i, "expected no directive at the beginning of a line"};
+    if (text.find('\n', i) == std::string_view::npos) return;
+  }
+}
+
 }  // namespace
 
 NodeRef readYaml(std::string_view text, const std::string& path) {
   Mistakes mistakes;
   try {
+    refuseDirectives(text);
     return YamlParser(text).read();
   } catch (const YamlRefusal& refusal) {
     mistakes.add(refusal.place, refusal.message);

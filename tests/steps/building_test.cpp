@@ -1,0 +1,77 @@
+// SPDX-License-Identifier: MIT
+// What is built of a source: tags that stay, short lists, names for the tools.
+
+#include <gtest/gtest.h>
+
+#include <set>
+
+#include "tests/steps/source_folder.hpp"
+
+namespace qz::tools::steps {
+namespace {
+
+std::set<std::string> keysOf(const ScriptFile& script) {
+  const auto keys = script.file.dictionary()->allKeys();
+  return {keys.begin(), keys.end()};
+}
+
+TEST(Building, TagsStayWhenStepsAreAddedElsewhere) {
+  const SourceFolder folder;
+  const auto before =
+      keysOf(folder.open("steps: {a: {next: {press: b}}, b: {next: {press: c}, back: {press: "
+                         "back}}, c: {next: {press: end}}}"));
+  const auto after =
+      keysOf(folder.open("steps: {a: {next: {press: b}}, b: {next: {press: c}, back: {press: "
+                         "back}}, c: {next: {press: d}},"
+                         " d: {next: {press: end}}}"));
+  for (const std::string& key : before) EXPECT_TRUE(after.contains(key)) << key;
+}
+
+TEST(Building, IsTheSameEachTime) {
+  const SourceFolder folder;
+  const char* const source = "steps: {a: {text: Hello, next: {press: b}}, b: {next: {press: end}}}";
+  EXPECT_EQ(folder.open(source).file.root()->description(),
+            folder.open(source).file.root()->description());
+}
+
+TEST(Building, AStepThatChangesNothingSendsNothing) {
+  const SourceFolder folder;
+  const auto script = folder.open(
+      "every step: {text: Same}\nsteps: {a: {next: {press: b}}, b: {next: {press: end}}}");
+  const auto key = std::to_string(
+      script.from->built.controlOfTag.rbegin()->first);  // of Next at a: its own tag ends at b
+  const auto list = script.file.dictionary()->objectForKey(key);
+  EXPECT_EQ(list->description().find("SET_TEXT"), std::string::npos) << list->description();
+}
+
+TEST(Building, NamesEveryTagAndEveryListThatLeadsToAStep) {
+  const SourceFolder folder;
+  const auto script = folder.open(
+      "steps: {a: {next: {press: b}}, b: {after 2 s: a, next: {press: end}, back: {press: back}}}");
+  const auto names = script.names();
+  std::set<std::string> controls;
+  for (const auto& [tag, name] : names.controls) controls.insert(name);
+  EXPECT_EQ(controls, (std::set<std::string>{"text", "picture", "box", "next", "back", "frame"}));
+  std::multiset<std::string> steps;
+  for (const auto& [key, step] : names.steps) steps.insert(step);
+  // The start, Back and the wait lead to a; Next to b.
+  EXPECT_EQ(steps, (std::multiset<std::string>{"a", "a", "a", "b"}));
+}
+
+TEST(Building, PositionsAreThoseOfTheSource) {
+  const SourceFolder folder;
+  const auto script = folder.open("steps:\n  a: {text: Hello, next: {press: end}}\n");
+  const auto end = script.file.dictionary()->objectForKey("4");
+  EXPECT_EQ(script.file.placeOf(end), "tour.yaml:4:34");
+}
+
+TEST(Building, CanStartAtAnyStep) {
+  const SourceFolder folder;
+  folder.writeSource("steps: {a: {next: {press: b}}, b: {next: {press: end}}}");
+  const auto script = openScript("tour.yaml", "b");
+  EXPECT_EQ(script.names().stepOf(script.from->built.startKeys.front()), "b");
+  EXPECT_THROW(openScript("tour.yaml", "c"), Failure);
+}
+
+}  // namespace
+}  // namespace qz::tools::steps
