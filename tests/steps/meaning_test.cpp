@@ -10,9 +10,9 @@
 
 #include "tests/check/checking.hpp"
 #include "tests/steps/asked_findings.hpp"
+#include "tests/steps/generated_folder.hpp"
 #include "tests/steps/joint_walk.hpp"
 #include "tests/steps/smaller_tours.hpp"
-#include "tests/steps/source_folder.hpp"
 #include "tests/steps/source_generator.hpp"
 
 namespace qz::meaning {
@@ -51,7 +51,7 @@ class Comparison {
  private:
   /// The walk also starts at another step, of this number.
   std::string disagreement(const Generated& generated, std::size_t start) {
-    const SourceFolder folder(generated);
+    const GeneratedFolder folder(generated);
     const auto& steps = generated.tour.steps;
     const std::string& first = steps.front().first;
     const std::string& other = steps[start % steps.size()].first;
@@ -67,8 +67,8 @@ class Comparison {
   }
 
   /// A script that was built to start at a step starts with the first of its start keys.
-  std::string walk(const Generated& generated, const ScriptFile& opened, const SourceFolder& folder,
-                   const std::string& step) {
+  std::string walk(const Generated& generated, const ScriptFile& opened,
+                   const GeneratedFolder& folder, const std::string& step) {
     const auto& [source, built] = *opened.from;
     const PlayableSource playable{folder.path(), built.script, built.startKeys.front(),
                                   planStage(source.stage, built.script, source.path)};
@@ -80,7 +80,7 @@ class Comparison {
   }
 
   /// What the check should not say, or should have said.
-  static std::string misjudged(const ScriptFile& opened, const SourceFolder& folder,
+  static std::string misjudged(const ScriptFile& opened, const GeneratedFolder& folder,
                                const Asked& asked) {
     tools::check::CheckOptions options;
     options.toolkit = tools::testToolkit();

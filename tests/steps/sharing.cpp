@@ -64,8 +64,8 @@ Part joined(Part said, Part otherwise) {
   return said;
 }
 
-// "A later fragment replaces what an earlier one says, the step itself replaces what fragments say, and
-// all replace what `like` says."
+// "A later fragment replaces what an earlier one says, the step itself replaces what fragments say,
+// and all replace what `like` says."
 Part completed(const Tour& tour, const Part& part, const Arguments& arguments) {
   const Part own = filledIn(part, arguments);
   Part whole = own;
