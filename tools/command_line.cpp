@@ -88,14 +88,17 @@ std::string whyNotPath(const std::string& argument) {
   return argument.empty() ? "expected a path, found an empty text" : "";
 }
 
-/// Calls `take` and translates its error: CLI11 handles only its own.
-void hand(const Command::Take& take, const std::string& value) {
+/// Calls a function and translates its error: CLI11 handles only its own.
+template <class Function, class... Arguments>
+auto translating(const Function& function, const Arguments&... arguments) {
   try {
-    take(value);
+    return function(arguments...);
   } catch (const UsageError& error) {
     throw CLI::ValidationError(error.what());
   }
 }
+
+void hand(const Command::Take& take, const std::string& value) { translating(take, value); }
 
 }  // namespace
 
@@ -219,7 +222,7 @@ Command::Option Command::repeatedList(const std::string& name, Take take, const 
 }
 
 void Command::action(std::function<int()> run) {
-  app_.callback([run = std::move(run), &status = status_] { status = run(); });
+  app_.callback([run = std::move(run), &status = status_] { status = translating(run); });
 }
 
 namespace {

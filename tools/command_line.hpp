@@ -91,7 +91,8 @@ class Command {
   /// The same for an option that takes all values up to the next option.
   Option repeatedList(const std::string& name, Take take, const std::string& help);
 
-  /// Sets what runs once the line is read; `run` returns the exit status or throws a Failure.
+  /// Sets what runs once the line is read; `run` returns the exit status, or throws a Failure or a
+  /// UsageError.
   void action(std::function<int()> run);
 
  private:

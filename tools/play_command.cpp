@@ -11,6 +11,7 @@
 #include "tools/play/play.hpp"
 #include "tools/play/prompt.hpp"
 #include "tools/reading_errors.hpp"
+#include "tools/steps/source.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/terminal.hpp"
 #include "tools/support/text_layout.hpp"
@@ -36,6 +37,16 @@ play::Style outputStyle() {
 void addPress(play::PlayOptions& options, const std::string& text) {
   const auto tag = play::parseTag(text);
   options.steps.emplace_back(tag ? play::Press{*tag, {}} : play::Press{0, text});
+}
+
+/// Throws a UsageError for a press by name, in a script without names.
+void requireTags(const play::PlayOptions& options) {
+  if (steps::isSourcePath(options.script)) return;
+  for (const play::Step& step : options.steps) {
+    const auto* const press = std::get_if<play::Press>(&step);
+    if (!press || press->name.empty()) continue;
+    throw UsageError("--press: expected a tag (a whole number), found " + quote(press->name));
+  }
 }
 
 void addAdvance(play::PlayOptions& options, const std::string& text) {
@@ -92,12 +103,16 @@ void addStepOptions(Command& command, play::PlayOptions& options) {
 
 void describePlay(Command& command) {
   const auto options = std::make_shared<play::PlayOptions>();
-  command.argument("SCRIPT", options->script, "The script, a property list").file();
+  command
+      .argument("SCRIPT", options->script,
+                "The script, a property list; or its source, a YAML file")
+      .file();
   addWindowOptions(command, *options);
   addStepOptions(command, *options);
   const auto noCheck = std::make_shared<bool>(false);
   command.flag("--no-check", *noCheck, "Do not say what can be read to be wrong in the script");
   command.action([options, noCheck] {
+    requireTags(*options);
     if (!*noCheck) {
       options->scriptLoaded = [](const InputFile& script, toolkit::Toolkit& toolkit,
                                  std::ostream& out) { writeReadingErrors(script, toolkit, out); };

@@ -74,16 +74,6 @@ void checkDirectory(const std::string& path) {
   throw Failure(ExitStatus::badInput, path + what + "; expected one with images");
 }
 
-/// Throws a Failure for a press by name, in a script without names.
-void requireTags(const std::vector<Step>& steps) {
-  for (const Step& step : steps) {
-    const auto* const press = std::get_if<Press>(&step);
-    if (!press || press->name.empty()) continue;
-    throw Failure(ExitStatus::badInput,
-                  "--press: expected a tag (a whole number), found " + quote(press->name));
-  }
-}
-
 void pressIfPossible(Session& session, const Press& press, std::ostream& out) {
   const auto tag = tagOf(session.picture(), press);
   if (!tag) {
@@ -146,7 +136,6 @@ ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
   checkStart(file, startKey);
   const fs::path path = fs::absolute(options.script);
   if (options.resources) checkDirectory(*options.resources);
-  if (!script.from) requireTags(options.steps);
 
   const auto driver = requireDriver(options.toolkit);
   driver->setResourcePath(options.resources ? *options.resources : path.parent_path().string());
