@@ -213,7 +213,8 @@ TEST_F(Runner, TakesAListsCountIn32BitsWithASign) {
   const struct {
     std::size_t count;
     std::size_t asked;
-  } cases[] = {{std::size_t{1} << 31, 0}, {(std::size_t{1} << 32) + 2, 2}};
+  } cases[] = {{std::size_t{1} << 31, 0},
+               {static_cast<std::size_t>((std::uint64_t{1} << 32) + 2), 2}};
   for (const auto& c : cases) {
     ClaimingList list(c.count);
     const ValueRef<> shared(toolkit::Counted<toolkit::Value>::share(&list));

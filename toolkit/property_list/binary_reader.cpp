@@ -74,7 +74,7 @@ class BinaryReader {
       : trailer_(checkedTrailer(bytes)),
         table_(trailer_.offsetSize),
         references_(trailer_.referenceSize),
-        objects_(bytes.substr(0, trailer_.tableOffset)),
+        objects_(bytes.substr(0, static_cast<std::size_t>(trailer_.tableOffset))),
         document_(document),
         offsets_(offsets),
         budget_(mostOverlap * bytes.size() + overlapForFree),
@@ -83,12 +83,12 @@ class BinaryReader {
   Value* root();
 
  private:
-  std::uint64_t offsetOf(std::uint64_t index) const {
+  std::uint64_t offsetOf(std::size_t index) const {
     return table_.at(objects_.data() + objects_.size(), index);
   }
   void checkTable() const;
-  Value* object(std::uint64_t index, std::size_t depth);
-  Value* newObject(std::uint64_t index, std::size_t depth);
+  Value* object(std::size_t index, std::size_t depth);
+  Value* newObject(std::size_t index, std::size_t depth);
   Value* content(std::size_t offset, std::size_t depth);
   Value* constant(std::size_t offset);
   Value* integer(std::size_t offset);
@@ -123,7 +123,7 @@ class BinaryReader {
 
 /// Every offset must lie before the table, even if it is not used.
 void BinaryReader::checkTable() const {
-  for (std::uint64_t index = 0; index < trailer_.objectCount; ++index) {
+  for (std::size_t index = 0; index < trailer_.objectCount; ++index) {
     if (offsetOf(index) >= objects_.size()) {
       refuse(objects_.size() + index * trailer_.offsetSize,
              "the offset does not lead to before the offset table");
@@ -133,17 +133,17 @@ void BinaryReader::checkTable() const {
 
 Value* BinaryReader::root() {
   checkTable();
-  values_.resize(trailer_.objectCount);
-  return object(trailer_.topObject, 0);
+  values_.resize(static_cast<std::size_t>(trailer_.objectCount));
+  return object(static_cast<std::size_t>(trailer_.topObject), 0);
 }
 
-inline Value* BinaryReader::object(std::uint64_t index, std::size_t depth) {
+inline Value* BinaryReader::object(std::size_t index, std::size_t depth) {
   Value* const value = values_[index];
   return value && value != beingRead_ ? value : newObject(index, depth);
 }
 
-Value* BinaryReader::newObject(std::uint64_t index, std::size_t depth) {
-  const std::size_t offset = offsetOf(index);
+Value* BinaryReader::newObject(std::size_t index, std::size_t depth) {
+  const auto offset = static_cast<std::size_t>(offsetOf(index));
   if (values_[index] == beingRead_) refuse(offset, "the object holds itself");
   if (offset < binary::headerSize) refuse(offset, "an object cannot lie in the header");
   if (depth > deepestNesting) {
@@ -187,12 +187,12 @@ Value* BinaryReader::content(std::size_t offset, std::size_t depth) {
 /// Returns `count` units of content from `at` on, which must lie before the offset table.
 std::string_view BinaryReader::take(std::size_t at, std::uint64_t count, std::size_t unitSize) {
   const std::size_t space = objects_.size() - at;
-  const std::size_t size = count * unitSize;
-  // If count ≤ space, count × unitSize cannot overflow.
+  const std::uint64_t size = count * unitSize;
+  // If count ≤ space, count × unitSize cannot overflow 64 bits.
   if (count > space || size > space) refuse(at, "the object reaches beyond the objects' space");
   if (size > budget_) refuse(at, "the objects overlap too often");
-  budget_ -= size;
-  return objects_.substr(at, size);
+  budget_ -= static_cast<std::size_t>(size);
+  return objects_.substr(at, static_cast<std::size_t>(size));
 }
 
 /// Returns the content of an object whose marker gives its length in units.
@@ -275,7 +275,7 @@ inline Value* BinaryReader::reference(const char* references, std::size_t index,
     const auto first = static_cast<std::size_t>(references - objects_.data());
     refuse(first + index * references_.size(), "the object referred to does not exist");
   }
-  return this->object(object, depth);
+  return this->object(static_cast<std::size_t>(object), depth);
 }
 
 Value* BinaryReader::array(std::size_t offset, std::size_t depth) {

@@ -72,7 +72,9 @@ class QZ_API KeyIndex {
   };
 
   static std::uint32_t tagOf(std::uint64_t hash) { return static_cast<std::uint32_t>(hash >> 32); }
-  std::size_t home(std::uint64_t hash) const { return hash & (slots_.size() - 1); }
+  std::size_t home(std::uint64_t hash) const {
+    return static_cast<std::size_t>(hash) & (slots_.size() - 1);
+  }
   std::size_t next(std::size_t at) const { return (at + 1) & (slots_.size() - 1); }
 
   std::pmr::vector<Slot> slots_;  // the size is a power of two; some slots are always free
