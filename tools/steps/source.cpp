@@ -6,10 +6,10 @@
 #include <filesystem>
 #include <map>
 
-#include "drivers/memory/memory_driver.hpp"
 #include "tools/steps/fragments.hpp"
 #include "tools/steps/step_reader.hpp"
 #include "tools/steps/words.hpp"
+#include "tools/support/drivers.hpp"
 #include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
 #include "tools/support/whole_file.hpp"
@@ -41,11 +41,11 @@ Control controlOf(const drivers::ViewPicture& view) {
 
 /// Returns the controls of the window that the options name, back to front.
 std::vector<Control> controlsOf(const walkthrough::StageOptions& options, const std::string& path) {
-  drivers::MemoryDriver driver;
-  driver.setResourcePath(fs::path(path).parent_path().string());
+  const auto driver = requireDriver("memory");
+  driver->setResourcePath(fs::path(path).parent_path().string());
   const auto plan = walkthrough::planStage(options, {}, path);
-  walkthrough::Stage stage(driver, plan);
-  const auto picture = walkthrough::takePicture(driver, stage.engine(), stage.title());
+  walkthrough::Stage stage(*driver, plan);
+  const auto picture = walkthrough::takePicture(*driver, stage.engine(), stage.title());
   std::vector<Control> controls;
   for (const auto& control : picture.controls) controls.push_back(controlOf(control.view));
   return controls;
