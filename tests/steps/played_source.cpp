@@ -54,13 +54,14 @@ void dropLineBreak(Reading& reading) {
   if (reading.back().text.empty()) reading.pop_back();
 }
 
-/// The font of the whole text; absent if there are several.
+/// The font of the whole text; absent if no part of it has one.
 std::optional<std::string> fontOf(const ControlPicture& control) {
   std::set<std::string> fonts;
   for (const auto& run : captionOf(control).runs()) {
     fonts.insert(run.attributes.font ? fontWords(*run.attributes.font) : "");
   }
-  return fonts.size() == 1 ? std::optional(*fonts.begin()) : std::nullopt;
+  if (fonts == std::set<std::string>{""}) return std::nullopt;
+  return fonts.size() == 1 ? *fonts.begin() : "several";
 }
 
 bool isCentered(const ControlPicture& control) {
@@ -94,7 +95,7 @@ ControlLook seen(const ControlPicture& control, const ControlLook& expected, boo
   look.reading = readingOf(control);
   if (expected.isCentered) dropLineBreak(look.reading);
   const bool isEmpty = captionOf(control).string().empty();  // and so has neither font nor color
-  look.font = isEmpty || !expected.font ? expected.font : fontOf(control);
+  look.font = isEmpty ? expected.font : fontOf(control);
   look.isCentered = isEmpty ? expected.isCentered : isCentered(control);
   look.toolTip = control.view.toolTip;
   look.color = !drivers::isButton(control.view.kind) || isEmpty ? expected.color : colorOf(control);

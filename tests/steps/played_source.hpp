@@ -38,8 +38,8 @@ class Play {
   std::unique_ptr<tools::walkthrough::Stage> stage_{};
 };
 
-/// Returns what the window looks like, in the interpreter's terms. Of fonts and places of text only
-/// what the interpreter's look says is looked at.
+/// Returns what the window looks like, in the interpreter's terms. What nobody can see is as
+/// expected: the rest of a hidden control, and the style of an empty text.
 Look seen(const tools::walkthrough::StepPicture& picture, const Look& expected);
 
 /// Returns all that the picture shows to a user, in words, except states and what is pressed in.
