@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // A walk-through over a form leaves no trace, except for what the user has changed meanwhile.
 
+#include <QPlainTextEdit>
 #include <QRadioButton>
 #include <QRandomGenerator>
 #include <QScrollBar>

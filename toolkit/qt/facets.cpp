@@ -472,34 +472,43 @@ void writeSubWindow(QWidget& widget, const QVariant& value) {
   if (window) static_cast<QMdiArea&>(widget).setActiveSubWindow(window);
 }
 
+template <auto read, auto write>
+constexpr Facet ofWidgets(Facet::Reach reach = Facet::Reach::own) {
+  return {[](QObject& widget) { return read(static_cast<QWidget&>(widget)); },
+          [](QObject& widget, const QVariant& value) {
+            write(static_cast<QWidget&>(widget), value);
+          },
+          reach};
+}
+
 }  // namespace
 
 std::span<const Facet> facets() {
   static constexpr Facet table[] = {
-      {readFocus, writeFocus},  // a widget that is hidden or disabled cannot take it
-      {readScroll, writeScroll},
-      {readSize, writeSize, Facet::Reach::layout},
-      {readTagProperty, writeTagProperty},
-      {readName, writeName},
-      {readDescription, writeDescription},
-      {readToolTip, writeToolTip},
-      {readHidden, writeHidden, Facet::Reach::form},
-      {readEnabled, writeEnabled, Facet::Reach::form},
-      {readLayer, writeLayer},
-      {readCheck, writeCheck},
-      {readChoice, writeChoice},
-      {readFace, writeFace},
-      {readBezel, writeBezel},
-      {readHighlight, writeHighlight},
-      {readTitle, writeTitle},
-      {readLabel, writeLabel},
-      {readLine, writeLine},
-      {readPage, writePage},
-      {readDress, writeDress},
-      {readPanes, writePanes},
-      {readPageShown, writePageShown},
-      {readFrontDock, writeFrontDock},
-      {readSubWindow, writeSubWindow},
+      ofWidgets<readFocus, writeFocus>(Facet::Reach::around),  // a widget that is hidden or disabled cannot take it
+      ofWidgets<readScroll, writeScroll>(Facet::Reach::around),
+      ofWidgets<readSize, writeSize>(Facet::Reach::layout),
+      ofWidgets<readTagProperty, writeTagProperty>(),
+      ofWidgets<readName, writeName>(),
+      ofWidgets<readDescription, writeDescription>(),
+      ofWidgets<readToolTip, writeToolTip>(),
+      ofWidgets<readHidden, writeHidden>(Facet::Reach::form),
+      ofWidgets<readEnabled, writeEnabled>(Facet::Reach::form),
+      ofWidgets<readLayer, writeLayer>(),
+      ofWidgets<readCheck, writeCheck>(),
+      ofWidgets<readChoice, writeChoice>(Facet::Reach::around),
+      ofWidgets<readFace, writeFace>(),
+      ofWidgets<readBezel, writeBezel>(),
+      ofWidgets<readHighlight, writeHighlight>(),
+      ofWidgets<readTitle, writeTitle>(),
+      ofWidgets<readLabel, writeLabel>(),
+      ofWidgets<readLine, writeLine>(),
+      ofWidgets<readPage, writePage>(),
+      ofWidgets<readDress, writeDress>(),
+      ofWidgets<readPanes, writePanes>(Facet::Reach::around),
+      ofWidgets<readPageShown, writePageShown>(Facet::Reach::around),
+      ofWidgets<readFrontDock, writeFrontDock>(Facet::Reach::around),
+      ofWidgets<readSubWindow, writeSubWindow>(Facet::Reach::around),
   };
   return table;
 }

@@ -7,22 +7,24 @@
 #include <span>
 #include <vector>
 
+class QObject;
 class QWidget;
 
 namespace qz::toolkit::qt {
 
-/// One thing about a widget.
+/// One thing about a widget, or about an action.
 struct Facet {
-  /// Returns the present value; invalid if the widget has no such thing. Values can be compared.
-  QVariant (*read)(QWidget& widget);
+  /// Returns the present value; invalid if the object has no such thing. Values can be compared.
+  QVariant (*read)(QObject& object);
   /// Restores a value that `read` returned.
-  void (*write)(QWidget& widget, const QVariant& value);
-  /// When it changes: with the widget that a command changes or one around it; also when the host
-  /// reacts to a change of any other widget; only when Qt lays the form out.
-  enum class Reach : std::uint8_t { near, form, layout } reach = Reach::near;
+  void (*write)(QObject& object, const QVariant& value);
+  /// When it changes: with the object that a command changes; also when a widget in it is brought
+  /// into view; moreover when the host reacts to a change of any other widget; only when Qt lays
+  /// the form out.
+  enum class Reach : std::uint8_t { own, around, form, layout } reach = Reach::own;
 };
 
-/// Returns all facets. Restore the later ones first: they may change the earlier ones too.
+/// Returns all facets of widgets. Their objects are widgets. Restore the later ones first: they may change the earlier ones too.
 std::span<const Facet> facets();
 
 /// Returns the facet that is the size of a window.

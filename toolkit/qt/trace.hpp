@@ -9,11 +9,13 @@
 
 #include "toolkit/qt/facets.hpp"
 
+class QAction;
+
 namespace qz::toolkit::qt {
 
-/// A facet of a widget at some moment.
+/// A facet of a widget or an action at some moment.
 struct Sighting {
-  QPointer<QWidget> widget;
+  QPointer<QObject> object;
   const Facet* facet;
   QVariant value;
 };
@@ -21,6 +23,8 @@ struct Sighting {
 /// Returns every facet that a change of `widget` can change; with what the host may change in
 /// return, in the whole window, if it is wanted.
 std::vector<Sighting> sightingsAround(QWidget& widget, bool withReactions);
+/// The same for an action of `window`.
+std::vector<Sighting> sightingsAround(QAction& action, QWidget& window, bool withReactions);
 
 class Trace {
  public:
@@ -33,11 +37,11 @@ class Trace {
 
  private:
   struct Entry {
-    QPointer<QWidget> widget;
+    QPointer<QObject> object;
     const Facet* facet;
     QVariant original;
     QVariant ours;
-    bool isOurs() const { return widget && facet->read(*widget) == ours; }
+    bool isOurs() const { return object && facet->read(*object) == ours; }
   };
 
   void undoNoted();

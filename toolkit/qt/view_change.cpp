@@ -12,6 +12,11 @@ ViewChange::ViewChange(QWidget* widget, std::shared_ptr<AdoptedForm> form, Notic
   if (form_ && widget) before_ = form_->look(*widget, notice);
 }
 
+ViewChange::ViewChange(QAction* action, std::shared_ptr<AdoptedForm> form)
+    : form_(std::move(form)), notice_(Notice::none) {
+  if (form_ && action) before_ = form_->look(*action);
+}
+
 ViewChange::~ViewChange() {
   if (form_) form_->changed(widget_, notice_, before_);
 }

@@ -5,12 +5,14 @@
 
 #include <QAction>
 #include <QCheckBox>
+#include <QMenu>
 #include <QToolButton>
 #include <QVariant>
 
 #include "toolkit/backend/responder_chain.hpp"
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/check_state.hpp"
+#include "toolkit/qt/hiding.hpp"
 #include "toolkit/qt/input_widgets.hpp"
 #include "toolkit/qt/text_look.hpp"
 #include "toolkit/qt/window.hpp"
@@ -24,8 +26,6 @@ bool isImageView(const QWidget& widget) {
   return label && (widget.property(imageViewProperty).toBool() ||
                    !label->pixmap(Qt::ReturnByValue).isNull());
 }
-
-bool isMarkedForBoth(const QObject& object) { return object.property(pressProperty) == "both"; }
 
 // True if a press of the button goes to the host as well as to the target.
 bool servesBoth(const QAbstractButton& button) {
@@ -64,9 +64,21 @@ QtButton::~QtButton() { QObject::disconnect(clicks_); }
 
 void QtButton::takeClicks() {
   if (!button() || gate_) return;
-  if (!servesBoth(*button())) heldAction_ = std::make_unique<HeldAction>(*button());
+  if (!servesBoth(*button())) {
+    takeMenuEntries();
+    heldAction_ = std::make_unique<HeldAction>(*button());
+  }
   gate_ = std::make_unique<PressGate>(
       *button(), [this] { return takesPress(); }, [this] { clicked(); });
+}
+
+// In a form the menus that show the button's action, and its shortcut, press the button.
+void QtButton::takeMenuEntries() {
+  QAction* const action = isInForm() ? actionShownBy(*button()) : nullptr;
+  if (!action || action->menu()) return;
+  menuEntries_ = std::make_unique<ActionStandIn>(*action, [this](bool) {
+    if (button()) button()->click();
+  });
 }
 
 // Asked at each press: the host may mark the button at any time, and the target may be gone.

@@ -15,6 +15,7 @@
 
 #include "qz/toolkit/view.hpp"
 #include "toolkit/qt/accessibility.hpp"
+#include "toolkit/qt/action_stand_in.hpp"
 #include "toolkit/qt/held_action.hpp"
 #include "toolkit/qt/image_look.hpp"
 #include "toolkit/qt/press_gate.hpp"
@@ -150,6 +151,7 @@ class QtButton final : public QtControl<Button> {
  private:
   QAbstractButton* button() const { return static_cast<QAbstractButton*>(widget()); }
   void takeClicks() override;
+  void takeMenuEntries();
   void hearClicks() override;
   bool takesPress() const;
   void clicked();
@@ -157,6 +159,7 @@ class QtButton final : public QtControl<Button> {
   State heldState_ = State::off;  // for a button that is not checkable; it is not shown
   QMetaObject::Connection clicks_;
   std::unique_ptr<HeldAction> heldAction_;
+  std::unique_ptr<ActionStandIn> menuEntries_;  // of the button's action
   std::unique_ptr<PressGate> gate_;
 };
 
