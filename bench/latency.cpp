@@ -169,6 +169,23 @@ void requireSame(Guided& guided, ByHand& byHand) {
   std::exit(1);
 }
 
+/// Measures a step forth and one back.
+void measureSteps(const std::string& where, bool adopts) {
+  Guided guided(adopts);
+  ByHand byHand;
+  const bench::Contender engine = click("engine", guided), slot = click("slot", byHand);
+  for (const auto& contender : {engine, slot, engine, slot}) {
+    contender.prepare();
+    contender.run();
+    if (contender.name == "slot") requireSame(guided, byHand);
+  }
+  const auto t = bench::leastTimes({engine, slot, engine, slot}, 500);
+  for (const std::size_t i : {0U, 2U}) {
+    bench::printRow({(i == 0 ? "forth" : "back") + where, bench::shownTime(t[i]),
+                     bench::shownTime(t[i + 1]), bench::shownRatio(t[i] / t[i + 1])});
+  }
+}
+
 /// A form with tabs of group boxes, of four controls each.
 struct BigForm : QTabWidget {
   explicit BigForm(int controls) {
@@ -239,29 +256,10 @@ int main(int argc, char** argv) {
   if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
   qputenv("QT_SCALE_FACTOR", "1");  // the slot's images have only one resolution
   const QApplication application(argc, argv);
-  Guided guided(false);
-  Guided inAdopted(true);
-  ByHand byHand;
-  const qz::bench::Contender engine = click("engine", guided), slot = click("slot", byHand),
-                             adopted = click("adopted", inAdopted);
-  for (const auto& contender : {engine, adopted, slot, engine, adopted, slot}) {
-    contender.prepare();
-    contender.run();
-    if (contender.name != "slot") continue;
-    requireSame(guided, byHand);
-    requireSame(inAdopted, byHand);
-  }
-  // Forth and back, measured separately.
-  const auto t = qz::bench::leastTimes({engine, adopted, slot, engine, adopted, slot}, 500);
   qz::bench::printHead("From a click to the last changed widget repainted",
-                       {"step", "this engine", "in an adopted form", "a slot by hand",
-                        "this : by hand", "adopted : by hand"});
-  for (const std::size_t i : {0U, 3U}) {
-    qz::bench::printRow({i == 0 ? "forth" : "back", qz::bench::shownTime(t[i]),
-                         qz::bench::shownTime(t[i + 1]), qz::bench::shownTime(t[i + 2]),
-                         qz::bench::shownRatio(t[i] / t[i + 2]),
-                         qz::bench::shownRatio(t[i + 1] / t[i + 2])});
-  }
+                       {"step", "this engine", "a slot by hand", "this : by hand"});
+  measureSteps("", false);
+  measureSteps(" in an adopted form", true);
   printStays();
   return 0;
 }

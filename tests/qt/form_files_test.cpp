@@ -83,7 +83,7 @@ TEST(FormFiles, ArePlayedAndTestedOnEveryToolkit) {
                   "expect #5.text Sent\n");
   for (const char* const toolkit : {"memory", "qt"}) {
     const Result played = run(playCommand, {"play", "script.plist", "--window", "form.ui",
-                                                    "--toolkit", toolkit, "--press", "2"});
+                                            "--toolkit", toolkit, "--press", "2"});
     EXPECT_EQ(played.status, 0) << played.err;
     EXPECT_NE(played.out.find("Sent"), std::string::npos) << played.out;
     const Result tested = run(testCommand, {"test", "--toolkit", toolkit, "form.walk"});
@@ -97,9 +97,10 @@ TEST(FormFiles, ThatHoldNoFormAreRefused) {
   directory.write("other.ui", "<plist/>");
   directory.write("untagged.ui", "<ui version=\"4.0\"><widget class=\"QWidget\" name=\"w\"/></ui>");
   EXPECT_EQ(refusal("none.ui"), "none.ui: no such file; expected a form of Qt Designer's");
-  EXPECT_EQ(refusal("text.ui"),
-            "text.ui: An error has occurred while reading the UI file at line 1, column 1: Start tag "
-            "expected. (read as a form of Qt Designer's)");
+  EXPECT_EQ(
+      refusal("text.ui"),
+      "text.ui: An error has occurred while reading the UI file at line 1, column 1: Start tag "
+      "expected. (read as a form of Qt Designer's)");
   EXPECT_EQ(refusal("other.ui"),
             "other.ui: Invalid UI file: The root element <ui> is missing. (read as a form of Qt "
             "Designer's)");

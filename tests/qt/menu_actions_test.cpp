@@ -36,9 +36,7 @@ struct MenuActions : testing::Test {
   WalkThrough walkThrough{toolkit};
 
   MenuActions() {
-    toolkit.log().setSink([this](std::string_view line) {
-      presses += line.ends_with("pressed.");
-    });
+    toolkit.log().setSink([this](std::string_view line) { presses += line.ends_with("pressed."); });
     for (const auto& [action, tag] : {std::pair{&open, 70}, {&wrap, 71}, {&later, 72}}) {
       action->setProperty("qzTag", tag);
     }
@@ -325,8 +323,9 @@ TEST_F(MenuActions, AreInDescriptionsAndOutlines) {
 
 TEST_F(MenuActions, AreWhereTheirMenuBarIsForAGuide) {
   const hosts::qt::Guide guide(toolkit, form);
-  ASSERT_TRUE(play("{ 0 = ((SET_TEXT_FOR_OBJECT_ID, Open, 901),"
-                   "       (SET_TEXT_FOR_OBJECT_ID, 72, 905)); }"));
+  ASSERT_TRUE(
+      play("{ 0 = ((SET_TEXT_FOR_OBJECT_ID, Open, 901),"
+           "       (SET_TEXT_FOR_OBJECT_ID, 72, 905)); }"));
   EXPECT_EQ(guide.target(), form.menuBar());
 }
 

@@ -104,8 +104,8 @@ void ActionStandIn::follow() {
 }
 
 bool ActionStandIn::eventFilter(QObject*, QEvent* event) {
-  const bool isPress = event->type() == QEvent::Shortcut &&
-                       !static_cast<QShortcutEvent*>(event)->isAmbiguous();
+  const bool isPress =
+      event->type() == QEvent::Shortcut && !static_cast<QShortcutEvent*>(event)->isAmbiguous();
   if (isPress) triggered(action_->isCheckable() && !action_->isChecked());
   return isPress;
 }

@@ -135,12 +135,11 @@ void QtAction::send() {
 bool QtAction::sendAction(std::string_view action, const std::shared_ptr<Responder>& target) {
   if (!action_) return false;
   const QPointer<QWidget> around = place();
-  return sendAlongResponderChain(
-      action, target, Ref<View>(shared_from_this()),
-      {[](const Ref<View>&) { return Ref<View>(); },
-       [desk = desk_, around]() -> Ref<Window> {
-         return around ? desk->knownWindow(*around->window()) : nullptr;
-       }});
+  return sendAlongResponderChain(action, target, Ref<View>(shared_from_this()),
+                                 {[](const Ref<View>&) { return Ref<View>(); },
+                                  [desk = desk_, around]() -> Ref<Window> {
+                                    return around ? desk->knownWindow(*around->window()) : nullptr;
+                                  }});
 }
 
 void QtAction::setTitle(std::string_view title) {

@@ -110,6 +110,7 @@ void AdoptedForm::addTaggedInPanels(std::vector<QObject*>& found) const {
 // The pages of a stack come in their own order: Qt puts the current one behind the others in the
 // list of children.
 void AdoptedForm::addTagged(const QWidget& around, std::vector<QObject*>& found) const {
+  if (around.children().isEmpty()) return;  // as most widgets; casts take longer
   const auto* const stack = qobject_cast<const QStackedWidget*>(&around);
   const int pages = stack ? stack->count() : 0;
   for (int i = 0; i < pages; ++i) addTaggedFrom(*stack->widget(i), found);
@@ -122,7 +123,8 @@ void AdoptedForm::addTagged(const QWidget& around, std::vector<QObject*>& found)
 
 void AdoptedForm::addTaggedFrom(QWidget& widget, std::vector<QObject*>& found) const {
   if (hasTagProperty(widget) || givenTag(widget)) found.push_back(&widget);
-  if (const auto* const menu = qobject_cast<const QMenu*>(&widget)) addActionsOf(*menu, found);
+  const auto* const menu = widget.isWindow() ? qobject_cast<const QMenu*>(&widget) : nullptr;
+  if (menu) addActionsOf(*menu, found);
   addTagged(widget, found);
 }
 
@@ -160,7 +162,8 @@ std::string AdoptedForm::complaintAbout(const QObject& object) const {
   const bool isWhole = how_.reading == Adoption::Reading::everyTaggedWidget;
   return "No command can reach the tag " + std::to_string(tag) + " of the " +
          object.metaObject()->className() + " \"" + utf8(object.objectName()) + "\": " +
-         (isWhole ? "only widgets inside the window, and actions in its menus and tool bars, are controls"
+         (isWhole ? "only widgets inside the window, and actions in its menus and tool bars, are "
+                    "controls"
                   : "only the direct children of the window's content are controls");
 }
 
@@ -184,9 +187,12 @@ std::vector<std::string> AdoptedForm::unreachableTags() const {
   return complaints;
 }
 
-std::vector<Sighting> AdoptedForm::look(QWidget& widget, Notice notice) const {
+std::vector<Sighting> AdoptedForm::look(QWidget& widget, Aspect aspect, Notice notice) const {
   if (how_.restoring == Adoption::Restoring::tags) return {};
-  return sightingsAround(widget, notice == Notice::shown && isHeardByHosts(widget));
+  return sightingsAround({.widget = widget,
+                          .aspect = aspect,
+                          .bringsIntoView = how_.bringsIntoView && notice != Notice::none,
+                          .withReactions = notice == Notice::shown && isHeardByHosts(widget)});
 }
 
 std::vector<Sighting> AdoptedForm::look(QAction& action) const {

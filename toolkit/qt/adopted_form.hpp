@@ -47,12 +47,12 @@ class AdoptedForm final : public QObject {
   /// Returns all that a change of `widget` can change, as `changed` needs it; nothing if the
   /// adoption does not restore it. A change that is shown also changes what the host changes in
   /// return: it may enable a button when a text is no longer empty.
-  std::vector<Sighting> look(QWidget& widget, Notice notice) const;
+  std::vector<Sighting> look(QWidget& widget, Aspect aspect, Notice notice) const;
   /// The same for a change of an action.
   std::vector<Sighting> look(QAction& action) const;
-  /// Brings a changed control into view (null for an action), if the adoption says so. A flash does so only once for
-  /// each control, so that it does not drag back a user who has gone elsewhere. Remembers what has
-  /// changed since `before`.
+  /// Brings a changed control into view (null for an action), if the adoption says so. A flash does
+  /// so only once for each control, so that it does not drag back a user who has gone elsewhere.
+  /// Remembers what has changed since `before`.
   void changed(QWidget* widget, Notice notice, const std::vector<Sighting>& before);
   /// Restores what has been remembered, and from now on every change at once: a list may still
   /// run.

@@ -19,7 +19,9 @@ namespace {
 // 0 for an action.
 int depthOf(const QObject& object) {
   int depth = 0;
-  for (const auto* around = qobject_cast<const QWidget*>(&object); around; around = around->parentWidget()) ++depth;
+  for (const auto* around = qobject_cast<const QWidget*>(&object); around;
+       around = around->parentWidget())
+    ++depth;
   return depth;
 }
 
@@ -40,29 +42,42 @@ void look(QObject& object, const Facet& facet, std::vector<Sighting>& sightings)
   if (value.isValid()) sightings.push_back({&object, &facet, std::move(value)});
 }
 
-using Reach = Facet::Reach;
-
-void look(QWidget& widget, std::initializer_list<Reach> reaches, std::vector<Sighting>& sightings) {
+void look(QWidget& widget, std::initializer_list<Aspect> aspects,
+          std::vector<Sighting>& sightings) {
   for (const Facet& facet : facets()) {
-    const bool isMeant = std::find(reaches.begin(), reaches.end(), facet.reach) != reaches.end();
+    const bool isMeant = std::find(aspects.begin(), aspects.end(), facet.aspect) != aspects.end();
     if (isMeant) look(widget, facet, sightings);
   }
 }
 
-void lookAtReactionsIn(QWidget& window, std::vector<Sighting>& sightings) {
-  for (QWidget* const one : formAround(window)) look(*one, {Reach::form}, sightings);
+void lookAtReactionsIn(const QWidget& window, std::vector<Sighting>& sightings) {
+  for (QWidget* const one : formAround(window)) {
+    look(*one, {Aspect::hidden, Aspect::enabled}, sightings);
+  }
 }
 
 }  // namespace
 
-std::vector<Sighting> sightingsAround(QWidget& widget, bool withReactions) {
+// A command that hides or disables a widget moves the focus; one that hides a tab turns the page.
+// No facet may be sighted twice.
+std::vector<Sighting> sightingsAround(const WidgetChange& change) {
   std::vector<Sighting> sightings;
-  look(widget, {Reach::own}, sightings);
-  for (QWidget* const one : widgetsConcernedBy(widget)) {
-    look(*one, {Reach::around}, sightings);
-    if (!withReactions) look(*one, {Reach::form}, sightings);
+  const bool hides = change.aspect == Aspect::hidden;
+  if (!hides) look(change.widget, {change.aspect}, sightings);
+  QWidget* const first =
+      change.aspect == Aspect::contents ? firstOfChoiceWith(change.widget) : nullptr;
+  if (first) look(*first, {Aspect::choice}, sightings);
+  const auto around = widgetsAround(change.widget);
+  if (change.bringsIntoView || hides) {
+    for (QWidget* const one : around) {
+      look(*one, {Aspect::place}, sightings);
+      if (!change.withReactions) look(*one, {Aspect::hidden}, sightings);
+    }
   }
-  if (withReactions) lookAtReactionsIn(widget, sightings);
+  if (change.bringsIntoView || hides || change.aspect == Aspect::enabled) {
+    look(*around.back(), {Aspect::focus}, sightings);
+  }
+  if (change.withReactions) lookAtReactionsIn(change.widget, sightings);
   return sightings;
 }
 

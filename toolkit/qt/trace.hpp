@@ -20,9 +20,16 @@ struct Sighting {
   QVariant value;
 };
 
-/// Returns every facet that a change of `widget` can change; with what the host may change in
-/// return, in the whole window, if it is wanted.
-std::vector<Sighting> sightingsAround(QWidget& widget, bool withReactions);
+/// A change of a widget by a command.
+struct WidgetChange {
+  QWidget& widget;
+  Aspect aspect;
+  bool bringsIntoView;  ///< so that the widgets around it may change, too
+  bool withReactions;   ///< so that the host may change widgets of the window in return
+};
+
+/// Returns every facet that a change can change.
+std::vector<Sighting> sightingsAround(const WidgetChange& change);
 /// The same for an action of `window`.
 std::vector<Sighting> sightingsAround(QAction& action, QWidget& window, bool withReactions);
 

@@ -13,7 +13,7 @@ namespace qz::toolkit::qt {
 /// Lives while a view of an adopted window changes what it shows. Does nothing for other views.
 class ViewChange {
  public:
-  ViewChange(QWidget* widget, std::shared_ptr<AdoptedForm> form, Notice notice);
+  ViewChange(QWidget* widget, std::shared_ptr<AdoptedForm> form, Aspect aspect, Notice notice);
   ViewChange(QAction* action, std::shared_ptr<AdoptedForm> form);
   ~ViewChange();
   ViewChange(const ViewChange&) = delete;

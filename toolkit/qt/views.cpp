@@ -97,7 +97,7 @@ void QtButton::clicked() {
 }
 
 void QtButton::setTitle(std::string_view title) {
-  const auto noted = change(Notice::shown);
+  const auto noted = change(Aspect::contents, Notice::shown);
   if (button()) showTitle(*button(), title);
   changed();
 }
@@ -108,7 +108,7 @@ std::optional<AttributedString> QtButton::attributedTitle() const {
 }
 
 void QtButton::setAttributedTitle(const AttributedString& title) {
-  const auto noted = change(Notice::shown);
+  const auto noted = change(Aspect::contents, Notice::shown);
   if (button()) showTitle(*button(), title);
   changed();
 }
@@ -120,7 +120,7 @@ State QtButton::state() const {
 
 void QtButton::setState(State state) {
   if (!button()) return;
-  const auto noted = change(Notice::shown);
+  const auto noted = change(Aspect::contents, Notice::shown);
   if (button()->isCheckable()) {
     setCheckState(*button(), state);
   } else {
@@ -132,19 +132,19 @@ void QtButton::setState(State state) {
 bool QtButton::isHighlighted() const { return button() && qt::isHighlighted(*button()); }
 
 void QtButton::highlight(bool highlighted) {
-  const auto noted = change(highlighted ? Notice::flash : Notice::none);
+  const auto noted = change(Aspect::contents, highlighted ? Notice::flash : Notice::none);
   if (button()) qt::setHighlighted(*button(), highlighted);
   changed();
 }
 
 void QtButton::setBackgroundColor(const Color& color) {
-  const auto noted = change(Notice::shown);
+  const auto noted = change(Aspect::contents, Notice::shown);
   if (button()) setFaceColor(*button(), color);
   changed();
 }
 
+// Only for buttons that the engine makes, so nothing is restored.
 void QtButton::setBezelStyle(BezelStyle style) {
-  const auto noted = change(Notice::none);
   if (button()) setBezel(*button(), style);
   changed();
 }
@@ -158,12 +158,12 @@ void QtTextField::setValue(const AttributedString& value) { showText(*widget(), 
 // Asked each time, because a host may make a group box checkable later.
 void QtOtherView::setEnabled(bool enabled) {
   if (widget_ && !takesInput(*widget_)) return View::setEnabled(enabled);
-  const auto noted = change(Notice::none);
+  const auto noted = change(Aspect::enabled);
   enable(enabled);
 }
 
 void QtImageView::setImage(const Ref<Image>& image) {
-  const auto noted = change(Notice::shown);
+  const auto noted = change(Aspect::contents, Notice::shown);
   if (label()) showImage(*label(), image);
   changed();
 }

@@ -62,7 +62,7 @@ class QtView : public Role, public Node {
   std::string className() const final { return this->nameOfClass(); }
   Tag tag() const final { return this->readTag(); }
   void setTag(Tag tag) final {
-    const auto noted = this->change(Notice::none);
+    const auto noted = this->change(Aspect::tag);
     this->writeTag(tag);
   }
   Rect frame() const final { return this->readFrame(); }
@@ -71,21 +71,21 @@ class QtView : public Role, public Node {
   void addSubview(const Ref<View>& view) final { this->insert(view); }
   bool needsDisplay() const final { return this->isRedrawPending(); }
   void setHidden(bool hidden) final {
-    const auto noted = this->change(hidden ? Notice::none : Notice::shown);
+    const auto noted = this->change(Aspect::hidden, hidden ? Notice::none : Notice::shown);
     this->hide(hidden);
   }
 
   void setToolTip(std::string_view text) final {
-    const auto noted = this->change(Notice::none);
+    const auto noted = this->change(Aspect::contents);
     if (this->widget_) showToolTip(*this->widget_, text);
   }
   void setWantsLayer(bool wants) final {
-    const auto noted = this->change(Notice::none);
+    const auto noted = this->change(Aspect::layer);
     if (this->widget_) setLayered(*this->widget_, wants);
     this->changed();
   }
   void setLayerContents(const Ref<Image>& image) final {
-    const auto noted = this->change(Notice::none);
+    const auto noted = this->change(Aspect::layer);
     if (this->widget_) showLayerContents(*this->widget_, image);
     this->changed();
   }
@@ -100,7 +100,7 @@ class QtControl : public QtView<Role, ControlNode> {
   using QtView<Role, ControlNode>::QtView;
 
   void setEnabled(bool enabled) final {
-    const auto noted = this->change(Notice::none);
+    const auto noted = this->change(Aspect::enabled);
     this->enable(enabled);
   }
   void setTarget(const std::shared_ptr<Responder>& target) final {
@@ -121,7 +121,7 @@ class QtControl : public QtView<Role, ControlNode> {
   }
   void setAttributedStringValue(const AttributedString& text) final {
     if (!this->widget_) return;
-    const auto noted = this->change(Notice::shown);
+    const auto noted = this->change(Aspect::contents, Notice::shown);
     this->setValue(text);
     this->changed();
   }

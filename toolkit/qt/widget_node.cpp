@@ -148,7 +148,9 @@ void WidgetNode::joinForm(const std::shared_ptr<AdoptedForm>& form, Tag tag) {
   tag_.reset();
 }
 
-ViewChange WidgetNode::change(Notice notice) { return {widget_, form_.lock(), notice}; }
+ViewChange WidgetNode::change(Aspect aspect, Notice notice) {
+  return {widget_, form_.lock(), aspect, notice};
+}
 
 void WidgetNode::insert(const Ref<View>& view) {
   const auto node = of(view);

@@ -75,7 +75,7 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   bool isInForm() const { return !form_.expired(); }
   /// Brings the widget into view as a command that changes it does, if it is a control of an
   /// adopted window.
-  void comeIntoView() { const auto noted = change(Notice::shown); }
+  void comeIntoView() { const auto noted = change(Aspect::place, Notice::shown); }
 
  protected:
   virtual View& role() = 0;
@@ -100,7 +100,7 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   void changed();
   bool isRedrawPending() const { return widget_ && isRedrawPending_; }
   /// Surrounds a change of the widget by a command.
-  ViewChange change(Notice notice);
+  ViewChange change(Aspect aspect, Notice notice = Notice::none);
   QPointer<QWidget> widget_;
   std::shared_ptr<Desk> desk_;
 

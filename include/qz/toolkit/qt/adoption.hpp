@@ -42,8 +42,8 @@ struct QZ_API Adoption {
 };
 
 /// Presents a top-level widget of the host to a walk-through while it lives. An action that a tool
-/// bar shows is the control that shows it there; one that only menus show is a control itself. Writes a line to the log for each tag that no
-/// command can reach.
+/// bar shows is the control that shows it there; one that only menus show is a control itself.
+/// Writes a line to the log for each tag that no command can reach.
 class QZ_API AdoptedWindow {
  public:
   /// `toolkit` must outlive this object; `window` need not.
