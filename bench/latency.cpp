@@ -1,20 +1,29 @@
 // SPDX-License-Identifier: MIT
 // Measures the time from a click on a button of a real window until everything that it changes is
-// repainted, for a walk-through's list and for a host's slot that makes the same changes by hand.
+// repainted, for a walk-through's list and for a host's slot that makes the same changes by hand;
+// and how long a walk-through needs to begin and end in a form with many widgets.
 #include <QApplication>
 #include <QCheckBox>
+#include <QGroupBox>
 #include <QLabel>
+#include <QLineEdit>
 #include <QMouseEvent>
 #include <QPixmap>
 #include <QPushButton>
+#include <QTabWidget>
+#include <QTemporaryFile>
+#include <QVBoxLayout>
 #include <cstdio>
 #include <cstdlib>
 #include <memory>
+#include <optional>
 #include <utility>
 
 #include "bench/measuring.hpp"
 #include "qz/engine.hpp"
+#include "qz/hosts/qt/walk_through.hpp"
 #include "qz/property_list/reader.hpp"
+#include "qz/toolkit/qt/adoption.hpp"
 #include "qz/toolkit/qt/qt_toolkit.hpp"
 
 namespace qz {
@@ -75,9 +84,10 @@ constexpr auto script = R"({
   );
 })";
 
-/// The form with a walk-through on it.
+/// The form with a walk-through on it, which restores it at the end if the window is adopted.
 struct Guided : Form {
-  Guided() {
+  explicit Guided(bool adopts) {
+    if (adopts) adopted.emplace(toolkit, window);
     toolkit.log().setSink([](std::string_view) {});
     toolkit.files().setResourcePath(EXAMPLE_IMAGES);
     engine->getGuiAssetsFromWindow(shown);
@@ -88,6 +98,7 @@ struct Guided : Form {
   Guided& operator=(const Guided&) = delete;
 
   toolkit::qt::QtToolkit toolkit;
+  std::optional<toolkit::qt::AdoptedWindow> adopted;
   toolkit::Ref<toolkit::Window> shown = toolkit.application().window(window);
   std::shared_ptr<QZ_Plist_State_Parser> engine =
       QZ_Plist_State_Parser::initWithWindow(toolkit, shown);
@@ -158,6 +169,83 @@ void requireSame(Guided& guided, ByHand& byHand) {
   std::exit(1);
 }
 
+/// Measures a step forth and one back.
+void measureSteps(const std::string& where, bool adopts) {
+  Guided guided(adopts);
+  ByHand byHand;
+  const bench::Contender engine = click("engine", guided), slot = click("slot", byHand);
+  for (const auto& contender : {engine, slot, engine, slot}) {
+    contender.prepare();
+    contender.run();
+    if (contender.name == "slot") requireSame(guided, byHand);
+  }
+  const auto t = bench::leastTimes({engine, slot, engine, slot}, 500);
+  for (const std::size_t i : {0U, 2U}) {
+    bench::printRow({(i == 0 ? "forth" : "back") + where, bench::shownTime(t[i]),
+                     bench::shownTime(t[i + 1]), bench::shownRatio(t[i] / t[i + 1])});
+  }
+}
+
+/// A form with tabs of group boxes, of four controls each.
+struct BigForm : QTabWidget {
+  explicit BigForm(int controls) {
+    for (int first = 0; first < controls; first += 20) {
+      auto* const page = new QWidget;
+      auto* const column = new QVBoxLayout(page);
+      for (int box = 0; box < 5; ++box) column->addWidget(makeBox(first + 4 * box));
+      addTab(page, QString::number(first));
+    }
+    show();
+  }
+
+  static QGroupBox* makeBox(int first) {
+    auto* const box = new QGroupBox;
+    auto* const column = new QVBoxLayout(box);
+    int tag = first;
+    for (QWidget* const widget :
+         {static_cast<QWidget*>(new QPushButton("Press")), static_cast<QWidget*>(new QLineEdit),
+          static_cast<QWidget*>(new QLabel("Label")),
+          static_cast<QWidget*>(new QCheckBox("Check"))}) {
+      widget->setProperty("qzTag", ++tag);
+      column->addWidget(widget);
+    }
+    return box;
+  }
+};
+
+struct Stay {
+  double beginning;
+  double end;
+};
+
+/// Returns the shortest times that a walk-through needs to begin and to end in a form.
+Stay measureStay(int controls) {
+  QTemporaryFile file;
+  if (!file.open() || file.write("{ 0 = (IDLE_LOOP); }") < 0 || !file.flush()) std::exit(1);
+  toolkit::qt::QtToolkit toolkit;
+  toolkit.log().setSink([](std::string_view) {});
+  BigForm form(controls);
+  QCoreApplication::processEvents();
+  hosts::qt::WalkThrough walkThrough(toolkit);
+  const std::string path = file.fileName().toStdString();
+  const auto begin = [&] {
+    if (!walkThrough.play(path, form)) std::exit(1);
+  };
+  const auto end = [&] { walkThrough.end(); };
+  const auto times = bench::leastTimes({{"begin", begin, end}, {"end", end, begin}}, 20);
+  return {times[0], times[1]};
+}
+
+void printStays() {
+  bench::printHead("A walk-through in a form with many tagged widgets",
+                   {"tagged widgets", "beginning", "end"});
+  for (const int controls : {100, 1000, 10000}) {
+    const Stay stay = measureStay(controls);
+    bench::printRow(
+        {std::to_string(controls), bench::shownTime(stay.beginning), bench::shownTime(stay.end)});
+  }
+}
+
 }  // namespace
 
 }  // namespace qz
@@ -168,21 +256,10 @@ int main(int argc, char** argv) {
   if (qEnvironmentVariableIsEmpty("QT_QPA_PLATFORM")) qputenv("QT_QPA_PLATFORM", "offscreen");
   qputenv("QT_SCALE_FACTOR", "1");  // the slot's images have only one resolution
   const QApplication application(argc, argv);
-  Guided guided;
-  ByHand byHand;
-  const qz::bench::Contender engine = click("engine", guided), slot = click("slot", byHand);
-  for (const auto& contender : {engine, slot, engine, slot}) {
-    contender.prepare();
-    contender.run();
-    if (contender.name == "slot") requireSame(guided, byHand);
-  }
-  // Forth and back, measured separately.
-  const auto t = qz::bench::leastTimes({engine, slot, engine, slot}, 500);
   qz::bench::printHead("From a click to the last changed widget repainted",
                        {"step", "this engine", "a slot by hand", "this : by hand"});
-  for (const std::size_t i : {0U, 2U}) {
-    qz::bench::printRow({i == 0 ? "forth" : "back", qz::bench::shownTime(t[i]),
-                         qz::bench::shownTime(t[i + 1]), qz::bench::shownRatio(t[i] / t[i + 1])});
-  }
+  measureSteps("", false);
+  measureSteps(" in an adopted form", true);
+  printStays();
   return 0;
 }

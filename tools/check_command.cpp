@@ -252,8 +252,9 @@ int runCheck(const CommandOptions& options) {
 }
 
 void addWindowOptions(Command& command, CheckOptions& options) {
-  auto window = command.option("--window", options.stage.window,
-                               "The host's window, a property list of its controls");
+  auto window =
+      command.option("--window", options.stage.window,
+                     "The host's window, a property list of its controls or a form (.ui)");
   auto assets = command.option("--assets", options.stage.assets,
                                "A description from which the engine builds the window");
   window.valueName("HOST.plist").file().excludes(assets);

@@ -14,6 +14,7 @@
 #include "qz/property_list/xml_writer.hpp"
 #include "qz/toolkit/class_names.hpp"
 #include "toolkit/qt/accessibility.hpp"
+#include "toolkit/qt/action_view.hpp"
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/coordinates.hpp"
 #include "toolkit/qt/strings.hpp"
@@ -27,6 +28,7 @@ namespace {
 using toolkit::Number;
 using toolkit::String;
 using toolkit::ValueRef;
+using toolkit::qt::QtAction;
 using toolkit::qt::WidgetNode;
 namespace class_names = toolkit::class_names;
 
@@ -91,7 +93,26 @@ void addState(Description& description, const toolkit::View& view) {
   if (view.state() == toolkit::State::mixed) description.add("state", std::string("mixed"));
 }
 
+// An action has no place of its own, so it has that of the menu bar or button that leads to it.
+ValueRef<> actionDescription(const QtAction& action, const QWidget& content) {
+  Description description;
+  const std::string name(class_names::button);
+  const QWidget* const place = action.place();
+  description.add("class", action.action()->isCheckable() ? name + ":toggle" : name);
+  description.add("tag", Number::withLong(action.tag()));
+  description.add("frame", frameIn(content, place ? *place : content));
+  description.add("title", action.attributedTitle()->string());
+  addState(description, action);
+  if (!action.isHidden() && !action.isEnabled()) {
+    description.add("enabled", Number::withBool(false));
+  }
+  if (action.isHidden()) description.add("hidden", Number::withBool(true));
+  description.add("toolTip", toolkit::qt::utf8(action.action()->toolTip()));
+  return description.value();
+}
+
 ValueRef<> controlDescription(const toolkit::Ref<toolkit::View>& view, const QWidget& content) {
+  if (const auto action = QtAction::of(view)) return actionDescription(*action, content);
   const auto node = WidgetNode::of(view);
   const QWidget& widget = *node->widget();
   Description description;

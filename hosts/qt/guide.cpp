@@ -132,6 +132,7 @@ void Guide::Stage::moved() {
 void Guide::Stage::beginStep(const GuideMessage& message) {
   told_ = message;
   toldOf_ = target_;
+  panel_->scrollToBeginning();
   if (target_) bringControlIntoView(toolkit_, *target_);
   arrange(true);
   leadFocus(appear());

@@ -4,7 +4,10 @@
 #include "hosts/qt/guide_panel.hpp"
 
 #include <QApplication>
+#include <QKeyEvent>
 #include <QPainter>
+#include <QScrollBar>
+#include <QVBoxLayout>
 #include <algorithm>
 
 #include "hosts/qt/guide_spotlight.hpp"
@@ -42,6 +45,28 @@ QFont headingFont(QFont font) {
 
 QString GuideLabel::words() const {
   return toolkit::qt::qString(toolkit::qt::shownText(*this).string());
+}
+
+GuideScroll::GuideScroll(QLabel& label, QWidget* parent) : QScrollArea(parent), label_(label) {
+  setFrameShape(NoFrame);
+  setFocusPolicy(Qt::NoFocus);
+  setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+  setWidgetResizable(true);
+  new QVBoxLayout(viewport());  // otherwise a hidden label would not report its changes
+  setWidget(&label);
+  label.setAutoFillBackground(false);
+  viewport()->setAutoFillBackground(false);
+}
+
+bool GuideScroll::event(QEvent* event) {
+  if (event->type() == QEvent::LayoutRequest) updateGeometry();
+  return QScrollArea::event(event);
+}
+
+// Some lines, and the bar.
+QSize GuideScroll::minimumSizeHint() const {
+  const QSize all = label_.minimumSizeHint();
+  return {all.width(), std::min(all.height(), 3 * fontMetrics().lineSpacing())};
 }
 
 GuidePanel::GuidePanel(QWidget& form, const GuideOptions& options)
@@ -82,6 +107,7 @@ void GuidePanel::setUp(QWidget& widget, const char* name, toolkit::Tag tag) {
 
 void GuidePanel::layOut() {
   target.hide();
+  scroll.show();  // as the others
   picture.setProperty(toolkit::qt::imageViewProperty, true);
   picture.setMaximumSize(largestImage, largestImage);
   for (GuideLabel* const label : {&heading, &text}) {
@@ -93,7 +119,7 @@ void GuidePanel::layOut() {
   grid_.setVerticalSpacing(0);
   grid_.addWidget(&picture, 0, 0, 2, 1, Qt::AlignTop);
   grid_.addWidget(&heading, 0, 1);
-  grid_.addWidget(&text, 1, 1);
+  grid_.addWidget(&scroll, 1, 1);
   grid_.addLayout(&buttons_, 2, 0, 1, 2);
   grid_.setColumnStretch(1, 1);
   grid_.setRowStretch(1, 1);
@@ -132,6 +158,15 @@ void GuidePanel::fit(const QSize& bounds) {
     width = std::min(width * 3 / 2, bounds.width());
   }
   resize(width, std::min(grid_.totalHeightForWidth(width), bounds.height()));
+}
+
+void GuidePanel::scrollToBeginning() { scroll.verticalScrollBar()->setValue(0); }
+
+void GuidePanel::keyPressEvent(QKeyEvent* event) {
+  QScrollBar& bar = *scroll.verticalScrollBar();
+  if (event->key() == Qt::Key_PageDown) return bar.triggerAction(QScrollBar::SliderPageStepAdd);
+  if (event->key() == Qt::Key_PageUp) return bar.triggerAction(QScrollBar::SliderPageStepSub);
+  QDialog::keyPressEvent(event);
 }
 
 std::vector<QPushButton*> GuidePanel::stops() {

@@ -7,6 +7,7 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
+#include <QScrollArea>
 #include <functional>
 #include <vector>
 
@@ -37,6 +38,25 @@ class GuideLabel final : public QLabel {
   bool isEmpty() const { return text().isEmpty() && pixmap(Qt::ReturnByValue).isNull(); }
 };
 
+/// Scrolls a label up and down if it has less height than it needs.
+class GuideScroll final : public QScrollArea {
+ public:
+  GuideScroll(QLabel& label, QWidget* parent);
+  ~GuideScroll() override { takeWidget(); }  // which is not the area's to delete
+  Q_DISABLE_COPY_MOVE(GuideScroll)
+
+  QSize sizeHint() const override { return label_.sizeHint(); }
+  QSize minimumSizeHint() const override;
+  bool hasHeightForWidth() const override { return true; }
+  int heightForWidth(int width) const override { return label_.heightForWidth(width); }
+
+ protected:
+  bool event(QEvent* event) override;
+
+ private:
+  const QLabel& label_;
+};
+
 class GuidePanel final : public QDialog {
  public:
   /// The panel is a part of the form's window for commands.
@@ -50,14 +70,18 @@ class GuidePanel final : public QDialog {
   void clear();
   /// Hides the panel for ever. Commands no longer find its controls.
   void retire();
-  /// Gives the panel the size that its contents need, within `bounds`.
+  /// Gives the panel the size that its contents need, within `bounds`. A text that needs more room
+  /// can be scrolled.
   void fit(const QSize& bounds);
+  /// Shows the beginning of the text.
+  void scrollToBeginning();
   /// Gives the focus to the first or the last button that takes it, or else to the panel.
   void focus(bool first);
   bool hasFocusInside() const;
 
   GuideLabel heading{this};
   GuideLabel text{this};
+  GuideScroll scroll{text, this};
   GuideLabel picture{this};
   GuideLabel progress{this};
   QLineEdit target{this};
@@ -74,6 +98,8 @@ class GuidePanel final : public QDialog {
 
  protected:
   bool focusNextPrevChild(bool forward) override;
+  /// The keys Page Up and Page Down scroll the text.
+  void keyPressEvent(QKeyEvent* event) override;
   void paintEvent(QPaintEvent* event) override;
 
  private:

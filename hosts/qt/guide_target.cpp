@@ -6,6 +6,7 @@
 #include <QEvent>
 #include <QWidget>
 
+#include "toolkit/qt/action_view.hpp"
 #include "toolkit/qt/strings.hpp"
 #include "toolkit/qt/widget_node.hpp"
 
@@ -13,13 +14,20 @@ namespace qz::hosts::qt {
 
 namespace {
 
+// That of an action is the menu bar or the button whose menus have it.
+QWidget* widgetOf(const toolkit::Ref<toolkit::View>& view) {
+  if (const auto action = toolkit::qt::QtAction::of(view)) return action->place();
+  return toolkit::qt::WidgetNode::of(view)->widget();
+}
+
 QWidget* controlWithTag(toolkit::Tag tag, toolkit::qt::QtToolkit& toolkit, QWidget& form,
                         const QWidget& panel) {
   const auto window = toolkit.application().window(form);
   const auto content = window->contentView();
   for (const auto& view : content->subviews()) {
-    QWidget* const widget = toolkit::qt::WidgetNode::of(view)->widget();
-    if (view->tag() == tag && widget && !panel.isAncestorOf(widget)) return widget;
+    if (view->tag() != tag) continue;
+    QWidget* const widget = widgetOf(view);
+    if (widget && !panel.isAncestorOf(widget)) return widget;
   }
   return nullptr;
 }

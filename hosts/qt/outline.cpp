@@ -3,6 +3,7 @@
 
 #include <QWidget>
 
+#include "toolkit/qt/action_view.hpp"
 #include "toolkit/qt/widget_node.hpp"
 
 namespace qz::hosts::qt {
@@ -18,6 +19,12 @@ ControlOutline::Kind outlinedKind(toolkit::View& view) {
 
 // A control in a group that is disabled can still be enabled itself, which commands change.
 ControlOutline outlineOf(const toolkit::Ref<toolkit::View>& view) {
+  if (const auto action = toolkit::qt::QtAction::of(view)) {
+    return {.kind = ControlOutline::Kind::button,
+            .tag = action->tag(),
+            .isHidden = action->isHidden(),
+            .isEnabled = action->isEnabled()};
+  }
   const auto node = toolkit::qt::WidgetNode::of(view);
   const QWidget* const widget = node->widget();
   return {.kind = outlinedKind(*view),

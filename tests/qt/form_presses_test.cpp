@@ -281,7 +281,7 @@ TEST_F(FormPresses, OfATogglingActionReachItsHostOnlyOutsideTheWalkThrough) {
   EXPECT_FALSE(form->save->isChecked()) << "it follows its button";
   EXPECT_FALSE(form->saveButton().isChecked());
   form->save->trigger();
-  EXPECT_EQ(triggers, 2) << "the menu and the shortcut are the host's";
+  EXPECT_EQ(triggers, 2) << "what the host triggers is its own";
   walkThrough.end();
   EXPECT_EQ(static_cast<QToolButton&>(form->saveButton()).defaultAction(), form->save);
   form->saveButton().click();

@@ -220,6 +220,34 @@ TEST_F(GuideKeyboard, KeepsTheFormsShortcutsWhileThePanelIsActive) {
   EXPECT_TRUE(QTest::qWaitFor([this] { return panel().heading.text() == "Sent"; }));
 }
 
+// The script hides the button that the user has just pressed.
+TEST_F(GuideKeyboard, StaysInAPanelInsideTheWindowWhenItsButtonIsHidden) {
+  show({.insideWindow = true});
+  play(
+      "0 = ((SET_TEXT_FOR_OBJECT_ID, Press, 901), (SET_TEXT_FOR_OBJECT_ID, 3, 905));"
+      "2000 = ((HIDE_OBJECT_WITH_ID, 2000), (SET_TEXT_FOR_OBJECT_ID, Again, 901));"
+      "1000 = ((HIDE_OBJECT_WITH_ID, 1000), (HIDE_OBJECT_WITH_ID, 906));");
+  panel().next.setFocus();
+  panel().next.click();
+  settle();
+  EXPECT_EQ(form->focusWidget(), &remark) << "the control, because there is no Next";
+}
+
+TEST_F(GuideKeyboard, StaysInAPanelWithoutButtons) {
+  show({.insideWindow = true});
+  play(
+      "0 = ((SET_TEXT_FOR_OBJECT_ID, Press, 901));"
+      "2000 = ((HIDE_OBJECT_WITH_ID, 2000)); 906 = ((HIDE_OBJECT_WITH_ID, 906));"
+      "1000 = ((HIDE_OBJECT_WITH_ID, 1000));");
+  panel().next.setFocus();
+  panel().next.click();
+  EXPECT_EQ(form->focusWidget(), &panel().skip);
+  panel().skip.click();
+  EXPECT_EQ(form->focusWidget(), &panel().back);
+  panel().back.click();
+  EXPECT_EQ(form->focusWidget(), &panel());
+}
+
 }  // namespace
 
 }  // namespace qz

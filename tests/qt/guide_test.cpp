@@ -528,6 +528,34 @@ TEST_F(Guides, SurviveWhateverHappensAtAnyMoment) {
   }
 }
 
+TEST_F(Guides, ScrollsATextThatIsTooLongForTheScreen) {
+  show();
+  const QString text = QString("All of this must be readable. ").repeated(2000);
+  play(qPrintable("0 = ((SET_TEXT_FOR_OBJECT_ID, Long, 901), (SET_TEXT_FOR_OBJECT_ID, \"" + text +
+                  "\", 902)); 2000 = ((SET_TEXT_FOR_OBJECT_ID, \"" + text + "!\", 902));"));
+  EXPECT_TRUE(form->screen()->availableGeometry().contains(onScreen(panel())));
+  const auto isShown = [&](const QWidget& widget) {
+    return onScreen(panel()).contains(onScreen(widget));
+  };
+  for (const QWidget* const part :
+       {static_cast<const QWidget*>(&panel().heading), static_cast<const QWidget*>(&panel().scroll),
+        static_cast<const QWidget*>(&panel().next)}) {
+    EXPECT_TRUE(isShown(*part));
+  }
+  const QLabel& label = panel().text;
+  EXPECT_GE(label.height(), label.heightForWidth(label.width())) << "all of it can be scrolled to";
+  QScrollBar& bar = *panel().scroll.verticalScrollBar();
+  ASSERT_GT(bar.maximum(), 0);
+  QTest::keyClick(&panel().next, Qt::Key_PageDown);
+  EXPECT_GT(bar.value(), 0);
+  QTest::keyClick(&panel().next, Qt::Key_PageDown);
+  QTest::keyClick(&panel().next, Qt::Key_PageUp);
+  EXPECT_GT(bar.value(), 0);
+  panel().next.click();
+  settle();
+  EXPECT_EQ(bar.value(), 0) << "a new step begins at its beginning";
+}
+
 }  // namespace
 
 }  // namespace qz

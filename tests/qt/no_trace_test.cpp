@@ -1,6 +1,10 @@
 // SPDX-License-Identifier: MIT
 // A walk-through over a form leaves no trace, except for what the user has changed meanwhile.
 
+#include <QButtonGroup>
+#include <QCheckBox>
+#include <QDialog>
+#include <QPlainTextEdit>
 #include <QRadioButton>
 #include <QRandomGenerator>
 #include <QScrollBar>
@@ -295,6 +299,60 @@ TEST_F(NoTrace, IsLeftByManyWalkThroughsThatEndAtRandomMoments) {
     EXPECT_FALSE(form->inArea.signalsBlocked());
     EXPECT_FALSE(form->inArea.group());
   }
+}
+
+TEST_F(NoTrace, OfButtonsInAGroupInWhichSeveralCanBeOn) {
+  QDialog dialog;
+  QButtonGroup group;
+  group.setExclusive(false);
+  auto* const one = new QCheckBox("One", &dialog);
+  auto* const two = new QCheckBox("Two", &dialog);
+  for (QCheckBox* const box : {one, two}) group.addButton(box);
+  one->setProperty("qzTag", 1);
+  two->setProperty("qzTag", 2);
+  two->setChecked(true);
+  dialog.show();
+  ASSERT_TRUE(walkThrough.play(
+      QByteArray("{ 0 = ((SET_STATE_ON_FOR_OBJECT_ID, 1), (SET_STATE_OFF_FOR_OBJECT_ID, 2)); }"),
+      dialog));
+  EXPECT_TRUE(one->isChecked());
+  EXPECT_FALSE(two->isChecked());
+  walkThrough.end();
+  EXPECT_FALSE(one->isChecked());
+  EXPECT_TRUE(two->isChecked());
+}
+
+TEST_F(NoTrace, OfAChoiceThatNobodyHadMade) {
+  QDialog dialog;
+  QButtonGroup group;
+  for (const int tag : {1, 2}) {
+    auto* const radio = new QRadioButton("Radio", &dialog);
+    radio->setProperty("qzTag", tag);
+    group.addButton(radio);
+  }
+  dialog.show();
+  ASSERT_TRUE(walkThrough.play(QByteArray("{ 0 = ((SET_STATE_ON_FOR_OBJECT_ID, 2)); }"), dialog));
+  EXPECT_EQ(group.checkedButton(), group.buttons()[1]);
+  walkThrough.end();
+  EXPECT_EQ(group.checkedButton(), nullptr);
+  EXPECT_TRUE(group.exclusive());
+}
+
+TEST_F(NoTrace, OfAFocusThatTheHostSetsInReturnWhereThereWasNone) {
+  QDialog dialog;
+  auto* const check = new QCheckBox("Check", &dialog);
+  auto* const line = new QLineEdit(&dialog);
+  check->setProperty("qzTag", 1);
+  QObject::connect(check, &QCheckBox::toggled, line, [line] { line->setFocus(); });
+  dialog.show();
+  hosts::settle();
+  if (dialog.focusWidget()) dialog.focusWidget()->clearFocus();
+  ASSERT_EQ(dialog.focusWidget(), nullptr);
+  ASSERT_TRUE(walkThrough.play(QByteArray("{ 0 = ((SET_STATE_ON_FOR_OBJECT_ID, 1)); }"), dialog));
+  EXPECT_EQ(dialog.focusWidget(), line);
+  QObject::disconnect(check, nullptr, line, nullptr);
+  walkThrough.end();
+  EXPECT_EQ(dialog.focusWidget(), nullptr);
 }
 
 }  // namespace

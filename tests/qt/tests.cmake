@@ -11,8 +11,8 @@ set_tests_properties(qt:outliving PROPERTIES ENVIRONMENT ${qz_leaks})
 qz_scenario_tests(qt QT_QPA_PLATFORM=offscreen)
 
 # Needs forms and Qt's form loader, which scripts/foreign-forms installs.
-find_package(Qt6 6.4 QUIET OPTIONAL_COMPONENTS UiTools)
 if(TARGET Qt6::UiTools)
+  target_compile_definitions(qt-tests PRIVATE QZ_FORMS)
   add_executable(foreign-forms foreign_forms/form_script.cpp foreign_forms/form_trial.cpp
     foreign_forms/main.cpp)
   set_target_properties(foreign-forms PROPERTIES AUTOMOC ON)

@@ -1,8 +1,10 @@
 // SPDX-License-Identifier: MIT
 // Walk-throughs that begin and end at random moments, in every way in which they can end.
 
+#include <QComboBox>
 #include <QRandomGenerator>
 #include <QTemporaryDir>
+#include <QWizard>
 #include <fstream>
 
 #include "qz/hosts/qt/walk_through.hpp"
@@ -62,11 +64,11 @@ struct TourEnds : testing::Test {
 
   int below(int end) { return static_cast<int>(random.bounded(end)); }
 
-  QString list(int length) {
+  QString list(int length, int tags = lastTag) {
     QStringList items;
     for (int i = 0; i < length; ++i) {
       QString command = randomCommands[below(std::size(randomCommands))];
-      items += command.replace("%1", QString::number(1 + below(lastTag)));
+      items += command.replace("%1", QString::number(1 + below(tags)));
     }
     return "(" + items.join(", ") + ")";
   }
@@ -191,6 +193,69 @@ const struct {
      }},
 };
 
+/// A wizard with a control of each kind on two pages.
+struct AWizard : QWizard {
+  QPushButton& button = *new QPushButton("&Go");
+  QLineEdit& line = *new QLineEdit("line");
+  QComboBox& combo = *new QComboBox;
+  QCheckBox& check = *new QCheckBox("&Check");
+
+  AWizard() {
+    combo.setEditable(true);
+    combo.addItems({"one", "two"});
+    int tag = 0;
+    for (const auto& [first, second] : {std::pair<QWidget*, QWidget*>{&button, &line},
+                                        std::pair<QWidget*, QWidget*>{&combo, &check}}) {
+      auto* const page = new QWizardPage;
+      auto* const column = new QVBoxLayout(page);
+      for (QWidget* const widget : {first, second}) {
+        widget->setProperty("qzTag", ++tag);
+        column->addWidget(widget);
+      }
+      addPage(page);
+    }
+    resize(500, 400);
+  }
+
+  /// Returns everything, also where each widget is, while the first page is shown. But a wizard
+  /// sets its own least size whenever it likes.
+  Snapshot picture() {
+    show();
+    if (currentId() != 0) restart();
+    for (const auto& turn : {&QWizard::next, &QWizard::back}) {
+      (this->*turn)();  // a page is laid out when it is shown
+      for (int level = 0; level < 5; ++level) hosts::settle();
+    }
+    Snapshot picture = hosts::pictureOfAll(*this);
+    for (const char* const least : {".minimumHeight", ".minimumWidth", ".minimumSize"}) {
+      picture.erase(hosts::nameOf(*this) + least);
+    }
+    return picture;
+  }
+};
+
+const struct {
+  const char* name;
+  void (*end)(AWizard&, hosts::qt::WalkThrough&);
+} waysToEndWizards[] = {
+    {"rejected", [](AWizard& wizard, auto&) { wizard.reject(); }},
+    {"accepted", [](AWizard& wizard, auto&) { wizard.accept(); }},
+    {"closed", [](AWizard& wizard, auto&) { wizard.close(); }},
+    {"rejected in a press",
+     [](AWizard& wizard, auto&) {
+       QObject::connect(&wizard.button, &QAbstractButton::released, &wizard, &QDialog::reject,
+                        Qt::SingleShotConnection);
+       wizard.button.setEnabled(true);
+       wizard.button.click();
+       wizard.reject();
+     }},
+    {"ended on the second page",
+     [](AWizard& wizard, auto& walkThrough) {
+       wizard.next();
+       walkThrough.end();
+     }},
+};
+
 // QZ_TOURS=1000 takes some minutes under the address sanitizer.
 int tourCount() {
   const int wanted = qEnvironmentVariableIntValue("QZ_TOURS");
@@ -223,6 +288,28 @@ TEST_F(TourEnds, AtAnyMomentAreSafeAndRestoreTheForm) {
     if (testing::Test::HasFailure()) return;
     form.reset();
     hosts::settle();
+  }
+}
+
+TEST_F(TourEnds, OfWizardsRestoreTheirPagesWithEveryPlace) {
+  for (int tour = 0; tour < tourCount(); ++tour) {
+    const auto& way = waysToEndWizards[below(std::size(waysToEndWizards))];
+    const std::string name = "tour " + std::to_string(tour) + ", wizard " + way.name;
+    AWizard wizard;
+    hosts::qt::WalkThrough tours(toolkit);
+    wizard.show();
+    wizard.next();
+    const Snapshot untouched = wizard.picture();
+    const QString lists = QString("{ 0 = %1; 1 = %2; }").arg(list(6, 4), list(3, 4));
+    ASSERT_TRUE(tours.play(lists.toUtf8(), wizard)) << name;
+    for (int act = below(3); act > 0; --act) hosts::settle();
+    way.end(wizard, tours);
+    hosts::settle();
+    ASSERT_FALSE(tours.isRunning()) << name;
+    for (const QString& what : hosts::differences(untouched, wizard.picture())) {
+      ADD_FAILURE() << name << ": " << what.toStdString() << " " << lists.toStdString();
+    }
+    if (testing::Test::HasFailure()) return;
   }
 }
 

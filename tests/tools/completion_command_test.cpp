@@ -166,7 +166,8 @@ TEST(Completion, FishAndZshAreToldEveryCommandAndEveryOption) {
        {"completion) _arguments '--help[Print this help message and exit]' "
         "'*:argument:(bash zsh fish)' ;;",
         "'--resources=[The directory of the images]:value:_files -/'",
-        "'--window=[The host'\\''s window, a property list of its controls]:value:_files'"}) {
+        "'--window=[The host'\\''s window, a property list of its controls or a "
+        "form]:value:_files'"}) {
     EXPECT_NE(zsh.find(part), std::string::npos) << part;
   }
 }

@@ -5,6 +5,8 @@
 
 #include <utility>
 
+#include "toolkit/qt/action_view.hpp"
+
 namespace qz::toolkit::qt {
 
 AdoptedNode::AdoptedNode(QWidget& content, std::shared_ptr<Desk> desk,
@@ -25,8 +27,12 @@ const Subviews& AdoptedNode::readSubviews() {
 
 void AdoptedNode::adoptControls() {
   for (const auto& view : presented()) {
-    const auto node = of(view);
-    node->joinForm(form_, form_->givenTag(*node->widget()).value_or(0));
+    if (const auto action = QtAction::of(view)) {
+      action->joinForm(form_, form_->givenTag(*action->action()).value_or(0));
+    } else {
+      const auto node = of(view);
+      node->joinForm(form_, form_->givenTag(*node->widget()).value_or(0));
+    }
   }
 }
 

@@ -23,7 +23,7 @@ class AdoptedNode : public WidgetNode {
   void adoptControls();
 
   const std::shared_ptr<AdoptedForm> form_;
-  std::vector<QWidget*> found_;  // by the last search; kept for its memory
+  std::vector<QObject*> found_;  // by the last search; kept for its memory
 };
 
 class AdoptedContent final : public QtView<View, AdoptedNode> {

@@ -15,6 +15,7 @@
 #include <algorithm>
 #include <utility>
 
+#include "toolkit/qt/action_stand_in.hpp"
 #include "toolkit/qt/bring_into_view.hpp"
 #include "toolkit/qt/hiding.hpp"
 #include "toolkit/qt/strings.hpp"
@@ -31,15 +32,24 @@ bool hasTagProperty(const QObject& object) {
                      [](const QByteArray& name) { return name == tagProperty; });
 }
 
-bool showsOneOf(const QAction& action, const std::vector<QWidget*>& controls) {
-  return std::any_of(controls.begin(), controls.end(),
-                     [&](const QWidget* control) { return actionShownBy(*control) == &action; });
+bool isInToolBarOf(const QWidget& window, const QAction& action) {
+  const auto places = action.associatedObjects();
+  return std::any_of(places.begin(), places.end(), [&](const QObject* place) {
+    const auto* const bar = qobject_cast<const QToolBar*>(place);
+    return bar && window.isAncestorOf(bar);
+  });
 }
 
-bool isReached(const QObject& object, const std::vector<QWidget*>& controls) {
-  if (std::find(controls.begin(), controls.end(), &object) != controls.end()) return true;
+bool showsAction(const QObject& control, const QAction& action) {
+  const auto* const widget = qobject_cast<const QWidget*>(&control);
+  return widget && actionShownBy(*widget) == &action;
+}
+
+bool isReached(const QObject& object, const std::vector<QObject*>& controls) {
   const auto* const action = qobject_cast<const QAction*>(&object);
-  return action && showsOneOf(*action, controls);
+  return std::any_of(controls.begin(), controls.end(), [&](const QObject* control) {
+    return control == &object || (action && showsAction(*control, *action));
+  });
 }
 
 bool isPanel(const QWidget& widget) { return widget.property(panelProperty).toBool(); }
@@ -69,7 +79,7 @@ bool AdoptedForm::eventFilter(QObject*, QEvent* event) {
   const QSize now = window_->size();
   const bool isForced =
       before.isValid() && now != before && now == before.expandedTo(window_->minimumSize());
-  if (isForced) trace_.remember({window_, &sizeFacet(), before}, now);
+  if (isForced) trace_.remember({window_.data(), &sizeFacet(), before}, now);
   return false;
 }
 
@@ -80,7 +90,7 @@ QWidget* AdoptedForm::content() const {
   return central || !isWhole ? central : window_.data();
 }
 
-void AdoptedForm::list(std::vector<QWidget*>& found) const {
+void AdoptedForm::list(std::vector<QObject*>& found) const {
   const QWidget* const around = content();
   if (!around) return;
   if (how_.reading == Adoption::Reading::everyTaggedWidget) return addTagged(*window_, found);
@@ -90,7 +100,7 @@ void AdoptedForm::list(std::vector<QWidget*>& found) const {
   addTaggedInPanels(found);
 }
 
-void AdoptedForm::addTaggedInPanels(std::vector<QWidget*>& found) const {
+void AdoptedForm::addTaggedInPanels(std::vector<QObject*>& found) const {
   for (const QObject* const child : window_->children()) {
     const auto* const panel = child->isWidgetType() ? static_cast<const QWidget*>(child) : nullptr;
     if (panel && isPanel(*panel)) addTagged(*panel, found);
@@ -99,7 +109,8 @@ void AdoptedForm::addTaggedInPanels(std::vector<QWidget*>& found) const {
 
 // The pages of a stack come in their own order: Qt puts the current one behind the others in the
 // list of children.
-void AdoptedForm::addTagged(const QWidget& around, std::vector<QWidget*>& found) const {
+void AdoptedForm::addTagged(const QWidget& around, std::vector<QObject*>& found) const {
+  if (around.children().isEmpty()) return;  // as most widgets; casts take longer
   const auto* const stack = qobject_cast<const QStackedWidget*>(&around);
   const int pages = stack ? stack->count() : 0;
   for (int i = 0; i < pages; ++i) addTaggedFrom(*stack->widget(i), found);
@@ -110,9 +121,20 @@ void AdoptedForm::addTagged(const QWidget& around, std::vector<QWidget*>& found)
   }
 }
 
-void AdoptedForm::addTaggedFrom(QWidget& widget, std::vector<QWidget*>& found) const {
+void AdoptedForm::addTaggedFrom(QWidget& widget, std::vector<QObject*>& found) const {
   if (hasTagProperty(widget) || givenTag(widget)) found.push_back(&widget);
+  const auto* const menu = widget.isWindow() ? qobject_cast<const QMenu*>(&widget) : nullptr;
+  if (menu) addActionsOf(*menu, found);
   addTagged(widget, found);
+}
+
+void AdoptedForm::addActionsOf(const QMenu& menu, std::vector<QObject*>& found) const {
+  for (QAction* const shown : menu.actions()) {
+    QAction* const action = ActionStandIn::actionBehind(*shown);
+    if (!action || !isTagged(*action) || action->menu()) continue;
+    const bool isKnown = std::find(found.begin(), found.end(), action) != found.end();
+    if (!isKnown && !isInToolBarOf(*window_, *action)) found.push_back(action);
+  }
 }
 
 std::optional<Tag> AdoptedForm::namedTag(const QObject& object) const {
@@ -121,9 +143,10 @@ std::optional<Tag> AdoptedForm::namedTag(const QObject& object) const {
   return named == how_.tags.end() ? std::nullopt : std::optional(named->second);
 }
 
-std::optional<Tag> AdoptedForm::givenTag(const QWidget& widget) const {
-  if (const auto named = namedTag(widget)) return named;
-  const QAction* const action = actionShownBy(widget);
+std::optional<Tag> AdoptedForm::givenTag(const QObject& object) const {
+  if (const auto named = namedTag(object)) return named;
+  const auto* const widget = qobject_cast<const QWidget*>(&object);
+  const QAction* const action = widget ? actionShownBy(*widget) : nullptr;
   if (!action) return std::nullopt;
   if (hasTagProperty(*action)) return Tag{action->property(tagProperty).toLongLong()};
   return namedTag(*action);
@@ -139,13 +162,14 @@ std::string AdoptedForm::complaintAbout(const QObject& object) const {
   const bool isWhole = how_.reading == Adoption::Reading::everyTaggedWidget;
   return "No command can reach the tag " + std::to_string(tag) + " of the " +
          object.metaObject()->className() + " \"" + utf8(object.objectName()) + "\": " +
-         (isWhole ? "only widgets inside the window, and actions in its tool bars, are controls"
+         (isWhole ? "only widgets inside the window, and actions in its menus and tool bars, are "
+                    "controls"
                   : "only the direct children of the window's content are controls");
 }
 
 std::vector<std::string> AdoptedForm::unreachableTags() const {
   std::vector<std::string> complaints;
-  std::vector<QWidget*> controls;
+  std::vector<QObject*> controls;
   list(controls);
   QObjectList objects = window_->findChildren<QObject*>();
   objects.prepend(window_);
@@ -163,9 +187,17 @@ std::vector<std::string> AdoptedForm::unreachableTags() const {
   return complaints;
 }
 
-std::vector<Sighting> AdoptedForm::look(QWidget& widget, Notice notice) const {
+std::vector<Sighting> AdoptedForm::look(QWidget& widget, Aspect aspect, Notice notice) const {
   if (how_.restoring == Adoption::Restoring::tags) return {};
-  return sightingsAround(widget, notice == Notice::shown && isHeardByHosts(widget));
+  return sightingsAround({.widget = widget,
+                          .aspect = aspect,
+                          .bringsIntoView = how_.bringsIntoView && notice != Notice::none,
+                          .withReactions = notice == Notice::shown && isHeardByHosts(widget)});
+}
+
+std::vector<Sighting> AdoptedForm::look(QAction& action) const {
+  if (how_.restoring == Adoption::Restoring::tags || !window_) return {};
+  return sightingsAround(action, *window_, action.isCheckable());
 }
 
 void AdoptedForm::changed(QWidget* widget, Notice notice, const std::vector<Sighting>& before) {

@@ -14,6 +14,7 @@
 #include "toolkit/qt/trace.hpp"
 
 class QAction;
+class QMenu;
 
 namespace qz::toolkit::qt {
 
@@ -34,21 +35,24 @@ class AdoptedForm final : public QObject {
   /// Returns the widget that holds the window's controls; null if it is gone. The central widget of
   /// a main window that has one, otherwise the window.
   QWidget* content() const;
-  /// Adds the controls to `found`, in the order of the widget tree.
-  void list(std::vector<QWidget*>& found) const;
-  /// Returns the tag that a widget without the property `qzTag` has by its name or its action;
-  /// absent if it has none.
-  std::optional<Tag> givenTag(const QWidget& widget) const;
+  /// Adds the controls to `found`, widgets and actions, in the order of the widget tree. The
+  /// actions of a menu come behind it; an action that a tool bar shows is the button there.
+  void list(std::vector<QObject*>& found) const;
+  /// Returns the tag that a widget or an action without the property `qzTag` has by its name, or a
+  /// widget by its action; absent if it has none.
+  std::optional<Tag> givenTag(const QObject& object) const;
   /// Returns a sentence for each tag in the window that no command can reach.
   std::vector<std::string> unreachableTags() const;
 
   /// Returns all that a change of `widget` can change, as `changed` needs it; nothing if the
   /// adoption does not restore it. A change that is shown also changes what the host changes in
   /// return: it may enable a button when a text is no longer empty.
-  std::vector<Sighting> look(QWidget& widget, Notice notice) const;
-  /// Brings a changed control into view, if the adoption says so. A flash does so only once for
-  /// each control, so that it does not drag back a user who has gone elsewhere. Remembers what has
-  /// changed since `before`.
+  std::vector<Sighting> look(QWidget& widget, Aspect aspect, Notice notice) const;
+  /// The same for a change of an action.
+  std::vector<Sighting> look(QAction& action) const;
+  /// Brings a changed control into view (null for an action), if the adoption says so. A flash does
+  /// so only once for each control, so that it does not drag back a user who has gone elsewhere.
+  /// Remembers what has changed since `before`.
   void changed(QWidget* widget, Notice notice, const std::vector<Sighting>& before);
   /// Restores what has been remembered, and from now on every change at once: a list may still
   /// run.
@@ -56,9 +60,10 @@ class AdoptedForm final : public QObject {
 
  private:
   void attend(QWidget& widget, Notice notice);
-  void addTagged(const QWidget& around, std::vector<QWidget*>& found) const;
-  void addTaggedFrom(QWidget& widget, std::vector<QWidget*>& found) const;
-  void addTaggedInPanels(std::vector<QWidget*>& found) const;
+  void addTagged(const QWidget& around, std::vector<QObject*>& found) const;
+  void addTaggedFrom(QWidget& widget, std::vector<QObject*>& found) const;
+  void addTaggedInPanels(std::vector<QObject*>& found) const;
+  void addActionsOf(const QMenu& menu, std::vector<QObject*>& found) const;
   bool isTagged(const QObject& object) const;
   std::optional<Tag> namedTag(const QObject& object) const;
   std::string complaintAbout(const QObject& object) const;

@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <utility>
 
+#include "toolkit/qt/action_view.hpp"
 #include "toolkit/qt/views.hpp"
 #include "toolkit/qt/window.hpp"
 
@@ -17,6 +18,21 @@ Ref<View> Desk::viewOf(QWidget& widget) {
   const auto known = found == views_.end() ? nullptr : found->second.lock();
   if (known && known->widget() == &widget) return known->view();
   return makeView(widget, shared_from_this(), KeptBy::host)->view();
+}
+
+Ref<View> Desk::viewOf(QAction& action) {
+  auto& entry = actions_[&action];
+  auto known = entry.lock();
+  if (!known || known->action() != &action) {
+    known = std::make_shared<QtAction>(action, shared_from_this());
+    entry = known;
+  }
+  return Ref<View>(known);
+}
+
+Ref<View> Desk::viewOf(QObject& object) {
+  return object.isWidgetType() ? viewOf(static_cast<QWidget&>(object))
+                               : viewOf(static_cast<QAction&>(object));
 }
 
 std::shared_ptr<QtWindow> Desk::windowOf(QWidget& widget) {
@@ -49,6 +65,11 @@ void Desk::enter(const QWidget& widget, const std::shared_ptr<QtWindow>& window)
 void Desk::forgetView(const QWidget* key) {
   const auto found = views_.find(key);
   if (found != views_.end() && found->second.expired()) views_.erase(found);
+}
+
+void Desk::forgetAction(const QAction* key) {
+  const auto found = actions_.find(key);
+  if (found != actions_.end() && found->second.expired()) actions_.erase(found);
 }
 
 void Desk::forgetWindow(const QWidget* key) {

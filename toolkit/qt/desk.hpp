@@ -13,8 +13,11 @@
 #include "qz/toolkit/view.hpp"
 #include "qz/toolkit/window.hpp"
 
+class QAction;
+
 namespace qz::toolkit::qt {
 
+class QtAction;
 class QtWindow;
 class WidgetNode;
 
@@ -27,6 +30,8 @@ class Desk : public std::enable_shared_from_this<Desk> {
   /// Returns the view of `widget`; makes one if there is none. It stays the same while anybody
   /// holds it.
   Ref<View> viewOf(QWidget& widget);
+  /// The same for a widget or an action.
+  Ref<View> viewOf(QObject& object);
   /// Returns the window of a top-level widget; makes one if there is none. It stays the same while
   /// anybody holds it.
   std::shared_ptr<QtWindow> windowOf(QWidget& widget);
@@ -39,6 +44,7 @@ class Desk : public std::enable_shared_from_this<Desk> {
   /// Removes the key's entry if its view or window has ended.
   void forgetView(const QWidget* key);
   void forgetWindow(const QWidget* key);
+  void forgetAction(const QAction* key);
 
   /// Keeps a window alive while it is on the screen.
   void keep(const std::shared_ptr<QtWindow>& window);
@@ -50,7 +56,10 @@ class Desk : public std::enable_shared_from_this<Desk> {
   std::function<void(const Ref<View>&)> willAct;
 
  private:
+  Ref<View> viewOf(QAction& action);
+
   std::unordered_map<const QWidget*, std::weak_ptr<WidgetNode>> views_;
+  std::unordered_map<const QAction*, std::weak_ptr<QtAction>> actions_;
   std::unordered_map<const QWidget*, std::weak_ptr<QtWindow>> windows_;
   std::vector<std::shared_ptr<QtWindow>> kept_;
 };

@@ -173,14 +173,6 @@ void writeFace(QWidget& widget, const QVariant& value) {
   setFaceColor(*asQtButton(widget), value.value<std::optional<Color>>());
 }
 
-QVariant readBezel(QWidget& widget) {
-  const auto* const button = asQtButton(widget);
-  return button ? QVariant(static_cast<int>(bezelOf(*button))) : QVariant();
-}
-void writeBezel(QWidget& widget, const QVariant& value) {
-  setBezel(*asQtButton(widget), static_cast<BezelStyle>(value.toInt()));
-}
-
 QVariant readHighlight(QWidget& widget) {
   const auto* const button = asQtButton(widget);
   return button ? QVariant(isHighlighted(*button)) : QVariant();
@@ -472,34 +464,42 @@ void writeSubWindow(QWidget& widget, const QVariant& value) {
   if (window) static_cast<QMdiArea&>(widget).setActiveSubWindow(window);
 }
 
+template <auto read, auto write>
+constexpr Facet ofWidgets(Aspect aspect) {
+  return {
+      [](QObject& widget) { return read(static_cast<QWidget&>(widget)); },
+      [](QObject& widget, const QVariant& value) { write(static_cast<QWidget&>(widget), value); },
+      aspect};
+}
+
 }  // namespace
 
 std::span<const Facet> facets() {
   static constexpr Facet table[] = {
-      {readFocus, writeFocus},  // a widget that is hidden or disabled cannot take it
-      {readScroll, writeScroll},
-      {readSize, writeSize, Facet::Reach::layout},
-      {readTagProperty, writeTagProperty},
-      {readName, writeName},
-      {readDescription, writeDescription},
-      {readToolTip, writeToolTip},
-      {readHidden, writeHidden, Facet::Reach::form},
-      {readEnabled, writeEnabled, Facet::Reach::form},
-      {readLayer, writeLayer},
-      {readCheck, writeCheck},
-      {readChoice, writeChoice},
-      {readFace, writeFace},
-      {readBezel, writeBezel},
-      {readHighlight, writeHighlight},
-      {readTitle, writeTitle},
-      {readLabel, writeLabel},
-      {readLine, writeLine},
-      {readPage, writePage},
-      {readDress, writeDress},
-      {readPanes, writePanes},
-      {readPageShown, writePageShown},
-      {readFrontDock, writeFrontDock},
-      {readSubWindow, writeSubWindow},
+      ofWidgets<readFocus, writeFocus>(
+          Aspect::focus),  // a widget that is hidden or disabled cannot take it
+      ofWidgets<readScroll, writeScroll>(Aspect::place),
+      ofWidgets<readSize, writeSize>(Aspect::size),
+      ofWidgets<readTagProperty, writeTagProperty>(Aspect::tag),
+      ofWidgets<readName, writeName>(Aspect::contents),
+      ofWidgets<readDescription, writeDescription>(Aspect::contents),
+      ofWidgets<readToolTip, writeToolTip>(Aspect::contents),
+      ofWidgets<readHidden, writeHidden>(Aspect::hidden),
+      ofWidgets<readEnabled, writeEnabled>(Aspect::enabled),
+      ofWidgets<readLayer, writeLayer>(Aspect::layer),
+      ofWidgets<readCheck, writeCheck>(Aspect::contents),
+      ofWidgets<readChoice, writeChoice>(Aspect::choice),
+      ofWidgets<readFace, writeFace>(Aspect::contents),
+      ofWidgets<readHighlight, writeHighlight>(Aspect::contents),
+      ofWidgets<readTitle, writeTitle>(Aspect::contents),
+      ofWidgets<readLabel, writeLabel>(Aspect::contents),
+      ofWidgets<readLine, writeLine>(Aspect::contents),
+      ofWidgets<readPage, writePage>(Aspect::contents),
+      ofWidgets<readDress, writeDress>(Aspect::contents),
+      ofWidgets<readPanes, writePanes>(Aspect::place),
+      ofWidgets<readPageShown, writePageShown>(Aspect::place),
+      ofWidgets<readFrontDock, writeFrontDock>(Aspect::place),
+      ofWidgets<readSubWindow, writeSubWindow>(Aspect::place),
   };
   return table;
 }
@@ -507,7 +507,7 @@ std::span<const Facet> facets() {
 const Facet& sizeFacet() {
   const auto table = facets();
   return *std::find_if(table.begin(), table.end(),
-                       [](const Facet& facet) { return facet.reach == Facet::Reach::layout; });
+                       [](const Facet& facet) { return facet.aspect == Aspect::size; });
 }
 
 bool isHeardByHosts(const QWidget& widget) {
@@ -516,17 +516,18 @@ bool isHeardByHosts(const QWidget& widget) {
          (showsText(widget) && !qobject_cast<const QLabel*>(&widget));
 }
 
-std::vector<QWidget*> widgetsConcernedBy(QWidget& widget) {
-  std::vector<QWidget*> widgets;
-  QWidget* around = &widget;
-  for (; isPartOfForm(*around) && around->parentWidget(); around = around->parentWidget()) {
-    widgets.push_back(around);
+std::vector<QWidget*> widgetsAround(QWidget& widget) {
+  std::vector<QWidget*> widgets{&widget};
+  while (isPartOfForm(*widgets.back()) && widgets.back()->parentWidget()) {
+    widgets.push_back(widgets.back()->parentWidget());
   }
-  widgets.push_back(around);  // the window
+  return widgets;
+}
+
+QWidget* firstOfChoiceWith(QWidget& widget) {
   const auto* const button = asQtButton(widget);
   const auto choice = button ? choiceWith(*button) : QList<QAbstractButton*>();
-  if (!choice.isEmpty() && choice.front() != button) widgets.push_back(choice.front());
-  return widgets;
+  return choice.isEmpty() ? nullptr : choice.front();
 }
 
 }  // namespace qz::toolkit::qt

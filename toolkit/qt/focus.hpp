@@ -11,7 +11,7 @@ bool takesFocus(const QWidget& widget);
 
 /// Moves the keyboard focus away from `widget` and its descendants, which are about to be hidden or
 /// disabled, to the next widget in the window's tab order that accepts it. If there is none, clears
-/// the focus.
+/// the focus. In a panel of an adopted window it stays in the panel.
 void giveFocusAway(QWidget& widget);
 
 }  // namespace qz::toolkit::qt

@@ -11,6 +11,7 @@ elseif(QZ_QT)
   find_package(Qt6 6.4 REQUIRED COMPONENTS Widgets)
 endif()
 if(QZ_QT)
+  find_package(Qt6 6.4 QUIET OPTIONAL_COMPONENTS UiTools)  # the tools read forms with it
   list(APPEND QZ_TOOLKITS qt)
   set(QZ_TITLE_qt "windows of Qt 6 Widgets")
   set(QZ_PACKAGES_qt "Qt6 6.4 COMPONENTS Widgets")

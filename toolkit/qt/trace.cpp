@@ -3,18 +3,25 @@
 
 #include "toolkit/qt/trace.hpp"
 
+#include <QAction>
 #include <algorithm>
+#include <functional>
+#include <initializer_list>
 #include <utility>
 
+#include "toolkit/qt/action_facets.hpp"
 #include "toolkit/qt/adopted_form.hpp"
 
 namespace qz::toolkit::qt {
 
 namespace {
 
-int depthOf(const QWidget& widget) {
+// 0 for an action.
+int depthOf(const QObject& object) {
   int depth = 0;
-  for (const QWidget* around = &widget; around; around = around->parentWidget()) ++depth;
+  for (const auto* around = qobject_cast<const QWidget*>(&object); around;
+       around = around->parentWidget())
+    ++depth;
   return depth;
 }
 
@@ -30,32 +37,61 @@ std::vector<QWidget*> formAround(const QWidget& widget) {
   return {found.begin(), found.end()};
 }
 
-void look(QWidget& widget, const Facet& facet, std::vector<Sighting>& sightings) {
-  QVariant value = facet.read(widget);
-  if (value.isValid()) sightings.push_back({&widget, &facet, std::move(value)});
+void look(QObject& object, const Facet& facet, std::vector<Sighting>& sightings) {
+  QVariant value = facet.read(object);
+  if (value.isValid()) sightings.push_back({&object, &facet, std::move(value)});
+}
+
+void look(QWidget& widget, std::initializer_list<Aspect> aspects,
+          std::vector<Sighting>& sightings) {
+  for (const Facet& facet : facets()) {
+    const bool isMeant = std::find(aspects.begin(), aspects.end(), facet.aspect) != aspects.end();
+    if (isMeant) look(widget, facet, sightings);
+  }
+}
+
+void lookAtReactionsIn(const QWidget& window, std::vector<Sighting>& sightings) {
+  for (QWidget* const one : formAround(window)) {
+    look(*one, {Aspect::hidden, Aspect::enabled}, sightings);
+  }
 }
 
 }  // namespace
 
-std::vector<Sighting> sightingsAround(QWidget& widget, bool withReactions) {
+// A command that hides or disables a widget moves the focus; one that hides a tab turns the page.
+// No facet may be sighted twice.
+std::vector<Sighting> sightingsAround(const WidgetChange& change) {
   std::vector<Sighting> sightings;
-  const auto lookAt = [&](QWidget& one, Facet::Reach reach) {
-    for (const Facet& facet : facets()) {
-      if (facet.reach == reach) look(one, facet, sightings);
+  const bool hides = change.aspect == Aspect::hidden;
+  if (!hides) look(change.widget, {change.aspect}, sightings);
+  QWidget* const first =
+      change.aspect == Aspect::contents ? firstOfChoiceWith(change.widget) : nullptr;
+  if (first) look(*first, {Aspect::choice}, sightings);
+  const auto around = widgetsAround(change.widget);
+  if (change.bringsIntoView || hides) {
+    for (QWidget* const one : around) {
+      look(*one, {Aspect::place}, sightings);
+      if (!change.withReactions) look(*one, {Aspect::hidden}, sightings);
     }
-  };
-  const auto near = widgetsConcernedBy(widget);
-  for (QWidget* const one : near) lookAt(*one, Facet::Reach::near);
-  for (QWidget* const one : withReactions ? formAround(widget) : near) {
-    lookAt(*one, Facet::Reach::form);
   }
+  if (change.bringsIntoView || hides || change.aspect == Aspect::enabled) {
+    look(*around.back(), {Aspect::focus}, sightings);
+  }
+  if (change.withReactions) lookAtReactionsIn(change.widget, sightings);
+  return sightings;
+}
+
+std::vector<Sighting> sightingsAround(QAction& action, QWidget& window, bool withReactions) {
+  std::vector<Sighting> sightings;
+  for (const Facet& facet : actionFacets()) look(action, facet, sightings);
+  if (withReactions) lookAtReactionsIn(window, sightings);
   return sightings;
 }
 
 void Trace::note(const std::vector<Sighting>& before) {
   for (const Sighting& sighting : before) {
-    if (!sighting.widget) continue;
-    const QVariant now = sighting.facet->read(*sighting.widget);
+    if (!sighting.object) continue;
+    const QVariant now = sighting.facet->read(*sighting.object);
     if (now != sighting.value) remember(sighting, now);
   }
 }
@@ -63,10 +99,10 @@ void Trace::note(const std::vector<Sighting>& before) {
 // If somebody else has changed the facet since our last change, theirs is the one to restore.
 void Trace::remember(const Sighting& before, const QVariant& now) {
   const auto known = std::find_if(entries_.begin(), entries_.end(), [&](const Entry& entry) {
-    return entry.widget == before.widget && entry.facet == before.facet;
+    return entry.object == before.object && entry.facet == before.facet;
   });
   if (known == entries_.end()) {
-    entries_.push_back({before.widget, before.facet, before.value, now});
+    entries_.push_back({before.object, before.facet, before.value, now});
     return;
   }
   if (known->ours != before.value) known->original = before.value;
@@ -80,10 +116,11 @@ void Trace::undoNoted() {
   auto entries = std::exchange(entries_, {});
   std::erase_if(entries, [](const Entry& entry) { return !entry.isOurs(); });
   std::stable_sort(entries.begin(), entries.end(), [](const Entry& a, const Entry& b) {
-    return a.facet != b.facet ? a.facet > b.facet : depthOf(*a.widget) > depthOf(*b.widget);
+    if (a.facet != b.facet) return std::greater<>()(a.facet, b.facet);
+    return depthOf(*a.object) > depthOf(*b.object);
   });
   for (const Entry& entry : entries) {
-    if (entry.widget) entry.facet->write(*entry.widget, entry.original);
+    if (entry.object) entry.facet->write(*entry.object, entry.original);
   }
 }
 

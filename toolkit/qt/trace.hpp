@@ -9,18 +9,29 @@
 
 #include "toolkit/qt/facets.hpp"
 
+class QAction;
+
 namespace qz::toolkit::qt {
 
-/// A facet of a widget at some moment.
+/// A facet of a widget or an action at some moment.
 struct Sighting {
-  QPointer<QWidget> widget;
+  QPointer<QObject> object;
   const Facet* facet;
   QVariant value;
 };
 
-/// Returns every facet that a change of `widget` can change; with what the host may change in
-/// return, in the whole window, if it is wanted.
-std::vector<Sighting> sightingsAround(QWidget& widget, bool withReactions);
+/// A change of a widget by a command.
+struct WidgetChange {
+  QWidget& widget;
+  Aspect aspect;
+  bool bringsIntoView;  ///< so that the widgets around it may change, too
+  bool withReactions;   ///< so that the host may change widgets of the window in return
+};
+
+/// Returns every facet that a change can change.
+std::vector<Sighting> sightingsAround(const WidgetChange& change);
+/// The same for an action of `window`.
+std::vector<Sighting> sightingsAround(QAction& action, QWidget& window, bool withReactions);
 
 class Trace {
  public:
@@ -33,11 +44,11 @@ class Trace {
 
  private:
   struct Entry {
-    QPointer<QWidget> widget;
+    QPointer<QObject> object;
     const Facet* facet;
     QVariant original;
     QVariant ours;
-    bool isOurs() const { return widget && facet->read(*widget) == ours; }
+    bool isOurs() const { return object && facet->read(*object) == ours; }
   };
 
   void undoNoted();

@@ -7,9 +7,15 @@
 
 namespace qz::toolkit::qt {
 
-ViewChange::ViewChange(QWidget* widget, std::shared_ptr<AdoptedForm> form, Notice notice)
+ViewChange::ViewChange(QWidget* widget, std::shared_ptr<AdoptedForm> form, Aspect aspect,
+                       Notice notice)
     : widget_(widget), form_(std::move(form)), notice_(notice) {
-  if (form_ && widget) before_ = form_->look(*widget, notice);
+  if (form_ && widget) before_ = form_->look(*widget, aspect, notice);
+}
+
+ViewChange::ViewChange(QAction* action, std::shared_ptr<AdoptedForm> form)
+    : form_(std::move(form)), notice_(Notice::none) {
+  if (form_ && action) before_ = form_->look(*action);
 }
 
 ViewChange::~ViewChange() {

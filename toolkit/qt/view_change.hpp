@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Surrounds a change that a command makes to a widget.
+// Surrounds a change that a command makes to a widget or an action.
 #pragma once
 
 #include <QPointer>
@@ -10,16 +10,17 @@
 
 namespace qz::toolkit::qt {
 
-/// Lives while a view of an adopted window changes its widget. Does nothing for other views.
+/// Lives while a view of an adopted window changes what it shows. Does nothing for other views.
 class ViewChange {
  public:
-  ViewChange(QWidget* widget, std::shared_ptr<AdoptedForm> form, Notice notice);
+  ViewChange(QWidget* widget, std::shared_ptr<AdoptedForm> form, Aspect aspect, Notice notice);
+  ViewChange(QAction* action, std::shared_ptr<AdoptedForm> form);
   ~ViewChange();
   ViewChange(const ViewChange&) = delete;
   ViewChange& operator=(const ViewChange&) = delete;
 
  private:
-  const QPointer<QWidget> widget_;
+  const QPointer<QWidget> widget_;  // null for an action
   const std::shared_ptr<AdoptedForm> form_;
   const Notice notice_;
   std::vector<Sighting> before_;

@@ -5,12 +5,14 @@
 
 #include <QAction>
 #include <QCheckBox>
+#include <QMenu>
 #include <QToolButton>
 #include <QVariant>
 
 #include "toolkit/backend/responder_chain.hpp"
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/check_state.hpp"
+#include "toolkit/qt/hiding.hpp"
 #include "toolkit/qt/input_widgets.hpp"
 #include "toolkit/qt/text_look.hpp"
 #include "toolkit/qt/window.hpp"
@@ -24,8 +26,6 @@ bool isImageView(const QWidget& widget) {
   return label && (widget.property(imageViewProperty).toBool() ||
                    !label->pixmap(Qt::ReturnByValue).isNull());
 }
-
-bool isMarkedForBoth(const QObject& object) { return object.property(pressProperty) == "both"; }
 
 // True if a press of the button goes to the host as well as to the target.
 bool servesBoth(const QAbstractButton& button) {
@@ -64,9 +64,21 @@ QtButton::~QtButton() { QObject::disconnect(clicks_); }
 
 void QtButton::takeClicks() {
   if (!button() || gate_) return;
-  if (!servesBoth(*button())) heldAction_ = std::make_unique<HeldAction>(*button());
+  if (!servesBoth(*button())) {
+    takeMenuEntries();
+    heldAction_ = std::make_unique<HeldAction>(*button());
+  }
   gate_ = std::make_unique<PressGate>(
       *button(), [this] { return takesPress(); }, [this] { clicked(); });
+}
+
+// In a form the menus that show the button's action, and its shortcut, press the button.
+void QtButton::takeMenuEntries() {
+  QAction* const action = isInForm() ? actionShownBy(*button()) : nullptr;
+  if (!action || action->menu()) return;
+  menuEntries_ = std::make_unique<ActionStandIn>(*action, [this](bool) {
+    if (button()) button()->click();
+  });
 }
 
 // Asked at each press: the host may mark the button at any time, and the target may be gone.
@@ -85,7 +97,7 @@ void QtButton::clicked() {
 }
 
 void QtButton::setTitle(std::string_view title) {
-  const auto noted = change(Notice::shown);
+  const auto noted = change(Aspect::contents, Notice::shown);
   if (button()) showTitle(*button(), title);
   changed();
 }
@@ -96,7 +108,7 @@ std::optional<AttributedString> QtButton::attributedTitle() const {
 }
 
 void QtButton::setAttributedTitle(const AttributedString& title) {
-  const auto noted = change(Notice::shown);
+  const auto noted = change(Aspect::contents, Notice::shown);
   if (button()) showTitle(*button(), title);
   changed();
 }
@@ -108,7 +120,7 @@ State QtButton::state() const {
 
 void QtButton::setState(State state) {
   if (!button()) return;
-  const auto noted = change(Notice::shown);
+  const auto noted = change(Aspect::contents, Notice::shown);
   if (button()->isCheckable()) {
     setCheckState(*button(), state);
   } else {
@@ -120,19 +132,19 @@ void QtButton::setState(State state) {
 bool QtButton::isHighlighted() const { return button() && qt::isHighlighted(*button()); }
 
 void QtButton::highlight(bool highlighted) {
-  const auto noted = change(highlighted ? Notice::flash : Notice::none);
+  const auto noted = change(Aspect::contents, highlighted ? Notice::flash : Notice::none);
   if (button()) qt::setHighlighted(*button(), highlighted);
   changed();
 }
 
 void QtButton::setBackgroundColor(const Color& color) {
-  const auto noted = change(Notice::shown);
+  const auto noted = change(Aspect::contents, Notice::shown);
   if (button()) setFaceColor(*button(), color);
   changed();
 }
 
+// Only for buttons that the engine makes, so nothing is restored.
 void QtButton::setBezelStyle(BezelStyle style) {
-  const auto noted = change(Notice::none);
   if (button()) setBezel(*button(), style);
   changed();
 }
@@ -146,12 +158,12 @@ void QtTextField::setValue(const AttributedString& value) { showText(*widget(), 
 // Asked each time, because a host may make a group box checkable later.
 void QtOtherView::setEnabled(bool enabled) {
   if (widget_ && !takesInput(*widget_)) return View::setEnabled(enabled);
-  const auto noted = change(Notice::none);
+  const auto noted = change(Aspect::enabled);
   enable(enabled);
 }
 
 void QtImageView::setImage(const Ref<Image>& image) {
-  const auto noted = change(Notice::shown);
+  const auto noted = change(Aspect::contents, Notice::shown);
   if (label()) showImage(*label(), image);
   changed();
 }

@@ -15,6 +15,7 @@
 
 #include "qz/toolkit/view.hpp"
 #include "toolkit/qt/accessibility.hpp"
+#include "toolkit/qt/action_stand_in.hpp"
 #include "toolkit/qt/held_action.hpp"
 #include "toolkit/qt/image_look.hpp"
 #include "toolkit/qt/press_gate.hpp"
@@ -61,7 +62,7 @@ class QtView : public Role, public Node {
   std::string className() const final { return this->nameOfClass(); }
   Tag tag() const final { return this->readTag(); }
   void setTag(Tag tag) final {
-    const auto noted = this->change(Notice::none);
+    const auto noted = this->change(Aspect::tag);
     this->writeTag(tag);
   }
   Rect frame() const final { return this->readFrame(); }
@@ -70,21 +71,21 @@ class QtView : public Role, public Node {
   void addSubview(const Ref<View>& view) final { this->insert(view); }
   bool needsDisplay() const final { return this->isRedrawPending(); }
   void setHidden(bool hidden) final {
-    const auto noted = this->change(hidden ? Notice::none : Notice::shown);
+    const auto noted = this->change(Aspect::hidden, hidden ? Notice::none : Notice::shown);
     this->hide(hidden);
   }
 
   void setToolTip(std::string_view text) final {
-    const auto noted = this->change(Notice::none);
+    const auto noted = this->change(Aspect::contents);
     if (this->widget_) showToolTip(*this->widget_, text);
   }
   void setWantsLayer(bool wants) final {
-    const auto noted = this->change(Notice::none);
+    const auto noted = this->change(Aspect::layer);
     if (this->widget_) setLayered(*this->widget_, wants);
     this->changed();
   }
   void setLayerContents(const Ref<Image>& image) final {
-    const auto noted = this->change(Notice::none);
+    const auto noted = this->change(Aspect::layer);
     if (this->widget_) showLayerContents(*this->widget_, image);
     this->changed();
   }
@@ -99,7 +100,7 @@ class QtControl : public QtView<Role, ControlNode> {
   using QtView<Role, ControlNode>::QtView;
 
   void setEnabled(bool enabled) final {
-    const auto noted = this->change(Notice::none);
+    const auto noted = this->change(Aspect::enabled);
     this->enable(enabled);
   }
   void setTarget(const std::shared_ptr<Responder>& target) final {
@@ -120,7 +121,7 @@ class QtControl : public QtView<Role, ControlNode> {
   }
   void setAttributedStringValue(const AttributedString& text) final {
     if (!this->widget_) return;
-    const auto noted = this->change(Notice::shown);
+    const auto noted = this->change(Aspect::contents, Notice::shown);
     this->setValue(text);
     this->changed();
   }
@@ -150,6 +151,7 @@ class QtButton final : public QtControl<Button> {
  private:
   QAbstractButton* button() const { return static_cast<QAbstractButton*>(widget()); }
   void takeClicks() override;
+  void takeMenuEntries();
   void hearClicks() override;
   bool takesPress() const;
   void clicked();
@@ -157,6 +159,7 @@ class QtButton final : public QtControl<Button> {
   State heldState_ = State::off;  // for a button that is not checkable; it is not shown
   QMetaObject::Connection clicks_;
   std::unique_ptr<HeldAction> heldAction_;
+  std::unique_ptr<ActionStandIn> menuEntries_;  // of the button's action
   std::unique_ptr<PressGate> gate_;
 };
 

@@ -19,7 +19,7 @@ namespace qz::toolkit::qt {
 namespace {
 
 /// True if `widgets` are exactly the subviews of `parent`, in their order.
-bool areSubviewsOf(const QWidget& parent, const std::vector<QPointer<QWidget>>& widgets) {
+bool areSubviewsOf(const QWidget& parent, const std::vector<QPointer<QObject>>& widgets) {
   auto next = widgets.begin();
   for (const QObject* const child : parent.children()) {
     if (!isSubview(child)) continue;
@@ -119,27 +119,27 @@ void WidgetNode::place(const Rect& frame) {
 
 const Subviews& WidgetNode::readSubviews() {
   if (widget_ && areSubviewsOf(*widget_, listed_)) return subviews_;
-  std::vector<QWidget*> children;
+  std::vector<QObject*> children;
   if (widget_) {
     for (QObject* const child : widget_->children()) {
-      if (isSubview(child)) children.push_back(static_cast<QWidget*>(child));
+      if (isSubview(child)) children.push_back(child);
     }
   }
   present(children);
   return subviews_;
 }
 
-void WidgetNode::present(const std::vector<QWidget*>& widgets) {
+void WidgetNode::present(const std::vector<QObject*>& objects) {
   Subviews fresh;
-  for (QWidget* const widget : widgets) fresh.push_back(desk_->viewOf(*widget));
-  listed_.assign(widgets.begin(), widgets.end());
+  for (QObject* const object : objects) fresh.push_back(desk_->viewOf(*object));
+  listed_.assign(objects.begin(), objects.end());
   subviews_.swap(fresh);
 }
 
-bool WidgetNode::presents(const std::vector<QWidget*>& widgets) const {
+bool WidgetNode::presents(const std::vector<QObject*>& objects) const {
   return std::equal(
-      widgets.begin(), widgets.end(), listed_.begin(), listed_.end(),
-      [](QWidget* widget, const QPointer<QWidget>& listed) { return widget == listed.data(); });
+      objects.begin(), objects.end(), listed_.begin(), listed_.end(),
+      [](QObject* object, const QPointer<QObject>& listed) { return object == listed.data(); });
 }
 
 void WidgetNode::joinForm(const std::shared_ptr<AdoptedForm>& form, Tag tag) {
@@ -148,7 +148,9 @@ void WidgetNode::joinForm(const std::shared_ptr<AdoptedForm>& form, Tag tag) {
   tag_.reset();
 }
 
-ViewChange WidgetNode::change(Notice notice) { return {widget_, form_.lock(), notice}; }
+ViewChange WidgetNode::change(Aspect aspect, Notice notice) {
+  return {widget_, form_.lock(), aspect, notice};
+}
 
 void WidgetNode::insert(const Ref<View>& view) {
   const auto node = of(view);

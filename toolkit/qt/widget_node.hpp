@@ -28,10 +28,15 @@ inline constexpr const char* tagProperty = "qzTag";
 /// no pixmap.
 inline constexpr const char* imageViewProperty = "qzImageView";
 
-/// The dynamic property of a button, or of a tool button's action, that leads its presses both to
+/// The dynamic property of a button or an action that leads its presses both to
 /// the host and to the button's target if it is "both". Otherwise a press goes to the target, if
 /// there is one.
 inline constexpr const char* pressProperty = "qzPress";
+
+/// True if the presses of an object with the property are for both.
+inline bool isMarkedForBoth(const QObject& object) {
+  return object.property(pressProperty) == "both";
+}
 
 /// The dynamic property that makes a child of a window a part of the adopted window if it is true,
 /// even if the child is a window too: its widgets with tags are controls.
@@ -67,9 +72,10 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   /// Makes the view a control of an adopted window while `form` lives. `tag` is the tag of a widget
   /// that has no tag of its own.
   void joinForm(const std::shared_ptr<AdoptedForm>& form, Tag tag);
+  bool isInForm() const { return !form_.expired(); }
   /// Brings the widget into view as a command that changes it does, if it is a control of an
   /// adopted window.
-  void comeIntoView() { const auto noted = change(Notice::shown); }
+  void comeIntoView() { const auto noted = change(Aspect::place, Notice::shown); }
 
  protected:
   virtual View& role() = 0;
@@ -80,10 +86,10 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   Rect readFrame() const;
   /// Returns the subviews: the child widgets, unless a subclass presents others.
   virtual const Subviews& readSubviews();
-  /// Makes the views of `widgets` the subviews.
-  void present(const std::vector<QWidget*>& widgets);
-  /// True if the subviews are those of `widgets`.
-  bool presents(const std::vector<QWidget*>& widgets) const;
+  /// Makes the views of `objects`, widgets and actions, the subviews.
+  void present(const std::vector<QObject*>& objects);
+  /// True if the subviews are those of `objects`.
+  bool presents(const std::vector<QObject*>& objects) const;
   const Subviews& presented() const { return subviews_; }
   /// As `View::addSubview`. Raises an invalid-argument exception, and changes nothing, if `view` is
   /// absent, another toolkit's, a window's content view, this view or one of its superviews.
@@ -94,7 +100,7 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   void changed();
   bool isRedrawPending() const { return widget_ && isRedrawPending_; }
   /// Surrounds a change of the widget by a command.
-  ViewChange change(Notice notice);
+  ViewChange change(Aspect aspect, Notice notice = Notice::none);
   QPointer<QWidget> widget_;
   std::shared_ptr<Desk> desk_;
 
@@ -117,7 +123,7 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   bool hiddenOutside_ = false;       // applies when it is inserted again
   std::optional<Placement> placement_;
   Subviews subviews_;
-  std::vector<QPointer<QWidget>> listed_;  // the widgets of `subviews_`; null once they are gone
+  std::vector<QPointer<QObject>> listed_;  // what `subviews_` show; null once it is gone
   mutable std::optional<Tag> tag_;         // cached, because every search reads all tags
   bool isRedrawPending_ = false;
   std::unique_ptr<Watch> watch_;

@@ -69,7 +69,7 @@ Outcome window(Stage& stage, const Arguments& a) {
 
 Outcome host(Stage& stage, const Arguments& a) try {
   const auto path = std::filesystem::absolute(stage.file).replace_filename(a.text("PATH")).string();
-  const auto described = walkthrough::parseHostWindow(InputFile(path, "a host's window"));
+  const auto described = walkthrough::readHostWindow(path);
   const auto made = walkthrough::makeHostWindow(stage.driver, described, path);
   stage.cast.nameWindow(a.text("+W"), toolkit::StoredRef<toolkit::Window>::own(made));
   return {};

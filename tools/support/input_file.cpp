@@ -20,16 +20,6 @@ namespace {
   throw Failure(ExitStatus::badInput, message);
 }
 
-std::string contentsOf(const std::string& path, const std::string& what) {
-  if (path.empty()) cannotRead("empty path; expected the path of " + what);
-  std::error_code error;
-  const auto status = std::filesystem::status(path, error);
-  if (!exists(status)) cannotRead(path + ": no such file; expected " + what);
-  if (is_directory(status)) cannotRead(path + ": a directory; expected " + what);
-  if (auto contents = wholeFile(path)) return *std::move(contents);
-  cannotRead(path + ": cannot be read (" + std::strerror(errno) + "); expected " + what);
-}
-
 std::string placeIn(const std::string& path, const std::optional<toolkit::Position>& position) {
   if (!position) return path;
   if (const auto* text = std::get_if<toolkit::TextPosition>(&*position)) {
@@ -40,10 +30,20 @@ std::string placeIn(const std::string& path, const std::optional<toolkit::Positi
 
 }  // namespace
 
+std::string requireContents(const std::string& path, const std::string& what) {
+  if (path.empty()) cannotRead("empty path; expected the path of " + what);
+  std::error_code error;
+  const auto status = std::filesystem::status(path, error);
+  if (!exists(status)) cannotRead(path + ": no such file; expected " + what);
+  if (is_directory(status)) cannotRead(path + ": a directory; expected " + what);
+  if (auto contents = wholeFile(path)) return *std::move(contents);
+  cannotRead(path + ": cannot be read (" + std::strerror(errno) + "); expected " + what);
+}
+
 InputFile::InputFile(std::string path, std::string_view what, ExitStatus refusal)
     : path_(std::move(path)), what_(what), refusal_(refusal) {
   try {
-    read();
+    read(requireContents(path_, what_));
   } catch (const std::bad_alloc&) {
     throw Failure(refusal_, path_ + ": needs more memory than there is; expected " + what_);
   }
@@ -57,8 +57,12 @@ InputFile::InputFile(std::string path, std::string_view what, toolkit::ValueRef<
       root_(std::move(root)),
       positions_(std::move(offsets), text) {}
 
-void InputFile::read() {
-  const std::string contents = contentsOf(path_, what_);
+InputFile::InputFile(std::string path, std::string_view what, std::string_view contents)
+    : path_(std::move(path)), what_(what), refusal_(ExitStatus::badInput) {
+  read(contents);
+}
+
+void InputFile::read(std::string_view contents) {
   if (contents.empty()) throw Failure(refusal_, path_ + ": an empty file; expected " + what_);
   const auto result = toolkit::readPropertyList(contents, &positions_);
   if (const auto& refused = result.refusal) {

@@ -18,6 +18,8 @@ class InputFile {
   /// Reads the property list at `path`, in any of the formats. `what` names what the file should
   /// hold, such as "a script"; `refusal` is the Failure's status if it holds something else.
   InputFile(std::string path, std::string_view what, ExitStatus refusal = ExitStatus::badInput);
+  /// Reads the contents that the file at `path` has, or that have been made from it.
+  InputFile(std::string path, std::string_view what, std::string_view contents);
 
   /// Takes a property list that was made of a text: of `text`, at `offsets`.
   InputFile(std::string path, std::string_view what, toolkit::ValueRef<> root,
@@ -39,7 +41,7 @@ class InputFile {
   [[noreturn]] void fail(const toolkit::ValueRef<>& value, const std::string& message) const;
 
  private:
-  void read();
+  void read(std::string_view contents);
 
   std::string path_;
   std::string what_;
@@ -47,6 +49,10 @@ class InputFile {
   toolkit::ValueRef<> root_;
   toolkit::PositionTable positions_;
 };
+
+/// Returns the contents of the file at `path`. Throws a Failure if it cannot be read; `what` names
+/// what it should hold.
+std::string requireContents(const std::string& path, const std::string& what);
 
 /// Says what was found, for a message: `the string “abc”` or "an array of 3", for example;
 /// "nothing" if the value is absent.

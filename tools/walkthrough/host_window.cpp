@@ -9,10 +9,13 @@
 #include "tools/support/failure.hpp"
 #include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
+#include "tools/walkthrough/form_file.hpp"
 #include "tools/walkthrough/plist_entry.hpp"
 
 namespace qz::tools::walkthrough {
 namespace {
+
+constexpr auto windowWords = "a host's window";
 
 using drivers::Caption;
 using toolkit::State;
@@ -121,6 +124,14 @@ HostWindow parseHostWindow(const InputFile& file) {
     }
   }
   return host;
+}
+
+HostWindow readHostWindow(const std::string& path) {
+  if (!namesForm(path)) return parseHostWindow(InputFile(path, windowWords));
+  auto host = parseHostWindow(InputFile(path, windowWords, describeFormFile(path)));
+  if (!host.controls.empty()) return host;
+  throw Failure(ExitStatus::badInput,
+                path + ": expected widgets with the dynamic property qzTag, found none");
 }
 
 toolkit::Ref<toolkit::Window> makeHostWindow(drivers::Driver& driver, const HostWindow& host,

@@ -36,6 +36,10 @@ struct HostWindow {
 /// from 1.
 HostWindow parseHostWindow(const InputFile& file);
 
+/// Returns the window that the file at `path` describes: a property list, or a form of Qt
+/// Designer's. Throws a Failure if the file does not describe one.
+HostWindow readHostWindow(const std::string& path);
+
 /// Puts the window on the driver's screen. Throws a Failure, which names `file`, if one of its
 /// images is unknown.
 toolkit::Ref<toolkit::Window> makeHostWindow(drivers::Driver& driver, const HostWindow& host,

@@ -20,7 +20,7 @@ class AdoptedForm;
 struct QZ_API Adoption {
   /// Which widgets are controls.
   enum class Reading : std::uint8_t {
-    everyTaggedWidget,  ///< every widget with a tag, however deep, in the order of the widget tree
+    everyTaggedWidget,  ///< every widget and menu's action with a tag, however deep, in tree order
     directSubviews      ///< the direct children of the content, with and without a tag
   };
   /// What the end of an adoption restores.
@@ -42,8 +42,8 @@ struct QZ_API Adoption {
 };
 
 /// Presents a top-level widget of the host to a walk-through while it lives. An action that a tool
-/// bar shows is the control that shows it there. Writes a line to the log for each tag that no
-/// command can reach.
+/// bar shows is the control that shows it there; one that only menus show is a control itself.
+/// Writes a line to the log for each tag that no command can reach.
 class QZ_API AdoptedWindow {
  public:
   /// `toolkit` must outlive this object; `window` need not.
