@@ -1,12 +1,12 @@
 # SPDX-License-Identifier: MIT
 # qz_library(NAME [HOT] [FOLDERS folders...] [LINKS targets...] [PRIVATE_LINKS targets...])
 #
-# Adds the library of the current folder: target qz_NAME, for users qz::NAME, from all .cpp files in the
-# folder and the FOLDERS. LINKS are the libraries that the folder may use (docs/layers.md). HOT is for the
+# Adds the library of the current folder: target qz_NAME, for users qz::NAME, from all .cpp, .mm and .m files
+# in the folder and the FOLDERS. LINKS are the libraries that the folder may use (docs/layers.md). HOT is for the
 # libraries in which tests spend their time: they are optimised even in builds without a build type.
 function(qz_library name)
   cmake_parse_arguments(arg "HOT" "" "LINKS;PRIVATE_LINKS;FOLDERS" ${ARGN})
-  set(patterns *.cpp)
+  set(patterns *.cpp *.mm *.m)
   foreach(folder ${arg_FOLDERS})
     list(APPEND patterns ${folder}/*.cpp)
   endforeach()
