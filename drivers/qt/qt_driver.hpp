@@ -8,7 +8,7 @@
 #include <functional>
 
 #include "drivers/driver.hpp"
-#include "drivers/qt/paced_clock.hpp"
+#include "drivers/paced_clock.hpp"
 #include "qz/toolkit/qt/qt_toolkit.hpp"
 
 namespace qz::drivers {

@@ -1,0 +1,99 @@
+// SPDX-License-Identifier: MIT
+// Sets the single `NSTimer`.
+
+#import "toolkit/appkit/run_loop.hpp"
+
+#include <algorithm>
+#include <utility>
+
+#import "toolkit/appkit/calling.hpp"
+
+using qz::toolkit::appkit::AppKitRunLoop;
+
+/// The target of the `NSTimer`, which retains it.
+@interface QZWakener : NSObject {
+ @private
+  AppKitRunLoop* loop_;  // its owner; null once that has ended
+}
+- (id)initWithLoop:(AppKitRunLoop*)loop;
+- (void)forgetLoop;
+- (void)wake:(NSTimer*)timer;
+@end
+
+@implementation QZWakener
+
+- (id)initWithLoop:(AppKitRunLoop*)loop {
+  self = [super init];
+  loop_ = loop;
+  return self;
+}
+
+- (void)forgetLoop {
+  loop_ = nullptr;
+}
+
+- (void)wake:(NSTimer*)timer {
+  (void)timer;
+  if (loop_) loop_->wake();
+}
+
+@end
+
+namespace qz::toolkit::appkit {
+
+namespace {
+
+// In seconds. A fire date must be a date; longer waits consist of several of these.
+constexpr double longestWait = 24 * 60 * 60;
+
+}  // namespace
+
+AppKitRunLoop::AppKitRunLoop(Clock& clock, Calls& calls)
+    : clock_(clock),
+      calls_(calls),
+      wakener_(foundation::Kept<id>::adopt([[QZWakener alloc] initWithLoop:this])) {}
+
+AppKitRunLoop::~AppKitRunLoop() {
+  [wakener_.get() forgetLoop];
+  stopAlarm();
+  invalidateAll();
+  stopAlarm();  // an action that ended may have scheduled another
+}
+
+Ref<Timer> AppKitRunLoop::schedule(double interval, bool repeats, TimerAction action) {
+  auto timer = TimedRunLoop::schedule(interval, repeats, std::move(action));
+  setAlarm();
+  return timer;
+}
+
+void AppKitRunLoop::wake() {
+  calls_.make([this] { calling([this] { fireDue(clock_.horizon()); }); });
+  setAlarm();
+}
+
+// A firing timer may run its own event loop, in which the other timers must fire.
+void AppKitRunLoop::reach(double due) {
+  clock_.reach(due);
+  setAlarm();
+}
+
+void AppKitRunLoop::stopAlarm() {
+  [alarm_.get() invalidate];
+  alarm_ = {};
+}
+
+void AppKitRunLoop::setAlarm() {
+  const foundation::Pool pool;
+  stopAlarm();
+  const auto due = nextDue();
+  if (!due || userIsBusy_) return;
+  const double wait = std::clamp(*due - clock_.horizon(), 0.0, longestWait);
+  alarm_ = foundation::Kept<NSTimer*>([NSTimer timerWithTimeInterval:wait
+                                                              target:wakener_.get()
+                                                            selector:@selector(wake:)
+                                                            userInfo:nil
+                                                             repeats:NO]);
+  [[NSRunLoop currentRunLoop] addTimer:alarm_.get() forMode:NSDefaultRunLoopMode];
+}
+
+}  // namespace qz::toolkit::appkit
