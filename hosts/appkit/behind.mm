@@ -30,8 +30,7 @@ void Behind::initWithWindow(id window) {
 
 void Behind::present() { platform.present(engine, object_); }
 
-const toolkit::Ref<toolkit::Window>& Behind::keep(toolkit::Ref<toolkit::Window>& place,
-                                                  id window) {
+const toolkit::Ref<toolkit::Window>& Behind::keep(toolkit::Ref<toolkit::Window>& place, id window) {
   place = platform.window(window);
   return place;
 }

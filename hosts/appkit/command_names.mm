@@ -56,8 +56,9 @@ struct CommandName {
   NSString* seen;  // retained
 };
 
-#define ROW(constant, value) \
-  {&::QZ_PLIST_STATE_PARSER_##constant, &qz::QZ_PLIST_STATE_PARSER_##constant, @value},
+#define ROW(constant, value)                                                             \
+  { &::QZ_PLIST_STATE_PARSER_##constant, &qz::QZ_PLIST_STATE_PARSER_##constant, @value } \
+  ,
 CommandName commandNames[] = {COMMAND_NAMES(ROW)};
 #undef ROW
 

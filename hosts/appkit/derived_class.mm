@@ -112,9 +112,8 @@ Subclass::Result DerivedClass::perform(std::string_view operation,
 }
 
 std::shared_ptr<void> DerivedClass::object() {
-  return std::shared_ptr<void>([object_ retain], [](void* object) {
-    [static_cast<id>(object) release];
-  });
+  return std::shared_ptr<void>([object_ retain],
+                               [](void* object) { [static_cast<id>(object) release]; });
 }
 
 }  // namespace qz::hosts::appkit

@@ -2,10 +2,9 @@
 // QZ_Plist_State_Parser as a class of Objective-C. Every method passes its arguments to the C++
 // engine of the same name. The classes of arguments are checked, because Objective-C does not.
 
-#import "QZ_Plist_State_Parser.h"
-
 #include <string>
 
+#import "QZ_Plist_State_Parser.h"
 #import "hosts/appkit/arguments.hpp"
 #import "hosts/appkit/behind.hpp"
 #import "hosts/appkit/engine_timers.hpp"
@@ -31,6 +30,7 @@ namespace qz::hosts::appkit {
 
 namespace {
 
+using toolkit::foundation::objectOf;
 using Lock = std::lock_guard<std::recursive_mutex>;
 
 /// A property whose values are those of scripts.
@@ -75,9 +75,9 @@ constexpr ValueProperty<Engine::Dictionary> flashingIds = {
     &Behind::flashingTagIds, &Engine::flashingTagIds, &Engine::setFlashingTagIds, aDictionary};
 constexpr ValueProperty<Engine::ObjectId> lastId = {&Behind::lastTagId, &Engine::lastTagId,
                                                     &Engine::setLastTagId, aNumber};
-constexpr ValueProperty<Engine::Dictionary> tags = {
-    &Behind::originalTagValues, &Engine::originalTagValues, &Engine::setOriginalTagValues,
-    aDictionary};
+constexpr ValueProperty<Engine::Dictionary> tags = {&Behind::originalTagValues,
+                                                    &Engine::originalTagValues,
+                                                    &Engine::setOriginalTagValues, aDictionary};
 
 /// A property with another table of the engine.
 template <class Table>
@@ -102,8 +102,7 @@ void set(Behind& behind, const TableProperty<Table>& property, id object) {
   answering([&] {
     if (object) requireKind(object, property.wanted());
     const Lock lock(behind.mutex);
-    (behind.engine.get()->*property.set)(
-        (behind.*property.twin).tableFor(object, behind.platform));
+    (behind.engine.get()->*property.set)((behind.*property.twin).tableFor(object, behind.platform));
   });
 }
 
@@ -204,9 +203,8 @@ bool addEntry(Engine& engine, NSMutableDictionary* entries, const std::optional<
 }
 
 - (BOOL)setButtonSates:(NSDictionary*)states {
-  return perform(self, [self behind], _cmd, [&](Engine& engine) {
-    return engine.setButtonSates(face::dictionaryOf(states));
-  });
+  return perform(self, [self behind], _cmd,
+                 [&](Engine& engine) { return engine.setButtonSates(face::dictionaryOf(states)); });
 }
 
 - (BOOL)createNextGuiAssetEntry:(NSMutableDictionary**)entries
@@ -216,9 +214,9 @@ bool addEntry(Engine& engine, NSMutableDictionary* entries, const std::optional<
   return perform(self, [self behind], _cmd, [&](Engine& engine) {
     NSMutableDictionary* const wanted = entries ? *entries : nil;
     if (![wanted isKindOfClass:[NSMutableDictionary class]]) return false;
-    return face::addEntry(
-        engine, wanted, face::textOf(className),
-        {frame.origin.x, frame.origin.y, frame.size.width, frame.size.height}, tagId);
+    return face::addEntry(engine, wanted, face::textOf(className),
+                          {frame.origin.x, frame.origin.y, frame.size.width, frame.size.height},
+                          tagId);
   });
 }
 
@@ -289,21 +287,34 @@ bool addEntry(Engine& engine, NSMutableDictionary* entries, const std::optional<
   });
 }
 
-- (BOOL)QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML:(NSString*)html WITH_FONT_NAME:(NSString*)fontName WITH_SIZE:(id)size FOR_OBJECT_ID:(NSNumber*)objectId {
+- (BOOL)QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML:(NSString*)html
+                                                WITH_FONT_NAME:(NSString*)fontName
+                                                     WITH_SIZE:(id)size
+                                                 FOR_OBJECT_ID:(NSNumber*)objectId {
   return perform(self, [self behind], _cmd, [&](Engine& engine) {
-    return engine.QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML(valueOf(html), valueOf(fontName), valueOf(size), numberOf(objectId));
+    return engine.QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML(
+        valueOf(html), valueOf(fontName), valueOf(size), numberOf(objectId));
   });
 }
 
-- (BOOL)QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER:(NSString*)html WITH_FONT_NAME:(NSString*)fontName WITH_SIZE:(id)size FOR_OBJECT_ID:(NSNumber*)objectId {
+- (BOOL)QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER:(NSString*)html
+                                                          WITH_FONT_NAME:(NSString*)fontName
+                                                               WITH_SIZE:(id)size
+                                                           FOR_OBJECT_ID:(NSNumber*)objectId {
   return perform(self, [self behind], _cmd, [&](Engine& engine) {
-    return engine.QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER(valueOf(html), valueOf(fontName), valueOf(size), numberOf(objectId));
+    return engine.QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER(
+        valueOf(html), valueOf(fontName), valueOf(size), numberOf(objectId));
   });
 }
 
-- (BOOL)QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS:(BOOL)asIs WITH_HTML:(NSString*)html WITH_FONT_NAME:(NSString*)fontName WITH_SIZE:(id)size FOR_OBJECT_ID:(NSNumber*)objectId {
+- (BOOL)QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS:(BOOL)asIs
+                                                   WITH_HTML:(NSString*)html
+                                              WITH_FONT_NAME:(NSString*)fontName
+                                                   WITH_SIZE:(id)size
+                                               FOR_OBJECT_ID:(NSNumber*)objectId {
   return perform(self, [self behind], _cmd, [&](Engine& engine) {
-    return engine.QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(asIs, valueOf(html), valueOf(fontName), valueOf(size), numberOf(objectId));
+    return engine.QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(
+        asIs, valueOf(html), valueOf(fontName), valueOf(size), numberOf(objectId));
   });
 }
 
@@ -313,7 +324,8 @@ bool addEntry(Engine& engine, NSMutableDictionary* entries, const std::optional<
   });
 }
 
-- (BOOL)QZ_Plist_State_Processor_SET_FOREGROUND_COLOR:(NSString*)name FOR_OBJECT_ID:(NSNumber*)objectId {
+- (BOOL)QZ_Plist_State_Processor_SET_FOREGROUND_COLOR:(NSString*)name
+                                        FOR_OBJECT_ID:(NSNumber*)objectId {
   return perform(self, [self behind], _cmd, [&](Engine& engine) {
     return engine.QZ_Plist_State_Processor_SET_FOREGROUND_COLOR(valueOf(name), numberOf(objectId));
   });
@@ -339,13 +351,16 @@ bool addEntry(Engine& engine, NSMutableDictionary* entries, const std::optional<
 
 - (BOOL)QZ_Plist_State_Processor_SET_TOOL_TIP:(NSArray*)parameters forObject:(NSNumber*)objectId {
   return perform(self, [self behind], _cmd, [&](Engine& engine) {
-    return engine.QZ_Plist_State_Processor_SET_TOOL_TIP(face::arrayOf(parameters), numberOf(objectId));
+    return engine.QZ_Plist_State_Processor_SET_TOOL_TIP(face::arrayOf(parameters),
+                                                        numberOf(objectId));
   });
 }
 
-- (BOOL)QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH:(NSArray*)parameters forObject:(NSNumber*)objectId {
+- (BOOL)QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH:(NSArray*)parameters
+                                                     forObject:(NSNumber*)objectId {
   return perform(self, [self behind], _cmd, [&](Engine& engine) {
-    return engine.QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH(face::arrayOf(parameters), numberOf(objectId));
+    return engine.QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH(face::arrayOf(parameters),
+                                                                         numberOf(objectId));
   });
 }
 
@@ -357,12 +372,12 @@ bool addEntry(Engine& engine, NSMutableDictionary* entries, const std::optional<
 
 - (void)QZ_Plist_State_Processor_TERMINATE_PARSER {
   perform(self, [self behind], _cmd,
- [](Engine& engine) { engine.QZ_Plist_State_Processor_TERMINATE_PARSER(); });
+          [](Engine& engine) { engine.QZ_Plist_State_Processor_TERMINATE_PARSER(); });
 }
 
 - (void)QZ_Plist_State_Processor_RETURN_TO_IDLE_LOOP {
   perform(self, [self behind], _cmd,
- [](Engine& engine) { engine.QZ_Plist_State_Processor_RETURN_TO_IDLE_LOOP(); });
+          [](Engine& engine) { engine.QZ_Plist_State_Processor_RETURN_TO_IDLE_LOOP(); });
 }
 
 - (BOOL)QZ_Plist_State_Processor_SET_TIMER:(NSUInteger)value forId:(NSNumber*)objectId {
@@ -377,9 +392,12 @@ bool addEntry(Engine& engine, NSMutableDictionary* entries, const std::optional<
   });
 }
 
-- (BOOL)QZ_Plist_State_Processor_SET_TAG:(NSNumber*)newTag forId:(NSNumber*)objectId withTimerValue:(id)timerValue {
+- (BOOL)QZ_Plist_State_Processor_SET_TAG:(NSNumber*)newTag
+                                   forId:(NSNumber*)objectId
+                          withTimerValue:(id)timerValue {
   return perform(self, [self behind], _cmd, [&](Engine& engine) {
-    return engine.QZ_Plist_State_Processor_SET_TAG(numberOf(newTag), numberOf(objectId), face::addressOf(timerValue));
+    return engine.QZ_Plist_State_Processor_SET_TAG(numberOf(newTag), numberOf(objectId),
+                                                   face::addressOf(timerValue));
   });
 }
 

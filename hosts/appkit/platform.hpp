@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Platform: the toolkit of the engines that Objective-C code makes, and its objects. It is AppKit's;
-// tests may use another one.
+// Platform: the toolkit of the engines that Objective-C code makes, and its objects. It is
+// AppKit's; tests may use another one.
 #pragma once
 
 #import <Foundation/Foundation.h>

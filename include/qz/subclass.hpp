@@ -22,10 +22,9 @@ namespace qz {
 class Subclass {
  public:
   /// Text is a value. Absent values, controls, windows and timers are absent arguments.
-  using Argument =
-      std::variant<bool, std::uint64_t, toolkit::Tag, toolkit::ValueRef<>,
-                   toolkit::Ref<toolkit::View>, toolkit::Ref<toolkit::Window>,
-                   toolkit::Ref<toolkit::Timer>>;
+  using Argument = std::variant<bool, std::uint64_t, toolkit::Tag, toolkit::ValueRef<>,
+                                toolkit::Ref<toolkit::View>, toolkit::Ref<toolkit::Window>,
+                                toolkit::Ref<toolkit::Timer>>;
 
   /// What an operation returns: YES or NO, a control, or nothing.
   struct Result {
