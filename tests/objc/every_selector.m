@@ -529,7 +529,7 @@ static void bothSidesSeeChangesOfATable(void) {
 
 int main(void) {
   NSAutoreleasePool *pool = [[NSAutoreleasePool alloc] init];
-  [NSApplication sharedApplication];
+  [[NSApplication sharedApplication] finishLaunching];
 #define RUN(test) runTest(#test, test)
   RUN(aFreshEngineHasTablesAndAFlasher);
   RUN(plainInitMakesNoTables);
