@@ -98,8 +98,8 @@ Subclass::Result DerivedClass::perform(std::string_view operation,
                                        std::span<const Argument> arguments) {
   const toolkit::foundation::Kept<id> kept(object_);
   Platform& platform = platform_;
+  const toolkit::foundation::Pool pool;  // outside `sending`, which reads what was raised
   return toolkit::foundation::sending([&] {
-    const toolkit::foundation::Pool pool;
     const SEL selector = selectorNamed(operation);
     NSInvocation* const invocation = [NSInvocation
         invocationWithMethodSignature:[kept.get() methodSignatureForSelector:selector]];

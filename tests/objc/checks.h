@@ -5,27 +5,26 @@
 /// Counts a failure, with its place, unless the condition holds.
 #define CHECK(condition) checkThat((condition) ? YES : NO, #condition, __FILE__, __LINE__)
 /// Compares two objects, which may be nil.
-#define CHECK_EQUAL(object, expected) \
-  checkEqual((object), (expected), #object, __FILE__, __LINE__)
+#define CHECK_EQUAL(object, expected) checkEqual((object), (expected), #object, __FILE__, __LINE__)
 /// Checks that the statement raises an exception with this name whose reason contains the text.
-#define CHECK_RAISES(name, text, statement)                                      \
-  do {                                                                           \
-    NSException *raised_ = nil;                                                  \
-    @try {                                                                       \
-      statement;                                                                 \
-    } @catch (NSException * exception_) {                                        \
-      raised_ = exception_;                                                      \
-    }                                                                            \
-    checkRaised(raised_, (name), (text), #statement, __FILE__, __LINE__);        \
+#define CHECK_RAISES(name, text, statement)                               \
+  do {                                                                    \
+    NSException* raised_ = nil;                                           \
+    @try {                                                                \
+      statement;                                                          \
+    } @catch (NSException * exception_) {                                 \
+      raised_ = exception_;                                               \
+    }                                                                     \
+    checkRaised(raised_, (name), (text), #statement, __FILE__, __LINE__); \
   } while (0)
 
-void checkThat(BOOL holds, const char *what, const char *file, int line);
-void checkEqual(id object, id expected, const char *what, const char *file, int line);
-void checkRaised(NSException *raised, NSString *name, NSString *text, const char *what,
-                 const char *file, int line);
+void checkThat(BOOL holds, const char* what, const char* file, int line);
+void checkEqual(id object, id expected, const char* what, const char* file, int line);
+void checkRaised(NSException* raised, NSString* name, NSString* text, const char* what,
+                 const char* file, int line);
 
 /// Runs a test in its own pool and prints its name.
-void runTest(const char *name, void (*test)(void));
+void runTest(const char* name, void (*test)(void));
 /// Returns the program's exit code.
 int testResult(void);
 
@@ -33,13 +32,13 @@ enum { nextTag = 2, switchTag = 3, textTag = 5, imageTag = 6 };
 
 /// Returns a window with a button, a switch, a text field, an image view and a text view, which has
 /// no tag, autoreleased.
-NSWindow *windowWithControls(void);
+NSWindow* windowWithControls(void);
 /// Returns the control of a window with the tag.
-id controlIn(NSWindow *window, NSInteger tag);
+id controlIn(NSWindow* window, NSInteger tag);
 /// Writes a script and returns its path.
-NSString *scriptFile(NSDictionary *script);
+NSString* scriptFile(NSDictionary* script);
 /// Returns a list with one command.
-NSArray *command(NSString *name, id parameter0, id parameter1);
+NSArray* command(NSString* name, id parameter0, id parameter1);
 /// Lets timers fire, for some seconds.
 void letTimePass(NSTimeInterval seconds);
-NSNumber *number(NSInteger value);
+NSNumber* number(NSInteger value);

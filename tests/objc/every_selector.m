@@ -4,8 +4,8 @@
 #import "QZ_Plist_State_Parser.h"
 #import "checks.h"
 
-static NSWindow *window = nil;
-static QZ_Plist_State_Parser *engine = nil;
+static NSWindow* window = nil;
+static QZ_Plist_State_Parser* engine = nil;
 
 static void setUp(void) {
   window = [windowWithControls() retain];
@@ -21,17 +21,17 @@ static void tearDown(void) {
   window = nil;
 }
 
-static void load(NSDictionary *script) {
+static void load(NSDictionary* script) {
   CHECK([engine loadPlist:scriptFile(script) runFromKey:nil withDelegate:nil runAsSheet:NO]);
 }
 
-static NSString *textOfField(void) { return [controlIn(window, textTag) stringValue]; }
+static NSString* textOfField(void) { return [controlIn(window, textTag) stringValue]; }
 
 // --- construction, state and end ---
 
 static void aFreshEngineHasTablesAndAFlasher(void) {
-  NSWindow *host = windowWithControls();
-  QZ_Plist_State_Parser *fresh = [[QZ_Plist_State_Parser alloc] initWithWindow:host];
+  NSWindow* host = windowWithControls();
+  QZ_Plist_State_Parser* fresh = [[QZ_Plist_State_Parser alloc] initWithWindow:host];
   CHECK([fresh window] == host);
   CHECK(![fresh flashing] && ![fresh runningAsSheet]);
   CHECK(![fresh terminating] && ![fresh hasTerminated]);
@@ -55,7 +55,7 @@ static void aFreshEngineHasTablesAndAFlasher(void) {
 }
 
 static void plainInitMakesNoTables(void) {
-  QZ_Plist_State_Parser *bare = [[[QZ_Plist_State_Parser alloc] init] autorelease];
+  QZ_Plist_State_Parser* bare = [[[QZ_Plist_State_Parser alloc] init] autorelease];
   CHECK([bare plistDictionary] == nil && [bare flashingTagIds] == nil);
   CHECK([bare addedObjectToTutorial] == nil && [bare guiAssets] == nil);
   CHECK([bare objectIdTimers] == nil && [bare originalTagValues] == nil);
@@ -66,9 +66,9 @@ static void plainInitMakesNoTables(void) {
 static void terminationEmptiesAndDropsTheTables(void) {
   setUp();
   load([NSDictionary dictionaryWithObject:[NSArray array] forKey:@"1"]);
-  NSMutableDictionary *script = [engine plistDictionary];
-  NSMutableDictionary *records = [engine guiAssets];
-  NSTimer *flasher = [engine flashingTimer];
+  NSMutableDictionary* script = [engine plistDictionary];
+  NSMutableDictionary* records = [engine guiAssets];
+  NSTimer* flasher = [engine flashingTimer];
   CHECK([script count] == 1 && [records count] == 4);
   [controlIn(window, nextTag) setTag:20];
   [engine setCommandArray:[NSArray arrayWithObject:@"a"]];
@@ -88,11 +88,11 @@ static void terminationEmptiesAndDropsTheTables(void) {
 
 static void loadPlistRunsAList(void) {
   setUp();
-  NSString *path = scriptFile(
-      [NSDictionary dictionaryWithObjectsAndKeys:
-                        command(@"SET_TEXT_FOR_OBJECT_ID", @"from 12", number(textTag)), @"12",
-                        command(@"SET_TEXT_FOR_OBJECT_ID", @"from -1", number(textTag)), @"-1",
-                        nil]);
+  NSString* path = scriptFile([NSDictionary
+      dictionaryWithObjectsAndKeys:command(@"SET_TEXT_FOR_OBJECT_ID", @"from 12", number(textTag)),
+                                   @"12",
+                                   command(@"SET_TEXT_FOR_OBJECT_ID", @"from -1", number(textTag)),
+                                   @"-1", nil]);
   CHECK([engine loadPlist:path runFromKey:@"12" withDelegate:nil runAsSheet:NO]);
   CHECK_EQUAL(textOfField(), @"from 12");
   CHECK_EQUAL([engine currentCommandState], @"12");
@@ -111,7 +111,7 @@ static void loadPlistRunsAList(void) {
 
 static void listsAndCommandsRun(void) {
   setUp();
-  NSArray *list = command(@"set_text_for_object_id", @"lower case", number(textTag));
+  NSArray* list = command(@"set_text_for_object_id", @"lower case", number(textTag));
   CHECK([engine processCommandArray:list ForObject:number(1)]);
   CHECK_EQUAL(textOfField(), @"lower case");
   CHECK(![engine processCommandArray:nil ForObject:number(9)]);
@@ -119,7 +119,7 @@ static void listsAndCommandsRun(void) {
   CHECK(![engine processCommandArray:nil ForObject:nil]);
   CHECK([engine lastTagId] == nil);
   CHECK_RAISES(NSInvalidArgumentException, @"count",
-               [engine processCommandArray:(NSArray *)@"text" ForObject:number(1)]);
+               [engine processCommandArray:(NSArray*)@"text" ForObject:number(1)]);
 
   CHECK([engine doSimpleCommand:@"IDLE_LOOP" withParams:nil usingObject:nil]);
   CHECK(![engine doSimpleCommand:nil withParams:nil usingObject:nil]);
@@ -128,17 +128,18 @@ static void listsAndCommandsRun(void) {
                      usingObject:number(nextTag)]);
   CHECK([controlIn(window, nextTag) isHidden]);
 
-  NSMutableArray *parameters = [NSMutableArray arrayWithObject:number(nextTag)];
+  NSMutableArray* parameters = [NSMutableArray arrayWithObject:number(nextTag)];
   CHECK([engine doCompoundCommand:@"SHOW_OBJECT_WITH_ID"
                    withParameters:parameters
                       usingObject:number(1)]);
   CHECK(![controlIn(window, nextTag) isHidden]);
   CHECK(![engine doCompoundCommand:nil withParameters:nil usingObject:nil]);
-  CHECK_RAISES(NSRangeException, @"", [engine doCompoundCommand:@"SET_TITLE_FOR_OBJECT_ID"
-                                                 withParameters:[NSMutableArray array]
-                                                    usingObject:number(1)]);
+  CHECK_RAISES(NSRangeException, @"",
+               [engine doCompoundCommand:@"SET_TITLE_FOR_OBJECT_ID"
+                          withParameters:[NSMutableArray array]
+                             usingObject:number(1)]);
   CHECK_RAISES(NSInvalidArgumentException, @"NSNumber",
-               [engine processCommandArray:list ForObject:(NSNumber *)@"1"]);
+               [engine processCommandArray:list ForObject:(NSNumber*)@"1"]);
   tearDown();
 }
 
@@ -147,7 +148,7 @@ static void pressesRunLists(void) {
   load([NSDictionary
       dictionaryWithObject:command(@"SET_TEXT_FOR_OBJECT_ID", @"pressed", number(textTag))
                     forKey:@"3"]);
-  NSButton *onOff = controlIn(window, switchTag);
+  NSButton* onOff = controlIn(window, switchTag);
   CHECK([onOff target] == engine);
   CHECK([onOff action] == @selector(buttonPushed:));
   [onOff performClick:nil];
@@ -167,7 +168,7 @@ static void windowsAreAdopted(void) {
   setUp();
   CHECK([window delegate] == (id)engine);
   CHECK([engine tutorialWindow] == window);
-  NSArray *record = [[engine guiAssets] objectForKey:@"2"];
+  NSArray* record = [[engine guiAssets] objectForKey:@"2"];
   CHECK([record count] == 3 && [record objectAtIndex:2] == controlIn(window, nextTag));
   CHECK_EQUAL([[record objectAtIndex:0] objectAtIndex:0], @"NSButton");
   CHECK_EQUAL([[record objectAtIndex:1] objectAtIndex:2], [NSNumber numberWithFloat:80]);
@@ -177,19 +178,19 @@ static void windowsAreAdopted(void) {
   CHECK([engine findObjectWithTag:textTag] == controlIn(window, textTag));
   CHECK([engine findObjectWithTag:99] == nil);
 
-  NSButton *own = [[[NSButton alloc] initWithFrame:NSMakeRect(0, 0, 9, 9)] autorelease];
+  NSButton* own = [[[NSButton alloc] initWithFrame:NSMakeRect(0, 0, 9, 9)] autorelease];
   CHECK([engine forceButtonPushedToBeActionForGuiAttribute:own]);
   CHECK([own action] == @selector(buttonPushed:) && [own target] == nil);
   CHECK(![engine forceButtonPushedToBeActionForGuiAttribute:controlIn(window, textTag)]);
   CHECK(![engine forceButtonPushedToBeActionForGuiAttribute:nil]);
   CHECK_RAISES(NSInvalidArgumentException, @"NSWindow",
-               [engine getGuiAssetsFromWindow:(NSWindow *)@"window"]);
+               [engine getGuiAssetsFromWindow:(NSWindow*)@"window"]);
   tearDown();
 }
 
 static void windowsAreBuilt(void) {
-  QZ_Plist_State_Parser *builder = [[QZ_Plist_State_Parser alloc] initWithWindow:nil];
-  NSMutableDictionary *assets = [NSMutableDictionary dictionary];
+  QZ_Plist_State_Parser* builder = [[QZ_Plist_State_Parser alloc] initWithWindow:nil];
+  NSMutableDictionary* assets = [NSMutableDictionary dictionary];
   CHECK([builder createNextGuiAssetEntry:&assets
                                forObject:@"NSButton"
                               usingFrame:NSMakeRect(10, 20, 80, 30)
@@ -204,16 +205,13 @@ static void windowsAreBuilt(void) {
                                 forObject:@"NSSlider"
                                usingFrame:NSZeroRect
                                 withTagId:6]);
-  CHECK(![builder createNextGuiAssetEntry:&assets
-                                forObject:nil
-                               usingFrame:NSZeroRect
-                                withTagId:6]);
+  CHECK(![builder createNextGuiAssetEntry:&assets forObject:nil usingFrame:NSZeroRect withTagId:6]);
   CHECK(![builder createNextGuiAssetEntry:NULL
                                 forObject:@"NSButton"
                                usingFrame:NSZeroRect
                                 withTagId:6]);
-  NSMutableDictionary *none = nil;
-  NSMutableDictionary *fixed = (NSMutableDictionary *)[NSDictionary dictionary];
+  NSMutableDictionary* none = nil;
+  NSMutableDictionary* fixed = (NSMutableDictionary*)[NSDictionary dictionary];
   CHECK(![builder createNextGuiAssetEntry:&none
                                 forObject:@"NSButton"
                                usingFrame:NSZeroRect
@@ -224,13 +222,13 @@ static void windowsAreBuilt(void) {
                                 withTagId:6]);
   CHECK([assets count] == 2);
 
-  NSError *error = nil;
+  NSError* error = nil;
   CHECK(![builder loadGuiAssets:nil error:NULL]);
   CHECK([builder loadGuiAssets:assets error:&error]);
   CHECK(error == nil);
   CHECK([[builder tutorialWindow] isVisible]);
   CHECK([[builder addedObjectToTutorial] count] == 2);
-  NSButton *built = [builder findObjectWithTag:4];
+  NSButton* built = [builder findObjectWithTag:4];
   CHECK([built isKindOfClass:[NSButton class]]);
   CHECK([[builder addedObjectToTutorial] containsObject:built]);
   CHECK([[builder tutorialWindow] delegate] == (id)builder);
@@ -247,7 +245,7 @@ static void windowsAreBuilt(void) {
 
 static void buttonStatesAreCarriedOver(void) {
   setUp();
-  NSDictionary *states = [NSDictionary dictionaryWithObject:[NSNumber numberWithBool:YES]
+  NSDictionary* states = [NSDictionary dictionaryWithObject:[NSNumber numberWithBool:YES]
                                                      forKey:@"3"];
   CHECK([engine setButtonSates:states]);
   CHECK([controlIn(window, switchTag) state] == NSOnState);
@@ -299,7 +297,7 @@ static void textsAreShown(void) {
 
 static void looksAreSet(void) {
   setUp();
-  NSButton *next = controlIn(window, nextTag);
+  NSButton* next = controlIn(window, nextTag);
   CHECK([engine QZ_Plist_State_Processor_SET_TITLE:@"Go" forId:number(nextTag)]);
   CHECK_EQUAL([next title], @"Go");
   CHECK(![engine QZ_Plist_State_Processor_SET_TITLE:@"Go" forId:number(textTag)]);
@@ -320,13 +318,13 @@ static void looksAreSet(void) {
   CHECK([controlIn(window, switchTag) state] == NSOffState);
   CHECK(![engine QZ_Plist_State_Processor_SET_STATE_ON:nil]);
   CHECK(![engine QZ_Plist_State_Processor_SET_STATE_OFF:nil]);
-  NSArray *tip = [NSArray arrayWithObjects:@"a tip", number(textTag), nil];
+  NSArray* tip = [NSArray arrayWithObjects:@"a tip", number(textTag), nil];
   CHECK([engine QZ_Plist_State_Processor_SET_TOOL_TIP:tip forObject:number(nextTag)]);
   CHECK_EQUAL([controlIn(window, textTag) toolTip], @"a tip");
   CHECK(![engine QZ_Plist_State_Processor_SET_TOOL_TIP:nil forObject:nil]);
-  NSImage *picture = [[[NSImage alloc] initWithSize:NSMakeSize(9, 9)] autorelease];
+  NSImage* picture = [[[NSImage alloc] initWithSize:NSMakeSize(9, 9)] autorelease];
   CHECK([picture setName:@"every-selector"]);
-  NSArray *image = [NSArray arrayWithObjects:@"every-selector", number(imageTag), nil];
+  NSArray* image = [NSArray arrayWithObjects:@"every-selector", number(imageTag), nil];
   CHECK([engine QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH:image forObject:nil]);
   CHECK([controlIn(window, imageTag) image] == picture);
   CHECK(![engine QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH:nil forObject:nil]);
@@ -356,9 +354,7 @@ static void tagsAreChanged(void) {
   CHECK(controlIn(window, 40) != nil);
   CHECK(![engine QZ_Plist_State_Processor_SET_TAG:number(41) forId:number(nextTag)]);
   CHECK(![engine QZ_Plist_State_Processor_SET_TAG:nil forId:nil]);
-  CHECK([engine QZ_Plist_State_Processor_SET_TAG:number(41)
-                                           forId:number(40)
-                                  withTimerValue:nil]);
+  CHECK([engine QZ_Plist_State_Processor_SET_TAG:number(41) forId:number(40) withTimerValue:nil]);
   CHECK([[engine objectIdTimers] count] == 0);
   CHECK([engine QZ_Plist_State_Processor_SET_TAG:number(42)
                                            forId:number(41)
@@ -374,8 +370,8 @@ static void timersAreKept(void) {
   [engine startTimerWithValue:3 forKey:@""];
   CHECK([[engine objectIdTimers] count] == 0);
   [engine startTimerWithValue:3 forKey:@"8"];
-  NSMutableDictionary *timers = [engine objectIdTimers];
-  NSTimer *timer = [timers objectForKey:@"8"];
+  NSMutableDictionary* timers = [engine objectIdTimers];
+  NSTimer* timer = [timers objectForKey:@"8"];
   CHECK([timer isKindOfClass:[NSTimer class]] && [timer isValid] && [timer timeInterval] == 3);
   CHECK(timer == [timers objectForKey:@"8"]);
   NSTimeInterval wait = [[timer fireDate] timeIntervalSinceNow];
@@ -411,7 +407,7 @@ static void timersFire(void) {
 
 static void buttonsFlash(void) {
   setUp();
-  NSButton *next = controlIn(window, nextTag);
+  NSButton* next = controlIn(window, nextTag);
   CHECK([engine QZ_Plist_State_Processor_FLASH_ID:number(nextTag) flashOn:YES]);
   CHECK(![engine QZ_Plist_State_Processor_FLASH_ID:number(nextTag) flashOn:NO]);
   CHECK([engine QZ_Plist_State_Processor_FLASH_ID:nil flashOn:YES]);
@@ -436,16 +432,16 @@ static void buttonsFlash(void) {
 
 static void propertiesGiveBackWhatWasSet(void) {
   setUp();
-  NSMutableDictionary *table = [NSMutableDictionary dictionary];
-  NSMutableArray *list = [NSMutableArray array];
-  NSNumber *large = number(4711);
-  NSTimer *timer = [NSTimer timerWithTimeInterval:9
+  NSMutableDictionary* table = [NSMutableDictionary dictionary];
+  NSMutableArray* list = [NSMutableArray array];
+  NSNumber* large = number(4711);
+  NSTimer* timer = [NSTimer timerWithTimeInterval:9
                                            target:engine
                                          selector:@selector(flasherFired:)
                                          userInfo:nil
                                           repeats:NO];
-  NSWindow *other = windowWithControls();
-  NSTimer *flasher = [[[engine flashingTimer] retain] autorelease];
+  NSWindow* other = windowWithControls();
+  NSTimer* flasher = [[[engine flashingTimer] retain] autorelease];
 #define CHECK_PROPERTY(getter, setter, value) \
   [engine setter:value];                      \
   CHECK([engine getter] == value);            \
@@ -474,28 +470,28 @@ static void propertiesGiveBackWhatWasSet(void) {
   CHECK([engine terminating] && [engine hasTerminated]);
   [engine setRunningAsSheet:NO];
   CHECK_RAISES(NSInvalidArgumentException, @"NSDictionary",
-               [engine setPlistDictionary:(NSMutableDictionary *)@"script"]);
+               [engine setPlistDictionary:(NSMutableDictionary*)@"script"]);
   CHECK_RAISES(NSInvalidArgumentException, @"NSDictionary",
-               [engine setGuiAssets:(NSMutableDictionary *)@"records"]);
-  CHECK_RAISES(NSInvalidArgumentException, @"NSTimer", [engine setFlashingTimer:(NSTimer *)@"t"]);
+               [engine setGuiAssets:(NSMutableDictionary*)@"records"]);
+  CHECK_RAISES(NSInvalidArgumentException, @"NSTimer", [engine setFlashingTimer:(NSTimer*)@"t"]);
   tearDown();
 }
 
 static void bothSidesSeeChangesOfATable(void) {
   setUp();
-  NSMutableDictionary *script = [engine plistDictionary];
+  NSMutableDictionary* script = [engine plistDictionary];
   CHECK(script == [engine plistDictionary]);
   [script setObject:command(@"SET_TEXT_FOR_OBJECT_ID", @"mine", number(textTag)) forKey:@"2"];
   [controlIn(window, nextTag) performClick:nil];
   CHECK_EQUAL(textOfField(), @"mine");
 
-  NSMutableDictionary *own = [NSMutableDictionary dictionary];
+  NSMutableDictionary* own = [NSMutableDictionary dictionary];
   [engine setPlistDictionary:own];
   [own setObject:command(@"SET_TEXT_FOR_OBJECT_ID", @"own", number(textTag)) forKey:@"2"];
   [controlIn(window, nextTag) performClick:nil];
   CHECK_EQUAL(textOfField(), @"own");
 
-  NSMutableDictionary *timers = [NSMutableDictionary dictionary];
+  NSMutableDictionary* timers = [NSMutableDictionary dictionary];
   [engine setObjectIdTimers:timers];
   [engine startTimerWithValue:50 forKey:@"8"];
   CHECK([[timers objectForKey:@"8"] isValid]);
@@ -503,18 +499,17 @@ static void bothSidesSeeChangesOfATable(void) {
   [engine startTimerWithValue:50 forKey:@"9"];
   CHECK([timers count] == 1 && [timers objectForKey:@"9"] != nil);
 
-  NSMutableDictionary *records = [engine guiAssets];
-  NSArray *record = [[[records objectForKey:@"2"] retain] autorelease];
+  NSMutableDictionary* records = [engine guiAssets];
+  NSArray* record = [[[records objectForKey:@"2"] retain] autorelease];
   [records removeObjectForKey:@"2"];
   CHECK([records objectForKey:@"2"] == nil && [records count] == 3);
   [records setObject:record forKey:@"77"];
   CHECK_EQUAL([records objectForKey:@"77"], record);
   CHECK_RAISES(NSInvalidArgumentException, @"a list of its class name",
                [records setObject:[NSArray arrayWithObject:@"NSButton"] forKey:@"78"]);
-  CHECK_RAISES(NSInvalidArgumentException, @"NSArray",
-               [records setObject:window forKey:@"78"]);
+  CHECK_RAISES(NSInvalidArgumentException, @"NSArray", [records setObject:window forKey:@"78"]);
 
-  NSMutableArray *added = [engine addedObjectToTutorial];
+  NSMutableArray* added = [engine addedObjectToTutorial];
   [added addObject:controlIn(window, nextTag)];
   [added insertObject:controlIn(window, textTag) atIndex:0];
   [added replaceObjectAtIndex:1 withObject:controlIn(window, imageTag)];
@@ -528,7 +523,7 @@ static void bothSidesSeeChangesOfATable(void) {
 }
 
 int main(void) {
-  NSAutoreleasePool *pool = [[NSAutoreleasePool alloc] init];
+  NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
   [[NSApplication sharedApplication] finishLaunching];
 #define RUN(test) runTest(#test, test)
   RUN(aFreshEngineHasTablesAndAFlasher);
