@@ -9,7 +9,7 @@
 namespace qz::hosts::appkit {
 
 Behind::Behind(id object, Class baseClass)
-    : platform(appkit::platform()),
+    : platform(Platform::shared()),
       derived(std::make_shared<DerivedClass>(object, baseClass, platform)),
       object_(object) {
   engine = Engine::init(platform.toolkit(), derived);

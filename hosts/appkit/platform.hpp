@@ -1,41 +1,41 @@
 // SPDX-License-Identifier: MIT
-// Platform: the toolkit of the engines that Objective-C code makes, and its objects. It is
-// AppKit's; tests may use another one.
+// Platform: the AppKit toolkit of all Objective-C engines, and its objects.
 #pragma once
 
-#import <Foundation/Foundation.h>
+#import <AppKit/AppKit.h>
 
 #include <memory>
 
-#include "qz/toolkit/toolkit.hpp"
+#include "qz/toolkit/appkit/appkit_toolkit.hpp"
 
 namespace qz::hosts::appkit {
 
 class Platform {
  public:
-  virtual ~Platform() = default;
+  /// Returns the only one; made at the first call.
+  static Platform& shared();
 
-  virtual toolkit::Toolkit& toolkit() = 0;
+  toolkit::Toolkit& toolkit() { return toolkit_; }
 
   /// Return the view or window of an object; absent for nil. Raise an invalid-argument exception
   /// for an object of another class.
-  virtual toolkit::Ref<toolkit::View> view(id object) = 0;
-  virtual toolkit::Ref<toolkit::Window> window(id object) = 0;
+  toolkit::Ref<toolkit::View> view(id object);
+  toolkit::Ref<toolkit::Window> window(id object);
   /// Return the object of a view or window, autoreleased; nil for an absent one.
-  virtual id object(const toolkit::Ref<toolkit::View>& view) = 0;
-  virtual id object(const toolkit::Ref<toolkit::Window>& window) = 0;
+  NSView* object(const toolkit::Ref<toolkit::View>& view);
+  NSWindow* object(const toolkit::Ref<toolkit::Window>& window);
 
   /// Makes `object`, which is not retained, the target and delegate that controls and windows have
   /// for `engine`.
-  virtual void present(const std::shared_ptr<toolkit::Responder>& engine, id object) = 0;
+  void present(const std::shared_ptr<toolkit::Responder>& engine, id object);
   /// Ends that; `object` is no longer a target or delegate in `window`, which may be absent.
-  virtual void withdraw(const std::shared_ptr<toolkit::Responder>& engine, id object,
-                        const toolkit::Ref<toolkit::Window>& window) = 0;
-};
+  void withdraw(const std::shared_ptr<toolkit::Responder>& engine, id object,
+                const toolkit::Ref<toolkit::Window>& window);
 
-/// Returns the platform of new engines.
-Platform& platform();
-/// Sets it; it must outlive the engines made from now on. Null sets AppKit's again.
-void setPlatform(Platform* platform);
+ private:
+  toolkit::appkit::AppKitApplication& application() { return toolkit_.application(); }
+
+  toolkit::appkit::AppKitToolkit toolkit_;
+};
 
 }  // namespace qz::hosts::appkit

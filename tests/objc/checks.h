@@ -2,6 +2,10 @@
 // Checks for test programs in Objective-C, and the window in which they play.
 #import <AppKit/AppKit.h>
 
+#ifdef __cplusplus
+extern "C" {
+#endif
+
 /// Counts a failure, with its place, unless the condition holds.
 #define CHECK(condition) checkThat((condition) ? YES : NO, #condition, __FILE__, __LINE__)
 /// Compares two objects, which may be nil.
@@ -42,3 +46,7 @@ NSArray* command(NSString* name, id parameter0, id parameter1);
 /// Lets timers fire, for some seconds.
 void letTimePass(NSTimeInterval seconds);
 NSNumber* number(NSInteger value);
+
+#ifdef __cplusplus
+}
+#endif

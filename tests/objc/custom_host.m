@@ -5,7 +5,7 @@
 #import "QZ_Plist_State_Parser.h"
 #import "checks.h"
 
-static NSMutableArray *journal = nil;  // what happened, in order
+static NSMutableArray* journal = nil;  // what happened, in order
 static NSInteger engines = 0;          // that exist
 
 /// An engine that writes down what it is sent.
@@ -17,7 +17,7 @@ static NSInteger engines = 0;          // that exist
 
 @implementation WatchedEngine
 
-- (id)initWithWindow:(NSWindow *)window {
+- (id)initWithWindow:(NSWindow*)window {
   self = [super initWithWindow:window];
   ++engines;
   return self;
@@ -41,17 +41,17 @@ static NSInteger engines = 0;          // that exist
   }
 }
 
-- (BOOL)processCommandArray:(NSArray *)list ForObject:(NSNumber *)objectId {
+- (BOOL)processCommandArray:(NSArray*)list ForObject:(NSNumber*)objectId {
   [journal addObject:[NSString stringWithFormat:@"list %@ of %d", objectId, (int)[list count]]];
   return [super processCommandArray:list ForObject:objectId];
 }
 
-- (BOOL)doCompoundCommand:(NSString *)name
-           withParameters:(NSMutableArray *)parameters
-              usingObject:(NSNumber *)objectId {
+- (BOOL)doCompoundCommand:(NSString*)name
+           withParameters:(NSMutableArray*)parameters
+              usingObject:(NSNumber*)objectId {
   [journal addObject:[NSString stringWithFormat:@"%@ %d", name, (int)[parameters count]]];
   if ([name isEqual:@"GREET"]) {  // a command of the host's own
-    NSArray *greeting = [NSArray arrayWithObjects:@"Hello", [parameters objectAtIndex:0], nil];
+    NSArray* greeting = [NSArray arrayWithObjects:@"Hello", [parameters objectAtIndex:0], nil];
     return [super doCompoundCommand:@"SET_TEXT_FOR_OBJECT_ID"
                      withParameters:[NSMutableArray arrayWithArray:greeting]
                         usingObject:objectId];
@@ -60,19 +60,18 @@ static NSInteger engines = 0;          // that exist
   return [super doCompoundCommand:name withParameters:parameters usingObject:objectId];
 }
 
-- (BOOL)doSimpleCommand:(NSString *)name
-             withParams:(NSMutableArray *)parameters
-            usingObject:(NSNumber *)objectId {
+- (BOOL)doSimpleCommand:(NSString*)name
+             withParams:(NSMutableArray*)parameters
+            usingObject:(NSNumber*)objectId {
   [journal addObject:name];
   return [super doSimpleCommand:name withParams:parameters usingObject:objectId];
 }
 
-- (BOOL)QZ_Plist_State_Processor_SET_TEXT:(NSString *)text forId:(NSNumber *)objectId {
+- (BOOL)QZ_Plist_State_Processor_SET_TEXT:(NSString*)text forId:(NSNumber*)objectId {
   return [super QZ_Plist_State_Processor_SET_TEXT:[text uppercaseString] forId:objectId];
 }
 
-- (BOOL)QZ_Plist_State_Processor_SET_TOOL_TIP:(NSArray *)parameters
-                                    forObject:(NSNumber *)objectId {
+- (BOOL)QZ_Plist_State_Processor_SET_TOOL_TIP:(NSArray*)parameters forObject:(NSNumber*)objectId {
   [journal addObject:[NSString stringWithFormat:@"tip of %d", (int)[parameters count]]];
   return [super QZ_Plist_State_Processor_SET_TOOL_TIP:parameters forObject:objectId];
 }
@@ -81,12 +80,12 @@ static NSInteger engines = 0;          // that exist
   return [super findObjectWithTag:tag == 1005 ? textTag : tag];
 }
 
-- (void)pseudoButtonPush:(NSTimer *)timer {
+- (void)pseudoButtonPush:(NSTimer*)timer {
   [journal addObject:[timer isKindOfClass:[NSTimer class]] ? @"timer" : @"no timer"];
   [super pseudoButtonPush:timer];
 }
 
-- (void)flasherFired:(NSTimer *)timer {
+- (void)flasherFired:(NSTimer*)timer {
   if (timer == [self flashingTimer]) [journal addObject:@"tick"];
   [super flasherFired:timer];
 }
@@ -106,16 +105,16 @@ static NSInteger engines = 0;          // that exist
 /// Learns of the end of a sheet.
 @interface Delegate : NSObject {
  @public
-  NSWindow *sheet_;
+  NSWindow* sheet_;
   NSInteger code_;
   int ends_;
 }
 @end
 
 @implementation Delegate
-- (void)sheetDidEnd:(NSWindow *)sheet
+- (void)sheetDidEnd:(NSWindow*)sheet
          returnCode:(NSInteger)returnCode
-        contextInfo:(void *)contextInfo {
+        contextInfo:(void*)contextInfo {
   CHECK(contextInfo == NULL);
   sheet_ = sheet;
   code_ = returnCode;
@@ -124,8 +123,8 @@ static NSInteger engines = 0;          // that exist
 }
 @end
 
-static NSWindow *window = nil;
-static WatchedEngine *engine = nil;
+static NSWindow* window = nil;
+static WatchedEngine* engine = nil;
 
 static void setUp(void) {
   journal = [[NSMutableArray alloc] init];
@@ -144,18 +143,18 @@ static void tearDown(void) {
   journal = nil;
 }
 
-static NSString *said(void) {
-  NSString *all = [journal componentsJoinedByString:@", "];
+static NSString* said(void) {
+  NSString* all = [journal componentsJoinedByString:@", "];
   [journal removeAllObjects];
   return all;
 }
 
-static NSString *textOfField(void) { return [controlIn(window, textTag) stringValue]; }
+static NSString* textOfField(void) { return [controlIn(window, textTag) stringValue]; }
 
 static void commandsAreRenamed(void) {
   setUp();
-  NSArray *say = command(@"say", @"a", number(textTag));
-  NSString *before = QZ_PLIST_STATE_PARSER_SET_TEXT_FOR_OBJECT_ID;
+  NSArray* say = command(@"say", @"a", number(textTag));
+  NSString* before = QZ_PLIST_STATE_PARSER_SET_TEXT_FOR_OBJECT_ID;
   CHECK_EQUAL(before, @"SET_TEXT_FOR_OBJECT_ID");
   CHECK_EQUAL(QZ_PLIST_STATE_PARSER_RETURN_TO_IDLE_LOOP, @"IDLE_LOOP");
   CHECK(![engine processCommandArray:say ForObject:number(1)]);
@@ -173,7 +172,7 @@ static void commandsAreRenamed(void) {
 
 static void theEngineSendsItselfMessages(void) {
   setUp();
-  NSMutableArray *list = [NSMutableArray array];
+  NSMutableArray* list = [NSMutableArray array];
   [list addObjectsFromArray:command(@"greet", number(1005), nil)];
   [list addObjectsFromArray:command(@"SET_TOOL_TIP_FOR_ID", @"tip", number(textTag))];
   [list addObject:@"IDLE_LOOP"];
@@ -228,7 +227,7 @@ static void propertiesHaveKeyValueCoding(void) {
 
 // A nib makes the object with `init` and then connects its outlets.
 static void aNibCanMakeIt(void) {
-  NSWindow *host = windowWithControls();
+  NSWindow* host = windowWithControls();
   id made = [[[NSClassFromString(@"QZ_Plist_State_Parser") alloc] init] autorelease];
   [made setValue:host forKey:@"window"];
   CHECK([made window] == host);
@@ -242,8 +241,8 @@ static void aNibCanMakeIt(void) {
 }
 
 static void theFlasherKeepsTheEngineAlive(void) {
-  NSAutoreleasePool *pool = [[NSAutoreleasePool alloc] init];
-  WatchedEngine *alone = [[WatchedEngine alloc] initWithWindow:nil];
+  NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+  WatchedEngine* alone = [[WatchedEngine alloc] initWithWindow:nil];
   [alone release];
   CHECK(engines == 1);
   [alone terminateParser];
@@ -255,8 +254,8 @@ static void anEngineLetsGoInItsOwnAction(void) {
   setUp();
   [[engine plistDictionary] setObject:[NSArray arrayWithObject:@"IDLE_LOOP"] forKey:@"2"];
   [engine setReleasesItself:YES];
-  NSButton *button = controlIn(window, nextTag);
-  NSAutoreleasePool *pool = [[NSAutoreleasePool alloc] init];
+  NSButton* button = controlIn(window, nextTag);
+  NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
   [button performClick:nil];
   [pool release];
   engine = nil;
@@ -268,10 +267,10 @@ static void anEngineLetsGoInItsOwnAction(void) {
 
 static void aListLetsTheEngineGo(void) {
   setUp();
-  [[engine plistDictionary] setObject:[NSArray arrayWithObjects:@"TERMINATE_PARSER",
-                                                                @"HIDE_OBJECT_WITH_ID", nil]
-                               forKey:@"2"];
-  NSAutoreleasePool *pool = [[NSAutoreleasePool alloc] init];
+  [[engine plistDictionary]
+      setObject:[NSArray arrayWithObjects:@"TERMINATE_PARSER", @"HIDE_OBJECT_WITH_ID", nil]
+         forKey:@"2"];
+  NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
   [engine release];  // now only the flasher holds it
   CHECK(engines == 1);
   [controlIn(window, nextTag) performClick:nil];
@@ -284,8 +283,8 @@ static void aListLetsTheEngineGo(void) {
 
 static void controlsMayGoInTheMiddle(void) {
   setUp();
-  NSMutableDictionary *records = [engine guiAssets];
-  NSAutoreleasePool *pool = [[NSAutoreleasePool alloc] init];
+  NSMutableDictionary* records = [engine guiAssets];
+  NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
   [controlIn(window, textTag) removeFromSuperview];
   CHECK(![engine QZ_Plist_State_Processor_SET_TEXT:@"a" forId:number(textTag)]);
   [window close];
@@ -297,9 +296,9 @@ static void controlsMayGoInTheMiddle(void) {
 
 static void aSheetTellsItsDelegate(void) {
   setUp();
-  Delegate *delegate = [[Delegate alloc] init];
+  Delegate* delegate = [[Delegate alloc] init];
   NSUInteger holders = [delegate retainCount];
-  NSWindow *host = windowWithControls();
+  NSWindow* host = windowWithControls();
   [host makeKeyAndOrderFront:nil];
   [engine setWindow:host];
   CHECK([engine loadPlist:nil runFromKey:nil withDelegate:delegate runAsSheet:YES]);
@@ -325,7 +324,7 @@ static void aDelegateNeedNotListen(void) {
 }
 
 int main(void) {
-  NSAutoreleasePool *pool = [[NSAutoreleasePool alloc] init];
+  NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
   [[NSApplication sharedApplication] finishLaunching];
 #define RUN(test) runTest(#test, test)
   RUN(commandsAreRenamed);
