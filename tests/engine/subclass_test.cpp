@@ -79,8 +79,7 @@ std::vector<Operation> everyOperation() {
        [=](Engine& e) { return e.doSimpleCommand("A", none, id); }},
       {"doCompoundCommand:withParameters:usingObject:",
        [=](Engine& e) { return e.doCompoundCommand("A", none, id); }},
-      {"findObjectWithTag:",
-       [](Engine& e) { return static_cast<bool>(e.findObjectWithTag(1)); }},
+      {"findObjectWithTag:", [](Engine& e) { return static_cast<bool>(e.findObjectWithTag(1)); }},
       {"restoreOriginalTagValues", silent([](Engine& e) { e.restoreOriginalTagValues(); })},
       {"startTimerWithValue:forKey:", silent([](Engine& e) { e.startTimerWithValue(1, "1"); })},
       {"killAllTimers", silent([](Engine& e) { e.killAllTimers(); })},
@@ -96,8 +95,8 @@ std::vector<Operation> everyOperation() {
       {processor +
            "SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER:WITH_FONT_NAME:WITH_SIZE:FOR_OBJECT_ID:",
        [=](Engine& e) {
-         return e.QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER(
-             nullptr, nullptr, nullptr, id);
+         return e.QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER(nullptr, nullptr,
+                                                                                   nullptr, id);
        }},
       {processor + "SET_ATTRIBUTED_STRING_AS_IS:WITH_HTML:WITH_FONT_NAME:WITH_SIZE:FOR_OBJECT_ID:",
        [=](Engine& e) {
@@ -211,8 +210,8 @@ TEST_F(Subclasses, PerformWhatTimersCall) {
   recorder->overridden = {"flasherFired:", "pseudoButtonPush:"};
   engine->startTimerWithValue(1, "8");
   toolkit.advance(1.2);
-  EXPECT_EQ(recorder->performed, (std::vector<std::string>{"flasherFired:", "flasherFired:",
-                                                           "pseudoButtonPush:"}));
+  EXPECT_EQ(recorder->performed,
+            (std::vector<std::string>{"flasherFired:", "flasherFired:", "pseudoButtonPush:"}));
   EXPECT_EQ(engine->objectIdTimers()->count(), 1U);  // the override did not remove it
   engine->terminateParser();
 }

@@ -9,7 +9,7 @@
 bool runsTheCppEngine();  // in a file without Objective-C
 
 static void bothEnginesRun() {
-  QZ_Plist_State_Parser *const engine = [[QZ_Plist_State_Parser alloc] initWithWindow:nil];
+  QZ_Plist_State_Parser* const engine = [[QZ_Plist_State_Parser alloc] initWithWindow:nil];
   qz::toolkit::memory::MemoryToolkit toolkit;
   const auto other = qz::QZ_Plist_State_Parser::initWithWindow(toolkit, nullptr);
   CHECK([engine doSimpleCommand:@"IDLE_LOOP" withParams:nil usingObject:nil]);
@@ -21,7 +21,7 @@ static void bothEnginesRun() {
 }
 
 int main() {
-  NSAutoreleasePool *const pool = [[NSAutoreleasePool alloc] init];
+  NSAutoreleasePool* const pool = [[NSAutoreleasePool alloc] init];
   [[NSApplication sharedApplication] finishLaunching];
   runTest("bothEnginesRun", bothEnginesRun);
   [pool release];

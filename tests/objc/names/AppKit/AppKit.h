@@ -12,7 +12,8 @@ typedef struct {
 
 @protocol NSObject
 @end
-__attribute__((objc_root_class)) @interface NSObject<NSObject>
+__attribute__((objc_root_class))
+@interface NSObject<NSObject>
 @end
 @protocol NSWindowDelegate <NSObject>
 @end
