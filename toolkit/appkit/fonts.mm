@@ -12,6 +12,7 @@
 #include <vector>
 
 #include "toolkit/backend/font_names.hpp"
+#import "toolkit/appkit/calling.hpp"
 #import "toolkit/foundation/strings.hpp"
 
 namespace qz::toolkit::appkit {
@@ -67,8 +68,10 @@ class Families {
   }
 
   static bool isFixedPitch(NSString* family) {
-    NSFont* const font =
-        [[NSFontManager sharedFontManager] fontWithFamily:family traits:0 weight:5 size:12];
+    NSFont* const font = [[NSFontManager sharedFontManager] fontWithFamily:family
+                                                                    traits:0
+                                                                    weight:5
+                                                                      size:12];
     return [font isFixedPitch];
   }
 
@@ -99,7 +102,7 @@ NSFontTraitMask traitsOf(const Font& font) {
 }  // namespace
 
 std::optional<Font> AppKitFonts::fontWithName(std::string_view name, double size) const {
-  auto font = Families::known().fontNamed(name);
+  auto font = calling([&] { return Families::known().fontNamed(name); });
   if (font && size > 0) font->size = size;
   return font;
 }

@@ -44,7 +44,7 @@ class AppKitRunLoop final : public TimedRunLoop {
 
   Clock& clock_;
   Calls& calls_;
-  foundation::Kept<id> wakener_;       // the target of `alarm_`
+  foundation::Kept<id> wakener_;      // the target of `alarm_`
   foundation::Kept<NSTimer*> alarm_;  // set to the timer that is due first
   bool userIsBusy_ = false;
 };
