@@ -108,14 +108,16 @@ std::optional<Font> AppKitFonts::fontWithName(std::string_view name, double size
 }
 
 NSFont* nsFont(const Font& font) {
+  // GNUstep draws no text any more, in any font, after a size that it cannot draw.
+  const double size = std::clamp(font.size, 1.0, 1000.0);
   constexpr NSInteger regular = 5;
   constexpr NSInteger bold = 9;
   NSFont* const drawn =
       [[NSFontManager sharedFontManager] fontWithFamily:Families::known().drawnWith(font.family)
                                                  traits:traitsOf(font)
                                                  weight:font.bold ? bold : regular
-                                                   size:static_cast<float>(font.size)];
-  return drawn ? drawn : [NSFont userFontOfSize:font.size];
+                                                   size:static_cast<float>(size)];
+  return drawn ? drawn : [NSFont userFontOfSize:size];
 }
 
 Font fontOf(NSFont* font) {
