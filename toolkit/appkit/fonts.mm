@@ -11,8 +11,8 @@
 #include <unordered_map>
 #include <vector>
 
-#include "toolkit/backend/font_names.hpp"
 #import "toolkit/appkit/calling.hpp"
+#include "toolkit/backend/font_names.hpp"
 #import "toolkit/foundation/strings.hpp"
 
 namespace qz::toolkit::appkit {

@@ -40,7 +40,6 @@ class AppKitRunLoop final : public TimedRunLoop {
 
  private:
   void reach(double due) override;
-  void stopAlarm();
 
   Clock& clock_;
   Calls& calls_;
