@@ -88,9 +88,8 @@ bool AppKitDriver::savePicture(const Ref<Window>& window, const std::string& pat
   const auto shown = AppKitWindow::of(window);
   if (!shown || ![shown->object() isVisible]) return false;
   return sending([&] {
-    NSData* const png =
-        [pictureOf(*shown) representationUsingType:NSPNGFileType
-                                                properties:[NSDictionary dictionary]];
+    NSData* const png = [pictureOf(*shown) representationUsingType:NSPNGFileType
+                                                        properties:[NSDictionary dictionary]];
     return png && [png writeToFile:nsString(path) atomically:NO];
   });
 }

@@ -116,6 +116,9 @@ void AppKitButton::highlight(bool highlighted) {
 void AppKitButton::setBackgroundColor(const Color& color) {
   calling([&] {
     [static_cast<NSButtonCell*>([button() cell]) setBackgroundColor:nsColor(color)];
+#ifdef GNUSTEP
+    [button() setBordered:NO];  // GNUstep's bezels cover the colour
+#endif
     [button() setNeedsDisplay:YES];
     background_ = color;
   });
