@@ -58,10 +58,12 @@ class AppKitDriver final : public Driver {
   void wait(double seconds);
   void jump(double seconds);
   void settle();
+  void setHeld(bool held);
   void raiseWhatWasThrown();
 
   bool realTime_ = false;
-  toolkit::foundation::Kept<NSButton*> held_;  // pretends to be held down
+  bool isHeld_ = false;                      // the mouse button is held down
+  toolkit::foundation::Kept<NSView*> held_;  // the button that it holds, until a keyboard click
   PacedClock clock_;
   std::exception_ptr thrown_;  // by the last click or advance
   AppKitToolkit toolkit_{clock_};

@@ -6,14 +6,28 @@
 #include <algorithm>
 #include <utility>
 
+#import "drivers/appkit/tagged_views.hpp"
 #include "drivers/appkit/toolkit_row.hpp"
 #include "qz/toolkit/exception.hpp"
-#import "drivers/appkit/tagged_views.hpp"
 #import "toolkit/appkit/parts.hpp"
 #import "toolkit/appkit/views.hpp"
 #import "toolkit/appkit/window.hpp"
 #import "toolkit/foundation/exceptions.hpp"
 #import "toolkit/foundation/strings.hpp"
+
+/// Takes the arguments of the program, which GNUstep would open as documents.
+@interface QZDriverDelegate : NSObject
+@end
+
+@implementation QZDriverDelegate
+
+- (BOOL)application:(NSApplication*)application openFile:(NSString*)path {
+  (void)application;
+  (void)path;
+  return YES;
+}
+
+@end
 
 namespace qz::drivers {
 
@@ -26,37 +40,37 @@ using toolkit::foundation::utf8;
 namespace {
 
 template <class ViewClass>
-NSView* plain(NSRect frame) {
-  return [[[ViewClass alloc] initWithFrame:frame] autorelease];
+NSView* plain() {
+  return [[[ViewClass alloc] initWithFrame:NSZeroRect] autorelease];
 }
 
-NSButton* pushButton(NSRect frame) {
-  NSButton* const button = [[[NSButton alloc] initWithFrame:frame] autorelease];
+NSButton* pushButton() {
+  NSButton* const button = [[[NSButton alloc] initWithFrame:NSZeroRect] autorelease];
   [button setTitle:@"Button"];
   return button;
 }
 
-NSView* newButton(NSRect frame) { return pushButton(frame); }
+NSView* newButton() { return pushButton(); }
 
-NSView* newToggle(NSRect frame) {
-  NSButton* const button = pushButton(frame);
+NSView* newToggle() {
+  NSButton* const button = pushButton();
   [button setButtonType:NSSwitchButton];
   return button;
 }
 
-NSView* newMixed(NSRect frame) {
-  NSButton* const button = static_cast<NSButton*>(newToggle(frame));
+NSView* newMixed() {
+  NSButton* const button = static_cast<NSButton*>(newToggle());
   [button setAllowsMixedState:YES];
   return button;
 }
 
-NSView* newPopUpButton(NSRect frame) {
-  return [[[NSPopUpButton alloc] initWithFrame:frame pullsDown:NO] autorelease];
+NSView* newPopUpButton() {
+  return [[[NSPopUpButton alloc] initWithFrame:NSZeroRect pullsDown:NO] autorelease];
 }
 
 // A label, as hosts have: a new text field has a frame and can be edited.
-NSView* newTextField(NSRect frame) {
-  NSTextField* const field = [[[NSTextField alloc] initWithFrame:frame] autorelease];
+NSView* newTextField() {
+  NSTextField* const field = [[[NSTextField alloc] initWithFrame:NSZeroRect] autorelease];
   [field setEditable:NO];
   [field setBezeled:NO];
   [field setDrawsBackground:NO];
@@ -67,7 +81,7 @@ NSView* newTextField(NSRect frame) {
 struct AppKitKind {
   ViewKind kind;
   std::string_view className;
-  NSView* (*make)(NSRect frame);
+  NSView* (*make)();
 };
 
 constexpr AppKitKind appKitKinds[] = {
@@ -105,8 +119,9 @@ void requireApplication() {
   const Pool pool;
   sending([] {
     if (NSApp) return;
-    // Without `finishLaunching`, which takes the arguments of the program for files to open.
     [NSApplication sharedApplication];
+    [NSApp setDelegate:[[QZDriverDelegate alloc] init]];  // lives as long as the application
+    [NSApp finishLaunching];
   });
 }
 
@@ -115,13 +130,15 @@ NSPoint middleOf(NSView* view) {
   return [view convertPoint:NSMakePoint(NSMidX(bounds), NSMidY(bounds)) toView:nil];
 }
 
-// Whether a click in the middle of the view reaches it.
-bool isReached(NSView* view) {
+// Whether the user sees the view, and no sheet is attached to its window.
+bool takesInput(NSView* view) {
   NSWindow* const window = [view window];
-  if (![window isVisible] || [view isHiddenOrHasHiddenAncestor]) return false;
-  NSView* const top = [[window contentView] superview];
-  NSView* const hit = [top hitTest:middleOf(view)];
-  return hit && [hit isDescendantOf:view];
+  return [window isVisible] && ![view isHiddenOrHasHiddenAncestor] && !SheetPlace::covers(window);
+}
+
+bool isUnderMouse(NSView* view) {
+  NSView* const top = [[[view window] contentView] superview];
+  return [[top hitTest:middleOf(view)] isDescendantOf:view];
 }
 
 NSEvent* mouseEvent(NSEventType type, NSView* view) {
@@ -147,8 +164,19 @@ void clickWithMouse(NSView* view) {
                                         dequeue:YES]];
 }
 
-void sendActionOf(NSControl* control) {
-  if ([control isEnabled]) [control sendAction:[control action] to:[control target]];
+bool isButton(NSView* view) { return [view isKindOfClass:[NSButton class]]; }
+bool isPopUp(NSView* view) { return [view isKindOfClass:[NSPopUpButton class]]; }
+
+// As the space key does, but at once: AppKit would show the button pressed in for a moment. Only
+// buttons react.
+void clickWithoutMouse(NSView* view) {
+  NSButton* const button = static_cast<NSButton*>(view);
+  if (!isButton(view) || ![button isEnabled]) return;
+  [button highlight:NO];
+  if (kindOf(button) == ViewKind::toggle || kindOf(button) == ViewKind::mixed) {
+    [static_cast<NSCell*>([button cell]) setNextState];
+  }
+  [button sendAction:[button action] to:[button target]];
 }
 
 }  // namespace
@@ -171,9 +199,9 @@ Ref<Window> AppKitDriver::makeWindow(const Rect& content) {
 Ref<View> AppKitDriver::makeView(ViewKind kind, Tag tag, const Rect& frame,
                                  const Ref<View>& parent) {
   const Pool pool;
-  NSView* const object =
-      rowOf(appKitKinds, kind).make(NSMakeRect(frame.x, frame.y, frame.width, frame.height));
-  Ref<View> view = toolkit_.application().view(object);
+  const auto node = toolkit_.application().desk()->nodeOf(rowOf(appKitKinds, kind).make());
+  node->place(frame);
+  Ref<View> view = node->view();
   view->setTag(tag);
   parent->addSubview(view);
   return view;
@@ -214,15 +242,11 @@ std::string_view AppKitDriver::className(ViewKind kind) const {
 void AppKitDriver::click(const Ref<View>& view) {
   const Pool pool;
   settle();
-  NSView* const object = toolkit_.application().object(view);
-  if (!object || !isReached(object)) return;
-  const Kept<NSView*> kept(object);
-  sending([&] {
-    const bool sendsAtOnce = held_ || [object isKindOfClass:[NSPopUpButton class]];
-    if (!sendsAtOnce) return clickWithMouse(object);
-    if (held_.get() == object) held_ = {};
-    if ([object isKindOfClass:[NSButton class]]) sendActionOf(static_cast<NSControl*>(object));
-  });
+  const Kept<NSView*> object(toolkit_.application().object(view));
+  if (!takesInput(object.get())) return;
+  const bool withMouse = !isHeld_ && !isPopUp(object.get()) && isUnderMouse(object.get());
+  if (object.get() == held_.get()) held_ = {};
+  sending([&] { withMouse ? clickWithMouse(object.get()) : clickWithoutMouse(object.get()); });
   settle();
   raiseWhatWasThrown();
 }
@@ -231,25 +255,30 @@ void AppKitDriver::hold(const Ref<View>& view) {
   const Pool pool;
   letGo();
   NSView* const object = toolkit_.application().object(view);
-  if (![object isKindOfClass:[NSButton class]] || !isReached(object)) return;
+  if (!isButton(object) || !takesInput(object)) return;
   if (![static_cast<NSButton*>(object) isEnabled]) return;
-  held_ = Kept<NSButton*>(static_cast<NSButton*>(object));
-  toolkit_.parts().runLoop.setUserIsBusy(true);
+  held_ = Kept<NSView*>(object);
+  setHeld(true);
+}
+
+void AppKitDriver::setHeld(bool held) {
+  isHeld_ = held;
+  toolkit_.parts().runLoop.setUserIsBusy(held);
 }
 
 void AppKitDriver::letGo() {
   const Pool pool;
-  if (toolkit_.parts().runLoop.isInDefaultMode()) return;
-  toolkit_.parts().runLoop.setUserIsBusy(false);
-  const Kept<NSButton*> held = std::exchange(held_, {});
-  if (held && isReached(held.get())) sending([&] { clickWithMouse(held.get()); });
+  if (!isHeld_) return;
+  setHeld(false);
+  const Kept<NSView*> held = std::exchange(held_, {});
+  if (takesInput(held.get())) sending([&] { clickWithMouse(held.get()); });
   settle();
   advance(0);
 }
 
 void AppKitDriver::advance(double seconds) {
   const Pool pool;
-  if (!held_ || !isReached(held_.get())) toolkit_.parts().runLoop.setUserIsBusy(false);
+  if (held_ && !takesInput(held_.get())) setHeld(false);
   if (realTime_) {
     wait(std::max(seconds, 0.0));
   } else {

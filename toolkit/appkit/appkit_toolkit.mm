@@ -4,8 +4,8 @@
 #include "qz/toolkit/appkit/appkit_toolkit.hpp"
 
 #import "toolkit/appkit/attributed_text.hpp"
-#import "toolkit/appkit/parts.hpp"
 #import "toolkit/appkit/calling.hpp"
+#import "toolkit/appkit/parts.hpp"
 
 namespace qz::toolkit::appkit {
 
@@ -22,13 +22,12 @@ AppKitLog& AppKitToolkit::log() { return parts_->log; }
 Calls& AppKitToolkit::calls() { return parts_->application.desk()->calls; }
 
 // GNUstep's reader yields nothing.
-std::optional<AttributedString> AppKitToolkit::attributedStringWithHTML(
-    std::string_view document) {
+std::optional<AttributedString> AppKitToolkit::attributedStringWithHTML(std::string_view document) {
 #ifndef GNUSTEP
   const auto read = calling([&]() -> std::optional<AttributedString> {
     NSData* const data = [NSData dataWithBytes:document.data() length:document.size()];
-    NSAttributedString* const string =
-        [[[NSAttributedString alloc] initWithHTML:data documentAttributes:NULL] autorelease];
+    NSAttributedString* const string = [[[NSAttributedString alloc] initWithHTML:data
+                                                              documentAttributes:NULL] autorelease];
     return string ? std::optional(attributedStringOf(string)) : std::nullopt;
   });
   if (read) return read;

@@ -3,33 +3,22 @@
 
 #include "qz/toolkit/appkit/application.hpp"
 
+#import "toolkit/appkit/calling.hpp"
 #import "toolkit/appkit/desk.hpp"
 #import "toolkit/appkit/views.hpp"
 #import "toolkit/appkit/window.hpp"
-#import "toolkit/appkit/calling.hpp"
 
 namespace qz::toolkit::appkit {
 
 namespace {
 
 template <class ViewClass>
-Ref<View> made(ViewClass* (*make)(NSRect), const Rect& frame, const std::shared_ptr<Desk>& desk) {
+Ref<View> made(const Rect& frame, const std::shared_ptr<Desk>& desk) {
   return calling([&] {
-    const foundation::Pool pool;
-    return desk->nodeOf(make(NSMakeRect(frame.x, frame.y, frame.width, frame.height)))->view();
+    const auto node = desk->nodeOf([[[ViewClass alloc] initWithFrame:NSZeroRect] autorelease]);
+    node->place(frame);
+    return node->view();
   });
-}
-
-NSButton* makeNSButton(NSRect frame) {
-  return [[[NSButton alloc] initWithFrame:frame] autorelease];
-}
-
-NSImageView* makeNSImageView(NSRect frame) {
-  return [[[NSImageView alloc] initWithFrame:frame] autorelease];
-}
-
-NSTextField* makeNSTextField(NSRect frame) {
-  return [[[NSTextField alloc] initWithFrame:frame] autorelease];
 }
 
 }  // namespace
@@ -43,15 +32,15 @@ Ref<Window> AppKitApplication::makeWindow(const Rect& content, StyleMask style,
 }
 
 Ref<Button> AppKitApplication::makeButton(const Rect& frame) {
-  return asButton(made(makeNSButton, frame, desk_));
+  return asButton(made<NSButton>(frame, desk_));
 }
 
 Ref<ImageView> AppKitApplication::makeImageView(const Rect& frame) {
-  return asImageView(made(makeNSImageView, frame, desk_));
+  return asImageView(made<NSImageView>(frame, desk_));
 }
 
 Ref<TextField> AppKitApplication::makeTextField(const Rect& frame) {
-  return asTextField(made(makeNSTextField, frame, desk_));
+  return asTextField(made<NSTextField>(frame, desk_));
 }
 
 void AppKitApplication::beginSheet(const Ref<Window>& sheet, const Ref<Window>& parent,

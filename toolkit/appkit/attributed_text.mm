@@ -135,8 +135,7 @@ AttributedString converted(NSAttributedString* string, Change change) {
 }  // namespace
 
 NSAttributedString* nsAttributedString(const AttributedString& text, const TextLook& look) {
-  NSMutableAttributedString* const native =
-      [[[NSMutableAttributedString alloc] init] autorelease];
+  NSMutableAttributedString* const native = [[[NSMutableAttributedString alloc] init] autorelease];
   const std::string_view whole = text.string();
   for (const TextRun& run : text.runs()) {
     NSString* const part = nsString(whole.substr(run.range.location, run.range.length));

@@ -11,6 +11,7 @@
 #include <unordered_map>
 #include <vector>
 
+#import "toolkit/appkit/calling.hpp"
 #include "toolkit/backend/font_names.hpp"
 #import "toolkit/foundation/strings.hpp"
 
@@ -67,8 +68,10 @@ class Families {
   }
 
   static bool isFixedPitch(NSString* family) {
-    NSFont* const font =
-        [[NSFontManager sharedFontManager] fontWithFamily:family traits:0 weight:5 size:12];
+    NSFont* const font = [[NSFontManager sharedFontManager] fontWithFamily:family
+                                                                    traits:0
+                                                                    weight:5
+                                                                      size:12];
     return [font isFixedPitch];
   }
 
@@ -99,20 +102,22 @@ NSFontTraitMask traitsOf(const Font& font) {
 }  // namespace
 
 std::optional<Font> AppKitFonts::fontWithName(std::string_view name, double size) const {
-  auto font = Families::known().fontNamed(name);
+  auto font = calling([&] { return Families::known().fontNamed(name); });
   if (font && size > 0) font->size = size;
   return font;
 }
 
 NSFont* nsFont(const Font& font) {
+  // GNUstep draws no text any more, in any font, after a size that it cannot draw.
+  const double size = std::clamp(font.size, 1.0, 1000.0);
   constexpr NSInteger regular = 5;
   constexpr NSInteger bold = 9;
   NSFont* const drawn =
       [[NSFontManager sharedFontManager] fontWithFamily:Families::known().drawnWith(font.family)
                                                  traits:traitsOf(font)
                                                  weight:font.bold ? bold : regular
-                                                   size:static_cast<float>(font.size)];
-  return drawn ? drawn : [NSFont userFontOfSize:font.size];
+                                                   size:static_cast<float>(size)];
+  return drawn ? drawn : [NSFont userFontOfSize:size];
 }
 
 Font fontOf(NSFont* font) {

@@ -6,8 +6,8 @@
 
 #include <utility>
 
-#include "toolkit/backend/image_names.hpp"
 #import "toolkit/appkit/calling.hpp"
+#include "toolkit/backend/image_names.hpp"
 #import "toolkit/foundation/strings.hpp"
 
 namespace qz::toolkit::appkit {
@@ -24,6 +24,12 @@ NSImage* readImage(const std::string& path) {
   NSImage* const image =
       [[[NSImage alloc] initWithContentsOfFile:foundation::nsString(path)] autorelease];
   return [image isValid] ? image : nil;
+}
+
+// A name that is a path finds nothing, on every toolkit.
+NSImage* knownImage(std::string_view name) {
+  const bool isName = !name.empty() && name.find_first_of("/\\") == std::string_view::npos;
+  return isName ? [NSImage imageNamed:foundation::nsString(name)] : nil;
 }
 
 }  // namespace
@@ -46,8 +52,7 @@ Ref<Image> AppKitImages::imageNamed(std::string_view name) {
     const std::string path = imageFileNamed(name, files_.resourcePath()).value_or("");
     if (known != found_.end() && known->second->isOf(path)) return known->second;
     if (known != found_.end()) found_.erase(known);
-    NSImage* const image = path.empty() ? [NSImage imageNamed:foundation::nsString(name)]
-                                        : readImage(path);
+    NSImage* const image = path.empty() ? knownImage(name) : readImage(path);
     if (!image) return {};
     const auto found = std::make_shared<AppKitImage>(std::string(name), path, image);
     if (!path.empty()) found_.emplace(name, found);

@@ -7,8 +7,8 @@
 #include <string>
 #include <unordered_set>
 
-#import "toolkit/appkit/view_node.hpp"
 #import "toolkit/appkit/calling.hpp"
+#import "toolkit/appkit/view_node.hpp"
 #import "toolkit/foundation/strings.hpp"
 
 namespace qz::toolkit::appkit {
@@ -35,8 +35,8 @@ void perform(const ResponderPlace& place, SEL selector, id sender) {
   const auto responder = place.responder.lock();
   const auto desk = place.desk.lock();
   if (!desk) return;
-  const Ref<View> view = [sender isKindOfClass:[NSView class]] ? desk->nodeOf(sender)->view()
-                                                               : Ref<View>();
+  const Ref<View> view =
+      [sender isKindOfClass:[NSView class]] ? desk->nodeOf(sender)->view() : Ref<View>();
   if (desk->willAct) desk->willAct(view);
   desk->calls.make([&] {
     calling([&] {

@@ -40,11 +40,10 @@ class AppKitRunLoop final : public TimedRunLoop {
 
  private:
   void reach(double due) override;
-  void stopAlarm();
 
   Clock& clock_;
   Calls& calls_;
-  foundation::Kept<id> wakener_;       // the target of `alarm_`
+  foundation::Kept<id> wakener_;      // the target of `alarm_`
   foundation::Kept<NSTimer*> alarm_;  // set to the timer that is due first
   bool userIsBusy_ = false;
 };

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Sets the single `NSTimer`.
+// Moves the date of the single `NSTimer`.
 
 #import "toolkit/appkit/run_loop.hpp"
 
@@ -48,16 +48,23 @@ constexpr double longestWait = 24 * 60 * 60;
 
 }  // namespace
 
-AppKitRunLoop::AppKitRunLoop(Clock& clock, Calls& calls)
-    : clock_(clock),
-      calls_(calls),
-      wakener_(foundation::Kept<id>::adopt([[QZWakener alloc] initWithLoop:this])) {}
+AppKitRunLoop::AppKitRunLoop(Clock& clock, Calls& calls) : clock_(clock), calls_(calls) {
+  const foundation::Pool pool;
+  wakener_ = foundation::Kept<id>::adopt([[QZWakener alloc] initWithLoop:this]);
+  // Repeats, so that it stays valid; `setAlarm` moves its date.
+  alarm_ = foundation::Kept<NSTimer*>([NSTimer timerWithTimeInterval:longestWait
+                                                              target:wakener_.get()
+                                                            selector:@selector(wake:)
+                                                            userInfo:nil
+                                                             repeats:YES]);
+  [[NSRunLoop currentRunLoop] addTimer:alarm_.get() forMode:NSDefaultRunLoopMode];
+}
 
 AppKitRunLoop::~AppKitRunLoop() {
+  const foundation::Pool pool;
   [wakener_.get() forgetLoop];
-  stopAlarm();
+  [alarm_.get() invalidate];
   invalidateAll();
-  stopAlarm();  // an action that ended may have scheduled another
 }
 
 Ref<Timer> AppKitRunLoop::schedule(double interval, bool repeats, TimerAction action) {
@@ -77,23 +84,13 @@ void AppKitRunLoop::reach(double due) {
   setAlarm();
 }
 
-void AppKitRunLoop::stopAlarm() {
-  [alarm_.get() invalidate];
-  alarm_ = {};
-}
-
 void AppKitRunLoop::setAlarm() {
   const foundation::Pool pool;
-  stopAlarm();
-  const auto due = nextDue();
-  if (!due || userIsBusy_) return;
-  const double wait = std::clamp(*due - clock_.horizon(), 0.0, longestWait);
-  alarm_ = foundation::Kept<NSTimer*>([NSTimer timerWithTimeInterval:wait
-                                                              target:wakener_.get()
-                                                            selector:@selector(wake:)
-                                                            userInfo:nil
-                                                             repeats:NO]);
-  [[NSRunLoop currentRunLoop] addTimer:alarm_.get() forMode:NSDefaultRunLoopMode];
+  if (![alarm_.get() isValid]) return;  // the toolkit ends
+  const auto due = userIsBusy_ ? std::nullopt : nextDue();
+  const double wait =
+      std::clamp(due.value_or(clock_.now() + longestWait) - clock_.horizon(), 0.0, longestWait);
+  [alarm_.get() setFireDate:[NSDate dateWithTimeIntervalSinceNow:wait]];
 }
 
 }  // namespace qz::toolkit::appkit

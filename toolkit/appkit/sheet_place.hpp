@@ -16,6 +16,8 @@ class SheetPlace {
  public:
   SheetPlace(NSWindow* sheet, NSWindow* parent);
   ~SheetPlace();
+  /// Whether a sheet is attached to the window.
+  static bool covers(NSWindow* window);
   SheetPlace(const SheetPlace&) = delete;
   SheetPlace& operator=(const SheetPlace&) = delete;
 

@@ -55,4 +55,9 @@ SheetPlace::SheetPlace(NSWindow* sheet, NSWindow* parent) : cover_(coveredConten
 
 SheetPlace::~SheetPlace() { [cover_.get() removeFromSuperview]; }
 
+bool SheetPlace::covers(NSWindow* window) {
+  NSView* const frontmost = [[[[window contentView] superview] subviews] lastObject];
+  return [frontmost isKindOfClass:[QZSheetCover class]];
+}
+
 }  // namespace qz::toolkit::appkit

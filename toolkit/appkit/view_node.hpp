@@ -9,6 +9,7 @@
 #import <AppKit/AppKit.h>
 
 #include <memory>
+#include <optional>
 #include <string>
 
 #include "qz/toolkit/geometry.hpp"
@@ -31,6 +32,8 @@ class ViewNode : public std::enable_shared_from_this<ViewNode> {
   Ref<View> view();
   NSView* object() const { return object_.get(); }
 
+  /// Moves the view to `frame` in its superview. The frame is remembered as it is until the host
+  /// moves the view: AppKit allows no negative size.
   void place(const Rect& frame);
   void removeFromSuperview();
   bool isHidden() const { return [object() isHidden]; }
@@ -59,7 +62,13 @@ class ViewNode : public std::enable_shared_from_this<ViewNode> {
   std::shared_ptr<Desk> desk_;
 
  private:
+  struct Placement {
+    Rect asked;
+    NSRect got;
+  };
+
   foundation::Kept<NSView*> object_;
+  std::optional<Placement> placement_;
   Subviews subviews_;
   bool wantsLayer_ = false;
   Ref<Image> layerContents_;

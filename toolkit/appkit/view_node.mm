@@ -7,9 +7,9 @@
 #include <utility>
 
 #include "qz/toolkit/exception.hpp"
-#include "toolkit/backend/insertion.hpp"
-#import "toolkit/appkit/layer.hpp"
 #import "toolkit/appkit/calling.hpp"
+#import "toolkit/appkit/layer.hpp"
+#include "toolkit/backend/insertion.hpp"
 #import "toolkit/foundation/strings.hpp"
 
 namespace qz::toolkit::appkit {
@@ -76,11 +76,13 @@ void ViewNode::writeTag(Tag tag) {
 
 Rect ViewNode::readFrame() const {
   const NSRect frame = [object() frame];
+  if (placement_ && NSEqualRects(placement_->got, frame)) return placement_->asked;
   return {frame.origin.x, frame.origin.y, frame.size.width, frame.size.height};
 }
 
 void ViewNode::place(const Rect& frame) {
-  [object() setFrame:NSMakeRect(frame.x, frame.y, frame.width, frame.height)];
+  calling([&] { [object() setFrame:NSMakeRect(frame.x, frame.y, frame.width, frame.height)]; });
+  placement_ = Placement{frame, [object() frame]};
 }
 
 const Subviews& ViewNode::readSubviews() {

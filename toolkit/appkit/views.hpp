@@ -15,14 +15,15 @@
 
 #include "qz/toolkit/view.hpp"
 #import "toolkit/appkit/attributed_text.hpp"
+#import "toolkit/appkit/calling.hpp"
 #import "toolkit/appkit/responders.hpp"
 #import "toolkit/appkit/view_node.hpp"
-#import "toolkit/appkit/calling.hpp"
 
 namespace qz::toolkit::appkit {
 
-/// Makes the view of `view`: a button for an `NSButton`, a text field for an `NSTextField`, an image
-/// view for an `NSImageView`; for another `NSControl` a view that understands what all controls do.
+/// Makes the view of `view`: a button for an `NSButton`, a text field for an `NSTextField`, an
+/// image view for an `NSImageView`; for another `NSControl` a view that understands what all
+/// controls do.
 std::shared_ptr<ViewNode> makeView(NSView* view, const std::shared_ptr<Desk>& desk);
 
 /// What all controls have in common, whatever their role.
@@ -126,6 +127,8 @@ class AppKitButton final : public AppKitControl<Button> {
   TextLook look() const;
   void show(const AttributedString& title);
   bool showsState() const;
+  bool isPopUp() const;
+  NSString* shownTitle() const;
 
   // Of a push button, because GNUstep changes its state with every click.
   State heldState_ = static_cast<State>([button() state]);

@@ -3,9 +3,9 @@
 
 #import "toolkit/appkit/views.hpp"
 
-#include "toolkit/backend/responder_chain.hpp"
 #import "toolkit/appkit/images.hpp"
 #import "toolkit/appkit/window.hpp"
+#include "toolkit/backend/responder_chain.hpp"
 #import "toolkit/foundation/strings.hpp"
 
 namespace qz::toolkit::appkit {
@@ -57,11 +57,20 @@ bool ControlNode::send(std::string_view action, const std::shared_ptr<Responder>
   return calling([&] { return sendAlongResponderChain(action, target, view(), places); });
 }
 
+bool AppKitButton::isPopUp() const { return [object() isKindOfClass:[NSPopUpButton class]]; }
+
+// The title of a pop-up button is that of the chosen item.
+NSString* AppKitButton::shownTitle() const {
+  return isPopUp() ? [static_cast<NSPopUpButton*>(button()) titleOfSelectedItem] : [button() title];
+}
+
 // AppKit does not say whether a title has attributes. The text tells whether the host has set
 // another title since.
 std::optional<AttributedString> AppKitButton::attributedTitle() const {
   return calling([&]() -> std::optional<AttributedString> {
-    if (title_ && title_->string() == utf8([button() title])) return title_;
+    const std::string shown = utf8(shownTitle());
+    if (title_ && title_->string() == shown) return title_;
+    if (isPopUp()) return AttributedString(shown);
     return attributedStringOf([button() attributedTitle], look());
   });
 }
@@ -75,7 +84,7 @@ TextLook AppKitButton::look() const {
 void AppKitButton::show(const AttributedString& title) {
   calling([&] {
     title_ = title;
-    if (isPlain(title)) {
+    if (isPlain(title) || isPopUp()) {
       [button() setTitle:nsString(title.string())];
     } else {
       [button() setAttributedTitle:nsAttributedString(title, look())];
@@ -107,6 +116,9 @@ void AppKitButton::highlight(bool highlighted) {
 void AppKitButton::setBackgroundColor(const Color& color) {
   calling([&] {
     [static_cast<NSButtonCell*>([button() cell]) setBackgroundColor:nsColor(color)];
+#ifdef GNUSTEP
+    [button() setBordered:NO];  // GNUstep's bezels cover the colour
+#endif
     [button() setNeedsDisplay:YES];
     background_ = color;
   });

@@ -13,11 +13,11 @@
 #include "qz/toolkit/application.hpp"
 #include "qz/toolkit/geometry.hpp"
 #include "qz/toolkit/window.hpp"
-#include "toolkit/backend/kept_by.hpp"
-#include "toolkit/backend/sheet_session.hpp"
 #import "toolkit/appkit/desk.hpp"
 #import "toolkit/appkit/responders.hpp"
 #import "toolkit/appkit/sheet_place.hpp"
+#include "toolkit/backend/kept_by.hpp"
+#include "toolkit/backend/sheet_session.hpp"
 #import "toolkit/foundation/kept.hpp"
 
 namespace qz::toolkit::appkit {

@@ -7,8 +7,8 @@
 #include <utility>
 
 #import "toolkit/appkit/attributed_text.hpp"
-#import "toolkit/appkit/view_node.hpp"
 #import "toolkit/appkit/calling.hpp"
+#import "toolkit/appkit/view_node.hpp"
 
 using qz::toolkit::appkit::AppKitWindow;
 
@@ -47,7 +47,6 @@ using qz::toolkit::appkit::AppKitWindow;
 
 namespace qz::toolkit::appkit {
 
-
 namespace {
 
 /// The code of a sheet that the user has closed.
@@ -69,8 +68,7 @@ AppKitWindow::AppKitWindow(NSWindow* window, std::shared_ptr<Desk> desk, KeptBy 
 }
 
 std::shared_ptr<AppKitWindow> AppKitWindow::make(NSWindow* window,
-                                                 const std::shared_ptr<Desk>& desk,
-                                                 KeptBy keptBy) {
+                                                 const std::shared_ptr<Desk>& desk, KeptBy keptBy) {
   std::shared_ptr<AppKitWindow> made(new AppKitWindow(window, desk, keptBy));
   desk->enter(window, made);
   return made;
@@ -192,8 +190,7 @@ void AppKitWindow::detach() {
 }
 
 void AppKitWindow::beginAsSheet(const std::shared_ptr<AppKitWindow>& parent,
-                                const std::shared_ptr<SheetDelegate>& delegate,
-                                void* contextInfo) {
+                                const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo) {
   const foundation::Pool pool;
   detach();
   session_.begin(delegate, contextInfo);
