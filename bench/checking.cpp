@@ -15,10 +15,10 @@
 #include "bench/spin_verifier.hpp"
 #include "bench/switches.hpp"
 #include "tools/check/conclusions.hpp"
-#include "tools/check/exploration.hpp"
 #include "tools/check/look_conclusions.hpp"
-#include "tools/check/script.hpp"
-#include "tools/check/world.hpp"
+#include "tools/exploration/exploration.hpp"
+#include "tools/exploration/script.hpp"
+#include "tools/exploration/world.hpp"
 
 namespace qz {
 

@@ -16,6 +16,7 @@ void QZ_Plist_State_Parser::buttonPushed(Control sender) {
   state_->toolkit.log().write("Button tag " + key + " pressed.");
   state_->buttonStates->setObject(toolkit::Number::withBool(sender->state() == toolkit::State::on),
                                   key);
+  state_->notify(&Observer::controlPressed, sender);
   const Value list = state_->plistDictionary->objectForKey(key);
   if (!list || !toolkit::asButton(sender)) return;
   processCommandArray(list, toolkit::Number::withLong(tag));

@@ -21,12 +21,12 @@
 #include <variant>
 
 #include "drivers/memory/memory_driver.hpp"
-#include "drivers/view_kinds.hpp"
 #include "fuzz/require.hpp"
 #include "fuzz/run_lengths.hpp"
+#include "qz/drivers/view_kinds.hpp"
 #include "qz/toolkit/exception.hpp"
 #include "tools/check/report.hpp"
-#include "tools/check/world.hpp"
+#include "tools/exploration/world.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/walkthrough/stand_in.hpp"
 #include "tools/walkthrough/step_picture.hpp"

@@ -3,7 +3,7 @@
 
 #include "engine/state.hpp"
 #include "engine/text_of.hpp"
-#include "toolkit/class_names.hpp"
+#include "qz/toolkit/class_names.hpp"
 
 namespace qz {
 

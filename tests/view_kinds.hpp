@@ -7,7 +7,7 @@
 #include <memory>
 #include <string>
 
-#include "drivers/driver.hpp"
+#include "qz/drivers/driver.hpp"
 #include "tests/enumerators.hpp"
 
 namespace qz {

@@ -278,7 +278,8 @@ void addExploringOptions(Command& command, CheckOptions& options) {
       .repeated(
           "--start", [&](const std::string& key) { options.startKeys.push_back(key); },
           "A list with which the walk-through may start (default: the smallest tag)")
-      .valueName("KEY");
+      .valueName("KEY")
+      .scriptKey();
   command
       .taken(
           "--limit", [&](const std::string& n) { options.limits.places = positive("--limit", n); },

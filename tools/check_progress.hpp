@@ -6,7 +6,7 @@
 #include <mutex>
 #include <string>
 
-#include "tools/check/exploration.hpp"
+#include "tools/exploration/exploration.hpp"
 
 namespace qz::tools {
 

@@ -140,6 +140,11 @@ Command::Option& Command::Option::directory() {
   return *this;
 }
 
+Command::Option& Command::Option::scriptKey() {
+  hints_[option_].isScriptKey = true;
+  return *this;
+}
+
 // Options pass their words on unconverted: CLI11's conversions are templates, which take longer to
 // compile than the rest of this file.
 namespace {

@@ -29,6 +29,7 @@ struct ValueHint {
   std::vector<std::string> choices;  ///< every value that is accepted; empty if they are not known
   bool isFile = false;               ///< the path of a file
   bool isDirectory = false;          ///< the path of a directory
+  bool isScriptKey = false;          ///< a key of the script that is on the line
 };
 
 /// The hints of the options that have one.
@@ -59,6 +60,8 @@ class Command {
     Option& file();
     /// Lets shells complete the value as the path of a directory.
     Option& directory();
+    /// Lets shells complete the value as a key of the script that is on the line.
+    Option& scriptKey();
 
    private:
     CLI::Option* option_;

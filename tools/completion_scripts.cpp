@@ -1,8 +1,9 @@
 // SPDX-License-Identifier: MIT
-// Writes completion scripts. Each script lists what every command accepts, so that completing does
-// not run the tool.
+// Writes completion scripts. Each script lists what every command accepts. Completing runs the tool
+// only for the keys of the script that is on the line.
 #include "tools/completion_scripts.hpp"
 
+#include <set>
 #include <utility>
 
 namespace qz::tools {
@@ -25,6 +26,18 @@ std::string replaced(std::string text, std::string_view mark, const std::string&
   return text.replace(text.find(mark), mark.size(), by);
 }
 
+/// Returns the options whose values are files. The script on the line is the first file that is not
+/// the value of one.
+std::vector<std::string> fileOptions(const std::vector<CommandOutline>& commands) {
+  std::set<std::string> names;
+  for (const CommandOutline& command : commands) {
+    for (const OptionOutline& option : command.options) {
+      if (option.value.isFile) names.insert(option.name);
+    }
+  }
+  return {names.begin(), names.end()};
+}
+
 // --- bash ---
 
 constexpr std::string_view bashScript =
@@ -34,6 +47,20 @@ _qz_walkthrough_words() { mapfile -t COMPREPLY < <(compgen -W "$1" -- "$current"
 _qz_walkthrough_paths() {  # -f for files, -d for directories
   compopt -o filenames 2>/dev/null
   mapfile -t COMPREPLY < <(compgen "$1" -- "$current")
+}
+
+_qz_walkthrough_keys() {  # of the script on the line
+  local i word key
+  for ((i = 2; i < COMP_CWORD; i++)); do
+    [[ " @files@ " == *" ${COMP_WORDS[i - 1]} "* ]] && continue
+    word=${COMP_WORDS[i]//\\/}
+    word=${word/#"~/"/"$HOME/"}
+    [[ -f $word ]] || continue
+    while IFS= read -r key; do  # not compgen, which would run commands in a key
+      [[ $key == "$current"* ]] && COMPREPLY+=("$key")
+    done < <(qz-walkthrough keys "$word" 2>/dev/null)
+    return
+  done
 }
 
 _qz_walkthrough() {
@@ -59,6 +86,7 @@ complete -F _qz_walkthrough qz-walkthrough
 
 std::string bashReply(const ValueHint& value) {
   if (!value.choices.empty()) return "_qz_walkthrough_words \"" + joined(value.choices) + "\"";
+  if (value.isScriptKey) return "_qz_walkthrough_keys";
   if (value.isFile) return "_qz_walkthrough_paths -f";
   return value.isDirectory ? "_qz_walkthrough_paths -d" : ":";
 }
@@ -80,6 +108,7 @@ std::string bash(const std::vector<CommandOutline>& commands) {
              joined(options) + "\"; else " + bashReply(command.arguments) + "; fi ;;\n";
   }
   std::string script = replaced(std::string(bashScript), "@commands@", joined(names));
+  script = replaced(std::move(script), "@files@", joined(fileOptions(commands)));
   script = replaced(std::move(script), "@values@", values);
   return replaced(std::move(script), "@words@", words);
 }
@@ -87,7 +116,18 @@ std::string bash(const std::vector<CommandOutline>& commands) {
 // --- zsh ---
 
 constexpr std::string_view zshScript =
-    R"(# Completes qz-walkthrough:  source <(qz-walkthrough completion zsh), after compinit
+    R"zsh(#compdef qz-walkthrough
+# Completes qz-walkthrough:  source <(qz-walkthrough completion zsh), after compinit
+_qz_walkthrough_keys() {  # of the script on the line
+  local i word
+  for ((i = 2; i < CURRENT; i++)); do
+    word=${~${(Q)words[i]}}
+    [[ " @files@ " == *" $words[i-1] "* || ! -f $word ]] && continue
+    compadd -- ${(f)"$(qz-walkthrough keys $word 2>/dev/null)"}
+    return
+  done
+}
+
 _qz_walkthrough() {
   local -a commands=(
 @commands@  )
@@ -100,13 +140,19 @@ _qz_walkthrough() {
   case $words[1] in
 @words@  esac
 }
-compdef _qz_walkthrough qz-walkthrough
-)";
+
+if [[ $funcstack[1] == _qz-walkthrough ]]; then  # zsh loads the file to complete a line
+  _qz_walkthrough "$@"
+else
+  compdef _qz_walkthrough qz-walkthrough
+fi
+)zsh";
 
 std::string zshQuoted(const std::string& text) { return quoted(text, "'\\''"); }
 
 std::string zshAction(const ValueHint& value) {
   if (!value.choices.empty()) return "(" + joined(value.choices) + ")";
+  if (value.isScriptKey) return "_qz_walkthrough_keys";
   if (value.isFile) return "_files";
   return value.isDirectory ? "_files -/" : " ";
 }
@@ -127,15 +173,34 @@ std::string zsh(const std::vector<CommandOutline>& commands) {
     for (const OptionOutline& option : command.options) words += " " + zshOption(option);
     words += " " + zshQuoted("*:argument:" + zshAction(command.arguments)) + " ;;\n";
   }
-  return replaced(replaced(std::string(zshScript), "@commands@", names), "@words@", words);
+  std::string script = replaced(std::string(zshScript), "@files@", joined(fileOptions(commands)));
+  return replaced(replaced(std::move(script), "@commands@", names), "@words@", words);
 }
 
 // --- fish ---
+
+constexpr std::string_view fishStart =
+    R"(# Completes qz-walkthrough:  qz-walkthrough completion fish | source
+function __qz_walkthrough_keys  # of the script on the line
+  set -l previous
+  for word in (commandline -opc)
+    if test -f "$word"; and not contains -- "$previous" qz-walkthrough @files@
+      qz-walkthrough keys $word 2>/dev/null
+      return
+    end
+    set previous $word
+  end
+end
+complete -c qz-walkthrough -f
+complete -c qz-walkthrough -n __fish_use_subcommand -l help -d 'Print the help'
+complete -c qz-walkthrough -n __fish_use_subcommand -l version -d 'Print the version'
+)";
 
 std::string fishQuoted(const std::string& text) { return quoted(text, "\\'"); }
 
 std::string fishValue(const ValueHint& value) {
   if (!value.choices.empty()) return " -x -a " + fishQuoted(joined(value.choices));
+  if (value.isScriptKey) return " -x -a '(__qz_walkthrough_keys)'";
   if (value.isFile) return " -r -F";
   return value.isDirectory ? " -x -a '(__fish_complete_directories)'" : " -x";
 }
@@ -147,10 +212,7 @@ std::string fishArguments(const ValueHint& value) {
 
 std::string fish(const std::vector<CommandOutline>& commands) {
   const std::string complete = "complete -c qz-walkthrough";
-  std::string script = "# Completes qz-walkthrough:  qz-walkthrough completion fish | source\n" +
-                       complete + " -f\n" + complete +
-                       " -n __fish_use_subcommand -l help -d 'Print the help'\n" + complete +
-                       " -n __fish_use_subcommand -l version -d 'Print the version'\n";
+  std::string script = replaced(std::string(fishStart), "@files@", joined(fileOptions(commands)));
   for (const CommandOutline& command : commands) {
     const std::string here = complete + " -n '__fish_seen_subcommand_from " + command.name + "'";
     script += complete + " -n __fish_use_subcommand -a " + command.name + " -d " +

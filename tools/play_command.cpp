@@ -76,12 +76,14 @@ void addWindowOptions(Command& command, play::PlayOptions& options) {
 
 void addStepOptions(Command& command, play::PlayOptions& options) {
   command.option("--start", options.startKey, "The list to start with (default: the smallest tag)")
-      .valueName("KEY");
+      .valueName("KEY")
+      .scriptKey();
   command
       .repeatedList(
           "--press", [&options](const std::string& tag) { addPress(options, tag); },
           "Press the buttons with these tags, in turn")
-      .valueName("TAG");
+      .valueName("TAG")
+      .scriptKey();
   command
       .repeated(
           "--advance", [&options](const std::string& text) { addAdvance(options, text); },

@@ -7,8 +7,8 @@
 #include <exception>
 #include <functional>
 
-#include "drivers/driver.hpp"
 #include "drivers/paced_clock.hpp"
+#include "qz/drivers/driver.hpp"
 #include "qz/toolkit/appkit/appkit_toolkit.hpp"
 #import "toolkit/foundation/kept.hpp"
 

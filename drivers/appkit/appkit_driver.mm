@@ -7,7 +7,7 @@
 #include <utility>
 
 #import "drivers/appkit/tagged_views.hpp"
-#include "drivers/appkit/toolkit_row.hpp"
+#include "qz/drivers/appkit/toolkit_row.hpp"
 #include "qz/toolkit/exception.hpp"
 #import "toolkit/appkit/parts.hpp"
 #import "toolkit/appkit/views.hpp"

@@ -4,8 +4,8 @@
 
 #include <memory>
 
-#include "drivers/driver.hpp"
-#include "drivers/memory/toolkit_row.hpp"
+#include "qz/drivers/driver.hpp"
+#include "qz/drivers/memory/toolkit_row.hpp"
 #include "qz/toolkit/memory/memory_toolkit.hpp"
 #include "toolkit/memory/views.hpp"
 

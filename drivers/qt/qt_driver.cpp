@@ -20,7 +20,7 @@
 #include <cmath>
 #include <utility>
 
-#include "drivers/qt/toolkit_row.hpp"
+#include "qz/drivers/qt/toolkit_row.hpp"
 #include "toolkit/qt/accessibility.hpp"
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/parts.hpp"

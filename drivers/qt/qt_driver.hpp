@@ -7,8 +7,8 @@
 #include <exception>
 #include <functional>
 
-#include "drivers/driver.hpp"
 #include "drivers/paced_clock.hpp"
+#include "qz/drivers/driver.hpp"
 #include "qz/toolkit/qt/qt_toolkit.hpp"
 
 namespace qz::drivers {

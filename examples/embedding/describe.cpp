@@ -3,12 +3,13 @@
 #include <iostream>
 
 #include "QZ_Plist_State_Parser.hpp"
-#include "drivers/memory/memory_driver.hpp"
+#include "qz/drivers/driver.hpp"
+#include "qz/drivers/memory/toolkit_row.hpp"
 
 int main() {
-  qz::drivers::MemoryDriver screen;
-  screen.setLogSink([](std::string_view line) { std::cout << "log: " << line << '\n'; });
-  const auto engine = QZ_Plist_State_Parser::initWithWindow(screen.toolkit(), nullptr);
+  const auto screen = qz::drivers::makeMemoryDriver();
+  screen->setLogSink([](std::string_view line) { std::cout << "log: " << line << '\n'; });
+  const auto engine = QZ_Plist_State_Parser::initWithWindow(screen->toolkit(), nullptr);
 
   // The number is the entry's key, and a button's tag. It must be unique across classes: a later
   // entry replaces an earlier one.
@@ -25,6 +26,6 @@ int main() {
     std::cout << control->className() << " has the tag " << control->tag() << '\n';
   }
 
-  screen.click(engine->findObjectWithTag(2));
+  screen->click(engine->findObjectWithTag(2));
   engine->terminateParser();
 }

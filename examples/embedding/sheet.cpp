@@ -5,7 +5,8 @@
 #include <iostream>
 
 #include "QZ_Plist_State_Parser.hpp"
-#include "drivers/memory/memory_driver.hpp"
+#include "qz/drivers/driver.hpp"
+#include "qz/drivers/memory/toolkit_row.hpp"
 
 namespace {
 
@@ -48,13 +49,13 @@ int main(int argc, char** argv) {
     std::cerr << "usage: sheet-example DIRECTORY\n";
     return 2;
   }
-  qz::drivers::MemoryDriver screen;
-  screen.setResourcePath(argv[1]);
-  const auto window = screen.makeWindow({100, 100, 600, 400});
+  const auto screen = qz::drivers::makeMemoryDriver();
+  screen->setResourcePath(argv[1]);
+  const auto window = screen->makeWindow({100, 100, 600, 400});
 
   QZ_Plist_State_Parser::Dictionary states = qz::toolkit::Dictionary::make();
   for (int round = 0; round < 2; ++round) {
-    states = play(screen, window, states);
+    states = play(*screen, window, states);
     std::cout << "the box is " << (states->objectForKey("6")->boolValue() ? "on\n" : "off\n");
   }
   return 0;

@@ -10,6 +10,7 @@
 #import "hosts/appkit/arguments.hpp"
 #import "hosts/appkit/engine_timers.hpp"
 #include "qz/toolkit/exception.hpp"
+#import "toolkit/foundation/collection_views.hpp"
 #import "toolkit/foundation/exceptions.hpp"
 #import "toolkit/foundation/strings.hpp"
 
@@ -130,7 +131,7 @@ namespace face = qz::hosts::appkit;
 using qz::toolkit::foundation::answering;
 
 /// Shows a table with string keys.
-@interface QZTableView : NSMutableDictionary {
+@interface QZTableView : QZKeyedView {
  @private
   face::TableAccess* access_;  // owned
 }

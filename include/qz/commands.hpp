@@ -9,6 +9,8 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
+
 namespace qz {
 
 /// What a parameter of a command means, which decides the values that it may have.
@@ -29,11 +31,12 @@ enum class ParameterType {
   anything,          ///< any value: it must be there, but its meaning does not matter
 };
 
-struct CommandParameter {
-  std::string_view name;  ///< what the documentation calls the parameter
-  ParameterType type;
+/// A parameter of a command.
+struct QZ_API CommandParameter {
+  std::string_view name;     ///< what the documentation calls the parameter
+  ParameterType type;        ///< what the engine converts it to
   std::string_view meaning;  ///< one line in plain English
-  bool isOptional = false;
+  bool isOptional = false;   ///< whether a list may leave it out
 };
 
 /// How a script may write a command: as a string (simple), or as an array of the name and the
@@ -71,7 +74,8 @@ enum class CommandFlow {
   endsWalkThrough,  ///< the list continues without a script, so that it runs no other list
 };
 
-struct Command {
+/// A command, as `commandCatalogue` lists it.
+struct QZ_API Command {
   /// Returns the position of the first parameter of this type, counted from 0 after the name;
   /// absent if there is none.
   ///
@@ -83,30 +87,30 @@ struct Command {
   std::string_view constant;  ///< the name of the constant, such as QZ_PLIST_STATE_PARSER_FLASH_ID
   std::string& name;          ///< the constant: the current name of the command in scripts
   std::string_view summary;   ///< what the command does, in one line of plain English
-  CommandForm form;
+  CommandForm form;           ///< whether a list writes it as a string or as an array
   std::span<const CommandParameter> parameters;  ///< of the compound form
-  TargetKind target;
-  ExtraParameters extraParameters;
-  CommandFlow flow;
+  TargetKind target;                             ///< the kind of control that it works on
+  ExtraParameters extraParameters;               ///< what it does with more parameters
+  CommandFlow flow;                              ///< what happens to its list afterwards
 };
 
 /// Returns all commands, in the order in which the engine compares their names. Each constant has
 /// exactly one entry. The entries live until the program ends.
-std::span<const Command> commandCatalogue();
+QZ_API std::span<const Command> commandCatalogue();
 
 /// Returns the command that the engine runs for an array with this name, in any case; null if there
 /// is none. If a host has given two commands the same name, the engine runs the first one.
-const Command* compoundCommandNamed(std::string_view name);
+QZ_API const Command* compoundCommandNamed(std::string_view name);
 
 /// Returns the command that the engine runs for this string, which is compared as written; null if
 /// there is none.
-const Command* simpleCommandNamed(std::string_view name);
+QZ_API const Command* simpleCommandNamed(std::string_view name);
 
 /// Returns the command of a constant, such as "QZ_PLIST_STATE_PARSER_FLASH_ID". A new name of the
 /// command changes nothing here. Null if no constant has this name.
-const Command* commandOfConstant(std::string_view constant);
+QZ_API const Command* commandOfConstant(std::string_view constant);
 
 /// Returns the values that a parameter of the type `colorName` may have.
-std::span<const std::string_view> titleColorNames();
+QZ_API std::span<const std::string_view> titleColorNames();
 
 }  // namespace qz

@@ -24,6 +24,7 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/asset_record.hpp"
 #include "qz/observer.hpp"
 #include "qz/property_list/collections.hpp"
@@ -43,58 +44,85 @@ inline namespace command_names {
 // Assigning another string to one renames the command for
 // every script from then on. The names of compound commands are upper-cased before they are
 // compared; those of simple commands are not.
-extern std::string QZ_PLIST_STATE_PARSER_TERMINATE_PARSER;
+/// The command TERMINATE_PARSER.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_TERMINATE_PARSER;
 /// Holds "IDLE_LOOP", the one value that differs from its constant's name.
-extern std::string QZ_PLIST_STATE_PARSER_RETURN_TO_IDLE_LOOP;
-extern std::string QZ_PLIST_STATE_PARSER_HIDE_OBJECT_WITH_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SHOW_OBJECT_WITH_ID;
-extern std::string QZ_PLIST_STATE_PARSER_ENABLE_OBJECT_WITH_ID;
-extern std::string QZ_PLIST_STATE_PARSER_DISABLE_OBJECT_WITH_ID;
-extern std::string QZ_PLIST_STATE_PARSER_LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID;
-extern std::string QZ_PLIST_STATE_PARSER_PROCESS_COMMANDS_FOR_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_TOOL_TIP_FOR_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_TEXT_FOR_OBJECT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_LOAD_BACKGROUND_WITH_IMAGE;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_RETURN_TO_IDLE_LOOP;
+/// The command HIDE_OBJECT_WITH_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_HIDE_OBJECT_WITH_ID;
+/// The command SHOW_OBJECT_WITH_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SHOW_OBJECT_WITH_ID;
+/// The command ENABLE_OBJECT_WITH_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_ENABLE_OBJECT_WITH_ID;
+/// The command DISABLE_OBJECT_WITH_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_DISABLE_OBJECT_WITH_ID;
+/// The command LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID;
+/// The command PROCESS_COMMANDS_FOR_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_PROCESS_COMMANDS_FOR_ID;
+/// The command SET_TOOL_TIP_FOR_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_TOOL_TIP_FOR_ID;
+/// The command SET_TEXT_FOR_OBJECT_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_TEXT_FOR_OBJECT_ID;
+/// The command LOAD_BACKGROUND_WITH_IMAGE.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_LOAD_BACKGROUND_WITH_IMAGE;
 /// Declared for hosts only: no command of this name is recognised.
-extern std::string QZ_PLIST_STATE_PARSER_BUTTON_WITH_ID_AT;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_BUTTON_WITH_ID_AT;
 /// Declared for hosts only: no command of this name is recognised.
-extern std::string QZ_PLIST_STATE_PARSER_IMAGE_WITH_ID_AND_PATH_AT;
-extern std::string QZ_PLIST_STATE_PARSER_ALLOW_FLASHING;
-extern std::string QZ_PLIST_STATE_PARSER_FLASH_ID;
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_IMAGE_WITH_ID_AND_PATH_AT;
+/// The command ALLOW_FLASHING.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_ALLOW_FLASHING;
+/// The command FLASH_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_FLASH_ID;
 /// Declared for hosts only: no command of this name is recognised.
-extern std::string QZ_PLIST_STATE_PARSER_HIGHLIGHT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_STATE_ON_FOR_OBJECT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_STATE_OFF_FOR_OBJECT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_BACKGROUND_COLOR_FOR_OBJECT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_FOREGROUND_COLOR_FOR_OBJECT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_TITLE_FOR_OBJECT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_TAG_FOR_OBJECT_ID;
-extern std::string QZ_PLIST_STATE_PARSER_SET_TAG_FOR_OBJECT_ID_WITH_TIMER;
-extern std::string QZ_PLIST_STATE_PARSER_SET_TIMER_FOR_ID;
-extern std::string
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_HIGHLIGHT_ID;
+/// The command SET_STATE_ON_FOR_OBJECT_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_STATE_ON_FOR_OBJECT_ID;
+/// The command SET_STATE_OFF_FOR_OBJECT_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_STATE_OFF_FOR_OBJECT_ID;
+/// The command SET_BACKGROUND_COLOR_FOR_OBJECT_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_BACKGROUND_COLOR_FOR_OBJECT_ID;
+/// The command SET_FOREGROUND_COLOR_FOR_OBJECT_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_FOREGROUND_COLOR_FOR_OBJECT_ID;
+/// The command SET_TITLE_FOR_OBJECT_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_TITLE_FOR_OBJECT_ID;
+/// The command SET_TAG_FOR_OBJECT_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_TAG_FOR_OBJECT_ID;
+/// The command SET_TAG_FOR_OBJECT_ID_WITH_TIMER.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_TAG_FOR_OBJECT_ID_WITH_TIMER;
+/// The command SET_TIMER_FOR_ID.
+extern QZ_API std::string QZ_PLIST_STATE_PARSER_SET_TIMER_FOR_ID;
+/// The command SET_ATTRIBUTED_STRING_AS_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID.
+extern QZ_API std::string
     QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID;
-extern std::string
+/// The command SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID.
+extern QZ_API std::string
     QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID;
-extern std::string
+/// The command SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID.
+extern QZ_API std::string
     QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID;
 
 }  // namespace command_names
 
 class KeepAlive;
 
-class QZ_Plist_State_Parser final : public toolkit::Responder,
-                                    public std::enable_shared_from_this<QZ_Plist_State_Parser> {
+/// Plays one walk-through over the controls of a window.
+class QZ_API QZ_Plist_State_Parser final
+    : public toolkit::Responder,
+      public std::enable_shared_from_this<QZ_Plist_State_Parser> {
  public:
-  using ObjectId = toolkit::ValueRef<toolkit::Number>;
-  using Parameters = toolkit::ValueRef<toolkit::Array>;
-  using Value = toolkit::ValueRef<>;
-  using Dictionary = toolkit::ValueRef<toolkit::Dictionary>;
-  using Control = toolkit::Ref<toolkit::View>;
-  using Controls = toolkit::Ref<toolkit::List<Control>>;
-  using GuiAssets = toolkit::Ref<toolkit::Table<AssetRecord>>;
-  using Timers = toolkit::Ref<toolkit::Table<toolkit::Ref<toolkit::Timer>>>;
-  using Timer = toolkit::Ref<toolkit::Timer>;
-  using Window = toolkit::Ref<toolkit::Window>;
+  using ObjectId =
+      toolkit::ValueRef<toolkit::Number>;  ///< the number of a control, as scripts write it
+  using Parameters = toolkit::ValueRef<toolkit::Array>;       ///< the parameters of a command
+  using Value = toolkit::ValueRef<>;                          ///< a value of a script
+  using Dictionary = toolkit::ValueRef<toolkit::Dictionary>;  ///< a table of a script
+  using Control = toolkit::Ref<toolkit::View>;            ///< a control; absent if there is none
+  using Controls = toolkit::Ref<toolkit::List<Control>>;  ///< a list of controls
+  using GuiAssets = toolkit::Ref<toolkit::Table<AssetRecord>>;  ///< the records of built or adopted
+                                                                ///< controls, by tag
+  using Timers = toolkit::Ref<toolkit::Table<toolkit::Ref<toolkit::Timer>>>;  ///< timers, by tag
+  using Timer = toolkit::Ref<toolkit::Timer>;    ///< a timer; absent if there is none
+  using Window = toolkit::Ref<toolkit::Window>;  ///< a window; absent if there is none
 
   // --- for the host, in calling order ---
 
@@ -221,6 +249,7 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
   bool QZ_Plist_State_Processor_SET_TITLE(Value title, ObjectId forId);
   /// Turn a button on or off without sending its action. NO if no button has the tag.
   bool QZ_Plist_State_Processor_SET_STATE_ON(ObjectId id);
+  /// Turns the button with that tag off. NO without such a control.
   bool QZ_Plist_State_Processor_SET_STATE_OFF(ObjectId id);
   /// Sets a tooltip: the text, then optionally the tag of another control. NO if the text is
   /// missing or no control has the tag.
@@ -256,59 +285,76 @@ class QZ_Plist_State_Parser final : public toolkit::Responder,
 
   /// Whether buttons flash. If NO, the flasher's ticks do nothing.
   bool flashing() const;
+  /// Sets what `flashing` returns.
   void setFlashing(bool flashing);
   /// Whether the last `loadPlist` was asked to run the walk-through as a sheet.
   bool runningAsSheet() const;
+  /// Sets what `runningAsSheet` returns.
   void setRunningAsSheet(bool runningAsSheet);
   /// Whether the end of the walk-through has begun; object timers that fire from then on run
   /// nothing.
   bool terminating() const;
+  /// Sets what `terminating` returns.
   void setTerminating(bool terminating);
   /// Whether `terminateParser` has closed the walk-through window.
   bool hasTerminated() const;
+  /// Sets what `hasTerminated` returns.
   void setHasTerminated(bool hasTerminated);
 
   /// The host window. A window from the setter is kept alive, the one from `initWithWindow` is not.
   Window window() const;
+  /// Sets what `window` returns, and keeps it alive.
   void setWindow(const Window& window);
   /// The script: tag key to command list.
   Dictionary plistDictionary() const;
+  /// Sets what `plistDictionary` returns.
   void setPlistDictionary(Dictionary script);
   /// For the host's use; the engine only clears it.
   Value commandArray() const;
+  /// Sets what `commandArray` returns.
   void setCommandArray(Value list);
   /// For the host's use; the engine never touches it.
   ObjectId objectId() const;
+  /// Sets what `objectId` returns.
   void setObjectId(ObjectId id);
   /// The repeating half-second timer behind flashing.
   Timer flashingTimer() const;
+  /// Sets what `flashingTimer` returns.
   void setFlashingTimer(Timer timer);
   /// The tags that flash: tag key to boolean.
   Dictionary flashingTagIds() const;
+  /// Sets what `flashingTagIds` returns.
   void setFlashingTagIds(Dictionary ids);
   /// The window whose controls the script drives. A window that the engine built or that was set
   /// here is kept alive, an adopted window is not.
   Window tutorialWindow() const;
+  /// Sets what `tutorialWindow` returns, and keeps it alive.
   void setTutorialWindow(const Window& window);
   /// The controls that the last `loadGuiAssets` made, in the order of their creation.
   Controls addedObjectToTutorial() const;
+  /// Sets what `addedObjectToTutorial` returns.
   void setAddedObjectToTutorial(Controls controls);
   /// The records of the adopted window's controls, by registry key: the decimal tag, or a larger
   /// unused number if an earlier control has the same tag.
   GuiAssets guiAssets() const;
+  /// Sets what `guiAssets` returns.
   void setGuiAssets(GuiAssets assets);
   /// The object id of the list that was started last.
   ObjectId lastTagId() const;
+  /// Sets what `lastTagId` returns.
   void setLastTagId(ObjectId id);
   /// The pending object timers, by tag key.
   Timers objectIdTimers() const;
+  /// Sets what `objectIdTimers` returns.
   void setObjectIdTimers(Timers timers);
   /// The tag that each adopted control had when it was recorded, by registry key.
   Dictionary originalTagValues() const;
+  /// Sets what `originalTagValues` returns.
   void setOriginalTagValues(Dictionary tags);
 
   /// Told what the engine does; absent at first. The engine keeps it alive.
   const std::shared_ptr<Observer>& observer() const;
+  /// Sets who is told what the engine does; null for nobody.
   void setObserver(std::shared_ptr<Observer> observer);
 
   /// The class of another language that derives from this engine; null if there is none.

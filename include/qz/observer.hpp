@@ -6,6 +6,7 @@
 #include <cstdint>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/property_list/collections.hpp"
 #include "qz/property_list/scalars.hpp"
 #include "qz/toolkit/exception.hpp"
@@ -18,10 +19,10 @@ namespace qz {
 /// overrides the ones it needs. They run on the engine's thread. They must not raise a
 /// toolkit::Exception, nor call the engine's operations; the engine's getters are allowed. An
 /// exception of another type stops the operation in its middle and reaches the operation's caller.
-class Observer {
+class QZ_API Observer {
  public:
-  using Value = toolkit::ValueRef<>;
-  using ObjectId = toolkit::ValueRef<toolkit::Number>;
+  using Value = toolkit::ValueRef<>;                    ///< a value of a script
+  using ObjectId = toolkit::ValueRef<toolkit::Number>;  ///< the number of a control
 
   virtual ~Observer() = default;
 
@@ -43,6 +44,10 @@ class Observer {
   /// The engine has looked up a control by its tag; `control` is absent if there is none.
   virtual void controlSought(toolkit::Tag /*tag*/, const toolkit::Ref<toolkit::View>& /*control*/) {
   }
+
+  /// The user or a timer has pressed a control; the list under its tag, if there is one, follows.
+  /// Pending timers are cancelled before.
+  virtual void controlPressed(const toolkit::Ref<toolkit::View>& /*control*/) {}
 
   /// An object timer of `seconds` has started under a tag key. It replaces a pending timer under
   /// that key.

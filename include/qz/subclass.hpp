@@ -9,6 +9,7 @@
 #include <string_view>
 #include <variant>
 
+#include "qz/api.hpp"
 #include "qz/property_list/value.hpp"
 #include "qz/toolkit/run_loop.hpp"
 #include "qz/toolkit/tag.hpp"
@@ -19,7 +20,7 @@ namespace qz {
 
 /// Operations are named by their selectors, such as "processCommandArray:ForObject:". Only those
 /// that the engine itself calls can be overridden. All functions run on the engine's thread.
-class Subclass {
+class QZ_API Subclass {
  public:
   /// Text is a value. Absent values, controls, windows and timers are absent arguments.
   using Argument = std::variant<bool, std::uint64_t, toolkit::Tag, toolkit::ValueRef<>,

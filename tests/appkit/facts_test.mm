@@ -6,8 +6,8 @@
 #import <AppKit/AppKit.h>
 #include <gtest/gtest.h>
 
-#include "drivers/appkit/toolkit_row.hpp"
-#include "drivers/driver.hpp"
+#include "qz/drivers/appkit/toolkit_row.hpp"
+#include "qz/drivers/driver.hpp"
 #import "tests/foundation/pool.hpp"
 
 @interface QZFactCounter : NSObject {

@@ -4,7 +4,7 @@
 #include <gtest/gtest.h>
 
 #import "drivers/appkit/appkit_driver.hpp"
-#include "drivers/appkit/toolkit_row.hpp"
+#include "qz/drivers/appkit/toolkit_row.hpp"
 #include "qz/toolkit/exception.hpp"
 #import "tests/foundation/pool.hpp"
 #include "tests/view_kinds.hpp"

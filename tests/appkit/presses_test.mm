@@ -7,7 +7,7 @@
 #include <string>
 
 #import "drivers/appkit/appkit_driver.hpp"
-#include "drivers/appkit/toolkit_row.hpp"
+#include "qz/drivers/appkit/toolkit_row.hpp"
 #include "qz/engine.hpp"
 #include "qz/toolkit/exception.hpp"
 #import "tests/foundation/pool.hpp"

@@ -6,7 +6,7 @@
 #include <string>
 #include <vector>
 
-#include "drivers/driver.hpp"
+#include "qz/drivers/driver.hpp"
 #include "tests/check/trace.hpp"
 
 namespace qz::naive {

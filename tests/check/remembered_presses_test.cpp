@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // How many presses are remembered, and which are forgotten first.
 
-#include "tools/check/remembered_presses.hpp"
+#include "tools/exploration/remembered_presses.hpp"
 
 #include <gtest/gtest.h>
 

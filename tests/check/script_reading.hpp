@@ -4,8 +4,8 @@
 
 #include <optional>
 
-#include "drivers/view_kinds.hpp"
 #include "qz/commands.hpp"
+#include "qz/drivers/view_kinds.hpp"
 #include "qz/property_list/collections.hpp"
 #include "qz/toolkit/tag.hpp"
 

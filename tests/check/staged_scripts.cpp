@@ -72,6 +72,7 @@ StagedScript stagedScript(const std::filesystem::path& file) {
   const auto folder = file.parent_path();
   tools::walkthrough::StageOptions options;
   options.window = existing(folder / "window.plist");
+  if (!options.window) options.window = existing(folder / (file.stem().string() + "-host.plist"));
   if (!options.window) options.window = existing(folder / "host.plist");
   if (!options.window) options.assets = existing(folder / descriptionName);
   StagedScript staged;

@@ -10,8 +10,8 @@
 #include <string>
 #include <vector>
 
-#include "drivers/view_kinds.hpp"
 #include "qz/commands.hpp"
+#include "qz/drivers/view_kinds.hpp"
 #include "qz/toolkit/tag.hpp"
 
 namespace qz::naive {

@@ -96,6 +96,36 @@ TEST_F(UnusualScripts, AreStuckFromTheStart) {
   EXPECT_EQ(finding->path.size(), 1U);
 }
 
+TEST_F(UnusualScripts, AreStuckAtAStartThatIsNotAList) {
+  const Verdict verdict = check("{ 1 = Welcome; 9 = (IDLE_LOOP); }");
+  const Finding* const finding = findingWith(verdict, "dead-end");
+  ASSERT_NE(finding, nullptr) << messagesOf(verdict);
+  EXPECT_EQ(finding->message.substr(0, 31), "the start leaves the user stuck");
+  EXPECT_EQ(finding->list, std::nullopt);
+}
+
+TEST_F(UnusualScripts, AreATrapFromOneOfTheirStarts) {
+  CheckOptions options;
+  options.startKeys = {"1", "7"};
+  const Verdict verdict = check(
+      "{ 1 = (IDLE_LOOP); 7 = ((HIDE_OBJECT_WITH_ID, 2)); 2 = (TERMINATE_PARSER);"
+      " 3 = ((SET_TEXT_FOR_OBJECT_ID, a, 5)); }",
+      options);
+  const Finding* const finding = findingWith(verdict, "trap");
+  ASSERT_NE(finding, nullptr) << messagesOf(verdict);
+  EXPECT_EQ(finding->list, "7");
+  EXPECT_EQ(finding->path.size(), 1U);
+}
+
+TEST_F(UnusualScripts, HaveATimerThatLeadsToNoList) {
+  const Verdict verdict =
+      check("{ 1 = ((SET_TIMER_FOR_ID, 5, 9)); 9 = Later; 2 = (TERMINATE_PARSER); }");
+  const Finding* const finding = findingWith(verdict, "not-a-list");
+  ASSERT_NE(finding, nullptr) << messagesOf(verdict);
+  EXPECT_TRUE(verdict.explored.complete);
+  EXPECT_EQ(verdict.explored.waits, 1U);
+}
+
 // A text that one timer shows again after the other is read for as long as all of them last.
 TEST_F(UnusualScripts, ShowATextAgainBeforeItIsRead) {
   const std::string text = longText();

@@ -92,7 +92,8 @@ std::string documentedRow(const Command& command) {
 
 TEST(CommandCatalogue, HasOneRowForEachConstantOfTheHeader) {
   const std::string constant = R"(\s*(QZ_PLIST_STATE_PARSER_\w+);)";
-  const auto declared = matches(contents("include/qz/engine.hpp"), "extern std::string" + constant);
+  const auto declared =
+      matches(contents("include/qz/engine.hpp"), "extern QZ_API std::string" + constant);
   EXPECT_EQ(inOneOf(declared, constantsWithRows()), Words())
       << "each constant of include/qz/engine.hpp needs one row in engine/catalogue.cpp";
 }

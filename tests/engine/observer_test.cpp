@@ -33,6 +33,9 @@ struct Notes final : qz::Observer {
   void controlSought(toolkit::Tag tag, const toolkit::Ref<toolkit::View>& control) override {
     lines.push_back((control ? "found " : "no control ") + std::to_string(tag));
   }
+  void controlPressed(const toolkit::Ref<toolkit::View>& control) override {
+    add("pressed ", static_cast<std::size_t>(control->tag()));
+  }
   void timerSet(std::string_view key, double seconds) override {
     add("timer " + std::string(key) + " of seconds: ", static_cast<std::size_t>(seconds));
   }
@@ -78,23 +81,25 @@ TEST_F(ObserverTest, IsToldOfListsAndTheirCommandsInOrder) {
   use("{ 1 = ((SHOW_OBJECT_WITH_ID, 1), (PROCESS_COMMANDS_FOR_ID, 2), (FLASH_ID), NOTHING);"
       "  2 = (IDLE_LOOP); }");
   driver.click(button);
-  EXPECT_EQ(noted(), (Lines{"list for 1", "command 0", "found 1", "found 1", "YES from 0",
-                            "command 1", "list for 2", "command 0", "no control 2", "YES from 0",
-                            "list ends", "YES from 1", "command 2", "NSRangeException from 2",
-                            "command 3", "found 1", "NO from 3", "list ends"}));
+  EXPECT_EQ(noted(),
+            (Lines{"pressed 1", "list for 1", "command 0", "found 1", "found 1", "YES from 0",
+                   "command 1", "list for 2", "command 0", "no control 2", "YES from 0",
+                   "list ends", "YES from 1", "command 2", "NSRangeException from 2", "command 3",
+                   "found 1", "NO from 3", "list ends"}));
 }
 
 TEST_F(ObserverTest, IsToldOfControlsThatAreNotThere) {
   use("{ 1 = ((SET_TITLE_FOR_OBJECT_ID, Go, 9)); }");
   driver.click(button);
-  EXPECT_EQ(noted(), (Lines{"list for 1", "command 0", "no control 9", "NO from 0", "list ends"}));
+  EXPECT_EQ(noted(), (Lines{"pressed 1", "list for 1", "command 0", "no control 9", "NO from 0",
+                            "list ends"}));
 }
 
 TEST_F(ObserverTest, IsToldOfTimersThatFire) {
   use("{ 1 = ((SET_TIMER_FOR_ID, 3, 5)); 5 = (IDLE_LOOP); }");
   driver.click(button);
-  EXPECT_EQ(noted(), (Lines{"list for 1", "command 0", "no control 5", "timer 5 of seconds: 3",
-                            "NO from 0", "list ends"}));
+  EXPECT_EQ(noted(), (Lines{"pressed 1", "list for 1", "command 0", "no control 5",
+                            "timer 5 of seconds: 3", "NO from 0", "list ends"}));
   driver.advance(3);
   EXPECT_EQ(noted(), (Lines{"fired 5", "no control 5", "list for 5", "command 0", "no control 5",
                             "YES from 0", "list ends"}));

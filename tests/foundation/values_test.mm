@@ -110,6 +110,27 @@ TEST_F(FoundationValues, ShowADictionaryOfTheEngineWithoutACopy) {
   EXPECT_EQ(dictionary->count(), 0U);
 }
 
+TEST_F(FoundationValues, ShowADictionaryOfTheEngineInEveryWay) {
+  const auto dictionary = Dictionary::make();
+  dictionary->setObject(String::make("one"), "1");
+  dictionary->setObject(String::make("two"), "2");
+  NSMutableDictionary* const view = viewOfDictionary(dictionary);
+  NSDictionary* const same =
+      [NSDictionary dictionaryWithObjectsAndKeys:@"one", @"1", @"two", @"2", nil];
+  EXPECT_EQ([[view allValues] count], 2U);
+  EXPECT_TRUE([[view allValues] containsObject:@"two"]);
+  EXPECT_TRUE([[view allKeysForObject:@"two"] isEqual:[NSArray arrayWithObject:@"2"]]);
+  EXPECT_TRUE([view isEqual:same]);
+  EXPECT_TRUE([same isEqual:view]);
+  EXPECT_TRUE([[[view mutableCopy] autorelease] isEqual:same]);
+  EXPECT_TRUE([[[view copy] autorelease] isEqual:same]);
+  EXPECT_TRUE([[view description] isEqual:[same description]]);
+  [view removeAllObjects];
+  EXPECT_EQ(dictionary->count(), 0U);
+  [view addEntriesFromDictionary:same];
+  EXPECT_EQ(dictionary->count(), 2U);
+}
+
 TEST_F(FoundationValues, ShowAnArrayOfTheEngineWithoutACopy) {
   const auto array = Array::make();
   NSMutableArray* const view = viewOfArray(array);

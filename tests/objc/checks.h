@@ -45,6 +45,9 @@ NSString* scriptFile(NSDictionary* script);
 NSArray* command(NSString* name, id parameter0, id parameter1);
 /// Lets timers fire, for some seconds.
 void letTimePass(NSTimeInterval seconds);
+/// Lets timers fire until the condition holds, for at most 10 seconds.
+#define WAIT_UNTIL(condition) \
+  for (int turn_ = 0; turn_ < 200 && !(condition); ++turn_) letTimePass(0.05)
 NSNumber* number(NSInteger value);
 
 #ifdef __cplusplus

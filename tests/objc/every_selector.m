@@ -392,7 +392,7 @@ static void timersFire(void) {
       dictionaryWithObject:command(@"SET_TEXT_FOR_OBJECT_ID", @"later", number(textTag))
                     forKey:@"8"]);
   [engine startTimerWithValue:1 forKey:@"8"];
-  letTimePass(1.3);
+  WAIT_UNTIL([textOfField() length] > 0);
   CHECK_EQUAL(textOfField(), @"later");
   CHECK([[engine objectIdTimers] count] == 0);
   [controlIn(window, textTag) setStringValue:@""];
@@ -418,7 +418,8 @@ static void buttonsFlash(void) {
   CHECK([engine flashing]);
   [engine flasherFired:[engine flashingTimer]];
   CHECK([[next cell] isHighlighted]);
-  letTimePass(0.7);  // at least one tick
+  WAIT_UNTIL(![[next cell] isHighlighted]);  // the next tick
+  CHECK(![[next cell] isHighlighted]);
   [next highlight:YES];
   load([NSDictionary dictionaryWithObject:[NSArray array] forKey:@"2"]);
   CHECK([engine QZ_Plist_State_Processor_ALLOW_FLASHING:NO]);
@@ -503,6 +504,7 @@ static void bothSidesSeeChangesOfATable(void) {
   NSArray* record = [[[records objectForKey:@"2"] retain] autorelease];
   [records removeObjectForKey:@"2"];
   CHECK([records objectForKey:@"2"] == nil && [records count] == 3);
+  CHECK([[records allValues] count] == 3 && ![[records allValues] containsObject:record]);
   [records setObject:record forKey:@"77"];
   CHECK_EQUAL([records objectForKey:@"77"], record);
   CHECK_RAISES(NSInvalidArgumentException, @"a list of its class name",

@@ -1,8 +1,11 @@
 // SPDX-License-Identifier: MIT
-// Begins and ends walk-throughs many times; fails if anything is left behind.
+// Begins and ends walk-throughs many times; fails if anything is left behind:
+//
+//   objc-soak [TIMES]     1000 if absent
 
 #include <malloc.h>
 #include <stdio.h>
+#include <stdlib.h>
 
 #import "QZ_Plist_State_Parser.h"
 #import "checks.h"
@@ -13,7 +16,7 @@ static NSInteger engines = 0;
 @end
 
 @implementation CountedEngine
-- (id)initWithWindow:(NSWindow *)window {
+- (id)initWithWindow:(NSWindow*)window {
   ++engines;
   return [super initWithWindow:window];
 }
@@ -23,9 +26,9 @@ static NSInteger engines = 0;
 }
 @end
 
-static void playOnce(NSWindow *window, NSMutableDictionary *script) {
-  NSAutoreleasePool *pool = [[NSAutoreleasePool alloc] init];
-  CountedEngine *engine = [[CountedEngine alloc] initWithWindow:nil];
+static void playOnce(NSWindow* window, NSMutableDictionary* script) {
+  NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+  CountedEngine* engine = [[CountedEngine alloc] initWithWindow:nil];
   [engine getGuiAssetsFromWindow:window];
   [engine setPlistDictionary:script];
   [engine startTimerWithValue:100 forKey:@"9"];
@@ -37,20 +40,20 @@ static void playOnce(NSWindow *window, NSMutableDictionary *script) {
   [pool release];
 }
 
-static void play(NSWindow *window, int times) {
+static void play(NSWindow* window, int times) {
   for (int i = 0; i < times; ++i) {
-    NSMutableDictionary *script = [[NSMutableDictionary alloc] init];
+    NSMutableDictionary* script = [[NSMutableDictionary alloc] init];
     [script setObject:command(@"SET_TEXT_FOR_OBJECT_ID", @"a", number(textTag)) forKey:@"2"];
     playOnce(window, script);
     [script release];
   }
 }
 
-int main(void) {
-  NSAutoreleasePool *pool = [[NSAutoreleasePool alloc] init];
-  int times = 1000;
+int main(int argc, char **argv) {
+  NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+  int times = argc > 1 ? atoi(argv[1]) : 1000;
   [[NSApplication sharedApplication] finishLaunching];
-  NSWindow *window = windowWithControls();
+  NSWindow* window = windowWithControls();
   play(window, 20);  // fills the caches
   size_t before = mallinfo2().uordblks;
   play(window, times);

@@ -11,9 +11,9 @@
 #include <QPushButton>
 #include <QTemporaryDir>
 #include <QTextEdit>
-#include <vector>
 
 #include "qz/toolkit/system_files.hpp"
+#include "tests/qt/announcements.hpp"
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/image_look.hpp"
 #include "toolkit/qt/images.hpp"
@@ -27,29 +27,11 @@ namespace {
 using namespace toolkit;
 using namespace toolkit::qt;
 
-struct Announcement {
-  QObject* object;
-  QAccessible::Event event;
-};
-std::vector<Announcement> announcements;
-
-}  // namespace
-
-}  // namespace qz
-
-// Replaces Qt's own function in this program. Qt passes announcements on only while assistive
-// technology is connected, which needs a desktop's message bus.
-void QAccessible::updateAccessibility(QAccessibleEvent* event) {
-  qz::announcements.push_back({event->object(), event->type()});
-}
-
-namespace qz {
-
-namespace {
+using hosts::announcements;
 
 class Accessibility : public ::testing::Test {
  protected:
-  Accessibility() { announcements.clear(); }
+  Accessibility() { hosts::listen(); }
 
   static bool wasAnnounced(const QObject& object, QAccessible::Event event) {
     for (const auto& said : announcements) {
@@ -69,11 +51,11 @@ TEST_F(Accessibility, TitlesAreNamesAndAnnounced) {
   QCheckBox box("Before");
   for (QAbstractButton* const each :
        {static_cast<QAbstractButton*>(&button), static_cast<QAbstractButton*>(&box)}) {
-    announcements.clear();
+    hosts::listen();
     showTitle(*each, "A & B");
     EXPECT_TRUE(wasAnnounced(*each, QAccessible::NameChanged));
     EXPECT_EQ(textOf(*each, QAccessible::Name), "A & B");
-    announcements.clear();
+    hosts::listen();
     showTitle(*each, styled);
     EXPECT_TRUE(wasAnnounced(*each, QAccessible::NameChanged));
     EXPECT_EQ(textOf(*each, QAccessible::Name), "Styled");
@@ -89,11 +71,11 @@ TEST_F(Accessibility, ReplacesANameThatTheHostGave) {
 
 TEST_F(Accessibility, TextsOfLabelsAreNamesAndAnnounced) {
   QLabel label("Before");
-  announcements.clear();
+  hosts::listen();
   showText(label, "Plain");
   EXPECT_TRUE(wasAnnounced(label, QAccessible::NameChanged));
   EXPECT_EQ(textOf(label, QAccessible::Name), "Plain");
-  announcements.clear();
+  hosts::listen();
   showText(label, styled);
   EXPECT_TRUE(wasAnnounced(label, QAccessible::NameChanged));
   EXPECT_EQ(textOf(label, QAccessible::Name), "Styled");
@@ -120,7 +102,7 @@ TEST_F(Accessibility, ImagesAreNamedByTheirNames) {
   QtImages images(files);
   QLabel label;
   for (const char* name : {"disk", "done"}) {
-    announcements.clear();
+    hosts::listen();
     showImage(label, images.imageNamed(name));
     EXPECT_TRUE(wasAnnounced(label, QAccessible::NameChanged));
     EXPECT_EQ(textOf(label, QAccessible::Name), name);

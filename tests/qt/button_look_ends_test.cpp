@@ -9,6 +9,7 @@
 
 #include "tests/qt/rendering.hpp"
 #include "toolkit/qt/button_look.hpp"
+#include "toolkit/qt/user_preferences.hpp"
 
 namespace qz {
 

@@ -21,6 +21,7 @@
 #include "tests/qt/rendering.hpp"
 #include "toolkit/qt/contrast.hpp"
 #include "toolkit/qt/strings.hpp"
+#include "toolkit/qt/user_preferences.hpp"
 
 namespace qz {
 

@@ -334,6 +334,25 @@ TEST_F(FormPresses, MayDeleteTheirButton) {
   EXPECT_TRUE(walkThrough.engine());
 }
 
+TEST_F(FormPresses, ThatReachBothMayDeleteTheirButtonOrEndTheWalkThrough) {
+  for (const bool atOnce : {true, false}) {
+    form = std::make_unique<hosts::CrowdedForm>();
+    form->show();
+    const QPointer<QPushButton> button = &form->inBox;
+    button->setProperty("qzPress", "both");
+    QObject::connect(button, &QPushButton::clicked, form.get(), [&] {
+      atOnce ? delete button.data() : button->deleteLater();
+      if (!atOnce) walkThrough.end();
+    });
+    ASSERT_TRUE(walkThrough.play("tour.plist", *form));
+    button->click();
+    hosts::settle();
+    EXPECT_FALSE(button);
+    EXPECT_EQ(walkThrough.engine() != nullptr, atOnce);
+    walkThrough.end();
+  }
+}
+
 TEST_F(FormPresses, ReachTheHostAgainWhenTheEngineIsGone) {
   ADialog dialog;
   ClickCounter counter(dialog.button);

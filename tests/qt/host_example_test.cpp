@@ -2,6 +2,7 @@
 // The example host: walk-throughs begin and end, and the host keeps working.
 #include <gtest/gtest.h>
 
+#include <QLabel>
 #include <QMenu>
 #include <QStatusBar>
 #include <QTest>
@@ -89,6 +90,32 @@ TEST_F(HostExample, ShowsTipsInASheet) {
   EXPECT_FALSE(form->tips.isVisible());
   EXPECT_EQ(form->tips.next.property("qzTag"), 10);
   expectHostWorks();
+}
+
+TEST_F(HostExample, IsGuidedInAPanelBesideItsControls) {
+  const auto part = [this](const char* name) { return form->findChild<QPushButton*>(name); };
+  const auto heading = [this] { return form->findChild<QLabel*>("qz-guide-heading")->text(); };
+  for (int round = 0; round < 2; ++round) {
+    choose(2);
+    EXPECT_EQ(heading(), "Welcome");
+    click(*part("qz-guide-next"));
+    EXPECT_EQ(heading(), "Who gets it?");
+    click(*part("qz-guide-next"));
+    EXPECT_EQ(heading(), "Faster");
+    click(*part("qz-guide-back"));
+    EXPECT_EQ(heading(), "Who gets it?");
+    click(*part("qz-guide-back"));
+    EXPECT_EQ(heading(), "Welcome");
+    for (int step = 0; step < 3; ++step) click(*part("qz-guide-next"));
+    EXPECT_EQ(heading(), "Send it");
+    click(form->order);
+    EXPECT_EQ(heading(), "That is all");
+    EXPECT_EQ(form->statusBar()->currentMessage(), "");
+    click(*part("qz-guide-next"));
+    EXPECT_EQ(heading(), "");
+    expectHostWorks();
+    form->statusBar()->clearMessage();
+  }
 }
 
 TEST_F(HostExample, TakesEscapeForTheEndOfItsTips) {

@@ -2,7 +2,11 @@
 // Everything that a window's objects tell of themselves, to compare before and after.
 #pragma once
 
+#include <QIcon>
 #include <QMetaProperty>
+#include <QPixmap>
+#include <QPointer>
+#include <QToolBar>
 #include <QWidget>
 #include <map>
 #include <set>
@@ -20,13 +24,20 @@ struct Receivers : QObject {
   }
 };
 
+/// Returns what can be compared in place of `value`: Qt never finds two icons or pixmaps equal.
+inline QVariant comparable(const QVariant& value) {
+  if (value.typeId() == QMetaType::QIcon) return value.value<QIcon>().cacheKey();
+  if (value.typeId() == QMetaType::QPixmap) return value.value<QPixmap>().cacheKey();
+  return value;
+}
+
 /// Adds every property and dynamic property of the object, how many receivers each of its signals
 /// has, and how many children it has.
 inline void addTo(Snapshot& snapshot, const QObject& object, const QString& called) {
   const QString name = called + '.';
   const QMetaObject& meta = *object.metaObject();
   for (int i = 0; i < meta.propertyCount(); ++i) {
-    snapshot[name + meta.property(i).name()] = meta.property(i).read(&object);
+    snapshot[name + meta.property(i).name()] = comparable(meta.property(i).read(&object));
   }
   for (const QByteArray& property : object.dynamicPropertyNames()) {
     snapshot[name + property] = object.property(property);
@@ -37,6 +48,50 @@ inline void addTo(Snapshot& snapshot, const QObject& object, const QString& call
     }
   }
   snapshot[name + "children()"] = object.children().size();
+}
+
+/// True for the parts of a document, which Qt makes anew with each text.
+inline bool isPartOfDocument(const QObject& object) {
+  const QByteArray name = object.metaObject()->className();
+  return !object.isWidgetType() && (name.startsWith("QText") || name == "QWidgetTextControl");
+}
+
+/// True for a part of Qt's widgets that is not needed, and for what is in it: a scroll bar, a
+/// button that scrolls tabs, a button for which a tool bar has no room. Qt places them when they
+/// are.
+inline bool isSparePart(const QObject& object) {
+  static const QStringList names = {"qt_scrollarea_hcontainer", "qt_scrollarea_vcontainer",
+                                    "ScrollLeftButton", "ScrollRightButton"};
+  const QObject* const around = object.parent();
+  const bool isHidden = object.isWidgetType() && static_cast<const QWidget&>(object).isHidden();
+  const bool isPart = names.contains(object.objectName()) || qobject_cast<const QToolBar*>(around);
+  return (isHidden && isPart) || (around && isSparePart(*around));
+}
+
+/// Returns the objects in the window, and the window. Reading one may make or delete others.
+inline QList<QPointer<QObject>> objectsOf(QWidget& window) {
+  const auto found = window.findChildren<QObject*>();
+  QList<QPointer<QObject>> objects(found.begin(), found.end());
+  objects.prepend(&window);
+  objects.removeIf(
+      [](const auto& object) { return isPartOfDocument(*object) || isSparePart(*object); });
+  return objects;
+}
+
+/// Returns a name that no other object has.
+inline QString nameOf(const QObject& object) {
+  return QString("%1 \"%2\" %3")
+      .arg(object.metaObject()->className(), object.objectName())
+      .arg(reinterpret_cast<quintptr>(&object), 0, 16);
+}
+
+/// Returns everything that `addTo` adds for the window and all objects in it.
+inline Snapshot pictureOfAll(QWidget& window) {
+  Snapshot snapshot;
+  for (const QPointer<QObject>& object : objectsOf(window)) {
+    if (object) addTo(snapshot, *object, nameOf(*object));
+  }
+  return snapshot;
 }
 
 /// Returns the names of the values that differ.

@@ -128,12 +128,20 @@ TEST_F(WalkThroughs, SayInTheLogWhyAScriptIsNotPlayed) {
     const char* script;
     const char* reason;
   } cases[] = {
-      {"missing.plist", "the file does not exist or contains no list"},
-      {"list.plist", "the file is not a property list with a dictionary"},
+      {"missing.plist", "the file does not exist"},
+      {"", "the path is empty"},
+      {"empty.plist", "it contains no list"},
+      {"list.plist", "it is not a dictionary of lists"},
+      {"torn.plist",
+       "it is not a property list: line 1, column 8: expected ',' or ')', found the end of the "
+       "file (read as old-style property list)"},
+      {"http://example.org/tour.plist", "only URLs of files and resources can be played"},
       {"word.plist", "the value under the smallest tag, 0, is not a list"},
       {"names.plist", "no key is a tag (a whole decimal number)"},
       {"loop.plist", "lists run each other endlessly: 1 -> 2 -> 1"},
   };
+  write("empty.plist", "{ }");
+  write("torn.plist", "{ 0 = (");
   write("word.plist", "{ 0 = word; }");
   write("names.plist", "{ start = (IDLE_LOOP); }");
   write("loop.plist",

@@ -44,7 +44,8 @@ Words linesOf(const std::string& text) {
   return lines;
 }
 
-/// A directory with a file, a directory, and the completion script of a shell.
+/// A directory with a file, a directory with a script, and the completion script of a shell, which
+/// finds the tool.
 class CompletionPlace {
  public:
   explicit CompletionPlace(const std::string& shell) {
@@ -52,6 +53,8 @@ class CompletionPlace {
     path_ = ::mkdtemp(name.data());
     std::filesystem::create_directory(path_ / "dir");
     std::ofstream(path_ / "data.plist") << "{}";
+    std::ofstream(path_ / "dir" / "in tro.plist")
+        << "{ 12 = (); 9 = (); 100 = (); \"$(id)\" = (); }";
     std::ofstream(path_ / "script") << run(completionCommand, {"completion", shell}).out;
   }
   ~CompletionPlace() { std::filesystem::remove_all(path_); }
@@ -61,7 +64,9 @@ class CompletionPlace {
   /// Returns the output of the program, which the named shell runs in the directory.
   std::string outputOf(const std::string& shell, const std::string& program) const {
     std::ofstream(path_ / "program") << program;
-    return tools::outputOf("cd '" + path_.string() + "' && timeout 60 " + shell + " program 2>&1");
+    return tools::outputOf("cd '" + path_.string() +
+                           "' && PATH='" QZ_TOOL_DIRECTORY "':$PATH timeout 60 " + shell +
+                           " program 2>&1");
   }
 
  private:
@@ -108,6 +113,9 @@ TEST(Completion, BashCompletesCommandsOptionsAndValues) {
       {{"play", "--window", "d"}, files},
       {{"play", "--resources", "d"}, {"dir"}},
       {{"play", "--press", ""}, {}},
+      {{"play", "dir/in\\ tro.plist", "--press", ""}, {"9", "12", "100", "$(id)"}},
+      {{"play", "--window", "data.plist", "dir/in\\ tro.plist", "--start", "1"}, {"12", "100"}},
+      {{"check", "dir/in\\ tro.plist", "--start", "=", "9"}, {"9"}},
       {{"dump", "--canonical", "da"}, {"data.plist"}},
       {{"unknown", ""}, {}},
   };
@@ -149,7 +157,7 @@ TEST(Completion, FishAndZshAreToldEveryCommandAndEveryOption) {
   expectAllNames(fish, "'__fish_seen_subcommand_from ", "'", "' -l ");
   for (const char* const part :
        {"completion' -a 'bash zsh fish'", "-l resources -x -a '(__fish_complete_directories)'",
-        "-l window -r -F", "-l press -x -d"}) {
+        "-l window -r -F", "-l press -x -a '(__qz_walkthrough_keys)' -d"}) {
     EXPECT_NE(fish.find(part), std::string::npos) << part;
   }
   const std::string zsh = run(completionCommand, {"completion", "zsh"}).out;
@@ -179,6 +187,7 @@ TEST(Completion, FishCompletesCommandsOptionsAndValues) {
       {"play d", {"data.plist", "dir/"}},
       {"play --resources d", {"dir/"}},
       {"play --press ", {}},
+      {"play --window data.plist dir/in\\ tro.plist --press 1", {"12", "100"}},
   };
   for (const auto& test : cases) {
     const std::string program = "source ./script\ncomplete -C 'qz-walkthrough " + test.line + "'\n";
@@ -219,6 +228,8 @@ TEST(Completion, ZshCompletesCommandsOptionsAndValues) {
       {"completion f", "completion fish "},
       {"dump da", "dump data.plist "},
       {"play --resources d", "play --resources dir/"},
+      {"play --window data.plist dir/in\\ tro.plist --start 10",
+       "play --window data.plist dir/in\\ tro.plist --start 100 "},
   };
   for (const auto& test : cases) {
     EXPECT_EQ(zshCompletes(place, test.line), test.completed) << test.line;

@@ -2,7 +2,7 @@
 // The words in which the transcript describes how a text looks.
 #include <gtest/gtest.h>
 
-#include "drivers/view_kinds.hpp"
+#include "qz/drivers/view_kinds.hpp"
 #include "tools/play/words.hpp"
 
 namespace qz::tools::play {

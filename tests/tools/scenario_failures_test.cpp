@@ -131,6 +131,9 @@ TEST(ScenarioFailures, FilesThatAreNotThere) {
   const auto found = failure("copy a.plist no/such.plist");
   EXPECT_TRUE(found.starts_with("1: expected the file no/such.plist in /")) << found;
   EXPECT_TRUE(found.ends_with(", got none")) << found;
+  const auto host = failure("host w none.plist");
+  EXPECT_TRUE(host.starts_with("1: expected the description of a host's window, got /")) << host;
+  EXPECT_TRUE(host.ends_with("/none.plist: no such file; expected a host's window")) << host;
   EXPECT_EQ(failure("file a text\nfile a/b text"),
             "2: expected the file a/b in the resource directory, got an error writing it");
 }

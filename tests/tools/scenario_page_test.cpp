@@ -7,7 +7,7 @@
 #include <string>
 #include <vector>
 
-#include "drivers/view_kinds.hpp"
+#include "qz/drivers/view_kinds.hpp"
 #include "scenario_support.hpp"
 
 namespace qz::tools::scenario {

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // The table of the kinds of view.
-#include "drivers/view_kinds.hpp"
+#include "qz/drivers/view_kinds.hpp"
 
 #include <gtest/gtest.h>
 

@@ -5,7 +5,6 @@
 
 #include <algorithm>
 
-#include "qz/toolkit/system_files.hpp"
 #include "text/ascii.hpp"
 
 namespace qz::toolkit {
@@ -29,13 +28,14 @@ bool isResourceName(std::string_view name) {
 
 }  // namespace
 
-std::optional<std::string> imageFileNamed(std::string_view name, std::string_view directory) {
+std::optional<std::string> imageFileNamed(std::string_view name, std::string_view directory,
+                                          bool (*isFile)(std::string_view path)) {
   if (!isResourceName(name)) return std::nullopt;
   std::string path = std::string(directory) + "/" + std::string(name);
-  if (carriesSuffix(name) && isRegularFile(path)) return path;
+  if (carriesSuffix(name) && isFile(path)) return path;
   for (const std::string_view suffix : imageSuffixes) {
     std::string candidate = path + "." + std::string(suffix);
-    if (isRegularFile(candidate)) return candidate;
+    if (isFile(candidate)) return candidate;
   }
   return std::nullopt;
 }

@@ -15,8 +15,12 @@
 - (qz::toolkit::Array*)arrayValue;
 @end
 
+/// What views of dictionaries share.
+@interface QZKeyedView : NSMutableDictionary
+@end
+
 /// Shows a dictionary of the engine.
-@interface QZDictionaryView : NSMutableDictionary {
+@interface QZDictionaryView : QZKeyedView {
  @private
   qz::toolkit::Dictionary* dictionary_;  // counted
 }

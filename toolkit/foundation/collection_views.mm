@@ -198,6 +198,15 @@ using namespace qz::toolkit::foundation;
 
 @end
 
+@implementation QZKeyedView
+
+// GNUstep does not derive it from the other methods.
+- (NSEnumerator*)objectEnumerator {
+  return [[self objectsForKeys:[self allKeys] notFoundMarker:[NSNull null]] objectEnumerator];
+}
+
+@end
+
 @implementation QZDictionaryView
 
 - (id)initWithDictionaryValue:(Dictionary*)dictionary {

@@ -11,10 +11,10 @@
 #include <string>
 #include <string_view>
 
+#include "qz/toolkit/class_names.hpp"
 #include "qz/toolkit/geometry.hpp"
 #include "qz/toolkit/image.hpp"
 #include "qz/toolkit/view.hpp"
-#include "toolkit/class_names.hpp"
 #include "toolkit/memory/saved_view.hpp"
 #include "toolkit/memory/screen.hpp"
 

@@ -7,6 +7,8 @@
 #include <QAction>
 #include <QDockWidget>
 #include <QMainWindow>
+#include <QMenu>
+#include <QResizeEvent>
 #include <QStackedWidget>
 #include <QToolBar>
 #include <QVariant>
@@ -14,6 +16,7 @@
 #include <utility>
 
 #include "toolkit/qt/bring_into_view.hpp"
+#include "toolkit/qt/hiding.hpp"
 #include "toolkit/qt/strings.hpp"
 #include "toolkit/qt/widget_node.hpp"
 
@@ -28,17 +31,6 @@ bool hasTagProperty(const QObject& object) {
                      [](const QByteArray& name) { return name == tagProperty; });
 }
 
-// Returns the action that a tool bar shows as `widget`; null if there is none.
-const QAction* actionShownBy(const QWidget& widget) {
-  const auto* const bar = qobject_cast<const QToolBar*>(widget.parentWidget());
-  if (!bar) return nullptr;
-  const auto actions = bar->actions();
-  const auto found = std::find_if(actions.begin(), actions.end(), [&](QAction* action) {
-    return bar->widgetForAction(action) == &widget;
-  });
-  return found == actions.end() ? nullptr : *found;
-}
-
 bool showsOneOf(const QAction& action, const std::vector<QWidget*>& controls) {
   return std::any_of(controls.begin(), controls.end(),
                      [&](const QWidget* control) { return actionShownBy(*control) == &action; });
@@ -50,6 +42,8 @@ bool isReached(const QObject& object, const std::vector<QWidget*>& controls) {
   return action && showsOneOf(*action, controls);
 }
 
+bool isPanel(const QWidget& widget) { return widget.property(panelProperty).toBool(); }
+
 // True if the widget is hidden for itself, and not as a page that is not the current one.
 bool isKeptHidden(const QWidget& widget) {
   return widget.isHidden() && !qobject_cast<const QStackedWidget*>(widget.parentWidget());
@@ -59,10 +53,25 @@ bool isKeptHidden(const QWidget& widget) {
 
 bool isPartOfForm(const QWidget& widget) {
   return !widget.isWindow() || qobject_cast<const QDockWidget*>(&widget) ||
-         qobject_cast<const QToolBar*>(&widget);
+         qobject_cast<const QToolBar*>(&widget) || qobject_cast<const QMenu*>(&widget) ||
+         isPanel(widget);
 }
 
-AdoptedForm::AdoptedForm(QWidget& window, Adoption how) : window_(&window), how_(std::move(how)) {}
+AdoptedForm::AdoptedForm(QWidget& window, Adoption how) : window_(&window), how_(std::move(how)) {
+  if (how_.restoring == Adoption::Restoring::everything) window.installEventFilter(this);
+}
+
+// A user cannot make the window smaller than its minimum. So it is a layout that wants more, now
+// that commands have changed what it holds, if the window grows to its minimum.
+bool AdoptedForm::eventFilter(QObject*, QEvent* event) {
+  if (event->type() != QEvent::Resize) return false;
+  const QSize before = static_cast<QResizeEvent*>(event)->oldSize();
+  const QSize now = window_->size();
+  const bool isForced =
+      before.isValid() && now != before && now == before.expandedTo(window_->minimumSize());
+  if (isForced) trace_.remember({window_, &sizeFacet(), before}, now);
+  return false;
+}
 
 QWidget* AdoptedForm::content() const {
   const auto* const mainWindow = qobject_cast<const QMainWindow*>(window_.data());
@@ -77,6 +86,14 @@ void AdoptedForm::list(std::vector<QWidget*>& found) const {
   if (how_.reading == Adoption::Reading::everyTaggedWidget) return addTagged(*window_, found);
   for (QObject* const child : around->children()) {
     if (isSubview(child)) found.push_back(static_cast<QWidget*>(child));
+  }
+  addTaggedInPanels(found);
+}
+
+void AdoptedForm::addTaggedInPanels(std::vector<QWidget*>& found) const {
+  for (const QObject* const child : window_->children()) {
+    const auto* const panel = child->isWidgetType() ? static_cast<const QWidget*>(child) : nullptr;
+    if (panel && isPanel(*panel)) addTagged(*panel, found);
   }
 }
 
@@ -146,14 +163,20 @@ std::vector<std::string> AdoptedForm::unreachableTags() const {
   return complaints;
 }
 
-std::vector<Sighting> AdoptedForm::look(QWidget& widget) const {
+std::vector<Sighting> AdoptedForm::look(QWidget& widget, Notice notice) const {
   if (how_.restoring == Adoption::Restoring::tags) return {};
-  return sightingsAround(widget);
+  return sightingsAround(widget, notice == Notice::shown && isHeardByHosts(widget));
 }
 
 void AdoptedForm::changed(QWidget* widget, Notice notice, const std::vector<Sighting>& before) {
-  if (widget) attend(*widget, notice);
+  if (widget && !isOver_) attend(*widget, notice);
   trace_.note(before);
+  if (isOver_) trace_.undo();
+}
+
+void AdoptedForm::restore() {
+  isOver_ = true;
+  trace_.undo();
 }
 
 void AdoptedForm::attend(QWidget& widget, Notice notice) {

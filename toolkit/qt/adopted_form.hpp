@@ -18,15 +18,18 @@ class QAction;
 namespace qz::toolkit::qt {
 
 /// True if `widget`, a child of a widget of a form, belongs to the form too: if it is not a window,
-/// or if it is a dock or a tool bar, which may float as a window.
+/// if it is a dock, a tool bar or a menu, or if it is marked as a panel.
 bool isPartOfForm(const QWidget& widget);
 
 /// How much of a control's change the user is to see.
 enum class Notice : std::uint8_t { none, shown, flash };
 
-class AdoptedForm {
+class AdoptedForm final : public QObject {
  public:
   AdoptedForm(QWidget& window, Adoption how);
+
+  /// Remembers the size of the window when its layout enlarges it.
+  bool eventFilter(QObject* receiver, QEvent* event) override;
 
   /// Returns the widget that holds the window's controls; null if it is gone. The central widget of
   /// a main window that has one, otherwise the window.
@@ -40,19 +43,22 @@ class AdoptedForm {
   std::vector<std::string> unreachableTags() const;
 
   /// Returns all that a change of `widget` can change, as `changed` needs it; nothing if the
-  /// adoption does not restore it.
-  std::vector<Sighting> look(QWidget& widget) const;
+  /// adoption does not restore it. A change that is shown also changes what the host changes in
+  /// return: it may enable a button when a text is no longer empty.
+  std::vector<Sighting> look(QWidget& widget, Notice notice) const;
   /// Brings a changed control into view, if the adoption says so. A flash does so only once for
   /// each control, so that it does not drag back a user who has gone elsewhere. Remembers what has
   /// changed since `before`.
   void changed(QWidget* widget, Notice notice, const std::vector<Sighting>& before);
-  /// Restores what has been remembered.
-  void restore() { trace_.undo(); }
+  /// Restores what has been remembered, and from now on every change at once: a list may still
+  /// run.
+  void restore();
 
  private:
   void attend(QWidget& widget, Notice notice);
   void addTagged(const QWidget& around, std::vector<QWidget*>& found) const;
   void addTaggedFrom(QWidget& widget, std::vector<QWidget*>& found) const;
+  void addTaggedInPanels(std::vector<QWidget*>& found) const;
   bool isTagged(const QObject& object) const;
   std::optional<Tag> namedTag(const QObject& object) const;
   std::string complaintAbout(const QObject& object) const;
@@ -61,6 +67,7 @@ class AdoptedForm {
   Adoption how_;
   std::set<const QWidget*> flashed_;
   Trace trace_;
+  bool isOver_ = false;
 };
 
 }  // namespace qz::toolkit::qt

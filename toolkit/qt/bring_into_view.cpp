@@ -6,6 +6,8 @@
 #include <QDockWidget>
 #include <QLayout>
 #include <QMainWindow>
+#include <QMdiArea>
+#include <QMdiSubWindow>
 #include <QScrollArea>
 #include <QSplitter>
 #include <QStackedWidget>
@@ -48,6 +50,12 @@ void openPanel(QWidget& panel) {
   if (mainWindow && !mainWindow->tabifiedDockWidgets(dock).isEmpty()) dock->raise();
 }
 
+// Another sub-window may cover it.
+void openSubWindow(QWidget& widget) {
+  auto* const window = qobject_cast<QMdiSubWindow*>(&widget);
+  if (window && window->mdiArea()) window->mdiArea()->setActiveSubWindow(window);
+}
+
 int lengthAlong(Qt::Orientation orientation, const QSize& size) {
   return orientation == Qt::Horizontal ? size.width() : size.height();
 }
@@ -79,6 +87,7 @@ void openPlacesOf(QWidget& widget, QWidget& target) {
   QWidget* const around = isPartOfForm(widget) ? widget.parentWidget() : nullptr;
   if (around) openPlacesOf(*around, target);
   openPanel(widget);
+  openSubWindow(widget);
   openPage(widget);
   openToolBoxPage(widget);
   openPane(widget);

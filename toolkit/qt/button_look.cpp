@@ -15,6 +15,7 @@
 #include "toolkit/qt/mnemonics.hpp"
 #include "toolkit/qt/rich_text.hpp"
 #include "toolkit/qt/strings.hpp"
+#include "toolkit/qt/user_preferences.hpp"
 #include "toolkit/qt/widget_colors.hpp"
 
 namespace qz::toolkit::qt {
@@ -24,13 +25,6 @@ namespace {
 /// How long an outline outlasts a highlight, in milliseconds. Longer than the half second between
 /// two flashes, so that the outline does not blink.
 constexpr int outlineRest = 1200;
-
-bool isSet(const QByteArray& value) { return !value.isEmpty() && value != "0"; }
-
-bool prefersReducedMotion() {
-  return isSet(qApp->property(reducedMotionProperty).toByteArray()) ||
-         isSet(qgetenv(reducedMotionVariable));
-}
 
 class ButtonLook final : public QObject {
  public:

@@ -48,9 +48,4 @@ std::optional<Color> faceColor(const QAbstractButton& button);
 void setBezel(QAbstractButton& button, BezelStyle style);
 BezelStyle bezelOf(const QAbstractButton& button);
 
-/// The application's dynamic property and the environment variable that ask for reduced motion when
-/// set to anything but "0". They exist because Qt 6.4 does not report the desktop's own setting.
-inline constexpr const char* reducedMotionProperty = "qzReducedMotion";
-inline constexpr const char* reducedMotionVariable = "QZ_REDUCED_MOTION";
-
 }  // namespace qz::toolkit::qt

@@ -3,13 +3,18 @@
 
 #include "toolkit/qt/facets.hpp"
 
+#include <QAbstractButton>
 #include <QAbstractScrollArea>
 #include <QButtonGroup>
+#include <QCoreApplication>
 #include <QDockWidget>
 #include <QKeySequence>
 #include <QLabel>
+#include <QLayout>
 #include <QLineEdit>
 #include <QMainWindow>
+#include <QMdiArea>
+#include <QMdiSubWindow>
 #include <QPixmap>
 #include <QPlainTextEdit>
 #include <QPointer>
@@ -26,6 +31,7 @@
 #include "toolkit/qt/adopted_form.hpp"
 #include "toolkit/qt/button_look.hpp"
 #include "toolkit/qt/check_state.hpp"
+#include "toolkit/qt/hiding.hpp"
 #include "toolkit/qt/image_look.hpp"
 #include "toolkit/qt/text_look.hpp"
 #include "toolkit/qt/widget_node.hpp"
@@ -70,9 +76,11 @@ void writeDescription(QWidget& widget, const QVariant& value) {
 QVariant readToolTip(QWidget& widget) { return widget.toolTip(); }
 void writeToolTip(QWidget& widget, const QVariant& value) { widget.setToolTip(value.toString()); }
 
-// Stacks and tool boxes hide and show their pages themselves.
-bool isPage(const QWidget& widget) {
-  return qobject_cast<QStackedWidget*>(widget.parentWidget()) ||
+// Stacks and tool boxes hide and show their pages themselves. But somebody may hide a current page.
+bool isOtherPage(const QWidget& widget) {
+  const auto* const stack = qobject_cast<QStackedWidget*>(widget.parentWidget());
+  const bool isTab = stack && qobject_cast<QTabWidget*>(stack->parentWidget());
+  return (stack && !isTab && stack->currentWidget() != &widget) ||
          qobject_cast<QToolBox*>(widget.parentWidget());
 }
 
@@ -85,18 +93,19 @@ struct HiddenState {
 };
 
 QVariant readHidden(QWidget& widget) {
-  if (!isPartOfForm(widget) || isPage(widget)) return {};
-  return QVariant::fromValue(HiddenState{widget.isHidden(), widget.geometry()});
+  if (!isPartOfForm(widget) || isOtherPage(widget)) return {};
+  return QVariant::fromValue(HiddenState{isHiddenInForm(widget), widget.geometry()});
 }
 
 void writeHidden(QWidget& widget, const QVariant& value) {
   const auto state = value.value<HiddenState>();
-  widget.setHidden(state.isHidden);
+  setHiddenInForm(widget, state.isHidden);
   if (state.isHidden) widget.setGeometry(state.place);
 }
 
 QVariant readEnabled(QWidget& widget) {
-  return widget.isWindow() ? QVariant() : widget.isEnabledTo(widget.parentWidget());
+  if (!isPartOfForm(widget)) return {};
+  return widget.isEnabledTo(widget.parentWidget());
 }
 void writeEnabled(QWidget& widget, const QVariant& value) { widget.setEnabled(value.toBool()); }
 
@@ -239,14 +248,15 @@ void writeChoice(QWidget& widget, const QVariant& value) {
 // --- labels and edits ---
 
 struct LabelState {
-  QString text;
+  QString text;  // of a styled text, Qt's own: it depends on the palette
   Qt::TextFormat format = Qt::AutoText;
   std::optional<AttributedString> styled;
   QPixmap pixmap;
   Ref<Image> image;
+  bool tracksMouse = false;  // Qt turns this on with a rich text, and never off
   friend bool operator==(const LabelState& a, const LabelState& b) {
-    return a.text == b.text && a.format == b.format && a.styled == b.styled &&
-           a.pixmap.cacheKey() == b.pixmap.cacheKey() && a.image == b.image;
+    return a.styled == b.styled && a.pixmap.cacheKey() == b.pixmap.cacheKey() &&
+           a.image == b.image && (a.styled || (a.text == b.text && a.format == b.format));
   }
 };
 
@@ -254,12 +264,11 @@ QVariant readLabel(QWidget& widget) {
   const auto* const label = qobject_cast<QLabel*>(&widget);
   if (!label) return {};
   return QVariant::fromValue(LabelState{label->text(), label->textFormat(), styledText(widget),
-                                        label->pixmap(Qt::ReturnByValue), shownImage(*label)});
+                                        label->pixmap(Qt::ReturnByValue), shownImage(*label),
+                                        label->hasMouseTracking()});
 }
 
-void writeLabel(QWidget& widget, const QVariant& value) {
-  auto& label = static_cast<QLabel&>(widget);
-  const auto state = value.value<LabelState>();
+void showLabel(QLabel& label, const LabelState& state) {
   dropStyledText(label);
   dropImage(label);
   label.setTextFormat(state.format);
@@ -268,6 +277,12 @@ void writeLabel(QWidget& widget, const QVariant& value) {
   if (state.styled) return showText(label, *state.styled);
   label.clear();  // a label with a pixmap may ignore an empty text
   label.setText(state.text);
+}
+
+void writeLabel(QWidget& widget, const QVariant& value) {
+  const auto state = value.value<LabelState>();
+  showLabel(static_cast<QLabel&>(widget), state);
+  widget.setMouseTracking(state.tracksMouse);
 }
 
 struct LineState {
@@ -401,6 +416,30 @@ void writeScroll(QWidget& widget, const QVariant& value) {
   area.verticalScrollBar()->setValue(value.toPoint().y());
 }
 
+// A window's. Qt enlarges it when its layout needs more room.
+QVariant readSize(QWidget& widget) { return widget.size(); }
+
+// Lets the layouts of the widget, and of all widgets in it, forget what they needed before. Qt
+// leaves those of pages that are not shown for later.
+void layOut(QWidget& widget) {
+  for (QObject* const child : QObjectList(widget.children())) {
+    auto* const inner = qobject_cast<QWidget*>(child);
+    if (inner && isPartOfForm(*inner)) layOut(*inner);
+  }
+  if (QLayout* const layout = widget.layout()) {
+    layout->invalidate();
+    layout->activate();
+  }
+  widget.updateGeometry();
+  QCoreApplication::sendPostedEvents(&widget, QEvent::LayoutRequest);
+}
+
+void writeSize(QWidget& widget, const QVariant& value) {
+  layOut(widget);
+  widget.resize(value.toSize());
+  layOut(widget);
+}
+
 // Returns the dock and those that share its place.
 QList<QDockWidget*> docksAt(QDockWidget& dock) {
   const auto* const mainWindow = qobject_cast<QMainWindow*>(dock.parentWidget());
@@ -423,24 +462,58 @@ void writeFrontDock(QWidget&, const QVariant& value) {
   if (QWidget* const front = picked(value)) front->raise();
 }
 
+QVariant readSubWindow(QWidget& widget) {
+  const auto* const area = qobject_cast<QMdiArea*>(&widget);
+  return area ? pick(area->currentSubWindow()) : QVariant();
+}
+
+void writeSubWindow(QWidget& widget, const QVariant& value) {
+  auto* const window = qobject_cast<QMdiSubWindow*>(picked(value));
+  if (window) static_cast<QMdiArea&>(widget).setActiveSubWindow(window);
+}
+
 }  // namespace
 
 std::span<const Facet> facets() {
   static constexpr Facet table[] = {
       {readFocus, writeFocus},  // a widget that is hidden or disabled cannot take it
-      {readScroll, writeScroll},       {readTagProperty, writeTagProperty},
-      {readName, writeName},           {readDescription, writeDescription},
-      {readToolTip, writeToolTip},     {readHidden, writeHidden},
-      {readEnabled, writeEnabled},     {readLayer, writeLayer},
-      {readCheck, writeCheck},         {readChoice, writeChoice},
-      {readFace, writeFace},           {readBezel, writeBezel},
-      {readHighlight, writeHighlight}, {readTitle, writeTitle},
-      {readLabel, writeLabel},         {readLine, writeLine},
-      {readPage, writePage},           {readDress, writeDress},
-      {readPanes, writePanes},         {readPageShown, writePageShown},
+      {readScroll, writeScroll},
+      {readSize, writeSize, Facet::Reach::layout},
+      {readTagProperty, writeTagProperty},
+      {readName, writeName},
+      {readDescription, writeDescription},
+      {readToolTip, writeToolTip},
+      {readHidden, writeHidden, Facet::Reach::form},
+      {readEnabled, writeEnabled, Facet::Reach::form},
+      {readLayer, writeLayer},
+      {readCheck, writeCheck},
+      {readChoice, writeChoice},
+      {readFace, writeFace},
+      {readBezel, writeBezel},
+      {readHighlight, writeHighlight},
+      {readTitle, writeTitle},
+      {readLabel, writeLabel},
+      {readLine, writeLine},
+      {readPage, writePage},
+      {readDress, writeDress},
+      {readPanes, writePanes},
+      {readPageShown, writePageShown},
       {readFrontDock, writeFrontDock},
+      {readSubWindow, writeSubWindow},
   };
   return table;
+}
+
+const Facet& sizeFacet() {
+  const auto table = facets();
+  return *std::find_if(table.begin(), table.end(),
+                       [](const Facet& facet) { return facet.reach == Facet::Reach::layout; });
+}
+
+bool isHeardByHosts(const QWidget& widget) {
+  const auto* const button = qobject_cast<const QAbstractButton*>(&widget);
+  return (button && button->isCheckable()) ||
+         (showsText(widget) && !qobject_cast<const QLabel*>(&widget));
 }
 
 std::vector<QWidget*> widgetsConcernedBy(QWidget& widget) {

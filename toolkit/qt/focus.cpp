@@ -13,12 +13,12 @@ bool isWithin(const QWidget* inner, const QWidget& outer) {
   return inner == &outer || outer.isAncestorOf(inner);
 }
 
+}  // namespace
+
 bool takesFocus(const QWidget& widget) {
   return (widget.focusPolicy() & Qt::TabFocus) == Qt::TabFocus && widget.isEnabled() &&
          widget.isVisibleTo(widget.window()) && !widget.isWindow();
 }
-
-}  // namespace
 
 void giveFocusAway(QWidget& widget) {
   QWidget* const focused = widget.window()->focusWidget();

@@ -9,6 +9,7 @@
 #include <QPainter>
 #include <filesystem>
 
+#include "qz/toolkit/qt/files.hpp"
 #include "toolkit/backend/image_names.hpp"
 #include "toolkit/qt/strings.hpp"
 
@@ -59,7 +60,7 @@ const QImage& QtImage::pixels(double ratio) const {
 
 Ref<Image> QtImages::imageNamed(std::string_view name) {
   const auto known = found_.find(name);
-  const auto path = imageFileNamed(name, files_.resourcePath());
+  const auto path = imageFileNamed(name, files_.resourcePath(), isFileOrResource);
   if (known != found_.end() && path && known->second->isOf(*path)) return known->second;
   if (known != found_.end()) found_.erase(known);
   if (!path) return {};

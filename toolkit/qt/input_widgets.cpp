@@ -12,6 +12,7 @@
 #include <QGroupBox>
 #include <QKeySequenceEdit>
 #include <QLineEdit>
+#include <QMenu>
 #include <QMenuBar>
 #include <QPlainTextEdit>
 #include <QSplitterHandle>
@@ -35,8 +36,8 @@ bool takesInput(const QWidget& widget) {
   if (const auto* const box = qobject_cast<const QGroupBox*>(&widget)) return box->isCheckable();
   return widget.focusPolicy() != Qt::NoFocus ||
          isOneOf<QAbstractButton, QAbstractItemView, QAbstractSlider, QAbstractSpinBox,
-                 QCalendarWidget, QComboBox, QKeySequenceEdit, QLineEdit, QMenuBar, QPlainTextEdit,
-                 QSplitterHandle, QTabBar, QTabWidget, QTextEdit, QToolBox>(widget);
+                 QCalendarWidget, QComboBox, QKeySequenceEdit, QLineEdit, QMenu, QMenuBar,
+                 QPlainTextEdit, QSplitterHandle, QTabBar, QTabWidget, QTextEdit, QToolBox>(widget);
 }
 
 }  // namespace qz::toolkit::qt

@@ -16,7 +16,7 @@ struct QtToolkit::Parts {
 
   SteadyClock steadyClock;
   QtLog log;
-  SystemFiles files;
+  QtFiles files;
   QtImages images{files};
   QtFonts fonts;
   QtApplication application{log};

@@ -15,7 +15,7 @@ QtApplication& QtToolkit::application() { return parts_->application; }
 RunLoop& QtToolkit::runLoop() { return parts_->runLoop; }
 Images& QtToolkit::images() { return parts_->images; }
 Fonts& QtToolkit::fonts() { return parts_->fonts; }
-SystemFiles& QtToolkit::files() { return parts_->files; }
+QtFiles& QtToolkit::files() { return parts_->files; }
 QtLog& QtToolkit::log() { return parts_->log; }
 Calls& QtToolkit::calls() { return parts_->application.desk()->calls; }
 

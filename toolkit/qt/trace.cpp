@@ -6,6 +6,8 @@
 #include <algorithm>
 #include <utility>
 
+#include "toolkit/qt/adopted_form.hpp"
+
 namespace qz::toolkit::qt {
 
 namespace {
@@ -16,15 +18,36 @@ int depthOf(const QWidget& widget) {
   return depth;
 }
 
+// A floating dock is not the window.
+const QWidget& windowAround(const QWidget& widget) {
+  const QWidget* around = &widget;
+  while (isPartOfForm(*around) && around->parentWidget()) around = around->parentWidget();
+  return *around;
+}
+
+std::vector<QWidget*> formAround(const QWidget& widget) {
+  const auto found = windowAround(widget).findChildren<QWidget*>();
+  return {found.begin(), found.end()};
+}
+
+void look(QWidget& widget, const Facet& facet, std::vector<Sighting>& sightings) {
+  QVariant value = facet.read(widget);
+  if (value.isValid()) sightings.push_back({&widget, &facet, std::move(value)});
+}
+
 }  // namespace
 
-std::vector<Sighting> sightingsAround(QWidget& widget) {
+std::vector<Sighting> sightingsAround(QWidget& widget, bool withReactions) {
   std::vector<Sighting> sightings;
-  for (QWidget* const concerned : widgetsConcernedBy(widget)) {
+  const auto lookAt = [&](QWidget& one, Facet::Reach reach) {
     for (const Facet& facet : facets()) {
-      QVariant value = facet.read(*concerned);
-      if (value.isValid()) sightings.push_back({concerned, &facet, std::move(value)});
+      if (facet.reach == reach) look(one, facet, sightings);
     }
+  };
+  const auto near = widgetsConcernedBy(widget);
+  for (QWidget* const one : near) lookAt(*one, Facet::Reach::near);
+  for (QWidget* const one : withReactions ? formAround(widget) : near) {
+    lookAt(*one, Facet::Reach::form);
   }
   return sightings;
 }
@@ -53,7 +76,7 @@ void Trace::remember(const Sighting& before, const QVariant& now) {
 // What is ours is decided first: restoring one facet may change another. The later facets of the
 // table come first, whatever the order of the changes. Of those, inner widgets come before those
 // around them, so that a page is restored while it is shown.
-void Trace::undo() {
+void Trace::undoNoted() {
   auto entries = std::exchange(entries_, {});
   std::erase_if(entries, [](const Entry& entry) { return !entry.isOurs(); });
   std::stable_sort(entries.begin(), entries.end(), [](const Entry& a, const Entry& b) {
@@ -62,6 +85,12 @@ void Trace::undo() {
   for (const Entry& entry : entries) {
     if (entry.widget) entry.facet->write(*entry.widget, entry.original);
   }
+}
+
+// Twice, because a page that is shown again may enlarge the window.
+void Trace::undo() {
+  undoNoted();
+  undoNoted();
 }
 
 }  // namespace qz::toolkit::qt

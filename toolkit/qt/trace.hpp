@@ -18,13 +18,16 @@ struct Sighting {
   QVariant value;
 };
 
-/// Returns every facet that a change of `widget` can change.
-std::vector<Sighting> sightingsAround(QWidget& widget);
+/// Returns every facet that a change of `widget` can change; with what the host may change in
+/// return, in the whole window, if it is wanted.
+std::vector<Sighting> sightingsAround(QWidget& widget, bool withReactions);
 
 class Trace {
  public:
   /// Remembers what has changed since the sightings.
   void note(const std::vector<Sighting>& before);
+  /// Remembers that a facet was as sighted, and that we have changed it to `now`.
+  void remember(const Sighting& before, const QVariant& now);
   /// Restores all that was noted, except what somebody else has changed since, and forgets it.
   void undo();
 
@@ -37,7 +40,7 @@ class Trace {
     bool isOurs() const { return widget && facet->read(*widget) == ours; }
   };
 
-  void remember(const Sighting& before, const QVariant& now);
+  void undoNoted();
 
   std::vector<Entry> entries_;
 };

@@ -9,7 +9,7 @@ namespace qz::toolkit::qt {
 
 ViewChange::ViewChange(QWidget* widget, std::shared_ptr<AdoptedForm> form, Notice notice)
     : widget_(widget), form_(std::move(form)), notice_(notice) {
-  if (form_ && widget) before_ = form_->look(*widget);
+  if (form_ && widget) before_ = form_->look(*widget, notice);
 }
 
 ViewChange::~ViewChange() {

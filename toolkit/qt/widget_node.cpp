@@ -12,6 +12,7 @@
 #include "toolkit/backend/insertion.hpp"
 #include "toolkit/qt/coordinates.hpp"
 #include "toolkit/qt/focus.hpp"
+#include "toolkit/qt/hiding.hpp"
 
 namespace qz::toolkit::qt {
 
@@ -190,7 +191,7 @@ bool WidgetNode::isOutside() const { return keptBy_ == KeptBy::holder && !widget
 
 bool WidgetNode::isHidden() const {
   if (!widget_) return false;
-  return isOutside() ? hiddenOutside_ : widget_->isHidden();
+  return isOutside() ? hiddenOutside_ : isHiddenInForm(*widget_);
 }
 
 // Only remembers the state of a view without a superview: Qt would show it as a separate window.
@@ -200,7 +201,7 @@ void WidgetNode::hide(bool hidden) {
   if (isOutside()) {
     hiddenOutside_ = hidden;
   } else {
-    widget_->setVisible(!hidden);
+    setHiddenInForm(*widget_, hidden);
   }
   changed();
 }

@@ -33,6 +33,10 @@ inline constexpr const char* imageViewProperty = "qzImageView";
 /// there is one.
 inline constexpr const char* pressProperty = "qzPress";
 
+/// The dynamic property that makes a child of a window a part of the adopted window if it is true,
+/// even if the child is a window too: its widgets with tags are controls.
+inline constexpr const char* panelProperty = "qzPanel";
+
 /// True if `child`, a child of a widget, is a subview: a widget that is not a window.
 bool isSubview(const QObject* child);
 
@@ -63,6 +67,9 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   /// Makes the view a control of an adopted window while `form` lives. `tag` is the tag of a widget
   /// that has no tag of its own.
   void joinForm(const std::shared_ptr<AdoptedForm>& form, Tag tag);
+  /// Brings the widget into view as a command that changes it does, if it is a control of an
+  /// adopted window.
+  void comeIntoView() { const auto noted = change(Notice::shown); }
 
  protected:
   virtual View& role() = 0;

@@ -10,8 +10,8 @@
 
 #include "tools/check/allowances.hpp"
 #include "tools/check/expectation_check.hpp"
-#include "tools/check/exploration.hpp"
 #include "tools/check/finding.hpp"
+#include "tools/exploration/exploration.hpp"
 #include "tools/support/input_file.hpp"
 #include "tools/walkthrough/stage.hpp"
 

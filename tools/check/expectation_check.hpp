@@ -7,8 +7,8 @@
 #include <vector>
 
 #include "tools/check/expectations.hpp"
-#include "tools/check/exploration.hpp"
 #include "tools/check/finding.hpp"
+#include "tools/exploration/exploration.hpp"
 
 namespace qz::tools::check {
 

@@ -8,7 +8,7 @@
 #include <vector>
 
 #include "tools/check/finding.hpp"
-#include "tools/check/script.hpp"
+#include "tools/exploration/script.hpp"
 
 namespace qz::tools::check {
 

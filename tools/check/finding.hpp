@@ -11,7 +11,7 @@
 #include <vector>
 
 #include "qz/property_list/value.hpp"
-#include "tools/check/move.hpp"
+#include "tools/exploration/move.hpp"
 
 namespace qz::tools::check {
 

@@ -11,7 +11,7 @@
 #include <utility>
 #include <vector>
 
-#include "tools/check/exploration.hpp"
+#include "tools/exploration/exploration.hpp"
 
 namespace qz::tools::check {
 

@@ -6,7 +6,7 @@
 
 #include "qz/toolkit/toolkit.hpp"
 #include "tools/check/finding.hpp"
-#include "tools/check/script.hpp"
+#include "tools/exploration/script.hpp"
 
 namespace qz::tools::check {
 

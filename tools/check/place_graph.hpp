@@ -5,7 +5,7 @@
 #include <cstdint>
 #include <vector>
 
-#include "tools/check/exploration.hpp"
+#include "tools/exploration/exploration.hpp"
 
 namespace qz::tools::check {
 

@@ -9,7 +9,7 @@
 #include <tuple>
 #include <vector>
 
-#include "tools/check/exploration.hpp"
+#include "tools/exploration/exploration.hpp"
 
 namespace qz::tools::check {
 

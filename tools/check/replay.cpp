@@ -6,8 +6,8 @@
 
 #include "drivers/memory/memory_driver.hpp"
 #include "qz/toolkit/exception.hpp"
-#include "tools/check/endless_run.hpp"
-#include "tools/check/recorder.hpp"
+#include "tools/exploration/endless_run.hpp"
+#include "tools/exploration/recorder.hpp"
 #include "tools/support/text_layout.hpp"
 
 namespace qz::tools::check {

@@ -6,8 +6,8 @@
 #include <string>
 #include <vector>
 
-#include "tools/check/move.hpp"
-#include "tools/check/world.hpp"
+#include "tools/exploration/move.hpp"
+#include "tools/exploration/world.hpp"
 #include "tools/walkthrough/step_picture.hpp"
 
 namespace qz::tools::check {

@@ -6,7 +6,7 @@
 #include <optional>
 #include <string>
 
-#include "tools/check/exploration.hpp"
+#include "tools/exploration/exploration.hpp"
 
 namespace qz::tools::check {
 

@@ -7,7 +7,7 @@
 #include <string>
 #include <string_view>
 
-#include "drivers/driver.hpp"
+#include "qz/drivers/driver.hpp"
 #include "tools/play/transcript.hpp"
 
 namespace qz::tools::play {

@@ -9,7 +9,7 @@
 #include <string>
 #include <vector>
 
-#include "drivers/driver.hpp"
+#include "qz/drivers/driver.hpp"
 #include "qz/toolkit/exception.hpp"
 #include "tools/play/play.hpp"
 #include "tools/play/screenshots.hpp"

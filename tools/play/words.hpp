@@ -6,7 +6,7 @@
 #include <string_view>
 #include <vector>
 
-#include "drivers/driver.hpp"
+#include "qz/drivers/driver.hpp"
 #include "qz/styled_text/attributed_string.hpp"
 #include "tools/walkthrough/step_picture.hpp"
 

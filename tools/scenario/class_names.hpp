@@ -6,7 +6,7 @@
 #include <string>
 #include <string_view>
 
-#include "drivers/driver.hpp"
+#include "qz/drivers/driver.hpp"
 #include "tools/scenario/json.hpp"
 
 namespace qz::tools::scenario {

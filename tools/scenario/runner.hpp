@@ -8,7 +8,7 @@
 #include <string>
 #include <vector>
 
-#include "drivers/driver.hpp"
+#include "qz/drivers/driver.hpp"
 #include "tools/scenario/parser.hpp"
 
 namespace qz::tools::scenario {

@@ -10,6 +10,9 @@
 #include "tools/scenario/statements.hpp"
 #include "tools/scenario/unmet.hpp"
 #include "tools/scenario/values.hpp"
+#include "tools/support/failure.hpp"
+#include "tools/support/input_file.hpp"
+#include "tools/walkthrough/host_window.hpp"
 
 namespace qz::tools::scenario {
 namespace setting_up {
@@ -56,6 +59,16 @@ Outcome window(Stage& stage, const Arguments& a) {
   const auto made = stage.driver.makeWindow(rectangle(a, {100, 100, 640, 480}));
   stage.cast.nameWindow(a.text("+W"), toolkit::StoredRef<toolkit::Window>::own(made));
   return {};
+}
+
+Outcome host(Stage& stage, const Arguments& a) try {
+  const auto path = std::filesystem::absolute(stage.file).replace_filename(a.text("PATH")).string();
+  const auto described = walkthrough::parseHostWindow(InputFile(path, "a host's window"));
+  const auto made = walkthrough::makeHostWindow(stage.driver, described, path);
+  stage.cast.nameWindow(a.text("+W"), toolkit::StoredRef<toolkit::Window>::own(made));
+  return {};
+} catch (const Failure& failure) {
+  throw Unmet("the description of a host's window", failure.what());
 }
 
 Cast::View viewNamed(const Stage& stage, const std::string& place) {
@@ -119,6 +132,7 @@ constexpr StatementKind table[] = {
     {"copy FILE PATH", Result::never, copy},
     {"image FILE", Result::never, image},
     {"window +W [X Y WIDTH HEIGHT]", Result::never, window},
+    {"host +W PATH", Result::never, host},
     {"control +C CLASS TAG in PLACE [X Y WIDTH HEIGHT]", Result::never, control},
     {"controls COUNT CLASS TAG in PLACE", Result::never, controls},
     {"delegate W", Result::never, delegate},

@@ -9,7 +9,7 @@
 #include <iterator>
 #include <limits>
 
-#include "drivers/view_kinds.hpp"
+#include "qz/drivers/view_kinds.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/suggestions.hpp"
 

@@ -8,7 +8,7 @@
 #include <optional>
 #include <string>
 
-#include "drivers/driver.hpp"
+#include "qz/drivers/driver.hpp"
 #include "tools/scenario/cast.hpp"
 #include "tools/scenario/class_names.hpp"
 #include "tools/scenario/command_names.hpp"

@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
 // The table of the toolkits, of which a build of the tool has some. The row of a toolkit is in
-// drivers/NAME/toolkit_row.hpp.
+// qz/drivers/NAME/toolkit_row.hpp.
 #pragma once
 
 #include <memory>
@@ -9,8 +9,8 @@
 #include <string_view>
 #include <vector>
 
-#include "drivers/driver.hpp"
-#include "drivers/toolkit_row.hpp"
+#include "qz/drivers/driver.hpp"
+#include "qz/drivers/toolkit_row.hpp"
 
 namespace qz::tools {
 

@@ -4,12 +4,12 @@
 
 #include <vector>
 
-#include "drivers/toolkit_row.hpp"
+#include "qz/drivers/toolkit_row.hpp"
 
 namespace qz::tools {
 
-/// Returns the row of each `drivers/NAME/toolkit_row.hpp`, in the order of the folders' names. Rows
-/// of toolkits that this build is without have no `make`.
+/// Returns the row of each `qz/drivers/NAME/toolkit_row.hpp`, in the order of the folders' names.
+/// Rows of toolkits that this build is without have no `make`.
 std::vector<drivers::ToolkitRow> toolkitRows();
 
 }  // namespace qz::tools

@@ -8,7 +8,7 @@
 #include <string_view>
 #include <vector>
 
-#include "drivers/driver.hpp"
+#include "qz/drivers/driver.hpp"
 #include "qz/toolkit/geometry.hpp"
 #include "tools/support/input_file.hpp"
 

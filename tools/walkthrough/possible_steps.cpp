@@ -4,7 +4,7 @@
 
 #include <algorithm>
 
-#include "drivers/view_kinds.hpp"
+#include "qz/drivers/view_kinds.hpp"
 
 namespace qz::tools::walkthrough {
 

@@ -6,7 +6,7 @@
 #include <optional>
 #include <string>
 
-#include "drivers/driver.hpp"
+#include "qz/drivers/driver.hpp"
 #include "qz/engine.hpp"
 #include "tools/walkthrough/host_window.hpp"
 

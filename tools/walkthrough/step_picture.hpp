@@ -8,7 +8,7 @@
 #include <string>
 #include <vector>
 
-#include "drivers/driver.hpp"
+#include "qz/drivers/driver.hpp"
 #include "qz/engine.hpp"
 
 namespace qz::tools::walkthrough {

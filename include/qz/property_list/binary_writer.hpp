@@ -4,6 +4,7 @@
 
 #include <string>
 
+#include "qz/api.hpp"
 #include "qz/property_list/value.hpp"
 
 namespace qz::toolkit {
@@ -14,6 +15,6 @@ namespace qz::toolkit {
 /// Raises an invalid-argument exception for a value that no binary property list can hold: an
 /// absent value, a collection as a key, a collection within itself, and more than 512 nested
 /// levels.
-std::string writeBinaryPropertyList(const ValueRef<>& value);
+QZ_API std::string writeBinaryPropertyList(const ValueRef<>& value);
 
 }  // namespace qz::toolkit

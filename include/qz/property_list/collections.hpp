@@ -14,14 +14,16 @@
 #include <string_view>
 #include <vector>
 
+#include "qz/api.hpp"
 #include "qz/property_list/key_index.hpp"
 #include "qz/property_list/value.hpp"
 
 namespace qz::toolkit {
 
 /// The base of arrays, sets and dictionaries.
-class Collection : public Value {
+class QZ_API Collection : public Value {
  protected:
+  /// Makes an empty collection of the kind.
   Collection(Kind kind, Mutability mutability) : Value(kind), mutability_(mutability) {}
   /// Raises if the collection is immutable. False if changes are ignored.
   bool canChange(std::string_view selector) const {
@@ -39,9 +41,13 @@ class Collection : public Value {
   Collection* nextToDestroy_ = nullptr;
 };
 
-class Array final : public Collection {
+/// An ordered list of values.
+class QZ_API Array final : public Collection {
  public:
+  /// Returns the object behind absent references: it answers zero, NO or absent, and changes do
+  /// nothing.
   static Array& nothing();
+  /// Makes an array of the elements.
   static ValueRef<Array> make(std::vector<ValueRef<>> elements = {},
                               Mutability mutability = Mutability::changeable);
 
@@ -54,6 +60,7 @@ class Array final : public Collection {
 
   /// Changes raise if the array is immutable; adding an absent value raises.
   void addObject(const ValueRef<>& value);
+  /// Removes all elements. Raises if the array is immutable.
   void removeAllObjects();
   /// Replaces the elements (`setArray:`).
   void setElements(std::span<const ValueRef<>> elements);
@@ -80,9 +87,12 @@ class Array final : public Collection {
 };
 
 /// An unordered set of values, from a binary property list; it keeps the order of the file.
-class Set final : public Collection {
+class QZ_API Set final : public Collection {
  public:
+  /// Returns the object behind absent references: it answers zero, NO or absent, and changes do
+  /// nothing.
   static Set& nothing();
+  /// Makes a set of the elements, without duplicates.
   static ValueRef<Set> make(std::vector<ValueRef<>> elements);
   /// Makes a set in `document`, as its elements must be; the caller gets no count.
   static Set* make(Document& document, std::span<Value* const> elements);
@@ -103,16 +113,19 @@ class Set final : public Collection {
 /// Values under keys. Scripts and tables use string keys; a binary property list may hold other
 /// keys, which no look-up by string finds. Entries keep the order in which their keys were first
 /// added.
-class Dictionary final : public Collection {
+class QZ_API Dictionary final : public Collection {
  public:
+  /// A key with its value.
   struct Entry {
-    ValueRef<> key;
-    ValueRef<> value;
+    ValueRef<> key;    ///< never absent
+    ValueRef<> value;  ///< never absent
   };
 
   /// Which value counts if a key occurs more than once.
   enum class Duplicates : std::uint8_t { firstWins, lastWins };
 
+  /// Returns the object behind absent references: it answers zero, NO or absent, and changes do
+  /// nothing.
   static Dictionary& nothing();
   /// If a key occurs more than once, the last value counts.
   static ValueRef<Dictionary> make(std::vector<Entry> entries = {},
@@ -140,7 +153,9 @@ class Dictionary final : public Collection {
   /// Changes raise if the dictionary is immutable; an absent value raises. An existing entry keeps
   /// its place when its value is replaced.
   void setObject(const ValueRef<>& value, std::string_view key);
+  /// Removes the entry under `key`, if there is one. Raises if the dictionary is immutable.
   void removeObjectForKey(std::string_view key);
+  /// Removes all entries. Raises if the dictionary is immutable.
   void removeAllObjects();
 
  private:
@@ -165,8 +180,9 @@ class Dictionary final : public Collection {
   std::unique_ptr<KeyIndex> index_;
 };
 
-/// Return `value` as the named kind; absent if it is absent or of another kind.
-ValueRef<Array> asArray(const ValueRef<>& value);
-ValueRef<Dictionary> asDictionary(const ValueRef<>& value);
+/// Returns `value` as an array; absent if it is absent or of another kind.
+QZ_API ValueRef<Array> asArray(const ValueRef<>& value);
+/// Returns `value` as a dictionary; absent if it is absent or of another kind.
+QZ_API ValueRef<Dictionary> asDictionary(const ValueRef<>& value);
 
 }  // namespace qz::toolkit

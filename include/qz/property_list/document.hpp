@@ -12,9 +12,12 @@
 #include <cstdint>
 #include <memory_resource>
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
-class Document final : public std::pmr::memory_resource {
+/// Owns the values of one file, in blocks of memory that are released together.
+class QZ_API Document final : public std::pmr::memory_resource {
  public:
   /// The alignment of values, in bytes, and the unit of distances within a block.
   static constexpr std::size_t unit = 8;
@@ -22,14 +25,14 @@ class Document final : public std::pmr::memory_resource {
   /// Memory that starts with a pointer to its document, so that a value can find its document by
   /// its distance from the start.
   struct Block {
-    Document* document;
-    Block* previous;
+    Document* document;  ///< whose block it is
+    Block* previous;     ///< null for the first
   };
 
   /// Memory for a value, and its distance in units from the start of its block.
   struct Place {
-    void* memory;
-    std::uint32_t distance;
+    void* memory;            ///< where the value is made
+    std::uint32_t distance;  ///< in units
   };
 
   Document(const Document&) = delete;
@@ -37,7 +40,9 @@ class Document final : public std::pmr::memory_resource {
 
   /// Makes an empty document with one count, which the caller owns.
   static Document* make() { return new Document; }
+  /// Adds an owner.
   void retain() { count_.fetch_add(1, std::memory_order_relaxed); }
+  /// Removes an owner; the last one destroys the document.
   void release() {
     if (count_.fetch_sub(1, std::memory_order_acq_rel) == 1) delete this;
   }

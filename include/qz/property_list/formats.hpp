@@ -8,6 +8,7 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/property_list/document.hpp"
 #include "qz/property_list/format_readers.hpp"
 #include "qz/property_list/value.hpp"
@@ -22,8 +23,8 @@ enum class Format : std::uint8_t {
 };
 
 /// What is known of a format.
-struct FormatRow {
-  Format format;
+struct QZ_API FormatRow {
+  Format format;           ///< the format of the row
   std::string_view name;   ///< for options, such as "xml"
   std::string_view title;  ///< for messages, such as "XML property list"
   /// Whether files are text, which has lines and an encoding. Then `looksLike` and `read` receive
@@ -32,6 +33,7 @@ struct FormatRow {
   /// Whether a file was probably meant as this format. Bytes are read only as a format that they
   /// look like. A text is read as every text format; this chooses the one that messages are about.
   bool (*looksLike)(std::string_view contents);
+  /// Makes the values in the document, and returns the root; throws RefusedAt.
   Value* (*read)(std::string_view contents, Document& document, ValueOffsets* offsets);
   /// Returns the value as a whole file; raises an invalid-argument exception for a value that the
   /// format cannot hold. Null if the format has no writer.
@@ -42,12 +44,12 @@ struct FormatRow {
 };
 
 /// Returns all formats, in the order in which they are tried. The last row is a text format.
-std::span<const FormatRow> formats();
+QZ_API std::span<const FormatRow> formats();
 
 /// Returns the row of the format.
-const FormatRow& formatRow(Format format);
+QZ_API const FormatRow& formatRow(Format format);
 
 /// Returns the title of the format, such as "XML property list".
-std::string_view description(Format format);
+QZ_API std::string_view description(Format format);
 
 }  // namespace qz::toolkit

@@ -13,27 +13,31 @@
 #include <string_view>
 #include <vector>
 
+#include "qz/api.hpp"
 #include "qz/property_list/value.hpp"
 
 namespace qz::toolkit {
 
-std::uint64_t hashOf(std::string_view text);
+/// Returns the hash of a string key.
+QZ_API std::uint64_t hashOf(std::string_view text);
 /// Returns the same hash for keys that are the same (see `sameKey`).
-std::uint64_t hashOfKey(const Value& key);
+QZ_API std::uint64_t hashOfKey(const Value& key);
 
 /// Whether two keys are the same. Strings are compared by text, numbers by value (a boolean equals
 /// only a boolean), data by bytes, dates and UIDs by number. A collection is the same only as
 /// itself.
-bool sameKey(const Value& a, const Value& b);
+QZ_API bool sameKey(const Value& a, const Value& b);
 
 /// An open-addressing table of positions. It does not know the entries: the caller compares the key
 /// at a position.
-class KeyIndex {
+class QZ_API KeyIndex {
  public:
-  static constexpr std::size_t none = std::numeric_limits<std::size_t>::max();
+  static constexpr std::size_t none =
+      std::numeric_limits<std::size_t>::max();  ///< the position of a key that is not in the index
 
   /// Makes an index with room for `count` keys.
   KeyIndex(std::size_t count, std::pmr::memory_resource* memory);
+  /// Copies an index into other memory.
   KeyIndex(const KeyIndex& other, std::pmr::memory_resource* memory)
       : slots_(other.slots_, memory), used_(other.used_) {}
 
@@ -49,6 +53,7 @@ class KeyIndex {
     return none;
   }
 
+  /// Whether `append` needs a larger index.
   bool isFull() const { return used_ >= slots_.size() / 4 * 3; }
   /// Adds a new key, whose position is one after the last. The index must not be full.
   void append(std::uint64_t hash);

@@ -9,31 +9,33 @@
 #include <unordered_map>
 #include <variant>
 
+#include "qz/api.hpp"
 #include "qz/property_list/format_readers.hpp"
 #include "qz/property_list/value.hpp"
 
 namespace qz::toolkit {
 
 /// A position in a text. Both count from 1; a column is one character, whatever its display width.
-struct TextPosition {
-  std::size_t line;
-  std::size_t column;
+struct QZ_API TextPosition {
+  std::size_t line;    ///< from 1
+  std::size_t column;  ///< from 1, in characters
   friend bool operator==(const TextPosition&, const TextPosition&) = default;
 };
 
 /// A position in a binary file, counted from 0.
-struct BytePosition {
-  std::size_t offset;
+struct QZ_API BytePosition {
+  std::size_t offset;  ///< from 0
   friend bool operator==(const BytePosition&, const BytePosition&) = default;
 };
 
+/// A position in a file of any format.
 using Position = std::variant<TextPosition, BytePosition>;
 
 /// Returns text such as "line 3, column 7" or "byte 42".
-std::string description(const Position& position);
+QZ_API std::string description(const Position& position);
 
 /// Converts offsets in a text to positions, moving forward only.
-class TextCursor {
+class QZ_API TextCursor {
  public:
   /// `text` is UTF-8, valid or not, and must outlive this.
   explicit TextCursor(std::string_view text) : text_(text) {}
@@ -49,7 +51,7 @@ class TextCursor {
 
 /// The positions of the values of one file, including dictionary keys. Values do not store their
 /// positions; this table does, and it is built only on request.
-class PositionTable {
+class QZ_API PositionTable {
  public:
   PositionTable() = default;
   /// `text` is the text in which the offsets count; absent for a binary file.

@@ -18,6 +18,7 @@
 #include <string_view>
 #include <utility>
 
+#include "qz/api.hpp"
 #include "qz/property_list/document.hpp"
 #include "qz/toolkit/ref.hpp"
 
@@ -40,10 +41,14 @@ class Counted {
     return adopt(value);
   }
 
+  /// Becomes another owner of the object.
   Counted(const Counted& other) : Counted(share(other.value_)) {}
+  /// Takes over the ownership.
   Counted(Counted&& other) noexcept : value_(std::exchange(other.value_, nullptr)) {}
+  /// Becomes another owner of the object, as its base.
   template <class U, class = std::enable_if_t<std::is_convertible_v<U*, T*>>>
   Counted(const Counted<U>& other) : Counted(share(other.get())) {}
+  /// Releases its object, and takes over the other's ownership.
   Counted& operator=(Counted other) noexcept {
     std::swap(value_, other.value_);
     return *this;
@@ -52,7 +57,9 @@ class Counted {
     if (value_) value_->release();
   }
 
+  /// Returns the object; null if there is none.
   T* get() const { return value_; }
+  /// Returns the object, which must exist.
   T& operator*() const { return *value_; }
   friend bool operator==(const Counted& a, const Counted& b) { return a.value_ == b.value_; }
   friend bool operator==(const Counted& a, std::nullptr_t) { return a.value_ == nullptr; }
@@ -67,8 +74,10 @@ class Value;
 template <class T = Value>
 using ValueRef = Ref<T, Counted>;
 
-class Value {
+/// A value of a property list.
+class QZ_API Value {
  public:
+  /// What a value is.
   enum class Kind : std::uint8_t {
     nothing,  ///< only for the object behind absent values
     string,
@@ -88,6 +97,7 @@ class Value {
   Value(const Value&) = delete;
   Value& operator=(const Value&) = delete;
 
+  /// Returns what the value is.
   Kind kind() const { return kind_; }
   /// Returns the name of the kind for messages, such as "NSString"; empty for an absent value.
   std::string_view className() const;
@@ -95,11 +105,15 @@ class Value {
   // Conversions of strings and numbers; any other kind raises. Strings convert by the rules of
   // number_conversion.hpp. An integer out of range keeps its low bits. A real is truncated; out of
   // range it gives the nearest bound, and NaN gives 0.
+  /// Returns the number as 32 bits.
   virtual std::int32_t intValue() const;
+  /// Returns the number as 64 bits.
   virtual std::int64_t integerValue() const;
   /// The same as `integerValue`.
   virtual std::int64_t longValue() const;
+  /// Returns the number as a real of 32 bits.
   virtual float floatValue() const;
+  /// Returns the number as a real of 64 bits.
   virtual double doubleValue() const;
   /// For a number, whether it is not zero.
   virtual bool boolValue() const;
@@ -120,6 +134,7 @@ class Value {
   /// style, `( a, b )` and `{ k = v; }`, with strings quoted where that style requires it.
   std::string description() const;
 
+  /// Adds an owner.
   void retain() {
     if (keeper_ == Keeper::references) {
       count_.fetch_add(1, std::memory_order_relaxed);
@@ -127,6 +142,7 @@ class Value {
       document().retain();
     }
   }
+  /// Removes an owner; the last one destroys the value.
   void release() {
     if (keeper_ == Keeper::references) {
       if (count_.fetch_sub(1, std::memory_order_acq_rel) == 1) destroy();
@@ -136,8 +152,10 @@ class Value {
   }
 
  protected:
+  /// Makes a value of the kind.
   explicit Value(Kind kind) : kind_(kind) {}
   virtual ~Value() = default;
+  /// Releases the memory of a value that no document owns.
   static void operator delete(void* memory) { ::operator delete(memory); }
 
   /// Returns the one object of class T behind absent references. Never destroyed: destructors at

@@ -4,6 +4,7 @@
 
 #include <string>
 
+#include "qz/api.hpp"
 #include "qz/property_list/value.hpp"
 
 namespace qz::toolkit {
@@ -18,6 +19,6 @@ namespace qz::toolkit {
 /// a dictionary with only a number `CF$UID` (it reads back as a UID), and more than 512 nested
 /// containers. Control characters, which XML does not allow, are written as character references,
 /// which every property-list reader accepts.
-std::string writeXmlPropertyList(const ValueRef<>& value);
+QZ_API std::string writeXmlPropertyList(const ValueRef<>& value);
 
 }  // namespace qz::toolkit

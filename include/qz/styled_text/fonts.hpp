@@ -6,21 +6,23 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
 /// The font that a text requests.
-struct Font {
-  std::string family;  ///< such as "Times"
-  double size = 12;    ///< points
-  bool bold = false;
-  bool italic = false;
+struct QZ_API Font {
+  std::string family;       ///< such as "Times"
+  double size = 12;         ///< points
+  bool bold = false;        ///< whether it is a bold face
+  bool italic = false;      ///< whether it is an italic face
   bool fixedPitch = false;  ///< all characters have the same width
 
   friend bool operator==(const Font&, const Font&) = default;
 };
 
 /// The catalogue of the fonts that a toolkit can draw.
-class Fonts {
+class QZ_API Fonts {
  public:
   virtual ~Fonts() = default;
 

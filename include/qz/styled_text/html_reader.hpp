@@ -5,6 +5,7 @@
 #include <optional>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/styled_text/attributed_string.hpp"
 #include "qz/styled_text/fonts.hpp"
 
@@ -20,7 +21,7 @@ namespace qz::toolkit {
 /// No markup is an error: unclosed, stray or misnested tags are read as in a browser. Time and
 /// memory are proportional to the input. Absent only if `bytes` is empty; a document with an empty
 /// body yields an empty text.
-std::optional<AttributedString> attributedStringFromHTML(std::string_view bytes,
-                                                         const Fonts& fonts);
+QZ_API std::optional<AttributedString> attributedStringFromHTML(std::string_view bytes,
+                                                                const Fonts& fonts);
 
 }  // namespace qz::toolkit

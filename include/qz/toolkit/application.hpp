@@ -4,6 +4,7 @@
 
 #include <memory>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/geometry.hpp"
 #include "qz/toolkit/ref.hpp"
 #include "qz/toolkit/view.hpp"
@@ -12,7 +13,7 @@
 namespace qz::toolkit {
 
 /// Notified when a sheet ends.
-class SheetDelegate {
+class QZ_API SheetDelegate {
  public:
   virtual ~SheetDelegate() = default;
 
@@ -21,7 +22,8 @@ class SheetDelegate {
   virtual void sheetDidEnd(const Ref<Window>& sheet, long returnCode, void* contextInfo) = 0;
 };
 
-class Application {
+/// Makes windows and controls, and shows sheets.
+class QZ_API Application {
  public:
   virtual ~Application() = default;
 
@@ -34,7 +36,9 @@ class Application {
   /// Make controls that are not yet in a window: a push button, an image view without an image, an
   /// empty text field. Their tags are the toolkit's default.
   virtual Ref<Button> makeButton(const Rect& frame) = 0;
+  /// Makes an image view. It has no superview yet.
   virtual Ref<ImageView> makeImageView(const Rect& frame) = 0;
+  /// Makes a text field. It has no superview yet.
   virtual Ref<TextField> makeTextField(const Rect& frame) = 0;
 
   /// Shows `sheet` attached to `parent`, whose input is blocked until the sheet is ordered out. An

@@ -4,10 +4,12 @@
 
 #include <chrono>
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
 /// Time in seconds. Neither `now()` nor `horizon()` ever goes back.
-class Clock {
+class QZ_API Clock {
  public:
   virtual ~Clock() = default;
 
@@ -21,7 +23,7 @@ class Clock {
 };
 
 /// The computer's monotonic clock, which cannot be set.
-class SteadyClock final : public Clock {
+class QZ_API SteadyClock final : public Clock {
  public:
   double now() const override {
     return std::chrono::duration<double>(std::chrono::steady_clock::now().time_since_epoch())

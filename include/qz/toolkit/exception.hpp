@@ -9,11 +9,14 @@
 #include <string_view>
 #include <utility>
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
 /// A raised exception, modelled on Foundation's `NSException`.
-class Exception : public std::exception {
+class QZ_API Exception : public std::exception {
  public:
+  /// Makes an exception of that kind.
   Exception(std::string name, std::string reason)
       : name_(std::move(name)), reason_(std::move(reason)) {}
 
@@ -21,6 +24,7 @@ class Exception : public std::exception {
   const std::string& name() const { return name_; }
   /// What happened, in one line; log lines show this text.
   const std::string& reason() const { return reason_; }
+  /// Returns the reason.
   const char* what() const noexcept override { return reason_.c_str(); }
 
  private:
@@ -29,14 +33,16 @@ class Exception : public std::exception {
 };
 
 /// A position or range is out of bounds.
-class RangeException : public Exception {
+class QZ_API RangeException : public Exception {
  public:
+  /// Makes an exception with that reason.
   explicit RangeException(std::string reason) : Exception("NSRangeException", std::move(reason)) {}
 };
 
 /// An argument is absent or of the wrong kind, or a receiver does not understand a message.
-class InvalidArgumentException : public Exception {
+class QZ_API InvalidArgumentException : public Exception {
  public:
+  /// Makes an exception with that reason.
   explicit InvalidArgumentException(std::string reason)
       : Exception("NSInvalidArgumentException", std::move(reason)) {}
 };

@@ -6,9 +6,12 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
-class Files {
+/// Reads files, and knows the resource directory.
+class QZ_API Files {
  public:
   virtual ~Files() = default;
 

@@ -2,13 +2,16 @@
 // Rectangles. Lengths are points; the origin is at the lower left, y grows upwards.
 #pragma once
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
-struct Rect {
-  double x = 0;
-  double y = 0;
-  double width = 0;
-  double height = 0;
+/// A rectangle. The origin is at the lower left.
+struct QZ_API Rect {
+  double x = 0;       ///< of the left edge, in points
+  double y = 0;       ///< of the lower edge, in points
+  double width = 0;   ///< in points
+  double height = 0;  ///< in points
 
   friend bool operator==(const Rect&, const Rect&) = default;
 };

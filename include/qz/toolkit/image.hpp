@@ -5,21 +5,25 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/ref.hpp"
 
 namespace qz::toolkit {
 
 /// An image. Only the toolkit that made it can draw it.
-class Image {
+class QZ_API Image {
  public:
   virtual ~Image() = default;
+  /// Returns the object behind absent references: it answers zero, NO or absent, and changes do
+  /// nothing.
   static Image& nothing();
 
   /// The name under which the image was found.
   virtual std::string name() const = 0;
 };
 
-class Images {
+/// Finds images by name.
+class QZ_API Images {
  public:
   virtual ~Images() = default;
 

@@ -4,9 +4,12 @@
 
 #include <string_view>
 
+#include "qz/api.hpp"
+
 namespace qz::toolkit {
 
-class Log {
+/// Writes diagnostic lines.
+class QZ_API Log {
  public:
   virtual ~Log() = default;
 

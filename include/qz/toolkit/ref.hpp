@@ -21,19 +21,27 @@ template <class T, template <class> class Pointer = std::shared_ptr>
 class Ref {
  public:
   Ref() = default;
+  /// Makes an absent reference.
   Ref(std::nullptr_t) {}
+  /// Makes an owner of the object; absent if it is null.
   Ref(Pointer<T> object) : object_(std::move(object)) {}
+  /// The same, as a base of the object.
   template <class U, class = std::enable_if_t<std::is_convertible_v<U*, T*>>>
   Ref(Pointer<U> object) : object_(std::move(object)) {}
+  /// Makes another owner of the object, as a base of it.
   template <class U, class = std::enable_if_t<std::is_convertible_v<U*, T*>>>
   Ref(const Ref<U, Pointer>& other) : object_(other.pointer()) {}
 
+  /// Whether there is an object.
   explicit operator bool() const { return object_.get() != nullptr; }
+  /// Returns the object, or the one that does nothing.
   T* operator->() const { return *this ? object_.get() : &T::nothing(); }
+  /// Returns the object, or the one that does nothing.
   T& operator*() const { return *operator->(); }
 
   /// Returns the owning pointer; null if the reference is absent.
   const Pointer<T>& pointer() const& { return object_; }
+  /// Gives the owning pointer away.
   Pointer<T>&& pointer() && { return std::move(object_); }
 
   friend bool operator==(const Ref& a, const Ref& b) { return a.object_ == b.object_; }
@@ -47,9 +55,11 @@ class Ref {
 template <class T>
 class StoredRef {
  public:
+  /// Returns a reference that keeps the object alive.
   static StoredRef own(const Ref<T>& object) {
     return StoredRef(object.pointer(), object.pointer());
   }
+  /// Returns a reference that does not keep the object alive.
   static StoredRef refer(const Ref<T>& object) { return StoredRef(nullptr, object.pointer()); }
   StoredRef() = default;
 

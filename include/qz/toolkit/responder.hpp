@@ -5,6 +5,7 @@
 #include <memory>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/ref.hpp"
 
 namespace qz::toolkit {
@@ -14,7 +15,7 @@ class View;
 /// The target of a control, or a link of the responder chain. The action of a control without a
 /// target travels along this chain: the control, its superviews, their window, the window's
 /// delegate.
-class Responder {
+class QZ_API Responder {
  public:
   virtual ~Responder() = default;
 

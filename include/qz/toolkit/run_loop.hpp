@@ -14,14 +14,17 @@
 
 #include <functional>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/ref.hpp"
 
 namespace qz::toolkit {
 
 /// A scheduled call, modelled on `NSTimer`.
-class Timer {
+class QZ_API Timer {
  public:
   virtual ~Timer() = default;
+  /// Returns the object behind absent references: it answers zero, NO or absent, and changes do
+  /// nothing.
   static Timer& nothing();
 
   /// Whether the timer can still fire. A one-shot timer becomes invalid after its firing.
@@ -41,7 +44,8 @@ class Timer {
 /// Called when a timer fires, with the timer itself.
 using TimerAction = std::function<void(const Ref<Timer>&)>;
 
-class RunLoop {
+/// Schedules timers.
+class QZ_API RunLoop {
  public:
   virtual ~RunLoop() = default;
 

@@ -6,11 +6,13 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/files.hpp"
 
 namespace qz::toolkit {
 
-class SystemFiles final : public Files {
+/// Reads files of the operating system.
+class QZ_API SystemFiles final : public Files {
  public:
   /// Starts with the working directory as the resource directory.
   SystemFiles() { setResourcePath(""); }
@@ -29,6 +31,6 @@ class SystemFiles final : public Files {
 };
 
 /// Whether a regular file, or a link to one, is at `path`.
-bool isRegularFile(std::string_view path);
+QZ_API bool isRegularFile(std::string_view path);
 
 }  // namespace qz::toolkit

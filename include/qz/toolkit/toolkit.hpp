@@ -5,6 +5,7 @@
 #include <optional>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/styled_text/attributed_string.hpp"
 #include "qz/styled_text/fonts.hpp"
 #include "qz/toolkit/application.hpp"
@@ -17,15 +18,21 @@ namespace qz::toolkit {
 
 /// Passed to an engine at its construction; must outlive every engine that uses it. All of it is
 /// used on one thread, the application's event thread.
-class Toolkit {
+class QZ_API Toolkit {
  public:
   virtual ~Toolkit() = default;
 
+  /// Returns what makes windows and controls, and shows sheets.
   virtual Application& application() = 0;
+  /// Returns what schedules timers.
   virtual RunLoop& runLoop() = 0;
+  /// Returns what finds images by name.
   virtual Images& images() = 0;
+  /// Returns what finds fonts by name.
   virtual Fonts& fonts() = 0;
+  /// Returns what reads files, and knows the resource directory.
   virtual Files& files() = 0;
+  /// Returns what writes diagnostic lines.
   virtual Log& log() = 0;
 
   /// Converts an HTML document to styled text; absent if it cannot be read. A platform that has an

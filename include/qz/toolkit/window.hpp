@@ -4,6 +4,7 @@
 
 #include <memory>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/ref.hpp"
 #include "qz/toolkit/responder.hpp"
 #include "qz/toolkit/view.hpp"
@@ -15,9 +16,12 @@ enum class StyleMask : unsigned { titled = 1, closable = 2, titledAndClosable = 
 /// How a window's pixels are stored (`NSBackingStoreType`).
 enum class BackingStore : unsigned { buffered = 2 };
 
-class Window {
+/// A window: content in a frame, on the screen or not.
+class QZ_API Window {
  public:
   virtual ~Window() = default;
+  /// Returns the object behind absent references: it answers zero, NO or absent, and changes do
+  /// nothing.
   static Window& nothing();
 
   /// Returns the view that holds the window's controls; owned by the window.
@@ -26,8 +30,10 @@ class Window {
   /// Returns the object that is notified of the window's events and ends its responder chain; null
   /// if there is none or it was destroyed. The window does not keep it alive.
   virtual std::shared_ptr<Responder> delegate() const = 0;
+  /// Sets who hears of the window's events; it is not kept alive.
   virtual void setDelegate(const std::shared_ptr<Responder>& delegate) = 0;
 
+  /// Sets the colour behind the content.
   virtual void setBackgroundColor(const Color& color) = 0;
 
   /// Shows the window in front of the others and gives it the keyboard focus.

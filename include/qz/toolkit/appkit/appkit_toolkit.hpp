@@ -7,6 +7,7 @@
 #include <optional>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/appkit/application.hpp"
 #include "qz/toolkit/appkit/files.hpp"
 #include "qz/toolkit/appkit/log.hpp"
@@ -16,8 +17,10 @@
 
 namespace qz::toolkit::appkit {
 
-class AppKitToolkit final : public Toolkit {
+/// The toolkit over AppKit.
+class QZ_API AppKitToolkit final : public Toolkit {
  public:
+  /// Uses the computer's monotonic clock.
   AppKitToolkit();
   /// Uses another clock, which must outlive the toolkit.
   explicit AppKitToolkit(Clock& clock);
@@ -40,6 +43,7 @@ class AppKitToolkit final : public Toolkit {
 
   /// The toolkit's own classes, for its driver.
   struct Parts;
+  /// Returns those classes.
   Parts& parts() { return *parts_; }
 
  private:

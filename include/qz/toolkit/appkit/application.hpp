@@ -4,6 +4,7 @@
 
 #include <memory>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/appkit/object.hpp"
 #include "qz/toolkit/application.hpp"
 #include "qz/toolkit/log.hpp"
@@ -12,8 +13,10 @@ namespace qz::toolkit::appkit {
 
 class Desk;
 
-class AppKitApplication final : public Application {
+/// The application and its windows.
+class QZ_API AppKitApplication final : public Application {
  public:
+  /// Makes one whose exceptions are written to `log`.
   explicit AppKitApplication(Log& log);
   /// Ends the windows that only the application keeps alive.
   ~AppKitApplication() override;

@@ -6,11 +6,13 @@
 #include <string>
 #include <string_view>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/files.hpp"
 
 namespace qz::toolkit::appkit {
 
-class AppKitFiles final : public Files {
+/// The main bundle's files.
+class QZ_API AppKitFiles final : public Files {
  public:
   /// The resource directory of the main bundle, unless another was set.
   std::string resourcePath() const override;

@@ -4,13 +4,15 @@
 
 #include <memory>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/application.hpp"
 
 namespace qz::toolkit::memory {
 
 class Screen;
 
-class MemoryApplication final : public Application {
+/// Makes windows and controls that exist only in memory.
+class QZ_API MemoryApplication final : public Application {
  public:
   MemoryApplication();
   MemoryApplication(const MemoryApplication&) = delete;
@@ -19,7 +21,9 @@ class MemoryApplication final : public Application {
   Ref<Window> makeWindow(const Rect& content, StyleMask style, BackingStore backing,
                          bool defer) override;
   Ref<Button> makeButton(const Rect& frame) override;
+  /// Makes an image view. It has no superview yet.
   Ref<ImageView> makeImageView(const Rect& frame) override;
+  /// Makes a text field. It has no superview yet.
   Ref<TextField> makeTextField(const Rect& frame) override;
   void beginSheet(const Ref<Window>& sheet, const Ref<Window>& parent,
                   const std::shared_ptr<SheetDelegate>& delegate, void* contextInfo) override;

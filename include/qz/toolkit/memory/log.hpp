@@ -7,13 +7,15 @@
 #include <string_view>
 #include <utility>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/log.hpp"
 
 namespace qz::toolkit::memory {
 
-class MemoryLog final : public Log {
+/// Writes lines to standard error, or to a sink.
+class QZ_API MemoryLog final : public Log {
  public:
-  using Sink = std::function<void(std::string_view)>;
+  using Sink = std::function<void(std::string_view)>;  ///< takes a line, without its end
 
   /// Writes to the sink or, without one, to standard error, as a host without a display expects.
   void write(std::string_view line) override {

@@ -7,6 +7,7 @@
 #include <map>
 #include <memory>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/qt/qt_toolkit.hpp"
 #include "qz/toolkit/tag.hpp"
 #include "qz/toolkit/window.hpp"
@@ -16,16 +17,19 @@ namespace qz::toolkit::qt {
 class AdoptedForm;
 
 /// How a walk-through takes over a window.
-struct Adoption {
+struct QZ_API Adoption {
+  /// Which widgets are controls.
   enum class Reading : std::uint8_t {
     everyTaggedWidget,  ///< every widget with a tag, however deep, in the order of the widget tree
     directSubviews      ///< the direct children of the content, with and without a tag
   };
+  /// What the end of an adoption restores.
   enum class Restoring : std::uint8_t {
     everything,  ///< all that commands have changed, unless somebody else has changed it since
     tags         ///< only the tags, as the engine does on its own
   };
 
+  /// Which widgets are controls.
   Reading reading = Reading::everyTaggedWidget;
   /// The tags of widgets and actions by their object names. An object's own tag, the dynamic
   /// property `qzTag`, counts more.
@@ -40,7 +44,7 @@ struct Adoption {
 /// Presents a top-level widget of the host to a walk-through while it lives. An action that a tool
 /// bar shows is the control that shows it there. Writes a line to the log for each tag that no
 /// command can reach.
-class AdoptedWindow {
+class QZ_API AdoptedWindow {
  public:
   /// `toolkit` must outlive this object; `window` need not.
   AdoptedWindow(QtToolkit& toolkit, QWidget& window, Adoption how = {});

@@ -4,6 +4,7 @@
 
 #include <memory>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/application.hpp"
 #include "qz/toolkit/log.hpp"
 
@@ -13,8 +14,10 @@ namespace qz::toolkit::qt {
 
 class Desk;
 
-class QtApplication final : public Application {
+/// Makes windows and controls of Qt Widgets.
+class QZ_API QtApplication final : public Application {
  public:
+  /// `log` must outlive this object.
   explicit QtApplication(Log& log);
   /// Ends the windows that only the application keeps alive.
   ~QtApplication() override;
@@ -24,7 +27,9 @@ class QtApplication final : public Application {
   Ref<Window> makeWindow(const Rect& content, StyleMask style, BackingStore backing,
                          bool defer) override;
   Ref<Button> makeButton(const Rect& frame) override;
+  /// Makes an image view. It has no superview yet.
   Ref<ImageView> makeImageView(const Rect& frame) override;
+  /// Makes a text field. It has no superview yet.
   Ref<TextField> makeTextField(const Rect& frame) override;
   /// Shows the sheet until it is ordered out, which restores its position, transient parent and
   /// modality. If the user dismisses the sheet, by Escape or its close button, it ends with code 0

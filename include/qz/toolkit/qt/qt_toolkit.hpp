@@ -5,16 +5,18 @@
 
 #include <memory>
 
+#include "qz/api.hpp"
 #include "qz/toolkit/qt/application.hpp"
 #include "qz/toolkit/qt/calls.hpp"
 #include "qz/toolkit/qt/clock.hpp"
+#include "qz/toolkit/qt/files.hpp"
 #include "qz/toolkit/qt/log.hpp"
-#include "qz/toolkit/system_files.hpp"
 #include "qz/toolkit/toolkit.hpp"
 
 namespace qz::toolkit::qt {
 
-class QtToolkit final : public Toolkit {
+/// The toolkit on Qt 6 Widgets. It needs an application object.
+class QZ_API QtToolkit final : public Toolkit {
  public:
   QtToolkit();
   /// Uses another clock, which must outlive the toolkit.
@@ -23,11 +25,17 @@ class QtToolkit final : public Toolkit {
   QtToolkit(const QtToolkit&) = delete;
   QtToolkit& operator=(const QtToolkit&) = delete;
 
+  /// Returns what makes windows and controls, and shows sheets.
   QtApplication& application() override;
+  /// Returns what schedules timers.
   RunLoop& runLoop() override;
+  /// Returns what finds images by name.
   Images& images() override;
+  /// Returns what finds fonts by name.
   Fonts& fonts() override;
-  SystemFiles& files() override;
+  /// Returns what reads files and Qt resources, and knows the resource directory.
+  QtFiles& files() override;
+  /// Returns what writes diagnostic lines.
   QtLog& log() override;
 
   /// Handles exceptions that escape from an action, a timer or a sheet's delegate.
@@ -35,6 +43,7 @@ class QtToolkit final : public Toolkit {
 
   /// The toolkit's own classes, for its driver.
   struct Parts;
+  /// Returns the toolkit's inner parts, for its driver.
   Parts& parts() { return *parts_; }
 
  private:

@@ -1,0 +1,44 @@
+// SPDX-License-Identifier: MIT
+// The command `keys`.
+#include <iostream>
+#include <map>
+#include <memory>
+#include <set>
+#include <string>
+#include <utility>
+
+#include "tools/commands.hpp"
+#include "tools/play/prompt.hpp"
+#include "tools/support/input_file.hpp"
+#include "tools/support/text_layout.hpp"
+
+namespace qz::tools {
+namespace {
+
+/// Prints the keys of the script, one a line: tags in their order, then all others.
+int printKeys(const std::string& path) {
+  const InputFile file(path, "a script");
+  const auto script = file.dictionary();  // held: its entries live only as long
+  std::map<std::pair<bool, toolkit::Tag>, std::set<std::string>> keys;
+  for (const auto& [key, list] : script->entries()) {
+    const auto text = key->description();
+    const auto tag = play::parseTag(text);
+    keys[{!tag, tag.value_or(0)}].insert(text);
+  }
+  for (const auto& [place, texts] : keys) {
+    for (const std::string& text : texts) std::cout << oneLine(text) << '\n';
+  }
+  return static_cast<int>(ExitStatus::fine);
+}
+
+void describeKeys(Command& command) {
+  const auto path = std::make_shared<std::string>();
+  command.argument("SCRIPT", *path, "The script, a property list").file();
+  command.action([path] { return printKeys(*path); });
+}
+
+}  // namespace
+
+constexpr CommandEntry keysCommand{"keys", "Print the keys of a script's lists", describeKeys};
+
+}  // namespace qz::tools
