@@ -9,4 +9,12 @@ add_test(NAME appkit:tests COMMAND ${PROJECT_SOURCE_DIR}/scripts/with-display $<
 add_test(NAME appkit-scenarios
   COMMAND ${PROJECT_SOURCE_DIR}/scripts/with-display
     $<TARGET_FILE:qz-walkthrough> test --toolkit appkit ${PROJECT_SOURCE_DIR}/scenarios)
-set_tests_properties(appkit:tests appkit-scenarios PROPERTIES ENVIRONMENT "${qz_leaks}" TIMEOUT 600)
+# Tests of other programs that play on every toolkit.
+add_test(NAME appkit:witnesses
+  COMMAND ${PROJECT_SOURCE_DIR}/scripts/with-display $<TARGET_FILE:check-tests> --gtest_filter=*Witness*)
+if(TARGET qt-tests)
+  add_test(NAME appkit:rows
+    COMMAND ${PROJECT_SOURCE_DIR}/scripts/with-display $<TARGET_FILE:qt-tests> --gtest_filter=ToolkitRows.*)
+  set_tests_properties(appkit:rows PROPERTIES ENVIRONMENT "QT_QPA_PLATFORM=offscreen;${qz_leaks}")
+endif()
+set_tests_properties(appkit:tests appkit:witnesses appkit-scenarios PROPERTIES ENVIRONMENT "${qz_leaks}" TIMEOUT 600)

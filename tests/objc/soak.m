@@ -1,11 +1,8 @@
 // SPDX-License-Identifier: MIT
-// Begins and ends walk-throughs many times; fails if anything is left behind:
-//
-//   objc-soak [TIMES]     1000 if absent
+// Begins and ends walk-throughs many times; fails if anything is left behind.
 
 #include <malloc.h>
 #include <stdio.h>
-#include <stdlib.h>
 
 #import "QZ_Plist_State_Parser.h"
 #import "checks.h"
@@ -26,8 +23,10 @@ static NSInteger engines = 0;
 }
 @end
 
-static void playOnce(NSWindow* window, NSMutableDictionary* script) {
+static void playOnce(NSWindow* window) {
   NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
+  NSArray* list = command(@"SET_TEXT_FOR_OBJECT_ID", @"a", number(textTag));
+  NSMutableDictionary* script = [NSMutableDictionary dictionaryWithObject:list forKey:@"2"];
   CountedEngine* engine = [[CountedEngine alloc] initWithWindow:nil];
   [engine getGuiAssetsFromWindow:window];
   [engine setPlistDictionary:script];
@@ -41,17 +40,12 @@ static void playOnce(NSWindow* window, NSMutableDictionary* script) {
 }
 
 static void play(NSWindow* window, int times) {
-  for (int i = 0; i < times; ++i) {
-    NSMutableDictionary* script = [[NSMutableDictionary alloc] init];
-    [script setObject:command(@"SET_TEXT_FOR_OBJECT_ID", @"a", number(textTag)) forKey:@"2"];
-    playOnce(window, script);
-    [script release];
-  }
+  for (int i = 0; i < times; ++i) playOnce(window);
 }
 
-int main(int argc, char **argv) {
+int main(void) {
   NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
-  int times = argc > 1 ? atoi(argv[1]) : 1000;
+  int times = 1000;
   [[NSApplication sharedApplication] finishLaunching];
   NSWindow* window = windowWithControls();
   play(window, 20);  // fills the caches

@@ -73,7 +73,10 @@ Ref<Timer> AppKitRunLoop::schedule(double interval, bool repeats, TimerAction ac
   return timer;
 }
 
+// GNUstep sees only by its address that an action has moved the date, so the old date must live
+// until then.
 void AppKitRunLoop::wake() {
+  const foundation::Kept<NSDate*> old([alarm_.get() fireDate]);
   calls_.make([this] { calling([this] { fireDue(clock_.horizon()); }); });
   setAlarm();
 }
