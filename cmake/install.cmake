@@ -72,7 +72,8 @@ function(qz_pkgconfig_dir result dir)
 endfunction()
 
 # Installs LIBRARY.pc. The file finds its prefix from its own place, unless the library directory is absolute.
-function(qz_install_pkgconfig library description requires)
+# `others` are the options that link libraries without a .pc file of their own.
+function(qz_install_pkgconfig library description requires others)
   set(prefix ${CMAKE_INSTALL_PREFIX})
   cmake_path(IS_ABSOLUTE CMAKE_INSTALL_LIBDIR is_absolute)
   if(NOT is_absolute)
@@ -115,11 +116,13 @@ function(qz_install_library library)
   string(REGEX REPLACE "^qz-" "" name ${library})
   if(library STREQUAL "qz")
     qz_install_common_headers()
-    qz_install_pkgconfig(qz "The QZ walk-through engine and its memory toolkit" "")
+    qz_install_pkgconfig(qz "The QZ walk-through engine and its memory toolkit" "" "")
   else()
     qz_install_toolkit_headers(${name})
-    qz_install_pkgconfig(${library} "Walk-throughs in ${QZ_TITLE_${name}}"
-      "qz = ${PROJECT_VERSION}, ${QZ_PKGCONFIG_${name}}")
+    set(requires "qz = ${PROJECT_VERSION}" ${QZ_PKGCONFIG_${name}})
+    list(JOIN requires ", " requires)
+    qz_install_pkgconfig(${library} "Walk-throughs in ${QZ_TITLE_${name}}" "${requires}"
+      "${QZ_PKGCONFIG_LIBS_${name}}")
   endif()
 
   get_property(internal GLOBAL PROPERTY QZ_INTERNAL_PARTS)

@@ -38,8 +38,12 @@ toolkit::AttributedString titleOf(const QZ_Plist_State_Parser::Control& control)
 std::span<const std::string_view> titleColorNames() { return titleColors; }
 
 // Always red, whatever colour is given; on purpose.
-bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_BACKGROUND_COLOR(std::uint64_t,
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_BACKGROUND_COLOR(std::uint64_t color,
                                                                           ObjectId forId) {
+  if (const auto other = state_->overridden(
+          "QZ_Plist_State_Processor_SET_BACKGROUND_COLOR:forId:", color, forId)) {
+    return other->yes;
+  }
   const auto kept = keepAlive();
   const auto button = asButton(findObjectWithTag(forId->longValue()));
   if (!button) return false;
@@ -49,6 +53,10 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_BACKGROUND_COLOR(std::u
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_FOREGROUND_COLOR(Value name,
                                                                           ObjectId FOR_OBJECT_ID) {
+  if (const auto other = state_->overridden(
+          "QZ_Plist_State_Processor_SET_FOREGROUND_COLOR:FOR_OBJECT_ID:", name, FOR_OBJECT_ID)) {
+    return other->yes;
+  }
   const auto kept = keepAlive();
   const auto color = colorNamed(textOf(name));
   try {
@@ -64,6 +72,10 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_FOREGROUND_COLOR(Value 
 }
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TITLE(Value title, ObjectId forId) {
+  if (const auto other =
+          state_->overridden("QZ_Plist_State_Processor_SET_TITLE:forId:", title, forId)) {
+    return other->yes;
+  }
   const auto kept = keepAlive();
   const auto button = asButton(findObjectWithTag(forId->longValue()));
   if (!button) return false;
@@ -72,10 +84,16 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TITLE(Value title, Obje
 }
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_STATE_ON(ObjectId id) {
+  if (const auto other = state_->overridden("QZ_Plist_State_Processor_SET_STATE_ON:", id)) {
+    return other->yes;
+  }
   return setState(id, toolkit::State::on);
 }
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_STATE_OFF(ObjectId id) {
+  if (const auto other = state_->overridden("QZ_Plist_State_Processor_SET_STATE_OFF:", id)) {
+    return other->yes;
+  }
   return setState(id, toolkit::State::off);
 }
 
@@ -88,7 +106,9 @@ bool QZ_Plist_State_Parser::setState(const ObjectId& id, toolkit::State state) {
   return true;
 }
 
-bool commands::setToolTip(const CompoundCall& call) {
+namespace {
+
+bool showToolTip(const commands::CompoundCall& call) {
   const std::size_t count = call.parameters->count();
   if (count == 0) return false;
   const std::string_view text = textOf(call.at(0));
@@ -102,14 +122,29 @@ bool commands::setToolTip(const CompoundCall& call) {
   return true;
 }
 
-bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TOOL_TIP(Parameters parameters,
-                                                                  ObjectId forObject) {
-  const auto kept = keepAlive();
-  const Parameters own = commands::ownList(parameters);
-  return commands::setToolTip({*this, own, forObject, state_->toolkit});
+}  // namespace
+
+// Calls the processor only if a subclass may have overridden it.
+bool commands::setToolTip(const CompoundCall& call) {
+  return call.engine.subclass()
+             ? call.engine.QZ_Plist_State_Processor_SET_TOOL_TIP(call.parameters, call.id)
+             : showToolTip(call);
 }
 
-bool commands::loadGraphic(const CompoundCall& call) {
+bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TOOL_TIP(Parameters parameters,
+                                                                  ObjectId forObject) {
+  if (const auto other = state_->overridden(
+          "QZ_Plist_State_Processor_SET_TOOL_TIP:forObject:", parameters, forObject)) {
+    return other->yes;
+  }
+  const auto kept = keepAlive();
+  const Parameters own = commands::ownList(parameters);
+  return showToolTip({*this, own, forObject, state_->toolkit});
+}
+
+namespace {
+
+bool showGraphic(const commands::CompoundCall& call) {
   if (call.parameters->count() != 2) return false;
   const toolkit::Tag tag = call.at(1)->intValue();
   // Two diagnostics that the test of the count above makes unreachable; their place is kept on
@@ -125,11 +160,26 @@ bool commands::loadGraphic(const CompoundCall& call) {
   return true;
 }
 
+}  // namespace
+
+// The same.
+bool commands::loadGraphic(const CompoundCall& call) {
+  return call.engine.subclass()
+             ? call.engine.QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH(call.parameters,
+                                                                                  call.id)
+             : showGraphic(call);
+}
+
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH(
     Parameters parameters, ObjectId forObject) {
+  if (const auto other = state_->overridden(
+          "QZ_Plist_State_Processor_LOAD_GRAPHIC_OBJECT_WITH_PATH:forObject:", parameters,
+          forObject)) {
+    return other->yes;
+  }
   const auto kept = keepAlive();
   const Parameters own = commands::ownList(parameters);
-  return commands::loadGraphic({*this, own, forObject, state_->toolkit});
+  return showGraphic({*this, own, forObject, state_->toolkit});
 }
 
 bool commands::loadBackground(const CompoundCall& call) {

@@ -10,6 +10,10 @@ namespace qz {
 
 // No guard against a list that reaches itself again: it runs until the stack is exhausted.
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID(ObjectId id) {
+  if (const auto other =
+          state_->overridden("QZ_Plist_State_Processor_PROCESS_COMMANDS_FOR_ID:", id)) {
+    return other->yes;
+  }
   const auto kept = keepAlive();
   Value list = state_->plistDictionary->objectForKey(tagKey(id->longValue()));
   return processCommandArray(std::move(list), std::move(id));
@@ -21,6 +25,7 @@ bool commands::processCommands(const SimpleCall& call) {
 }
 
 void QZ_Plist_State_Parser::QZ_Plist_State_Processor_TERMINATE_PARSER() {
+  if (state_->overridden("QZ_Plist_State_Processor_TERMINATE_PARSER")) return;
   const auto kept = keepAlive();
   state_->terminating = true;
   terminateParser();

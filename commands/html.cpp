@@ -54,6 +54,11 @@ void show(const toolkit::AttributedString& text, const toolkit::Ref<toolkit::Vie
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML(
     Value html, Value WITH_FONT_NAME, Value WITH_SIZE, ObjectId FOR_OBJECT_ID) {
+  if (const auto other = state_->overridden("QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_"
+                                            "HTML:WITH_FONT_NAME:WITH_SIZE:FOR_OBJECT_ID:",
+                                            html, WITH_FONT_NAME, WITH_SIZE, FOR_OBJECT_ID)) {
+    return other->yes;
+  }
   return QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(
       false, std::move(html), std::move(WITH_FONT_NAME), std::move(WITH_SIZE),
       std::move(FOR_OBJECT_ID));
@@ -61,12 +66,24 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HT
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER(
     Value html, Value WITH_FONT_NAME, Value WITH_SIZE, ObjectId FOR_OBJECT_ID) {
+  if (const auto other =
+          state_->overridden("QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_HTML_NO_CENTER:"
+                             "WITH_FONT_NAME:WITH_SIZE:FOR_OBJECT_ID:",
+                             html, WITH_FONT_NAME, WITH_SIZE, FOR_OBJECT_ID)) {
+    return other->yes;
+  }
   return showHtml(linkedOneBlank, toolkit::TextAlignment::natural, html, WITH_FONT_NAME, WITH_SIZE,
                   FOR_OBJECT_ID);
 }
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS(
     bool asIs, Value WITH_HTML, Value WITH_FONT_NAME, Value WITH_SIZE, ObjectId FOR_OBJECT_ID) {
+  if (const auto other =
+          state_->overridden("QZ_Plist_State_Processor_SET_ATTRIBUTED_STRING_AS_IS:WITH_HTML:WITH_"
+                             "FONT_NAME:WITH_SIZE:FOR_OBJECT_ID:",
+                             asIs, WITH_HTML, WITH_FONT_NAME, WITH_SIZE, FOR_OBJECT_ID)) {
+    return other->yes;
+  }
   if (asIs) {
     return showHtml(linkedTwoBlanks, std::nullopt, WITH_HTML, WITH_FONT_NAME, WITH_SIZE,
                     FOR_OBJECT_ID);

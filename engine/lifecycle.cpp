@@ -18,16 +18,19 @@ void stop(const toolkit::Ref<toolkit::Timer>& timer) {
 
 }  // namespace
 
-QZ_Plist_State_Parser::QZ_Plist_State_Parser(toolkit::Toolkit& toolkit)
-    : state_(std::make_unique<State>(toolkit)) {}
+QZ_Plist_State_Parser::QZ_Plist_State_Parser(toolkit::Toolkit& toolkit,
+                                             std::shared_ptr<Subclass> subclass)
+    : state_(std::make_unique<State>(toolkit, std::move(subclass))) {}
 
-std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::init(toolkit::Toolkit& toolkit) {
-  return std::shared_ptr<QZ_Plist_State_Parser>(new QZ_Plist_State_Parser(toolkit));
+std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::init(
+    toolkit::Toolkit& toolkit, std::shared_ptr<Subclass> subclass) {
+  return std::shared_ptr<QZ_Plist_State_Parser>(
+      new QZ_Plist_State_Parser(toolkit, std::move(subclass)));
 }
 
 std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::initWithWindow(
-    toolkit::Toolkit& toolkit, const Window& window) {
-  auto engine = init(toolkit);
+    toolkit::Toolkit& toolkit, const Window& window, std::shared_ptr<Subclass> subclass) {
+  auto engine = init(toolkit, std::move(subclass));
   engine->state_->window.set(StoredRef<toolkit::Window>::refer(window));
   engine->state_->buttonStates = toolkit::Dictionary::make();
   engine->state_->plistDictionary.set(toolkit::Dictionary::make());
@@ -36,13 +39,16 @@ std::shared_ptr<QZ_Plist_State_Parser> QZ_Plist_State_Parser::initWithWindow(
   engine->state_->objectIdTimers.set(toolkit::Table<Timer>::make());
   // The timer keeps the engine alive while it ticks.
   engine->state_->flashingTimer.set(toolkit.runLoop().schedule(
-      flasherPeriod, true, [engine](const Timer& timer) { engine->flasherFired(timer); }));
+      flasherPeriod, true, [self = engine->state_->forTimers(engine)](const Timer& timer) {
+        self->flasherFired(timer);
+      }));
   engine->state_->guiAssets.set(toolkit::Table<AssetRecord>::make());
   engine->state_->originalTagValues.set(toolkit::Dictionary::make());
   return engine;
 }
 
 void QZ_Plist_State_Parser::terminateParser() {
+  if (state_->overridden("terminateParser")) return;
   const auto kept = keepAlive();
   restoreOriginalTagValues();
   state_->terminating = true;
@@ -50,7 +56,7 @@ void QZ_Plist_State_Parser::terminateParser() {
   state_->flashingTimer.set(nullptr);
   // Tables are emptied before they are dropped, so that a host that kept one sees the end.
   if (state_->objectIdTimers->count() > 0) {
-    killAllTimers();
+    cancelTimers();
     state_->objectIdTimers.set(nullptr);
   }
   const Window tutorial = tutorialWindow();

@@ -8,6 +8,7 @@
 namespace qz {
 
 void QZ_Plist_State_Parser::buttonPushed(Control sender) {
+  if (state_->overridden("buttonPushed:", sender)) return;
   const auto kept = keepAlive();
   if (sender) killAllTimers();
   const toolkit::Tag tag = sender->tag();
@@ -22,6 +23,7 @@ void QZ_Plist_State_Parser::buttonPushed(Control sender) {
 }
 
 void QZ_Plist_State_Parser::pseudoButtonPush(Timer timer) {
+  if (state_->overridden("pseudoButtonPush:", timer)) return;
   const auto kept = keepAlive();
   const auto key = keyOfTimer(timer);
   if (!key) return;  // replaced under its key, or the walk-through is over

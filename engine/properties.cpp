@@ -90,6 +90,9 @@ void QZ_Plist_State_Parser::setOriginalTagValues(Dictionary tags) {
 const std::shared_ptr<qz::Observer>& QZ_Plist_State_Parser::observer() const {
   return state_->observer;
 }
+const std::shared_ptr<qz::Subclass>& QZ_Plist_State_Parser::subclass() const {
+  return state_->subclass;
+}
 void QZ_Plist_State_Parser::setObserver(std::shared_ptr<qz::Observer> observer) {
   state_->observer = std::move(observer);
 }

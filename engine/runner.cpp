@@ -19,7 +19,9 @@ bool runElement(Engine& engine, toolkit::Toolkit& toolkit, const Engine::Value& 
                 bool isFixed, const Engine::Parameters& parameters, const Engine::ObjectId& id) {
   if (element->kind() != toolkit::Value::Kind::array) {
     parameters->removeAllObjects();
-    return commands::runSimple(textOf(Engine::Value(element)), engine, id);
+    const Engine::Value kept = element;
+    return engine.subclass() ? engine.doSimpleCommand(textOf(kept), parameters, id)
+                             : commands::runSimple(textOf(kept), engine, id);
   }
   // Not asArray, which would count a reference: this runs for every command.
   const auto& compound = static_cast<const toolkit::Array&>(*element);
@@ -27,12 +29,16 @@ bool runElement(Engine& engine, toolkit::Toolkit& toolkit, const Engine::Value& 
   const auto name = text::uppercased(textOf(compound.objectAtIndex(0)), raised);
   const auto given = compound.elements().subspan(1);
   isFixed ? parameters->borrowElements(given) : parameters->setElements(given);
+  if (engine.subclass()) return engine.doCompoundCommand(name, commands::ownList(parameters), id);
   return commands::runCompound(name, {engine, parameters, id, toolkit});
 }
 
 }  // namespace
 
 bool QZ_Plist_State_Parser::processCommandArray(Value list, ObjectId forObject) {
+  if (const auto other = state_->overridden("processCommandArray:ForObject:", list, forObject)) {
+    return other->yes;
+  }
   const auto kept = keepAlive();
   const Parameters parameters = toolkit::Array::make();
   state_->lastTagId.set(forObject);

@@ -35,6 +35,7 @@ std::uint64_t firstOverflowKey(const toolkit::Subviews& views) {
 }  // namespace
 
 bool QZ_Plist_State_Parser::getGuiAssetsFromWindow(Window window) {
+  if (const auto other = state_->overridden("getGuiAssetsFromWindow:", window)) return other->yes;
   const auto kept = keepAlive();
   if (!window) return false;
   // A window that the engine already keeps alive stays so.

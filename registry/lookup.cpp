@@ -8,6 +8,7 @@ namespace qz {
 // Scans the live window at every call, never the records: a re-tagged control is found only under
 // its new tag. If several controls have the tag, the back-most is found.
 QZ_Plist_State_Parser::Control QZ_Plist_State_Parser::findObjectWithTag(toolkit::Tag tag) const {
+  if (const auto other = state_->overridden("findObjectWithTag:", tag)) return other->control;
   const Window window = state_->tutorialWindow.ask(&toolkit::StoredRef<toolkit::Window>::get);
   const Control content = window->contentView();
   for (const Control& view : content->subviews()) {

@@ -7,6 +7,7 @@
 namespace qz {
 
 void QZ_Plist_State_Parser::restoreOriginalTagValues() {
+  if (state_->overridden("restoreOriginalTagValues")) return;
   const auto kept = keepAlive();
   if (!*state_->guiAssets) return;
   const Dictionary tags = state_->originalTagValues->copy(toolkit::Mutability::immutable);

@@ -9,7 +9,8 @@ namespace qz {
 
 using toolkit::asButton;
 
-void QZ_Plist_State_Parser::flasherFired(Timer) {
+void QZ_Plist_State_Parser::flasherFired(Timer timer) {
+  if (state_->overridden("flasherFired:", timer)) return;
   const auto kept = keepAlive();
   if (!state_->flashing) return;
   const Dictionary flashing = *state_->flashingTagIds;
@@ -21,6 +22,9 @@ void QZ_Plist_State_Parser::flasherFired(Timer) {
 }
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_ALLOW_FLASHING(bool allow) {
+  if (const auto other = state_->overridden("QZ_Plist_State_Processor_ALLOW_FLASHING:", allow)) {
+    return other->yes;
+  }
   const auto kept = keepAlive();
   state_->flashing = allow;
   if (allow) return true;
@@ -34,6 +38,10 @@ bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_ALLOW_FLASHING(bool allow) 
 }
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_FLASH_ID(ObjectId id, bool flashOn) {
+  if (const auto other =
+          state_->overridden("QZ_Plist_State_Processor_FLASH_ID:flashOn:", id, flashOn)) {
+    return other->yes;
+  }
   const auto kept = keepAlive();
   const std::string key = tagKey(id->longValue());
   // The first FLASH_ID for a tag wins; later ones are ignored.

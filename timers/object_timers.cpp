@@ -9,11 +9,12 @@ namespace qz {
 
 void QZ_Plist_State_Parser::startTimerWithValue(std::uint64_t value,
                                                 std::optional<std::string> forKey) {
+  if (state_->overridden("startTimerWithValue:forKey:", value, forKey)) return;
   const auto kept = keepAlive();
   if (value == 0 || !forKey || forKey->empty()) return;
   // Seconds in single precision: above 16,777,216 the low digits are lost.
   const auto interval = static_cast<double>(static_cast<float>(value));
-  const auto self = shared_from_this();
+  const auto self = state_->forTimers(shared_from_this());
   // A replaced timer keeps running; when it fires, no key is found for it.
   state_->objectIdTimers->setObject(
       state_->toolkit.runLoop().schedule(
@@ -23,7 +24,12 @@ void QZ_Plist_State_Parser::startTimerWithValue(std::uint64_t value,
 }
 
 void QZ_Plist_State_Parser::killAllTimers() {
+  if (state_->overridden("killAllTimers")) return;
   const auto kept = keepAlive();
+  cancelTimers();
+}
+
+void QZ_Plist_State_Parser::cancelTimers() {
   const Timers timers = *state_->objectIdTimers;
   const auto pending = timers->entries();  // a copy: releasing a timer may change the table
   for (const auto& [key, timer] : pending) {
@@ -35,6 +41,10 @@ void QZ_Plist_State_Parser::killAllTimers() {
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TIMER(std::uint64_t value,
                                                                ObjectId forId) {
+  if (const auto other =
+          state_->overridden("QZ_Plist_State_Processor_SET_TIMER:forId:", value, forId)) {
+    return other->yes;
+  }
   const auto kept = keepAlive();
   const std::string key = tagKey(forId->integerValue());
   if (findObjectWithTag(forId->intValue())) {

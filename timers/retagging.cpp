@@ -8,22 +8,36 @@
 namespace qz {
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TAG(ObjectId newTag, ObjectId forId) {
-  return QZ_Plist_State_Processor_SET_TAG(std::move(newTag), std::move(forId), nullptr);
+  if (const auto other =
+          state_->overridden("QZ_Plist_State_Processor_SET_TAG:forId:", newTag, forId)) {
+    return other->yes;
+  }
+  return retag(newTag, forId, nullptr);
 }
 
 bool QZ_Plist_State_Parser::QZ_Plist_State_Processor_SET_TAG(ObjectId newTag, ObjectId forId,
                                                              Value withTimerValue) {
+  if (const auto other =
+          state_->overridden("QZ_Plist_State_Processor_SET_TAG:forId:withTimerValue:", newTag,
+                             forId, withTimerValue)) {
+    return other->yes;
+  }
+  return retag(newTag, forId, withTimerValue);
+}
+
+bool QZ_Plist_State_Parser::retag(const ObjectId& newTag, const ObjectId& id,
+                                  const Value& timerValue) {
   const auto kept = keepAlive();
-  const Control control = findObjectWithTag(forId->longValue());
+  const Control control = findObjectWithTag(id->longValue());
   if (!control) return false;
   control->setTag(newTag->integerValue());
-  if (withTimerValue) {
+  if (timerValue) {
     // On purpose: the seconds are the address of the parameter, not its number, so the delay is
     // very long. A script that needs a real delay sets a separate timer.
-    startTimerWithValue(reinterpret_cast<std::uintptr_t>(withTimerValue.pointer().get()),
+    startTimerWithValue(reinterpret_cast<std::uintptr_t>(timerValue.pointer().get()),
                         tagKey(newTag->longValue()));
   }
-  rewriteFlashingEntry(forId);
+  rewriteFlashingEntry(id);
   return true;
 }
 

@@ -7,7 +7,7 @@
 #include <exception>
 #include <functional>
 
-#include "drivers/qt/paced_clock.hpp"
+#include "drivers/paced_clock.hpp"
 #include "qz/drivers/driver.hpp"
 #include "qz/toolkit/qt/qt_toolkit.hpp"
 

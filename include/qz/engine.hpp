@@ -29,6 +29,7 @@
 #include "qz/observer.hpp"
 #include "qz/property_list/collections.hpp"
 #include "qz/property_list/scalars.hpp"
+#include "qz/subclass.hpp"
 #include "qz/toolkit/exception.hpp"
 #include "qz/toolkit/table.hpp"
 #include "qz/toolkit/tag.hpp"
@@ -126,11 +127,14 @@ class QZ_API QZ_Plist_State_Parser final
   // --- for the host, in calling order ---
 
   /// Creates an engine with its tables and starts the flasher. `window` is the parent of a sheet;
-  /// it may be absent and is not kept alive. `toolkit` must outlive the engine.
-  static std::shared_ptr<QZ_Plist_State_Parser> initWithWindow(toolkit::Toolkit& toolkit,
-                                                               const Window& window);
+  /// it may be absent and is not kept alive. `toolkit` must outlive the engine. The engine keeps
+  /// `subclass` alive; null if no class of another language derives from it.
+  static std::shared_ptr<QZ_Plist_State_Parser> initWithWindow(
+      toolkit::Toolkit& toolkit, const Window& window,
+      std::shared_ptr<Subclass> subclass = nullptr);
   /// Creates an engine without tables and without a flasher.
-  static std::shared_ptr<QZ_Plist_State_Parser> init(toolkit::Toolkit& toolkit);
+  static std::shared_ptr<QZ_Plist_State_Parser> init(toolkit::Toolkit& toolkit,
+                                                     std::shared_ptr<Subclass> subclass = nullptr);
   ~QZ_Plist_State_Parser() override;
   QZ_Plist_State_Parser(const QZ_Plist_State_Parser&) = delete;
   QZ_Plist_State_Parser& operator=(const QZ_Plist_State_Parser&) = delete;
@@ -353,18 +357,23 @@ class QZ_API QZ_Plist_State_Parser final
   /// Sets who is told what the engine does; null for nobody.
   void setObserver(std::shared_ptr<Observer> observer);
 
+  /// The class of another language that derives from this engine; null if there is none.
+  const std::shared_ptr<Subclass>& subclass() const;
+
   /// Performs "buttonPushed:"; NO for any other action.
   bool tryToPerform(std::string_view action, const Control& sender) override;
 
  private:
   struct State;
 
-  explicit QZ_Plist_State_Parser(toolkit::Toolkit& toolkit);
+  QZ_Plist_State_Parser(toolkit::Toolkit& toolkit, std::shared_ptr<Subclass> subclass);
 
   /// Every operation that calls foreign code begins with this. (`findObjectWithTag` need not: it
   /// does not read the engine after it has called foreign code.)
   [[nodiscard]] KeepAlive keepAlive();
   std::optional<std::string> keyOfTimer(const Timer& timer) const;
+  void cancelTimers();
+  bool retag(const ObjectId& newTag, const ObjectId& id, const Value& timerValue);
   void rewriteFlashingEntry(const ObjectId& id);
   bool setState(const ObjectId& id, toolkit::State state);
   Window makeTutorialWindow(const toolkit::Rect& content);

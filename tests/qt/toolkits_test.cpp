@@ -3,6 +3,8 @@
 
 #include <gtest/gtest.h>
 
+#include <cstdlib>
+
 #include "tools/support/drivers.hpp"
 
 namespace qz {
@@ -13,6 +15,8 @@ TEST(ToolkitRows, AgreeWithTheirDrivers) {
   int drivers = 0;
   for (const tools::ToolkitRow& row : tools::toolkits()) {
     if (!row.make) continue;
+    // AppKit needs a display; the test appkit:rows has one.
+    if (row.name == "appkit" && !std::getenv("DISPLAY")) continue;
     ++drivers;
     const auto driver = row.make();
     EXPECT_EQ(driver->name(), row.name);

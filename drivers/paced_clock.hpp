@@ -6,11 +6,11 @@
 #include <algorithm>
 #include <chrono>
 
-#include "qz/toolkit/qt/clock.hpp"
+#include "qz/toolkit/clock.hpp"
 
 namespace qz::drivers {
 
-class PacedClock final : public toolkit::qt::Clock {
+class PacedClock final : public toolkit::Clock {
  public:
   /// Runs the clock for at most `seconds`, while this object lives.
   class Going {

@@ -1,11 +1,11 @@
 // SPDX-License-Identifier: MIT
 // The default handling of exceptions.
 
-#include "qz/toolkit/qt/calls.hpp"
+#include "qz/toolkit/calls.hpp"
 
 #include "qz/toolkit/exception.hpp"
 
-namespace qz::toolkit::qt {
+namespace qz::toolkit {
 
 Calls::Calls(Log& log)
     : handler_([&log](const std::exception_ptr& thrown) {
@@ -16,4 +16,4 @@ Calls::Calls(Log& log)
         }
       }) {}
 
-}  // namespace qz::toolkit::qt
+}  // namespace qz::toolkit
