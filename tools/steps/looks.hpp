@@ -11,10 +11,12 @@
 
 namespace qz::tools::steps {
 
+using Parameter = std::variant<std::string, int, bool>;
+
 /// A command of the script without the tag, which is its last parameter.
 struct Command {
   std::string name{};
-  std::vector<std::variant<std::string, int, bool>> parameters{};
+  std::vector<Parameter> parameters{};
   Place place = 0;
 
   /// Two commands are equal if they do the same, wherever they come from.

@@ -16,7 +16,7 @@ using toolkit::ValueRef;
 // The marks around a command and around each of its parameters.
 constexpr std::size_t sizeOfMarks = 15;
 
-ValueRef<> valueOf(const std::variant<std::string, int, bool>& parameter) {
+ValueRef<> valueOf(const Parameter& parameter) {
   if (const auto* text = std::get_if<std::string>(&parameter)) return String::make(*text);
   if (const auto* number = std::get_if<int>(&parameter)) return Number::withLong(*number);
   return Number::withBool(std::get<bool>(parameter));
