@@ -46,7 +46,6 @@ class ButtonLook final : public QObject {
   void setFaceColor(const std::optional<Color>& color) { shown_.face = color; }
   const std::optional<Color>& faceColor() const { return shown_.face; }
   void setBezel(BezelStyle bezel) { shown_.bezel = bezel; }
-  BezelStyle bezel() const { return shown_.bezel; }
 
   /// True if the button looks and reads as it would without this object.
   bool isIdle() const { return shown_.isNothing() && !highlighted_; }
@@ -203,9 +202,5 @@ void setBezel(QAbstractButton& button, BezelStyle style) {
   changeLook(button, [&](ButtonLook& look) { look.setBezel(style); });
 }
 
-BezelStyle bezelOf(const QAbstractButton& button) {
-  const auto* const look = decorationOn<ButtonLook>(button);
-  return look ? look->bezel() : BezelStyle::rounded;
-}
 
 }  // namespace qz::toolkit::qt

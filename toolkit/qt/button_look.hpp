@@ -46,6 +46,5 @@ void setFaceColor(QAbstractButton& button, const std::optional<Color>& color);
 std::optional<Color> faceColor(const QAbstractButton& button);
 
 void setBezel(QAbstractButton& button, BezelStyle style);
-BezelStyle bezelOf(const QAbstractButton& button);
 
 }  // namespace qz::toolkit::qt

@@ -29,9 +29,10 @@ struct ScriptFile {
   walkthrough::StageOptions stage(walkthrough::StageOptions options) const;
 };
 
-/// Reads the script at `path`, or builds it if this is a source, which can then be started at the
-/// step `start` too, if that is not empty. Throws a SourceRefused if the source has mistakes,
-/// another Failure if a file cannot be read or does not hold what it should.
+/// Reads the script at `path`, or builds it if this is a source. The first start key of a built
+/// script is that of the step `start`, or of the first step if `start` is empty. Throws a
+/// SourceRefused if the source has mistakes, another Failure if a file cannot be read or does not
+/// hold what it should.
 ScriptFile openScript(const std::string& path, const std::string& start = {},
                       const Translate& translate = {});
 
