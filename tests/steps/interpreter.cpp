@@ -161,7 +161,9 @@ bool Interpreter::leadsNowhere(const State& state, const std::string& target) co
 }
 
 // "The way"
-State Interpreter::go(State state, const std::string& target) const {
+State Interpreter::go(State state, const std::string& said) const {
+  const bool isInstead = said.starts_with(instead);
+  const std::string target = isInstead ? said.substr(instead.size()) : said;
   if (target == "end") {
     State over;
     over.isOver = true;
@@ -173,9 +175,10 @@ State Interpreter::go(State state, const std::string& target) const {
     return enter(state, last);
   }
   if (target == state.step) return enter(state, target);
-  if (!steps_.at(state.step).isPassedOver.value_or(false)) state.way.push_back(state.step);
+  const bool isPassedOver = isInstead || steps_.at(state.step).isPassedOver.value_or(false);
+  if (!isPassedOver) state.way.push_back(state.step);
   state.way.erase(std::find(state.way.begin(), state.way.end(), target), state.way.end());
-  if (state.way.size() > tour_.backOver.value_or(50)) state.way.erase(state.way.begin());
+  if (tour_.backOver && state.way.size() > *tour_.backOver) state.way.erase(state.way.begin());
   return enter(state, target);
 }
 

@@ -54,7 +54,7 @@ class Smaller {
       if (part.like == name) part.like = "";
       if (part.wait && part.wait->go == name) part.wait->go = "end";
       for (auto& [control, words] : part.controls) {
-        if (words.press == name) words.press = "end";
+        if (words.press && words.press->ends_with(name)) words.press = "end";
       }
       for (Use& use : part.uses) {
         for (auto& [parameter, value] : use.arguments) value = value == name ? "end" : value;

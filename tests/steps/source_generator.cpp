@@ -262,7 +262,7 @@ void Maker::lead(std::size_t from, const std::string& to) {
   }
   Words& words = part.controls[anyPushButton().name];
   words.isEntry = true;
-  words.press = to;
+  words.press = to != "end" && dice_.oneIn(4) ? std::string(instead) + to : to;
   words.isShown.reset();
   words.isEnabled.reset();
 }

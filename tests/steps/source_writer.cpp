@@ -65,6 +65,11 @@ class PartWriter {
 
   static std::string flag(bool flag) { return flag ? "yes" : "no"; }
 
+  std::string press(const std::string& target) {
+    if (!target.starts_with(instead)) return text(target);
+    return flow(Entries{{"instead", text(target.substr(instead.size()))}});
+  }
+
   void writeControl(const std::string& name, const Words& words) {
     Entries properties;
     writeContents(name, words, properties);
@@ -88,7 +93,7 @@ class PartWriter {
     if (words.color) properties.emplace_back("color", text(*words.color));
     if (words.isRed) properties.emplace_back("background", "red");
     if (words.isOn) properties.emplace_back("state", *words.isOn ? "on" : "off");
-    if (words.press) properties.emplace_back("press", text(*words.press));
+    if (words.press) properties.emplace_back("press", press(*words.press));
   }
 
   void writeLook(const std::string& name, const Words& words, Entries& properties) {

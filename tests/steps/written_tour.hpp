@@ -6,6 +6,7 @@
 #include <map>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <tuple>
 #include <utility>
 #include <vector>
@@ -14,6 +15,9 @@
 #include "qz/toolkit/toolkit.hpp"
 
 namespace qz::meaning {
+
+/// Before the name of a step that takes the place of the step at which the press is.
+inline constexpr std::string_view instead = "instead of this: ";
 
 using drivers::ViewKind;
 
@@ -48,7 +52,7 @@ struct Words {
   std::optional<bool> isShown{};
   std::optional<bool> isEnabled{};
   std::optional<bool> flashes{};
-  std::optional<std::string> press{};  ///< a step, back, end or nothing
+  std::optional<std::string> press{};  ///< a step, also after `instead`; or back, end or nothing
 
   /// Everything that can be said or not.
   auto options() {

@@ -47,7 +47,7 @@ NodeRef withArguments(const NodeRef& node, const std::map<std::string, NodeRef>&
 }  // namespace
 
 void Fragments::read(const NodeRef& table) {
-  for (const auto& [key, body] : entriesOf(table, "a table of fragments", mistakes_)) {
+  for (const auto& [key, body] : entriesOf(*table, "a table of fragments", mistakes_)) {
     if (body->kind != Node::Kind::table) {
       mistakes_.add(body->place,
                     "expected what steps have in common (a table), found " + foundWords(*body));
@@ -66,7 +66,7 @@ NodeRef Fragments::expand(const NodeRef& body) const {
 }
 
 void Fragments::expandInto(const NodeRef& body, std::size_t depth, Node& into) const {
-  const auto entries = entriesOf(body, "a table", mistakes_);
+  const auto entries = entriesOf(*body, "a table", mistakes_);
   for (const auto& [key, value] : entries) {
     if (key->text == words::use) use(value, depth, into);
   }
@@ -107,7 +107,8 @@ void Fragments::useOne(const NodeRef& name, const NodeRef& arguments, std::size_
   }
   Arguments given;
   if (arguments) {
-    for (const auto& [parameter, value] : entriesOf(arguments, "a table of arguments", mistakes_)) {
+    for (const auto& [parameter, value] :
+         entriesOf(*arguments, "a table of arguments", mistakes_)) {
       given[parameter->text] = value;
     }
   }

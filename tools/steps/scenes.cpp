@@ -139,17 +139,20 @@ class Finder {
       case Lead::Kind::step:
         break;
     }
-    return {Exit::Kind::scene, add(lead.step, wayTo(lead.step, situations_[from]))};
+    return {Exit::Kind::scene, add(lead.step, wayTo(lead, situations_[from]))};
   }
 
-  WayIndex wayTo(StepIndex step, const Situation& from) {
+  WayIndex wayTo(const Lead& lead, const Situation& from) {
     const StepIndex left = from.scene.step;
-    const auto& words = tour_.steps[left].words;
-    const auto isPassedOver =
-        words.isPassedOver ? words.isPassedOver : tour_.everyStep.isPassedOver;
-    if (step == left) return from.way;
-    const WayIndex way = isPassedOver.value_or(false) ? from.way : ways_.extended(from.way, left);
-    return ways_.shortened(ways_.before(way, step), tour_.mostStepsBack);
+    if (lead.step == left) return from.way;
+    const bool leavesNoTrace = lead.isInstead || isPassedOver(left);
+    const WayIndex way = leavesNoTrace ? from.way : ways_.extended(from.way, left);
+    return ways_.shortened(ways_.before(way, lead.step), tour_.mostStepsBack);
+  }
+
+  bool isPassedOver(StepIndex step) const {
+    const auto& own = tour_.steps[step].words.isPassedOver;
+    return (own ? own : tour_.everyStep.isPassedOver).value_or(false);
   }
 
   const Tour& tour_;

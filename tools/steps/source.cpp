@@ -61,7 +61,7 @@ class SourceReader {
   void read() {
     const NodeRef root = readYaml(source_.text, source_.path);
     for (const auto& [key, value] :
-         entriesOf(root, "a walk-through in steps (a table)", mistakes_)) {
+         entriesOf(*root, "a walk-through in steps (a table)", mistakes_)) {
       const auto known = std::find(std::begin(sourceWords), std::end(sourceWords), key->text);
       if (known == std::end(sourceWords)) {
         mistakes_.add(key->place,
@@ -111,7 +111,7 @@ class SourceReader {
   }
 
   void readControls() {
-    for (const auto& [name, value] : entriesOf(part("controls"), "names with tags", mistakes_)) {
+    for (const auto& [name, value] : entriesOf(*part("controls"), "names with tags", mistakes_)) {
       const auto tag =
           numberOf(*value, -greatestTag, greatestTag, "the tag of a control", mistakes_);
       if (!tag) continue;
@@ -133,7 +133,7 @@ class SourceReader {
   void readSteps() {
     Fragments fragments(mistakes_);
     if (const NodeRef table = part("fragments")) fragments.read(table);
-    const auto entries = entriesOf(part("steps"), "the steps, by name", mistakes_);
+    const auto entries = entriesOf(*part("steps"), "the steps, by name", mistakes_);
     std::map<std::string, StepIndex> names;
     std::map<std::string, NodeRef> bodies;
     for (const auto& [name, body] : entries) {

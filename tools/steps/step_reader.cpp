@@ -167,7 +167,7 @@ void StepReader::readNames(const NodeRef& names, const PropertyRow& row, StepWor
 }
 
 void StepReader::readEach(const NodeRef& values, const PropertyRow& row, StepWords& words) const {
-  for (const auto& [name, value] : entriesOf(values, "a value for each control", mistakes_)) {
+  for (const auto& [name, value] : entriesOf(*values, "a value for each control", mistakes_)) {
     const auto control = controlNamed(*name);
     if (control && has(*control, row, *name)) {
       (this->*row.read)(*control, *value, words.controls[*control]);
@@ -194,7 +194,7 @@ void StepReader::readControl(ControlIndex control, const NodeRef& value, StepWor
   ControlWords& said = words.controls[control];
   if (value->kind == Node::Kind::nothing) return;  // `control:` alone shows it
   if (value->kind == Node::Kind::scalar) return readContent(control, *value, said);
-  for (const auto& [key, property] : entriesOf(value, "a text or a table", mistakes_)) {
+  for (const auto& [key, property] : entriesOf(*value, "a text or a table", mistakes_)) {
     readProperty(control, *key, *property, said);
   }
 }
@@ -289,17 +289,33 @@ void StepReader::readPress(ControlIndex /*control*/, const Node& value, ControlW
 }
 
 std::optional<Lead> StepReader::readLead(const Node& value) const {
-  if (value.text == words::nothing) return Lead{Lead::Kind::nowhere, 0, value.place};
-  if (value.text == words::back) return Lead{Lead::Kind::back, 0, value.place};
-  if (value.text == words::end) return Lead{Lead::Kind::end, 0, value.place};
-  const auto found = steps_.find(value.text);
+  if (value.kind == Node::Kind::table) return readInstead(value);
+  const std::string& text = value.text;
+  if (text == words::nothing) return Lead{.place = value.place};
+  if (text == words::back) return Lead{.kind = Lead::Kind::back, .place = value.place};
+  if (text == words::end) return Lead{.kind = Lead::Kind::end, .place = value.place};
+  const auto found = steps_.find(text);
   if (value.kind == Node::Kind::scalar && found != steps_.end()) {
-    return Lead{Lead::Kind::step, found->second, value.place};
+    return Lead{.kind = Lead::Kind::step, .step = found->second, .place = value.place};
   }
   std::vector<std::string_view> known = {words::back, words::end, words::nothing};
   for (const auto& [name, step] : steps_) known.push_back(name);
   mistakes_.add(value.place, "expected the name of a step, “back”, “end” or “nothing”, found " +
-                                 foundWords(value) + didYouMean(value.text, known));
+                                 foundWords(value) + didYouMean(text, known));
+  return std::nullopt;
+}
+
+std::optional<Lead> StepReader::readInstead(const Node& table) const {
+  const auto entries = entriesOf(table, "a table", mistakes_);
+  const bool isInstead = entries.size() == 1 && entries[0].first->text == words::instead;
+  auto lead = isInstead ? readLead(*entries[0].second) : std::nullopt;
+  if (lead && lead->kind == Lead::Kind::step) {
+    lead->isInstead = true;
+    return lead;
+  }
+  if (!isInstead || lead) {
+    mistakes_.add(table.place, "expected “instead” with the name of a step");
+  }
   return std::nullopt;
 }
 
@@ -312,13 +328,13 @@ void StepReader::readWait(const Node& key, const NodeRef& value, StepWords& word
   }
   Wait wait{.seconds = *seconds, .place = key.place};
   const auto lead =
-      value->kind == Node::Kind::table ? readWaitTable(value, wait) : readLead(*value);
+      value->kind == Node::Kind::table ? readWaitTable(*value, wait) : readLead(*value);
   if (!lead) return;
   wait.lead = *lead;
   words.wait = wait;
 }
 
-std::optional<Lead> StepReader::readWaitTable(const NodeRef& table, Wait& wait) const {
+std::optional<Lead> StepReader::readWaitTable(const Node& table, Wait& wait) const {
   static constexpr std::string_view choices[] = {"give up", "start again"};
   std::optional<Lead> lead;
   for (const auto& [word, value] : entriesOf(table, "a table", mistakes_)) {
@@ -330,7 +346,7 @@ std::optional<Lead> StepReader::readWaitTable(const NodeRef& table, Wait& wait) 
       mistakes_.add(word->place, "expected “go” or “other presses”, found " + foundWords(*word));
     }
   }
-  if (!lead) mistakes_.add(table->place, "expected “go” with where the wait leads");
+  if (!lead) mistakes_.add(table.place, "expected “go” with where the wait leads");
   return lead;
 }
 

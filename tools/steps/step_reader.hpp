@@ -35,7 +35,7 @@ class StepReader {
   /// Reads a value for each control: `font: {heading: Helvetica 18}`.
   void readEach(const NodeRef& values, const PropertyRow& row, StepWords& words) const;
   void readWait(const Node& key, const NodeRef& value, StepWords& words) const;
-  std::optional<Lead> readWaitTable(const NodeRef& table, Wait& wait) const;
+  std::optional<Lead> readWaitTable(const Node& table, Wait& wait) const;
 
   void readControl(ControlIndex control, const NodeRef& value, StepWords& words) const;
   void readProperty(ControlIndex control, const Node& key, const Node& value,
@@ -57,6 +57,7 @@ class StepReader {
   std::optional<std::string> translatedText(ControlIndex control, std::string_view property,
                                             const Node& value) const;
   std::optional<Lead> readLead(const Node& value) const;
+  std::optional<Lead> readInstead(const Node& table) const;
   /// Returns the control with that name; absent, and a mistake, if there is none.
   std::optional<ControlIndex> controlNamed(const Node& name) const;
   /// Returns the row of a property; null if no property has this name.

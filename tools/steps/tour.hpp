@@ -41,6 +41,7 @@ struct Lead {
   enum class Kind { nowhere, step, back, end };
   Kind kind = Kind::nowhere;
   StepIndex step = 0;
+  bool isInstead = false;  ///< the step takes the place of this one: Back does not lead here
   Place place = 0;
 };
 

@@ -31,15 +31,15 @@ std::string foundWords(const Node& node) {
   return "nothing";
 }
 
-std::vector<std::pair<NodeRef, NodeRef>> entriesOf(const NodeRef& node, std::string_view what,
+std::vector<std::pair<NodeRef, NodeRef>> entriesOf(const Node& node, std::string_view what,
                                                    Mistakes& mistakes) {
-  if (node->kind != Node::Kind::table) {
-    expect(*node, what, mistakes);
+  if (node.kind != Node::Kind::table) {
+    expect(node, what, mistakes);
     return {};
   }
   std::vector<std::pair<NodeRef, NodeRef>> entries;
   std::set<std::string_view> keys;
-  for (const auto& entry : node->entries) {
+  for (const auto& entry : node.entries) {
     const Node& key = *entry.first;
     if (key.kind != Node::Kind::scalar || key.text.empty()) {
       expect(key, "a name before the colon", mistakes);

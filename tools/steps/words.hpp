@@ -21,6 +21,7 @@ inline constexpr std::string_view background = "background";
 inline constexpr std::string_view passedOver = "back passes over";
 inline constexpr std::string_view back = "back";
 inline constexpr std::string_view end = "end";
+inline constexpr std::string_view instead = "instead";
 inline constexpr std::string_view nothing = "nothing";
 }  // namespace words
 
@@ -29,7 +30,7 @@ std::string foundWords(const Node& node);
 
 /// Returns the entries of a table. Whatever else the node is, a key that is not a text, and a key
 /// that occurs twice are mistakes; `expected` is the table's name in the message.
-std::vector<std::pair<NodeRef, NodeRef>> entriesOf(const NodeRef& node, std::string_view expected,
+std::vector<std::pair<NodeRef, NodeRef>> entriesOf(const Node& node, std::string_view expected,
                                                    Mistakes& mistakes);
 
 /// Returns the text; absent, and a mistake, if the node is not a text.
