@@ -202,5 +202,4 @@ void setBezel(QAbstractButton& button, BezelStyle style) {
   changeLook(button, [&](ButtonLook& look) { look.setBezel(style); });
 }
 
-
 }  // namespace qz::toolkit::qt
