@@ -14,6 +14,7 @@
 #include "tools/commands.hpp"
 #include "tools/steps/po.hpp"
 #include "tools/steps/script_file.hpp"
+#include "tools/support/folder_watch.hpp"
 #include "tools/support/replace_file.hpp"
 #include "tools/support/text_layout.hpp"
 #include "tools/support/whole_file.hpp"
@@ -28,6 +29,7 @@ struct BuildOptions {
   std::string source;
   std::optional<std::string> output;
   std::optional<std::string> language;
+  bool watch = false;
 };
 
 toolkit::Format formatFor(const std::string& path) {
@@ -68,6 +70,12 @@ void sayUntranslated(const steps::Source& source, const steps::Text& text,
             << use.control << "); it stays as it is\n";
 }
 
+std::string outputOf(const BuildOptions& options) {
+  const std::string ending = options.language ? "_" + *options.language + ".plist" : ".plist";
+  auto standard = std::filesystem::path(options.source).replace_extension().concat(ending);
+  return options.output.value_or(standard.string());
+}
+
 void buildSource(const BuildOptions& options) {
   if (!steps::isSourcePath(options.source)) {
     throw Failure(ExitStatus::badInput, options.source +
@@ -77,16 +85,29 @@ void buildSource(const BuildOptions& options) {
   const auto translate =
       options.language ? translationTo(*options.language, options.source) : steps::Translate();
   const steps::ScriptFile script = steps::openScript(options.source, {}, translate);
-  const std::string output = options.output.value_or(
-      std::filesystem::path(options.source)
-          .replace_extension()
-          .concat(options.language ? "_" + *options.language + ".plist" : ".plist")
-          .string());
+  const std::string output = outputOf(options);
   const auto& format = toolkit::formatRow(formatFor(output));
   replaceFile(output, format.write(script.file.dictionary()));
   for (const steps::Text& text : script.from->source.texts) {
     if (!text.isTranslated) sayUntranslated(script.from->source, text, *options.language);
   }
+}
+
+/// Builds again whenever a file beside the source has changed, until the user interrupts. Mistakes
+/// are said, and mended ones are built.
+void watch(const BuildOptions& options) {
+  const auto folder = std::filesystem::absolute(options.source).parent_path().string();
+  watchFolder(folder, outputOf(options), [&] {
+    try {
+      buildSource(options);
+      std::cout << outputOf(options) << ": written" << std::endl;
+    } catch (const steps::SourceRefused& refused) {
+      for (const std::string& message : refused.messages()) std::cerr << message << '\n';
+    } catch (const Failure& failure) {
+      std::cerr << failure.what() << '\n';
+    }
+    return true;
+  });
 }
 
 void describeBuild(Command& command) {
@@ -103,8 +124,14 @@ void describeBuild(Command& command) {
               "Write the script of a language, with the translations of LANG.po beside the source; "
               "x-long makes all texts longer")
       .valueName("LANG");
+  command.flag("--watch", options->watch,
+               "Build again whenever a file beside the source has changed, until interrupted");
   command.action([options] {
-    buildSource(*options);
+    if (options->watch) {
+      watch(*options);
+    } else {
+      buildSource(*options);
+    }
     return static_cast<int>(ExitStatus::fine);
   });
 }
