@@ -14,6 +14,7 @@
 #include "tools/commands.hpp"
 #include "tools/steps/po.hpp"
 #include "tools/steps/script_file.hpp"
+#include "tools/steps/source_map.hpp"
 #include "tools/support/folder_watch.hpp"
 #include "tools/support/replace_file.hpp"
 #include "tools/support/text_layout.hpp"
@@ -29,6 +30,7 @@ struct BuildOptions {
   std::string source;
   std::optional<std::string> output;
   std::optional<std::string> language;
+  std::optional<std::string> map;
   bool watch = false;
 };
 
@@ -88,6 +90,7 @@ void buildSource(const BuildOptions& options) {
   const std::string output = outputOf(options);
   const auto& format = toolkit::formatRow(formatFor(output));
   replaceFile(output, format.write(script.file.dictionary()));
+  if (options.map) replaceFile(*options.map, steps::sourceMap(script));
   for (const steps::Text& text : script.from->source.texts) {
     if (!text.isTranslated) sayUntranslated(script.from->source, text, *options.language);
   }
@@ -124,6 +127,12 @@ void describeBuild(Command& command) {
               "Write the script of a language, with the translations of LANG.po beside the source; "
               "x-long makes all texts longer")
       .valueName("LANG");
+  command
+      .option("--map", options->map,
+              "Also write where in the source each list and command comes from, as JSON")
+      .valueName("MAP.json")
+      .path()
+      .file();
   command.flag("--watch", options->watch,
                "Build again whenever a file beside the source has changed, until interrupted");
   command.action([options] {

@@ -6,6 +6,7 @@
 #include <set>
 
 #include "tests/steps/source_folder.hpp"
+#include "tools/steps/source_map.hpp"
 
 namespace qz::tools::steps {
 namespace {
@@ -63,6 +64,55 @@ TEST(Building, PositionsAreThoseOfTheSource) {
   const auto script = folder.open("steps:\n  a: {text: Hello, next: {press: end}}\n");
   const auto end = script.file.dictionary()->objectForKey("4");
   EXPECT_EQ(script.file.placeOf(end), "tour.yaml:4:34");
+}
+
+TEST(Building, AMapSaysWhereListsAndCommandsComeFrom) {
+  const SourceFolder folder;
+  const auto script = folder.open("steps:\n  a: {next: {press: end}}\n");
+  EXPECT_EQ(sourceMap(script), R"({
+ "version": 1,
+ "source": "tour.yaml",
+ "controls": {
+  "1": "text",
+  "2": "picture",
+  "3": "box",
+  "4": "next",
+  "5": "back",
+  "6": "frame"
+ },
+ "lists": {
+  "0": {
+   "line": 4,
+   "column": 3,
+   "step": "a",
+   "commands": [
+    {
+     "line": 4,
+     "column": 3
+    },
+    {
+     "line": 4,
+     "column": 3
+    },
+    {
+     "line": 4,
+     "column": 3
+    }
+   ]
+  },
+  "4": {
+   "line": 4,
+   "column": 21,
+   "commands": [
+    {
+     "line": 4,
+     "column": 21
+    }
+   ]
+  }
+ }
+}
+)");
 }
 
 TEST(Building, CanStartAtAnyStep) {

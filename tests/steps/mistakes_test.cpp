@@ -62,6 +62,11 @@ TEST(Mistakes, InStepsHavePlaces) {
        {"3:22: “enabled” is a property of controls that take input; the control “frame” is a box"}},
       {"steps: {a: {font: {text: Helvetica}, next: {press: end}}}",
        {"3:26: expected a font and its size in points, such as Helvetica 13, found “Helvetica”"}},
+      {"steps: {a: {font: {text: Sans;color 9}, next: {press: end}}}",
+       {"3:26: expected a font and its size in points, such as Helvetica 13, found “Sans;color "
+        "9”"}},
+      {"steps: {a: {next: {press: {instead: end}}}}",
+       {"3:27: expected “instead” with the name of a step"}},
       {"steps: {a: {after x s: a, next: {press: end}}}",
        {"3:13: expected whole seconds, such as “after 5 s”, found “after x s”"}},
       {"steps: {a: {after 1 s: {other presses: give up}, next: {press: end}}}",

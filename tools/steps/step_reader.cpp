@@ -247,7 +247,9 @@ void StepReader::readFont(ControlIndex /*control*/, const Node& value, ControlWo
   const auto size = space == std::string::npos
                         ? std::nullopt
                         : walkthrough::parseNumber<int>(value.text.substr(space + 1));
-  if (size && *size >= 1 && *size <= mostPoints) {
+  // Names go into styles of HTML; those of fonts have none of these characters.
+  const bool isName = value.text.find_first_of("\"'<>&;\\") == std::string::npos;
+  if (isName && size && *size >= 1 && *size <= mostPoints) {
     words.font = Font{value.text.substr(0, space), *size};
   } else {
     mistakes_.add(

@@ -1,0 +1,49 @@
+// SPDX-License-Identifier: MIT
+// Where the lists and commands of a built script come from.
+#include "tools/steps/source_map.hpp"
+
+#include <nlohmann/json.hpp>
+
+#include <filesystem>
+
+namespace qz::tools::steps {
+namespace {
+
+using Json = nlohmann::ordered_json;
+
+Json placeOf(const InputFile& file, const toolkit::ValueRef<>& value) {
+  const auto [line, column] = std::get<toolkit::TextPosition>(*file.positionOf(value));
+  return {{"line", line}, {"column", column}};
+}
+
+Json listOf(const InputFile& file, const toolkit::Dictionary::Entry& entry,
+            const walkthrough::Names& names) {
+  Json list = placeOf(file, entry.key);
+  const std::string step = names.stepOf(entry.key->description());
+  if (!step.empty()) list["step"] = step;
+  list["commands"] = Json::array();
+  for (const auto& command : toolkit::asArray(entry.value)->elements()) {
+    list["commands"].push_back(placeOf(file, command));
+  }
+  return list;
+}
+
+}  // namespace
+
+std::string sourceMap(const ScriptFile& script) {
+  const walkthrough::Names names = script.names();
+  Json controls = Json::object();
+  for (const auto& [tag, name] : names.controls) controls[std::to_string(tag)] = name;
+  Json lists = Json::object();
+  const auto dictionary = script.file.dictionary();  // held: its entries live only as long
+  for (const auto& entry : dictionary->entries()) {
+    lists[entry.key->description()] = listOf(script.file, entry, names);
+  }
+  const Json map = {{"version", 1},
+                    {"source", std::filesystem::path(script.file.path()).filename().string()},
+                    {"controls", controls},
+                    {"lists", lists}};
+  return map.dump(1) + "\n";
+}
+
+}  // namespace qz::tools::steps
