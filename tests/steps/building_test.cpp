@@ -100,6 +100,11 @@ TEST(Building, AMapSaysWhereListsAndCommandsComeFrom) {
     }
    ]
   },
+  "3": {
+   "line": 4,
+   "column": 3,
+   "commands": []
+  },
   "4": {
    "line": 4,
    "column": 21,

@@ -64,6 +64,9 @@ std::vector<Sighting> sightingsAround(const WidgetChange& change) {
   std::vector<Sighting> sightings;
   const bool hides = change.aspect == Aspect::hidden;
   if (!hides) look(change.widget, {change.aspect}, sightings);
+  // The styled text of an edit is written anew when its palette changes.
+  const bool mayRedress = hides || change.aspect == Aspect::enabled;
+  if (mayRedress) look(change.widget, {Aspect::contents}, sightings);
   QWidget* const first =
       change.aspect == Aspect::contents ? firstOfChoiceWith(change.widget) : nullptr;
   if (first) look(*first, {Aspect::choice}, sightings);
