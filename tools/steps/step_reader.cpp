@@ -243,14 +243,13 @@ void StepReader::readHtml(ControlIndex control, const Node& value, ControlWords&
 }
 
 void StepReader::readFont(ControlIndex /*control*/, const Node& value, ControlWords& words) const {
-  const std::size_t space = value.text.rfind(' ');
-  const auto size = space == std::string::npos
-                        ? std::nullopt
-                        : walkthrough::parseNumber<int>(value.text.substr(space + 1));
   // Names go into styles of HTML; those of fonts have none of these characters.
   const bool isName = value.text.find_first_of("\"'<>&;\\") == std::string::npos;
-  if (isName && size && *size >= 1 && *size <= mostPoints) {
-    words.font = Font{value.text.substr(0, space), *size};
+  const std::size_t space = std::min(value.text.rfind(' '), value.text.size());
+  const std::string_view size = std::string_view(value.text).substr(space);
+  const int points = size.empty() ? 0 : walkthrough::parseNumber<int>(size.substr(1)).value_or(0);
+  if (isName && points >= 1 && points <= mostPoints) {
+    words.font = Font{value.text.substr(0, space), points};
   } else {
     mistakes_.add(
         value.place,
