@@ -29,8 +29,8 @@ class QZ_API Subclass {
 
   /// What an operation returns: YES or NO, a control, or nothing.
   struct Result {
-    bool yes = false;
-    toolkit::Ref<toolkit::View> control;
+    bool yes = false;                     ///< of an operation that answers YES or NO
+    toolkit::Ref<toolkit::View> control;  ///< of one that finds a control; or absent
   };
 
   virtual ~Subclass() = default;

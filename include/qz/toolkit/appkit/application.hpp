@@ -38,9 +38,10 @@ class QZ_API AppKitApplication final : public Application {
   Ref<Window> window(NSWindow* window);
   /// Returns the view of a host's `NSView`; absent for nil. The view is retained.
   Ref<View> view(NSView* view);
-  /// Return the AppKit object behind a window or view of this toolkit; nil for an absent one and
-  /// for another toolkit's.
+  /// Returns the AppKit object behind a window of this toolkit; nil for an absent one and for
+  /// another toolkit's.
   NSWindow* object(const Ref<Window>& window) const;
+  /// The same for a view.
   NSView* object(const Ref<View>& view) const;
 
   /// Makes `object`, which is not retained, the target and delegate that AppKit sees wherever
