@@ -95,6 +95,9 @@ function(qz_install_toolkit_headers name)
       install(DIRECTORY ${headers} DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/qz/${folder})
     endif()
   endforeach()
+  if(name STREQUAL "appkit")
+    install(FILES include/QZ_Plist_State_Parser.h DESTINATION ${CMAKE_INSTALL_INCLUDEDIR})
+  endif()
 endfunction()
 
 # Installs all headers except those of toolkits that have their own library.
@@ -103,7 +106,8 @@ function(qz_install_common_headers)
     ${PROJECT_SOURCE_DIR}/include/qz/toolkit/* ${PROJECT_SOURCE_DIR}/include/qz/drivers/*)
   list(FILTER folders EXCLUDE REGEX "/memory$|\\.hpp$")
   list(TRANSFORM folders REPLACE "(.+)" "PATTERN;\\1;EXCLUDE")
-  install(DIRECTORY include/ DESTINATION ${CMAKE_INSTALL_INCLUDEDIR} PATTERN qz/hosts EXCLUDE ${folders})
+  install(DIRECTORY include/ DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}
+    PATTERN qz/hosts EXCLUDE PATTERN QZ_Plist_State_Parser.h EXCLUDE ${folders})
 endfunction()
 
 # Installs a library with all that its users need.
