@@ -112,7 +112,7 @@ class Player {
 
  private:
   void make(const StartMove& start) {
-    attempt([&] { stage_.load(noFile, start.key); });
+    attempt([&] { stage_.load(walkthrough::noFile, start.key); });
   }
 
   void make(const PressMove& press) {
