@@ -9,7 +9,7 @@ namespace qz::hosts::forms {
 
 /// Returns the description of the window in a form, as `WalkThrough::describe` does for a running
 /// window. `form` is the contents of the file, and `directory` its folder, for icons. Throws a
-/// std::runtime_error that says what is wrong if there is no form in it.
+/// std::runtime_error with the reason if the file does not hold a form.
 std::string describeForm(std::string_view form, const std::string& directory);
 
 }  // namespace qz::hosts::forms

@@ -31,7 +31,7 @@ Resumption resumptionOf(const QVariantMap& state, const toolkit::Dictionary& lis
   Resumption resumption;
   const QStringList texts = state["steps"].toStringList();
   if (state["version"].toInt() != formatVersion || texts.isEmpty()) {
-    resumption.problem = "there is no state of this version to resume";
+    resumption.problem = "this state is not one that this version can resume";
     return resumption;
   }
   for (const QString& text : texts) {

@@ -188,7 +188,7 @@ bool WalkThrough::resume(const QVariantMap& state, QWidget& window) {
 }
 
 bool WalkThrough::resumeInSheet(const QVariantMap& state, QWidget& panel, QWidget& window) {
-  if (state.isEmpty()) return refuse("(none)", "there is no state to resume");
+  if (state.isEmpty()) return refuse("(none)", "the state to resume is empty");
   return begin(ScriptSource::fromVariant(state["script"]), panel, window, &state);
 }
 

@@ -46,7 +46,7 @@ std::string buttonCommands(std::size_t tag) {
          command("SET_STATE_ON_FOR_OBJECT_ID", tag) + command("FLASH_ID", "YES", tag);
 }
 
-// A third of the widgets without a button in them is hidden, so that its form is laid out anew.
+// A third of the widgets without a button in them is hidden, so that Qt lays out its form again.
 std::string visibilityCommands(const QWidget& widget, std::size_t tag) {
   std::string commands = command("HIDE_OBJECT_WITH_ID", tag);
   if (tag % 3 || widget.findChild<QAbstractButton*>()) {

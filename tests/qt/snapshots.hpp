@@ -50,7 +50,7 @@ inline void addTo(Snapshot& snapshot, const QObject& object, const QString& call
   snapshot[name + "children()"] = object.children().size();
 }
 
-/// True for the parts of a document, which Qt makes anew with each text.
+/// True for the parts of a document, which Qt makes again for each text.
 inline bool isPartOfDocument(const QObject& object) {
   const QByteArray name = object.metaObject()->className();
   return !object.isWidgetType() && (name.startsWith("QText") || name == "QWidgetTextControl");

@@ -210,10 +210,10 @@ TEST_F(ToldHost, RefusesStatesThatItCannotTakeUp) {
     QVariantMap state;
     const char* reason;
   } cases[] = {
-      {{}, "there is no state to resume"},
-      {{{"script", tour}}, "there is no state of this version to resume"},
+      {{}, "the state to resume is empty"},
+      {{{"script", tour}}, "this state is not one that this version can resume"},
       {{{"script", tour}, {"version", 2}, {"steps", QStringList{"list 0"}}},
-       "there is no state of this version to resume"},
+       "this state is not one that this version can resume"},
       {{{"script", tour}, {"version", 1}, {"steps", QStringList{"list 0", "leap 1"}}},
        "its state has the unknown step \"leap 1\""},
       {{{"script", tour}, {"version", 1}, {"steps", QStringList{"list 0", "press 1 off"}}},

@@ -43,7 +43,7 @@ class Desk : public std::enable_shared_from_this<Desk> {
   void letGo(const AppKitWindow& window);
   void letAllGo();
 
-  /// Makes `object` stand for `responder`; nil ends that.
+  /// Makes `object` stand for `responder`; with nil, no object stands for it any more.
   void present(const std::shared_ptr<Responder>& responder, id object);
   /// Returns the object that stands for `responder`; nil if there is none.
   id objectFor(const Responder* responder) const;

@@ -64,7 +64,7 @@ std::vector<Sighting> sightingsAround(const WidgetChange& change) {
   std::vector<Sighting> sightings;
   const bool hides = change.aspect == Aspect::hidden;
   if (!hides) look(change.widget, {change.aspect}, sightings);
-  // The styled text of an edit is written anew when its palette changes.
+  // Qt writes the styled text of an edit again when the palette of the edit changes.
   const bool mayRedress = hides || change.aspect == Aspect::enabled;
   if (mayRedress) look(change.widget, {Aspect::contents}, sightings);
   QWidget* const first =

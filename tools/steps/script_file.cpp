@@ -47,7 +47,7 @@ ScriptFile openScript(const std::string& path, const std::string& start,
                       const Translate& translate) {
   if (!isSourcePath(path)) return {InputFile(path, expectedFile), std::nullopt};
   BuiltSource from{.source = readSource(path, translate), .built = {}};
-  // The first step stays a start, so that the others are reached as ever.
+  // The first step stays a start, so that the same steps are reached as without `start`.
   std::vector<StepIndex> starts = {0};
   const StepIndex first = start.empty() ? 0 : stepNamed(from.source, start);
   if (first != 0) starts.insert(starts.begin(), first);

@@ -18,8 +18,8 @@ inline constexpr ToolkitRow appkitRow = {
     .place = 3,
 };
 
-/// Makes a driver with its own AppKit toolkit. Makes the application object if there is none.
-/// Raises if there is no display.
+/// Makes a driver with its own AppKit toolkit. Makes the application object if the program does not
+/// have one. Raises if no display can be opened.
 QZ_API std::unique_ptr<Driver> makeAppkitDriver();
 
 }  // namespace qz::drivers

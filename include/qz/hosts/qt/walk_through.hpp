@@ -90,10 +90,11 @@ class QZ_API WalkThrough : public QObject {
 
   /// Returns where the walk-through is, for `resume`: the running one, or else the last one unless
   /// its script ended it. Has the keys "version", "script" and "steps" (a list of strings); all
-  /// that settings can keep. Empty if there is none.
+  /// that settings can keep. Empty if no walk-through can be resumed.
   QVariantMap state() const;
   /// Plays the script of a state, and makes its steps again at once. The timers of the last step
-  /// start anew. Fails like `play`, and if the script no longer has a list that the state needs.
+  /// start again from the beginning. Fails like `play`, and also if the script no longer has a list
+  /// that the state needs.
   bool resume(const QVariantMap& state, QWidget& window);
   /// The same in `panel`, a top-level widget, which is shown as a sheet over `window`.
   bool resumeInSheet(const QVariantMap& state, QWidget& panel, QWidget& window);

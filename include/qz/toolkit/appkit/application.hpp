@@ -46,7 +46,8 @@ class QZ_API AppKitApplication final : public Application {
 
   /// Makes `object`, which is not retained, the target and delegate that AppKit sees wherever
   /// `responder` is one. Without this, AppKit sees an object of the toolkit's own that performs the
-  /// responder's actions. Null ends it; the object must not end before.
+  /// responder's actions. Null removes `object` again. Do that before `object` is
+  /// deallocated.
   void present(const std::shared_ptr<Responder>& responder, void* object);
 
   /// The desk that this application's windows and views share, for code that makes more of them.
