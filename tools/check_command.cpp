@@ -17,6 +17,7 @@
 #include "tools/check/witness.hpp"
 #include "tools/check_progress.hpp"
 #include "tools/commands.hpp"
+#include "tools/stage_arguments.hpp"
 #include "tools/steps/script_file.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/suggestions.hpp"
@@ -252,31 +253,16 @@ int runCheck(const CommandOptions& options) {
 }
 
 void addWindowOptions(Command& command, CheckOptions& options) {
-  auto window =
-      command.option("--window", options.stage.window,
-                     "The host's window, a property list of its controls or a form (.ui)");
-  auto assets = command.option("--assets", options.stage.assets,
-                               "A description from which the engine builds the window");
-  window.valueName("HOST.plist").file().excludes(assets);
-  assets.valueName("DESCRIPTION.plist").file();
-  auto standIn = command.flag("--stand-in", options.standIn,
-                              "Check without a window: make one from the script, and say nothing "
-                              "about the tags, kinds and looks of its controls");
-  standIn.excludes(window).excludes(assets);
+  auto [window, assets] = addStageOptions(command, options.stage, options.resources);
   command
-      .option("--resources", options.resources,
-              "The directory of the images (default: the script's)")
-      .valueName("DIR")
-      .directory();
-  command.flag("--sheet", options.stage.sheet,
-               "Show the window as a sheet over another window of the host");
+      .flag("--stand-in", options.standIn,
+            "Check without a window: make one from the script, and say nothing about the tags, "
+            "kinds and looks of its controls")
+      .excludes(window)
+      .excludes(assets);
   options.toolkit = testToolkit();
-  command
-      .option("--toolkit", options.toolkit,
-              "The toolkit whose fonts and images the script may use: " + toolkitHelp())
-      .valueName("NAME")
-      .choices(driverNames())
-      .showDefault();
+  addToolkitOption(command, options.toolkit,
+                   "The toolkit whose fonts and images the script may use");
 }
 
 void addExploringOptions(Command& command, CheckOptions& options) {

@@ -11,6 +11,7 @@
 #include "tools/play/play.hpp"
 #include "tools/play/prompt.hpp"
 #include "tools/reading_errors.hpp"
+#include "tools/stage_arguments.hpp"
 #include "tools/steps/source.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/terminal.hpp"
@@ -58,26 +59,9 @@ void addAdvance(play::PlayOptions& options, const std::string& text) {
 }
 
 void addWindowOptions(Command& command, play::PlayOptions& options) {
-  auto window =
-      command.option("--window", options.stage.window,
-                     "The host's window, a property list of its controls or a form (.ui)");
-  auto assets = command.option("--assets", options.stage.assets,
-                               "A description from which the engine builds the window");
-  window.valueName("HOST.plist").file().excludes(assets);
-  assets.valueName("DESCRIPTION.plist").file();
-  command
-      .option("--resources", options.resources,
-              "The directory of the images (default: the script's)")
-      .valueName("DIR")
-      .directory();
-  command.flag("--sheet", options.stage.sheet,
-               "Show the window as a sheet over another window of the host");
+  addStageOptions(command, options.stage, options.resources);
   options.toolkit = playerToolkit();
-  command
-      .option("--toolkit", options.toolkit, "The toolkit to play the script on: " + toolkitHelp())
-      .valueName("NAME")
-      .choices(driverNames())
-      .showDefault();
+  addToolkitOption(command, options.toolkit, "The toolkit to play the script on");
   command
       .option("--screenshots", options.screenshots,
               "Write the transcript and a picture after every step to this directory")

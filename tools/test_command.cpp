@@ -17,6 +17,7 @@
 #include "tools/scenario/runner.hpp"
 #include "tools/scenario/scenario_files.hpp"
 #include "tools/scenario/statements.hpp"
+#include "tools/stage_arguments.hpp"
 #include "tools/steps/script_file.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/failure.hpp"
@@ -188,9 +189,7 @@ void describeTest(Command& command) {
   command.arguments("FILE", options->paths, "Scenario files (.walk), or directories of them")
       .path()
       .file();
-  command.option("--toolkit", options->toolkit, "The toolkit to run on: " + toolkitHelp())
-      .choices(driverNames())
-      .showDefault();
+  addToolkitOption(command, options->toolkit, "The toolkit to run on");
   command.option("--filter", options->filter, "Run only scenarios whose title contains this");
   command.flag("--list", options->list, "Name the scenarios instead of running them");
   command.flag("--verbose", options->verbose, "Print every statement with its result");

@@ -1,0 +1,32 @@
+// SPDX-License-Identifier: MIT
+#include "tools/stage_arguments.hpp"
+
+#include "tools/support/drivers.hpp"
+
+namespace qz::tools {
+
+WindowArguments addStageOptions(Command& command, walkthrough::StageOptions& stage,
+                                std::optional<std::string>& resources) {
+  auto window =
+      command.option("--window", stage.window,
+                     "The host's window, a property list of its controls or a form (.ui)");
+  auto assets = command.option("--assets", stage.assets,
+                               "A description from which the engine builds the window");
+  window.valueName("HOST.plist").file().excludes(assets);
+  assets.valueName("DESCRIPTION.plist").file();
+  command.option("--resources", resources, "The directory of the images (default: the script's)")
+      .valueName("DIR")
+      .directory();
+  command.flag("--sheet", stage.sheet,
+               "Show the window as a sheet over another window of the host");
+  return {window, assets};
+}
+
+void addToolkitOption(Command& command, std::string& toolkit, const std::string& help) {
+  command.option("--toolkit", toolkit, help + ": " + toolkitHelp())
+      .valueName("NAME")
+      .choices(driverNames())
+      .showDefault();
+}
+
+}  // namespace qz::tools
