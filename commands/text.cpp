@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Plain text.
+// The command that sets the plain text of a control.
 
 #include "engine/state.hpp"
 #include "engine/text_of.hpp"

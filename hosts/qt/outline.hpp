@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: MIT
+// Where a walk-through is, for progress meters.
 #pragma once
 
 #include "qz/engine.hpp"

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The place of a sheet: over its parent, which takes no input meanwhile.
+// The place of a sheet: over its parent, which takes no clicks and no keys meanwhile.
 //
 // AppKit's own sheets are not used, because GNUstep's run a modal session that blocks their caller
 // and in which timers of the default mode wait.

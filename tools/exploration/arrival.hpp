@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: MIT
+// Where a move has led, and what was seen on the way.
 #pragma once
 
 #include <cstdint>

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Scenes: a step together with the way on which the user came, as far as Back needs it.
+// Scenes: a step, together with the steps to which Back leads from there.
 #pragma once
 
 #include <optional>
