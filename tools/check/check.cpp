@@ -28,16 +28,6 @@ namespace {
                 file.path() + ": " + problem + "expected one of " + enumerate(keys));
 }
 
-std::vector<std::string> startKeysOf(const InputFile& file, const Script& script,
-                                     const CheckOptions& options) {
-  for (const std::string& key : options.startKeys) {
-    if (!script.listUnder(key)) wrongStartKey(file, script, key);
-  }
-  if (!options.startKeys.empty()) return options.startKeys;
-  const auto smallest = smallestTagKey(*script.dictionary());
-  return smallest ? std::vector{*smallest} : std::vector<std::string>();
-}
-
 constexpr std::size_t longestShownPath = 100;  // moves
 
 /// Returns the path of a file beside the script, if there is one.
@@ -151,6 +141,16 @@ void playPaths(std::vector<Finding>& findings, const Setting& setting) {
 }
 
 }  // namespace
+
+std::vector<std::string> startKeysOf(const InputFile& file, const Script& script,
+                                     const CheckOptions& options) {
+  for (const std::string& key : options.startKeys) {
+    if (!script.listUnder(key)) wrongStartKey(file, script, key);
+  }
+  if (!options.startKeys.empty()) return options.startKeys;
+  const auto smallest = smallestTagKey(*script.dictionary());
+  return smallest ? std::vector{*smallest} : std::vector<std::string>();
+}
 
 std::string resourcesFor(const InputFile& file, const CheckOptions& options) {
   return options.resources.value_or(std::filesystem::absolute(file.path()).parent_path().string());

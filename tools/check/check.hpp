@@ -54,6 +54,11 @@ struct Verdict {
 /// Returns the directory of the named images.
 std::string resourcesFor(const InputFile& file, const CheckOptions& options);
 
+/// Returns the keys of the lists with which the walk-through may start. Throws a Failure if one of
+/// the options is not a key of a list.
+std::vector<std::string> startKeysOf(const InputFile& file, const Script& script,
+                                     const CheckOptions& options);
+
 /// Checks one script. Throws a Failure if a file does not hold what it should.
 Verdict checkScript(const InputFile& file, const CheckOptions& options,
                     const ExplorationHooks& hooks);

@@ -137,22 +137,31 @@ std::vector<std::string> changesBetween(const StepPicture& before, const StepPic
 
 }  // namespace
 
-std::vector<PlayedMove> playPath(const Setting& setting, const Path& path) {
-  const auto& names = setting.plan.names;
+void playEach(const Setting& setting, const Path& path,
+              const std::function<void(const SeenMove&)>& see) {
   Replay replay(setting);
-  std::vector<PlayedMove> played;
   StepPicture before = replay.picture();
   for (const Step& step : path) {
     const auto outcome = replay.make(step);
-    if (outcome == Replay::Outcome::endless) {
-      played.push_back(
-          {wordsOf(step, names), {"runs lists without end, so the program crashes"}, false, true});
-      break;
-    }
+    if (outcome == Replay::Outcome::endless) return;
     StepPicture after = replay.picture();
-    played.push_back({wordsOf(step, names), changesBetween(before, after),
-                      outcome == Replay::Outcome::raised, false});
+    see({step, before, after, outcome == Replay::Outcome::raised});
     before = std::move(after);
+  }
+}
+
+std::vector<PlayedMove> playPath(const Setting& setting, const Path& path) {
+  const auto& names = setting.plan.names;
+  std::vector<PlayedMove> played;
+  playEach(setting, path, [&](const SeenMove& move) {
+    played.push_back(
+        {wordsOf(move.step, names), changesBetween(move.before, move.after), move.raised, false});
+  });
+  if (played.size() < path.size()) {
+    played.push_back({wordsOf(path[played.size()], names),
+                      {"runs lists without end, so the program crashes"},
+                      false,
+                      true});
   }
   return played;
 }

@@ -1,0 +1,156 @@
+// SPDX-License-Identifier: MIT
+// A move is followed by what differs from before; the start, by all that can be expected.
+#include "tools/cover/scenario_text.hpp"
+
+#include <sstream>
+
+#include "tools/check/replay.hpp"
+#include "tools/cover/control_names.hpp"
+#include "tools/scenario/text_properties.hpp"
+#include "tools/support/text_layout.hpp"
+
+namespace qz::tools::cover {
+namespace {
+
+using check::quotedWord;
+using check::yesNo;
+using drivers::ViewPicture;
+using walkthrough::ControlPicture;
+using walkthrough::StepPicture;
+
+constexpr std::size_t longestFileName = 60;
+
+/// Returns an optional text as a value of an expectation.
+std::string valueOf(const std::optional<std::string>& text) {
+  return text ? quotedWord(*text) : "absent";
+}
+
+/// Expects what differs between two pictures of one control; everything, if there is no picture
+/// before.
+class ControlExpectations {
+ public:
+  ControlExpectations(const std::string& name, const ControlPicture* before,
+                      const ControlPicture& after, std::ostream& out)
+      : name_(name), before_(before ? &before->view : nullptr), after_(after.view), out_(out) {
+    const auto& row = drivers::rowOf(after_.kind);
+    expect("hidden", &ViewPicture::hidden, yesNo(after_.hidden));
+    if (row.isControl) expect("enabled", &ViewPicture::enabled, yesNo(after_.enabled));
+    if (row.isButton)
+      expect("state", &ViewPicture::state, std::to_string(static_cast<int>(after_.state)));
+    if (row.isButton) expectText("title", &ViewPicture::title);
+    if (row.caption == drivers::Caption::text) expectText("text", &ViewPicture::text);
+    if (row.caption == drivers::Caption::imageName)
+      expect("image", &ViewPicture::image, valueOf(after_.image));
+    expect("tooltip", &ViewPicture::toolTip,
+           after_.toolTip.empty() ? "absent" : quotedWord(after_.toolTip));
+    if (row.isButton) {
+      const auto& color = after_.background;
+      expect("background", &ViewPicture::background,
+             color ? quotedWord(scenario::showColor(*color)) : "absent");
+    }
+    const bool flashed = before && before->flashing;
+    if (after.flashing && !flashed) {
+      out_ << "expect engine.flashingTagIds." << after_.tag << " YES\n";
+    }
+  }
+
+ private:
+  template <class Value>
+  void expect(const char* property, Value ViewPicture::*value, const std::string& words) {
+    if (before_ && before_->*value == after_.*value) return;
+    out_ << "expect " << name_ << '.' << property << ' ' << words << '\n';
+  }
+
+  /// The characters, and the attributes if the text has any.
+  void expectText(const char* property, toolkit::AttributedString ViewPicture::*text) {
+    const auto& after = after_.*text;
+    if (before_ && before_->*text == after) return;
+    expect(property, text, quotedWord(after.string()));
+    const auto runs = scenario::showRuns(after);
+    const bool isPlain = runs.empty() || (runs.size() == 1 && runs[0][1].empty());
+    const bool wasPlain = !before_ || scenario::showRuns(before_->*text) == scenario::showRuns({});
+    if (!isPlain || !wasPlain) out_ << "expect " << name_ << ".runs " << runs.dump() << '\n';
+  }
+
+  const std::string& name_;
+  const ViewPicture* before_;
+  const ViewPicture& after_;
+  std::ostream& out_;
+};
+
+class Writer {
+ public:
+  Writer(const check::WrittenPlay& play, const check::Path& path) : play_(play), path_(path) {}
+
+  WrittenScenario write() {
+    check::playEach(play_.setting, path_, [&](const check::SeenMove& move) { add(move); });
+    std::ostringstream text;
+    text << signature << '\n' << "# " << oneLine(what_) << '\n';
+    check::writeSetUp(play_, names_, text);
+    if (play_.setting.plan.description) nameControls(text);
+    text << moves_.str() << "ignore log\n";
+    return {slugOf(what_, longestFileName), text.str()};
+  }
+
+ private:
+  /// For a window that the engine builds, whose controls have no names.
+  void nameControls(std::ostream& out) const {
+    for (std::size_t i = 0; i < names_.size(); ++i)
+      out << "name " << names_[i] << " @" << i << '\n';
+  }
+
+  void add(const check::SeenMove& move) {
+    const bool isStart = std::holds_alternative<check::StartMove>(move.step);
+    if (isStart) names_ = controlNames(move.before);
+    const auto* press = std::get_if<check::PressMove>(&move.step);
+    const std::string pressed = press ? names_[press->control] : "";
+    tell(move.step, pressed);
+    if (!isStart) moves_ << '\n';
+    check::writeMove(play_, move.step, pressed, moves_);
+    moves_ << (move.raised ? " => raises" : "") << '\n';
+    expectChanges(isStart ? nullptr : &move.before, move.after);
+  }
+
+  void tell(const check::Step& step, const std::string& pressed) {
+    if (const auto* start = std::get_if<check::StartMove>(&step)) {
+      what_ = "from " + start->key + ":";
+      return;
+    }
+    what_ += " " + (pressed.empty() ? std::string("wait") : pressed);
+  }
+
+  void expectChanges(const StepPicture* before, const StepPicture& after) {
+    if (after.ended) {
+      moves_ << "expect engine.terminating YES\n";
+      return;
+    }
+    for (std::size_t i = 0; i < after.controls.size(); ++i) {
+      ControlExpectations(names_[i], before ? &before->controls[i] : nullptr, after.controls[i],
+                          moves_);
+    }
+    expectTimers(before, after);
+  }
+
+  void expectTimers(const StepPicture* before, const StepPicture& after) {
+    if (before && before->timers == after.timers) return;
+    if (after.timers.empty() && before) moves_ << "expect engine.objectIdTimers empty\n";
+    for (const auto& timer : after.timers) {
+      moves_ << "expect engine.objectIdTimers." << timer.key << ' '
+             << check::numberWord(timer.timeLeft) << '\n';
+    }
+  }
+
+  const check::WrittenPlay& play_;
+  const check::Path& path_;
+  std::vector<std::string> names_;  // of the controls
+  std::string what_;                // the user does
+  std::ostringstream moves_;
+};
+
+}  // namespace
+
+WrittenScenario scenarioOf(const check::WrittenPlay& play, const check::Path& path) {
+  return Writer(play, path).write();
+}
+
+}  // namespace qz::tools::cover
