@@ -29,9 +29,12 @@ struct Covered {
 std::vector<Covered> coveredScripts() {
   const std::string source = QZ_SOURCE_DIR;
   std::vector<Covered> all = {
-      {source + "/examples/first-steps/script.plist", source + "/examples/first-steps/host.plist", ""},
-      {source + "/examples/photo-import/script.plist", source + "/examples/photo-import/host.plist", ""},
-      {source + "/examples/built-window/script.plist", "", source + "/examples/built-window/assets.plist"},
+      {source + "/examples/first-steps/script.plist", source + "/examples/first-steps/host.plist",
+       ""},
+      {source + "/examples/photo-import/script.plist", source + "/examples/photo-import/host.plist",
+       ""},
+      {source + "/examples/built-window/script.plist", "",
+       source + "/examples/built-window/assets.plist"},
       {source + "/examples/qt-host/tour.plist", source + "/examples/qt-host/tour-host.plist", ""}};
   for (const auto& folder : fs::directory_iterator(source + "/tests/check/corpus")) {
     const auto window = folder.path() / "window.plist";
@@ -63,7 +66,8 @@ std::string failuresOn(std::string_view toolkit) {
     for (const scenario::Scenario& each : file.contents.scenarios) {
       const scenario::Report report = runner.run(file, each);
       if (report.verdict == scenario::Verdict::passed) continue;
-      failures += report.file + ":" + std::to_string(report.failedLine) + ": " + report.problem + "\n";
+      failures +=
+          report.file + ":" + std::to_string(report.failedLine) + ": " + report.problem + "\n";
     }
   }
   return failures;

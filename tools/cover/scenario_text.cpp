@@ -20,56 +20,71 @@ using walkthrough::StepPicture;
 
 constexpr std::size_t longestFileName = 60;
 
-/// Returns an optional text as a value of an expectation.
-std::string valueOf(const std::optional<std::string>& text) {
-  return text ? quotedWord(*text) : "absent";
-}
-
-/// Expects what differs between two pictures of one control; everything, if there is no picture
-/// before.
+/// Expects what differs between two pictures of one control; all that is there to see, if there is
+/// no picture before or the control was hidden. What a hidden control has is nobody's business.
 class ControlExpectations {
  public:
   ControlExpectations(const std::string& name, const ControlPicture* before,
                       const ControlPicture& after, std::ostream& out)
-      : name_(name), before_(before ? &before->view : nullptr), after_(after.view), out_(out) {
+      : name_(name),
+        before_(before && !before->view.hidden ? &before->view : nullptr),
+        after_(after.view),
+        out_(out) {
+    if (!before || before->view.hidden != after_.hidden) expect("hidden", yesNo(after_.hidden));
+    if (after_.hidden) return;
     const auto& row = drivers::rowOf(after_.kind);
-    expect("hidden", &ViewPicture::hidden, yesNo(after_.hidden));
-    if (row.isControl) expect("enabled", &ViewPicture::enabled, yesNo(after_.enabled));
-    if (row.isButton)
-      expect("state", &ViewPicture::state, std::to_string(static_cast<int>(after_.state)));
-    if (row.isButton) expectText("title", &ViewPicture::title);
-    if (row.caption == drivers::Caption::text) expectText("text", &ViewPicture::text);
-    if (row.caption == drivers::Caption::imageName)
-      expect("image", &ViewPicture::image, valueOf(after_.image));
-    expect("tooltip", &ViewPicture::toolTip,
-           after_.toolTip.empty() ? "absent" : quotedWord(after_.toolTip));
-    if (row.isButton) {
-      const auto& color = after_.background;
-      expect("background", &ViewPicture::background,
-             color ? quotedWord(scenario::showColor(*color)) : "absent");
+    if (row.isControl && differs(&ViewPicture::enabled)) expect("enabled", yesNo(after_.enabled));
+    if (row.showsState && differs(&ViewPicture::state)) {
+      expect("state", std::to_string(static_cast<int>(after_.state)));
     }
-    const bool flashed = before && before->flashing;
-    if (after.flashing && !flashed) {
+    expectCaption(row);
+    expectIfSet("tooltip", &ViewPicture::toolTip, quotedWord(after_.toolTip));
+    const auto& color = after_.background;
+    expectIfSet("background", &ViewPicture::background,
+                color ? quotedWord(scenario::showColor(*color)) : "absent");
+    if (after.flashing && !(before && before->flashing)) {
       out_ << "expect engine.flashingTagIds." << after_.tag << " YES\n";
     }
   }
 
  private:
   template <class Value>
-  void expect(const char* property, Value ViewPicture::*value, const std::string& words) {
-    if (before_ && before_->*value == after_.*value) return;
+  bool differs(Value ViewPicture::*value) const {
+    return !before_ || before_->*value != after_.*value;
+  }
+
+  void expect(const char* property, const std::string& words) {
     out_ << "expect " << name_ << '.' << property << ' ' << words << '\n';
   }
 
-  /// The characters, and the attributes if the text has any.
+  /// Expects a value that most controls do not have.
+  template <class Value>
+  void expectIfSet(const char* property, Value ViewPicture::*value, const std::string& words) {
+    const bool isSet = before_ ? differs(value) : after_.*value != Value{};
+    if (isSet) expect(property, words);
+  }
+
+  void expectCaption(const drivers::ViewKindRow& row) {
+    if (row.caption == drivers::Caption::title) expectText("title", &ViewPicture::title);
+    if (row.caption == drivers::Caption::text) expectText("text", &ViewPicture::text);
+    if (row.caption == drivers::Caption::imageName && differs(&ViewPicture::image)) {
+      expect("image", after_.image ? quotedWord(*after_.image) : "absent");
+    }
+  }
+
+  /// Expects the characters; the runs instead, if the text has attributes or had some.
   void expectText(const char* property, toolkit::AttributedString ViewPicture::*text) {
-    const auto& after = after_.*text;
-    if (before_ && before_->*text == after) return;
-    expect(property, text, quotedWord(after.string()));
-    const auto runs = scenario::showRuns(after);
-    const bool isPlain = runs.empty() || (runs.size() == 1 && runs[0][1].empty());
-    const bool wasPlain = !before_ || scenario::showRuns(before_->*text) == scenario::showRuns({});
-    if (!isPlain || !wasPlain) out_ << "expect " << name_ << ".runs " << runs.dump() << '\n';
+    if (!differs(text)) return;
+    const auto runs = scenario::showRuns(after_.*text);
+    if (isPlain(runs) && (!before_ || isPlain(scenario::showRuns(before_->*text)))) {
+      expect(property, quotedWord((after_.*text).string()));
+    } else {
+      expect("runs", runs.dump());
+    }
+  }
+
+  static bool isPlain(const scenario::Json& runs) {
+    return runs.empty() || (runs.size() == 1 && runs[0][1].empty());
   }
 
   const std::string& name_;

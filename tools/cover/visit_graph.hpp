@@ -13,10 +13,11 @@
 
 namespace qz::tools::cover {
 
-/// What a user sees, and the list that had the last word.
+/// What a user sees, and the list that had the last word. The number of the appearance is the same
+/// for all that looks the same to a user; states that the user changed do not count.
 struct SeenStep {
   std::uint32_t list = check::noList;
-  std::uint32_t look = 0;
+  std::uint32_t appearance = 0;
 
   auto operator<=>(const SeenStep&) const = default;
 };
