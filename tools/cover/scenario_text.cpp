@@ -143,6 +143,10 @@ class Writer {
       ControlExpectations(names_[i], before ? &before->controls[i] : nullptr, after.controls[i],
                           moves_);
     }
+    const bool allowed = before && before->flashingAllowed;
+    if (allowed != after.flashingAllowed) {
+      moves_ << "expect engine.flashing " << yesNo(after.flashingAllowed) << '\n';
+    }
     expectTimers(before, after);
   }
 

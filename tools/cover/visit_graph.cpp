@@ -76,6 +76,7 @@ VisitGraph::VisitGraph(check::Exploration& exploration, unsigned threads) {
         const bool isStart = occasion.visit == check::noVisit;
         Way way{.occasion = occasion, .to = to->second};
         way.goals.push_back({.from = isStart ? SeenStep{} : stepAt(visits[occasion.visit]),
+                             .place = isStart ? check::noPlace : visits[occasion.visit].place,
                              .move = arrival.move,
                              .to = {lastList, appearances.numberOf(place, arrival.look)}});
         for (const std::uint32_t list : arrival.watchedLists)

@@ -22,9 +22,11 @@ struct SeenStep {
   auto operator<=>(const SeenStep&) const = default;
 };
 
-/// What some scenario must do: make a move from one step to another, or run a list.
+/// What some scenario must do: make a move from one step to another, or run a list. Where a step is
+/// at several places, such as with other tags, its moves are made at each.
 struct Goal {
   SeenStep from{};
+  std::uint32_t place = check::noPlace;
   check::Move move = 0;
   SeenStep to{};
   std::uint32_t ranList = check::noList;  ///< or this, and all else is 0
