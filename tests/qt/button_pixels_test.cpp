@@ -64,8 +64,8 @@ const char* const sheets[] = {
     "",
     "QAbstractButton { border: 1px solid #888; border-radius: 4px; background: #eee; }",
     "QAbstractButton { background: #222; color: #ddd; border: none; padding: 4px; }",
-    "QAbstractButton { background: #3b82f6; color: white; border: 2px solid #1d4ed8; }"
-    "QAbstractButton:hover { background: #60a5fa; }",
+    ("QAbstractButton { background: #3b82f6; color: white; border: 2px solid #1d4ed8; }"
+     "QAbstractButton:hover { background: #60a5fa; }"),
     "* { font-size: 13px; color: #eee; background-color: #333; }",
 };
 

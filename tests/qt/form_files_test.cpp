@@ -113,7 +113,8 @@ TEST(FormFiles, ThatHoldNoFormAreRefused) {
 TEST(FormFiles, NeedQtsFormLoader) {
   const WorkingDirectory directory;
   directory.write("form.ui", form);
-  EXPECT_EQ(refusal("form.ui").substr(0, 40), "form.ui: this build does not read forms: ");
+  const std::string said = refusal("form.ui");
+  EXPECT_TRUE(said.starts_with("form.ui: this build does not read forms: ")) << said;
 }
 
 #endif

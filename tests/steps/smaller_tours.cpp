@@ -69,8 +69,8 @@ class Smaller {
 
   void leaveOutOf(const PartOf& partOf) {
     Part part = partOf(tour_);
-    for (const auto& [name, words] : part.controls) {
-      without([&](Tour& t) { partOf(t).controls.erase(name); });
+    for (const auto& control : part.controls) {
+      without([&](Tour& t) { partOf(t).controls.erase(control.first); });
     }
     for (std::size_t i = 0; i < part.uses.size(); ++i) {
       without([&](Tour& t) {
@@ -79,8 +79,8 @@ class Smaller {
     }
     if (!part.like.empty()) without([&](Tour& t) { partOf(t).like = ""; });
     leaveOutOptions(partOf);
-    for (const auto& [name, words] : part.controls) {
-      leaveOutOptions([&](Tour& t) -> Words& { return partOf(t).controls.at(name); });
+    for (const auto& control : part.controls) {
+      leaveOutOptions([&](Tour& t) -> Words& { return partOf(t).controls.at(control.first); });
     }
   }
 
