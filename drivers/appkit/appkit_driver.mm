@@ -16,7 +16,7 @@
 #import "toolkit/foundation/strings.hpp"
 
 /// Takes the arguments of the program, which GNUstep would open as documents.
-@interface QZDriverDelegate : NSObject
+@interface QZDriverDelegate : NSObject <NSApplicationDelegate>
 @end
 
 @implementation QZDriverDelegate
@@ -111,10 +111,6 @@ ViewKind kindOf(View& view, NSView* object) {
   return [object isKindOfClass:[NSBox class]] ? ViewKind::box : ViewKind::plain;
 }
 
-std::optional<std::string> nameOf(const Ref<Image>& image) {
-  return image ? std::optional(image->name()) : std::nullopt;
-}
-
 void requireApplication() {
   const Pool pool;
   sending([] {
@@ -181,12 +177,7 @@ void clickWithoutMouse(NSView* view) {
 
 }  // namespace
 
-AppKitDriver::AppKitDriver() {
-  setLogSink({});
-  toolkit_.calls().setHandler([this](const std::exception_ptr& thrown) {
-    if (!thrown_) thrown_ = thrown;
-  });
-}
+template class PacedDriver<AppKitToolkit>;
 
 Ref<Window> AppKitDriver::makeWindow(const Rect& content) {
   const Pool pool;
@@ -217,22 +208,9 @@ void AppKitDriver::setFrame(const Ref<View>& view, const Rect& frame) {
   if (const auto node = ViewNode::of(view)) node->place(frame);
 }
 
-void AppKitDriver::setCaption(const Ref<View>& view, std::string_view text) {
-  const Pool pool;
-  asTextField(view)->setStringValue(text);
-  asButton(view)->setTitle(text);
-  if (const auto imageView = asImageView(view)) {
-    imageView->setImage(toolkit_.images().imageNamed(text));
-  }
-}
-
 void AppKitDriver::setWindowTitle(const Ref<Window>& window, std::string_view title) {
   const Pool pool;
   [toolkit_.application().object(window) setTitle:nsString(title)];
-}
-
-void AppKitDriver::setResourcePath(std::string_view path) {
-  toolkit_.files().setResourcePath(path);
 }
 
 std::string_view AppKitDriver::className(ViewKind kind) const {
@@ -279,43 +257,20 @@ void AppKitDriver::letGo() {
 void AppKitDriver::advance(double seconds) {
   const Pool pool;
   if (held_ && !takesInput(held_.get())) setHeld(false);
-  if (realTime_) {
-    wait(std::max(seconds, 0.0));
-  } else {
-    jump(std::max(seconds, 0.0));
-  }
-  settle();
-  raiseWhatWasThrown();
+  PacedDriver::advance(seconds);
 }
 
-void AppKitDriver::wait(double seconds) {
-  PacedClock::Going going(clock_, seconds);
-  toolkit_.parts().runLoop.wake();
-  while (!going.isOver() && !thrown_) {
-    const Pool pool;
-    NSEvent* const event =
-        [NSApp nextEventMatchingMask:NSAnyEventMask
-                           untilDate:[NSDate dateWithTimeIntervalSinceNow:going.left()]
-                              inMode:NSDefaultRunLoopMode
-                             dequeue:YES];
-    if (event) sending([&] { [NSApp sendEvent:event]; });
-  }
-  if (thrown_) return;
-  toolkit_.parts().runLoop.wake();
-  going.finish();
-}
-
-// Processes AppKit's events between two firings, as happens when real time passes.
-void AppKitDriver::jump(double seconds) {
-  const double end = clock_.now() + seconds;
-  double next = 0;
-  do {
-    const auto due =
-        toolkit_.parts().runLoop.isInDefaultMode() ? toolkit_.parts().runLoop.nextDue() : end;
-    next = std::min(due.value_or(end), end);
-    clock_.reach(next);
-    toolkit_.parts().runLoop.wake();
-  } while (next < end && !thrown_);
+// AppKit's queue does not say when a timer has fired, so whoever waits for one must look again
+// soon.
+void AppKitDriver::awaitEvents(double seconds) {
+  constexpr double longestWait = 0.05;
+  const Pool pool;
+  NSDate* const end = [NSDate dateWithTimeIntervalSinceNow:std::min(seconds, longestWait)];
+  NSEvent* const event = [NSApp nextEventMatchingMask:NSAnyEventMask
+                                            untilDate:end
+                                               inMode:NSDefaultRunLoopMode
+                                              dequeue:YES];
+  if (event) sending([&] { [NSApp sendEvent:event]; });
 }
 
 // Processes waiting events, and draws what has changed.
@@ -330,10 +285,6 @@ void AppKitDriver::settle() {
     }
     [[NSApp windows] makeObjectsPerformSelector:@selector(displayIfNeeded)];
   });
-}
-
-void AppKitDriver::raiseWhatWasThrown() {
-  if (thrown_) std::rethrow_exception(std::exchange(thrown_, nullptr));
 }
 
 ViewPicture AppKitDriver::look(const Ref<View>& view) {
@@ -389,10 +340,6 @@ WindowPicture AppKitDriver::look(const Ref<Window>& window) {
 AppKitDriver::~AppKitDriver() {
   const Pool pool;
   settle();
-}
-
-void AppKitDriver::setLogSink(std::function<void(std::string_view)> sink) {
-  toolkit_.log().setSink(sink ? std::move(sink) : [](std::string_view) {});
 }
 
 std::unique_ptr<Driver> makeAppkitDriver() {

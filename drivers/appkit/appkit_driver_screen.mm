@@ -1,8 +1,5 @@
 // SPDX-License-Identifier: MIT
-// The driver's work with a real screen: hands the windows to the person in front of it, and takes
-// pictures of them.
-
-#include <limits>
+// Pictures of the windows.
 
 #import "drivers/appkit/appkit_driver.hpp"
 #import "toolkit/appkit/parts.hpp"
@@ -56,31 +53,6 @@ NSBitmapImageRep* pictureOf(const AppKitWindow& window) {
 }
 
 }  // namespace
-
-void AppKitDriver::handOver(const std::function<void(const Ref<View>&)>& willAct,
-                            const std::function<bool()>& goesOn) {
-  const auto desk = toolkit_.application().desk();
-  desk->willAct = [&](const Ref<View>& view) {
-    clock_.reach(clock_.horizon());  // timers that the action schedules start at this moment
-    willAct(view);
-  };
-  const struct Quiet {
-    Desk& desk;
-    ~Quiet() { desk.willAct = nullptr; }
-  } atTheEnd{*desk};
-
-  const PacedClock::Going going(clock_, std::numeric_limits<double>::max());
-  toolkit_.parts().runLoop.wake();
-  while (goesOn()) {
-    const Pool pool;
-    NSEvent* const event = [NSApp nextEventMatchingMask:NSAnyEventMask
-                                              untilDate:[NSDate dateWithTimeIntervalSinceNow:0.05]
-                                                 inMode:NSDefaultRunLoopMode
-                                                dequeue:YES];
-    if (event) sending([&] { [NSApp sendEvent:event]; });
-    raiseWhatWasThrown();
-  }
-}
 
 bool AppKitDriver::savePicture(const Ref<Window>& window, const std::string& path) {
   const Pool pool;

@@ -106,14 +106,6 @@ void MemoryDriver::setFrame(const Ref<View>& view, const Rect& frame) {
   if (const auto node = ViewNode::of(view)) node->setFrame(frame);
 }
 
-void MemoryDriver::setCaption(const Ref<View>& view, std::string_view text) {
-  asTextField(view)->setStringValue(text);
-  asButton(view)->setTitle(text);
-  if (const auto imageView = asImageView(view)) {
-    imageView->setImage(toolkit_.images().imageNamed(text));
-  }
-}
-
 void MemoryDriver::setResourcePath(std::string_view path) {
   toolkit_.files().setResourcePath(path);
 }

@@ -25,7 +25,6 @@ class MemoryDriver final : public Driver {
   Ref<View> makeView(ViewKind kind, Tag tag, const Rect& frame, const Ref<View>& parent) override;
   void removeFromSuperview(const Ref<View>& view) override;
   void setFrame(const Ref<View>& view, const Rect& frame) override;
-  void setCaption(const Ref<View>& view, std::string_view text) override;
   void setResourcePath(std::string_view path) override;
   std::string_view className(ViewKind kind) const override;
 

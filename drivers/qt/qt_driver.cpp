@@ -103,10 +103,6 @@ ViewKind kindOf(View& view, const QWidget& widget) {
   return qobject_cast<const QGroupBox*>(&widget) ? ViewKind::box : ViewKind::plain;
 }
 
-std::optional<std::string> nameOf(const Ref<Image>& image) {
-  return image ? std::optional(image->name()) : std::nullopt;
-}
-
 // Shows windows on a display if one can be reached; otherwise they are drawn off the screen. Tries
 // X11 before Wayland, where a sheet cannot be positioned.
 void chooseDisplay() {
@@ -182,14 +178,11 @@ void clickByKeyboard(QWidget& widget) {
 
 }  // namespace
 
-QtDriver::QtDriver() {
-  setLogSink({});
-  toolkit_.calls().setHandler([this](const std::exception_ptr& thrown) {
-    if (!thrown_) thrown_ = thrown;
-  });
-}
+template class PacedDriver<QtToolkit>;
 
-QtDriver::Sweep::~Sweep() { QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete); }
+DeletionSweep::~DeletionSweep() {
+  QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+}
 
 Ref<Window> QtDriver::makeWindow(const Rect& content) {
   auto window = QtWindow::make(content, StyleMask::titledAndClosable, toolkit_.application().desk(),
@@ -216,20 +209,10 @@ void QtDriver::setFrame(const Ref<View>& view, const Rect& frame) {
   if (const auto node = WidgetNode::of(view)) node->place(frame);
 }
 
-void QtDriver::setCaption(const Ref<View>& view, std::string_view text) {
-  asTextField(view)->setStringValue(text);
-  asButton(view)->setTitle(text);
-  if (const auto imageView = asImageView(view)) {
-    imageView->setImage(toolkit_.images().imageNamed(text));
-  }
-}
-
 void QtDriver::setWindowTitle(const Ref<Window>& window, std::string_view title) {
   const auto shown = QtWindow::of(window);
   if (shown && shown->widget()) shown->widget()->setWindowTitle(qString(title));
 }
-
-void QtDriver::setResourcePath(std::string_view path) { toolkit_.files().setResourcePath(path); }
 
 std::string_view QtDriver::className(ViewKind kind) const { return rowOf(qtKinds, kind).className; }
 
@@ -270,44 +253,15 @@ void QtDriver::letGo() {
   raiseWhatWasThrown();
 }
 
-void QtDriver::advance(double seconds) {
-  if (realTime_) {
-    wait(std::max(seconds, 0.0));
-  } else {
-    jump(std::max(seconds, 0.0));
-  }
-  settle();
-  raiseWhatWasThrown();
-}
-
-void QtDriver::wait(double seconds) {
-  PacedClock::Going going(clock_, seconds);
-  toolkit_.parts().runLoop.wake();
-  while (!going.isOver() && !thrown_) {
-    // The loop waits for events; this timer is the one that ends the wait.
-    QTimer end;
-    end.setTimerType(Qt::PreciseTimer);
-    end.callOnTimeout([] {});
-    end.start(std::chrono::milliseconds(std::lround(std::ceil(going.left() * 1000))));
-    QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
-  }
-  if (thrown_) return;
-  toolkit_.parts().runLoop.wake();
-  going.finish();
-}
-
-// Processes Qt's events between two firings, as happens when real time passes.
-void QtDriver::jump(double seconds) {
-  const double end = clock_.now() + seconds;
-  double next = 0;
-  do {
-    const auto due =
-        toolkit_.parts().runLoop.isInDefaultMode() ? toolkit_.parts().runLoop.nextDue() : end;
-    next = std::min(due.value_or(end), end);
-    clock_.reach(next);
-    toolkit_.parts().runLoop.wake();
-    settle();
-  } while (next < end && !thrown_);
+void QtDriver::awaitEvents(double seconds) {
+  constexpr double longestWait = 3600;
+  // The loop waits for events; this timer is the one that ends the wait.
+  QTimer end;
+  end.setTimerType(Qt::PreciseTimer);
+  end.callOnTimeout([] {});
+  end.start(
+      std::chrono::milliseconds(std::lround(std::ceil(std::min(seconds, longestWait) * 1000))));
+  QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
 }
 
 // Processes posted events, pending repaints and pending deletions.
@@ -323,10 +277,6 @@ void QtDriver::settleWithoutFiring() {
     settle();
   }
   toolkit_.parts().runLoop.setAlarm();
-}
-
-void QtDriver::raiseWhatWasThrown() {
-  if (thrown_) std::rethrow_exception(std::exchange(thrown_, nullptr));
 }
 
 ViewPicture QtDriver::look(const Ref<View>& view) {
@@ -382,10 +332,6 @@ WindowPicture QtDriver::look(const Ref<Window>& window) {
   picture.sheetOf = shown->sheetParent();
   picture.sheetEnds = shown->sheetEnds();
   return picture;
-}
-
-void QtDriver::setLogSink(std::function<void(std::string_view)> sink) {
-  toolkit_.log().setSink(sink ? std::move(sink) : [](std::string_view) {});
 }
 
 std::unique_ptr<Driver> makeQtDriver() {

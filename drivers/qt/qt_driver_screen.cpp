@@ -1,12 +1,9 @@
 // SPDX-License-Identifier: MIT
-// The driver's work with a real screen: hands the windows to the person in front of it, and takes
-// pictures of them.
+// The driver's work with a real screen: who is in front of it, and pictures of the windows.
 
 #include <QApplication>
 #include <QPainter>
 #include <QPixmap>
-#include <QTimer>
-#include <limits>
 
 #include "drivers/qt/qt_driver.hpp"
 #include "toolkit/qt/parts.hpp"
@@ -42,26 +39,6 @@ QPixmap pictureOf(const QtWindow& window) {
 bool QtDriver::hasPerson() const {
   const QString platform = QGuiApplication::platformName();
   return platform != "offscreen" && platform != "minimal" && platform != "vnc";
-}
-
-void QtDriver::handOver(const std::function<void(const Ref<View>&)>& willAct,
-                        const std::function<bool()>& goesOn) {
-  const auto desk = toolkit_.application().desk();
-  desk->willAct = [&](const Ref<View>& view) {
-    clock_.reach(clock_.horizon());  // timers that the action schedules start at this moment
-    willAct(view);
-  };
-  const struct Quiet {
-    Desk& desk;
-    ~Quiet() { desk.willAct = nullptr; }
-  } atTheEnd{*desk};
-
-  const PacedClock::Going going(clock_, std::numeric_limits<double>::max());
-  toolkit_.parts().runLoop.wake();
-  while (goesOn()) {
-    QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
-    raiseWhatWasThrown();
-  }
 }
 
 bool QtDriver::savePicture(const Ref<Window>& window, const std::string& path) {

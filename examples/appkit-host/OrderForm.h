@@ -27,5 +27,7 @@
 
 /// Calculates the price from the controls.
 - (IBAction)showPrice:(id)sender;
+/// Empties the form.
+- (IBAction)clearAll:(id)sender;
 
 @end

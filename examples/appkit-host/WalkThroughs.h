@@ -16,5 +16,7 @@
 - (IBAction)showAround:(id)sender;
 /// Plays one in a sheet over the form.
 - (IBAction)showTips:(id)sender;
+/// One walk-through at a time.
+- (BOOL)validateMenuItem:(id)item;
 
 @end

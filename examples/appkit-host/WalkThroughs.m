@@ -96,7 +96,6 @@ static NSWindow* tipsPanel(void) {
   [sheet orderOut:nil];
 }
 
-/// One walk-through at a time.
 - (BOOL)validateMenuItem:(id)item {
   return engine == nil || [engine terminating];
 }

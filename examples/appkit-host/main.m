@@ -22,7 +22,7 @@ static NSMenu* mainMenu(WalkThroughs* walkThroughs) {
   return bar;
 }
 
-int main(int argc, const char** argv) {
+int main(void) {
   NSAutoreleasePool* pool = [[NSAutoreleasePool alloc] init];
   [NSApplication sharedApplication];
   OrderForm* form = [[OrderForm alloc] init];

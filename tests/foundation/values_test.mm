@@ -182,14 +182,14 @@ TEST_F(FoundationValues, RaiseWhatFoundationRaises) {
   NSMutableArray* const array = viewOfArray(Array::make());
   NSMutableArray* const fixed = viewOfArray(Array::make({}, Mutability::immutable));
   NSMutableDictionary* const dictionary = viewOfDictionary(Dictionary::make());
+  id none = nil;
   const Case cases[] = {
       {"NSRangeException", [&] { [array objectAtIndex:0]; }},
       {"NSRangeException", [&] { [array removeLastObject]; }},
       {"NSRangeException", [&] { [array insertObject:@"a" atIndex:1]; }},
-      {"NSInvalidArgumentException", [&] { [array addObject:static_cast<id>(nil)]; }},
+      {"NSInvalidArgumentException", [&] { [array addObject:none]; }},
       {"NSInvalidArgumentException", [&] { [fixed addObject:@"a"]; }},
-      {"NSInvalidArgumentException",
-       [&] { [dictionary setObject:static_cast<id>(nil) forKey:@"1"]; }},
+      {"NSInvalidArgumentException", [&] { [dictionary setObject:none forKey:@"1"]; }},
       {"NSInvalidArgumentException",
        [&] { [dictionary setObject:@"a" forKey:static_cast<id>([NSNull null])]; }},
   };
@@ -220,7 +220,8 @@ TEST_F(FoundationValues, FindKeysThatAreNotStrings) {
 TEST_F(FoundationValues, RefuseWhatNoScriptHolds) {
   EXPECT_THROW(valueOf([NSObject class]), InvalidArgumentException);
   NSMutableArray* const endless = [NSMutableArray array];
-  [endless addObject:endless];
+  const id itself = endless;
+  [endless addObject:itself];
   EXPECT_THROW(valueOf(endless), InvalidArgumentException);
   [endless removeAllObjects];
 }

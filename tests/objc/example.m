@@ -17,9 +17,10 @@ static void show(NSWindow* window, NSString* step) {
   NSBitmapImageRep* picture =
       [[[NSBitmapImageRep alloc] initWithFocusedViewRect:[content bounds]] autorelease];
   [content unlockFocus];
-  NSString* file =
-      [pictures stringByAppendingPathComponent:[step stringByAppendingString:@".tiff"]];
-  CHECK([[picture TIFFRepresentation] writeToFile:file atomically:NO]);
+  NSString* file = [pictures stringByAppendingPathComponent:[step stringByAppendingString:@".png"]];
+  NSData* png = [picture representationUsingType:NSPNGFileType
+                                      properties:[NSDictionary dictionary]];
+  CHECK([png writeToFile:file atomically:NO]);
 }
 
 static void press(NSWindow* window, NSInteger tag) { [controlIn(window, tag) performClick:nil]; }

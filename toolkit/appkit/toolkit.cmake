@@ -26,6 +26,8 @@ function(qz_find_appkit found)
     target_link_libraries(qz_foundation_platform INTERFACE "-framework Foundation")
     target_link_libraries(qz_appkit_platform INTERFACE "-framework AppKit" "-framework QuartzCore")
     set(QZ_PKGCONFIG_LIBS_appkit "-framework AppKit -framework QuartzCore" PARENT_SCOPE)
+    # GNUstep has only the older names of constants, which macOS keeps but has deprecated.
+    target_compile_options(qz_private INTERFACE $<$<COMPILE_LANGUAGE:OBJC,OBJCXX>:-Wno-deprecated-declarations>)
   else()
     find_path(QZ_GNUSTEP_HEADERS AppKit/AppKit.h PATH_SUFFIXES GNUstep)
     find_library(QZ_GNUSTEP_BASE gnustep-base)

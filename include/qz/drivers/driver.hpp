@@ -149,6 +149,14 @@ class QZ_API Driver : public HostActions, public UserActions, public Display, pu
   virtual std::string_view name() const = 0;
   /// Returns the driver's own toolkit, for engines.
   virtual Toolkit& toolkit() = 0;
+
+  void setCaption(const Ref<View>& view, std::string_view text) override {
+    asTextField(view)->setStringValue(text);
+    asButton(view)->setTitle(text);
+    if (const auto imageView = asImageView(view)) {
+      imageView->setImage(toolkit().images().imageNamed(text));
+    }
+  }
 };
 
 }  // namespace qz::drivers
