@@ -6,16 +6,18 @@
 #include <QWidget>
 #include <exception>
 #include <functional>
+#include <memory>
 
 #include "drivers/paced_clock.hpp"
 #include "qz/drivers/driver.hpp"
+#include "qz/drivers/measuring.hpp"
 #include "qz/toolkit/qt/qt_toolkit.hpp"
 
 namespace qz::drivers {
 
 using namespace toolkit::qt;
 
-class QtDriver final : public Driver {
+class QtDriver final : public Driver, public Measuring {
  public:
   /// Makes the application object if there is none.
   QtDriver();
@@ -47,6 +49,9 @@ class QtDriver final : public Driver {
 
   bool draws() const override { return true; }
   bool savePicture(const Ref<Window>& window, const std::string& path) override;
+  void workOffScreen() override;
+  MissingRoom missingRoom(const Ref<View>& view) override;
+
   ViewPicture look(const Ref<View>& view) override;
   WindowPicture look(const Ref<Window>& window) override;
   void setLogSink(std::function<void(std::string_view)> sink) override;
@@ -64,7 +69,8 @@ class QtDriver final : public Driver {
   };
 
   bool realTime_ = false;
-  QPointer<QWidget> held_;  // the mouse button is down on it; null while it is up
+  std::unique_ptr<QObject> offScreen_;  // null while windows are shown
+  QPointer<QWidget> held_;              // the mouse button is down on it; null while it is up
   PacedClock clock_;
   const Sweep atTheEnd_{};
   std::exception_ptr thrown_;  // by the last click or advance

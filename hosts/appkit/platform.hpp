@@ -28,8 +28,8 @@ class Platform {
   /// Makes `object`, which is not retained, the target and delegate that controls and windows have
   /// for `engine`.
   void present(const std::shared_ptr<toolkit::Responder>& engine, id object);
-  /// Undoes `present`: removes `object` from the targets and the delegate of `window`, if there is a
-  /// window.
+  /// Undoes `present`: removes `object` from the targets and the delegate of `window`, if there is
+  /// a window.
   void withdraw(const std::shared_ptr<toolkit::Responder>& engine, id object,
                 const toolkit::Ref<toolkit::Window>& window);
 

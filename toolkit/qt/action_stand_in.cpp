@@ -110,7 +110,8 @@ bool ActionStandIn::eventFilter(QObject*, QEvent* event) {
   return isPress;
 }
 
-// A checkable copy has changed its state, but the receiver of the press decides whether the action changes, too.
+// A checkable copy has changed its state, but the receiver of the press decides whether the action
+// changes, too.
 void ActionStandIn::triggered(bool on) {
   if (!action_) return;
   follow();

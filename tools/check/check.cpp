@@ -4,6 +4,7 @@
 #include <algorithm>
 #include <filesystem>
 #include <set>
+#include <tuple>
 
 #include "engine/tag_key.hpp"
 #include "tools/check/conclusions.hpp"
@@ -122,12 +123,15 @@ void append(std::vector<Finding>& findings, std::vector<Finding> more) {
 /// Sorts by place in the script; what belongs to no place comes last.
 void sortByPlace(std::vector<Finding>& findings, const InputFile& file) {
   const auto placeOf = [&](const Finding& finding) {
+    using Place = std::tuple<bool, std::string_view, std::size_t, std::size_t>;
     const auto position = finding.where ? file.positionOf(finding.where) : std::nullopt;
-    if (!position) return std::pair<std::size_t, std::size_t>(-1, -1);
+    if (!position) return Place(true, {}, 0, 0);
+    const std::string& path = file.pathOf(finding.where);
+    const std::string_view included = path == file.path() ? std::string_view() : path;
     if (const auto* text = std::get_if<toolkit::TextPosition>(&*position)) {
-      return std::pair(text->line, text->column);
+      return Place(false, included, text->line, text->column);
     }
-    return std::pair(std::get<toolkit::BytePosition>(*position).offset, std::size_t{0});
+    return Place(false, included, std::get<toolkit::BytePosition>(*position).offset, 0);
   };
   std::stable_sort(findings.begin(), findings.end(), [&](const Finding& a, const Finding& b) {
     const auto one = placeOf(a);

@@ -53,8 +53,9 @@ ScriptFile openScript(const std::string& path, const std::string& start,
   if (first != 0) starts.insert(starts.begin(), first);
   Mistakes mistakes;
   from.built = build(from.source.tour, starts, mistakes);
-  mistakes.throwIfAny(path, from.source.text);
-  InputFile file(path, expectedFile, from.built.script, from.built.offsets, from.source.text);
+  mistakes.throwIfAny(from.source.files);
+  InputFile file(path, expectedFile, from.built.script,
+                 from.source.files.written(from.built.offsets));
   return {std::move(file), std::move(from)};
 }
 
