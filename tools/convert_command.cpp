@@ -78,7 +78,7 @@ void setFormat(ConvertOptions& options, const std::string& name) {
 
 void describeConvert(Command& command) {
   const auto options = std::make_shared<ConvertOptions>();
-  command.argument("IN", options->in, "The property list, of any format").file();
+  command.argument("IN", options->in, "The property list, of any format; or a source").file();
   command.argument("OUT", options->out, "The file to write").path().file();
   command
       .taken(

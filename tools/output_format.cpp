@@ -11,9 +11,8 @@ std::vector<toolkit::FormatRow> writableFormats() {
   for (const toolkit::FormatRow& row : toolkit::formats()) {
     if (row.write) rows.push_back(row);
   }
-  std::stable_partition(rows.begin(), rows.end(), [](const toolkit::FormatRow& row) {
-    return row.format == standardFormat;
-  });
+  std::stable_partition(rows.begin(), rows.end(),
+                        [](const toolkit::FormatRow& row) { return row.format == standardFormat; });
   return rows;
 }
 

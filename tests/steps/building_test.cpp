@@ -124,9 +124,9 @@ TEST(Building, AMapSaysWhereListsAndCommandsComeFrom) {
 TEST(Building, CanStartAtAnyStep) {
   const SourceFolder folder;
   folder.writeSource("steps: {a: {next: {press: b}}, b: {next: {press: end}}}");
-  const auto script = openScript("tour.yaml", "b");
+  const auto script = openScript("tour.yaml", {"b"});
   EXPECT_EQ(script.names().stepOf(script.from->built.startKeys.front()), "b");
-  EXPECT_THROW(openScript("tour.yaml", "c"), Failure);
+  EXPECT_THROW(openScript("tour.yaml", {"c"}), Failure);
 }
 
 }  // namespace

@@ -12,6 +12,7 @@
 #include "tools/check/reading.hpp"
 #include "tools/check/replay.hpp"
 #include "tools/check/self_check.hpp"
+#include "tools/check/source_words.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
@@ -60,7 +61,7 @@ std::vector<Allowance> allowancesFor(const InputFile& file, const CheckOptions& 
 std::vector<Expectation> expectationsFor(const InputFile& file, const Script& script,
                                          const CheckOptions& options) {
   const auto path = options.expectations ? options.expectations : pathBeside(file, "check.expect");
-  return path ? readExpectations(*path, script) : std::vector<Expectation>();
+  return path ? readExpectations(*path, script, options.stage.names) : std::vector<Expectation>();
 }
 
 /// Throws a Failure for a tag that no control ever has: such an expectation says nothing.
@@ -69,7 +70,8 @@ void requireTags(const std::vector<Expectation>& expectations, const Setting& se
   const auto given = setting.script.newTags();
   tags.insert(given.begin(), given.end());
   const auto require = [&](const Condition& condition, const Expectation& expectation) {
-    if (!isAboutControl(condition) || tags.contains(condition.tag)) return;
+    const bool isTag = isAboutControl(condition) && condition.name.empty();
+    if (!isTag || tags.contains(condition.tag)) return;
     throw Failure(ExitStatus::badInput, expectation.place.text(condition.column) +
                                             ": no control ever has the tag " +
                                             std::to_string(condition.tag));
@@ -86,7 +88,9 @@ void watchFor(const std::vector<Expectation>& expectations, Setting& setting) {
   const auto watch = [&](const Condition& condition) {
     if (condition.kind != Condition::Kind::listRan) return;
     setting.watchedLists.resize(setting.script.lists().size());
-    setting.watchedLists[*setting.script.listUnder(condition.word)] = true;
+    for (const std::string& key : condition.keys) {
+      setting.watchedLists[*setting.script.listUnder(key)] = true;
+    }
   };
   for (const Expectation& expectation : expectations) {
     watch(expectation.condition);
@@ -190,6 +194,7 @@ Verdict checkScript(const InputFile& file, const CheckOptions& options,
     append(findings, concludeFromLooks(exploration, {options.wordsPerMinute, options.threads}));
   }
   append(findings, checkExpectations(exploration, expectations, options.threads, verdict.expected));
+  if (!verdict.names.isEmpty()) speakOfSteps(findings);
   // A code that was not looked for, or not everywhere, says nothing about its allowances.
   const bool canTell = verdict.explored.complete && !options.standIn;
   auto unneeded = canTell ? unneededAllowances(findings, allowances) : std::vector<Finding>();

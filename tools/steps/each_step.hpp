@@ -13,8 +13,8 @@ namespace qz::tools::steps {
 /// none can work here.
 std::unique_ptr<drivers::Driver> findDriver(const std::function<bool(drivers::Driver&)>& suits);
 
-/// Begins the walk-through at each step in turn, and calls `see` with the step and the stage. Throws
-/// a Failure if the window that the source names cannot be made.
+/// Begins the walk-through at each step in turn, and calls `see` with the step and the stage.
+/// Throws a Failure if the window that the source names cannot be made.
 void showEachStep(const Source& source, drivers::Driver& driver,
                   const std::function<void(StepIndex, walkthrough::Stage&)>& see);
 

@@ -9,6 +9,7 @@
 #include "qz/drivers/measuring.hpp"
 #include "tools/steps/each_step.hpp"
 #include "tools/support/failure.hpp"
+#include "tools/support/file_names.hpp"
 
 namespace qz::tools::steps {
 namespace {
@@ -17,16 +18,11 @@ namespace {
   throw Failure(ExitStatus::badInput, "--screenshots: " + message);
 }
 
-/// Returns a name such as "03-where-to.png", which every file system takes.
+/// Returns a name such as "03-where-to.png".
 std::string fileNameOf(StepIndex number, const std::string& step) {
   std::array<char, 32> start{};
   std::snprintf(start.data(), start.size(), "%02zu-", number + 1);
-  std::string name = start.data();
-  for (const char c : step) {
-    const bool isPlain = (c >= 'a' && c <= 'z') || (c >= 'A' && c <= 'Z') || (c >= '0' && c <= '9');
-    if (isPlain || !name.ends_with('-')) name += isPlain ? c : '-';
-  }
-  return name + ".png";
+  return start.data() + fileWord(step) + ".png";
 }
 
 }  // namespace

@@ -58,9 +58,8 @@ class RoomCheck {
     const ControlWords& own = ownWords(step, control);
     const Place place = own.content ? own.place : commonWords(control).place;
     messages_.push_back(source_.files.at(place).text() + ": warning: " + quoteStart(text) + " (" +
-                        source_.tour.steps[step].name + ", " +
-                        source_.tour.controls[control].name + ") does not fit: the control lacks " +
-                        wordsFor(missing));
+                        source_.tour.steps[step].name + ", " + source_.tour.controls[control].name +
+                        ") does not fit: the control lacks " + wordsFor(missing));
   }
 
   const Source& source_;

@@ -68,6 +68,9 @@ class SourceReader {
     if (!part("window") && !part("assets")) {
       mistakes_.add(0, "expected “window”, the file of the host's window, or “assets”");
     }
+    if (part("window") && part("assets")) {
+      mistakes_.add(part("assets")->place, "expected either “window” or “assets”, found both");
+    }
     mistakes_.throwIfAny(source_.files);
     readWindow();
     readControls();

@@ -23,8 +23,7 @@ Translation translationIn(const PoEntry& entry) {
 }
 
 std::string reasonOf(const Translation& translation) {
-  return translation.isOld ? " has changed since it was translated"
-                           : " has no translation";
+  return translation.isOld ? " has changed since it was translated" : " has no translation";
 }
 
 }  // namespace
