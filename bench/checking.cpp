@@ -204,10 +204,12 @@ void showRequirements(const AllCosts& all) {
   bench::printExponent("Time grows with the number of presses", points);
 }
 
-/// The arguments of `check` for each script of the examples, in their directory.
-constexpr const char* examples[] = {"first-steps/script.plist --window first-steps/host.plist",
+/// The arguments of `check` for examples, in their directory.
+constexpr const char* examples[] = {"first-steps/backup.yaml",
+                                    "photo-import/import.yaml",
                                     "built-window/script.plist --assets built-window/assets.plist",
-                                    "embedding/script.plist", "qt-host/tour.plist",
+                                    "embedding/script.plist",
+                                    "qt-host/tour.plist",
                                     "qt-host/tips.plist"};
 
 void measureExamples() {

@@ -57,7 +57,6 @@ class PacedDriver : public Driver {
   }
 
   PacedClock clock_;
-  Platform toolkit_{clock_};
 
  private:
   void wait(double seconds);
@@ -65,6 +64,9 @@ class PacedDriver : public Driver {
 
   bool realTime_ = false;
   std::exception_ptr thrown_;
+
+ protected:
+  Platform toolkit_{clock_};  // the last member: while it ends, its calls may still throw
 };
 
 template <class Platform>

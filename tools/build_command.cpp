@@ -1,30 +1,25 @@
 // SPDX-License-Identifier: MIT
 // The command `build`.
-#include <algorithm>
 #include <filesystem>
 #include <iostream>
-#include <map>
 #include <memory>
 #include <optional>
+#include <set>
 #include <string>
-#include <string_view>
+#include <vector>
 
 #include "qz/property_list/formats.hpp"
-#include "qz/property_list/positions.hpp"
 #include "tools/commands.hpp"
-#include "tools/steps/po.hpp"
+#include "tools/output_format.hpp"
+#include "tools/steps/room.hpp"
 #include "tools/steps/script_file.hpp"
 #include "tools/steps/source_map.hpp"
+#include "tools/steps/translation.hpp"
 #include "tools/support/folder_watch.hpp"
 #include "tools/support/replace_file.hpp"
-#include "tools/support/text_layout.hpp"
-#include "tools/support/whole_file.hpp"
 
 namespace qz::tools {
 namespace {
-
-// No language: shows which texts have no room to grow.
-constexpr std::string_view longLanguage = "x-long";
 
 struct BuildOptions {
   std::string source;
@@ -34,82 +29,76 @@ struct BuildOptions {
   bool watch = false;
 };
 
-toolkit::Format formatFor(const std::string& path) {
-  for (const toolkit::FormatRow& row : toolkit::formats()) {
-    const bool isNamed =
-        std::any_of(row.suffixes.begin(), row.suffixes.end(),
-                    [&](std::string_view suffix) { return path.ends_with(suffix); });
-    if (row.write && isNamed) return row.format;
-  }
-  return toolkit::Format::xml;
-}
-
-/// Returns the translations of the file LANGUAGE.po beside the source.
-steps::Translate translationTo(const std::string& language, const std::string& source) {
-  if (language == longLanguage) return steps::lengthened;
-  const auto path = std::filesystem::path(source).replace_filename(language + ".po").string();
-  const auto text = wholeFile(path);
-  if (!text) {
-    throw Failure(ExitStatus::badInput, path + ": cannot be read; expected the translations to " +
-                                            quote(language) + " beside the source");
-  }
-  std::map<std::string, std::string> known;
-  for (const steps::PoEntry& entry : steps::readPo(*text, path)) {
-    if (!entry.isFuzzy && !entry.translation.empty()) known[entry.text] = entry.translation;
-  }
-  return [known](const std::string& original) -> std::optional<std::string> {
-    const auto found = known.find(original);
-    return found == known.end() ? std::nullopt : std::optional(found->second);
-  };
-}
-
-void sayUntranslated(const steps::Source& source, const steps::Text& text,
-                     const std::string& language) {
-  const steps::TextUse& use = text.uses.front();
-  const auto [line, column] = toolkit::TextCursor(source.text).at(use.place);
-  std::cerr << source.path << ":" << line << ":" << column << ": warning: no text in "
-            << quote(language) << " for " << quoteStart(text.text) << " (" << use.step << ", "
-            << use.control << "); it stays as it is\n";
-}
-
 std::string outputOf(const BuildOptions& options) {
   const std::string ending = options.language ? "_" + *options.language + ".plist" : ".plist";
   auto standard = std::filesystem::path(options.source).replace_extension().concat(ending);
   return options.output.value_or(standard.string());
 }
 
-void buildSource(const BuildOptions& options) {
+steps::Translate translateOf(const BuildOptions& options) {
+  return options.language ? steps::translationTo(*options.language, options.source)
+                          : steps::Translate();
+}
+
+void say(const std::vector<std::string>& messages) {
+  for (const std::string& message : messages) std::cerr << message << '\n';
+}
+
+/// Says which texts are not in the language, and which have no room in it.
+void judgeTexts(const steps::Source& source, const std::string& language) {
+  say(steps::untranslated(source, language));
+  const auto without = steps::textsWithoutRoom(source);
+  say(
+      without.value_or(std::vector<std::string>{
+          source.path + ": note: nobody knows whether the texts fit, because this build has no "
+                        "toolkit that measures them, such as Qt"}));
+}
+
+/// Builds the script of the options, writes it, and returns it.
+steps::ScriptFile buildSource(const BuildOptions& options) {
   if (!steps::isSourcePath(options.source)) {
     throw Failure(ExitStatus::badInput, options.source +
                                             ": expected a walk-through in steps, a file "
                                             "whose name ends with .yaml or .yml");
   }
-  const auto translate =
-      options.language ? translationTo(*options.language, options.source) : steps::Translate();
-  const steps::ScriptFile script = steps::openScript(options.source, {}, translate);
+  steps::ScriptFile script = steps::openScript(options.source, {}, translateOf(options));
   const std::string output = outputOf(options);
-  const auto& format = toolkit::formatRow(formatFor(output));
+  const auto& format = toolkit::formatRow(formatBySuffix(output));
   replaceFile(output, format.write(script.file.dictionary()));
   if (options.map) replaceFile(*options.map, steps::sourceMap(script));
-  for (const steps::Text& text : script.from->source.texts) {
-    if (!text.isTranslated) sayUntranslated(script.from->source, text, *options.language);
-  }
+  if (options.language) judgeTexts(script.from->source, *options.language);
+  return script;
 }
 
-/// Builds again whenever a file beside the source has changed, until the user interrupts. Mistakes
-/// are said, and mended ones are built.
+std::string folderOf(const std::string& path) {
+  return std::filesystem::absolute(path).parent_path().string();
+}
+
+/// Returns the folders of the files of which a script was built.
+std::set<std::string> foldersOf(const steps::Source& source) {
+  std::set<std::string> folders;
+  for (const std::string& path : source.files.paths()) folders.insert(folderOf(path));
+  folders.insert(folderOf(source.stage.window ? *source.stage.window : *source.stage.assets));
+  return folders;
+}
+
+/// Builds again whenever a file has changed beside the source or another file that it is built of,
+/// until the user interrupts. Mistakes are said, and mended ones are built.
 void watch(const BuildOptions& options) {
-  const auto folder = std::filesystem::absolute(options.source).parent_path().string();
-  watchFolder(folder, outputOf(options), [&] {
+  std::set<std::string> folders = {folderOf(options.source)};
+  const std::set<std::string> outputs = {outputOf(options),
+                                         options.map.value_or(outputOf(options))};
+  watchFolders(folders, outputs, [&] {
     try {
-      buildSource(options);
+      folders.merge(foldersOf(buildSource(options).from->source));
       std::cout << outputOf(options) << ": written" << std::endl;
     } catch (const steps::SourceRefused& refused) {
-      for (const std::string& message : refused.messages()) std::cerr << message << '\n';
+      say(refused.messages());
+      for (const std::string& path : refused.paths()) folders.insert(folderOf(path));
     } catch (const Failure& failure) {
       std::cerr << failure.what() << '\n';
     }
-    return true;
+    return folders;
   });
 }
 
@@ -134,7 +123,8 @@ void describeBuild(Command& command) {
       .path()
       .file();
   command.flag("--watch", options->watch,
-               "Build again whenever a file beside the source has changed, until interrupted");
+               "Build again whenever a file that the script depends on has changed, until "
+               "interrupted");
   command.action([options] {
     if (options->watch) {
       watch(*options);

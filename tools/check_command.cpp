@@ -51,6 +51,7 @@ struct CommandOptions {
 /// A script that is checked, and what came of it.
 struct Job {
   std::optional<InputFile> file;
+  CheckOptions options;  // with the window that a source names
   check::Verdict verdict;
   std::optional<Failure> failure;  // why it could not be checked
 };
@@ -112,17 +113,34 @@ int statusOf(const std::vector<Job>& jobs, Severity failOn) {
   return complete ? static_cast<int>(ExitStatus::fine) : notComplete;
 }
 
-void checkOne(const std::string& path, const CheckOptions& options, ProgressLine& line, Job& job) {
+/// Reads the script and its window. On the main thread, because Qt reads forms only there.
+void openJob(const std::string& path, const CheckOptions& options, Job& job) {
+  try {
+    const steps::ScriptFile script = steps::openScript(path, options.startKeys);
+    job.file.emplace(script.file);
+    job.options = options;
+    auto& stage = job.options.stage = script.stage(options.stage);
+    if (script.from) {
+      job.options.standIn = false;
+      auto& keys = job.options.startKeys = script.from->built.startKeys;
+      keys.resize(std::max<std::size_t>(options.startKeys.size(), 1));
+    }
+    if (!stage.window) return;
+    stage.host =
+        std::make_shared<walkthrough::HostWindow>(walkthrough::readHostWindow(*stage.window));
+  } catch (const Failure& failure) {
+    job.failure = failure;
+  }
+}
+
+void checkOne(const std::string& path, unsigned threads, ProgressLine& line, Job& job) {
+  if (job.failure) return;
   check::ExplorationHooks hooks;
   hooks.report = [&](const check::Progress& progress) { line.show(path, progress); };
   hooks.isCancelled = Interruption::isWanted;
+  job.options.threads = threads;
   try {
-    const steps::ScriptFile script = steps::openScript(path);
-    job.file.emplace(script.file);
-    CheckOptions own = options;
-    own.stage = script.stage(own.stage);
-    if (script.from) own.standIn = false;
-    job.verdict = checkScript(*job.file, own, hooks);
+    job.verdict = checkScript(*job.file, job.options, hooks);
   } catch (const Failure& failure) {
     job.failure = failure;
   }
@@ -135,12 +153,12 @@ std::vector<Job> checkAll(const CommandOptions& options) {
   std::vector<Job> jobs(options.scripts.size());
   const auto workers =
       static_cast<unsigned>(std::min<std::size_t>(options.check.threads, jobs.size()));
-  CheckOptions each = options.check;
-  each.threads = std::max(1U, options.check.threads / workers);
+  const unsigned threads = std::max(1U, options.check.threads / workers);
+  for (std::size_t i = 0; i < jobs.size(); ++i) openJob(options.scripts[i], options.check, jobs[i]);
   std::atomic<std::size_t> next = 0;
   const auto work = [&] {
     for (std::size_t i = next++; i < jobs.size(); i = next++) {
-      checkOne(options.scripts[i], each, line, jobs[i]);
+      checkOne(options.scripts[i], threads, line, jobs[i]);
     }
   };
   std::vector<std::jthread> others;
@@ -181,10 +199,9 @@ void applyBaseline(check::Baseline& baseline, bool isUpdated, std::vector<Job>& 
   if (isUpdated) baseline.write();
 }
 
-void writeWitnesses(check::WitnessWriter& writer, const CheckOptions& options,
-                    const std::vector<Job>& jobs) {
+void writeWitnesses(check::WitnessWriter& writer, const std::vector<Job>& jobs) {
   for (const Job& job : jobs) {
-    if (!job.failure) writer.write(job.verdict, *job.file, options);
+    if (!job.failure) writer.write(job.verdict, *job.file, job.options);
   }
 }
 
@@ -242,7 +259,7 @@ int runCheck(const CommandOptions& options) {
   auto jobs = checkAll(options);
   mergeAllowances(jobs);
   if (baseline) applyBaseline(*baseline, options.updateBaseline, jobs);
-  if (witnesses) writeWitnesses(*witnesses, options.check, jobs);
+  if (witnesses) writeWitnesses(*witnesses, jobs);
   const auto run = reportOf(options, jobs);
   format.write(run, outputShowsColor(), std::cout);
   std::cout.flush();
@@ -269,7 +286,8 @@ void addExploringOptions(Command& command, CheckOptions& options) {
   command
       .repeated(
           "--start", [&](const std::string& key) { options.startKeys.push_back(key); },
-          "A list with which the walk-through may start (default: the smallest tag)")
+          "A list, or a step of a source, with which the walk-through may start (default: the "
+          "smallest tag, or the first step)")
       .valueName("KEY")
       .scriptKey();
   command
@@ -372,7 +390,11 @@ void addAuthorsOptions(Command& command, CommandOptions& options) {
 
 void describeCheck(Command& command) {
   const auto options = std::make_shared<CommandOptions>();
-  command.arguments("SCRIPT", options->scripts, "The scripts, property lists").file().notRequired();
+  command
+      .arguments("SCRIPT", options->scripts,
+                 "The scripts, property lists; or their sources, YAML files")
+      .file()
+      .notRequired();
   addWindowOptions(command, options->check);
   addExploringOptions(command, options->check);
   addAnswerOptions(command, *options);

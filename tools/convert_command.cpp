@@ -1,7 +1,5 @@
 // SPDX-License-Identifier: MIT
 // The command `convert`.
-#include <algorithm>
-#include <filesystem>
 #include <memory>
 #include <optional>
 #include <string>
@@ -11,6 +9,7 @@
 #include "qz/property_list/formats.hpp"
 #include "qz/toolkit/exception.hpp"
 #include "tools/commands.hpp"
+#include "tools/output_format.hpp"
 #include "tools/shared_values.hpp"
 #include "tools/steps/script_file.hpp"
 #include "tools/support/failure.hpp"
@@ -25,25 +24,11 @@ namespace {
 using toolkit::Format;
 using toolkit::FormatRow;
 
-// For an output file whose suffix says nothing.
-constexpr Format standardFormat = Format::xml;
-
 struct ConvertOptions {
   std::string in;
   std::string out;
   std::optional<Format> format;
 };
-
-/// Returns the formats that can be written, the standard one first.
-std::vector<FormatRow> writableFormats() {
-  std::vector<FormatRow> rows;
-  for (const FormatRow& row : toolkit::formats()) {
-    if (row.write) rows.push_back(row);
-  }
-  std::stable_partition(rows.begin(), rows.end(),
-                        [](const FormatRow& row) { return row.format == standardFormat; });
-  return rows;
-}
 
 std::vector<std::string_view> writableNames() {
   std::vector<std::string_view> names;
@@ -65,15 +50,6 @@ std::string suffixRules() {
              enumerate({row.suffixes.begin(), row.suffixes.end()}) + ", ";
   }
   return rules + "else " + std::string(toolkit::formatRow(standardFormat).name);
-}
-
-Format formatBySuffix(const std::string& path) {
-  const auto suffix = std::filesystem::path(path).extension();
-  for (const FormatRow& row : writableFormats()) {
-    const auto& known = row.suffixes;
-    if (std::find(known.begin(), known.end(), suffix) != known.end()) return row.format;
-  }
-  return standardFormat;
 }
 
 std::string written(const InputFile& file, const FormatRow& row) {
@@ -102,7 +78,7 @@ void setFormat(ConvertOptions& options, const std::string& name) {
 
 void describeConvert(Command& command) {
   const auto options = std::make_shared<ConvertOptions>();
-  command.argument("IN", options->in, "The property list, of any format").file();
+  command.argument("IN", options->in, "The property list, of any format; or a source").file();
   command.argument("OUT", options->out, "The file to write").path().file();
   command
       .taken(

@@ -34,7 +34,10 @@ void dump(const DumpOptions& options) {
 
 void describeDump(Command& command) {
   const auto options = std::make_shared<DumpOptions>();
-  command.argument("FILE", options->file, "The property list").file();
+  command
+      .argument("FILE", options->file,
+                "The property list; or a source, for the script that is built of it")
+      .file();
   command.flag("--canonical", options->canonical,
                "Print one line of ASCII that is the same for equal values");
   command.flag("--dictionary", options->dictionary, "Fail unless the root is a dictionary");

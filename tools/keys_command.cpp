@@ -37,7 +37,8 @@ void printKeys(const InputFile& file) {
 
 void describeKeys(Command& command) {
   const auto path = std::make_shared<std::string>();
-  command.argument("SCRIPT", *path, "The script, a property list").file();
+  command.argument("SCRIPT", *path, "The script, a property list; or its source, a YAML file")
+      .file();
   command.action([path] {
     const steps::ScriptFile script = steps::openScript(*path);
     if (script.from) {

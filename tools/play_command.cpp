@@ -70,13 +70,17 @@ void addWindowOptions(Command& command, play::PlayOptions& options) {
 }
 
 void addStepOptions(Command& command, play::PlayOptions& options) {
-  command.option("--start", options.startKey, "The list to start with (default: the smallest tag)")
+  command
+      .option("--start", options.startKey,
+              "The list, or the step of a source, to start with (default: the smallest tag, or the "
+              "first "
+              "step)")
       .valueName("KEY")
       .scriptKey();
   command
       .repeatedList(
           "--press", [&options](const std::string& tag) { addPress(options, tag); },
-          "Press the buttons with these tags, in turn")
+          "Press the buttons with these tags, or of a source with these names, in turn")
       .valueName("TAG")
       .scriptKey();
   command

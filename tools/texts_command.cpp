@@ -1,12 +1,13 @@
 // SPDX-License-Identifier: MIT
 // The command `texts`.
 #include <filesystem>
+#include <map>
 #include <memory>
 #include <optional>
 #include <string>
 
-#include "qz/property_list/positions.hpp"
 #include "tools/commands.hpp"
+#include "tools/steps/pictures.hpp"
 #include "tools/steps/po.hpp"
 #include "tools/steps/source.hpp"
 #include "tools/support/replace_file.hpp"
@@ -19,28 +20,51 @@ struct TextsOptions {
   std::string action;
   std::string source;
   std::optional<std::string> output;
+  std::optional<std::string> screenshots;
 };
 
-steps::PoEntry entryOf(const steps::Source& source, const steps::Text& text) {
+namespace fs = std::filesystem;
+
+/// The pictures of the steps, by their names.
+using Pictures = std::map<std::string, std::string>;
+
+/// Returns a path as it is seen from the directory of `file`.
+std::string seenFrom(const std::string& file, const std::string& path) {
+  const auto folder = fs::absolute(file).parent_path();
+  return fs::absolute(path).lexically_proximate(folder).generic_string();
+}
+
+std::string commentOf(const steps::Source& source, const steps::TextUse& use,
+                      const Pictures& pictures) {
+  const bool isOfAll = use.step == "every step";
+  const std::string comment =
+      (isOfAll ? use.step : "step " + use.step) + ": " + use.property + " of " + use.control;
+  const auto picture = pictures.find(isOfAll ? source.tour.steps.front().name : use.step);
+  return picture == pictures.end() ? comment : comment + ", in " + picture->second;
+}
+
+steps::PoEntry entryOf(const steps::Source& source, const steps::Text& text,
+                       const Pictures& pictures) {
   steps::PoEntry entry{.text = text.text};
-  const std::string file = std::filesystem::path(source.path).filename().string();
   for (const steps::TextUse& use : text.uses) {
-    const auto [line, column] = toolkit::TextCursor(source.text).at(use.place);
-    const std::string comment = (use.step == "every step" ? use.step : "step " + use.step) + ": " +
-                                use.property + " of " + use.control;
-    entry.comments.push_back(comment);
-    entry.references.push_back(file + ":" + std::to_string(line));
+    const steps::FilePlace place = source.files.at(use.place);
+    entry.comments.push_back(commentOf(source, use, pictures));
+    entry.references.push_back(seenFrom(source.path, place.path) + ":" +
+                               std::to_string(place.line));
   }
   return entry;
 }
 
 void extract(const TextsOptions& options) {
   const steps::Source source = steps::readSource(options.source);
-  std::vector<steps::PoEntry> entries;
-  for (const steps::Text& text : source.texts) entries.push_back(entryOf(source, text));
-  const auto path = std::filesystem::path(options.source);
+  const fs::path path = options.source;
   const std::string output =
-      options.output.value_or(std::filesystem::path(path).replace_extension(".pot").string());
+      options.output.value_or(fs::path(path).replace_extension(".pot").string());
+  Pictures pictures;
+  if (options.screenshots) pictures = steps::writePictures(source, *options.screenshots);
+  for (auto& [step, picture] : pictures) picture = seenFrom(output, picture);
+  std::vector<steps::PoEntry> entries;
+  for (const steps::Text& text : source.texts) entries.push_back(entryOf(source, text, pictures));
   replaceFile(output, steps::writePoTemplate(entries, path.stem().string()));
 }
 
@@ -55,6 +79,11 @@ void describeTexts(Command& command) {
       .valueName("TEXTS.pot")
       .path()
       .file();
+  command
+      .option("--screenshots", options->screenshots,
+              "Write a picture of every step to this directory, and name it at the step's texts")
+      .valueName("DIR")
+      .directory();
   command.action([options] {
     if (options->action != "extract") {
       throw UsageError("expected the action “extract”, found " + quote(options->action));

@@ -4,8 +4,10 @@
 
 #include <QPointer>
 #include <QWidget>
+#include <memory>
 
 #include "drivers/paced_driver.hpp"
+#include "qz/drivers/measuring.hpp"
 #include "qz/toolkit/qt/qt_toolkit.hpp"
 
 namespace qz::drivers {
@@ -20,7 +22,7 @@ struct DeletionSweep {
 };
 
 // The first base ends last, after the toolkit.
-class QtDriver final : DeletionSweep, public PacedDriver<QtToolkit> {
+class QtDriver final : DeletionSweep, public PacedDriver<QtToolkit>, public Measuring {
  public:
   std::string_view name() const override { return "qt"; }
 
@@ -39,6 +41,9 @@ class QtDriver final : DeletionSweep, public PacedDriver<QtToolkit> {
 
   bool hasPerson() const override;
   bool savePicture(const Ref<Window>& window, const std::string& path) override;
+  void workOffScreen() override;
+  MissingRoom missingRoom(const Ref<View>& view) override;
+
   ViewPicture look(const Ref<View>& view) override;
   WindowPicture look(const Ref<Window>& window) override;
 
@@ -47,7 +52,8 @@ class QtDriver final : DeletionSweep, public PacedDriver<QtToolkit> {
   void awaitEvents(double seconds) override;
   void settleWithoutFiring();
 
-  QPointer<QWidget> held_;  // the mouse button is down on it; null while it is up
+  std::unique_ptr<QObject> offScreen_;  // null while windows are shown
+  QPointer<QWidget> held_;              // the mouse button is down on it; null while it is up
 };
 
 }  // namespace qz::drivers

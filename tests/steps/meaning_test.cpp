@@ -60,7 +60,7 @@ class Comparison {
       std::string wrong = walk(generated, opened, folder, first);
       if (wrong.empty()) wrong = misjudged(opened, folder, askedFor(generated));
       if (!wrong.empty() || other == first) return wrong;
-      return walk(generated, tools::steps::openScript(folder.source(), other), folder, other);
+      return walk(generated, tools::steps::openScript(folder.source(), {other}), folder, other);
     } catch (const tools::Failure& failure) {
       return std::string("refused: ") + failure.what();
     }

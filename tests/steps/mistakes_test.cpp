@@ -88,7 +88,7 @@ TEST(Mistakes, OfTheWholeSourceHavePlaces) {
       {"steps: {}", {"3:8: expected at least one step"}},
       {"stps: {}",
        {"1:1: expected an entry “steps”",
-        "3:1: expected one of window, assets, controls, back over, every step, fragments "
+        "3:1: expected one of window, assets, include, controls, back over, every step, fragments "
         "or steps, found “stps”; did you mean \"steps\"?"}},
       {"steps: {a: {next: {press: end}}, b: {}}",
        {"3:34: nothing leads to the step “b”; expected a press or a wait that does"}},

@@ -34,12 +34,12 @@ TEST(Texts, AreTranslatedWhereThereIsATranslation) {
   const SourceFolder folder;
   folder.writeSource("steps: {a: {text: Hello, next: {title: Bye, press: end}}}");
   const Source source = readSource("tour.yaml", [](const std::string& text) {
-    return text == "Hello" ? std::optional<std::string>("Grüße") : std::nullopt;
+    return text == "Hello" ? Translation{.text = "Grüße"} : Translation{};
   });
   EXPECT_EQ(source.tour.steps[0].words.controls[0].content->text, "Grüße");
   EXPECT_EQ(source.tour.steps[0].words.controls[3].content->text, "Bye");
-  EXPECT_TRUE(source.texts[0].isTranslated);
-  EXPECT_FALSE(source.texts[1].isTranslated);
+  EXPECT_TRUE(source.texts[0].translation->text);
+  EXPECT_FALSE(source.texts[1].translation->text);
 }
 
 TEST(Texts, CanBeMadeLonger) {

@@ -50,8 +50,9 @@ std::string headings(const std::string& transcript) {
 PlayOptions firstSteps() {
   const std::string directory = std::string(QZ_SOURCE_DIR) + "/examples/first-steps/";
   PlayOptions options;
-  options.script = directory + "script.plist";
+  options.script = std::string(QZ_TEST_DATA) + "/scripts/first-steps.plist";
   options.stage.window = directory + "host.plist";
+  options.resources = directory;
   return options;
 }
 

@@ -4,6 +4,7 @@
 #include <algorithm>
 #include <filesystem>
 #include <set>
+#include <tuple>
 
 #include "engine/tag_key.hpp"
 #include "tools/check/conclusions.hpp"
@@ -11,6 +12,7 @@
 #include "tools/check/reading.hpp"
 #include "tools/check/replay.hpp"
 #include "tools/check/self_check.hpp"
+#include "tools/check/source_words.hpp"
 #include "tools/support/drivers.hpp"
 #include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
@@ -49,7 +51,7 @@ std::vector<Allowance> allowancesFor(const InputFile& file, const CheckOptions& 
 std::vector<Expectation> expectationsFor(const InputFile& file, const Script& script,
                                          const CheckOptions& options) {
   const auto path = options.expectations ? options.expectations : pathBeside(file, "check.expect");
-  return path ? readExpectations(*path, script) : std::vector<Expectation>();
+  return path ? readExpectations(*path, script, options.stage.names) : std::vector<Expectation>();
 }
 
 /// Throws a Failure for a tag that no control ever has: such an expectation says nothing.
@@ -58,7 +60,8 @@ void requireTags(const std::vector<Expectation>& expectations, const Setting& se
   const auto given = setting.script.newTags();
   tags.insert(given.begin(), given.end());
   const auto require = [&](const Condition& condition, const Expectation& expectation) {
-    if (!isAboutControl(condition) || tags.contains(condition.tag)) return;
+    const bool isTag = isAboutControl(condition) && condition.name.empty();
+    if (!isTag || tags.contains(condition.tag)) return;
     throw Failure(ExitStatus::badInput, expectation.place.text(condition.column) +
                                             ": no control ever has the tag " +
                                             std::to_string(condition.tag));
@@ -75,7 +78,9 @@ void watchFor(const std::vector<Expectation>& expectations, Setting& setting) {
   const auto watch = [&](const Condition& condition) {
     if (condition.kind != Condition::Kind::listRan) return;
     setting.watchedLists.resize(setting.script.lists().size());
-    setting.watchedLists[*setting.script.listUnder(condition.word)] = true;
+    for (const std::string& key : condition.keys) {
+      setting.watchedLists[*setting.script.listUnder(key)] = true;
+    }
   };
   for (const Expectation& expectation : expectations) {
     watch(expectation.condition);
@@ -112,12 +117,15 @@ void append(std::vector<Finding>& findings, std::vector<Finding> more) {
 /// Sorts by place in the script; what belongs to no place comes last.
 void sortByPlace(std::vector<Finding>& findings, const InputFile& file) {
   const auto placeOf = [&](const Finding& finding) {
+    using Place = std::tuple<bool, std::string_view, std::size_t, std::size_t>;
     const auto position = finding.where ? file.positionOf(finding.where) : std::nullopt;
-    if (!position) return std::pair<std::size_t, std::size_t>(-1, -1);
+    if (!position) return Place(true, {}, 0, 0);
+    const std::string& path = file.pathOf(finding.where);
+    const std::string_view included = path == file.path() ? std::string_view() : path;
     if (const auto* text = std::get_if<toolkit::TextPosition>(&*position)) {
-      return std::pair(text->line, text->column);
+      return Place(false, included, text->line, text->column);
     }
-    return std::pair(std::get<toolkit::BytePosition>(*position).offset, std::size_t{0});
+    return Place(false, included, std::get<toolkit::BytePosition>(*position).offset, 0);
   };
   std::stable_sort(findings.begin(), findings.end(), [&](const Finding& a, const Finding& b) {
     const auto one = placeOf(a);
@@ -186,6 +194,7 @@ Verdict checkScript(const InputFile& file, const CheckOptions& options,
     append(findings, concludeFromLooks(exploration, {options.wordsPerMinute, options.threads}));
   }
   append(findings, checkExpectations(exploration, expectations, options.threads, verdict.expected));
+  if (!verdict.names.isEmpty()) speakOfSteps(findings);
   // A code that was not looked for, or not everywhere, says nothing about its allowances.
   const bool canTell = verdict.explored.complete && !options.standIn;
   auto unneeded = canTell ? unneededAllowances(findings, allowances) : std::vector<Finding>();

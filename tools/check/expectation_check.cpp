@@ -56,21 +56,30 @@ bool ExpectationCheck::isSo(const Condition& condition, const Arrival& arrival,
   const std::uint8_t* const bytes = exploration_.place(place);
   if (condition.kind == Kind::end) return format.isOver(bytes);
   if (condition.kind == Kind::listRan) {
-    const auto list = exploration_.setting().script.listUnder(condition.word);
     const auto& ran = arrival.watchedLists;
-    return list && std::find(ran.begin(), ran.end(), *list) != ran.end();
+    return std::any_of(condition.keys.begin(), condition.keys.end(), [&](const std::string& key) {
+      const auto list = exploration_.setting().script.listUnder(key);
+      return list && std::find(ran.begin(), ran.end(), *list) != ran.end();
+    });
   }
   if (condition.kind == Kind::timer) {
     const PendingTimers& timers = exploration_.timers(place);
     return std::any_of(timers.begin(), timers.end(),
-                       [&](const PendingTimer& each) { return each.key == condition.word; });
+                       [&](const PendingTimer& each) { return each.key == condition.keys[0]; });
   }
   for (std::size_t i = 0; i < format.controls(); ++i) {  // commands find the backmost one
-    if (format.control(bytes, i).tag == condition.tag) {
+    if (isMeant(condition, format.control(bytes, i).tag)) {
       return isControlSo(condition, arrival, place, i);
     }
   }
   return false;
+}
+
+bool ExpectationCheck::isMeant(const Condition& condition, Tag tag) const {
+  if (condition.name.empty()) return tag == condition.tag;
+  const auto& names = exploration_.setting().plan.names.controls;
+  const auto found = names.find(tag);
+  return found != names.end() && found->second == condition.name;
 }
 
 bool ExpectationCheck::isControlSo(const Condition& condition, const Arrival& arrival,

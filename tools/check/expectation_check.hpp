@@ -41,6 +41,7 @@ class ExpectationCheck {
 
   bool meets(const Condition& condition, const Arrival& arrival, std::uint32_t place) const;
   bool isSo(const Condition& condition, const Arrival& arrival, std::uint32_t place) const;
+  bool isMeant(const Condition& condition, Tag tag) const;
   bool isControlSo(const Condition& condition, const Arrival& arrival, std::uint32_t place,
                    std::size_t control) const;
   void note(const Expectation& expectation, Evidence& evidence, const Occasion& occasion,

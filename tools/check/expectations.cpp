@@ -18,7 +18,7 @@ using Kind = Condition::Kind;
 using Rule = Expectation::Rule;
 
 /// What follows the word that begins a condition.
-enum class Operands : std::uint8_t { key, tag, tagAndWord };
+enum class Operands : std::uint8_t { key, step, control, controlAndWord };
 
 struct KindRow {
   std::string_view word;
@@ -30,16 +30,17 @@ struct KindRow {
 // "the end" has two words and no operand, so it is not a row.
 constexpr KindRow kindRows[] = {
     {"list", Kind::listRan, Operands::key},
-    {"hidden", Kind::hidden, Operands::tag},
-    {"shown", Kind::shown, Operands::tag},
-    {"enabled", Kind::enabled, Operands::tag},
-    {"disabled", Kind::disabled, Operands::tag},
-    {"on", Kind::on, Operands::tag, true},
-    {"off", Kind::off, Operands::tag, true},
-    {"text", Kind::text, Operands::tagAndWord, true},
-    {"title", Kind::title, Operands::tagAndWord, true},
-    {"image", Kind::image, Operands::tagAndWord, true},
-    {"tooltip", Kind::toolTip, Operands::tagAndWord, true},
+    {"step", Kind::listRan, Operands::step},
+    {"hidden", Kind::hidden, Operands::control},
+    {"shown", Kind::shown, Operands::control},
+    {"enabled", Kind::enabled, Operands::control},
+    {"disabled", Kind::disabled, Operands::control},
+    {"on", Kind::on, Operands::control, true},
+    {"off", Kind::off, Operands::control, true},
+    {"text", Kind::text, Operands::controlAndWord, true},
+    {"title", Kind::title, Operands::controlAndWord, true},
+    {"image", Kind::image, Operands::controlAndWord, true},
+    {"tooltip", Kind::toolTip, Operands::controlAndWord, true},
     {"timer", Kind::timer, Operands::key},
 };
 
@@ -48,8 +49,8 @@ constexpr const char* ruleWords =
 
 class Parser {
  public:
-  Parser(const Line& line, FileLine place, const Script& script)
-      : line_(line), place_(std::move(place)), script_(script) {}
+  Parser(const Line& line, FileLine place, const Script& script, const walkthrough::Names& names)
+      : line_(line), place_(std::move(place)), script_(script), names_(names) {}
 
   Expectation parse() {
     Expectation expectation{.words = line_.text, .place = place_};
@@ -91,14 +92,46 @@ class Parser {
     condition.kind = row->kind;
     condition.column = column();
     if (row->operands == Operands::key) {
-      condition.word = takeWord("the key of a list");
-      if (!script_.listUnder(condition.word)) wrongKey(condition);
+      condition.keys = {takeWord("the key of a list")};
+      if (!script_.listUnder(condition.keys[0])) wrongKey(condition);
       if (row->kind == Kind::listRan) takes("ran");
-      return condition;
+    } else if (row->operands == Operands::step) {
+      condition.keys = keysOfStep();
+    } else {
+      takeControl(condition);
+      if (row->operands == Operands::controlAndWord) condition.word = takeWord("what it shows");
     }
-    condition.tag = takeNumber<Tag>("the tag of a control");
-    if (row->operands == Operands::tagAndWord) condition.word = takeWord("what it shows");
     return condition;
+  }
+
+  /// Returns the keys of the lists that lead to the step.
+  std::vector<std::string> keysOfStep() {
+    const std::string word = next_ < line_.words.size() ? line_.words[next_] : "";
+    std::vector<std::string> keys;
+    std::vector<std::string_view> steps;
+    for (const auto& [key, step] : names_.steps) {
+      steps.push_back(step);
+      if (step == word) keys.push_back(key);
+    }
+    if (keys.empty()) wrong("the name of a step of a source", didYouMean(word, steps));
+    ++next_;
+    return keys;
+  }
+
+  /// Takes the name that a source gives to a control, or its tag.
+  void takeControl(Condition& condition) {
+    const std::string word = next_ < line_.words.size() ? line_.words[next_] : "";
+    std::vector<std::string_view> known;
+    for (const auto& [tag, name] : names_.controls) known.push_back(name);
+    if (std::find(known.begin(), known.end(), word) != known.end()) {
+      condition.name = takeWord("the name of a control");
+    } else if (const auto tag = walkthrough::parseNumber<Tag>(word)) {
+      condition.tag = *tag;
+      ++next_;
+    } else {
+      wrong(known.empty() ? "the tag of a control" : "the name of a control",
+            didYouMean(word, known));
+    }
   }
 
   const KindRow* takeKind() {
@@ -149,13 +182,14 @@ class Parser {
     std::vector<std::string_view> keys;
     for (const ScriptList& list : script_.lists()) keys.push_back(list.key);
     throw Failure(ExitStatus::badInput, place_.text(condition.column) +
-                                            ": the script has no list " + quote(condition.word) +
-                                            didYouMean(condition.word, keys));
+                                            ": the script has no list " + quote(condition.keys[0]) +
+                                            didYouMean(condition.keys[0], keys));
   }
 
   const Line& line_;
   FileLine place_;
   const Script& script_;
+  const walkthrough::Names& names_;
   std::size_t next_ = 0;
 };
 
@@ -166,10 +200,11 @@ bool isLook(const Condition& condition) {
 
 }  // namespace
 
-std::vector<Expectation> readExpectations(const std::string& path, const Script& script) {
+std::vector<Expectation> readExpectations(const std::string& path, const Script& script,
+                                          const walkthrough::Names& names) {
   std::vector<Expectation> expectations;
   for (const Line& line : linesOf(path, "expectations")) {
-    expectations.push_back(Parser(line, {path, line.number}, script).parse());
+    expectations.push_back(Parser(line, {path, line.number}, script, names).parse());
   }
   return expectations;
 }

@@ -9,6 +9,7 @@
 
 #include "tools/check/finding.hpp"
 #include "tools/exploration/script.hpp"
+#include "tools/walkthrough/names.hpp"
 
 namespace qz::tools::check {
 
@@ -16,7 +17,7 @@ namespace qz::tools::check {
 struct Condition {
   enum class Kind : std::uint8_t {
     end,      ///< the walk-through has ended
-    listRan,  ///< the move ran the list under the key `word`
+    listRan,  ///< the move ran a list under one of `keys`
     hidden,   ///< of the control with the tag, as the rest; false if no control has the tag
     shown,
     enabled,
@@ -33,6 +34,8 @@ struct Condition {
   Kind kind = Kind::end;
   bool isNegated = false;
   Tag tag = 0;
+  std::string name{};  ///< of the control, in place of the tag; empty: it has none
+  std::vector<std::string> keys{};
   std::string word{};
   std::size_t column = 0;  ///< where in its line the tag or the key is, from 1; 0 for `end`
 };
@@ -56,8 +59,10 @@ struct Expectation {
 };
 
 /// Reads a file of expectations, one on a line, with comments that begin with `#`. Throws a Failure
-/// for a line that is not one, or that names a list that the script has not.
-std::vector<Expectation> readExpectations(const std::string& path, const Script& script);
+/// for a line that is not one, or that names a list that the script has not. `names` are those of
+/// the script's source.
+std::vector<Expectation> readExpectations(const std::string& path, const Script& script,
+                                          const walkthrough::Names& names);
 
 /// Whether the condition names a control by its tag.
 bool isAboutControl(const Condition& condition);

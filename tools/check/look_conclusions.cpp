@@ -62,8 +62,9 @@ class LookConclusions {
   void add(const LookDifference& difference) {
     const Tag tag = ownTag(difference.control);
     Finding finding = findingOf("looks-differ",
-                                "after this list " + nameOf(difference.control) + " shows " +
-                                    difference.words + ", depending on how the user came here",
+                                (setting_.plan.names.isEmpty() ? "after this list " : "here ") +
+                                    nameOf(difference.control) + " shows " + difference.words +
+                                    ", depending on how the user came here",
                                 "let this list set what the control shows");
     finding.tag = tag;
     finding.path = exploration_.path(difference.second);
@@ -72,11 +73,13 @@ class LookConclusions {
   }
 
   void add(const BriefText& text) {
-    Finding finding = findingOf("too-brief",
-                                "the timer that this command starts replaces the text " +
-                                    quote(text.text) + " after " + inSeconds(text.shown) +
-                                    "; reading it takes " + inSeconds(text.needed),
-                                "wait longer, or let the user press a button");
+    Finding finding =
+        findingOf("too-brief",
+                  std::string("the ") +
+                      (setting_.plan.names.isEmpty() ? "timer that this command starts" : "wait") +
+                      " replaces the text " + quote(text.text) + " after " + inSeconds(text.shown) +
+                      "; reading it takes " + inSeconds(text.needed),
+                  "wait longer, or let the user press a button");
     finding.tag = ownTag(text.control);
     finding.path = text.path;
     addForElement(std::move(finding), text.element, text.places);

@@ -62,13 +62,12 @@ class PlaceConclusions {
       entry.second.insert(place);
     });
     for (const auto& [blame, entry] : entries) {
-      add(findingOf(
-              "dead-end",
-              causeOf(blame) +
-                  " leaves the user stuck: no press and no timer runs a list any more, but the "
-                  "walk-through has not ended",
-              "show or enable a button that has a list, start a timer, or end with "
-              "TERMINATE_PARSER"),
+      add(findingOf("dead-end",
+                    causeOf(blame) + " leaves the user stuck: no press and no timer " +
+                        (names().isEmpty() ? "runs a list any more" : "leads on any more") +
+                        ", but the walk-through has not ended",
+                    "show or enable a button that has a list, start a timer, or end with "
+                    "TERMINATE_PARSER"),
           blame, exploration_.path(entry.first), entry.second.size());
     }
   }

@@ -28,6 +28,11 @@ std::optional<toolkit::TextPosition> positionOf(const Finding& finding, const In
   return text ? std::optional(*text) : std::nullopt;
 }
 
+const std::string& pathOf(const Finding& finding, const InputFile& file) {
+  if (finding.elsewhere) return finding.elsewhere->path;
+  return finding.where ? file.pathOf(finding.where) : file.path();
+}
+
 std::string placeOf(const Finding& finding, const InputFile& file) {
   if (finding.elsewhere) return finding.elsewhere->text();
   return finding.where ? file.placeOf(finding.where) : file.path();

@@ -49,6 +49,8 @@ void writeJson(const RunReport& run, bool color, std::ostream& out);
 
 /// Returns where in the script a finding is; absent for one elsewhere, or in a binary file.
 std::optional<toolkit::TextPosition> positionOf(const Finding& finding, const InputFile& file);
+/// Returns the path of the file in which the finding's cause is.
+const std::string& pathOf(const Finding& finding, const InputFile& file);
 /// Returns the place of a finding, such as "intro.plist:12:5"; the path alone if that is all.
 std::string placeOf(const Finding& finding, const InputFile& file);
 

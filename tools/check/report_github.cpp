@@ -40,11 +40,8 @@ std::string_view commandOf(Severity severity) {
 }
 
 std::string propertiesOf(const Finding& finding, const Report& report) {
-  if (finding.elsewhere) {
-    return " file=" + escaped(finding.elsewhere->path, true) +
-           ",line=" + std::to_string(finding.elsewhere->line);
-  }
-  const std::string file = " file=" + escaped(report.verdict.path, true);
+  const std::string file = " file=" + escaped(pathOf(finding, report.file), true);
+  if (finding.elsewhere) return file + ",line=" + std::to_string(finding.elsewhere->line);
   const auto position = positionOf(finding, report.file);
   if (!position) return file;
   return file + ",line=" + std::to_string(position->line) +

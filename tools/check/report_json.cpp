@@ -35,6 +35,7 @@ Json jsonOf(const Finding& finding, const InputFile& file) {
     json["file"] = finding.elsewhere->path;
     json["line"] = finding.elsewhere->line;
   } else if (const auto position = positionOf(finding, file)) {
+    if (const auto& path = pathOf(finding, file); path != file.path()) json["file"] = path;
     json["line"] = position->line;
     json["column"] = position->column;
   }

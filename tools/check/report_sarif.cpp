@@ -39,14 +39,11 @@ std::string uriOf(const std::string& path) {
 Json physicalOf(const std::string& path) { return {{"artifactLocation", {{"uri", uriOf(path)}}}}; }
 
 Json locationOf(const Report& report, const Finding* finding) {
-  if (finding && finding->elsewhere) {
-    Json physical = physicalOf(finding->elsewhere->path);
-    physical["region"] = {{"startLine", finding->elsewhere->line}};
-    return {{"physicalLocation", std::move(physical)}};
-  }
-  Json physical = physicalOf(report.verdict.path);
+  Json physical = physicalOf(finding ? pathOf(*finding, report.file) : report.verdict.path);
   const auto position = finding ? positionOf(*finding, report.file) : std::nullopt;
-  if (position) {
+  if (finding && finding->elsewhere) {
+    physical["region"] = {{"startLine", finding->elsewhere->line}};
+  } else if (position) {
     physical["region"] = {{"startLine", position->line}, {"startColumn", position->column}};
   }
   return {{"physicalLocation", std::move(physical)}};

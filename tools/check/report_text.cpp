@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 // The report for people.
 #include <algorithm>
+#include <map>
 #include <ostream>
 #include <set>
 #include <sstream>
@@ -38,10 +39,7 @@ std::size_t widthBefore(const std::string& line, const toolkit::TextPosition& po
 class TextReport {
  public:
   TextReport(const Report& report, bool color, std::ostream& out)
-      : report_(report), colors_{color}, out_(out) {
-    std::istringstream source(wholeFile(report.file.path()).value_or(""));
-    for (std::string line; std::getline(source, line);) lines_.push_back(line);
-  }
+      : report_(report), colors_{color}, out_(out) {}
 
   void write() {
     for (const Finding& finding : report_.verdict.findings) writeFinding(finding);
@@ -61,10 +59,19 @@ class TextReport {
     if (!finding.help.empty()) out_ << "  help: " << oneLine(finding.help) << '\n';
   }
 
+  const std::vector<std::string>& linesOf(const std::string& path) {
+    const auto [known, isNew] = lines_.try_emplace(path);
+    std::istringstream source(isNew ? wholeFile(path).value_or("") : "");
+    for (std::string line; std::getline(source, line);) known->second.push_back(line);
+    return known->second;
+  }
+
   void writeSource(const Finding& finding) {
     const auto text = positionOf(finding, report_.file);
-    if (!text || text->line > lines_.size()) return;
-    const std::string& line = lines_[text->line - 1];
+    if (!text) return;
+    const auto& lines = linesOf(pathOf(finding, report_.file));
+    if (text->line > lines.size()) return;
+    const std::string& line = lines[text->line - 1];
     if (displayWidth(line) > widestLine || line.find('\0') != std::string::npos) return;
     out_ << "  | " << oneLine(line) << "\n  | " << std::string(widthBefore(line, *text), ' ')
          << colors_.of(finding.severity) << '^' << colors_.plain() << '\n';
@@ -152,8 +159,8 @@ class TextReport {
   const Report& report_;
   Colors colors_;
   std::ostream& out_;
-  std::vector<std::string> lines_;
-  std::set<std::string> shown_;  // the paths whose moves were written
+  std::map<std::string, std::vector<std::string>> lines_;  // of files, by their paths
+  std::set<std::string> shown_;                            // the paths whose moves were written
 };
 
 /// Says which of several scripts could not be checked; standard error says why. Of a run with one

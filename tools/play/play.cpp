@@ -126,10 +126,15 @@ void connectLog(drivers::Driver& driver, const Terminal& terminal) {
   });
 }
 
+std::vector<std::string> startsOf(const PlayOptions& options) {
+  if (options.startKey.empty()) return {};
+  return {options.startKey};
+}
+
 }  // namespace
 
 ExitStatus play(const PlayOptions& options, const Terminal& terminal) {
-  const steps::ScriptFile script = steps::openScript(options.script, options.startKey);
+  const steps::ScriptFile script = steps::openScript(options.script, startsOf(options));
   const InputFile& file = script.file;
   const std::string startKey =
       script.from ? script.from->built.startKeys.front() : options.startKey;

@@ -55,7 +55,9 @@ std::string noSuchName(const StepPicture& picture, const std::string& name) {
   for (const ControlPicture& control : picture.controls) {
     if (!control.name.empty()) known.push_back(control.name);
   }
-  return "no control is called " + quote(name) + didYouMean(name, known) + pressableWords(picture);
+  const std::string suggestion = didYouMean(name, known);
+  return "no control is called " + quote(name) +
+         (suggestion.empty() ? pressableWords(picture) : suggestion);
 }
 
 std::string pressWords(const StepPicture& picture, toolkit::Tag tag) {

@@ -22,7 +22,7 @@ namespace fs = std::filesystem;
 
 /// Deletes the pictures of an earlier walk-through, which would mix with the new ones.
 void clearAway(const std::string& directory) {
-  static const std::regex own("[0-9]{2,}-(start|press|advance|list)[-.0-9a-z]*\\.png");
+  static const std::regex own("[0-9]{2,}-(start|press|advance|list|wait)[-.0-9a-zA-Z]*\\.png");
   std::error_code error;
   for (const auto& entry : fs::directory_iterator(directory, error)) {
     if (std::regex_match(entry.path().filename().string(), own)) fs::remove(entry.path(), error);

@@ -8,6 +8,7 @@
 
 #include "tools/play/pressing.hpp"
 #include "tools/play/words.hpp"
+#include "tools/support/file_names.hpp"
 #include "tools/support/text_layout.hpp"
 
 namespace qz::tools::play {
@@ -23,6 +24,24 @@ const TimerPicture* firedBetween(const StepPicture& before, const StepPicture& a
     if (!pends) return &timer;
   }
   return nullptr;
+}
+
+std::string headingOf(const TimerPicture& fired) {
+  return fired.step.empty() ? "list " + fired.key + " runs by its timer"
+                            : "the wait leads to " + quote(fired.step);
+}
+
+// Names of pictures, after the number of each.
+std::string pictureOfPress(const StepPicture& picture, toolkit::Tag tag) {
+  const auto pressed =
+      std::find_if(picture.controls.begin(), picture.controls.end(),
+                   [&](const ControlPicture& control) { return control.view.tag == tag; });
+  const bool hasName = pressed != picture.controls.end() && !pressed->name.empty();
+  return "press-" + (hasName ? fileWord(pressed->name) : std::to_string(tag));
+}
+
+std::string pictureOf(const TimerPicture& fired) {
+  return fired.step.empty() ? "list-" + fired.key : "wait-" + fileWord(fired.step);
 }
 
 }  // namespace
@@ -65,7 +84,7 @@ void Session::press(const Press& press) {
   if (!tag) return refuse("press " + press.name, noSuchName(picture(), press.name));
   const std::string heading = "press " + pressWords(picture(), *tag);
   if (const auto reason = whyNotPress(picture(), *tag)) return refuse(heading, *reason);
-  run(heading, "press-" + std::to_string(*tag),
+  run(heading, pictureOfPress(picture(), *tag),
       [&] { driver_.click(stage_.engine().findObjectWithTag(*tag)); });
 }
 
@@ -86,7 +105,7 @@ void Session::pass(double seconds) {
     const StepPicture after = look();
     const TimerPicture* const fired = firedBetween(before, after);
     if (!fired) break;
-    takeScreenshot("list-" + fired->key);
+    takeScreenshot(pictureOf(*fired));
     if (seconds <= 0) begun_->name.clear();  // nothing has changed since that picture
   }
   driver_.advance(seconds);
@@ -128,7 +147,8 @@ void Session::handOver() {
   const auto willAct = [this](const toolkit::Ref<toolkit::View>& view) {
     watch();  // what happened before is its own step, such as the list of a timer
     const toolkit::Tag tag = view->tag();
-    begin("press " + pressWords(look(), tag), "press-" + std::to_string(tag));
+    const StepPicture now = look();
+    begin("press " + pressWords(now, tag), pictureOfPress(now, tag));
   };
   while (watch()) {
     try {
@@ -145,7 +165,7 @@ bool Session::watch() {
   if (!begun_) {
     const StepPicture now = look();
     if (const TimerPicture* const fired = firedBetween(picture(), now)) {
-      begin("list " + fired->key + " runs by its timer", "list-" + fired->key);
+      begin(headingOf(*fired), pictureOf(*fired));
     } else {
       return !now.ended && now.window && now.window->visible;
     }

@@ -154,7 +154,7 @@ class Compiler {
     return list;
   }
 
-  /// Begins a scene whose controls show and have what they should, but for flashing and the wait.
+  /// Begins what goes on in a scene by itself: the flashing and the wait. All else must be set.
   void begin(List& list, SceneIndex scene, Place place) {
     if (plan_.flashesIn(scene)) list.push_back(untagged("ALLOW_FLASHING", {true}, place));
     if (plan_.waitOf(scene)) list.push_back(wait(scene));

@@ -173,6 +173,8 @@ Look everyStepLook(const Tour& tour) {
   return completeLook(tour, nothing, true);
 }
 
+namespace {
+
 void judgeBackgrounds(const Tour& tour, Mistakes& mistakes) {
   const bool isEverywhere = tour.everyStep.background.has_value();
   const auto hasNone = [](const Step& step) { return !step.words.background; };
@@ -222,41 +224,46 @@ void judgePictures(const Tour& tour, Mistakes& mistakes) {
   }
 }
 
+/// A push button with a name that the user can press must lead somewhere.
+void judgePresses(const Tour& tour, Mistakes& mistakes) {
+  for (StepIndex i = 0; i < tour.steps.size(); ++i) {
+    const Step& step = tour.steps[i];
+    const Look look = lookOf(tour, i, true);
+    for (ControlIndex c = 0; c < tour.controls.size(); ++c) {
+      const Control& control = tour.controls[c];
+      const bool needsPress = !control.name.empty() && control.kind == ViewKind::button;
+      const ControlWords words = merged(tour.everyStep.controls[c], step.words.controls[c]);
+      if (!needsPress || words.press || !look.controls[c].canBePressed) continue;
+      mistakes.add(words.place == 0 ? step.place : words.place,
+                   "at the step " + quote(step.name) + " a press of " + quote(control.name) +
+                       " leads nowhere; expected “press” with a step, “back”, “end” or “nothing”");
+    }
+  }
+}
+
+/// A button that is red at one step stays red.
+void judgeRed(const Tour& tour, Mistakes& mistakes) {
+  for (ControlIndex c = 0; c < tour.controls.size(); ++c) {
+    if (tour.everyStep.controls[c].isRed) continue;
+    const auto isPlain = [&](const Step& step) { return !step.words.controls[c].isRed; };
+    const auto red = std::find_if_not(tour.steps.begin(), tour.steps.end(), isPlain);
+    if (red == tour.steps.end() || std::none_of(tour.steps.begin(), tour.steps.end(), isPlain)) {
+      continue;
+    }
+    mistakes.add(red->words.controls[c].place,
+                 "no command takes the red from a button again; expected “background: red” "
+                 "under “every step”, or at none");
+  }
+}
+
+}  // namespace
+
 void judgeLooks(const Tour& tour, Mistakes& mistakes) {
   judgeBackgrounds(tour, mistakes);
   judgeStates(tour, mistakes);
   judgePictures(tour, mistakes);
-  std::vector<Place> redAt(tour.controls.size(), 0);
-  std::vector<bool> plainSomewhere(tour.controls.size(), false);
-  for (StepIndex step = 0; step < tour.steps.size(); ++step) {
-    Look look = lookOf(tour, step, true);
-    for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
-      const ControlWords words =
-          merged(tour.everyStep.controls[i], tour.steps[step].words.controls[i]);
-      const Control& control = tour.controls[i];
-      const bool isDead = !control.name.empty() && control.kind == ViewKind::button &&
-                          !words.press && look.controls[i].canBePressed;
-      if (isDead) {
-        const Place place =
-            words.isMentioned || words.place != 0 ? words.place : tour.steps[step].place;
-        mistakes.add(place, "at the step " + quote(tour.steps[step].name) + " a press of " +
-                                quote(control.name) +
-                                " leads nowhere; expected “press” with a step, “back”, “end” or "
-                                "“nothing”");
-      }
-      if (words.isRed) {
-        redAt[i] = words.place;
-      } else {
-        plainSomewhere[i] = true;
-      }
-    }
-  }
-  for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
-    if (redAt[i] == 0 || !plainSomewhere[i]) continue;
-    mistakes.add(redAt[i],
-                 "no command takes the red from a button again; expected “background: red” "
-                 "under “every step”, or at none");
-  }
+  judgePresses(tour, mistakes);
+  judgeRed(tour, mistakes);
 }
 
 }  // namespace qz::tools::steps

@@ -4,14 +4,16 @@
 
 #include <cstddef>
 #include <string>
-#include <string_view>
 #include <vector>
 
 #include "tools/support/failure.hpp"
 
 namespace qz::tools::steps {
 
-/// The byte of the source, from 0, at which something begins.
+class SourceFiles;
+
+/// The byte at which something begins, from 0. The bytes of included files count on from those of
+/// the source.
 using Place = std::size_t;
 
 struct Mistake {
@@ -19,16 +21,21 @@ struct Mistake {
   std::string message;  ///< what is wrong, what was expected, and the likeliest name
 };
 
-/// Thrown if a source has mistakes. The message is the first one, with its line and column.
+/// Thrown if a source has mistakes. The message is the first one, with its file, line and column.
 class SourceRefused : public Failure {
  public:
-  explicit SourceRefused(std::vector<std::string> messages)
-      : Failure(ExitStatus::badInput, messages.front()), messages_(std::move(messages)) {}
+  SourceRefused(std::vector<std::string> messages, std::vector<std::string> paths)
+      : Failure(ExitStatus::badInput, messages.front()),
+        messages_(std::move(messages)),
+        paths_(std::move(paths)) {}
   /// Returns all of them, in the order of the source.
   const std::vector<std::string>& messages() const { return messages_; }
+  /// Returns the paths of the source and of all files that it includes.
+  const std::vector<std::string>& paths() const { return paths_; }
 
  private:
   std::vector<std::string> messages_;
+  std::vector<std::string> paths_;
 };
 
 /// Collects what is wrong with a source, so that its author learns of everything at once.
@@ -36,8 +43,8 @@ class Mistakes {
  public:
   void add(Place place, std::string message) { list_.push_back({place, std::move(message)}); }
   bool isEmpty() const { return list_.empty(); }
-  /// Throws a SourceRefused if there are mistakes. `text` is the source, `path` its file.
-  void throwIfAny(std::string_view path, std::string_view text);
+  /// Throws a SourceRefused if there are mistakes in these files.
+  void throwIfAny(const SourceFiles& files);
 
  private:
   std::vector<Mistake> list_;

@@ -2,6 +2,8 @@
 // Opens scripts and sources alike.
 #include "tools/steps/script_file.hpp"
 
+#include <algorithm>
+
 #include "tools/support/suggestions.hpp"
 #include "tools/support/text_layout.hpp"
 
@@ -18,6 +20,14 @@ StepIndex stepNamed(const Source& source, const std::string& name) {
   }
   throw Failure(ExitStatus::failed,
                 source.path + ": no step is called " + quote(name) + didYouMean(name, names));
+}
+
+/// Returns the steps to start at. The first step is always one, so that the same steps are reached.
+std::vector<StepIndex> startsOf(const Source& source, const std::vector<std::string>& names) {
+  std::vector<StepIndex> starts;
+  for (const std::string& name : names) starts.push_back(stepNamed(source, name));
+  if (std::find(starts.begin(), starts.end(), StepIndex{0}) == starts.end()) starts.push_back(0);
+  return starts;
 }
 
 }  // namespace
@@ -43,18 +53,15 @@ walkthrough::StageOptions ScriptFile::stage(walkthrough::StageOptions options) c
   return options;
 }
 
-ScriptFile openScript(const std::string& path, const std::string& start,
+ScriptFile openScript(const std::string& path, const std::vector<std::string>& starts,
                       const Translate& translate) {
   if (!isSourcePath(path)) return {InputFile(path, expectedFile), std::nullopt};
   BuiltSource from{.source = readSource(path, translate), .built = {}};
-  // The first step stays a start, so that the same steps are reached as without `start`.
-  std::vector<StepIndex> starts = {0};
-  const StepIndex first = start.empty() ? 0 : stepNamed(from.source, start);
-  if (first != 0) starts.insert(starts.begin(), first);
   Mistakes mistakes;
-  from.built = build(from.source.tour, starts, mistakes);
-  mistakes.throwIfAny(path, from.source.text);
-  InputFile file(path, expectedFile, from.built.script, from.built.offsets, from.source.text);
+  from.built = build(from.source.tour, startsOf(from.source, starts), mistakes);
+  mistakes.throwIfAny(from.source.files);
+  InputFile file(path, expectedFile, from.built.script,
+                 from.source.files.written(from.built.offsets));
   return {std::move(file), std::move(from)};
 }
 

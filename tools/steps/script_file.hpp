@@ -4,6 +4,7 @@
 
 #include <optional>
 #include <string>
+#include <vector>
 
 #include "tools/steps/compiler.hpp"
 #include "tools/steps/source.hpp"
@@ -29,11 +30,10 @@ struct ScriptFile {
   walkthrough::StageOptions stage(walkthrough::StageOptions options) const;
 };
 
-/// Reads the script at `path`, or builds it if this is a source. The first start key of a built
-/// script is that of the step `start`, or of the first step if `start` is empty. Throws a
-/// SourceRefused if the source has mistakes, another Failure if a file cannot be read or does not
-/// hold what it should.
-ScriptFile openScript(const std::string& path, const std::string& start = {},
+/// Reads the script at `path`, or builds it if this is a source. The first start keys of a built
+/// script are those of the steps `starts`, or else of the first step. Throws a SourceRefused if the
+/// source has mistakes, another Failure if a file cannot be read or does not hold what it should.
+ScriptFile openScript(const std::string& path, const std::vector<std::string>& starts = {},
                       const Translate& translate = {});
 
 /// Reads any property list; of a source, the script that is built of it.

@@ -7,6 +7,7 @@
 #include <map>
 
 #include "tools/steps/fragments.hpp"
+#include "tools/steps/parts.hpp"
 #include "tools/steps/step_reader.hpp"
 #include "tools/steps/words.hpp"
 #include "tools/support/drivers.hpp"
@@ -22,9 +23,6 @@ namespace fs = std::filesystem;
 using drivers::Caption;
 
 constexpr int greatestTag = 2147483647;  // the engine reads tags as an int
-constexpr std::string_view sourceWords[] = {"window",     "assets",    "controls", "back over",
-                                            "every step", "fragments", "steps"};
-
 Control controlOf(const drivers::ViewPicture& view) {
   Control control{.tag = view.tag, .kind = view.kind};
   const Caption caption = rowOf(view.kind).caption;
@@ -55,59 +53,54 @@ std::vector<Control> controlsOf(const walkthrough::StageOptions& options, const 
 /// of the file.
 class SourceReader {
  public:
-  SourceReader(Source& source, const ReadControls& readControls, const Translate& translate)
-      : source_(source), tour_(source.tour), readControls_(readControls), texts_(translate) {}
+  SourceReader(Source& source, const SourceInputs& inputs, const Translate& translate)
+      : source_(source),
+        tour_(source.tour),
+        inputs_(inputs),
+        texts_(translate),
+        parts_(source.files, inputs.readText, mistakes_) {}
 
-  void read() {
-    const NodeRef root = readYaml(source_.text, source_.path);
-    for (const auto& [key, value] :
-         entriesOf(*root, "a walk-through in steps (a table)", mistakes_)) {
-      const auto known = std::find(std::begin(sourceWords), std::end(sourceWords), key->text);
-      if (known == std::end(sourceWords)) {
-        mistakes_.add(key->place,
-                      "expected one of " +
-                          enumerate({std::begin(sourceWords), std::end(sourceWords)}) + ", found " +
-                          foundWords(*key) +
-                          didYouMean(key->text, {std::begin(sourceWords), std::end(sourceWords)}));
-      }
-      parts_[key->text] = value;
-    }
-    require("steps", *root);
-    require("controls", *root);
+  void read(std::string text) {
+    parts_.read(source_.path, std::move(text));
+    if (!parts_.areWhole()) mistakes_.throwIfAny(source_.files);
+    require("steps");
+    require("controls");
     if (!part("window") && !part("assets")) {
-      mistakes_.add(root->place, "expected “window”, the file of the host's window, or “assets”");
+      mistakes_.add(0, "expected “window”, the file of the host's window, or “assets”");
     }
-    mistakes_.throwIfAny(source_.path, source_.text);
+    if (part("window") && part("assets")) {
+      mistakes_.add(part("assets")->place, "expected either “window” or “assets”, found both");
+    }
+    mistakes_.throwIfAny(source_.files);
     readWindow();
     readControls();
     readSteps();
     source_.texts = texts_.list();
-    mistakes_.throwIfAny(source_.path, source_.text);
+    mistakes_.throwIfAny(source_.files);
   }
 
  private:
-  NodeRef part(const std::string& word) const {
-    const auto found = parts_.find(word);
-    return found == parts_.end() ? nullptr : found->second;
+  NodeRef part(const std::string& word) const { return parts_.part(word); }
+
+  void require(const std::string& word) {
+    if (!part(word)) mistakes_.add(0, "expected an entry " + quote(word));
   }
 
-  void require(const std::string& word, const Node& root) {
-    if (!part(word)) mistakes_.add(root.place, "expected an entry " + quote(word));
-  }
-
+  /// Returns the path of a file that an entry names, from the directory in which the entry is.
   std::optional<std::string> fileIn(const std::string& word) {
     const NodeRef node = part(word);
     if (!node) return std::nullopt;
     const auto name = textOf(*node, "the name of a file", mistakes_);
     if (!name) return std::nullopt;
-    return (fs::path(source_.path).parent_path() / *name).string();
+    const fs::path from = source_.files.at(node->place).path;
+    return (from.parent_path() / *name).string();
   }
 
   void readWindow() {
     source_.stage.window = fileIn("window");
     source_.stage.assets = fileIn("assets");
-    mistakes_.throwIfAny(source_.path, source_.text);
-    tour_.controls = readControls_(source_.stage);
+    mistakes_.throwIfAny(source_.files);
+    tour_.controls = inputs_.readControls(source_.stage);
   }
 
   void readControls() {
@@ -199,10 +192,10 @@ class SourceReader {
 
   Source& source_;
   Tour& tour_;
-  const ReadControls& readControls_;
+  const SourceInputs& inputs_;
   Texts texts_;
   Mistakes mistakes_;
-  std::map<std::string, NodeRef> parts_;
+  Parts parts_;
 };
 
 }  // namespace
@@ -213,18 +206,20 @@ bool isSourcePath(const std::string& path) {
 
 Source readSource(const std::string& path, const Translate& translate) {
   auto text = wholeFile(path);
-  if (!text)
+  if (!text) {
     throw Failure(ExitStatus::badInput,
                   path + ": cannot be read; expected a walk-through in steps");
-  return readSourceText(
-      path, *std::move(text),
-      [&](const walkthrough::StageOptions& stage) { return controlsOf(stage, path); }, translate);
+  }
+  const auto controls = [&](const walkthrough::StageOptions& stage) {
+    return controlsOf(stage, path);
+  };
+  return readSourceText(path, *std::move(text), {controls, wholeFile}, translate);
 }
 
-Source readSourceText(const std::string& path, std::string text, const ReadControls& readControls,
+Source readSourceText(const std::string& path, std::string text, const SourceInputs& inputs,
                       const Translate& translate) {
-  Source source{.path = path, .text = std::move(text)};
-  SourceReader(source, readControls, translate).read();
+  Source source{.path = path};
+  SourceReader(source, inputs, translate).read(std::move(text));
   return source;
 }
 

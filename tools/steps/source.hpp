@@ -1,11 +1,13 @@
 // SPDX-License-Identifier: MIT
-// The source of a walk-through: a YAML file.
+// The source of a walk-through: a YAML file, and those that it includes.
 #pragma once
 
 #include <functional>
 #include <string>
 #include <vector>
 
+#include "tools/steps/parts.hpp"
+#include "tools/steps/source_files.hpp"
 #include "tools/steps/texts.hpp"
 #include "tools/steps/tour.hpp"
 #include "tools/walkthrough/stage.hpp"
@@ -14,7 +16,7 @@ namespace qz::tools::steps {
 
 struct Source {
   std::string path{};
-  std::string text{};
+  SourceFiles files{};
   walkthrough::StageOptions stage{};  ///< the window that the source names
   Tour tour{};
   std::vector<Text> texts{};  ///< for translators, in the order of the file
@@ -26,8 +28,14 @@ bool isSourcePath(const std::string& path);
 /// Returns the controls of the window that the options name, back to front.
 using ReadControls = std::function<std::vector<Control>(const walkthrough::StageOptions&)>;
 
+/// What a source names.
+struct SourceInputs {
+  ReadControls readControls;
+  ReadText readText;  ///< of included files
+};
+
 /// Reads a source from its text. Throws a SourceRefused if there are mistakes in it.
-Source readSourceText(const std::string& path, std::string text, const ReadControls& readControls,
+Source readSourceText(const std::string& path, std::string text, const SourceInputs& inputs,
                       const Translate& translate = {});
 
 /// Reads a source, and the window that it names. With `translate` its texts are in another

@@ -11,9 +11,20 @@ namespace {
 
 using Json = nlohmann::ordered_json;
 
+/// Returns a path as it is seen from the directory of `source`.
+std::string relativeTo(const std::string& source, const std::string& path) {
+  const auto folder = std::filesystem::path(source).parent_path();
+  return std::filesystem::path(path).lexically_proximate(folder).generic_string();
+}
+
 Json placeOf(const InputFile& file, const toolkit::ValueRef<>& value) {
   const auto [line, column] = std::get<toolkit::TextPosition>(*file.positionOf(value));
-  return {{"line", line}, {"column", column}};
+  Json place = Json::object();
+  if (file.pathOf(value) != file.path())
+    place["file"] = relativeTo(file.path(), file.pathOf(value));
+  place["line"] = line;
+  place["column"] = column;
+  return place;
 }
 
 Json listOf(const InputFile& file, const toolkit::Dictionary::Entry& entry,

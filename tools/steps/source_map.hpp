@@ -9,7 +9,8 @@
 namespace qz::tools::steps {
 
 /// Returns a JSON object: the source, the name of the control for each tag, and for each list its
-/// place, the step to which it leads, and the place of each command. `script` must be built of a
+/// place, the step to which it leads, and the place of each command. A place in an included file
+/// names that. `script` must be built of a
 /// source. docs/qz-walkthrough.md describes the object.
 std::string sourceMap(const ScriptFile& script);
 

@@ -18,9 +18,8 @@ std::string Texts::translated(const std::string& text, TextUse use) {
     noted.uses.push_back(std::move(use));
   }
   if (!translate_) return text;
-  const auto translation = translate_(text);
-  noted.isTranslated = translation.has_value();
-  return translation.value_or(text);
+  if (!noted.translation) noted.translation = translate_(text);
+  return noted.translation->text.value_or(text);
 }
 
 std::string lengthened(const std::string& text) {

@@ -12,8 +12,13 @@
 
 namespace qz::tools::steps {
 
-/// Returns a text in another language; absent if there is none.
-using Translate = std::function<std::optional<std::string>(const std::string& text)>;
+/// A text in another language.
+struct Translation {
+  std::optional<std::string> text{};  ///< absent: there is none of the text as it is now
+  bool isOld = false;                 ///< there is one of the text as it was before
+};
+
+using Translate = std::function<Translation(const std::string& text)>;
 
 /// Where a text is used.
 struct TextUse {
@@ -28,7 +33,7 @@ struct TextUse {
 struct Text {
   std::string text{};  ///< as it is written in the source
   std::vector<TextUse> uses{};
-  bool isTranslated = true;
+  std::optional<Translation> translation{};  ///< absent if no language was asked for
 };
 
 /// Collects the texts of a source while it is read, and puts translations in their place.
@@ -52,8 +57,8 @@ class Texts {
   std::map<std::string, std::size_t> numbers_;
 };
 
-/// Returns the text about half as long again and with accents, Markdown and references as they are:
-/// shows which texts a window has no room for before anybody has translated them.
+/// Returns the text with letters after it, so that it is half as long again: shows which texts have
+/// no room to grow before anybody has translated them.
 std::string lengthened(const std::string& text);
 
 }  // namespace qz::tools::steps

@@ -14,6 +14,7 @@
 namespace qz::tools::steps {
 
 namespace words {
+inline constexpr std::string_view include = "include";
 inline constexpr std::string_view use = "use";
 inline constexpr std::string_view like = "like";
 inline constexpr std::string_view after = "after ";  // and the seconds

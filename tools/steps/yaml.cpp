@@ -18,44 +18,47 @@ constexpr std::size_t mostNodesForAByte = 4;
 constexpr std::size_t deepestNesting = 100;
 
 struct YamlRefusal {
-  Place place;
+  std::size_t offset;  // in the text
   std::string message;
 };
 
 /// Puts each node into the one that is open.
 class TreeBuilder {
  public:
-  explicit TreeBuilder(std::size_t mostNodes) : mostNodes_(mostNodes) {}
+  /// `start` is the place of the text's first byte.
+  TreeBuilder(std::size_t mostNodes, Place start) : mostNodes_(mostNodes), start_(start) {}
 
   NodeRef root() const { return root_; }
 
-  void begin(Node::Kind kind, Place place, const std::string& anchor) {
+  void begin(Node::Kind kind, std::size_t offset, const std::string& anchor) {
     if (open_.size() == deepestNesting) {
-      throw YamlRefusal{place, "lists and tables are nested too deeply; expected at most " +
-                                   std::to_string(deepestNesting) + " levels"};
+      throw YamlRefusal{offset, "lists and tables are nested too deeply; expected at most " +
+                                    std::to_string(deepestNesting) + " levels"};
     }
-    open_.push_back({std::make_shared<Node>(Node{.kind = kind, .place = place}), anchor, nullptr});
+    open_.push_back(
+        {std::make_shared<Node>(Node{.kind = kind, .place = start_ + offset}), anchor, nullptr});
   }
 
   void end() {
     const Open closed = open_.back();
     open_.pop_back();
-    keep(closed.node, closed.anchor);
+    keep(closed.node, closed.anchor, closed.node->place - start_);
   }
 
-  void addScalar(std::string text, bool isPlain, Place place, const std::string& anchor) {
+  void addScalar(std::string text, bool isPlain, std::size_t offset, const std::string& anchor) {
     const bool isNothing = isPlain && (text.empty() || text == "~" || text == "null");
     const auto kind = isNothing ? Node::Kind::nothing : Node::Kind::scalar;
-    keep(std::make_shared<Node>(Node{.kind = kind, .place = place, .text = std::move(text)}),
-         anchor);
+    keep(std::make_shared<Node>(
+             Node{.kind = kind, .place = start_ + offset, .text = std::move(text)}),
+         anchor, offset);
   }
 
-  void addAlias(const std::string& anchor, Place place) {
+  void addAlias(const std::string& anchor, std::size_t offset) {
     const auto known = anchors_.find(anchor);
     if (known == anchors_.end()) {
-      throw YamlRefusal{place, "nothing before this has the anchor “" + anchor + "”"};
+      throw YamlRefusal{offset, "nothing before this has the anchor “" + anchor + "”"};
     }
-    add(known->second, place);
+    add(known->second, offset);
   }
 
  private:
@@ -65,12 +68,12 @@ class TreeBuilder {
     NodeRef key;  // of the entry that is being read
   };
 
-  void keep(const NodeRef& node, const std::string& anchor) {
+  void keep(const NodeRef& node, const std::string& anchor, std::size_t offset) {
     if (!anchor.empty()) anchors_[anchor] = node;
-    add(node, node->place);
+    add(node, offset);
   }
 
-  void add(const NodeRef& node, Place place) {
+  void add(const NodeRef& node, std::size_t offset) {
     if (open_.empty()) {
       root_ = node;
       return;
@@ -78,8 +81,8 @@ class TreeBuilder {
     Open& parent = open_.back();
     parent.node->size += node->size;
     if (parent.node->size > mostNodes_) {
-      throw YamlRefusal{place, "the aliases of this file repeat too much; expected at most " +
-                                   std::to_string(mostNodes_) + " values"};
+      throw YamlRefusal{offset, "the aliases of this file repeat too much; expected at most " +
+                                    std::to_string(mostNodes_) + " values"};
     }
     if (parent.node->kind == Node::Kind::list) {
       parent.node->elements.push_back(node);
@@ -92,6 +95,7 @@ class TreeBuilder {
   }
 
   std::size_t mostNodes_;
+  Place start_;
   NodeRef root_;
   std::vector<Open> open_;
   std::map<std::string, NodeRef> anchors_;
@@ -108,7 +112,7 @@ std::string tokenText(fy_token* token) {
 /// The parser, and what it has found wrong.
 class YamlParser {
  public:
-  explicit YamlParser(std::string_view text) : text_(text) {
+  YamlParser(std::string_view text, Place start) : text_(text), start_(start) {
     fy_diag_cfg quiet;
     fy_diag_cfg_default(&quiet);
     diagnostics_.reset(fy_diag_create(&quiet));
@@ -123,7 +127,7 @@ class YamlParser {
   }
 
   NodeRef read() {
-    TreeBuilder builder(mostNodesForAByte * text_.size() + 1);
+    TreeBuilder builder(mostNodesForAByte * text_.size() + 1, start_);
     while (fy_event* const event = fy_parser_parse(parser_.get())) {
       const EventOwner owner{parser_.get(), event};
       handle(*event, builder);
@@ -150,27 +154,27 @@ class YamlParser {
 
   void handle(const fy_event& event, TreeBuilder& builder) {
     const fy_mark* const mark = fy_event_start_mark(const_cast<fy_event*>(&event));
-    const Place place = mark ? mark->input_pos : 0;
+    const std::size_t offset = mark ? mark->input_pos : 0;
     switch (event.type) {
       case FYET_DOCUMENT_START:
         if (builder.root()) {
-          throw YamlRefusal{place, "a second document; expected one walk-through in a file"};
+          throw YamlRefusal{offset, "a second document; expected one walk-through in a file"};
         }
         return;
       case FYET_MAPPING_START:
-        return builder.begin(Node::Kind::table, place, tokenText(event.mapping_start.anchor));
+        return builder.begin(Node::Kind::table, offset, tokenText(event.mapping_start.anchor));
       case FYET_SEQUENCE_START:
-        return builder.begin(Node::Kind::list, place, tokenText(event.sequence_start.anchor));
+        return builder.begin(Node::Kind::list, offset, tokenText(event.sequence_start.anchor));
       case FYET_MAPPING_END:
       case FYET_SEQUENCE_END:
         return builder.end();
       case FYET_SCALAR: {
         fy_token* const value = event.scalar.value;
         const bool isPlain = !value || fy_token_scalar_style(value) == FYSS_PLAIN;
-        return builder.addScalar(tokenText(value), isPlain, place, tokenText(event.scalar.anchor));
+        return builder.addScalar(tokenText(value), isPlain, offset, tokenText(event.scalar.anchor));
       }
       case FYET_ALIAS:
-        return builder.addAlias(tokenText(event.alias.anchor), place - 1);  // at the star
+        return builder.addAlias(tokenText(event.alias.anchor), offset - 1);  // at the star
       default:
         return;
     }
@@ -182,6 +186,7 @@ class YamlParser {
   };
 
   std::string_view text_;
+  Place start_;
   std::unique_ptr<fy_diag, Destroyer> diagnostics_;
   std::unique_ptr<fy_parser, Destroyer> parser_;
 };
@@ -197,16 +202,14 @@ void refuseDirectives(std::string_view text) {
 
 }  // namespace
 
-NodeRef readYaml(std::string_view text, const std::string& path) {
-  Mistakes mistakes;
+NodeRef readYaml(std::string_view text, Place begin, Mistakes& mistakes) {
   try {
     refuseDirectives(text);
-    return YamlParser(text).read();
+    return YamlParser(text, begin).read();
   } catch (const YamlRefusal& refusal) {
-    mistakes.add(refusal.place, refusal.message);
+    mistakes.add(begin + refusal.offset, refusal.message);
   }
-  mistakes.throwIfAny(path, text);
-  return nullptr;  // not reached
+  return nullptr;
 }
 
 }  // namespace qz::tools::steps

@@ -28,8 +28,8 @@ struct Node {
   std::size_t size = 1;  ///< how many nodes it holds, those of aliases each time
 };
 
-/// Reads the only document of `text`. Throws a SourceRefused, which names `path`, if the text is
-/// not YAML, or if its aliases repeat much more than is written.
-NodeRef readYaml(std::string_view text, const std::string& path);
+/// Reads the only document of `text`, whose first byte is at `begin`. Null, and a mistake, if the
+/// text is not YAML, or if its aliases repeat much more than is written.
+NodeRef readYaml(std::string_view text, Place begin, Mistakes& mistakes);
 
 }  // namespace qz::tools::steps

@@ -1,16 +1,22 @@
 // SPDX-License-Identifier: MIT
-// Waits for changes of the files in a folder.
+// Waits for changes of the files in folders.
 #pragma once
 
 #include <functional>
+#include <set>
 #include <string>
 
 namespace qz::tools {
 
-/// Calls `act`, and calls it again whenever a file in the folder was written, made or removed since
-/// the call before; until `act` answers NO. What `act` itself writes to `output` is no such change.
-/// Looks five times a second.
-void watchFolder(const std::string& folder, const std::string& output,
-                 const std::function<bool()>& act);
+/// Sleeps for a fifth of a second.
+void sleepShortly();
+
+/// Calls `act`, and calls it again whenever a file in the folders was written, made or removed
+/// since the call before. `act` returns the folders to watch from then on; none ends this. The
+/// files `outputs`, which `act` itself writes, are not watched. `rest` passes the time between two
+/// looks.
+void watchFolders(std::set<std::string> folders, const std::set<std::string>& outputs,
+                  const std::function<std::set<std::string>()>& act,
+                  const std::function<void()>& rest = sleepShortly);
 
 }  // namespace qz::tools

@@ -2,6 +2,7 @@
 // The property lists that the tool reads.
 #include "tools/support/input_file.hpp"
 
+#include <algorithm>
 #include <cerrno>
 #include <cstring>
 #include <filesystem>
@@ -50,12 +51,12 @@ InputFile::InputFile(std::string path, std::string_view what, ExitStatus refusal
 }
 
 InputFile::InputFile(std::string path, std::string_view what, toolkit::ValueRef<> root,
-                     toolkit::ValueOffsets offsets, std::string_view text)
+                     std::vector<WrittenFile> written)
     : path_(std::move(path)),
       what_(what),
       refusal_(ExitStatus::badInput),
       root_(std::move(root)),
-      positions_(std::move(offsets), text) {}
+      written_(std::move(written)) {}
 
 InputFile::InputFile(std::string path, std::string_view what, std::string_view contents)
     : path_(std::move(path)), what_(what), refusal_(ExitStatus::badInput) {
@@ -64,7 +65,8 @@ InputFile::InputFile(std::string path, std::string_view what, std::string_view c
 
 void InputFile::read(std::string_view contents) {
   if (contents.empty()) throw Failure(refusal_, path_ + ": an empty file; expected " + what_);
-  const auto result = toolkit::readPropertyList(contents, &positions_);
+  written_.push_back({.path = path_});
+  const auto result = toolkit::readPropertyList(contents, &written_.back().positions);
   if (const auto& refused = result.refusal) {
     throw Failure(refusal_, placeIn(path_, refused->position) + ": " + printable(refused->reason) +
                                 " (read as " + std::string(toolkit::description(refused->format)) +
@@ -81,8 +83,25 @@ toolkit::ValueRef<toolkit::Dictionary> InputFile::dictionary() const {
   return dictionary;
 }
 
+const WrittenFile* InputFile::writtenFileOf(const toolkit::ValueRef<>& value) const {
+  const auto found = std::find_if(written_.begin(), written_.end(), [&](const WrittenFile& file) {
+    return file.positions.of(*value).has_value();
+  });
+  return found == written_.end() ? nullptr : &*found;
+}
+
+const std::string& InputFile::pathOf(const toolkit::ValueRef<>& value) const {
+  const WrittenFile* const file = writtenFileOf(value);
+  return file ? file->path : path_;
+}
+
+std::optional<toolkit::Position> InputFile::positionOf(const toolkit::ValueRef<>& value) const {
+  const WrittenFile* const file = writtenFileOf(value);
+  return file ? file->positions.of(*value) : std::nullopt;
+}
+
 std::string InputFile::placeOf(const toolkit::ValueRef<>& value) const {
-  return placeIn(path_, positions_.of(*value));
+  return placeIn(pathOf(value), positionOf(value));
 }
 
 void InputFile::fail(const toolkit::ValueRef<>& value, const std::string& message) const {

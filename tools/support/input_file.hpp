@@ -5,6 +5,7 @@
 
 #include <string>
 #include <string_view>
+#include <vector>
 
 #include "qz/property_list/collections.hpp"
 #include "qz/property_list/positions.hpp"
@@ -12,6 +13,12 @@
 #include "tools/support/failure.hpp"
 
 namespace qz::tools {
+
+/// A file in which values were written.
+struct WrittenFile {
+  std::string path{};
+  toolkit::PositionTable positions{};
+};
 
 class InputFile {
  public:
@@ -21,19 +28,20 @@ class InputFile {
   /// Reads the contents that the file at `path` has, or that have been made from it.
   InputFile(std::string path, std::string_view what, std::string_view contents);
 
-  /// Takes a property list that was made of a text: of `text`, at `offsets`.
+  /// Takes a property list that was made of other files, in which its values were written.
   InputFile(std::string path, std::string_view what, toolkit::ValueRef<> root,
-            toolkit::ValueOffsets offsets, std::string_view text);
+            std::vector<WrittenFile> written);
 
   const std::string& path() const { return path_; }
   const toolkit::ValueRef<>& root() const { return root_; }
   /// Returns the root; throws a Failure if it is not a dictionary.
   toolkit::ValueRef<toolkit::Dictionary> dictionary() const;
 
-  /// Returns the position of a value of this file; absent for any other value.
-  std::optional<toolkit::Position> positionOf(const toolkit::ValueRef<>& value) const {
-    return positions_.of(*value);
-  }
+  /// Returns the path of the file in which a value was written; that of this file for any other
+  /// value.
+  const std::string& pathOf(const toolkit::ValueRef<>& value) const;
+  /// Returns the position of a value in that file; absent for any other value.
+  std::optional<toolkit::Position> positionOf(const toolkit::ValueRef<>& value) const;
   /// Returns the place of a value of this file, such as "intro.plist:12:5"; the path alone for any
   /// other value.
   std::string placeOf(const toolkit::ValueRef<>& value) const;
@@ -42,12 +50,13 @@ class InputFile {
 
  private:
   void read(std::string_view contents);
+  const WrittenFile* writtenFileOf(const toolkit::ValueRef<>& value) const;
 
   std::string path_;
   std::string what_;
   ExitStatus refusal_;
   toolkit::ValueRef<> root_;
-  toolkit::PositionTable positions_;
+  std::vector<WrittenFile> written_;
 };
 
 /// Returns the contents of the file at `path`. Throws a Failure if it cannot be read; `what` names

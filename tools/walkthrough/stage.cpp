@@ -32,7 +32,7 @@ StagePlan planStage(const StageOptions& options, const QZ_Plist_State_Parser::Di
     checkGuiDescription(file);
     plan.description = file.dictionary();
   } else if (options.window) {
-    plan.host = readHostWindow(*options.window);
+    plan.host = options.host ? *options.host : readHostWindow(*options.window);
     plan.hostFile = *options.window;
   } else {
     plan.host = standInWindow(script);

@@ -20,6 +20,8 @@ inline constexpr const char* noFile = "/dev/null/no-script";
 /// the script itself.
 struct StageOptions {
   std::optional<std::string> window;  ///< path of the host's window; or
+  /// The host's window, if that file has been read already; Qt reads forms on one thread only.
+  std::shared_ptr<const HostWindow> host;
   std::optional<std::string> assets;  ///< path of a description from which the engine builds one
   bool sheet = false;                 ///< show it as a sheet over another window of the host
   Names names{};                      ///< of the script's source
