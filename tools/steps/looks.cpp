@@ -173,18 +173,6 @@ Look everyStepLook(const Tour& tour) {
   return completeLook(tour, nothing, true);
 }
 
-void judgeBackgrounds(const Tour& tour, Mistakes& mistakes) {
-  const bool isEverywhere = tour.everyStep.background.has_value();
-  const auto hasNone = [](const Step& step) { return !step.words.background; };
-  const auto without = std::find_if(tour.steps.begin(), tour.steps.end(), hasNone);
-  const bool isSomewhere = !std::all_of(tour.steps.begin(), tour.steps.end(), hasNone);
-  if (isEverywhere || !isSomewhere || without == tour.steps.end()) return;
-  mistakes.add(without->place,
-               "the step " + quote(without->name) +
-                   " would keep the background of the step before, because no command "
-                   "takes it away; expected “background” here or under “every step”");
-}
-
 /// A state that the host made neither on nor off cannot be set again.
 void judgeStates(const Tour& tour, Mistakes& mistakes) {
   for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
@@ -201,33 +189,8 @@ void judgeStates(const Tour& tour, Mistakes& mistakes) {
   }
 }
 
-/// A picture cannot be taken out of an image view that the user sees.
-void judgePictures(const Tour& tour, Mistakes& mistakes) {
-  for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
-    if (rowOf(tour.controls[i].kind).caption != Caption::imageName || tour.controls[i].caption)
-      continue;
-    const auto hasPicture = [&](const Step& step) {
-      return merged(tour.everyStep.controls[i], step.words.controls[i]).content.has_value();
-    };
-    if (std::none_of(tour.steps.begin(), tour.steps.end(), hasPicture)) continue;
-    for (const Step& step : tour.steps) {
-      const ControlWords words = merged(tour.everyStep.controls[i], step.words.controls[i]);
-      if (hasPicture(step) || !words.isShown.value_or(false)) continue;
-      mistakes.add(
-          words.place == 0 ? step.place : words.place,
-          "at the step " + quote(step.name) + " " + quote(tour.controls[i].name) +
-              " is shown without a picture, but no command takes the picture of another step "
-              "out; expected “picture” or “hide”");
-    }
-  }
-}
-
 void judgeLooks(const Tour& tour, Mistakes& mistakes) {
-  judgeBackgrounds(tour, mistakes);
   judgeStates(tour, mistakes);
-  judgePictures(tour, mistakes);
-  std::vector<Place> redAt(tour.controls.size(), 0);
-  std::vector<bool> plainSomewhere(tour.controls.size(), false);
   for (StepIndex step = 0; step < tour.steps.size(); ++step) {
     Look look = lookOf(tour, step, true);
     for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
@@ -244,18 +207,7 @@ void judgeLooks(const Tour& tour, Mistakes& mistakes) {
                                 " leads nowhere; expected “press” with a step, “back”, “end” or "
                                 "“nothing”");
       }
-      if (words.isRed) {
-        redAt[i] = words.place;
-      } else {
-        plainSomewhere[i] = true;
-      }
     }
-  }
-  for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
-    if (redAt[i] == 0 || !plainSomewhere[i]) continue;
-    mistakes.add(redAt[i],
-                 "no command takes the red from a button again; expected “background: red” "
-                 "under “every step”, or at none");
   }
 }
 
