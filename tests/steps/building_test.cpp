@@ -60,6 +60,25 @@ TEST(Building, NamesEveryTagAndEveryListThatLeadsToAStep) {
   EXPECT_EQ(steps, (std::multiset<std::string>{"a", "a", "a", "b"}));
 }
 
+TEST(Building, ControlsThatShareATagGetTagsOfTheirOwn) {
+  const SourceFolder folder;
+  folder.write("host.plist", R"((
+    { class = NSTextField; frame = (0, 0, 90, 30); }, { class = NSTextField; frame = (0, 30, 90, 30); },
+    { class = NSTextField; frame = (0, 60, 90, 30); }, { class = NSButton; tag = 4; frame = (0, 90, 90, 30); }))");
+  folder.write("tour.yaml",
+               "window: host.plist\ncontrols: {first: 0, third: {tag: 0, number: 3}, next: 4}\n"
+               "steps: {a: {first: One, third: Three, next: {press: end}}}\n");
+  const auto script = openScript("tour.yaml");
+  std::set<std::string> controls;
+  for (const auto& [tag, name] : script.names().controls) {
+    if (tag != 0) controls.insert(name);
+  }
+  EXPECT_EQ(controls, (std::set<std::string>{"first", "third", "next"}));
+  const std::string list = script.file.dictionary()->objectForKey("-1")->description();
+  const auto retags = list.find("SET_TAG_FOR_OBJECT_ID");
+  EXPECT_LT(retags, list.find("SET_TEXT_FOR_OBJECT_ID")) << list;
+}
+
 TEST(Building, PositionsAreThoseOfTheSource) {
   const SourceFolder folder;
   const auto script = folder.open("steps:\n  a: {text: Hello, next: {press: end}}\n");

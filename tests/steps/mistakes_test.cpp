@@ -97,18 +97,15 @@ TEST(Mistakes, OfTheWholeSourceHavePlaces) {
         "“back”, "
         "“end” or “nothing”"}},
       {"steps: {a: {next: {press: b, background: red}}, b: {next: {press: end}}}",
-       {"3:13: no command takes the red from a button again; expected “background: red” under "
-        "“every "
-        "step”, or at none"}},
+       {"3:49: the step “b” would keep what a step before it shows, because no command takes away "
+        "the red of “next”; expected “background: red” here or under “every step”"}},
       {"steps: {a: {background: sea, next: {press: b}}, b: {next: {press: end}}}",
-       {"3:49: the step “b” would keep the background of the step before, because no command takes "
-        "it "
-        "away; expected “background” here or under “every step”"}},
-      {"steps: {a: {picture: sea, next: {press: b}}, b: {picture: {shown: yes}, next: {press: "
-       "end}}}",
-       {"3:50: at the step “b” “picture” is shown without a picture, but no command takes the "
-        "picture "
-        "of another step out; expected “picture” or “hide”"}},
+       {"3:49: the step “b” would keep what a step before it shows, because no command takes away "
+        "the background; expected “background” here or under “every step”"}},
+      {"steps: {a: {picture: sea, next: {press: b}}, b: {next: {press: c}}, c: {picture: {shown: "
+       "yes}, next: {press: end}}}",
+       {"3:69: the step “c” would keep what a step before it shows, because no command takes away "
+        "the picture of “picture”; expected “picture” or “hide”"}},
   });
 }
 

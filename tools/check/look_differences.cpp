@@ -8,12 +8,8 @@
 
 namespace qz::tools::check {
 
-LookComparison::LookComparison(const Exploration& exploration) : exploration_(exploration) {
-  std::size_t part = exploration.firstFlashPart();
-  for (const std::string& key : exploration.setting().flashKeys) {
-    flashParts_.emplace(std::stoll(key), part++);
-  }
-}
+LookComparison::LookComparison(const Exploration& exploration)
+    : exploration_(exploration), flashing_(exploration) {}
 
 void LookComparison::see(std::uint32_t place, std::uint32_t list, std::uint32_t look,
                          const Occasion& occasion) {
@@ -23,7 +19,8 @@ void LookComparison::see(std::uint32_t place, std::uint32_t list, std::uint32_t 
   const Looks::Parts& parts = exploration_.looks().parts(look);
   for (const std::size_t control : controlsWithSeveralLooks(place)) {
     if (format.control(bytes, control).hidden) continue;
-    seeControl(place, list, control, {{parts[control], flashes(place, control, parts)}, occasion});
+    seeControl(place, list, control,
+               {{parts[control], flashing_.flashes(place, control, parts)}, occasion});
   }
 }
 
@@ -42,29 +39,10 @@ std::vector<std::size_t> LookComparison::controlsWithSeveralLooks(std::uint32_t 
   std::vector<std::size_t> controls;
   if (several.empty()) return controls;
   for (std::size_t control = 0; control < format.controls(); ++control) {
-    const auto flashPart = flashParts_.find(format.control(exploration_.place(place), control).tag);
-    if (isOneOfThem(control) ||
-        (flashPart != flashParts_.end() && isOneOfThem(flashPart->second))) {
-      controls.push_back(control);
-    }
+    const auto flashPart = flashing_.partOf(place, control);
+    if (isOneOfThem(control) || (flashPart && isOneOfThem(*flashPart))) controls.push_back(control);
   }
   return controls;
-}
-
-bool LookComparison::flashes(std::uint32_t place, std::size_t control,
-                             const Looks::Parts& parts) const {
-  const auto& format = exploration_.format();
-  const std::uint8_t* const bytes = exploration_.place(place);
-  const Tag tag = format.control(bytes, control).tag;
-  const auto flashPart = flashParts_.find(tag);
-  if (flashPart == flashParts_.end() || parts[flashPart->second] != flashingAllowed + notedYes ||
-      !drivers::isButton(exploration_.setting().kinds[control])) {
-    return false;
-  }
-  for (std::size_t behind = 0; behind < control; ++behind) {  // only the backmost one flashes
-    if (format.control(bytes, behind).tag == tag) return false;
-  }
-  return true;
 }
 
 // A state that the user made does not count.

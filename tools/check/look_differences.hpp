@@ -7,11 +7,11 @@
 #include <map>
 #include <set>
 #include <tuple>
-#include <unordered_map>
 #include <utility>
 #include <vector>
 
 #include "tools/exploration/exploration.hpp"
+#include "tools/exploration/flashing.hpp"
 
 namespace qz::tools::check {
 
@@ -48,14 +48,13 @@ class LookComparison {
   };
 
   std::vector<std::size_t> controlsWithSeveralLooks(std::uint32_t place) const;
-  bool flashes(std::uint32_t place, std::size_t control, const Looks::Parts& parts) const;
   bool differ(const Appearance& one, const Appearance& other) const;
   std::string wordsFor(const Appearance& one, const Appearance& other) const;
   void seeControl(std::uint32_t place, std::uint32_t list, std::size_t control, const Seen& seen);
   void add(std::uint32_t place, const LookDifference& difference);
 
   const Exploration& exploration_;
-  std::unordered_map<Tag, std::size_t> flashParts_;  // of the look, by the tag that flashes
+  Flashing flashing_;
   std::map<std::tuple<std::uint32_t, std::uint32_t, std::size_t>, std::vector<Seen>> seen_;
   using Cause = std::pair<std::uint32_t, std::size_t>;  // list and control
   std::map<Cause, LookDifference> differences_;

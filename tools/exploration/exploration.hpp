@@ -86,6 +86,8 @@ class Exploration {
   /// Returns the path of a visit, or of a visit and a move out of it.
   Path path(std::uint32_t visit) const;
   Path path(const Occasion& occasion) const;
+  /// Returns a move out of a place.
+  Step stepFrom(std::uint32_t place, Move move) const;
   /// Returns the number of moves after the start.
   std::size_t depth(std::uint32_t visit) const;
 
@@ -161,7 +163,6 @@ class Exploration {
   std::uint32_t numberOf(const PendingTimers& timers);
   std::optional<std::uint32_t> knownNumberOf(const PendingTimers& timers) const;
   Step step(const Visit& visit) const;
-  Step stepFrom(std::uint32_t place, Move move) const;
   void addEdges(const std::vector<std::uint32_t>& targets);
   std::size_t edgeStart(std::uint32_t place) const;
 

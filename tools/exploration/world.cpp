@@ -359,7 +359,8 @@ PendingTimers World::pendingAtTheEnd() const {
 // The text of other controls than text fields is not seen, nor is the state of a push button.
 ViewLook World::lookOf(const Control& control) const {
   const bool showsState = !control.button || control.showsState;
-  ViewLook look{control.node->save(), control.hasUsersState || !showsState};
+  const bool isUsers = control.hasUsersState && !setting_.exactStates;
+  ViewLook look{control.node->save(), isUsers || !showsState};
   if (!control.view->asTextField()) look.view.text = {};
   return look;
 }

@@ -33,6 +33,7 @@ struct Setting {
   std::vector<bool> watchedLists{};    ///< by index: arrivals say whether the move ran it; or empty
   bool tracksTaggers = false;  ///< which element gave each control its tag is a part of the look
   bool wholeLooks = false;     ///< what two controls show together matters, not only each by itself
+  bool exactStates = false;    ///< the states that the user made are parts of the look
 };
 
 /// Reads from a world of its own what all worlds share.

@@ -7,6 +7,7 @@
 #include <algorithm>
 #include <set>
 
+#include "tools/steps/lasting_looks.hpp"
 #include "tools/steps/plan.hpp"
 #include "tools/steps/script_writer.hpp"
 
@@ -86,7 +87,7 @@ class Compiler {
     List list;
     for (const Varying& each : plan_.varying()) {
       if (!canBeShared(scene, each)) continue;
-      setValues(list, valueAt(scene, each), tour_.controls[each.control].tag, plan_.placeOf(scene));
+      setValues(list, valueAt(scene, each), plan_.ownTag(each.control), plan_.placeOf(scene));
     }
     return list;
   }
@@ -244,6 +245,7 @@ Built build(const Tour& tour, const std::vector<StepIndex>& starts, Mistakes& mi
   judgeLooks(tour, mistakes);
   Scenes scenes = findScenes(tour, starts, mistakes);
   judgeReach(tour, scenes, mistakes);
+  judgeLastingLooks(tour, scenes, mistakes);
   if (!mistakes.isEmpty()) return {};
   return Compiler(tour, std::move(scenes)).run();
 }

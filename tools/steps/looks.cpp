@@ -175,18 +175,6 @@ Look everyStepLook(const Tour& tour) {
 
 namespace {
 
-void judgeBackgrounds(const Tour& tour, Mistakes& mistakes) {
-  const bool isEverywhere = tour.everyStep.background.has_value();
-  const auto hasNone = [](const Step& step) { return !step.words.background; };
-  const auto without = std::find_if(tour.steps.begin(), tour.steps.end(), hasNone);
-  const bool isSomewhere = !std::all_of(tour.steps.begin(), tour.steps.end(), hasNone);
-  if (isEverywhere || !isSomewhere || without == tour.steps.end()) return;
-  mistakes.add(without->place,
-               "the step " + quote(without->name) +
-                   " would keep the background of the step before, because no command "
-                   "takes it away; expected “background” here or under “every step”");
-}
-
 /// A state that the host made neither on nor off cannot be set again.
 void judgeStates(const Tour& tour, Mistakes& mistakes) {
   for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
@@ -200,27 +188,6 @@ void judgeStates(const Tour& tour, Mistakes& mistakes) {
                                     quote(tour.controls[i].name) +
                                     " is mixed, as in the host's window, which no command sets; "
                                     "expected “state” here or under “every step”");
-  }
-}
-
-/// A picture cannot be taken out of an image view that the user sees.
-void judgePictures(const Tour& tour, Mistakes& mistakes) {
-  for (ControlIndex i = 0; i < tour.controls.size(); ++i) {
-    if (rowOf(tour.controls[i].kind).caption != Caption::imageName || tour.controls[i].caption)
-      continue;
-    const auto hasPicture = [&](const Step& step) {
-      return merged(tour.everyStep.controls[i], step.words.controls[i]).content.has_value();
-    };
-    if (std::none_of(tour.steps.begin(), tour.steps.end(), hasPicture)) continue;
-    for (const Step& step : tour.steps) {
-      const ControlWords words = merged(tour.everyStep.controls[i], step.words.controls[i]);
-      if (hasPicture(step) || !words.isShown.value_or(false)) continue;
-      mistakes.add(
-          words.place == 0 ? step.place : words.place,
-          "at the step " + quote(step.name) + " " + quote(tour.controls[i].name) +
-              " is shown without a picture, but no command takes the picture of another step "
-              "out; expected “picture” or “hide”");
-    }
   }
 }
 
@@ -241,29 +208,11 @@ void judgePresses(const Tour& tour, Mistakes& mistakes) {
   }
 }
 
-/// A button that is red at one step stays red.
-void judgeRed(const Tour& tour, Mistakes& mistakes) {
-  for (ControlIndex c = 0; c < tour.controls.size(); ++c) {
-    if (tour.everyStep.controls[c].isRed) continue;
-    const auto isPlain = [&](const Step& step) { return !step.words.controls[c].isRed; };
-    const auto red = std::find_if_not(tour.steps.begin(), tour.steps.end(), isPlain);
-    if (red == tour.steps.end() || std::none_of(tour.steps.begin(), tour.steps.end(), isPlain)) {
-      continue;
-    }
-    mistakes.add(red->words.controls[c].place,
-                 "no command takes the red from a button again; expected “background: red” "
-                 "under “every step”, or at none");
-  }
-}
-
 }  // namespace
 
 void judgeLooks(const Tour& tour, Mistakes& mistakes) {
-  judgeBackgrounds(tour, mistakes);
   judgeStates(tour, mistakes);
-  judgePictures(tour, mistakes);
   judgePresses(tour, mistakes);
-  judgeRed(tour, mistakes);
 }
 
 }  // namespace qz::tools::steps

@@ -58,8 +58,8 @@ Look lookOf(const Tour& tour, StepIndex step, bool canGoBack);
 /// Returns what it would show at a step that says nothing.
 Look everyStepLook(const Tour& tour);
 
-/// Adds a mistake for every button that a user can press in vain, and for every look that cannot be
-/// left again.
+/// Adds a mistake for every button that a user can press in vain, and for every state that cannot
+/// be set again.
 void judgeLooks(const Tour& tour, Mistakes& mistakes);
 
 }  // namespace qz::tools::steps

@@ -22,6 +22,7 @@ Plan::Plan(const Tour& tour, Scenes scenes)
   for (const Scene& scene : scenes_.list) addLook(scene);
   findWhatChanges();
   chooseOwnTags();
+  chooseOwnUses();
   chooseTags();
 }
 
@@ -77,8 +78,28 @@ std::optional<Plan::Everywhere> Plan::everywhere(SceneIndex scene, ControlIndex 
   return Everywhere::doesNothing;
 }
 
-/// A button keeps its own tag where it does one thing that is the same in every scene.
+/// Commands find only the back-most of the controls that share a tag.
+bool Plan::sharesTagWithName(ControlIndex control) const {
+  bool isBehind = false;
+  bool isNamed = false;
+  for (const Control& each : tour_.controls) {
+    if (each.tag != tour_.controls[control].tag) continue;
+    isNamed |= isBehind && !each.name.empty();
+    isBehind = true;
+  }
+  return isNamed;
+}
+
 void Plan::chooseOwnTags() {
+  for (ControlIndex i = 0; i < tour_.controls.size(); ++i) {
+    const Control& control = tour_.controls[i];
+    const std::string number = control.name.empty() ? std::to_string(i) : control.name;
+    ownTags_.push_back(sharesTagWithName(i) ? numbers_.of("control\t" + number) : control.tag);
+  }
+}
+
+/// A button keeps its own tag where it does one thing that is the same in every scene.
+void Plan::chooseOwnUses() {
   ownUse_.resize(tour_.controls.size());
   for (SceneIndex scene = 0; scene < scenes_.list.size(); ++scene) {
     for (ControlIndex i = 0; i < tour_.controls.size(); ++i) {
@@ -103,7 +124,7 @@ void Plan::chooseTags() {
 }
 
 Tag Plan::tagFor(SceneIndex scene, ControlIndex control) {
-  const Tag own = tour_.controls[control].tag;
+  const Tag own = ownTag(control);
   if (!scenes_.list[scene].presses[control]) return own;
   // A tag flashes for the whole walk-through or never.
   const bool flashes = look(scene).controls[control].flashes;
@@ -116,7 +137,7 @@ Tag Plan::tagFor(SceneIndex scene, ControlIndex control) {
 
 bool Plan::hasOwnTagEverywhere(ControlIndex control) const {
   return std::all_of(tags_.begin(), tags_.end(), [&](const std::vector<Tag>& tags) {
-    return tags[control] == tour_.controls[control].tag;
+    return tags[control] == ownTag(control);
   });
 }
 

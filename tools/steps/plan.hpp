@@ -51,6 +51,9 @@ class Plan {
 
   /// Returns the tag of a control in a scene.
   Tag tag(SceneIndex scene, ControlIndex control) const { return tags_[scene][control]; }
+  /// Returns the tag that a control has where it needs no other: that of the window, unless
+  /// another control has it too.
+  Tag ownTag(ControlIndex control) const { return ownTags_[control]; }
   /// Whether the control has its own tag in every scene.
   bool keepsTag(ControlIndex control) const { return keepsTag_[control]; }
   /// Returns the tags that flash, in the order of the scenes.
@@ -73,6 +76,8 @@ class Plan {
   bool changes(ControlIndex control, Property property) const;
   bool isStateSaid(ControlIndex control) const;
   void chooseOwnTags();
+  void chooseOwnUses();
+  bool sharesTagWithName(ControlIndex control) const;
   void chooseTags();
   std::optional<Everywhere> everywhere(SceneIndex scene, ControlIndex control) const;
   Tag tagFor(SceneIndex scene, ControlIndex control);
@@ -90,6 +95,7 @@ class Plan {
   std::vector<Varying> varying_;
   bool changesBackground_ = false;
   Numbers numbers_;
+  std::vector<Tag> ownTags_;                       // of the controls
   std::vector<std::optional<Everywhere>> ownUse_;  // of each control's own tag
   std::vector<std::vector<Tag>> tags_;             // of the controls, in each scene
   std::vector<Tag> flashing_;

@@ -37,18 +37,6 @@ Control controlOf(const drivers::ViewPicture& view) {
   return control;
 }
 
-/// Returns the controls of the window that the options name, back to front.
-std::vector<Control> controlsOf(const walkthrough::StageOptions& options, const std::string& path) {
-  const auto driver = requireDriver("memory");
-  driver->setResourcePath(fs::path(path).parent_path().string());
-  const auto plan = walkthrough::planStage(options, {}, path);
-  walkthrough::Stage stage(*driver, plan);
-  const auto picture = walkthrough::takePicture(*driver, stage.engine(), stage.title());
-  std::vector<Control> controls;
-  for (const auto& control : picture.controls) controls.push_back(controlOf(control.view));
-  return controls;
-}
-
 /// Reads the parts of a source in the order in which they need each other, which is not always that
 /// of the file.
 class SourceReader {
@@ -105,22 +93,65 @@ class SourceReader {
 
   void readControls() {
     for (const auto& [name, value] : entriesOf(*part("controls"), "names with tags", mistakes_)) {
-      const auto tag =
-          numberOf(*value, -greatestTag, greatestTag, "the tag of a control", mistakes_);
-      if (!tag) continue;
-      Control* found = nullptr;  // the back-most, as commands find it
-      for (Control& control : tour_.controls) {
-        if (control.tag == *tag && !found) found = &control;
-      }
+      const auto which = readControl(*value);
+      if (!which) continue;
+      Control* const found = findControl(*which);
       if (!found) {
-        mistakes_.add(value->place, "the window has no control with the tag " + value->text);
+        mistakes_.add(value->place, "the window has no " + wordsFor(*which));
       } else if (!found->name.empty()) {
-        mistakes_.add(name->place, "the control with the tag " + value->text + " is called " +
-                                       quote(found->name) + " already");
+        mistakes_.add(name->place,
+                      "the " + wordsFor(*which) + " is called " + quote(found->name) + " already");
       } else {
         found->name = name->text;
       }
     }
+  }
+
+  /// A tag, and how many controls behind have the same.
+  struct WhichControl {
+    int tag = 0;
+    int number = 1;  ///< from 1: the back-most, as commands find it
+  };
+
+  std::optional<WhichControl> readControl(const Node& value) {
+    constexpr int mostControls = 10000;
+    WhichControl which;
+    const Node* tagNode = value.kind == Node::Kind::table ? nullptr : &value;
+    if (!tagNode) {
+      for (const auto& [word, each] : entriesOf(value, "a table", mistakes_)) {
+        if (word->text == "tag") {
+          tagNode = each.get();
+        } else if (word->text == "number") {
+          which.number =
+              numberOf(*each, 1, mostControls,
+                       "which of the controls with the tag, from 1 at the back", mistakes_)
+                  .value_or(1);
+        } else {
+          mistakes_.add(word->place, "expected “tag” or “number”, found " + foundWords(*word));
+        }
+      }
+    }
+    if (!tagNode) {
+      mistakes_.add(value.place, "expected “tag” with the tag of a control");
+      return std::nullopt;
+    }
+    const auto tag =
+        numberOf(*tagNode, -greatestTag, greatestTag, "the tag of a control", mistakes_);
+    if (!tag) return std::nullopt;
+    which.tag = *tag;
+    return which;
+  }
+
+  Control* findControl(WhichControl which) {
+    for (Control& control : tour_.controls) {
+      if (control.tag == which.tag && --which.number == 0) return &control;
+    }
+    return nullptr;
+  }
+
+  static std::string wordsFor(const WhichControl& which) {
+    const std::string with = "control with the tag " + std::to_string(which.tag);
+    return which.number == 1 ? with : with + " and the number " + std::to_string(which.number);
   }
 
   void readSteps() {
@@ -200,6 +231,16 @@ class SourceReader {
 
 }  // namespace
 
+std::vector<Control> controlsOf(const walkthrough::StagePlan& plan, const std::string& resources) {
+  const auto driver = requireDriver("memory");
+  driver->setResourcePath(resources);
+  walkthrough::Stage stage(*driver, plan);
+  const auto picture = walkthrough::takePicture(*driver, stage.engine(), stage.title());
+  std::vector<Control> controls;
+  for (const auto& control : picture.controls) controls.push_back(controlOf(control.view));
+  return controls;
+}
+
 bool isSourcePath(const std::string& path) {
   return path.ends_with(".yaml") || path.ends_with(".yml");
 }
@@ -210,8 +251,9 @@ Source readSource(const std::string& path, const Translate& translate) {
     throw Failure(ExitStatus::badInput,
                   path + ": cannot be read; expected a walk-through in steps");
   }
+  const std::string resources = fs::path(path).parent_path().string();
   const auto controls = [&](const walkthrough::StageOptions& stage) {
-    return controlsOf(stage, path);
+    return controlsOf(walkthrough::planStage(stage, {}, path), resources);
   };
   return readSourceText(path, *std::move(text), {controls, wholeFile}, translate);
 }

@@ -25,6 +25,10 @@ struct Source {
 /// Whether the file's name is that of a source: it ends with .yaml or .yml.
 bool isSourcePath(const std::string& path);
 
+/// Returns the controls of a window as its host made it, back to front. `resources` is the
+/// directory of the images.
+std::vector<Control> controlsOf(const walkthrough::StagePlan& plan, const std::string& resources);
+
 /// Returns the controls of the window that the options name, back to front.
 using ReadControls = std::function<std::vector<Control>(const walkthrough::StageOptions&)>;
 
