@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// What Qt does for walk-throughs in steps: forms as their windows, texts that are measured, pictures
-// for translators.
+// What Qt does for walk-throughs in steps: forms as their windows, texts that are measured,
+// pictures for translators.
 
 #include <gtest/gtest.h>
 
@@ -51,7 +51,8 @@ TEST(StepsTexts, AreMeasuredInTheirControls) {
        {ViewKind::button, ViewKind::toggle, ViewKind::popUpButton, ViewKind::textField}) {
     MeasuredView view(kind);
     EXPECT_EQ(view.with("Next"), MissingRoom{}) << drivers::rowOf(kind).name;
-    EXPECT_GT(view.with("Donaudampfschifffahrtsgesellschaft").width, 50) << drivers::rowOf(kind).name;
+    EXPECT_GT(view.with("Donaudampfschifffahrtsgesellschaft").width, 50)
+        << drivers::rowOf(kind).name;
     EXPECT_EQ(view.with(""), MissingRoom{}) << drivers::rowOf(kind).name;
   }
   MeasuredView text(ViewKind::textField);
@@ -85,8 +86,9 @@ TEST(StepsTexts, ThatDoNotFitAreNamedWithTheirStep) {
                "msgid \"End\"\nmsgstr \"Ende\"\n");
   const Result built = run(buildCommand, {"build", "tour.yaml", "--language", "de"});
   EXPECT_EQ(built.status, 0);
-  EXPECT_TRUE(built.err.starts_with("tour.yaml:4:20: warning: “Mit dem nächsten Schritt "
-                                    "fortfahren” (a, next) does not fit: the control lacks "))
+  EXPECT_TRUE(
+      built.err.starts_with("tour.yaml:4:20: warning: “Mit dem nächsten Schritt "
+                            "fortfahren” (a, next) does not fit: the control lacks "))
       << built.err;
   EXPECT_TRUE(built.err.ends_with(" points of width\n")) << built.err;
   EXPECT_EQ(std::count(built.err.begin(), built.err.end(), '\n'), 1) << built.err;

@@ -35,8 +35,9 @@ TEST(Includes, EntriesOfAllFilesAreJoined) {
   const IncludingFolder folder;
   folder.writeTour("[common.yaml, more.yaml]");
   folder.writeCommon("every step: {text: Same}\n");
-  folder.write("more.yaml", "include: common.yaml\nfragments: {f: {box: {state: on}}}\n"
-                            "steps: {b: {use: f, next: {press: a}}}\n");
+  folder.write("more.yaml",
+               "include: common.yaml\nfragments: {f: {box: {state: on}}}\n"
+               "steps: {b: {use: f, next: {press: a}}}\n");
   folder.write("tour.yaml", "include: [common.yaml, more.yaml]\nsteps: {a: {next: {press: b}}}\n");
   const Source source = readSource("tour.yaml");
   ASSERT_EQ(source.tour.steps.size(), 2U);
@@ -79,6 +80,10 @@ TEST(Includes, ThatCannotBeMadeAreMistakes) {
   EXPECT_EQ(mistakesOf("tour.yaml"),
             std::vector<std::string>{
                 "common.yaml:3:11: tour.yaml includes itself; expected another file"});
+  folder.writeTour("/dev/zero");
+  EXPECT_EQ(mistakesOf("tour.yaml"),
+            std::vector<std::string>{
+                "tour.yaml:1:10: /dev/zero: cannot be read; expected a part of a walk-through"});
   folder.writeTour("[comon.yaml, {}]");
   EXPECT_EQ(mistakesOf("tour.yaml"),
             (std::vector<std::string>{
@@ -93,7 +98,8 @@ TEST(Includes, ANameIsInOneFileOnly) {
   EXPECT_EQ(mistakesOf("tour.yaml"),
             std::vector<std::string>{
                 "common.yaml:3:9: “a” is also in tour.yaml:2:9; expected one entry of this name"});
-  folder.write("tour.yaml", "window: host.plist\ninclude: common.yaml\nsteps: {a: {next: {press: end}}}\n");
+  folder.write("tour.yaml",
+               "window: host.plist\ninclude: common.yaml\nsteps: {a: {next: {press: end}}}\n");
   folder.writeCommon();
   EXPECT_EQ(mistakesOf("tour.yaml"),
             std::vector<std::string>{"common.yaml:1:1: “window” is also in tour.yaml:1:9; expected "
@@ -108,7 +114,8 @@ TEST(Includes, AreNotNestedEndlessly) {
   folder.writeTour("0.yaml");
   const auto messages = mistakesOf("tour.yaml");
   ASSERT_FALSE(messages.empty());
-  EXPECT_EQ(messages.back(), "18.yaml:1:10: files include each other too deeply; expected at most 20 levels");
+  EXPECT_EQ(messages.back(),
+            "18.yaml:1:10: files include each other too deeply; expected at most 20 levels");
 }
 
 TEST(Includes, AreWatchedAlsoBeforeTheyCanBeRead) {

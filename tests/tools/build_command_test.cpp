@@ -26,7 +26,9 @@ class BuildCommand : public testing::Test {
     arguments.insert(arguments.begin(), {"build", "tour.yaml"});
     return run(buildCommand, arguments);
   }
-  static std::string contents(const std::string& path) { return wholeFile(path).value_or("absent"); }
+  static std::string contents(const std::string& path) {
+    return wholeFile(path).value_or("absent");
+  }
 
   steps::SourceFolder folder_;
 };
@@ -130,11 +132,12 @@ TEST_F(BuildCommand, TranscriptsSpeakOfStepsAndControls) {
 }
 
 TEST_F(BuildCommand, FindingsSpeakOfStepsAndControls) {
-  folder_.writeSource("steps:\n  a: {text: Hello, next: {press: b}}\n  b: {next: {press: nothing}}\n");
+  folder_.writeSource(
+      "steps:\n  a: {text: Hello, next: {press: b}}\n  b: {next: {press: nothing}}\n");
   const Result checked = run(checkCommand, {"check", "tour.yaml", "--witness", "found"});
   EXPECT_EQ(checked.status, 1);
-  for (const char* const part :
-       {"tour.yaml: warning: nothing that the user does", "help: let a press or a wait lead to the “end”\n"}) {
+  for (const char* const part : {"tour.yaml: warning: nothing that the user does",
+                                 "help: let a press or a wait lead to the “end”\n"}) {
     EXPECT_NE(checked.out.find(part), std::string::npos) << part << "\n" << checked.out;
   }
   EXPECT_EQ(checked.out.find("TERMINATE_PARSER"), std::string::npos) << checked.out;
@@ -150,12 +153,14 @@ TEST_F(BuildCommand, ExpectationsNameStepsAndControls) {
       << checked.out;
   EXPECT_NE(checked.out.find("expectations: 4 hold, 1 fail"), std::string::npos) << checked.out;
   folder_.write("check.expect", "can reach step c\n");
-  EXPECT_EQ(run(checkCommand, {"check", "tour.yaml"}).err,
-            "qz-walkthrough: check.expect:1:16: expected the name of a step of a source, found “c”\n");
+  EXPECT_EQ(
+      run(checkCommand, {"check", "tour.yaml"}).err,
+      "qz-walkthrough: check.expect:1:16: expected the name of a step of a source, found “c”\n");
   folder_.write("check.expect", "never hidden nxt\n");
-  EXPECT_EQ(run(checkCommand, {"check", "tour.yaml"}).err,
-            "qz-walkthrough: check.expect:1:14: expected the name of a control, found “nxt”; did you "
-            "mean \"next\"?\n");
+  EXPECT_EQ(
+      run(checkCommand, {"check", "tour.yaml"}).err,
+      "qz-walkthrough: check.expect:1:14: expected the name of a control, found “nxt”; did you "
+      "mean \"next\"?\n");
 }
 
 TEST_F(BuildCommand, ChecksStartAtStepsByName) {

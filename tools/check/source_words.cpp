@@ -10,7 +10,8 @@ namespace qz::tools::check {
 namespace {
 
 constexpr std::pair<std::string_view, std::string_view> helpOfCodes[] = {
-    {"dead-end", "show or enable a button whose “press” leads on, or let the step wait: “after 5 s”"},
+    {"dead-end",
+     "show or enable a button whose “press” leads on, or let the step wait: “after 5 s”"},
     {"trap", "let a press or a wait lead to a step from which the end can be reached"},
     {"no-end", "let a press or a wait lead to the “end”"},
     {"no-list", "give the button a name under “controls”, and say where a “press” leads"},
