@@ -29,9 +29,9 @@ struct Covered {
 std::vector<Covered> coveredScripts() {
   const std::string source = QZ_SOURCE_DIR;
   std::vector<Covered> all = {
-      {source + "/examples/first-steps/script.plist", source + "/examples/first-steps/host.plist",
+      {source + "/tests/data/scripts/first-steps.plist", source + "/examples/first-steps/host.plist",
        ""},
-      {source + "/examples/photo-import/script.plist", source + "/examples/photo-import/host.plist",
+      {source + "/tests/data/scripts/photo-import.plist", source + "/examples/photo-import/host.plist",
        ""},
       {source + "/examples/built-window/script.plist", "",
        source + "/examples/built-window/assets.plist"},

@@ -51,7 +51,8 @@ class LiftedScript {
  private:
   naive::StartedScript built() const {
     const auto controls = [&](const auto&) { return steps::controlsOf(plan_, resources_); };
-    const auto read = steps::readSourceText("source", lifted_.source, controls);
+    const auto nothing = [](const std::string&) { return std::nullopt; };
+    const auto read = steps::readSourceText("source", lifted_.source, {controls, nothing});
     steps::Mistakes mistakes;
     const auto built = steps::build(read.tour, {0}, mistakes);
     return {built.script, built.startKeys.front()};

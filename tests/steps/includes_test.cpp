@@ -80,6 +80,10 @@ TEST(Includes, ThatCannotBeMadeAreMistakes) {
   EXPECT_EQ(mistakesOf("tour.yaml"),
             std::vector<std::string>{
                 "common.yaml:3:11: tour.yaml includes itself; expected another file"});
+  folder.writeTour("/dev/zero");
+  EXPECT_EQ(mistakesOf("tour.yaml"),
+            std::vector<std::string>{
+                "tour.yaml:1:10: /dev/zero: cannot be read; expected a part of a walk-through"});
   folder.writeTour("[comon.yaml, {}]");
   EXPECT_EQ(mistakesOf("tour.yaml"),
             (std::vector<std::string>{

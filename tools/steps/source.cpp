@@ -37,6 +37,12 @@ Control controlOf(const drivers::ViewPicture& view) {
   return control;
 }
 
+/// Returns the text of an included file. A device, for example, has no end.
+std::optional<std::string> includedText(const std::string& path) {
+  std::error_code error;
+  return fs::is_regular_file(path, error) ? wholeFile(path) : std::nullopt;
+}
+
 /// Reads the parts of a source in the order in which they need each other, which is not always that
 /// of the file.
 class SourceReader {
@@ -255,7 +261,7 @@ Source readSource(const std::string& path, const Translate& translate) {
   const auto controls = [&](const walkthrough::StageOptions& stage) {
     return controlsOf(walkthrough::planStage(stage, {}, path), resources);
   };
-  return readSourceText(path, *std::move(text), {controls, wholeFile}, translate);
+  return readSourceText(path, *std::move(text), {controls, includedText}, translate);
 }
 
 Source readSourceText(const std::string& path, std::string text, const SourceInputs& inputs,
