@@ -29,7 +29,6 @@ class JointPlay {
   std::size_t pairs() const { return known_.size(); }
 
  private:
-  struct Both;
   using Path = std::vector<Move>;
 
   std::string arrive(const Path& path);

@@ -49,6 +49,13 @@ std::string tagWords(const std::vector<steps::Control>& controls, ControlIndex c
   return flowTable({{"tag", tag}, {"number", std::to_string(behind + 1)}});
 }
 
+/// Returns what follows the name of a control: its content alone if that is all.
+std::string controlWords(const std::vector<std::pair<std::string, std::string>>& entries) {
+  const bool isOnlyContent =
+      entries.size() == 1 && isContentWord(entries[0].first) && entries[0].first != "html";
+  return isOnlyContent ? entries[0].second : flowTable(entries);
+}
+
 /// Returns an entry of a block, on one line or, if that is too long, with each of its entries on a
 /// line of its own.
 std::string blockEntry(const std::string& key,
@@ -219,12 +226,6 @@ bool Draft::isShownUnsaid(StepIndex step, ControlIndex control) const {
   return host.isShown;
 }
 
-std::string Draft::controlWords(ControlIndex /*control*/, const Entries& entries) const {
-  const bool isOnlyContent =
-      entries.size() == 1 && isContentWord(entries[0].first) && entries[0].first != "html";
-  return isOnlyContent ? entries[0].second : flowTable(entries);
-}
-
 std::optional<std::pair<std::string, std::string>> Draft::waitWords(StepIndex step) const {
   const Step& here = walk_.steps[step];
   if (!here.seconds) return std::nullopt;
@@ -247,7 +248,7 @@ std::vector<std::pair<std::string, std::string>> Draft::stepWords(StepIndex step
   for (ControlIndex i = 0; i < controls_.size(); ++i) {
     const Entries& entries = said_[step][i];
     if (!entries.empty()) {
-      words.emplace_back(controlNames_[i], controlWords(i, entries));
+      words.emplace_back(controlNames_[i], controlWords(entries));
     } else if (isShown(step, i) && !isShownUnsaid(step, i)) {
       shown.push_back(controlNames_[i]);
     } else if (!isShown(step, i) && isShownUnsaid(step, i)) {
@@ -269,7 +270,7 @@ std::vector<std::pair<std::string, std::string>> Draft::everyStepWords() const {
   for (ControlIndex i = 0; i < controls_.size(); ++i) {
     if (isHidden_[i]) hidden.push_back(controlNames_[i]);
     if (!everywhere_[i].empty()) {
-      words.emplace_back(controlNames_[i], controlWords(i, everywhere_[i]));
+      words.emplace_back(controlNames_[i], controlWords(everywhere_[i]));
     }
   }
   if (!hidden.empty()) words.emplace_back("hide", flowList(hidden));

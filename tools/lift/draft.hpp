@@ -38,7 +38,6 @@ class Draft {
   bool isShown(StepIndex step, ControlIndex control) const;
   bool isShownUnsaid(StepIndex step, ControlIndex control) const;
   std::string lead(const Lead& lead) const;
-  std::string controlWords(ControlIndex control, const Entries& entries) const;
   std::optional<std::pair<std::string, std::string>> waitWords(StepIndex step) const;
   std::vector<std::pair<std::string, std::string>> stepWords(StepIndex step) const;
   std::vector<std::pair<std::string, std::string>> everyStepWords() const;

@@ -84,10 +84,10 @@ Sayings::Candidates Sayings::contents(ControlIndex control, const check::SavedVi
   Candidates candidates = {{}};
   switch (rowOf(stand_.controls()[control].kind).caption) {
     case Caption::title:
-      addTexts("title", view, view.title, candidates);
+      addTexts("title", view.title, candidates);
       break;
     case Caption::text:
-      addTexts("text", view, view.text, candidates);
+      addTexts("text", view.text, candidates);
       break;
     case Caption::imageName:
       if (view.image) {
@@ -101,8 +101,8 @@ Sayings::Candidates Sayings::contents(ControlIndex control, const check::SavedVi
   return candidates;
 }
 
-void Sayings::addTexts(const std::string& property, const check::SavedView& /*view*/,
-                       const AttributedString& text, Candidates& candidates) const {
+void Sayings::addTexts(const std::string& property, const AttributedString& text,
+                       Candidates& candidates) const {
   const bool isTitle = property == "title";
   const std::string& plain = text.string();
   const auto fonts = fontsOf(text);

@@ -33,12 +33,11 @@ class Sayings {
 
   std::optional<Properties> find(ControlIndex control, LookValue look);
   Candidates contents(ControlIndex control, const check::SavedView& view) const;
-  void addTexts(const std::string& property, const check::SavedView& view,
-                const toolkit::AttributedString& text, Candidates& candidates) const;
+  void addTexts(const std::string& property, const toolkit::AttributedString& text,
+                Candidates& candidates) const;
 
   Stand& stand_;
   std::vector<std::string> fragments_;  // the HTML of the script
-  std::vector<steps::Font> fonts_;      // those of the script
   std::map<std::pair<ControlIndex, LookValue>, std::optional<Properties>> known_;
 };
 
