@@ -57,6 +57,14 @@ std::optional<std::string> existing(const std::filesystem::path& file) {
   return std::filesystem::exists(file) ? std::optional(file.string()) : std::nullopt;
 }
 
+/// Returns the folder of a script's window and images: its own, or that of the example that is
+/// written in steps and does what the script does.
+std::filesystem::path stageFolderOf(const std::filesystem::path& file) {
+  const auto folder = file.parent_path();
+  const auto example = folder / "../../../examples" / file.stem();
+  return folder.filename() == "scripts" ? example : folder;
+}
+
 }  // namespace
 
 std::vector<std::filesystem::path> scriptFilesIn(const std::filesystem::path& folder) {
@@ -69,7 +77,7 @@ std::vector<std::filesystem::path> scriptFilesIn(const std::filesystem::path& fo
 }
 
 StagedScript stagedScript(const std::filesystem::path& file) {
-  const auto folder = file.parent_path();
+  const auto folder = stageFolderOf(file);
   tools::walkthrough::StageOptions options;
   options.window = existing(folder / "window.plist");
   if (!options.window) options.window = existing(folder / (file.stem().string() + "-host.plist"));

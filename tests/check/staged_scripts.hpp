@@ -22,7 +22,8 @@ struct StagedScript {
 std::vector<std::filesystem::path> scriptFilesIn(const std::filesystem::path& folder);
 
 /// Reads a script. Its window is `window.plist` or `host.plist` in the same folder, or one like
-/// that which the engine builds from `assets.plist`, or else one made from the script itself.
+/// that which the engine builds from `assets.plist`, or else one made from the script itself. A
+/// script in a folder `scripts` has the window of the example of its name.
 /// Throws a tools::Failure if a file does not hold what it should.
 StagedScript stagedScript(const std::filesystem::path& file);
 

@@ -29,10 +29,10 @@ struct Covered {
 std::vector<Covered> coveredScripts() {
   const std::string source = QZ_SOURCE_DIR;
   std::vector<Covered> all = {
-      {source + "/tests/data/scripts/first-steps.plist", source + "/examples/first-steps/host.plist",
-       ""},
-      {source + "/tests/data/scripts/photo-import.plist", source + "/examples/photo-import/host.plist",
-       ""},
+      {source + "/tests/data/scripts/first-steps.plist",
+       source + "/examples/first-steps/host.plist", ""},
+      {source + "/tests/data/scripts/photo-import.plist",
+       source + "/examples/photo-import/host.plist", ""},
       {source + "/examples/built-window/script.plist", "",
        source + "/examples/built-window/assets.plist"},
       {source + "/examples/qt-host/tour.plist", source + "/examples/qt-host/tour-host.plist", ""}};
@@ -45,7 +45,10 @@ std::vector<Covered> coveredScripts() {
 
 check::CheckOptions optionsFor(const Covered& covered) {
   check::CheckOptions options;
-  if (!covered.window.empty()) options.stage.window = covered.window;
+  if (!covered.window.empty()) {
+    options.stage.window = covered.window;
+    options.resources = fs::path(covered.window).parent_path();
+  }
   if (!covered.assets.empty()) options.stage.assets = covered.assets;
   return options;
 }
@@ -97,7 +100,10 @@ TEST_P(Covers, AreTheSameWhenWrittenAgain) {
 
 INSTANTIATE_TEST_SUITE_P(All, Covers, testing::ValuesIn(coveredScripts()),
                          [](const testing::TestParamInfo<Covered>& each) {
-                           std::string name = fs::path(each.param.script).parent_path().filename();
+                           const fs::path script = each.param.script;
+                           const bool isNamed = script.stem() != "script";
+                           std::string name =
+                               isNamed ? script.stem() : script.parent_path().filename();
                            std::replace(name.begin(), name.end(), '-', '_');
                            return name;
                          });

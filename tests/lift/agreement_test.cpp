@@ -47,8 +47,11 @@ std::string disagreement(std::uint64_t seed, Totals& totals) {
 }
 
 TEST(Lift, OfExamplesIsNoDifferentForUsers) {
+  const std::string source = QZ_SOURCE_DIR;
+  auto files = naive::scriptFilesIn(source + "/examples");
+  for (auto& file : naive::scriptFilesIn(source + "/tests/data/scripts")) files.push_back(file);
   std::size_t count = 0;
-  for (const auto& file : naive::scriptFilesIn(std::string(QZ_SOURCE_DIR) + "/examples")) {
+  for (const auto& file : files) {
     const naive::StagedScript staged = naive::stagedScript(file);
     const LiftedScript script(staged.script, staged.host, staged.resources);
     ASSERT_FALSE(script.refusal()) << file << ": " << *script.refusal();

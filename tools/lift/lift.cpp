@@ -154,8 +154,7 @@ class Lifter {
   void requireNoDifference(const std::string& source) {
     const auto readControls = [&](const walkthrough::StageOptions&) { return stand_.controls(); };
     const auto readNothing = [](const std::string&) { return std::nullopt; };
-    const auto read =
-        steps::readSourceText("the source", source, {readControls, readNothing});
+    const auto read = steps::readSourceText("the source", source, {readControls, readNothing});
     steps::Mistakes mistakes;
     const auto built = steps::build(read.tour, {0}, mistakes);
     mistakes.throwIfAny(read.files);
