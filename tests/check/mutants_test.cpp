@@ -82,7 +82,7 @@ class Judgement {
 std::vector<std::filesystem::path> originals() {
   const std::string source = QZ_SOURCE_DIR;
   auto files = naive::scriptFilesIn(source + "/tests/check/corpus");
-  const auto more = naive::scriptFilesIn(source + "/examples");
+  const auto more = naive::exampleScripts(source);
   files.insert(files.end(), more.begin(), more.end());
   return files;
 }

@@ -58,7 +58,7 @@ class Walks {
 
 TEST(RandomWalks, ReachOnlyListedPlacesInTheExamples) {
   const std::uint64_t moves = numberInEnvironment("QZ_MOVES").value_or(fewMoves);
-  const auto files = naive::scriptFilesIn(std::string(QZ_SOURCE_DIR) + "/examples");
+  const auto files = naive::exampleScripts(QZ_SOURCE_DIR);
   Walks walks;
   for (const auto& file : files) {
     EXPECT_TRUE(walks.walk(naive::stagedScript(file), 1, moves / files.size())) << file;

@@ -76,6 +76,13 @@ std::vector<std::filesystem::path> scriptFilesIn(const std::filesystem::path& fo
   return files;
 }
 
+std::vector<std::filesystem::path> exampleScripts(const std::filesystem::path& root) {
+  auto files = scriptFilesIn(root / "examples");
+  const auto more = scriptFilesIn(root / "tests/data/scripts");
+  files.insert(files.end(), more.begin(), more.end());
+  return files;
+}
+
 StagedScript stagedScript(const std::filesystem::path& file) {
   const auto folder = stageFolderOf(file);
   tools::walkthrough::StageOptions options;

@@ -21,6 +21,10 @@ struct StagedScript {
 /// dictionary is not a script, nor is a description of a window, `assets.plist`.
 std::vector<std::filesystem::path> scriptFilesIn(const std::filesystem::path& folder);
 
+/// Returns the scripts of the examples in the repository at `root`: those that are written by hand,
+/// and those that two examples in steps had before.
+std::vector<std::filesystem::path> exampleScripts(const std::filesystem::path& root);
+
 /// Reads a script. Its window is `window.plist` or `host.plist` in the same folder, or one like
 /// that which the engine builds from `assets.plist`, or else one made from the script itself. A
 /// script in a folder `scripts` has the window of the example of its name.

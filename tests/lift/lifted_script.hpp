@@ -24,7 +24,7 @@ class LiftedScript {
     played.plan.host = host_;
     plan_ = played.plan;
     original_ = {script, played.startKeys.front()};
-    const InputFile file("script.plist", "a script", script, {}, "");
+    const InputFile file("script.plist", "a script", script, {});
     LiftOptions options;
     options.window = "window: host.plist";
     options.limits.places = 20000;
