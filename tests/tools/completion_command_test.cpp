@@ -100,7 +100,7 @@ TEST(Completion, BashCompletesCommandsOptionsAndValues) {
     Words expected;
   } cases[] = {
       {{"pl"}, {"play"}},
-      {{"co"}, {"convert", "completion"}},
+      {{"co"}, {"cover", "convert", "completion"}},
       {{"--v"}, {"--version"}},
       {{"play", "--s"}, {"--sheet", "--screenshots", "--start"}},
       {{"play", "--toolkit", ""}, setOf(driverNames())},
@@ -180,7 +180,7 @@ TEST(Completion, FishCompletesCommandsOptionsAndValues) {
     Words expected;
   } cases[] = {
       {"pl", {"play"}},
-      {"co", {"convert", "completion"}},
+      {"co", {"cover", "convert", "completion"}},
       {"play --s", {"--sheet", "--screenshots", "--start"}},
       {"test --toolkit ", setOf(driverNames())},
       {"convert a b --format ", writableFormats()},

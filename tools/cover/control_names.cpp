@@ -3,16 +3,23 @@
 
 #include <set>
 
+#include "tools/scenario/references.hpp"
+
 namespace qz::tools::cover {
 namespace {
 
 constexpr std::size_t longestName = 24;
 
-std::string wordsFor(const walkthrough::ControlPicture& control) {
-  if (!control.name.empty()) return control.name;
+bool canBeName(const std::string& name) { return !scenario::Names().whyNotNew({.text = name}); }
+
+/// Returns the name of a control, which others may have too.
+std::string firstNameOf(const walkthrough::ControlPicture& control) {
   const auto& row = drivers::rowOf(control.view.kind);
   const std::string title = row.isButton ? control.view.title.string() : "";
-  return slugOf(title, longestName).empty() ? std::string(row.word) : title;
+  const std::string name = slugOf(control.name.empty() ? title : control.name, longestName);
+  if (canBeName(name)) return name;
+  const std::string kind = slugOf(std::string(row.word), longestName);
+  return name.empty() ? kind : kind + "-" + name;
 }
 
 }  // namespace
@@ -34,9 +41,9 @@ std::string slugOf(const std::string& text, std::size_t length) {
 
 std::vector<std::string> controlNames(const walkthrough::StepPicture& picture) {
   std::vector<std::string> names;
-  std::set<std::string> taken;
+  std::set<std::string> taken = {"host", "parent"};  // the windows
   for (const auto& control : picture.controls) {
-    const std::string first = slugOf(wordsFor(control), longestName);
+    const std::string first = firstNameOf(control);
     std::string name = first;
     for (int number = 2; !taken.insert(name).second; ++number) {
       name = first + "-" + std::to_string(number);
