@@ -10,7 +10,11 @@ namespace {
 
 constexpr std::size_t longestName = 24;
 
-bool canBeName(const std::string& name) { return !scenario::Names().whyNotNew({.text = name}); }
+bool canBeName(const std::string& name) {
+  scenario::Word word;
+  word.text = name;
+  return !scenario::Names().whyNotNew(word);
+}
 
 /// Returns the name of a control, which others may have too.
 std::string firstNameOf(const walkthrough::ControlPicture& control) {

@@ -1,4 +1,5 @@
 // SPDX-License-Identifier: MIT
+// Why a script cannot be said in steps.
 #pragma once
 
 #include <cstddef>
