@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "tools/cover/control_names.hpp"
 
+#include <algorithm>
 #include <set>
 
 #include "tools/scenario/references.hpp"
