@@ -20,17 +20,18 @@ using walkthrough::StepPicture;
 
 constexpr std::size_t longestFileName = 60;
 
-/// Expects what differs between two pictures of one control; all that is there to see, if there is
-/// no picture before or the control was hidden. What a hidden control has is nobody's business.
+/// Expects what differs between two pictures of one control; all that is there to see, at the start
+/// and if the control was hidden. What a hidden control has is nobody's business, but for its tag.
 class ControlExpectations {
  public:
-  ControlExpectations(const std::string& name, const ControlPicture* before,
+  ControlExpectations(const std::string& name, const ControlPicture& before, bool isStart,
                       const ControlPicture& after, std::ostream& out)
       : name_(name),
-        before_(before && !before->view.hidden ? &before->view : nullptr),
+        before_(isStart || before.view.hidden ? nullptr : &before.view),
         after_(after.view),
         out_(out) {
-    if (!before || before->view.hidden != after_.hidden) expect("hidden", yesNo(after_.hidden));
+    if (before.view.tag != after_.tag) expect("tag", std::to_string(after_.tag));
+    if (isStart || before.view.hidden != after_.hidden) expect("hidden", yesNo(after_.hidden));
     if (after_.hidden) return;
     const auto& row = drivers::rowOf(after_.kind);
     if (row.isControl && differs(&ViewPicture::enabled)) expect("enabled", yesNo(after_.enabled));
@@ -42,7 +43,7 @@ class ControlExpectations {
     const auto& color = after_.background;
     expectIfSet("background", &ViewPicture::background,
                 color ? quotedWord(scenario::showColor(*color)) : "absent");
-    if (after.flashing && !(before && before->flashing)) {
+    if (after.flashing && (isStart || !before.flashing)) {
       out_ << "expect engine.flashingTagIds." << after_.tag << " YES\n";
     }
   }
@@ -123,7 +124,7 @@ class Writer {
     if (!isStart) moves_ << '\n';
     check::writeMove(play_, move.step, pressed, moves_);
     moves_ << (move.raised ? " => raises" : "") << '\n';
-    expectChanges(isStart ? nullptr : &move.before, move.after);
+    expectChanges(move, isStart);
   }
 
   void tell(const check::Step& step, const std::string& pressed) {
@@ -134,25 +135,23 @@ class Writer {
     what_ += " " + (pressed.empty() ? std::string("wait") : pressed);
   }
 
-  void expectChanges(const StepPicture* before, const StepPicture& after) {
+  void expectChanges(const check::SeenMove& move, bool isStart) {
+    const StepPicture& after = move.after;
     if (after.ended) {
       moves_ << "expect engine.terminating YES\n";
       return;
     }
     for (std::size_t i = 0; i < after.controls.size(); ++i) {
-      ControlExpectations(names_[i], before ? &before->controls[i] : nullptr, after.controls[i],
-                          moves_);
+      ControlExpectations(names_[i], move.before.controls[i], isStart, after.controls[i], moves_);
     }
-    const bool allowed = before && before->flashingAllowed;
-    if (allowed != after.flashingAllowed) {
+    if (move.before.flashingAllowed != after.flashingAllowed) {
       moves_ << "expect engine.flashing " << yesNo(after.flashingAllowed) << '\n';
     }
-    expectTimers(before, after);
+    if (move.before.timers != after.timers) expectTimers(after);
   }
 
-  void expectTimers(const StepPicture* before, const StepPicture& after) {
-    if (before && before->timers == after.timers) return;
-    if (after.timers.empty() && before) moves_ << "expect engine.objectIdTimers empty\n";
+  void expectTimers(const StepPicture& after) {
+    if (after.timers.empty()) moves_ << "expect engine.objectIdTimers empty\n";
     for (const auto& timer : after.timers) {
       moves_ << "expect engine.objectIdTimers." << timer.key << ' '
              << check::numberWord(timer.timeLeft) << '\n';
