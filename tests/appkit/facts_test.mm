@@ -26,6 +26,54 @@
 
 @end
 
+/// A view that counts actions that reach it.
+@interface QZFactView : NSView {
+ @public
+  int count;
+}
+- (void)count:(id)sender;
+@end
+
+@implementation QZFactView
+
+- (BOOL)acceptsFirstResponder {
+  return YES;
+}
+
+- (void)count:(id)sender {
+  (void)sender;
+  ++count;
+}
+
+@end
+
+/// Understands an action that it has no method for.
+@interface QZFactForwarder : NSObject {
+ @public
+  int forwarded;
+}
+@end
+
+// By its name: in GCC's runtime one name can have several selectors.
+static BOOL isCount(SEL selector) { return [NSStringFromSelector(selector) isEqual:@"count:"]; }
+
+@implementation QZFactForwarder
+
+- (BOOL)respondsToSelector:(SEL)selector {
+  return isCount(selector) || [super respondsToSelector:selector];
+}
+
+- (NSMethodSignature*)methodSignatureForSelector:(SEL)selector {
+  if ([super respondsToSelector:selector]) return [super methodSignatureForSelector:selector];
+  return [NSMethodSignature signatureWithObjCTypes:"v@:@"];
+}
+
+- (void)forwardInvocation:(NSInvocation*)invocation {
+  if (isCount([invocation selector])) ++forwarded;
+}
+
+@end
+
 namespace {
 
 class AppKitFacts : public qz::WithPool {
@@ -38,7 +86,24 @@ class AppKitFacts : public qz::WithPool {
                                      backing:NSBackingStoreBuffered
                                        defer:YES] autorelease];
   NSButton* button_ = [[[NSButton alloc] initWithFrame:NSMakeRect(10, 10, 90, 30)] autorelease];
+  QZFactCounter* counter_ = [[[QZFactCounter alloc] init] autorelease];
 };
+
+template <class ViewClass>
+ViewClass* newView(const NSRect& frame = NSMakeRect(0, 0, 90, 90)) {
+  return [[[ViewClass alloc] initWithFrame:frame] autorelease];
+}
+
+/// Returns a timer that counts, in a mode of the run loop.
+NSTimer* timerIn(NSString* mode, double interval, bool repeats, QZFactCounter* counter) {
+  NSTimer* const timer = [NSTimer timerWithTimeInterval:interval
+                                                 target:counter
+                                               selector:@selector(count:)
+                                               userInfo:nil
+                                                repeats:repeats];
+  [[NSRunLoop currentRunLoop] addTimer:timer forMode:mode];
+  return timer;
+}
 
 void runFor(double seconds, NSString* mode) {
   NSDate* const end = [NSDate dateWithTimeIntervalSinceNow:seconds];
@@ -53,7 +118,7 @@ TEST_F(AppKitFacts, ANewButtonHasATitleAndTheTagZero) {
 }
 
 TEST_F(AppKitFacts, APlainViewHasATagThatCannotBeSet) {
-  NSView* const view = [[[NSView alloc] initWithFrame:NSZeroRect] autorelease];
+  NSView* const view = newView<NSView>();
   EXPECT_EQ([view tag], -1);
   EXPECT_FALSE([view respondsToSelector:@selector(setTag:)]);
 }
@@ -84,8 +149,7 @@ TEST_F(AppKitFacts, AWindowDoesNotRetainItsDelegate) {
 }
 
 TEST_F(AppKitFacts, ASuperviewOwnsItsSubviewsFromBackToFront) {
-  NSView* const first = [[[NSView alloc] initWithFrame:NSZeroRect] autorelease];
-  [[window_ contentView] addSubview:first];
+  [[window_ contentView] addSubview:newView<NSView>()];
   [[window_ contentView] addSubview:button_];
   EXPECT_EQ([[[window_ contentView] subviews] lastObject], button_);
   EXPECT_EQ([button_ superview], [window_ contentView]);
@@ -93,7 +157,7 @@ TEST_F(AppKitFacts, ASuperviewOwnsItsSubviewsFromBackToFront) {
 }
 
 TEST_F(AppKitFacts, ABoxHoldsItsSubviewsInItsContentView) {
-  NSBox* const box = [[[NSBox alloc] initWithFrame:NSMakeRect(0, 0, 90, 90)] autorelease];
+  NSBox* const box = newView<NSBox>();
   [[box contentView] addSubview:button_];
   EXPECT_EQ([[button_ superview] superview], box);
 }
@@ -107,48 +171,124 @@ TEST_F(AppKitFacts, HighlightingAButtonHighlightsItsCell) {
 }
 
 TEST_F(AppKitFacts, AnActionGoesToItsTargetEvenFromADisabledButton) {
-  QZFactCounter* const target = [[[QZFactCounter alloc] init] autorelease];
   [button_ setEnabled:NO];
+  EXPECT_TRUE([button_ sendAction:@selector(count:) to:counter_]);
+  EXPECT_EQ(counter_->count, 1);
+}
+
+TEST_F(AppKitFacts, AnObjectMayForwardTheActionsThatItClaimsToUnderstand) {
+  QZFactForwarder* const target = [[[QZFactForwarder alloc] init] autorelease];
   EXPECT_TRUE([button_ sendAction:@selector(count:) to:target]);
-  EXPECT_EQ(target->count, 1);
+  EXPECT_EQ(target->forwarded, 1);
+}
+
+TEST_F(AppKitFacts, AnActionWithoutATargetGoesUpFromTheFirstResponder) {
+  QZFactView* const outer = newView<QZFactView>();
+  NSView* const inner = newView<NSTextField>();
+  [outer addSubview:inner];
+  [[window_ contentView] addSubview:outer];
+  [window_ makeKeyAndOrderFront:nil];
+  [window_ makeFirstResponder:inner];
+  EXPECT_TRUE([NSApp sendAction:@selector(count:) to:nil from:button_]);
+  EXPECT_EQ(outer->count, 1);
+}
+
+TEST_F(AppKitFacts, AnActionThatNoViewUnderstandsGoesToTheDelegateOfTheWindow) {
+  [window_ setDelegate:static_cast<id>(counter_)];
+  [window_ makeKeyAndOrderFront:nil];
+  EXPECT_TRUE([NSApp sendAction:@selector(count:) to:nil from:button_]);
+  EXPECT_EQ(counter_->count, 1);
+  [window_ setDelegate:nil];
+  EXPECT_FALSE([NSApp sendAction:@selector(count:) to:nil from:button_]);
+}
+
+TEST_F(AppKitFacts, AViewBesideTheContentViewTakesTheMouse) {
+  NSView* const content = [window_ contentView];
+  [content addSubview:button_];
+  NSView* const around = [content superview];
+  const NSPoint inButton = [button_ convertPoint:NSMakePoint(45, 15) toView:nil];
+  EXPECT_EQ([around hitTest:inButton], button_);
+  QZFactView* const cover = newView<QZFactView>([content frame]);
+  [around addSubview:cover positioned:NSWindowAbove relativeTo:content];
+  EXPECT_EQ([around hitTest:inButton], cover);
+  EXPECT_EQ([window_ contentView], content);
+  [cover removeFromSuperview];
+  EXPECT_EQ([around hitTest:inButton], button_);
+}
+
+TEST_F(AppKitFacts, AWindowTellsItsObserversThatItCloses) {
+  [[NSNotificationCenter defaultCenter] addObserver:counter_
+                                           selector:@selector(count:)
+                                               name:NSWindowWillCloseNotification
+                                             object:window_];
+  [window_ setReleasedWhenClosed:NO];
+  [window_ makeKeyAndOrderFront:nil];
+  [window_ orderOut:nil];
+  EXPECT_EQ(counter_->count, 0);
+  [window_ makeKeyAndOrderFront:nil];
+  [window_ close];
+  EXPECT_EQ(counter_->count, 1);
+  EXPECT_FALSE([window_ isVisible]);
+  [[NSNotificationCenter defaultCenter] removeObserver:counter_];
+}
+
+TEST_F(AppKitFacts, AWindowThatWasClosedCanBeShownAgain) {
+  [window_ setReleasedWhenClosed:NO];
+  [window_ makeKeyAndOrderFront:nil];
+  [window_ close];
+  [window_ makeKeyAndOrderFront:nil];
+  EXPECT_TRUE([window_ isVisible]);
+  [window_ orderOut:nil];
+}
+
+TEST_F(AppKitFacts, TheContentOfAWindowIsInItsFrame) {
+  const NSRect content = [window_ contentRectForFrameRect:[window_ frame]];
+  EXPECT_EQ(content.size.width, 200);
+  EXPECT_EQ(content.size.height, 100);
+}
+
+TEST_F(AppKitFacts, AFieldWithAttributesHasTheirTextAsItsValue) {
+  NSTextField* const field = newView<NSTextField>();
+  NSDictionary* const red = [NSDictionary dictionaryWithObject:[NSColor redColor]
+                                                        forKey:NSForegroundColorAttributeName];
+  [field setAttributedStringValue:[[[NSAttributedString alloc] initWithString:@"Go"
+                                                                   attributes:red] autorelease]];
+  EXPECT_TRUE([[field stringValue] isEqual:@"Go"]);
+}
+
+TEST_F(AppKitFacts, AnImageIsFoundByTheNameThatItWasGiven) {
+  NSImage* const image = [[[NSImage alloc] initWithSize:NSMakeSize(9, 9)] autorelease];
+  EXPECT_TRUE([image setName:@"a fact"]);
+  EXPECT_EQ([NSImage imageNamed:@"a fact"], image);
+  [image setName:nil];
 }
 
 TEST_F(AppKitFacts, ATimerOfTheDefaultModeWaitsInOtherModes) {
-  QZFactCounter* const counter = [[[QZFactCounter alloc] init] autorelease];
-  NSTimer* const timer = [NSTimer timerWithTimeInterval:0.02
-                                                 target:counter
-                                               selector:@selector(count:)
-                                               userInfo:nil
-                                                repeats:NO];
-  [[NSRunLoop currentRunLoop] addTimer:timer forMode:NSDefaultRunLoopMode];
+  NSTimer* const timer = timerIn(NSDefaultRunLoopMode, 0.02, false, counter_);
   // A mode without a timer or port of its own returns at once.
-  NSTimer* const other = [NSTimer timerWithTimeInterval:10
-                                                 target:counter
-                                               selector:@selector(count:)
-                                               userInfo:nil
-                                                repeats:NO];
-  [[NSRunLoop currentRunLoop] addTimer:other forMode:NSEventTrackingRunLoopMode];
+  NSTimer* const other = timerIn(NSEventTrackingRunLoopMode, 10, false, counter_);
   runFor(0.1, NSEventTrackingRunLoopMode);
-  EXPECT_EQ(counter->count, 0);
+  EXPECT_EQ(counter_->count, 0);
   runFor(0.1, NSDefaultRunLoopMode);
-  EXPECT_EQ(counter->count, 1);
+  EXPECT_EQ(counter_->count, 1);
   EXPECT_FALSE([timer isValid]);
   [other invalidate];
 }
 
 TEST_F(AppKitFacts, ATimerCanBeMovedToAnEarlierDate) {
-  QZFactCounter* const counter = [[[QZFactCounter alloc] init] autorelease];
-  NSTimer* const timer = [NSTimer timerWithTimeInterval:1000
-                                                 target:counter
-                                               selector:@selector(count:)
-                                               userInfo:nil
-                                                repeats:YES];
-  [[NSRunLoop currentRunLoop] addTimer:timer forMode:NSDefaultRunLoopMode];
+  NSTimer* const timer = timerIn(NSDefaultRunLoopMode, 1000, true, counter_);
   [timer setFireDate:[NSDate dateWithTimeIntervalSinceNow:0.02]];
   runFor(0.1, NSDefaultRunLoopMode);
-  EXPECT_EQ(counter->count, 1);
+  EXPECT_EQ(counter_->count, 1);
   EXPECT_TRUE([timer isValid]);
   [timer invalidate];
+}
+
+TEST_F(AppKitFacts, EachBooleanIsOneObjectAndNoOtherNumber) {
+  EXPECT_EQ([NSNumber numberWithBool:YES], [NSNumber numberWithBool:YES]);
+  EXPECT_EQ([NSNumber numberWithBool:NO], [NSNumber numberWithBool:NO]);
+  EXPECT_NE([NSNumber numberWithChar:1], [NSNumber numberWithBool:YES]);
+  EXPECT_NE([NSNumber numberWithInt:0], [NSNumber numberWithBool:NO]);
 }
 
 TEST_F(AppKitFacts, AMessageToNilAnswersZero) {
