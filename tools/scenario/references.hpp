@@ -1,6 +1,6 @@
 // SPDX-License-Identifier: MIT
-// How statements refer to things: the names that a scenario declares, #TAG and @INDEX for controls,
-// and NAME.PROPERTY.
+// How statements refer to things: by the names that a scenario declares, by the tag or the index of
+// a control, and by the names of properties.
 #pragma once
 
 #include <cstddef>
