@@ -388,9 +388,13 @@ struct PaneState {
   }
 };
 
+// Nothing if the splitter has not been laid out yet, as on a page that nobody has seen.
 QVariant readPanes(QWidget& widget) {
   const auto* const splitter = qobject_cast<QSplitter*>(&widget);
-  return splitter ? QVariant::fromValue(PaneState{splitter->sizes()}) : QVariant();
+  if (!splitter) return {};
+  const auto sizes = splitter->sizes();
+  const bool isLaidOut = std::any_of(sizes.begin(), sizes.end(), [](int size) { return size > 0; });
+  return isLaidOut ? QVariant::fromValue(PaneState{sizes}) : QVariant();
 }
 void writePanes(QWidget& widget, const QVariant& value) {
   static_cast<QSplitter&>(widget).setSizes(value.value<PaneState>().sizes);
