@@ -16,9 +16,10 @@ namespace {
 class AccessiblePanel final : public QAccessibleWidget {
  public:
   explicit AccessiblePanel(GuidePanel& panel)
-      : QAccessibleWidget(&panel, QAccessible::Dialog),
-        parts_{&panel.heading, &panel.text, &panel.picture, &panel.progress,
-               &panel.target,  &panel.skip, &panel.back,    &panel.next} {}
+      : QAccessibleWidget(&panel, QAccessible::Dialog), parts_{&panel.heading, &panel.text,
+                                                               &panel.picture, &panel.progress,
+                                                               &panel.target,  &panel.skip,
+                                                               &panel.back,    &panel.next} {}
 
   int childCount() const override { return static_cast<int>(parts_.size()); }
   QAccessibleInterface* child(int index) const override {

@@ -168,8 +168,8 @@ TEST_F(ChangingForms, KeepTheOrderOfPages) {
 
 TEST_F(ChangingForms, FollowNamesIfTagsGoByNames) {
   adopted.reset();
-  adopted = std::make_unique<AdoptedWindow>(
-      toolkit, *form, toolkit::qt::Adoption{.tags = {{QString("own"), 60}}});
+  adopted = std::make_unique<AdoptedWindow>(toolkit, *form,
+                                            toolkit::qt::Adoption{.tags = {{QString("own"), 60}}});
   EXPECT_FALSE(presents(form->untagged));
   form->untagged.setObjectName("own");
   EXPECT_TRUE(presents(form->untagged));
@@ -180,7 +180,8 @@ TEST_F(ChangingForms, FollowNamesIfTagsGoByNames) {
 // A host may look for a control while Qt deletes what holds it.
 TEST_F(ChangingForms, HoldWhileAWidgetIsDeleted) {
   std::size_t least = presented().size();
-  for (QObject* const object : {static_cast<QObject*>(&form->inBox), static_cast<QObject*>(&form->line)}) {
+  for (QObject* const object :
+       {static_cast<QObject*>(&form->inBox), static_cast<QObject*>(&form->line)}) {
     QObject::connect(object, &QObject::destroyed,
                      [&] { least = std::min(least, presented().size()); });
   }

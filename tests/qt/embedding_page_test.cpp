@@ -133,10 +133,10 @@ TEST_F(EmbeddingPage, TellsTheHost) {
   settle();
   telling.press("906");
   settle();
-  EXPECT_EQ(telling.told, QStringList({"The walk-through none.plist is not played: the file does "
-                                       "not exist",
-                                       "the tour begins", "0", "2001", "906",
-                                       "the user knows it all"}));
+  EXPECT_EQ(telling.told,
+            QStringList({"The walk-through none.plist is not played: the file does "
+                         "not exist",
+                         "the tour begins", "0", "2001", "906", "the user knows it all"}));
   ASSERT_TRUE(telling.begin());
   telling.tour.end();
   EXPECT_EQ(telling.told.last(), "not yet");
@@ -197,8 +197,8 @@ TEST_F(EmbeddingPage, TakesScriptsFromEverywhere) {
 TEST_F(EmbeddingPage, TurnsTheLogOff) {
   static int lines;
   lines = 0;
-  const auto before = qInstallMessageHandler(
-      [](QtMsgType, const QMessageLogContext&, const QString&) { ++lines; });
+  const auto before =
+      qInstallMessageHandler([](QtMsgType, const QMessageLogContext&, const QString&) { ++lines; });
   ASSERT_TRUE(form->begin());
   EXPECT_GT(lines, 0);
   QLoggingCategory::setFilterRules("qz.walkthrough=false");

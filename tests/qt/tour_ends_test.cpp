@@ -2,8 +2,8 @@
 // Walk-throughs that begin and end at random moments, in every way in which they can end.
 
 #include <QComboBox>
-#include <QRandomGenerator>
 #include <QDebug>
+#include <QRandomGenerator>
 #include <QTemporaryDir>
 #include <QWizard>
 #include <fstream>
@@ -168,8 +168,8 @@ struct TourEnds : testing::Test {
   void expectSamePlaces(const std::string& name) const;
 };
 
-// What has nothing to do with the place of a widget, which `expectSamePlaces` compares, or with what
-// the user does here.
+// What has nothing to do with the place of a widget, which `expectSamePlaces` compares, or with
+// what the user does here.
 bool isLasting(const QString& name) {
   static const QStringList lasting = {
       "text",         "title",      "toolTip", "accessibleName", "accessibleDescription",
@@ -218,13 +218,20 @@ void TourEnds::expectSamePlaces(const std::string& name) const {
     if (same == twins.end() || isInLostPage(*widget) || hosts::isSparePart(*widget)) continue;
     const auto place = toolkit::qt::exactly(widget->geometry());
     const auto expected = toolkit::qt::exactly(same->second->geometry());
-    EXPECT_EQ(place, expected) << name << ": " << number << ' ' << hosts::nameOf(*widget).toStdString();
+    EXPECT_EQ(place, expected) << name << ": " << number << ' '
+                               << hosts::nameOf(*widget).toStdString();
   }
 }
 
 void TourEnds::expectRestored(const std::string& name) {
   if (!form) return;
-  for (auto* f : {form.get(), twin.get()}) { auto* e=f->findChild<QWidget*>("qt_toolbar_ext_button"); auto& b=f->saveButton(); qWarning() << "DEBUG" << e->isHidden() << e->geometry() << f->bar->geometry() << f->bar->sizeHint() << f->bar->minimumSizeHint() << b.geometry() << b.isHidden() << b.sizeHint() << f->save->isVisible(); }
+  for (auto* f : {form.get(), twin.get()}) {
+    auto* e = f->findChild<QWidget*>("qt_toolbar_ext_button");
+    auto& b = f->saveButton();
+    qWarning() << "DEBUG" << e->isHidden() << e->geometry() << f->bar->geometry()
+               << f->bar->sizeHint() << f->bar->minimumSizeHint() << b.geometry() << b.isHidden()
+               << b.sizeHint() << f->save->isVisible();
+  }
   expectSamePlaces(name);
   const Snapshot after = picture();
   for (const QString& what : hosts::differences(before, after)) {
@@ -274,9 +281,7 @@ const struct {
      }},
     {"button deleted in its press",
      [](TourEnds& test) {
-       test.whenPressed = [&test] {
-         onBoth(test, [](CrowdedForm& form) { delete &form.inBox; });
-       };
+       test.whenPressed = [&test] { onBoth(test, [](CrowdedForm& form) { delete &form.inBox; }); };
        test.form->inBox.click();
      }},
     {"window deleted in a press",

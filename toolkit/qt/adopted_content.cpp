@@ -18,8 +18,7 @@ AdoptedNode::AdoptedNode(QWidget& content, std::shared_ptr<Desk> desk,
 
 // A widget that is destroyed together with those around it sends no event.
 bool AdoptedNode::isUpToDate() {
-  return !tree_.hasChanged() && !form_->usesNames() && found_.hasAllPages() &&
-         presentsOnlyLiving();
+  return !tree_.hasChanged() && !form_->usesNames() && found_.hasAllPages() && presentsOnlyLiving();
 }
 
 const Subviews& AdoptedNode::readSubviews() {

@@ -31,8 +31,8 @@ bool hasTagProperty(const QObject& object) {
                      [](const QByteArray& name) { return name == tagProperty; });
 }
 
-// Returns the child as a widget; null if it is none, or if it is deleted while its siblings wait for
-// the same.
+// Returns the child as a widget; null if it is none, or if it is deleted while its siblings wait
+// for the same.
 QWidget* widgetAt(QObject* child) {
   return child && child->isWidgetType() ? static_cast<QWidget*>(child) : nullptr;
 }
