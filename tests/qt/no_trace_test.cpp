@@ -223,16 +223,6 @@ TEST_F(NoTrace, IsLeftInThePlacesThatCommandsHaveOpened) {
   }
 }
 
-TEST_F(NoTrace, IsLeftInASplitterWhosePaneWasHiddenBehindAnotherTab) {
-  const QList<int> before = sizesOfPanes();
-  const QByteArray script = "{ 0 = ((HIDE_OBJECT_WITH_ID, 6)); }";
-  ASSERT_TRUE(walkThrough.play(script, *form));
-  form->tabs->setCurrentIndex(1);  // by the user: now the splitter gives the room to the other pane
-  hosts::settle();
-  walkThrough.end();
-  EXPECT_EQ(sizesOfPanes(), before);
-}
-
 TEST_F(NoTrace, ButWhatTheUserHasChangedStays) {
   begin();
   goThrough();
