@@ -1,29 +1,27 @@
 // SPDX-License-Identifier: MIT
-// The form with walk-throughs in its Help menu: over the form itself, in a sheet, in a guide.
+// The window with walk-throughs in its Help menu: one in a guide beside the controls, one in a
+// sheet.
 #pragma once
 
 #include <QMenuBar>
 
-#include "form_guide.hpp"
 #include "order_form.hpp"
+#include "qz/hosts/qt/guide.hpp"
 #include "qz/hosts/qt/walk_through.hpp"
 #include "tips_panel.hpp"
 
 class GuidedForm final : public OrderForm {
+  Q_OBJECT
+
  public:
-  /// Scripts and images are looked for in the directory.
-  explicit GuidedForm(std::string_view resources) {
-    toolkit_.files().setResourcePath(resources);
-    QMenu* const help = menuBar()->addMenu("&Help");
-    help->addAction("Show me &around", [this] { walkThrough_.play("tour.plist", *this); });
-    help->addAction("&Tips", [this] { walkThrough_.playInSheet("tips.plist", tips, *this); });
-    help->addAction("&Guide me", [this] { formGuide_.play(walkThrough_); });
+  GuidedForm() {
+    walkThrough.setResources(":/tour");
+    QMenu* const help = menuBar()->addMenu(tr("&Help"));
+    help->addAction(tr("Show me &around"), [this] { walkThrough.play("tour.plist", *this); });
+    help->addAction(tr("&Tips"), [this] { walkThrough.playInSheet("tips.plist", tips, *this); });
   }
 
   TipsPanel tips;
-
- private:
-  qz::toolkit::qt::QtToolkit toolkit_;
-  qz::hosts::qt::WalkThrough walkThrough_{toolkit_};
-  FormGuide formGuide_{toolkit_, *this};
+  qz::hosts::qt::WalkThrough walkThrough;
+  qz::hosts::qt::Guide guide{walkThrough.toolkit(), *this};
 };

@@ -1,12 +1,15 @@
 // SPDX-License-Identifier: MIT
-// A host with its own windows, and walk-throughs in its Help menu.
+// An application with walk-throughs in its Help menu, in the language of the user.
 #include <QApplication>
+#include <QTranslator>
 
 #include "guided_form.hpp"
 
 int main(int argc, char** argv) {
   const QApplication application(argc, argv);
-  GuidedForm form(QApplication::applicationDirPath().toStdString());
+  QTranslator words;
+  if (words.load(QLocale(), "parcels", "_", ":/i18n")) QCoreApplication::installTranslator(&words);
+  GuidedForm form;
   form.show();
   return QApplication::exec();
 }

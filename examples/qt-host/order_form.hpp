@@ -1,38 +1,45 @@
 // SPDX-License-Identifier: MIT
-// The host's own window: an order form for parcels. It knows nothing of walk-throughs except the
+// The application's own window: it orders parcels. It knows nothing of walk-throughs except the
 // tags by which scripts name its controls.
 #pragma once
 
 #include <QCheckBox>
-#include <QComboBox>
 #include <QLabel>
 #include <QLineEdit>
 #include <QMainWindow>
-#include <QPlainTextEdit>
 #include <QPushButton>
 #include <QSpinBox>
+#include <QTabWidget>
+#include <QTableWidget>
 
 class OrderForm : public QMainWindow {
+  Q_OBJECT
+
  public:
   OrderForm();
 
-  QLineEdit name;
-  QLineEdit street;
-  QLineEdit city;
-  QComboBox country;
-  QSpinBox parcels;
-  QCheckBox express{"E&xpress"};
-  QCheckBox insured{"&Insured"};
-  QPlainTextEdit remarks;
-  QLabel price;
-  QPushButton order{"&Order"};
-  QPushButton clear{"&Clear"};
-  // At the lower edge; hidden unless a walk-through shows them.
-  QLabel guide;
-  QLabel picture;
-  QPushButton next{"&Next"};
+  QTabWidget& tabs = *new QTabWidget;
+  // The first tab.
+  QLineEdit& name = *new QLineEdit;
+  QLineEdit& city = *new QLineEdit;
+  QSpinBox& parcels = *new QSpinBox;
+  QCheckBox& express = *new QCheckBox(tr("E&xpress"));
+  QCheckBox& insured = *new QCheckBox(tr("&Insured"));
+  QLabel& price = *new QLabel;
+  QPushButton& clear = *new QPushButton(tr("C&lear"));
+  // The second tab.
+  QTableWidget& orders = *new QTableWidget(0, 3);
+  QPushButton& cancel = *new QPushButton(tr("&Cancel this order"));
+  // In the tool bar.
+  QAction* order = nullptr;
 
  private:
+  void addToolBarWithOrder();
+  void addFormPage();
+  void addOrdersPage();
+  void react();
+  void giveTags();
+
   void showPrice();
   void placeOrder();
   void clearAll();

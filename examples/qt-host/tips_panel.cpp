@@ -5,7 +5,7 @@
 #include <QGridLayout>
 
 TipsPanel::TipsPanel() {
-  setWindowTitle("Tips");
+  setWindowTitle(tr("Tips"));
   auto* const grid = new QGridLayout(this);
   grid->addWidget(&heading, 0, 0, 1, 3);
   grid->addWidget(&tip, 1, 0, 1, 3);

@@ -1,5 +1,5 @@
 // SPDX-License-Identifier: MIT
-// A panel with tips, which the host shows as a sheet.
+// A panel with tips, which the application shows as a sheet.
 #pragma once
 
 #include <QLabel>
@@ -7,11 +7,13 @@
 #include <QWidget>
 
 class TipsPanel : public QWidget {
+  Q_OBJECT
+
  public:
   TipsPanel();
 
   QLabel heading;
   QLabel tip;
-  QPushButton next{"&Next tip"};
-  QPushButton close{"&Close"};
+  QPushButton next{tr("&Next tip")};
+  QPushButton close{tr("&Close")};
 };

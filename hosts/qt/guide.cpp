@@ -10,6 +10,7 @@
 #include <QScreen>
 #include <utility>
 
+#include "hosts/qt/guide_accessibility.hpp"
 #include "hosts/qt/guide_announcement.hpp"
 #include "hosts/qt/guide_panel.hpp"
 #include "hosts/qt/guide_placement.hpp"
@@ -33,6 +34,11 @@ template <class W, class... Arguments>
 W* addUnnoticed(QWidget& parent, const Arguments&... arguments) {
   const UnnoticedChild unnoticed(parent);
   return new W(parent, arguments...);
+}
+
+GuidePanel* addPanel(QWidget& form, const GuideOptions& options) {
+  simplifyAccessiblePanels();
+  return addUnnoticed<GuidePanel>(form, options);
 }
 
 }  // namespace
@@ -80,7 +86,7 @@ Guide::Stage::Stage(toolkit::qt::QtToolkit& toolkit, QWidget& form, const GuideO
     : toolkit_(toolkit),
       options_(options),
       form_(&form),
-      panel_(addUnnoticed<GuidePanel>(form, options)),
+      panel_(addPanel(form, options)),
       tabOrder_(options.tab ? std::make_unique<GuideTabOrder>(form, *panel_) : nullptr) {
   panel_->installEventFilter(this);
   formFollower_.follow(&form);

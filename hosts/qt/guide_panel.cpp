@@ -148,7 +148,8 @@ int GuidePanel::widthFor(int bound) const {
                                   minimumSizeHint().width()));
 }
 
-// A text that is too long for a panel of the usual width makes the panel wider.
+// A text that is too long for a panel of the usual width makes the panel wider. A scroll bar that
+// is not needed would take room from the lines, and so be needed.
 void GuidePanel::fit(const QSize& bounds) {
   heading.setFont(headingFont(font()));
   grid_.setHorizontalSpacing(picture.speaks() ? panelMargin : 0);
@@ -157,7 +158,10 @@ void GuidePanel::fit(const QSize& bounds) {
   while (grid_.totalHeightForWidth(width) > bounds.height() && width < bounds.width()) {
     width = std::min(width * 3 / 2, bounds.width());
   }
-  resize(width, std::min(grid_.totalHeightForWidth(width), bounds.height()));
+  const int height = grid_.totalHeightForWidth(width);
+  const bool fits = height <= bounds.height();
+  scroll.setVerticalScrollBarPolicy(fits ? Qt::ScrollBarAlwaysOff : Qt::ScrollBarAsNeeded);
+  resize(width, std::min(height, bounds.height()));
 }
 
 void GuidePanel::scrollToBeginning() { scroll.verticalScrollBar()->setValue(0); }

@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <optional>
+#include <string>
 
 #include "drivers/memory/memory_driver.hpp"
 #include "tools/support/input_file.hpp"
@@ -12,6 +13,13 @@
 namespace qz::naive {
 
 namespace {
+
+// Returns the name without the language of a translation, such as the "_de" of "tour_de.plist".
+std::string originalOf(const std::filesystem::path& file) {
+  const std::string name = file.stem().string();
+  const bool isTranslation = name.size() > 3 && name[name.size() - 3] == '_';
+  return isTranslation ? name.substr(0, name.size() - 3) : name;
+}
 
 using tools::walkthrough::HostControl;
 using tools::walkthrough::HostWindow;
@@ -87,7 +95,7 @@ StagedScript stagedScript(const std::filesystem::path& file) {
   const auto folder = stageFolderOf(file);
   tools::walkthrough::StageOptions options;
   options.window = existing(folder / "window.plist");
-  if (!options.window) options.window = existing(folder / (file.stem().string() + "-host.plist"));
+  if (!options.window) options.window = existing(folder / (originalOf(file) + "-host.plist"));
   if (!options.window) options.window = existing(folder / "host.plist");
   if (!options.window) options.assets = existing(folder / descriptionName);
   StagedScript staged;

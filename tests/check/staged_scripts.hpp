@@ -25,10 +25,11 @@ std::vector<std::filesystem::path> scriptFilesIn(const std::filesystem::path& fo
 /// and those that two examples in steps had before.
 std::vector<std::filesystem::path> exampleScripts(const std::filesystem::path& root);
 
-/// Reads a script. Its window is `window.plist` or `host.plist` in the same folder, or one like
-/// that which the engine builds from `assets.plist`, or else one made from the script itself. A
-/// script in a folder `scripts` has the window of the example of its name.
-/// Throws a tools::Failure if a file does not hold what it should.
+/// Reads a script. Its window is `window.plist`, `NAME-host.plist` or `host.plist` in the same
+/// folder (NAME is that of the script without the language of a translation), or one like that
+/// which the engine builds from `assets.plist`, or else one made from the script itself. A script
+/// in a folder `scripts` has the window of the example of its name. Throws a tools::Failure if a
+/// file does not hold what it should.
 StagedScript stagedScript(const std::filesystem::path& file);
 
 }  // namespace qz::naive

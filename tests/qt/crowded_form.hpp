@@ -88,7 +88,7 @@ struct CrowdedForm : QMainWindow {
     auto* const column = new QVBoxLayout(second);
     sheet->setFixedSize(300, 2000);
     inArea.setParent(sheet);
-    inArea.move(10, 1900);
+    inArea.setGeometry(10, 1900, 120, 30);
     area->setWidget(sheet);
     (new QVBoxLayout(front))->addWidget(&onFront);
     (new QVBoxLayout(back))->addWidget(&onBack);

@@ -22,8 +22,7 @@ std::string roleName(QAccessible::Role role) {
 struct GuideAccessibility : hosts::Guided {
   GuideAccessibility() { hosts::listen(); }
 
-  /// Lists what the panel shows, as a screen reader that explores it reads it: without what only
-  /// holds others, as the area that scrolls the text.
+  /// Lists what the panel shows, as a screen reader that explores it reads it.
   static void read(QAccessibleInterface& object, Lines& lines) {
     if (object.state().invisible || object.rect().isEmpty()) return;
     std::string line = roleName(object.role()) + " \"" + utf8(object.text(QAccessible::Name)) + '"';
@@ -31,8 +30,12 @@ struct GuideAccessibility : hosts::Guided {
     if (!description.isEmpty()) line += ": " + utf8(description);
     if (object.state().disabled) line += " (disabled)";
     if (object.state().focused) line += " (focused)";
-    if (line != "Client \"\"") lines.push_back(line);
-    for (int i = 0; i < object.childCount(); ++i) read(*object.child(i), lines);
+    lines.push_back(line);
+    for (int i = 0; i < object.childCount(); ++i) {
+      EXPECT_EQ(object.child(i)->parent(), &object) << line;
+      EXPECT_EQ(object.indexOfChild(object.child(i)), i) << line;
+      read(*object.child(i), lines);
+    }
   }
   Lines readPanel() const {
     Lines lines;

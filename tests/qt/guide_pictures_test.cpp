@@ -7,6 +7,8 @@
 #include <QPainter>
 #include <QScreen>
 #include <QStyle>
+#include <QToolBar>
+#include <QTranslator>
 #include <utility>
 
 #include "examples/qt-host/guided_form.hpp"
@@ -43,17 +45,21 @@ struct Variant {
   QPalette palette;
   Qt::LayoutDirection direction = Qt::LeftToRight;
   bool hasHighContrast = false;
+  QLocale locale = QLocale(QLocale::English);
 };
 
 struct GuidePictures : testing::Test {
   std::unique_ptr<GuidedForm> form;
+  QTranslator words;
   const QPalette before = QApplication::palette();
+  const QLocale localeBefore;
   std::vector<QImage> steps;  // of one walk-through
 
   GuidePictures() { qApp->setProperty(toolkit::qt::reducedMotionProperty, true); }
   ~GuidePictures() override {
     form.reset();
     QApplication::setPalette(before);
+    QLocale::setDefault(localeBefore);
     QApplication::setLayoutDirection(Qt::LeftToRight);
     qApp->setProperty(toolkit::qt::reducedMotionProperty, QVariant());
     qApp->setProperty(toolkit::qt::highContrastProperty, QVariant());
@@ -64,12 +70,17 @@ struct GuidePictures : testing::Test {
     QApplication::setPalette(variant.palette);
     QApplication::setLayoutDirection(variant.direction);
     qApp->setProperty(toolkit::qt::highContrastProperty, variant.hasHighContrast);
-    form = std::make_unique<GuidedForm>(QZ_SOURCE_DIR "/examples/qt-host");
+    QLocale::setDefault(variant.locale);
+    QCoreApplication::removeTranslator(&words);
+    const bool isTranslated = words.load(variant.locale, "parcels", "_", ":/i18n");
+    ASSERT_EQ(isTranslated, variant.locale.language() == QLocale::German);
+    if (isTranslated) QCoreApplication::installTranslator(&words);
+    form = std::make_unique<GuidedForm>();
     form->move(place);
     form->show();
     form->activateWindow();
     ASSERT_TRUE(QTest::qWaitForWindowActive(form.get()));
-    form->menuBar()->actions()[0]->menu()->actions()[2]->trigger();
+    form->menuBar()->actions()[0]->menu()->actions()[0]->trigger();
     hosts::settle();
   }
 
@@ -146,6 +157,7 @@ struct GuidePictures : testing::Test {
     for (const auto* const label : {&panel().heading, &panel().text}) {
       EXPECT_GE(label->height(), label->heightForWidth(label->width())) << name.toStdString();
     }
+    EXPECT_GE(panel().scroll.viewport()->height(), panel().text.height()) << name.toStdString();
     return !target().isEmpty();
   }
 
@@ -173,7 +185,7 @@ struct GuidePictures : testing::Test {
       click(panel().next);
     }
     look(name);
-    click(form->order);
+    click(*form->findChild<QToolBar*>()->widgetForAction(form->order));
     look(name);
     click(panel().next);
     EXPECT_FALSE(panel().isVisible());
@@ -191,7 +203,8 @@ TEST_F(GuidePictures, ShowEveryStepOfTheExample) {
   const Variant variants[] = {{"light", QApplication::style()->standardPalette()},
                               {"dark", nightPalette()},
                               {"right-to-left", before, Qt::RightToLeft},
-                              {"high-contrast", contrastPalette(), Qt::LeftToRight, true}};
+                              {"high-contrast", contrastPalette(), Qt::LeftToRight, true},
+                              {"german", before, Qt::LeftToRight, false, QLocale::German}};
   for (const Variant& variant : variants) {
     begin(variant, {40, 120});
     walk(variant.name);
@@ -201,7 +214,7 @@ TEST_F(GuidePictures, ShowEveryStepOfTheExample) {
 // The form is in the corners of the screen, and hangs over its edges.
 TEST_F(GuidePictures, ShowTheEdgesOfTheScreen) {
   const QRect screen = QGuiApplication::primaryScreen()->availableGeometry();
-  const QSize room = screen.size() - QSize(480, 480);
+  const QSize room = screen.size() - QSize(480, 440);
   const struct {
     const char* name;
     QPoint place;

@@ -6,11 +6,13 @@
 #include <QTemporaryDir>
 #include <QWizard>
 #include <fstream>
+#include <map>
 
 #include "qz/hosts/qt/walk_through.hpp"
 #include "tests/qt/crowded_form.hpp"
 #include "tests/qt/snapshots.hpp"
 #include "tests/qt/support.hpp"
+#include "toolkit/qt/coordinates.hpp"
 
 namespace qz {
 
@@ -44,16 +46,78 @@ constexpr const char* randomCommands[] = {
     "(SET_TIMER_FOR_ID, 0.001, %1)",
 };
 
+/// The property by which a widget of one form is known in another.
+constexpr const char* numberProperty = "number";
+
+/// A form whose widgets have numbers.
+std::unique_ptr<CrowdedForm> makeForm() {
+  auto form = std::make_unique<CrowdedForm>();
+  int number = 0;
+  for (auto* const widget : form->findChildren<QWidget*>()) {
+    widget->setProperty(numberProperty, ++number);
+  }
+  return form;
+}
+
+std::map<int, QWidget*> numbered(const QWidget& form) {
+  std::map<int, QWidget*> widgets;
+  for (auto* const widget : form.findChildren<QWidget*>()) {
+    const QVariant number = widget->property(numberProperty);
+    if (number.isValid()) widgets[number.toInt()] = widget;
+  }
+  return widgets;
+}
+
+// A page that its stack has lost is never laid out.
+bool isInLostPage(const QWidget& widget) {
+  const QWidget* const around = widget.parentWidget();
+  if (!around || widget.isWindow()) return false;
+  const auto* const stack = qobject_cast<const QStackedWidget*>(around);
+  return (stack && stack->indexOf(&widget) < 0) || isInLostPage(*around);
+}
+
+bool isInSplitter(const QWidget& widget) {
+  const QWidget* const around = widget.parentWidget();
+  return around && (qobject_cast<const QSplitter*>(around) || isInSplitter(*around));
+}
+
+bool isFreeStack(const QStackedWidget& stack) {
+  return !qobject_cast<QTabWidget*>(stack.parentWidget());
+}
+
+/// Shows each page, with the first as the last: Qt lays a page out when it is shown.
+template <class Pages, class Inner>
+void showEachPage(Pages& pages, const Inner& showInner) {
+  for (int page = pages.count() - 1; page >= 0; --page) {
+    pages.setCurrentIndex(page);
+    showInner();
+    for (int level = 0; level < 5; ++level) hosts::settle();  // of nested layouts
+  }
+}
+
+void showEachPageOf(QWidget& form) {
+  form.show();
+  const auto showInner = [&] {
+    for (auto* const stack : form.findChildren<QStackedWidget*>()) {
+      if (isFreeStack(*stack)) showEachPage(*stack, [] {});
+    }
+    for (auto* const box : form.findChildren<QToolBox*>()) showEachPage(*box, [] {});
+  };
+  for (auto* const tabs : form.findChildren<QTabWidget*>()) showEachPage(*tabs, showInner);
+}
+
 struct TourEnds : testing::Test {
   QRandomGenerator random{20};
   QTemporaryDir directory;
   toolkit::qt::QtToolkit toolkit;
   std::unique_ptr<hosts::qt::WalkThrough> walkThrough;
   std::unique_ptr<CrowdedForm> form;
+  std::unique_ptr<CrowdedForm> twin;  // has no walk-through, but the same host and user
   QWidget other;                      // has no controls
   std::function<void()> whenPressed;  // called once, inside a press
   Snapshot before;
-  int clicks = 0;  // that the host has heard
+  int clicks = 0;             // that the host has heard
+  bool hasSeenPages = false;  // the user, before the walk-through
 
   TourEnds() {
     toolkit.files().setResourcePath(directory.path().toStdString());
@@ -83,12 +147,20 @@ struct TourEnds : testing::Test {
   }
 
   QAbstractButton* anyButton() {
-    const auto all = form->findChildren<QAbstractButton*>();
+    auto all = form->findChildren<QAbstractButton*>();
+    all.removeIf([](const QAbstractButton* button) { return hosts::isSparePart(*button); });
     return all.isEmpty() ? nullptr : all[below(static_cast<int>(all.size()))];
   }
 
   void press() {
-    if (auto* const button = form ? anyButton() : nullptr) button->click();
+    auto* const button = form ? anyButton() : nullptr;
+    if (!button) return;
+    const auto twins = numbered(*twin);
+    const auto same = twins.find(button->property(numberProperty).toInt());
+    if (button->isEnabled() && same != twins.end()) {
+      static_cast<QAbstractButton*>(same->second)->click();
+    }
+    button->click();
   }
 
   // Presses buttons until the walk-through has heard one.
@@ -99,9 +171,11 @@ struct TourEnds : testing::Test {
   void actLikeAUser();
   Snapshot picture() const;
   void expectRestored(const std::string& name);
+  void expectSamePlaces(const std::string& name) const;
 };
 
-// What has nothing to do with the place of a widget, or with what the user does here.
+// What has nothing to do with the place of a widget, which `expectSamePlaces` compares, or with
+// what the user does here.
 bool isLasting(const QString& name) {
   static const QStringList lasting = {
       "text",         "title",      "toolTip", "accessibleName", "accessibleDescription",
@@ -139,8 +213,30 @@ void TourEnds::actLikeAUser() {
   }
 }
 
+// Expects each widget where it would be without the walk-through.
+void TourEnds::expectSamePlaces(const std::string& name) const {
+  showEachPageOf(*form);
+  showEachPageOf(*twin);
+  const auto twins = numbered(*twin);
+  EXPECT_EQ(form->geometry().size(), twin->geometry().size()) << name;
+  for (const auto& [number, widget] : numbered(*form)) {
+    const auto same = twins.find(number);
+    // A splitter that appears during a walk-through shares its room out among what it shows then.
+    const bool isNew = !hasSeenPages && isInSplitter(*widget);
+    const bool isInDock = widget == form->dock || form->dock->isAncestorOf(widget);
+    const bool isAway = isInDock && (form->dock->isFloating() || form->dock->isHidden());
+    const bool isLost = isInLostPage(*widget) || hosts::isSparePart(*widget) || isAway;
+    if (same == twins.end() || isNew || isLost) continue;
+    const auto place = toolkit::qt::exactly(widget->geometry());
+    const auto expected = toolkit::qt::exactly(same->second->geometry());
+    EXPECT_EQ(place, expected) << name << ": " << number << ' '
+                               << hosts::nameOf(*widget).toStdString();
+  }
+}
+
 void TourEnds::expectRestored(const std::string& name) {
   if (!form) return;
+  expectSamePlaces(name);
   const Snapshot after = picture();
   for (const QString& what : hosts::differences(before, after)) {
     // Some ways to end delete widgets, or add one.
@@ -156,6 +252,12 @@ void TourEnds::expectRestored(const std::string& name) {
   }
 }
 
+/// What happens to the form happens to its twin, too.
+void onBoth(const TourEnds& test, void (*change)(CrowdedForm&)) {
+  change(*test.form);
+  change(*test.twin);
+}
+
 const struct {
   const char* name;
   void (*end)(TourEnds&);
@@ -167,9 +269,14 @@ const struct {
     {"walk-through destroyed", [](TourEnds& test) { test.walkThrough.reset(); }},
     {"replaced", [](TourEnds& test) { test.walkThrough->play("tour.plist", test.other); }},
     {"played again", [](TourEnds& test) { test.walkThrough->play("tour.plist", *test.form); }},
-    {"tab removed", [](TourEnds& test) { test.form->tabs->removeTab(1); }},
-    {"page deleted", [](TourEnds& test) { delete test.form->second; }},
-    {"content replaced", [](TourEnds& test) { test.form->setCentralWidget(new QWidget); }},
+    {"tab removed",
+     [](TourEnds& test) { onBoth(test, [](CrowdedForm& form) { form.tabs->removeTab(1); }); }},
+    {"page deleted",
+     [](TourEnds& test) { onBoth(test, [](CrowdedForm& form) { delete form.second; }); }},
+    {"content replaced",
+     [](TourEnds& test) {
+       onBoth(test, [](CrowdedForm& form) { form.setCentralWidget(new QWidget); });
+     }},
     {"application quits",
      [](TourEnds&) {
        QMetaObject::invokeMethod(
@@ -178,7 +285,7 @@ const struct {
      }},
     {"button deleted in its press",
      [](TourEnds& test) {
-       test.whenPressed = [&test] { delete &test.form->inBox; };
+       test.whenPressed = [&test] { onBoth(test, [](CrowdedForm& form) { delete &form.inBox; }); };
        test.form->inBox.click();
      }},
     {"window deleted in a press",
@@ -267,14 +374,21 @@ TEST_F(TourEnds, AtAnyMomentAreSafeAndRestoreTheForm) {
   for (int tour = 0; tour < end; ++tour) {
     const auto& way = waysToEnd[below(std::size(waysToEnd))];
     const std::string name = "tour " + std::to_string(tour) + ", " + way.name;
-    form = std::make_unique<CrowdedForm>();
+    form = makeForm();
+    twin = makeForm();
     walkThrough = std::make_unique<hosts::qt::WalkThrough>(toolkit);
     for (auto* const button : form->findChildren<QAbstractButton*>()) {
       QObject::connect(button, &QAbstractButton::clicked, [this] { ++clicks; });
     }
     form->show();
+    twin->show();
     other.show();
     if (below(2)) hosts::settle();
+    hasSeenPages = below(2) != 0;
+    if (hasSeenPages) {
+      showEachPageOf(*form);
+      showEachPageOf(*twin);
+    }
     before = picture();
     writeScript();
     ASSERT_TRUE(walkThrough->play("tour.plist", *form)) << name;

@@ -1,5 +1,6 @@
 // SPDX-License-Identifier: MIT
-// Presents the controls of a form as the subviews of one view.
+// Presents the controls of a form as the subviews of one view. The form is walked again only after
+// something has changed that decides what its controls are.
 
 #include "toolkit/qt/adopted_content.hpp"
 
@@ -15,11 +16,17 @@ AdoptedNode::AdoptedNode(QWidget& content, std::shared_ptr<Desk> desk,
   joinForm(form_, 0);
 }
 
+// A widget that is destroyed together with those around it sends no event.
+bool AdoptedNode::isUpToDate() {
+  return !tree_.hasChanged() && !form_->usesNames() && found_.hasAllPages() && presentsOnlyLiving();
+}
+
 const Subviews& AdoptedNode::readSubviews() {
-  found_.clear();
+  if (isUpToDate()) return presented();
+  found_ = {};
   form_->list(found_);
-  if (!presents(found_)) {
-    present(found_);
+  if (!presents(found_.controls)) {
+    present(found_.controls);
     adoptControls();
   }
   return presented();

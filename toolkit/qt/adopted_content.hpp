@@ -3,9 +3,9 @@
 #pragma once
 
 #include <memory>
-#include <vector>
 
 #include "toolkit/qt/adopted_form.hpp"
+#include "toolkit/qt/tree_watch.hpp"
 #include "toolkit/qt/views.hpp"
 
 namespace qz::toolkit::qt {
@@ -20,10 +20,12 @@ class AdoptedNode : public WidgetNode {
   const Subviews& readSubviews() override;
 
  private:
+  bool isUpToDate();
   void adoptControls();
 
   const std::shared_ptr<AdoptedForm> form_;
-  std::vector<QObject*> found_;  // by the last search; kept for its memory
+  Listing found_;  // by the last walk
+  TreeWatch tree_;
 };
 
 class AdoptedContent final : public QtView<View, AdoptedNode> {

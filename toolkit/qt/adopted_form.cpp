@@ -1,6 +1,5 @@
 // SPDX-License-Identifier: MIT
-// Finds the controls of an adopted window. The tree is walked at every search, because widgets do
-// not report changes of their descendants.
+// Finds the controls of an adopted window.
 
 #include "toolkit/qt/adopted_form.hpp"
 
@@ -30,6 +29,12 @@ bool hasTagProperty(const QObject& object) {
   const auto names = object.dynamicPropertyNames();
   return std::any_of(names.begin(), names.end(),
                      [](const QByteArray& name) { return name == tagProperty; });
+}
+
+// Returns the child as a widget; null if it is none, or if it is deleted while its siblings wait
+// for the same.
+QWidget* widgetAt(QObject* child) {
+  return child && child->isWidgetType() ? static_cast<QWidget*>(child) : nullptr;
 }
 
 bool isInToolBarOf(const QWidget& window, const QAction& action) {
@@ -67,6 +72,12 @@ bool isPartOfForm(const QWidget& widget) {
          isPanel(widget);
 }
 
+bool Listing::hasAllPages() const {
+  return std::all_of(stacks.begin(), stacks.end(), [](const auto& entry) {
+    return entry.first && entry.first->count() == entry.second;
+  });
+}
+
 AdoptedForm::AdoptedForm(QWidget& window, Adoption how) : window_(&window), how_(std::move(how)) {
   if (how_.restoring == Adoption::Restoring::everything) window.installEventFilter(this);
 }
@@ -90,41 +101,42 @@ QWidget* AdoptedForm::content() const {
   return central || !isWhole ? central : window_.data();
 }
 
-void AdoptedForm::list(std::vector<QObject*>& found) const {
+void AdoptedForm::list(Listing& found) const {
   const QWidget* const around = content();
   if (!around) return;
   if (how_.reading == Adoption::Reading::everyTaggedWidget) return addTagged(*window_, found);
   for (QObject* const child : around->children()) {
-    if (isSubview(child)) found.push_back(static_cast<QWidget*>(child));
+    if (isSubview(child)) found.controls.push_back(static_cast<QWidget*>(child));
   }
   addTaggedInPanels(found);
 }
 
-void AdoptedForm::addTaggedInPanels(std::vector<QObject*>& found) const {
-  for (const QObject* const child : window_->children()) {
-    const auto* const panel = child->isWidgetType() ? static_cast<const QWidget*>(child) : nullptr;
+void AdoptedForm::addTaggedInPanels(Listing& found) const {
+  for (QObject* const child : window_->children()) {
+    const QWidget* const panel = widgetAt(child);
     if (panel && isPanel(*panel)) addTagged(*panel, found);
   }
 }
 
 // The pages of a stack come in their own order: Qt puts the current one behind the others in the
 // list of children.
-void AdoptedForm::addTagged(const QWidget& around, std::vector<QObject*>& found) const {
+void AdoptedForm::addTagged(const QWidget& around, Listing& found) const {
   if (around.children().isEmpty()) return;  // as most widgets; casts take longer
   const auto* const stack = qobject_cast<const QStackedWidget*>(&around);
   const int pages = stack ? stack->count() : 0;
+  if (stack) found.stacks.emplace_back(stack, pages);
   for (int i = 0; i < pages; ++i) addTaggedFrom(*stack->widget(i), found);
   for (QObject* const child : around.children()) {
-    auto* const widget = child->isWidgetType() ? static_cast<QWidget*>(child) : nullptr;
+    QWidget* const widget = widgetAt(child);
     const bool isPage = stack && widget && stack->indexOf(widget) >= 0;
     if (widget && !isPage && isPartOfForm(*widget)) addTaggedFrom(*widget, found);
   }
 }
 
-void AdoptedForm::addTaggedFrom(QWidget& widget, std::vector<QObject*>& found) const {
-  if (hasTagProperty(widget) || givenTag(widget)) found.push_back(&widget);
+void AdoptedForm::addTaggedFrom(QWidget& widget, Listing& found) const {
+  if (hasTagProperty(widget) || givenTag(widget)) found.controls.push_back(&widget);
   const auto* const menu = widget.isWindow() ? qobject_cast<const QMenu*>(&widget) : nullptr;
-  if (menu) addActionsOf(*menu, found);
+  if (menu) addActionsOf(*menu, found.controls);
   addTagged(widget, found);
 }
 
@@ -169,12 +181,12 @@ std::string AdoptedForm::complaintAbout(const QObject& object) const {
 
 std::vector<std::string> AdoptedForm::unreachableTags() const {
   std::vector<std::string> complaints;
-  std::vector<QObject*> controls;
-  list(controls);
+  Listing found;
+  list(found);
   QObjectList objects = window_->findChildren<QObject*>();
   objects.prepend(window_);
   for (const QObject* const object : objects) {
-    if (isTagged(*object) && !isReached(*object, controls)) {
+    if (isTagged(*object) && !isReached(*object, found.controls)) {
       complaints.push_back(complaintAbout(*object));
     }
   }

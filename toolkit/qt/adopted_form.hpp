@@ -8,6 +8,7 @@
 #include <optional>
 #include <set>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "qz/toolkit/qt/adoption.hpp"
@@ -15,12 +16,25 @@
 
 class QAction;
 class QMenu;
+class QStackedWidget;
 
 namespace qz::toolkit::qt {
 
 /// True if `widget`, a child of a widget of a form, belongs to the form too: if it is not a window,
 /// if it is a dock, a tool bar or a menu, or if it is marked as a panel.
 bool isPartOfForm(const QWidget& widget);
+
+/// The controls that a walk through the widgets of a form has found.
+struct Listing {
+  /// Widgets and actions in the order of the widget tree. The actions of a menu come behind it; an
+  /// action that a tool bar shows is the button there.
+  std::vector<QObject*> controls;
+  /// The stacks on the way, and how many pages each had.
+  std::vector<std::pair<QPointer<const QStackedWidget>, int>> stacks;
+
+  /// True if no stack has lost a page, which it keeps as a child. No event tells of that.
+  bool hasAllPages() const;
+};
 
 /// How much of a control's change the user is to see.
 enum class Notice : std::uint8_t { none, shown, flash };
@@ -35,9 +49,10 @@ class AdoptedForm final : public QObject {
   /// Returns the widget that holds the window's controls; null if it is gone. The central widget of
   /// a main window that has one, otherwise the window.
   QWidget* content() const;
-  /// Adds the controls to `found`, widgets and actions, in the order of the widget tree. The
-  /// actions of a menu come behind it; an action that a tool bar shows is the button there.
-  void list(std::vector<QObject*>& found) const;
+  /// Walks through the form and adds its controls to `found`.
+  void list(Listing& found) const;
+  /// True if some tags depend on object names, whose changes no event tells.
+  bool usesNames() const { return !how_.tags.empty(); }
   /// Returns the tag that a widget or an action without the property `qzTag` has by its name, or a
   /// widget by its action; absent if it has none.
   std::optional<Tag> givenTag(const QObject& object) const;
@@ -60,9 +75,9 @@ class AdoptedForm final : public QObject {
 
  private:
   void attend(QWidget& widget, Notice notice);
-  void addTagged(const QWidget& around, std::vector<QObject*>& found) const;
-  void addTaggedFrom(QWidget& widget, std::vector<QObject*>& found) const;
-  void addTaggedInPanels(std::vector<QObject*>& found) const;
+  void addTagged(const QWidget& around, Listing& found) const;
+  void addTaggedFrom(QWidget& widget, Listing& found) const;
+  void addTaggedInPanels(Listing& found) const;
   void addActionsOf(const QMenu& menu, std::vector<QObject*>& found) const;
   bool isTagged(const QObject& object) const;
   std::optional<Tag> namedTag(const QObject& object) const;

@@ -84,9 +84,14 @@ bool isOtherPage(const QWidget& widget) {
          qobject_cast<QToolBox*>(widget.parentWidget());
 }
 
+bool isLaidOut(const QList<int>& panes) {
+  return std::any_of(panes.begin(), panes.end(), [](int size) { return size > 0; });
+}
+
 struct HiddenState {
   bool isHidden = false;
-  QRect place;  // layouts do not look after hidden widgets
+  QRect place;       // layouts do not look after hidden widgets
+  QList<int> panes;  // of the splitter around the widget: a hidden pane loses its room
   friend bool operator==(const HiddenState& a, const HiddenState& b) {
     return a.isHidden == b.isHidden;
   }
@@ -94,13 +99,17 @@ struct HiddenState {
 
 QVariant readHidden(QWidget& widget) {
   if (!isPartOfForm(widget) || isOtherPage(widget)) return {};
-  return QVariant::fromValue(HiddenState{isHiddenInForm(widget), widget.geometry()});
+  const auto* const splitter = qobject_cast<QSplitter*>(widget.parentWidget());
+  return QVariant::fromValue(HiddenState{isHiddenInForm(widget), widget.geometry(),
+                                         splitter ? splitter->sizes() : QList<int>()});
 }
 
 void writeHidden(QWidget& widget, const QVariant& value) {
   const auto state = value.value<HiddenState>();
   setHiddenInForm(widget, state.isHidden);
   if (state.isHidden) widget.setGeometry(state.place);
+  auto* const splitter = qobject_cast<QSplitter*>(widget.parentWidget());
+  if (splitter && isLaidOut(state.panes)) splitter->setSizes(state.panes);
 }
 
 QVariant readEnabled(QWidget& widget) {
@@ -388,9 +397,12 @@ struct PaneState {
   }
 };
 
+// Nothing if the splitter has not been laid out yet, as on a page that nobody has seen.
 QVariant readPanes(QWidget& widget) {
   const auto* const splitter = qobject_cast<QSplitter*>(&widget);
-  return splitter ? QVariant::fromValue(PaneState{splitter->sizes()}) : QVariant();
+  if (!splitter) return {};
+  const auto sizes = splitter->sizes();
+  return isLaidOut(sizes) ? QVariant::fromValue(PaneState{sizes}) : QVariant();
 }
 void writePanes(QWidget& widget, const QVariant& value) {
   static_cast<QSplitter&>(widget).setSizes(value.value<PaneState>().sizes);

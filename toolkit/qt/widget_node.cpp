@@ -32,7 +32,7 @@ bool areSubviewsOf(const QWidget& parent, const std::vector<QPointer<QObject>>& 
 }  // namespace
 
 bool isSubview(const QObject* child) {
-  return child->isWidgetType() && !static_cast<const QWidget*>(child)->isWindow();
+  return child && child->isWidgetType() && !static_cast<const QWidget*>(child)->isWindow();
 }
 
 // Watches for changes of the widget that this toolkit does not make.
@@ -140,6 +140,11 @@ bool WidgetNode::presents(const std::vector<QObject*>& objects) const {
   return std::equal(
       objects.begin(), objects.end(), listed_.begin(), listed_.end(),
       [](QObject* object, const QPointer<QObject>& listed) { return object == listed.data(); });
+}
+
+bool WidgetNode::presentsOnlyLiving() const {
+  return std::none_of(listed_.begin(), listed_.end(),
+                      [](const QPointer<QObject>& listed) { return listed.isNull(); });
 }
 
 void WidgetNode::joinForm(const std::shared_ptr<AdoptedForm>& form, Tag tag) {

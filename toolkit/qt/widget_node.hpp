@@ -42,7 +42,8 @@ inline bool isMarkedForBoth(const QObject& object) {
 /// even if the child is a window too: its widgets with tags are controls.
 inline constexpr const char* panelProperty = "qzPanel";
 
-/// True if `child`, a child of a widget, is a subview: a widget that is not a window.
+/// True if `child`, a child of a widget, is a subview: a widget that is not a window. A child is
+/// null while Qt deletes it together with its siblings.
 bool isSubview(const QObject* child);
 
 class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
@@ -90,6 +91,8 @@ class WidgetNode : public std::enable_shared_from_this<WidgetNode> {
   void present(const std::vector<QObject*>& objects);
   /// True if the subviews are those of `objects`.
   bool presents(const std::vector<QObject*>& objects) const;
+  /// True if no object that the subviews show has been destroyed.
+  bool presentsOnlyLiving() const;
   const Subviews& presented() const { return subviews_; }
   /// As `View::addSubview`. Raises an invalid-argument exception, and changes nothing, if `view` is
   /// absent, another toolkit's, a window's content view, this view or one of its superviews.
