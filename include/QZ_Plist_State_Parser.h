@@ -50,12 +50,15 @@
 extern "C" {
 #endif
 
-// The names of the commands in scripts. Assigning another string to one renames the command for
-// every script from then on; with nil, no command has the name. The engine looks at them when one
-// of its operations is called. The names of compound commands are upper-cased before they are
-// compared; those of simple commands are not. QZ_PLIST_STATE_PARSER_RETURN_TO_IDLE_LOOP holds
-// "IDLE_LOOP", the one value that differs from its constant's name. No command has the names
-// BUTTON_WITH_ID_AT, IMAGE_WITH_ID_AND_PATH_AT and HIGHLIGHT_ID.
+/// \name Names of commands
+/// \{
+
+/// The name of a command in scripts. Assigning another string to one renames the command for
+/// every script from then on; with nil, no command has the name. The engine looks at the names when
+/// one of its operations is called. The names of compound commands are upper-cased before they are
+/// compared; those of simple commands are not. QZ_PLIST_STATE_PARSER_RETURN_TO_IDLE_LOOP holds
+/// "IDLE_LOOP", the one value that differs from its constant's name. No command has the names
+/// BUTTON_WITH_ID_AT, IMAGE_WITH_ID_AND_PATH_AT and HIGHLIGHT_ID.
 QZ_EXPORTED extern NSString* QZ_NULLABLE QZ_PLIST_STATE_PARSER_TERMINATE_PARSER;
 QZ_EXPORTED extern NSString* QZ_NULLABLE QZ_PLIST_STATE_PARSER_RETURN_TO_IDLE_LOOP;
 QZ_EXPORTED extern NSString* QZ_NULLABLE QZ_PLIST_STATE_PARSER_HIDE_OBJECT_WITH_ID;
@@ -87,6 +90,8 @@ QZ_EXPORTED extern NSString* QZ_NULLABLE
 QZ_EXPORTED extern NSString* QZ_NULLABLE
     QZ_PLIST_STATE_PARSER_SET_ATTRIBUTED_STRING_AS_IS_WITH_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID;
 
+/// \}
+
 #ifdef __cplusplus
 }
 #endif
@@ -101,6 +106,7 @@ QZ_EXPORTED extern NSString* QZ_NULLABLE
         contextInfo:(void* QZ_NULLABLE)contextInfo;
 @end
 
+/// Plays scripted walk-throughs over the controls of a window.
 @interface QZ_Plist_State_Parser : NSObject <NSWindowDelegate> {
  @private
   void* _behind;  // made at the first use
@@ -220,8 +226,9 @@ QZ_EXPORTED extern NSString* QZ_NULLABLE
 /// Sets a button's title.
 - (BOOL)QZ_Plist_State_Processor_SET_TITLE:(NSString* QZ_NULLABLE)title
                                      forId:(NSNumber* QZ_NULLABLE)objectId;
-/// Turn a button on or off without sending its action.
+/// Turns a button on without sending its action.
 - (BOOL)QZ_Plist_State_Processor_SET_STATE_ON:(NSNumber* QZ_NULLABLE)objectId;
+/// Turns a button off without sending its action.
 - (BOOL)QZ_Plist_State_Processor_SET_STATE_OFF:(NSNumber* QZ_NULLABLE)objectId;
 /// Sets a tooltip: the text, then optionally the tag of another control.
 - (BOOL)QZ_Plist_State_Processor_SET_TOOL_TIP:(NSArray* QZ_NULLABLE)parameters
