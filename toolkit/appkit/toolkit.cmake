@@ -47,6 +47,17 @@ function(qz_find_appkit found)
     target_link_libraries(qz_foundation_platform INTERFACE ${QZ_GNUSTEP_BASE} -lobjc)
     target_link_libraries(qz_appkit_platform INTERFACE ${QZ_GNUSTEP_GUI})
     set(QZ_PKGCONFIG_LIBS_appkit "-lgnustep-gui -lgnustep-base -lobjc" PARENT_SCOPE)
+    set(QZ_CONDITION_appkit [[
+if(CMAKE_OBJC_COMPILER_ID AND NOT CMAKE_OBJC_COMPILER_ID STREQUAL "GNU")
+  set(qz_NOT_FOUND_MESSAGE "The AppKit toolkit of qz was built for GCC's Objective-C, and this project compiles \
+Objective-C with ${CMAKE_OBJC_COMPILER}. Configure it in a new build directory, with OBJC=gcc in the environment.")
+  set(qz_FOUND FALSE)
+  return()
+endif()
+# CMake has no flags for the run path of programs in Objective-C, except on macOS.
+set(CMAKE_EXECUTABLE_RUNTIME_OBJC_FLAG "-Wl,-rpath,")
+set(CMAKE_EXECUTABLE_RUNTIME_OBJC_FLAG_SEP ":")
+]] PARENT_SCOPE)
   endif()
   if(QZ_INSTALL)
     foreach(kind shared static)  # each of the two libraries has its own list
