@@ -98,6 +98,14 @@ TEST(CommandCatalogue, HasOneRowForEachConstantOfTheHeader) {
       << "each constant of include/qz/engine.hpp needs one row in engine/catalogue.cpp";
 }
 
+TEST(CommandCatalogue, ObjectiveCHostsCanAssignEveryNameThatTheirHeaderDeclares) {
+  const auto declared = matches(contents("include/QZ_Plist_State_Parser.h"),
+                                R"(extern NSString\* QZ_NULLABLE\s+QZ_PLIST_STATE_PARSER_(\w+);)");
+  const auto read = matches(contents("hosts/appkit/command_names.mm"), R"(\n  DO\((\w+), )");
+  EXPECT_FALSE(declared.empty());
+  EXPECT_EQ(inOneOf(declared, read), Words());
+}
+
 TEST(CommandCatalogue, EachNameIsThatOfItsConstantButForTheIdleCommand) {
   for (const Command& command : commandCatalogue()) {
     const bool isIdle = &command.name == &QZ_PLIST_STATE_PARSER_RETURN_TO_IDLE_LOOP;

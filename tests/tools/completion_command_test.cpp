@@ -92,6 +92,14 @@ Words writableFormats() {
   return names;
 }
 
+Words commandsWith(std::string_view beginning) {
+  Words names;
+  for (const CommandEntry& command : allCommands()) {
+    if (std::string_view(command.name).starts_with(beginning)) names.emplace(command.name);
+  }
+  return names;
+}
+
 TEST(Completion, BashCompletesCommandsOptionsAndValues) {
   const CompletionPlace place("bash");
   const Words files = {"data.plist", "dir"};
@@ -100,7 +108,7 @@ TEST(Completion, BashCompletesCommandsOptionsAndValues) {
     Words expected;
   } cases[] = {
       {{"pl"}, {"play"}},
-      {{"co"}, {"cover", "convert", "completion"}},
+      {{"co"}, commandsWith("co")},
       {{"--v"}, {"--version"}},
       {{"play", "--s"}, {"--sheet", "--screenshots", "--start"}},
       {{"play", "--toolkit", ""}, setOf(driverNames())},
@@ -180,7 +188,7 @@ TEST(Completion, FishCompletesCommandsOptionsAndValues) {
     Words expected;
   } cases[] = {
       {"pl", {"play"}},
-      {"co", {"cover", "convert", "completion"}},
+      {"co", commandsWith("co")},
       {"play --s", {"--sheet", "--screenshots", "--start"}},
       {"test --toolkit ", setOf(driverNames())},
       {"convert a b --format ", writableFormats()},

@@ -6,7 +6,7 @@
 
 namespace qz::toolkit {
 
-#define QZ_FORMAT(name) extern const FormatRow name##Format;
+#define QZ_FORMAT(name, value) extern const FormatRow name##Format;
 #include "qz/property_list/formats.inc"
 #undef QZ_FORMAT
 
