@@ -18,5 +18,3 @@ if(TARGET qt-tests)
   set_tests_properties(appkit:rows PROPERTIES ENVIRONMENT "QT_QPA_PLATFORM=offscreen;${qz_leaks}")
 endif()
 set_tests_properties(appkit:tests appkit:witnesses appkit-scenarios PROPERTIES ENVIRONMENT "${qz_leaks}" TIMEOUT 600)
-# It takes longest, so it begins first, and the others run beside it.
-set_tests_properties(appkit-scenarios PROPERTIES COST 1000)

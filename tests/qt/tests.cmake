@@ -2,13 +2,16 @@
 # The tests of the Qt toolkit.
 find_package(Qt6 6.4 REQUIRED COMPONENTS Test)
 qz_tests(qt qz::qt_driver qz::engine qz::tools qz::progress qt-host-forms Qt6::Test)
+# Some wait for a real clock, so they begin first, and the others run beside them.
+set_tests_properties(qt:part-0 qt:part-1 qt:part-2 qt:part-3 PROPERTIES COST 100)
 target_sources(qt-tests PRIVATE qt/main.cpp qt/announcements.cpp qt/resources/resources.qrc)
 set_target_properties(qt-tests PROPERTIES AUTOUIC ON AUTORCC ON)
 add_executable(qt-outliving-test qt/outliving/main.cpp)
 target_link_libraries(qt-outliving-test PRIVATE qz::qt_host qz_private)
 add_test(NAME qt:outliving COMMAND qt-outliving-test)
 set_tests_properties(qt:outliving PROPERTIES ENVIRONMENT ${qz_leaks})
-qz_scenario_tests(qt QT_QPA_PLATFORM=offscreen)
+add_test(NAME qt-scenarios COMMAND qz-walkthrough test --toolkit qt ${PROJECT_SOURCE_DIR}/scenarios)
+set_tests_properties(qt-scenarios PROPERTIES ENVIRONMENT "QT_QPA_PLATFORM=offscreen;${qz_leaks}" TIMEOUT 1200)
 
 # Needs forms and Qt's form loader, which scripts/foreign-forms installs.
 if(TARGET Qt6::UiTools)

@@ -113,8 +113,10 @@ void ViewNode::insert(const Ref<View>& view) {
     [holderIn(object()) addSubview:added];
     [added release];
   });
-  if (before) before->readSubviews();
-  readSubviews();
+  // The whole list is not read anew, which would take longer with every view. What a host has
+  // changed, the next reading sees.
+  if (before) std::erase(before->subviews_, kept);
+  subviews_.push_back(kept);
 }
 
 void ViewNode::removeFromSuperview() {
@@ -122,7 +124,7 @@ void ViewNode::removeFromSuperview() {
   const auto kept = shared_from_this();
   const auto around = of(superview());
   [object() removeFromSuperview];
-  if (around) around->readSubviews();
+  if (around) std::erase(around->subviews_, view());
 }
 
 Ref<View> ViewNode::superview() const {
