@@ -87,9 +87,8 @@ std::set<std::string> foldersOf(const steps::Source& source) {
 
 /// Sleeps for a fifth of a second. Returns NO if the user has interrupted.
 bool restUntilInterrupted() {
-  if (Interruption::isWanted()) return false;
   std::this_thread::sleep_for(std::chrono::milliseconds(200));
-  return true;
+  return !Interruption::isWanted();
 }
 
 /// Builds again whenever a file has changed beside the source or another file that it is built of,

@@ -57,6 +57,8 @@ TEST(Mistakes, InStepsHavePlaces) {
        {"3:20: “color” is a property of buttons; the control “text” is a text field"}},
       {"steps: {a: {next: {press: end, color: pink}}}",
        {"3:39: expected red, white, blue, green, black, orange or gray, found “pink”"}},
+      {"steps: {a: {next: {press: end, color: }}}",
+       {"3:32: expected red, white, blue, green, black, orange or gray, found nothing"}},
       {"steps: {a: {hide: [texd], next: {press: end}}}",
        {"3:20: expected the name of a control, found “texd”; did you mean \"text\"?"}},
       {"steps: {a: {disable: frame, next: {press: end}}}",
