@@ -1,14 +1,17 @@
 // SPDX-License-Identifier: MIT
 // The command `build`.
+#include <chrono>
 #include <filesystem>
 #include <iostream>
 #include <memory>
 #include <optional>
 #include <set>
 #include <string>
+#include <thread>
 #include <vector>
 
 #include "qz/property_list/formats.hpp"
+#include "tools/check_progress.hpp"
 #include "tools/commands.hpp"
 #include "tools/output_format.hpp"
 #include "tools/steps/room.hpp"
@@ -82,13 +85,20 @@ std::set<std::string> foldersOf(const steps::Source& source) {
   return folders;
 }
 
+/// Sleeps for a fifth of a second. Returns NO if the user has interrupted.
+bool restUntilInterrupted() {
+  std::this_thread::sleep_for(std::chrono::milliseconds(200));
+  return !Interruption::isWanted();
+}
+
 /// Builds again whenever a file has changed beside the source or another file that it is built of,
 /// until the user interrupts. Mistakes are said, and mended ones are built.
 void watch(const BuildOptions& options) {
+  const Interruption interruption;
   std::set<std::string> folders = {folderOf(options.source)};
   const std::set<std::string> outputs = {outputOf(options),
                                          options.map.value_or(outputOf(options))};
-  watchFolders(folders, outputs, [&] {
+  const auto buildAgain = [&] {
     try {
       folders.merge(foldersOf(buildSource(options).from->source));
       std::cout << outputOf(options) << ": written" << std::endl;
@@ -99,7 +109,8 @@ void watch(const BuildOptions& options) {
       std::cerr << failure.what() << '\n';
     }
     return folders;
-  });
+  };
+  watchFolders(folders, outputs, buildAgain, restUntilInterrupted);
 }
 
 void describeBuild(Command& command) {

@@ -50,11 +50,10 @@ class AccessibleText final : public QAccessibleWidget {
 };
 
 GuidePanel* panelWithText(const QObject& object) {
-  for (QObject* around = object.parent(); around; around = around->parent()) {
-    auto* const panel = dynamic_cast<GuidePanel*>(around);
-    if (panel) return &panel->text == &object ? panel : nullptr;
-  }
-  return nullptr;
+  QObject* around = object.parent();
+  while (around && !dynamic_cast<GuidePanel*>(around)) around = around->parent();
+  auto* const panel = dynamic_cast<GuidePanel*>(around);
+  return panel && &panel->text == &object ? panel : nullptr;
 }
 
 QAccessibleInterface* makeInterface(const QString&, QObject* object) {

@@ -13,8 +13,10 @@ using drivers::ViewKind;
 using Kind = Difference::Kind;
 
 Played played(const std::string& script) {
-  Played played{
-      .script = naive::test::script(script), .plan = {}, .resources = "", .startKeys = {"0"}};
+  Played played{.script = naive::test::script(script),
+                .plan = {},
+                .resources = QZ_SOURCE_DIR "/examples/first-steps",
+                .startKeys = {"0"}};
   played.plan.host =
       naive::test::window({{ViewKind::textField, 1}, {ViewKind::button, 2}, {ViewKind::toggle, 3}});
   return played;
@@ -109,6 +111,15 @@ TEST(Comparison, NamesThePathByTheTagsOfEach) {
   EXPECT_EQ(std::get<check::StartMove>(path[0]).key, "0");
   EXPECT_EQ(std::get<check::PressMove>(path[1]).tag, 2);
   EXPECT_EQ(std::get<check::PressMove>(path[2]).tag, 20);
+}
+
+TEST(Comparison, FindsAnotherBackground) {
+  const auto found =
+      differences(original, changed("Hello, 1)", "Hello, 1), (LOAD_BACKGROUND_WITH_IMAGE, disk)"));
+  ASSERT_EQ(found.size(), 1U);
+  EXPECT_EQ(found[0].kind, Kind::look);
+  EXPECT_FALSE(found[0].control.has_value());
+  EXPECT_EQ(found[0].words, "the picture “disk” instead of no picture");
 }
 
 }  // namespace

@@ -4,6 +4,7 @@
 
 #include "tests/check/small_scripts.hpp"
 #include "tests/lift/lifted_script.hpp"
+#include "tools/lift/styled_text.hpp"
 
 namespace qz::tools::lift {
 namespace {
@@ -96,10 +97,51 @@ TEST(Lifting, SaysWhatTheLanguageCannot) {
       "press it");
 }
 
+/// Returns why a script is refused that begins with these commands; the tag 2 ends it.
+std::string refusalOf(const std::string& commands, const std::string& lists = "") {
+  return sourceOf("{ 0 = (" + commands + "); 2 = (TERMINATE_PARSER); " + lists + " }");
+}
+
+TEST(Lifting, SaysWhichWaitsTheLanguageCannotSay) {
+  const std::string tooLong =
+      "SET_TIMER_FOR_ID: a wait of 700000 s is not a whole number of seconds from 1 to 604800";
+  EXPECT_EQ(refusalOf("(SET_TIMER_FOR_ID, 700000, 9)", "9 = (TERMINATE_PARSER);"),
+            "script.plist: list “0”: " + tooLong);
+  EXPECT_EQ(refusalOf("(SET_TIMER_FOR_ID, 5, 9)", "9 = ((PROCESS_COMMANDS_FOR_ID, 9));"),
+            "script.plist: list “9”: a wait runs lists without end");
+  // The same without Back, if it is not Back that cannot be said.
+  EXPECT_EQ(sourceOf(R"({
+    0 = ((SET_TEXT_FOR_OBJECT_ID, Hello, 1), (DISABLE_OBJECT_WITH_ID, 3));
+    2 = ((SET_TAG_FOR_OBJECT_ID, 12, 2), (SET_TEXT_FOR_OBJECT_ID, Middle, 1), (ENABLE_OBJECT_WITH_ID, 3));
+    3 = ((SET_TAG_FOR_OBJECT_ID, 2, 12), (SET_TEXT_FOR_OBJECT_ID, Hello, 1), (DISABLE_OBJECT_WITH_ID, 3));
+    12 = ((SET_TEXT_FOR_OBJECT_ID, Last, 1), (SET_TAG_FOR_OBJECT_ID, 22, 12), (SET_TAG_FOR_OBJECT_ID, 13, 3),
+          (SET_TIMER_FOR_ID, 700000, 22));
+    13 = ((SET_TAG_FOR_OBJECT_ID, 12, 22), (SET_TAG_FOR_OBJECT_ID, 3, 13), (SET_TEXT_FOR_OBJECT_ID, Middle, 1));
+    22 = (TERMINATE_PARSER);
+    4 = ();
+  })"),
+            "script.plist: list “12”: " + tooLong);
+}
+
+TEST(Lifting, NamesTheCommandThatMadeALookThatTheLanguageCannotSay) {
+  const std::string blamed =
+      "script.plist: list “0”: SET_TEXT_FOR_OBJECT_ID: the control with the tag 1: no words of the "
+      "language make it look so";
+  EXPECT_EQ(refusalOf("(SET_TEXT_FOR_OBJECT_ID, \"  indented\", 1)"), blamed);
+  // Those before it are tried too, and must not run a list, wait or end anything meanwhile.
+  EXPECT_EQ(
+      refusalOf("(PROCESS_COMMANDS_FOR_ID, 1), (SET_TIMER_FOR_ID, 0, 1), HIDE_OBJECT_WITH_ID, "
+                "(HIDE_OBJECT_WITH_ID), (SET_TITLE_FOR_OBJECT_ID, Go, 2), "
+                "(SET_TEXT_FOR_OBJECT_ID, \"  indented\", 1)",
+                "1 = ();"),
+      blamed);
+}
+
 TEST(Lifting, QuotesWhatYamlWouldMisunderstand) {
   EXPECT_EQ(sourceOf(R"({
     0 = ((SET_TEXT_FOR_OBJECT_ID, "- yes: *no* #1 {a}", 1), (SET_TITLE_FOR_OBJECT_ID, "No", 2),
-         (SET_TITLE_FOR_OBJECT_ID, "say \"hi\"", 3));
+         (SET_TITLE_FOR_OBJECT_ID, "say \"hi\"", 3),
+         (SET_TOOL_TIP_FOR_ID, "two\nlines,\ta tab\U0001", 3));
     2 = (TERMINATE_PARSER);
     3 = (TERMINATE_PARSER);
     4 = ();
@@ -111,8 +153,34 @@ steps:
   "- yes: *no* #1 {a}":
     heading: "\\- yes: \\*no\\* \\#1 {a}"
     "no": {title: "No", press: end}
-    "say \"hi\"": {title: "say \"hi\"", press: end}
+    "say \"hi\"": {title: "say \"hi\"", tooltip: "two\nlines,\ta tab\x01", press: end}
 )");
+}
+
+TEST(Lifting, AButtonThatInvertsACheckBoxHasAStepForEachState) {
+  EXPECT_EQ(sourceOf(R"({
+    0 = ((SET_TEXT_FOR_OBJECT_ID, Choose, 1), (SET_STATE_OFF_FOR_OBJECT_ID, 4));
+    4 = ((SET_TAG_FOR_OBJECT_ID, 40, 4), (SET_TAG_FOR_OBJECT_ID, 20, 2));
+    40 = ((SET_TAG_FOR_OBJECT_ID, 4, 40), (SET_TAG_FOR_OBJECT_ID, 2, 20));
+    2 = ((SET_STATE_ON_FOR_OBJECT_ID, 4), (SET_TAG_FOR_OBJECT_ID, 40, 4), (SET_TAG_FOR_OBJECT_ID, 20, 2));
+    20 = ((SET_STATE_OFF_FOR_OBJECT_ID, 40), (SET_TAG_FOR_OBJECT_ID, 4, 40), (SET_TAG_FOR_OBJECT_ID, 2, 20));
+    3 = (TERMINATE_PARSER);
+  })"),
+            R"(window: host.plist
+controls: {heading: 1, button: 2, button 2: 3, button 3: 4}
+every step: {heading: Choose, button 2: {press: end}}
+back over: 0
+steps:
+  Choose: {button: {press: Choose 2}, button 3: {press: Choose 2}}
+  Choose 2: {button: {press: Choose}, button 3: {state: on, press: Choose}}
+)");
+}
+
+TEST(Lifting, WritesColoursBehindTextsAsHtml) {
+  toolkit::TextAttributes attributes;
+  attributes.backgroundColor = toolkit::Color{1, 1, 0, 1};
+  EXPECT_EQ(asHtml(toolkit::AttributedString("Hi", attributes), std::nullopt),
+            "<font style=\"background-color: #ffff00\">Hi</font>");
 }
 
 }  // namespace

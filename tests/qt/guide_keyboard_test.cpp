@@ -248,6 +248,32 @@ TEST_F(GuideKeyboard, StaysInAPanelWithoutButtons) {
   EXPECT_EQ(form->focusWidget(), &panel());
 }
 
+TEST_F(GuideKeyboard, PassesAControlThatTakesNoFocus) {
+  show();
+  send.setFocusPolicy(Qt::NoFocus);
+  play(threeSteps);
+  click(panel().next);
+  ASSERT_EQ(guide->target(), &send);
+  panel().next.setFocus();
+  press(Qt::Key_Tab);
+  EXPECT_EQ(focused(), &remark) << "the panel is behind the control before";
+  press(Qt::Key_Backtab, Qt::ShiftModifier);
+  EXPECT_EQ(focused(), &panel().next);
+}
+
+TEST_F(GuideKeyboard, StaysInThePanelIfTheFormTakesNoFocus) {
+  show();
+  for (QWidget* const widget : {static_cast<QWidget*>(&name), static_cast<QWidget*>(&send),
+                                static_cast<QWidget*>(&remark)}) {
+    widget->setFocusPolicy(Qt::NoFocus);
+  }
+  play(threeSteps);
+  ASSERT_EQ(focused(), &panel().next);
+  press(Qt::Key_Tab);
+  EXPECT_TRUE(panel().isAncestorOf(focused()));
+  EXPECT_TRUE(panel().isActiveWindow());
+}
+
 }  // namespace
 
 }  // namespace qz

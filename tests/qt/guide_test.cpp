@@ -284,6 +284,22 @@ TEST_F(Guides, StayInsideTheWindowIfTheHostWantsThat) {
   EXPECT_FALSE(panel().geometry().intersects(send.geometry()));
 }
 
+TEST_F(Guides, HaveLargerHeadingsInFontsOfPixelsToo) {
+  QFont inPixels = form->font();
+  inPixels.setPixelSize(20);
+  for (const QFont& font : {form->font(), inPixels}) {
+    form->setFont(font);
+    show();
+    play(threeSteps);
+    const QFont text = panel().text.font();
+    const QFont heading = panel().heading.font();
+    EXPECT_EQ(text.pixelSize(), font.pixelSize());
+    EXPECT_EQ(heading.pixelSize(), font.pixelSize() > 0 ? 24 : -1);
+    EXPECT_GT(QFontMetrics(heading).height(), QFontMetrics(text).height());
+    walkThrough.end();
+  }
+}
+
 TEST_F(Guides, GrowWiderForLongTextsAndStayOnTheScreen) {
   show();
   std::string text;

@@ -297,6 +297,38 @@ TEST_F(MenuActions, MayBeDeletedAtAnyTime) {
   hosts::settle();
 }
 
+TEST_F(MenuActions, ShowOfAButtonWhatAnActionCan) {
+  ASSERT_TRUE(play());
+  const auto view = control(70);
+  auto* const button = view->asButton();
+  const QIcon icon = open.icon();
+  view->setWantsLayer(true);
+  view->setLayerContents(nullptr);
+  button->setBackgroundColor(toolkit::colors::red);
+  button->setBezelStyle({});
+  EXPECT_EQ(open.icon().cacheKey(), icon.cacheKey());
+  button->setStringValue("plain");
+  EXPECT_EQ(button->stringValue(), "plain");
+  button->setAttributedStringValue(toolkit::AttributedString("styled"));
+  EXPECT_EQ(button->stringValue(), "styled");
+  EXPECT_EQ(open.text(), "&Open…") << "the value is not the title";
+  button->setAttributedTitle(toolkit::AttributedString("Title"));
+  EXPECT_EQ(open.text(), "Title");
+  button->highlight(true);
+  EXPECT_TRUE(button->isHighlighted());
+  EXPECT_THROW(view->addSubview(control(71)), toolkit::Exception);
+}
+
+TEST_F(MenuActions, OfAMenuThatNothingOpensReachNoWindow) {
+  ASSERT_TRUE(play());
+  const auto view = control(70);
+  auto* const button = view->asButton();
+  EXPECT_FALSE(button->sendAction("isUnknown:", nullptr));
+  form.menuBar()->removeAction(file.menuAction());
+  EXPECT_EQ(toolkit::qt::QtAction::of(view)->place(), nullptr);
+  EXPECT_FALSE(button->sendAction("isUnknown:", nullptr));
+}
+
 TEST_F(MenuActions, WithoutATargetAreTheHosts) {
   ASSERT_TRUE(play());
   const auto view = control(70);

@@ -8,11 +8,13 @@
 #include <QWidget>
 #include <algorithm>
 #include <filesystem>
+#include <stdexcept>
 
 #include "drivers/qt/qt_driver.hpp"
 #include "tests/steps/source_folder.hpp"
 #include "tests/tools/tool_run.hpp"
 #include "tools/commands.hpp"
+#include "tools/steps/each_step.hpp"
 #include "tools/support/whole_file.hpp"
 
 namespace qz::tools {
@@ -94,6 +96,22 @@ TEST(StepsTexts, ThatDoNotFitAreNamedWithTheirStep) {
   EXPECT_EQ(std::count(built.err.begin(), built.err.end(), '\n'), 1) << built.err;
   const Result longer = run(buildCommand, {"build", "tour.yaml", "--language", "x-long"});
   EXPECT_EQ(longer.err, "") << "half as long again still fits";
+}
+
+TEST(StepsTexts, MayLackHeight) {
+  const steps::SourceFolder folder;
+  folder.writeSource("steps: {a: {text: Hello, next: {press: end}}}\n");
+  folder.write("de.po", "msgid \"Hello\"\nmsgstr \"eins\\nzwei\\ndrei\\nvier\\nfünf\"\n");
+  const std::string said = run(buildCommand, {"build", "tour.yaml", "--language", "de"}).err;
+  EXPECT_TRUE(said.starts_with("tour.yaml:3:13: warning: “eins")) << said;
+  EXPECT_TRUE(said.ends_with(" points of height\n")) << said;
+  EXPECT_EQ(said.find("width"), std::string::npos) << said;
+}
+
+TEST(StepsTexts, AreMeasuredByNoToolkitThatCannotBeMade) {
+  const auto fails = [](drivers::Driver&) -> bool { throw std::runtime_error("no display"); };
+  EXPECT_EQ(steps::findDriver(fails), nullptr);
+  EXPECT_NE(steps::findDriver([](drivers::Driver&) { return true; }), nullptr);
 }
 
 TEST(StepsTexts, PicturesShowTranslatorsWhereTheyAre) {

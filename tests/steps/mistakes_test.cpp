@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 
 #include "tests/steps/source_folder.hpp"
+#include "tools/steps/compiler.hpp"
 
 namespace qz::tools::steps {
 namespace {
@@ -56,6 +57,8 @@ TEST(Mistakes, InStepsHavePlaces) {
        {"3:20: “color” is a property of buttons; the control “text” is a text field"}},
       {"steps: {a: {next: {press: end, color: pink}}}",
        {"3:39: expected red, white, blue, green, black, orange or gray, found “pink”"}},
+      {"steps: {a: {next: {press: end, color: }}}",
+       {"3:32: expected red, white, blue, green, black, orange or gray, found nothing"}},
       {"steps: {a: {hide: [texd], next: {press: end}}}",
        {"3:20: expected the name of a control, found “texd”; did you mean \"text\"?"}},
       {"steps: {a: {disable: frame, next: {press: end}}}",
@@ -78,6 +81,14 @@ TEST(Mistakes, InStepsHavePlaces) {
       {"steps: {a: {like: b, next: {press: end}}}", {"3:19: no step is called “b”"}},
       {"steps: {a: {like: a, next: {press: end}}}", {"3:19: the step “a” is like itself"}},
       {"steps: {a: {use: f, next: {press: end}}}", {"3:18: no fragment is called “f”"}},
+      {"steps: {a: {use: , next: {press: end}}}",
+       {"3:13: expected the name of a fragment, found nothing"}},
+      {"steps: {a: {frame: Hello, next: {press: end}}}",
+       {"3:20: a box shows no text; expected properties such as “shown”"}},
+      {"steps: {a: {after 1 s: {go: end, presses: give up}, next: {press: end}}}",
+       {"3:34: expected “go” or “other presses”, found “presses”"}},
+      {"steps: {a: {? [next] : {press: end}}}",
+       {"3:15: expected a name before the colon, found a list"}},
       {"fragments: {f: {use: f}}\nsteps: {a: {use: f, next: {press: end}}}",
        {"3:22: the fragment “f” uses itself"}},
   });
@@ -147,6 +158,74 @@ TEST(Mistakes, AllAreSaidAtOnce) {
   const SourceFolder folder;
   folder.writeSource("steps:\n  a: {nxt: 1}\n  b: {bck: 1}\n");
   EXPECT_EQ(mistakesIn(folder, "tour.yaml").size(), 2U);
+}
+
+TEST(Mistakes, InTheNamesOfControlsHavePlaces) {
+  const SourceFolder folder;
+  const auto with = [&](const std::string& controls) {
+    folder.write("tour.yaml", "window: host.plist\ncontrols: {" + controls +
+                                  "}\nsteps: {a: {next: {press: end}}}\n");
+    return mistakesIn(folder, "tour.yaml");
+  };
+  EXPECT_EQ(with("next: 4"), Messages{});
+  EXPECT_EQ(with("next: 4, go: 4"),
+            Messages{"2:21: the control with the tag 4 is called “next” already"});
+  EXPECT_EQ(with("next: 4, text: {tag: 1, nr: 1}"),
+            Messages{"2:36: expected “tag” or “number”, found “nr”"});
+}
+
+/// Returns what is wrong with a source that was read, without the name of its file.
+Messages messagesOf(Mistakes& mistakes, const Source& source) {
+  try {
+    mistakes.throwIfAny(source.files);
+  } catch (const SourceRefused& refused) {
+    Messages messages;
+    for (const std::string& message : refused.messages()) {
+      messages.push_back(message.substr(message.find(':') + 1));
+    }
+    return messages;
+  }
+  return {};
+}
+
+TEST(Mistakes, AMixedStateIsSaidAtEveryStepOrAtNone) {
+  const auto with = [&](const std::string& box) {
+    const auto controls = [](const auto&) {
+      Control mixed{.name = {}, .tag = 3, .kind = drivers::ViewKind::toggle};
+      mixed.isMixed = true;
+      return std::vector<Control>{mixed, {.name = {}, .tag = 4, .kind = drivers::ViewKind::button}};
+    };
+    const Source source = readSourceText(
+        "tour.yaml",
+        "window: form.ui\ncontrols: {box: 3, next: 4}\nsteps:\n  a: {next: {press: b}}\n  b: {" +
+            box + "next: {press: end}}\n",
+        {.readControls = controls, .readText = {}});
+    Mistakes mistakes;
+    build(source.tour, {0}, mistakes);
+    return messagesOf(mistakes, source);
+  };
+  EXPECT_EQ(with(""), Messages{});
+  EXPECT_EQ(with("box: {state: on}, "),
+            Messages{"4:3: at the step “a” the state of “box” is mixed, as in the host's window, "
+                     "which no command sets; expected “state” here or under “every step”"});
+}
+
+TEST(Mistakes, TooManyWaysAreRefused) {
+  const SourceFolder folder;
+  std::string steps = "steps:\n";
+  constexpr int mostSteps = 40;
+  for (int i = 0; i < mostSteps; ++i) {
+    const auto name = [](int number) { return "s" + std::to_string(number); };
+    steps += "  " + name(i) + ": {next: {press: " + name((i + 1) % mostSteps) +
+             "}, box: {press: " + name((i + 2) % mostSteps) + "}, back: {press: back}}\n";
+  }
+  folder.writeSource(steps);
+  const Source source = readSource("tour.yaml");
+  Mistakes mistakes;
+  build(source.tour, {0}, mistakes, 100);
+  EXPECT_EQ(messagesOf(mistakes, source),
+            Messages{"11:3: more than 100 ways lead to the steps up to “s7”; expected “back over” "
+                     "with a small number of steps"});
 }
 
 }  // namespace

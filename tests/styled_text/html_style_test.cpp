@@ -85,6 +85,25 @@ TEST(HtmlStyle, TakesTheFirstFaceThatIsKnown) {
   }));
 }
 
+/// Knows every font.
+class EveryFont final : public toolkit::Fonts {
+ public:
+  std::optional<toolkit::Font> fontWithName(std::string_view name, double size) const override {
+    return toolkit::Font{std::string(name), size};
+  }
+};
+
+TEST(HtmlStyle, AsksForFacesAsTheyAreWritten) {
+  const auto familyIn = [](std::string_view html) {
+    const auto text = toolkit::attributedStringFromHTML(html, EveryFont());
+    return text ? text->runs().front().attributes.font->family : "none";
+  };
+  EXPECT_EQ(familyIn("<tt>x"), "Courier");
+  EXPECT_EQ(familyIn("<font face=' , ,Verdana'>x"), "Verdana") << "no face is not asked for";
+  EXPECT_EQ(familyIn("<font face='\"Verdana\"'>x"), "Verdana");
+  EXPECT_EQ(familyIn("<font face='\", Verdana'>x"), "\"") << "one quote quotes nothing";
+}
+
 TEST(HtmlStyle, SizesFontElementsInSevenSteps) {
   expectRuns(std::to_array<Case>({
       {"<font size=1>x", "x{7.5}"},
@@ -176,8 +195,10 @@ TEST(HtmlStyle, ReadsInlineStyleSheetsLeniently) {
        "x{italic #ff0000}"},
       {"<span style='color:red;color:blue;color:nocolor'>x", "x{#0000ff}"},
       {"<span style='/* color:red; */font-weight:/* x */bold/*'>x", "x{bold}"},
+      {"<span style='color:red;/*/ color:blue; */'>x", "x{#ff0000}"},
       {"<span style=\"font-family:'A;color:red', Arial; color:blue\">x", "x{Arial #0000ff}"},
       {"<span style='unknown:x;font:bold'>x", "x"},
+      {"<p><font color=red>a<p><font color=blue>b", "a{#ff0000}|\n|b{#0000ff}|\n"},
       {"<b style=color:red>x<custom style='color:blue'>y", "xy{bold #ff0000}"},
   }));
 }

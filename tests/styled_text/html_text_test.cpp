@@ -118,6 +118,8 @@ TEST(HtmlText, KeepsWhatIsPreformatted) {
       {"<pre><b>\na</b></pre>", "\na\n"},
       {"<pre> a </pre> b", " a \nb"},
       {"x<pre>  <i> a</i></pre>", "x\n   a\n"},
+      {"<pre>a<!-- -->\nb</pre>", "a\nb\n"},
+      {"<pre>a\n</pre> b", "a\nb"},
   }));
 }
 
@@ -155,6 +157,7 @@ TEST(HtmlText, DropsWhatIsNotShown) {
       {"a<style>b { c: </stylex> </style>b", "ab"},
       {"a<script>b", "a"},
       {"a<!-- <b>x</b> -- > -->b<!---->c<!-->d<!--->e<!-- x --!>f", "abcdef"},
+      {"a<!-- b --->c", "ac"},
       {"a<!-- b", "a"},
       {"<!DOCTYPE html PUBLIC \"-//W3C//DTD HTML 4.01//EN\">a", "a"},
       {"a<?xml b?>c<![CDATA[d]]>e</>f</ x>g<!>h", "acefgh"},

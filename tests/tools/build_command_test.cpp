@@ -1,12 +1,16 @@
 // SPDX-License-Identifier: MIT
 // The commands `build` and `texts`: what they write where, and what they say.
 #include <gtest/gtest.h>
+#include <signal.h>
 
 #include <filesystem>
+#include <functional>
+#include <sstream>
 
 #include "tests/steps/source_folder.hpp"
 #include "tool_run.hpp"
 #include "tools/commands.hpp"
+#include "tools/play/play.hpp"
 #include "tools/support/whole_file.hpp"
 
 namespace qz::tools {
@@ -81,6 +85,47 @@ TEST_F(BuildCommand, SaysAllMistakesAndWritesNothing) {
   EXPECT_FALSE(fs::exists("map.json"));
 }
 
+/// Does one thing after the other, each when the next line is written to a stream.
+class Reader : public std::stringbuf {
+ public:
+  Reader(std::ostream& stream, std::vector<std::function<void()>> acts)
+      : stream_(stream), before_(stream.rdbuf(this)), acts_(std::move(acts)) {}
+  ~Reader() override { stream_.rdbuf(before_); }
+  Reader(const Reader&) = delete;
+  Reader& operator=(const Reader&) = delete;
+
+ protected:
+  int sync() override {
+    if (str().ends_with('\n') && next_ < acts_.size()) acts_[next_++]();
+    return 0;
+  }
+
+ private:
+  std::ostream& stream_;
+  std::streambuf* before_;
+  std::vector<std::function<void()>> acts_;
+  std::size_t next_ = 0;
+};
+
+TEST_F(BuildCommand, BuildsAgainAfterEachChangeUntilInterrupted) {
+  const auto misspell = [&] { folder_.writeSource("steps:\n  a: {nxt: 1}\n"); };
+  const auto remove = [] { fs::remove("tour.yaml"); };
+  const auto mend = [&] {
+    EXPECT_NE(contents("tour.plist").find("<string>Hello</string>"), std::string::npos);
+    folder_.writeSource("steps:\n  a: {text: Mended, next: {press: end}}\n");
+  };
+  const auto interrupt = [] { ::raise(SIGINT); };
+  Reader out(std::cout, {misspell, interrupt});
+  Reader err(std::cerr, {remove, mend});
+  EXPECT_EQ(runTool({"build", "tour.yaml", "--watch"}, {buildCommand}), 0);
+  EXPECT_EQ(out.str(), "tour.plist: written\ntour.plist: written\n");
+  EXPECT_EQ(err.str(),
+            "tour.yaml:4:7: expected the name of a control or a word such as “show”, found “nxt”; "
+            "did you mean \"next\"?\n"
+            "tour.yaml: cannot be read; expected a walk-through in steps\n");
+  EXPECT_NE(contents("tour.plist").find("<string>Mended</string>"), std::string::npos);
+}
+
 TEST_F(BuildCommand, WritesAMap) {
   EXPECT_EQ(build({"--map", "map.json"}).status, 0);
   EXPECT_NE(contents("map.json").find("\"source\": \"tour.yaml\""), std::string::npos);
@@ -129,6 +174,22 @@ TEST_F(BuildCommand, TranscriptsSpeakOfStepsAndControls) {
       run(playCommand, {"play", "tour.yaml", "--toolkit", "memory", "--press", "nxt"});
   EXPECT_EQ(wrong.status, 1);
   EXPECT_NE(wrong.err.find("nxt"), std::string::npos) << wrong.err;
+}
+
+TEST_F(BuildCommand, ThePromptTakesControlsByName) {
+  play::PlayOptions options;
+  options.script = "tour.yaml";
+  const steps::ScriptFile script = steps::openScript(options.script);
+  options.stage = script.stage({});
+  options.toolkit = "memory";
+  std::istringstream typed("nxt\nnext\nnext\n");
+  std::ostringstream out;
+  std::ostringstream log;
+  EXPECT_EQ(play::play(options, {typed, out, log, true, {}}), ExitStatus::fine) << log.str();
+  EXPECT_NE(out.str().find("  no control is called “nxt”; did you mean \"next\"?\n"),
+            std::string::npos)
+      << out.str();
+  EXPECT_NE(out.str().find("The walk-through ended."), std::string::npos) << out.str();
 }
 
 TEST_F(BuildCommand, FindingsSpeakOfStepsAndControls) {

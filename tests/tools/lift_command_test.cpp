@@ -66,6 +66,9 @@ TEST_F(LiftCommand, SaysWhatIsMissing) {
             "it\n");
   EXPECT_EQ(lift({"script.plist", "--window", "host.plist", "--start", "7"}).err,
             "qz-walkthrough: script.plist: no list has the key “7”\n");
+  EXPECT_EQ(lift({"script.plist", "--window", "host.plist", "--limit", "0"}).err,
+            "qz-walkthrough: --limit: expected a whole number above 0, found “0”; see "
+            "qz-walkthrough lift --help\n");
   directory_.write("tour.yaml", "steps: {}");
   EXPECT_EQ(lift({"tour.yaml", "--window", "host.plist"}).err,
             "qz-walkthrough: tour.yaml: is a walk-through in steps already\n");

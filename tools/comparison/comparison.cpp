@@ -12,13 +12,6 @@
 namespace qz::tools::comparison {
 namespace {
 
-std::string secondsWords(const std::optional<double>& wait) {
-  if (!wait) return "no wait";
-  std::ostringstream out;
-  out << "a wait of " << *wait << " s";
-  return out.str();
-}
-
 class Comparer {
  public:
   Comparer(const Behavior& before, const Behavior& after, std::size_t most)
@@ -97,7 +90,7 @@ class Comparer {
       return true;
     }
     difference.kind = Difference::Kind::wait;
-    difference.words = secondsWords(after.wait) + " instead of " + secondsWords(before.wait);
+    difference.words = waitWords(after.wait) + " instead of " + waitWords(before.wait);
     return before.wait != after.wait;
   }
 
@@ -123,6 +116,13 @@ class Comparer {
 };
 
 }  // namespace
+
+std::string waitWords(const std::optional<double>& seconds) {
+  if (!seconds) return "no wait";
+  std::ostringstream out;
+  out << "a wait of " << *seconds << " s";
+  return out.str();
+}
 
 std::vector<Difference> compare(const Behavior& before, const Behavior& after, std::size_t most) {
   return Comparer(before, after, most).run();

@@ -35,6 +35,9 @@ struct Difference {
 std::vector<Difference> compare(const Behavior& before, const Behavior& after,
                                 std::size_t most = 1);
 
+/// Returns words such as "a wait of 5 s".
+std::string waitWords(const std::optional<double>& seconds);
+
 /// Returns the path of a difference in a walk-through, with the tags that its buttons have there.
 check::Path pathIn(const Behavior& behavior, const std::vector<Move>& moves);
 

@@ -5,6 +5,7 @@
 #include <cmath>
 #include <map>
 
+#include "tools/comparison/comparison.hpp"
 #include "tools/lift/names.hpp"
 #include "tools/lift/yaml_text.hpp"
 #include "tools/support/text_layout.hpp"
@@ -231,9 +232,9 @@ std::optional<std::pair<std::string, std::string>> Draft::waitWords(StepIndex st
   if (!here.seconds) return std::nullopt;
   const double seconds = *here.seconds;
   if (seconds < 1 || seconds > longestWait || std::floor(seconds) != seconds) {
-    refuse(step, std::nullopt,
-           "a wait of " + std::to_string(seconds) +
-               " s is not a whole number of seconds from 1 to 604800");
+    refuse(
+        step, std::nullopt,
+        comparison::waitWords(here.seconds) + " is not a whole number of seconds from 1 to 604800");
   }
   const std::string key = "after " + std::to_string(static_cast<int>(seconds)) + " s";
   const std::string go = lead(here.wait);

@@ -116,6 +116,7 @@ class Lifter {
                  const std::optional<ControlIndex>& control) {
     if (!element.command) return false;
     if (control) {
+      if (element.command->target == TargetKind::none) return false;  // it may run lists
       const LookValue look = stand_.withoutState(situation.controls[*control].look);
       return look != stand_.show(*control, {}) && stand_.run(*control, element) == look;
     }
@@ -153,8 +154,8 @@ class Lifter {
 
   void requireNoDifference(const std::string& source) {
     const auto readControls = [&](const walkthrough::StageOptions&) { return stand_.controls(); };
-    const auto readNothing = [](const std::string&) { return std::nullopt; };
-    const auto read = steps::readSourceText("the source", source, {readControls, readNothing});
+    const auto read = steps::readSourceText(
+        "the source", source, {.readControls = readControls, .readText = {}});  // includes nothing
     steps::Mistakes mistakes;
     const auto built = steps::build(read.tour, {0}, mistakes);
     mistakes.throwIfAny(read.files);

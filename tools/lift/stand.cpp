@@ -4,7 +4,6 @@
 
 #include <algorithm>
 
-#include "qz/toolkit/exception.hpp"
 #include "toolkit/memory/parts.hpp"
 #include "tools/steps/source.hpp"
 
@@ -83,11 +82,7 @@ LookValue Stand::play(ControlIndex control, const List& list) {
   ViewNode& node = *ViewNode::of(view);
   const auto before = node.save();
   const ValueRef<> commands = Array::make(list);
-  try {
-    stage_->start(Dictionary::make({{String::make(standKey), commands}}), standKey);
-  } catch (const toolkit::Exception&) {
-    // The command does not suit the control, and so shows nothing.
-  }
+  stage_->start(Dictionary::make({{String::make(standKey), commands}}), standKey);
   check::ViewLook seen{node.save(), true};
   if (!view->asTextField()) seen.view.text = {};
   node.restore(before);

@@ -25,7 +25,8 @@ class Stand {
   const std::vector<steps::Control>& controls() const { return controls_; }
   /// Returns what the control looks like after these words, but for its state.
   LookValue show(ControlIndex control, const steps::ControlWords& words);
-  /// Returns what it looks like after a command of a script, whichever control that names.
+  /// Returns what it looks like after a command of a script that acts on controls, whichever it
+  /// names. A command that does not suit the control shows nothing.
   LookValue run(ControlIndex control, const check::Element& element);
   /// Returns a look without the state of the button.
   LookValue withoutState(LookValue look) { return looks_.valueOf({looks_.look(look).view, true}); }

@@ -241,9 +241,11 @@ void judgeReach(const Tour& tour, const Scenes& scenes, Mistakes& mistakes) {
 
 }  // namespace
 
-Built build(const Tour& tour, const std::vector<StepIndex>& starts, Mistakes& mistakes) {
+Built build(const Tour& tour, const std::vector<StepIndex>& starts, Mistakes& mistakes,
+            std::size_t mostWays) {
   judgeLooks(tour, mistakes);
-  Scenes scenes = findScenes(tour, starts, mistakes);
+  Scenes scenes = findScenes(tour, starts, mistakes, mostWays);
+  if (scenes.list.empty()) return {};
   judgeReach(tour, scenes, mistakes);
   judgeLastingLooks(tour, scenes, mistakes);
   if (!mistakes.isEmpty()) return {};

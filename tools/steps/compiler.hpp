@@ -8,7 +8,7 @@
 
 #include "qz/property_list/collections.hpp"
 #include "qz/property_list/format_readers.hpp"
-#include "tools/steps/tour.hpp"
+#include "tools/steps/scenes.hpp"
 
 namespace qz::tools::steps {
 
@@ -22,7 +22,9 @@ struct Built {
 };
 
 /// Builds the script. It starts at the first of `starts`, under its smallest key; the others have
-/// start keys of their own. What is wrong is added to `mistakes`; then there is no script.
-Built build(const Tour& tour, const std::vector<StepIndex>& starts, Mistakes& mistakes);
+/// start keys of their own, and `mostWays` limits them as in `findScenes`. What is wrong is added
+/// to `mistakes`; then there is no script.
+Built build(const Tour& tour, const std::vector<StepIndex>& starts, Mistakes& mistakes,
+            std::size_t mostWays = mostUsableWays);
 
 }  // namespace qz::tools::steps

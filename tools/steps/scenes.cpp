@@ -69,12 +69,10 @@ struct Situation {
   WayIndex way = Ways::empty;
 };
 
-// Each needs lists of its own unless they can be joined, so a script of more would not be usable.
-constexpr std::size_t mostSituations = 200000;
-
 class Finder {
  public:
-  Finder(const Tour& tour, Mistakes& mistakes) : tour_(tour), mistakes_(mistakes) {}
+  Finder(const Tour& tour, Mistakes& mistakes, std::size_t mostWays)
+      : tour_(tour), mistakes_(mistakes), mostWays_(mostWays) {}
 
   SceneIndex add(StepIndex step, WayIndex way) {
     const auto [known, isNew] = numbers_.try_emplace({step, way}, situations_.size());
@@ -84,11 +82,16 @@ class Finder {
     return known->second;
   }
 
-  void run() {
+  /// Returns NO if there are too many ways.
+  bool run() {
     for (SceneIndex i = 0; i < situations_.size(); ++i) {
-      if (situations_.size() > mostSituations) return refuse(situations_[i].scene.step);
+      if (situations_.size() > mostWays_) {
+        refuse(situations_[i].scene.step);
+        return false;
+      }
       leave(i);
     }
+    return true;
   }
 
   const Ways& ways() const { return ways_; }
@@ -97,10 +100,9 @@ class Finder {
  private:
   void refuse(StepIndex step) {
     mistakes_.add(tour_.steps[step].place,
-                  "more than " + std::to_string(mostSituations) + " ways lead to the steps up to " +
+                  "more than " + std::to_string(mostWays_) + " ways lead to the steps up to " +
                       quote(tour_.steps[step].name) +
                       "; expected “back over” with a small number of steps");
-    situations_.clear();
   }
 
   const std::vector<std::optional<Lead>>& pressesAt(StepIndex step, bool canGoBack) {
@@ -157,6 +159,7 @@ class Finder {
 
   const Tour& tour_;
   Mistakes& mistakes_;
+  std::size_t mostWays_;
   Ways ways_;
   std::vector<Situation> situations_;
   std::map<std::pair<StepIndex, WayIndex>, SceneIndex> numbers_;
@@ -241,10 +244,11 @@ Scenes joined(std::vector<Situation> all, const Ways& ways, std::size_t starts) 
 
 }  // namespace
 
-Scenes findScenes(const Tour& tour, const std::vector<StepIndex>& starts, Mistakes& mistakes) {
-  Finder finder(tour, mistakes);
+Scenes findScenes(const Tour& tour, const std::vector<StepIndex>& starts, Mistakes& mistakes,
+                  std::size_t mostWays) {
+  Finder finder(tour, mistakes, mostWays);
   for (const StepIndex step : starts) finder.add(step, Ways::empty);
-  finder.run();
+  if (!finder.run()) return {};
   return joined(finder.take(), finder.ways(), starts.size());
 }
 

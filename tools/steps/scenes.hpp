@@ -36,8 +36,13 @@ struct Scenes {
   std::vector<SceneIndex> starts{};
 };
 
-/// Finds all scenes that can be reached from the steps `starts`, to which no way leads. Too many
-/// are a mistake.
-Scenes findScenes(const Tour& tour, const std::vector<StepIndex>& starts, Mistakes& mistakes);
+/// So many pairs of a step and a way to it are followed. Each needs lists of its own unless they
+/// can be joined, so a script of more would not be usable.
+inline constexpr std::size_t mostUsableWays = 200000;
+
+/// Finds all scenes that can be reached from the steps `starts`, to which no way leads. If there
+/// are more than `mostWays` ways, that is a mistake, and there are no scenes.
+Scenes findScenes(const Tour& tour, const std::vector<StepIndex>& starts, Mistakes& mistakes,
+                  std::size_t mostWays = mostUsableWays);
 
 }  // namespace qz::tools::steps

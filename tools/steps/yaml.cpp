@@ -154,7 +154,8 @@ class YamlParser {
 
   void handle(const fy_event& event, TreeBuilder& builder) {
     const fy_mark* const mark = fy_event_start_mark(const_cast<fy_event*>(&event));
-    const std::size_t offset = mark ? mark->input_pos : 0;
+    if (mark) offset_ = mark->input_pos;
+    const std::size_t offset = offset_;  // of what is left out: that of its key
     switch (event.type) {
       case FYET_DOCUMENT_START:
         if (builder.root()) {
@@ -187,6 +188,7 @@ class YamlParser {
 
   std::string_view text_;
   Place start_;
+  std::size_t offset_ = 0;  // of the last event that has one
   std::unique_ptr<fy_diag, Destroyer> diagnostics_;
   std::unique_ptr<fy_parser, Destroyer> parser_;
 };

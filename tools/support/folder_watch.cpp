@@ -2,11 +2,9 @@
 // Waits for changes of the files in folders.
 #include "tools/support/folder_watch.hpp"
 
-#include <chrono>
 #include <filesystem>
 #include <map>
 #include <system_error>
-#include <thread>
 #include <utility>
 
 namespace qz::tools {
@@ -33,11 +31,9 @@ Contents contentsOf(const std::set<std::string>& folders, const std::set<fs::pat
 
 }  // namespace
 
-void sleepShortly() { std::this_thread::sleep_for(std::chrono::milliseconds(200)); }
-
 void watchFolders(std::set<std::string> folders, const std::set<std::string>& outputs,
                   const std::function<std::set<std::string>()>& act,
-                  const std::function<void()>& rest) {
+                  const std::function<bool()>& rest) {
   std::set<fs::path> own;
   for (const std::string& output : outputs) own.insert(normal(output));
   for (;;) {
@@ -46,7 +42,9 @@ void watchFolders(std::set<std::string> folders, const std::set<std::string>& ou
     if (next.empty()) return;
     // In folders that were not watched, files may have changed since `act` has read them.
     const bool isKnown = std::exchange(folders, next) == next;
-    while (isKnown && contentsOf(folders, own) == before) rest();
+    while (isKnown && contentsOf(folders, own) == before) {
+      if (!rest()) return;
+    }
   }
 }
 
