@@ -144,6 +144,8 @@ std::vector<Move> World::moves() const {
 
 bool World::isOnScreen() const { return driver_.look(window_).visible; }
 
+std::string World::windowImage() const { return driver_.look(window_).layerImage.value_or(""); }
+
 std::string World::place() const {
   std::string place;
   for (const auto& control : pictures()) place += lineOf(control);

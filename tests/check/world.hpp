@@ -58,6 +58,8 @@ class World {
   bool hasEnded() const { return engine_->terminating(); }
   /// Whether the user sees the window.
   bool isOnScreen() const;
+  /// Returns the name of the image behind the controls; empty if there is none.
+  std::string windowImage() const;
   /// Returns the timers that are pending, in the order of their firing.
   std::vector<PendingTimer> timers() const;
 

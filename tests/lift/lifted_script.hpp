@@ -6,7 +6,7 @@
 #include <string>
 
 #include "tests/check/both_opinions.hpp"
-#include "tests/lift/joint_play.hpp"
+#include "tests/check/joint_play.hpp"
 #include "tools/lift/lift.hpp"
 #include "tools/steps/compiler.hpp"
 #include "tools/steps/source.hpp"
@@ -44,8 +44,8 @@ class LiftedScript {
   /// does.
   std::string difference(std::size_t mostPairs) const {
     naive::JointPlay play(original_, built(), host_, resources_);
-    const std::string wrong = play.run(mostPairs);
-    return wrong.empty() ? "" : wrong + "\n" + lifted_.source;
+    const auto difference = play.run(mostPairs);
+    return difference ? difference->words + "\n" + lifted_.source : "";
   }
 
  private:

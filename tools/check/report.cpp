@@ -48,6 +48,18 @@ std::string shellWord(const std::string& text) {
   return quoted + "'";
 }
 
+std::string stageArguments(const CheckOptions& options) {
+  std::string arguments;
+  const auto add = [&](const char* option, const std::optional<std::string>& value) {
+    if (value) arguments += std::string(" ") + option + " " + shellWord(*value);
+  };
+  add("--window", options.stage.window);
+  add("--assets", options.stage.assets);
+  add("--resources", options.resources);
+  if (options.stage.sheet) arguments += " --sheet";
+  return arguments;
+}
+
 std::string playCommand(const Report& report, const Path& path) {
   return "qz-walkthrough play " + shellWord(report.verdict.path) + report.stageArguments + " " +
          playArguments(path, report.verdict.names);

@@ -56,6 +56,8 @@ std::string placeOf(const Finding& finding, const InputFile& file);
 
 /// Returns the text as one word of a shell's command line.
 std::string shellWord(const std::string& text);
+/// Returns the arguments of `play` that set up the window of the options, each after a space.
+std::string stageArguments(const CheckOptions& options);
 /// Returns the command line that plays a path of the report's script.
 std::string playCommand(const Report& report, const Path& path);
 /// Returns the arguments of `play` that walk a path, such as "--start 1 --press 2 3".

@@ -30,6 +30,16 @@ std::vector<StepIndex> startsOf(const Source& source, const std::vector<std::str
   return starts;
 }
 
+ScriptFile built(Source source, const std::vector<std::string>& starts) {
+  BuiltSource from{.source = std::move(source), .built = {}};
+  Mistakes mistakes;
+  from.built = build(from.source.tour, startsOf(from.source, starts), mistakes);
+  mistakes.throwIfAny(from.source.files);
+  InputFile file(from.source.path, expectedFile, from.built.script,
+                 from.source.files.written(from.built.offsets));
+  return {std::move(file), std::move(from)};
+}
+
 }  // namespace
 
 walkthrough::Names ScriptFile::names() const {
@@ -56,13 +66,13 @@ walkthrough::StageOptions ScriptFile::stage(walkthrough::StageOptions options) c
 ScriptFile openScript(const std::string& path, const std::vector<std::string>& starts,
                       const Translate& translate) {
   if (!isSourcePath(path)) return {InputFile(path, expectedFile), std::nullopt};
-  BuiltSource from{.source = readSource(path, translate), .built = {}};
-  Mistakes mistakes;
-  from.built = build(from.source.tour, startsOf(from.source, starts), mistakes);
-  mistakes.throwIfAny(from.source.files);
-  InputFile file(path, expectedFile, from.built.script,
-                 from.source.files.written(from.built.offsets));
-  return {std::move(file), std::move(from)};
+  return built(readSource(path, translate), starts);
+}
+
+ScriptFile openScriptOf(const std::string& path, const std::string& contents,
+                        const std::vector<std::string>& starts) {
+  if (!isSourcePath(path)) return {InputFile(path, expectedFile, contents), std::nullopt};
+  return built(readSourceOf(path, contents), starts);
 }
 
 InputFile openPropertyList(const std::string& path) {

@@ -36,6 +36,10 @@ struct ScriptFile {
 ScriptFile openScript(const std::string& path, const std::vector<std::string>& starts = {},
                       const Translate& translate = {});
 
+/// The same, with contents that the file at `path` had once. What a source names is beside `path`.
+ScriptFile openScriptOf(const std::string& path, const std::string& contents,
+                        const std::vector<std::string>& starts = {});
+
 /// Reads any property list; of a source, the script that is built of it.
 InputFile openPropertyList(const std::string& path);
 

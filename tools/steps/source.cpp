@@ -252,16 +252,20 @@ bool isSourcePath(const std::string& path) {
 }
 
 Source readSource(const std::string& path, const Translate& translate) {
-  auto text = wholeFile(path);
+  const auto text = wholeFile(path);
   if (!text) {
     throw Failure(ExitStatus::badInput,
                   path + ": cannot be read; expected a walk-through in steps");
   }
+  return readSourceOf(path, *text, translate);
+}
+
+Source readSourceOf(const std::string& path, const std::string& text, const Translate& translate) {
   const std::string resources = fs::path(path).parent_path().string();
   const auto controls = [&](const walkthrough::StageOptions& stage) {
     return controlsOf(walkthrough::planStage(stage, {}, path), resources);
   };
-  return readSourceText(path, *std::move(text), {controls, includedText}, translate);
+  return readSourceText(path, text, {controls, includedText}, translate);
 }
 
 Source readSourceText(const std::string& path, std::string text, const SourceInputs& inputs,

@@ -47,4 +47,8 @@ Source readSourceText(const std::string& path, std::string text, const SourceInp
 /// be read.
 Source readSource(const std::string& path, const Translate& translate = {});
 
+/// The same, with the text that the source at `path` had once.
+Source readSourceOf(const std::string& path, const std::string& text,
+                    const Translate& translate = {});
+
 }  // namespace qz::tools::steps

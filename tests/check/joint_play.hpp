@@ -4,8 +4,10 @@
 #pragma once
 
 #include <cstddef>
-#include <map>
+#include <optional>
+#include <set>
 #include <string>
+#include <utility>
 #include <vector>
 
 #include "tests/check/world.hpp"
@@ -17,6 +19,15 @@ struct StartedScript {
   std::string startKey;
 };
 
+/// The nearest difference that a user notices.
+struct JointDifference {
+  std::string words{};    ///< for failing tests
+  std::size_t moves = 0;  ///< after the start
+  /// The controls that look different, each with a property: "shown", "enabled", "flashing",
+  /// "caption", "image", "tooltip", "background" or "state".
+  std::set<std::pair<std::size_t, std::string>> controls{};
+};
+
 /// Makes every move from every pair of situations; each path is replayed from its beginning in two
 /// new worlds.
 class JointPlay {
@@ -24,21 +35,22 @@ class JointPlay {
   JointPlay(StartedScript one, StartedScript other, const HostWindow& host,
             std::string resources = "");
 
-  /// Visits at most so many pairs. Returns what differs and after which moves; empty if nothing.
-  std::string run(std::size_t mostPairs);
+  /// Visits at most so many pairs, the nearest first. Returns what differs first; absent if nothing
+  /// does.
+  std::optional<JointDifference> run(std::size_t mostPairs);
   std::size_t pairs() const { return known_.size(); }
 
  private:
   using Path = std::vector<Move>;
 
-  std::string arrive(const Path& path);
+  std::optional<JointDifference> arrive(const Path& path);
   std::string words(const Path& path) const;
 
   StartedScript one_;
   StartedScript other_;
   const HostWindow& host_;
   std::string resources_;
-  std::map<std::string, bool> known_;
+  std::set<std::string> known_;
   std::vector<Path> pending_;
 };
 
