@@ -84,7 +84,7 @@ Words bashCompletes(const CompletionPlace& place, const std::vector<std::string>
 
 Words setOf(const std::vector<std::string_view>& words) { return {words.begin(), words.end()}; }
 
-Words writableFormats() {
+Words writableFormatNames() {
   Words names;
   for (const toolkit::FormatRow& row : toolkit::formats()) {
     if (row.write) names.emplace(row.name);
@@ -112,10 +112,10 @@ TEST(Completion, BashCompletesCommandsOptionsAndValues) {
       {{"--v"}, {"--version"}},
       {{"play", "--s"}, {"--sheet", "--screenshots", "--start"}},
       {{"play", "--toolkit", ""}, setOf(driverNames())},
-      {{"test", "--toolkit", "m"}, {"memory"}},
+      {{"test", "--toolkit", "mem"}, {"memory"}},
       {{"test", "--toolkit", "="}, setOf(driverNames())},
-      {{"test", "--toolkit", "=", "m"}, {"memory"}},
-      {{"convert", "a", "b", "--format", ""}, writableFormats()},
+      {{"test", "--toolkit", "=", "mem"}, {"memory"}},
+      {{"convert", "a", "b", "--format", ""}, writableFormatNames()},
       {{"completion", ""}, {"bash", "zsh", "fish"}},
       {{"play", "d"}, files},
       {{"play", "--window", "d"}, files},
@@ -191,7 +191,7 @@ TEST(Completion, FishCompletesCommandsOptionsAndValues) {
       {"co", commandsWith("co")},
       {"play --s", {"--sheet", "--screenshots", "--start"}},
       {"test --toolkit ", setOf(driverNames())},
-      {"convert a b --format ", writableFormats()},
+      {"convert a b --format ", writableFormatNames()},
       {"completion ", {"bash", "zsh", "fish"}},
       {"play d", {"data.plist", "dir/"}},
       {"play --resources d", {"dir/"}},
@@ -232,7 +232,7 @@ TEST(Completion, ZshCompletesCommandsOptionsAndValues) {
   } cases[] = {
       {"pl", "play "},
       {"play --she", "play --sheet "},
-      {"test --toolkit m", "test --toolkit memory "},
+      {"test --toolkit mem", "test --toolkit memory "},
       {"convert --format x", "convert --format xml "},
       {"completion f", "completion fish "},
       {"dump da", "dump data.plist "},

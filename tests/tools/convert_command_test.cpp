@@ -16,6 +16,8 @@
 #include "qz/property_list/scalars.hpp"
 #include "tool_run.hpp"
 #include "tools/commands.hpp"
+#include "tools/output_format.hpp"
+#include "tools/support/suggestions.hpp"
 
 namespace qz::tools {
 namespace {
@@ -25,6 +27,12 @@ namespace fs = std::filesystem;
 std::string contentsOf(const std::string& path) {
   std::ifstream file(path, std::ios::binary);
   return {std::istreambuf_iterator<char>(file), {}};
+}
+
+std::vector<std::string> writableNames() {
+  std::vector<std::string> names;
+  for (const toolkit::FormatRow& row : writableFormats()) names.emplace_back(row.name);
+  return names;
 }
 
 class ConvertCommand : public testing::Test {
@@ -71,8 +79,8 @@ TEST_F(ConvertCommand, ChoosesTheFormat) {
               "{\"dict\":[[\"k\",[\"a\",{\"data\":\"01\"}]]]}");
   }
   EXPECT_EQ(convert({"in.plist", "out", "--format", "yaml"}).err,
-            "qz-walkthrough: --format: expected xml or binary, found “yaml”; see qz-walkthrough "
-            "convert --help\n");
+            "qz-walkthrough: --format: expected " + enumerate(writableNames()) +
+                ", found “yaml”; see qz-walkthrough convert --help\n");
 }
 
 TEST_F(ConvertCommand, ReplacesAFileAndKeepsWhatBelongsToIt) {
