@@ -17,7 +17,6 @@ namespace {
 
 using hosts::threeSteps;
 using hosts::qt::GuideOptions;
-using hosts::qt::GuidePanel;
 using hosts::qt::Spotlight;
 using Lines = std::vector<std::string>;
 
