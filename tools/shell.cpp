@@ -19,11 +19,12 @@ const ToolHelp& toolHelp() {
       QZ_VERSION,
       "Exit status:\n"
       "  0  all went well\n"
-      "  1  a test failed, a check found something, a walk-through could not start or go on as\n"
-      "     asked, or a file could not be dumped or converted\n"
+      "  1  a test failed, a check found something, users would notice a difference, a\n"
+      "     walk-through could not start or go on as asked, or a file could not be dumped or\n"
+      "     converted\n"
       "  2  bad usage, or a file that is not what it should be\n"
-      "  3  a script's lists ran each other endlessly, or a check found nothing but did not see\n"
-      "     everything"};
+      "  3  a script's lists ran each other endlessly, or a check or a comparison found nothing\n"
+      "     but did not see everything"};
   return help;
 }
 

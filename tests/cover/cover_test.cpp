@@ -10,10 +10,8 @@
 #include <fstream>
 #include <sstream>
 
+#include "tests/cover/passing.hpp"
 #include "tests/tools/play_files.hpp"
-#include "tools/scenario/runner.hpp"
-#include "tools/scenario/scenario_files.hpp"
-#include "tools/support/drivers.hpp"
 #include "tools/support/whole_file.hpp"
 
 namespace qz::tools::cover {
@@ -64,23 +62,6 @@ check::CheckOptions optionsFor(const Covered& covered) {
 
 Coverage coverageOf(const Covered& covered) {
   return coverScript(InputFile(covered.script, "a script"), optionsFor(covered), ".", {});
-}
-
-/// Runs the scenarios of the present directory until one fails, and returns why; empty if all pass.
-std::string firstFailureOn(std::string_view toolkit) {
-  const scenario::Runner runner{
-      [&] { return makeDriver(std::string(toolkit)); }, std::string(toolkit),
-      [](const std::string&, const scenario::Statement&, const std::string&) {}};
-  const auto read = scenario::readScenarios({"."});
-  if (!read.problems.empty()) return read.problems.front();
-  for (const scenario::LoadedFile& file : read.files) {
-    for (const scenario::Scenario& each : file.contents.scenarios) {
-      const scenario::Report report = runner.run(file, each);
-      if (report.verdict == scenario::Verdict::passed) continue;
-      return report.file + ":" + std::to_string(report.failedLine) + ": " + report.problem;
-    }
-  }
-  return "";
 }
 
 class CoverOf : public testing::TestWithParam<Covered> {

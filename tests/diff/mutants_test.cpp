@@ -13,6 +13,7 @@
 #include "tests/check/both_opinions.hpp"
 #include "tests/check/generated_scripts.hpp"
 #include "tests/check/joint_play.hpp"
+#include "tests/check/orderly_scripts.hpp"
 #include "tests/diff/diffed_scripts.hpp"
 
 namespace qz::tools::diff {
@@ -122,27 +123,13 @@ class Judge {
   std::size_t leftOut_ = 0;
 };
 
-/// Mutants need scripts whose values are all lists of commands with names.
-bool hasListsOnly(const naive::Script& script) {
-  const auto isCommand = [](const auto& element) {
-    const auto compound = toolkit::asArray(element);
-    return toolkit::asString(compound->count() > 0 ? compound->objectAtIndex(0) : element);
-  };
-  const auto entries = script->entries();
-  return std::all_of(entries.begin(), entries.end(), [&](const auto& entry) {
-    const auto list = toolkit::asArray(entry.value);
-    const auto elements = list->elements();
-    return list && std::all_of(elements.begin(), elements.end(), isCommand);
-  });
-}
-
 TEST(DiffOfMutants, IsWhatASecondOpinionSays) {
   std::uint64_t seed = numberInEnvironment("QZ_FIRST_SEED").value_or(1);
   const std::uint64_t count = numberInEnvironment("QZ_DIFFS").value_or(standardMutants);
   Judge judge;
   for (; judge.judged() < count && !HasFailure(); ++seed) {
     const naive::Generated generated = naive::generate(seed);
-    if (!hasListsOnly(generated.script)) continue;
+    if (!naive::hasListsOnly(generated.script)) continue;
     const auto mutants = naive::mutantsOf(generated.script, seed);
     const std::size_t step = std::max<std::size_t>(1, mutants.size() / mutantsOfAScript);
     for (std::size_t i = 0; i < mutants.size() && judge.judged() < count; i += step) {
