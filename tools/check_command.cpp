@@ -87,18 +87,6 @@ const check::ReportFormat& formatNamed(const std::string& name) {
                 "--format: expected " + formatNames() + ", found " + quote(name));
 }
 
-std::string stageArguments(const CheckOptions& options) {
-  std::string arguments;
-  const auto add = [&](const char* option, const std::optional<std::string>& value) {
-    if (value) arguments += std::string(" ") + option + " " + check::shellWord(*value);
-  };
-  add("--window", options.stage.window);
-  add("--assets", options.stage.assets);
-  add("--resources", options.resources);
-  if (options.stage.sheet) arguments += " --sheet";
-  return arguments;
-}
-
 int statusOf(const std::vector<Job>& jobs, Severity failOn) {
   bool complete = true;
   for (const Job& job : jobs) {
@@ -211,8 +199,9 @@ check::RunReport reportOf(const CommandOptions& options, const std::vector<Job>&
     if (const auto& failure = jobs[i].failure) {
       run.unchecked.push_back({options.scripts[i], failure->what()});
     } else {
-      run.scripts.push_back(
-          {jobs[i].verdict, *jobs[i].file, stageArguments(options.check), options.failOn});
+      run.scripts.push_back({jobs[i].verdict, *jobs[i].file,
+                             playStageArguments(options.check.stage, options.check.resources),
+                             options.failOn});
     }
   }
   return run;
