@@ -49,6 +49,9 @@ storyboard::Storyboard storyboardOf(const StoryboardCommandOptions& options) {
   hooks.report = [&](const check::Progress& progress) { line.show(options.script, progress); };
   hooks.isCancelled = Interruption::isWanted;
   auto own = options.board;
+  own.drawing = [&](std::size_t done, std::size_t all) {
+    line.show("drawing", done, all, "pictures");
+  };
   const steps::ScriptFile script = steps::openScript(options.script, own.check.startKeys);
   own.stageArguments = playStageArguments(own.check.stage, own.check.resources);
   own.check.stage = script.stage(own.check.stage);

@@ -46,7 +46,8 @@ class QtDriver final : DeletionSweep,
   bool hasPerson() const override;
   bool savePicture(const Ref<Window>& window, const std::string& path) override;
   void drawAlike(std::span<const std::string_view> fonts) override;
-  std::string drawPicture(const Ref<Window>& window, double density) override;
+  Pixels draw(const Ref<Window>& window, double density) override;
+  std::string pngOf(const Pixels& pixels) override;
   void workOffScreen() override;
   MissingRoom missingRoom(const Ref<View>& view) override;
 

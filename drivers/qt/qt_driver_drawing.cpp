@@ -33,6 +33,10 @@ std::optional<QImage> withColorTable(const QImage& picture) {
     const auto* const from = reinterpret_cast<const QRgb*>(picture.constScanLine(y));
     uchar* const to = small.scanLine(y);
     for (int x = 0; x < picture.width(); ++x) {
+      if (x > 0 && from[x] == from[x - 1]) {
+        to[x] = to[x - 1];
+        continue;
+      }
       const auto known = numbers.constFind(from[x]);
       if (known != numbers.constEnd()) {
         to[x] = *known;
@@ -48,11 +52,34 @@ std::optional<QImage> withColorTable(const QImage& picture) {
   return small;
 }
 
-std::string pngOf(const QImage& picture) {
-  QByteArray bytes;
-  QBuffer buffer(&bytes);
-  withColorTable(picture).value_or(picture).save(&buffer, "PNG", smallestFile);
-  return bytes.toStdString();
+/// Returns a grey picture with 16 shades, which are enough for texts and make half the file.
+QImage withFewShades(QImage picture) {
+  constexpr int step = 17;  // from one shade to the next
+  for (int y = 0; y < picture.height(); ++y) {
+    auto* const row = reinterpret_cast<QRgb*>(picture.scanLine(y));
+    for (int x = 0; x < picture.width(); ++x) {
+      const int shade = (qRed(row[x]) + step / 2) / step * step;
+      row[x] = qRgb(shade, shade, shade);
+    }
+  }
+  return picture;
+}
+
+/// Returns the opaque picture in the form that makes the smallest file.
+QImage smallFormOf(const QImage& picture) {
+  if (picture.allGray()) return *withColorTable(withFewShades(picture));
+  const QImage opaque = picture.convertToFormat(QImage::Format_RGB888);
+  return withColorTable(picture).value_or(opaque);
+}
+
+Pixels pixelsOf(const QImage& picture) {
+  Pixels pixels{.width = picture.width(), .height = picture.height()};
+  const QImage image = picture.convertToFormat(QImage::Format_ARGB32);
+  for (int y = 0; y < image.height(); ++y) {
+    const auto* const row = reinterpret_cast<const QRgb*>(image.constScanLine(y));
+    pixels.argb.insert(pixels.argb.end(), row, row + image.width());
+  }
+  return pixels;
 }
 
 /// Returns the family of the first font that can be read; empty if none can.
@@ -79,7 +106,7 @@ void QtDriver::drawAlike(std::span<const std::string_view> fonts) {
   QApplication::setFont(font);
 }
 
-std::string QtDriver::drawPicture(const Ref<Window>& window, double density) {
+Pixels QtDriver::draw(const Ref<Window>& window, double density) {
   settleWithoutFiring();
   const auto shown = QtWindow::of(window);
   if (!shown || !shown->widget() || !shown->widget()->isVisible()) return {};
@@ -89,9 +116,18 @@ std::string QtDriver::drawPicture(const Ref<Window>& window, double density) {
   picture.setDevicePixelRatio(drawn);
   picture.fill(Qt::white);
   widget.render(&picture);
-  if (density == drawn) return pngOf(picture);
-  return pngOf(picture.scaled((QSizeF(widget.size()) * density).toSize(), Qt::IgnoreAspectRatio,
-                              Qt::SmoothTransformation));
+  if (density == drawn) return pixelsOf(picture);
+  return pixelsOf(picture.scaled((QSizeF(widget.size()) * density).toSize(), Qt::IgnoreAspectRatio,
+                                 Qt::SmoothTransformation));
+}
+
+std::string QtDriver::pngOf(const Pixels& pixels) {
+  const QImage picture(reinterpret_cast<const uchar*>(pixels.argb.data()), pixels.width,
+                       pixels.height, QImage::Format_ARGB32);
+  QByteArray bytes;
+  QBuffer buffer(&bytes);
+  smallFormOf(picture).save(&buffer, "PNG", smallestFile);
+  return bytes.toStdString();
 }
 
 }  // namespace qz::drivers

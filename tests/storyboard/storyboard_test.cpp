@@ -139,6 +139,9 @@ TEST(Storyboards, LinkToTheirOwnStepsAndToNothingElse) {
   for (const std::string& link : all(page, "href=\"#([^\"]*)\"")) {
     EXPECT_EQ(ids.count(link), 1U) << link;
   }
+  for (const std::string& id : ids) {
+    EXPECT_EQ(all(page, " id=\"(" + id + ")\"").size(), 1U) << "no other element has the name";
+  }
   EXPECT_EQ(all(page, "(?:href|src)=\"([^#d][^\"]*)\"").size(), 0U);
 }
 

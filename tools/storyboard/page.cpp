@@ -1,16 +1,17 @@
 // SPDX-License-Identifier: MIT
-// Moves are links, so that a page can be clicked through even where programs do not run. A picture
-// that several steps show is in the first of them; the page's program copies it to the others.
+// Moves are links, so that a page can be clicked through even where programs do not run. Pictures
+// are backgrounds in the style, so that the parts that steps have in common are in the page once.
+// Names of steps have no "_", with which the page's own names begin.
 #include "tools/storyboard/page.hpp"
 
 #include <algorithm>
 #include <array>
 #include <cstdio>
-#include <set>
 
 #include "toolkit/property_list/base64.hpp"
 #include "tools/play/pressing.hpp"
 #include "tools/play/words.hpp"
+#include "tools/storyboard/map_html.hpp"
 #include "tools/storyboard/markup.hpp"
 #include "tools/storyboard/page_parts.hpp"
 #include "tools/storyboard/reading_order.hpp"
@@ -27,6 +28,7 @@ constexpr std::string_view mark = " class=\"marked\"";
 std::string base64(std::string_view bytes) {
   std::string text;
   toolkit::encodeBase64(bytes, "", text);
+  std::erase(text, '\n');
   return text;
 }
 
@@ -40,10 +42,16 @@ std::string attribute(std::string_view name, std::string_view value) {
   return " " + std::string(name) + "=\"" + html(value) + "\"";
 }
 
-std::string percent(double part, double whole) {
+std::string percent(double share) {
   std::array<char, 32> text{};
-  std::snprintf(text.data(), text.size(), "%.3f%%", whole > 0 ? 100 * part / whole : 0);
+  std::snprintf(text.data(), text.size(), "%.3f%%", 100 * share);
   return text.data();
+}
+
+/// Returns the style of an element at a place that is in shares of the window from the top left.
+std::string placeOf(const toolkit::Rect& area) {
+  return "left:" + percent(area.x) + ";top:" + percent(area.y) + ";width:" + percent(area.width) +
+         ";height:" + percent(area.height);
 }
 
 /// Returns what a user calls the control: what it says, else its name.
@@ -57,13 +65,13 @@ std::string callingOf(const ControlPicture& control) {
 
 class PageWriter {
  public:
-  explicit PageWriter(const Page& page) : page_(page) {}
+  explicit PageWriter(const Page& page) : page_(page), map_(mapOf(page)) {}
 
   std::string write() {
     writeHead();
     writeIntroduction();
     writeContents();
-    text_ += "<main id=\"steps\">\n";
+    text_ += "<main id=\"_steps\">\n";
     for (std::size_t i = 0; i < page_.steps.size(); ++i) writeStep(i);
     text_ += "</main>\n<script>";
     text_ += pageProgram();
@@ -80,8 +88,25 @@ class PageWriter {
         base64(fromHex(pageProgramHash())) +
         "'\">\n<meta name=\"viewport\" content=\"width=device-width, initial-scale=1\">\n"
         "<link rel=\"icon\" href=\"data:,\">\n<title>" +
-        html(page_.title) + "</title>\n<style>" + std::string(pageStyle()) +
+        html(page_.title) + "</title>\n<style>" + std::string(pageStyle()) + pictureRules() +
         "</style>\n</head>\n<body>\n";
+  }
+
+  /// Returns the rules that show pictures. Each part of a picture is in the page once, however many
+  /// steps show it.
+  std::string pictureRules() const {
+    if (page_.ground.empty()) return "";
+    std::string rules = ".drawn { background-image: " + imageOf(page_.ground) + "; }\n";
+    for (std::size_t i = 0; i < page_.patches.size(); ++i) {
+      const PagePatch& patch = page_.patches[i];
+      rules += ".p" + std::to_string(i) + " {" + placeOf(patch.area) +
+               ";background-image:" + imageOf(patch.png) + "}\n";
+    }
+    return rules;
+  }
+
+  static std::string imageOf(const std::string& png) {
+    return "url(data:image/png;base64," + base64(png) + ")";
   }
 
   void writeIntroduction() {
@@ -89,12 +114,15 @@ class PageWriter {
     for (const std::string& remark : page_.remarks) text_ += "<p>" + html(remark) + "</p>\n";
     writeFindings();
     text_ +=
-        "<div class=\"player\" hidden>\n<button type=\"button\" id=\"back\">Back</button>\n"
-        "<button type=\"button\" id=\"again\">Start again</button>\n"
-        "<label for=\"command\">Played so far</label>\n"
-        "<input id=\"command\" readonly>\n"
-        "<button type=\"button\" id=\"copy\">Copy</button>\n"
-        "<span role=\"status\" id=\"status\"></span>\n</div>\n</header>\n";
+        "<div class=\"player\" hidden>\n<button type=\"button\" id=\"_back\">Back</button>\n"
+        "<button type=\"button\" id=\"_again\">Start again</button>\n"
+        "<label for=\"_command\">Played so far</label>\n"
+        "<input id=\"_command\" readonly>\n"
+        "<button type=\"button\" id=\"_copy\">Copy</button>\n"
+        "<span role=\"status\" id=\"_status\"></span>\n</div>\n";
+    text_ += map_ ? htmlOf(page_, *map_)
+                  : "<p>This page has no map: it was made without Graphviz.</p>\n";
+    text_ += "</header>\n";
   }
 
   // --- findings ---
@@ -110,7 +138,7 @@ class PageWriter {
 
   void writeFinding(std::size_t index) {
     const PageFinding& finding = page_.findings[index];
-    text_ += "<li id=\"finding-" + std::to_string(index + 1) + "\" class=\"" + finding.severity +
+    text_ += "<li id=\"_finding-" + std::to_string(index + 1) + "\" class=\"" + finding.severity +
              "\"><strong>" + finding.severity + "</strong> <span dir=\"auto\">" +
              html(finding.message) + "</span> <code>" + finding.code + "</code>, <code>" +
              html(finding.place) + "</code>";
@@ -133,7 +161,8 @@ class PageWriter {
       if (!isHere) continue;
       text_ += "<p class=\"finding " + finding.severity + "\"><strong>" + finding.severity +
                "</strong> <span dir=\"auto\">" + html(finding.message) +
-               "</span> <a href=\"#finding-" + std::to_string(i + 1) + "\">more about it</a></p>\n";
+               "</span> <a href=\"#_finding-" + std::to_string(i + 1) +
+               "\">more about it</a></p>\n";
     }
   }
 
@@ -141,8 +170,8 @@ class PageWriter {
 
   void writeContents() {
     text_ +=
-        "<nav aria-label=\"Steps\">\n<label for=\"search\">Search</label>\n"
-        "<input id=\"search\" type=\"search\">\n<ul id=\"contents\">\n";
+        "<nav aria-label=\"Steps\">\n<label for=\"_search\">Search</label>\n"
+        "<input id=\"_search\" type=\"search\">\n<ul id=\"_contents\">\n";
     for (const PageStep& step : page_.steps) {
       text_ += "<li><a dir=\"auto\" href=\"#" + step.name.id + "\">" + html(step.name.title) +
                "</a></li>\n";
@@ -155,7 +184,7 @@ class PageWriter {
   void writeStep(std::size_t index) {
     const PageStep& step = page_.steps[index];
     text_ += "<section id=\"" + step.name.id + "\" class=\"step" + (index == 0 ? " current" : "") +
-             "\"" + attribute("data-command", step.command) +
+             "\"" + attribute("data-command", step.command) + nodeOf(index) +
              ">\n<h2 tabindex=\"-1\" dir=\"auto\">" + html(step.name.title) + "</h2>\n";
     writeFindingsAt(index);
     text_ += "<div class=\"columns\">\n<div class=\"seen\">\n";
@@ -169,27 +198,19 @@ class PageWriter {
     text_ += "</div>\n</div>\n</section>\n";
   }
 
-  void writePicture(const PageStep& step) {
-    const auto& content = step.picture.window->content;
-    text_ += "<div class=\"picture\" style=\"--width:" + play::numberWords(content.width) +
-             ";--height:" + play::numberWords(content.height) + "\">\n";
-    if (step.image) writeImage(*step.image, step);
-    for (const std::size_t control : readingOrder(step.picture)) writeArea(step, control);
-    text_ += "</div>\n";
+  std::string nodeOf(std::size_t step) const {
+    if (!map_) return "";
+    return " data-node=\"" + std::to_string(map_->nodeOfStep[step]) + "\"";
   }
 
-  void writeImage(std::size_t image, const PageStep& step) {
-    const std::string size = " width=\"" + play::numberWords(step.picture.window->content.width) +
-                             "\" height=\"" +
-                             play::numberWords(step.picture.window->content.height) + "\"";
-    const std::string id = "picture-" + std::to_string(image);
-    text_ += "<img alt=\"\" loading=\"lazy\" decoding=\"async\"" + size;
-    if (shown_.insert(image).second) {
-      text_ +=
-          " id=\"" + id + "\" src=\"data:image/png;base64," + base64(page_.images[image]) + "\">\n";
-    } else {
-      text_ += " data-same=\"" + id + "\">\n";
-    }
+  void writePicture(const PageStep& step) {
+    const auto& content = step.picture.window->content;
+    text_ += "<div class=\"picture" + std::string(step.isDrawn ? " drawn" : "") +
+             "\" style=\"--width:" + play::numberWords(content.width) +
+             ";--height:" + play::numberWords(content.height) + "\">\n";
+    text_ += patchesOf(step);
+    for (const std::size_t control : readingOrder(step.picture)) writeArea(step, control);
+    text_ += "</div>\n";
   }
 
   /// Writes where a control is: what can be pressed as a link, the rest only where nothing is
@@ -197,16 +218,16 @@ class PageWriter {
   void writeArea(const PageStep& step, std::size_t index) {
     const ControlPicture& control = step.picture.controls[index];
     const PageMove* const press = pressOf(step, index);
-    if (!press && step.image) return;
+    if (!press && step.isDrawn) return;
     const auto& frame = control.view.frame;
     const auto& content = step.picture.window->content;
-    const std::string style = " style=\"left:" + percent(frame.x, content.width) + ";top:" +
-                              percent(content.height - frame.y - frame.height, content.height) +
-                              ";width:" + percent(frame.width, content.width) +
-                              ";height:" + percent(frame.height, content.height) +
-                              ";z-index:" + std::to_string(index + 1) + "\"";
+    const std::string style =
+        " style=\"" +
+        placeOf({frame.x / content.width, 1 - (frame.y + frame.height) / content.height,
+                 frame.width / content.width, frame.height / content.height}) +
+        ";z-index:" + std::to_string(index + 1) + "\"";
     const std::string kind = "area " + classOf(control);
-    const std::string words = step.image ? "" : boxWords(control);
+    const std::string words = step.isDrawn ? "" : boxWords(control);
     if (!press) {
       text_ += "<span aria-hidden=\"true\" dir=\"auto\" class=\"" + kind + "\"" + style + ">" +
                words + "</span>\n";
@@ -287,9 +308,10 @@ class PageWriter {
           control.name.empty() ? std::to_string(control.view.tag) : printable(control.name);
       text_ += "<li><span class=\"kind\">" + std::string(row.word) +
                "</span> <span class=\"name\">" + html(name) +
-               "</span> <span class=\"content\" dir=\"auto\">" + html(content) +
-               "</span> <span class=\"details\">" + html(joined(play::remarksOn(control))) +
-               "</span></li>\n";
+               "</span> <span class=\"content\" dir=\"auto\">" + html(content) + "</span>";
+      const std::string details = joined(play::remarksOn(control));
+      if (!details.empty()) text_ += " <span class=\"details\">" + html(details) + "</span>";
+      text_ += "</li>\n";
     }
     text_ += "</ul>\n";
   }
@@ -306,8 +328,8 @@ class PageWriter {
   }
 
   const Page& page_;
+  const std::optional<PageMap> map_;
   std::string text_;
-  std::set<std::size_t> shown_;  // images that are in the page already
 };
 
 }  // namespace

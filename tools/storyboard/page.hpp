@@ -39,11 +39,19 @@ struct SourceExcerpt {
 
 struct PageStep {
   StepName name{};
+  std::string group{};  ///< the step of the source, or the list that had the last word
   walkthrough::StepPicture picture{};
-  std::optional<std::size_t> image{};  ///< of the page; absent: the page shows the controls' texts
+  bool isDrawn = false;                ///< on the page's ground; else the page shows texts
+  std::vector<std::size_t> patches{};  ///< of the page, over its ground
   std::string command{};               ///< that plays a shortest way to here
   std::vector<PageMove> moves{};
   std::vector<SourceExcerpt> source{};
+};
+
+/// A part of pictures, which may be in several.
+struct PagePatch {
+  toolkit::Rect area{};  ///< in shares of the window from the *top* left: 0 to 1
+  std::string png{};
 };
 
 struct PageFinding {
@@ -59,7 +67,8 @@ struct Page {
   std::string title{};
   std::vector<std::string> remarks{};  ///< sentences about the whole
   std::vector<PageStep> steps{};       ///< the first is a start
-  std::vector<std::string> images{};   ///< PNG files
+  std::string ground{};                ///< a PNG file that is behind all pictures; or empty
+  std::vector<PagePatch> patches{};    ///< no two the same
   std::vector<PageFinding> findings{};
 };
 

@@ -4,7 +4,7 @@
 (() => {
   const at = (id) => document.getElementById(id);
   const steps = [...document.querySelectorAll('.step')];
-  const links = new Map([...document.querySelectorAll('#contents a')].map((a) => [a.hash, a]));
+  const links = new Map([...document.querySelectorAll('#_contents a')].map((a) => [a.hash, a]));
   const reduced = matchMedia('(prefers-reduced-motion: reduce)');
   let current = null;
   let walk = null;  // the step where it began, and the moves since
@@ -15,12 +15,55 @@
     return found && found.classList.contains('step') ? found : null;
   };
 
-  const fill = (step) => {
-    for (const image of step.querySelectorAll('img[data-same]')) {
-      image.src = at(image.dataset.same).src;
-      image.removeAttribute('data-same');
+  // --- the map, which a page may be without ---
+
+  const map = at('_map');
+  const nodes = map ? [...map.querySelectorAll('.node')] : [];
+  const edges = map ? [...map.querySelectorAll('.edge')] : [];
+  let zoom = 1;
+
+  const showOnMap = (step) => {
+    const {node} = step.dataset;
+    for (const each of nodes) each.toggleAttribute('aria-current', each.dataset.node === node);
+    for (const edge of edges) {
+      edge.classList.toggle('front', edge.dataset.from === node || edge.dataset.to === node);
     }
+    if (map && map.open) nodes[node].scrollIntoView({block: 'nearest', inline: 'nearest'});
   };
+
+  const setZoom = (wanted) => {
+    zoom = Math.min(Math.max(wanted, .1), 3);
+    map.querySelector('.sheet').style.zoom = zoom;
+  };
+
+  // Drags the map by its background.
+  const dragMap = (frame) => {
+    frame.addEventListener('pointerdown', (event) => {
+      if (event.pointerType !== 'mouse' || event.target.closest('.node')) return;
+      const pan = (moved) => frame.scrollBy(-moved.movementX, -moved.movementY);
+      const end = () => frame.removeEventListener('pointermove', pan);
+      frame.setPointerCapture(event.pointerId);
+      frame.addEventListener('pointermove', pan);
+      frame.addEventListener('pointerup', end, {once: true});
+    });
+    frame.addEventListener('wheel', (event) => {
+      if (!event.ctrlKey) return;
+      event.preventDefault();
+      setZoom(zoom * (event.deltaY < 0 ? 1.2 : 1 / 1.2));
+    }, {passive: false});
+  };
+
+  if (map) {
+    const frame = map.querySelector('.map');
+    const sheet = map.querySelector('.sheet');
+    const [width, height] = [parseFloat(sheet.style.width), parseFloat(sheet.style.height)];
+    at('_larger').addEventListener('click', () => setZoom(zoom * 1.3));
+    at('_smaller').addEventListener('click', () => setZoom(zoom / 1.3));
+    at('_whole').addEventListener('click', () => setZoom(
+        Math.min((frame.clientWidth - 40) / width, (frame.clientHeight - 40) / height, 1)));
+    map.addEventListener('toggle', () => map.open && showOnMap(current));
+    dragMap(frame);
+  }
 
   const stopWaiting = () => {
     clearInterval(countdown);
@@ -35,16 +78,16 @@
     if (current) current.classList.remove('current');
     links.get('#' + (current || step).id)?.removeAttribute('aria-current');
     current = step;
-    fill(step);
     step.classList.add('current');
     const link = links.get('#' + step.id);
     link?.setAttribute('aria-current', 'true');
-    at('command').value = [at(walk.from).dataset.command, ...walk.moves].join(' ');
-    at('back').disabled = walk.moves.length === 0;
-    at('status').textContent = '';
+    at('_command').value = [at(walk.from).dataset.command, ...walk.moves].join(' ');
+    showOnMap(step);
+    at('_back').disabled = walk.moves.length === 0;
+    at('_status').textContent = '';
     if (!isMove) return;
     step.querySelector('h2').focus({preventScroll: true});
-    step.scrollIntoView({block: 'nearest', behavior: reduced.matches ? 'auto' : 'smooth'});
+    step.querySelector('h2').scrollIntoView({block: 'nearest', behavior: reduced.matches ? 'auto' : 'smooth'});
   };
 
   const begin = (step, isMove) => {
@@ -94,17 +137,17 @@
     button.addEventListener('click', () => wait(button));
   }
 
-  at('back').addEventListener('click', () => history.back());
-  at('again').addEventListener('click', () => {
+  at('_back').addEventListener('click', () => history.back());
+  at('_again').addEventListener('click', () => {
     walk = {from: steps[0].id, moves: []};
     history.pushState(walk, '', '#' + steps[0].id);
     show(steps[0], true);
   });
-  at('copy').addEventListener('click', async () => {
-    at('command').select();
-    const copied = await navigator.clipboard?.writeText(at('command').value).then(() => true, () => false)
+  at('_copy').addEventListener('click', async () => {
+    at('_command').select();
+    const copied = await navigator.clipboard?.writeText(at('_command').value).then(() => true, () => false)
         || document.execCommand('copy');
-    at('status').textContent = copied ? 'Copied' : 'Press Ctrl-C to copy';
+    at('_status').textContent = copied ? 'Copied' : 'Press Ctrl-C to copy';
   });
 
   const texts = new Map();  // of the steps, in small letters
@@ -112,16 +155,15 @@
     if (!texts.has(id)) texts.set(id, at(id).textContent.toLowerCase());
     return texts.get(id);
   };
-  at('search').addEventListener('input', () => {
-    const wanted = at('search').value.trim().toLowerCase();
+  at('_search').addEventListener('input', () => {
+    const wanted = at('_search').value.trim().toLowerCase();
+    const found = new Set();  // nodes
     for (const [hash, link] of links) {
-      link.parentElement.hidden = wanted !== '' && !textOf(hash.slice(1)).includes(wanted);
+      const isFound = wanted === '' || textOf(hash.slice(1)).includes(wanted);
+      link.parentElement.hidden = !isFound;
+      if (isFound) found.add(at(hash.slice(1)).dataset.node);
     }
-  });
-
-  addEventListener('beforeprint', () => {
-    for (const step of steps) fill(step);
-    for (const image of document.images) image.loading = 'eager';
+    for (const node of nodes) node.classList.toggle('dim', !found.has(node.dataset.node));
   });
 
   document.querySelector('.player').hidden = false;

@@ -11,6 +11,7 @@
 #include "tools/drawing/look_stage.hpp"
 #include "tools/storyboard/board.hpp"
 #include "tools/storyboard/page.hpp"
+#include "tools/storyboard/picture_store.hpp"
 #include "tools/storyboard/selection.hpp"
 #include "tools/storyboard/shipped_fonts.hpp"
 #include "tools/storyboard/source_excerpt.hpp"
@@ -22,7 +23,6 @@ namespace {
 
 using walkthrough::StepPicture;
 
-constexpr double density = 2;  // pixels a point
 constexpr auto nothingSeen = std::numeric_limits<check::LookValue>::max();
 
 /// Makes the page of a board.
@@ -46,6 +46,7 @@ class PageMaker {
     return std::move(page_);
   }
 
+  std::size_t pictures() const { return drawn_; }
   std::size_t leftOut() const { return board_.steps().size() - shown_.size(); }
 
  private:
@@ -66,6 +67,7 @@ class PageMaker {
   void addStep(StepIndex index) {
     const BoardStep& step = board_.steps()[index];
     PageStep shown{.name = names_[index],
+                   .group = step.group,
                    .picture = pictures_[index],
                    .command = check::playCommand(report_, board_.exploration().path(step.visit)),
                    .source = excerpts_.of(step.ranLists)};
@@ -84,17 +86,21 @@ class PageMaker {
     if (!artist) return;
     artist->drawAlike(shippedFonts());
     driver->setResourcePath(board_.exploration().setting().resources);
-    std::map<check::Looks::Parts, std::size_t> drawn;
+    PictureStore store(*artist, page_);
+    std::map<check::Looks::Parts, std::vector<std::size_t>> drawn;  // their patches
     for (std::size_t i = 0; i < shown_.size(); ++i) {
       options_.drawing(i, shown_.size());
       const BoardStep& step = board_.steps()[shown_[i]];
       if (step.isOver) continue;
-      const auto [known, isNew] = drawn.try_emplace(seenAt(step), page_.images.size());
-      page_.steps[i].image = known->second;
-      if (!isNew) continue;
-      drawing::LookStage stage(*driver, board_.exploration(), step.place, step.look);
-      page_.images.push_back(artist->drawPicture(stage.window(), density));
+      const auto [known, isNew] = drawn.try_emplace(seenAt(step));
+      if (isNew) {
+        drawing::LookStage stage(*driver, board_.exploration(), step.place, step.look);
+        known->second = store.add(stage.window(), page_.steps[i].picture);
+      }
+      page_.steps[i].patches = known->second;
+      page_.steps[i].isDrawn = !page_.ground.empty();
     }
+    drawn_ = drawn.size();
   }
 
   /// Returns the parts of the look that are seen.
@@ -168,6 +174,7 @@ class PageMaker {
   std::vector<StepName> names_;        // the same
   std::vector<StepIndex> shown_;
   std::map<StepIndex, std::size_t> numbers_;  // of the shown steps, on the page
+  std::size_t drawn_ = 0;                     // pictures
   Page page_;
 };
 
@@ -191,7 +198,7 @@ Storyboard makeStoryboard(const InputFile& file, const StoryboardOptions& option
   return {.html = htmlOf(page),
           .steps = page.steps.size(),
           .leftOut = maker.leftOut(),
-          .pictures = page.images.size(),
+          .pictures = maker.pictures(),
           .findings = page.findings.size(),
           .isComplete = exploration.isComplete()};
 }

@@ -34,15 +34,17 @@ const linkOf = (page, {from, move}) => page.locator(`[id="${from}"] a[data-move=
 
 const seenOn = (page) => page.evaluate(() => {
   const step = document.querySelector('.step.current');
-  const text = (element, name) => element.querySelector('.' + name).textContent;
+  const text = (element, name) => element.querySelector('.' + name)?.textContent || '';
   return {
     id: step.id,
     standing: text(step, 'standing'),
-    command: document.getElementById('command').value,
+    command: document.getElementById('_command').value,
     says: [...step.querySelectorAll('.says li')].map((li) => (
         {name: text(li, 'name'), kind: text(li, 'kind'), content: text(li, 'content'), details: text(li, 'details')})),
   };
 });
+
+const isAt = (page, step) => page.locator(`.step.current[id="${step}"]`).waitFor({timeout: 10000});
 
 const sorted = (rows) => rows.map((row) => JSON.stringify(
     [row.name, row.kind, row.content, row.details].map(squeezed))).sort();
@@ -68,7 +70,7 @@ async function clickThrough(page, url) {
   const all = await page.locator('.step').count();
   assert.strictEqual(Object.keys(ways).length, all, 'every step can be come to');
   for (const [step, way] of Object.entries(ways)) {
-    await page.click('#again');
+    await page.click('#_again');
     for (const move of way) await linkOf(page, move).click();
     await compare(page, step);
     counts.clicks += way.length;
@@ -95,10 +97,10 @@ async function useKeyboard(page, url, ways) {
     assert.strictEqual((await seenOn(page)).id, move.to);
   }
   for (const move of longest(ways).slice().reverse()) {
-    await page.click('#back');
-    await page.waitForFunction((id) => document.querySelector('.step.current').id === id, move.from);
+    await page.click('#_back');
+    await isAt(page, move.from);
   }
-  assert.ok(await page.locator('#back').isDisabled());
+  assert.ok(await page.locator('#_back').isDisabled());
 }
 
 async function usePhone(browser, url, ways) {
@@ -129,12 +131,12 @@ async function useTheRest(page, url) {
   const last = await page.locator('.step').last().getAttribute('id');
   await page.goto(`${url}#${last}`);
   await compare(page, last);
-  await page.fill('#search', await page.locator('#contents a').last().textContent());
-  const found = await page.locator('#contents li:visible').count();
+  await page.fill('#_search', await page.locator('#_contents a').last().textContent());
+  const found = await page.locator('#_contents li:visible').count();
   assert.ok(found >= 1, 'the search finds the step');
-  await page.fill('#search', 'no step says this');
-  assert.strictEqual(await page.locator('#contents li:visible').count(), 0);
-  await page.click('#again');
+  await page.fill('#_search', 'no step says this');
+  assert.strictEqual(await page.locator('#_contents li:visible').count(), 0);
+  await page.click('#_again');
   const timer = await page.evaluate(() => {
     const wait = [...document.querySelectorAll('.wait')].find((each) => each.dataset.seconds <= 3);
     return wait && {step: wait.closest('.step').id, to: wait.parentElement.querySelector('a').hash.slice(1)};
@@ -142,7 +144,7 @@ async function useTheRest(page, url) {
   if (!timer) return;
   await page.goto(`${url}#${timer.step}`);
   await page.click('.step.current .wait');
-  await page.waitForFunction((id) => document.querySelector('.step.current').id === id, timer.to, {timeout: 5000});
+  await isAt(page, timer.to);
 }
 
 // A new page that fails on messages and requests.
