@@ -199,8 +199,9 @@ check::RunReport reportOf(const CommandOptions& options, const std::vector<Job>&
     if (const auto& failure = jobs[i].failure) {
       run.unchecked.push_back({options.scripts[i], failure->what()});
     } else {
-      run.scripts.push_back(
-          {jobs[i].verdict, *jobs[i].file, stageArguments(options.check), options.failOn});
+      run.scripts.push_back({jobs[i].verdict, *jobs[i].file,
+                             playStageArguments(options.check.stage, options.check.resources),
+                             options.failOn});
     }
   }
   return run;

@@ -30,18 +30,30 @@ ProgressLine::~ProgressLine() {
   if (isShown_) std::cerr << clearLine << std::flush;
 }
 
-void ProgressLine::show(const std::string& script, const check::Progress& progress) {
-  if (!isOn_) return;
+/// Whether the line is to be written now.
+bool ProgressLine::isDue() {
   using namespace std::chrono_literals;
-  const std::lock_guard lock(mutex_);
   const auto now = Clock::now();
-  if (now - began_ < 1s || now - shown_ < 200ms) return;
+  if (!isOn_ || now - began_ < 1s || now - shown_ < 200ms) return false;
   shown_ = now;
   isShown_ = true;
-  const double seconds = std::chrono::duration<double>(now - began_).count();
+  return true;
+}
+
+void ProgressLine::show(const std::string& script, const check::Progress& progress) {
+  const std::lock_guard lock(mutex_);
+  if (!isDue()) return;
+  const double seconds = std::chrono::duration<double>(shown_ - began_).count();
   std::cerr << clearLine << oneLine(script) << ": " << progress.places << " places, "
             << perSecond(progress.places, seconds) << " a second, " << progress.frontier
             << " to go on from; Ctrl-C stops" << std::flush;
+}
+
+void ProgressLine::show(const std::string& what, std::size_t done, std::size_t all,
+                        const std::string& noun) {
+  const std::lock_guard lock(mutex_);
+  if (!isDue()) return;
+  std::cerr << clearLine << what << ' ' << done << " of " << all << ' ' << noun << std::flush;
 }
 
 Interruption::Interruption() {

@@ -20,9 +20,13 @@ class ProgressLine {
   ProgressLine& operator=(const ProgressLine&) = delete;
 
   void show(const std::string& script, const check::Progress& progress);
+  /// Shows how much of a known number is done, such as "drawing 3 of 20 pictures".
+  void show(const std::string& what, std::size_t done, std::size_t all, const std::string& noun);
 
  private:
   using Clock = std::chrono::steady_clock;
+
+  bool isDue();
 
   bool isOn_;
   Clock::time_point began_ = Clock::now();

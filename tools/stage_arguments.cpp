@@ -1,6 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "tools/stage_arguments.hpp"
 
+#include "tools/check/report.hpp"
 #include "tools/support/drivers.hpp"
 
 namespace qz::tools {
@@ -20,6 +21,19 @@ WindowArguments addStageOptions(Command& command, walkthrough::StageOptions& sta
   command.flag("--sheet", stage.sheet,
                "Show the window as a sheet over another window of the host");
   return {window, assets};
+}
+
+std::string playStageArguments(const walkthrough::StageOptions& stage,
+                               const std::optional<std::string>& resources) {
+  std::string arguments;
+  const auto add = [&](const char* option, const std::optional<std::string>& value) {
+    if (value) arguments += std::string(" ") + option + " " + check::shellWord(*value);
+  };
+  add("--window", stage.window);
+  add("--assets", stage.assets);
+  add("--resources", resources);
+  if (stage.sheet) arguments += " --sheet";
+  return arguments;
 }
 
 void addToolkitOption(Command& command, std::string& toolkit, const std::string& help) {

@@ -20,6 +20,10 @@ struct WindowArguments {
 WindowArguments addStageOptions(Command& command, walkthrough::StageOptions& stage,
                                 std::optional<std::string>& resources);
 
+/// Returns these options as arguments of `play`, each behind a blank; empty without any.
+std::string playStageArguments(const walkthrough::StageOptions& stage,
+                               const std::optional<std::string>& resources);
+
 /// Adds --toolkit, whose default is the variable's present value. `help` says what the toolkit is
 /// for; the names of the toolkits follow.
 void addToolkitOption(Command& command, std::string& toolkit, const std::string& help);

@@ -7,6 +7,7 @@
 #include <memory>
 
 #include "drivers/paced_driver.hpp"
+#include "qz/drivers/drawing.hpp"
 #include "qz/drivers/measuring.hpp"
 #include "qz/toolkit/qt/qt_toolkit.hpp"
 
@@ -22,7 +23,10 @@ struct DeletionSweep {
 };
 
 // The first base ends last, after the toolkit.
-class QtDriver final : DeletionSweep, public PacedDriver<QtToolkit>, public Measuring {
+class QtDriver final : DeletionSweep,
+                       public PacedDriver<QtToolkit>,
+                       public Drawing,
+                       public Measuring {
  public:
   std::string_view name() const override { return "qt"; }
 
@@ -41,6 +45,9 @@ class QtDriver final : DeletionSweep, public PacedDriver<QtToolkit>, public Meas
 
   bool hasPerson() const override;
   bool savePicture(const Ref<Window>& window, const std::string& path) override;
+  void drawAlike(std::span<const std::string_view> fonts) override;
+  Pixels draw(const Ref<Window>& window, double density) override;
+  std::string pngOf(const Pixels& pixels) override;
   void workOffScreen() override;
   MissingRoom missingRoom(const Ref<View>& view) override;
 
