@@ -12,25 +12,36 @@ namespace {
 
 using Engine = QZ_Plist_State_Parser;
 
+/// What the elements of a list share.
+struct Run {
+  Engine& engine;
+  toolkit::Toolkit& toolkit;
+  const Engine::Parameters& parameters;
+  const Engine::ObjectId& id;
+  bool isFixed;         ///< whether nobody can change the list meanwhile
+  bool isByOperations;  ///< whether a subclass may override what runs a command
+};
+
 // Runs an array as a compound command, whose name is compared in upper case, and anything else as a
 // simple command, whose name is compared as written. An element that is not fixed may change while
 // it runs, so it is kept alive or copied.
-bool runElement(Engine& engine, toolkit::Toolkit& toolkit, const Engine::Value& element,
-                bool isFixed, const Engine::Parameters& parameters, const Engine::ObjectId& id) {
+bool runElement(const Run& run, const Engine::Value& element) {
   if (element->kind() != toolkit::Value::Kind::array) {
-    parameters->removeAllObjects();
+    run.parameters->removeAllObjects();
     const Engine::Value kept = element;
-    return engine.subclass() ? engine.doSimpleCommand(textOf(kept), parameters, id)
-                             : commands::runSimple(textOf(kept), engine, id);
+    return run.isByOperations ? run.engine.doSimpleCommand(textOf(kept), run.parameters, run.id)
+                              : commands::runSimple(textOf(kept), run.engine, run.id);
   }
   // Not asArray, which would count a reference: this runs for every command.
   const auto& compound = static_cast<const toolkit::Array&>(*element);
   std::string raised;
   const auto name = text::uppercased(textOf(compound.objectAtIndex(0)), raised);
   const auto given = compound.elements().subspan(1);
-  isFixed ? parameters->borrowElements(given) : parameters->setElements(given);
-  if (engine.subclass()) return engine.doCompoundCommand(name, commands::ownList(parameters), id);
-  return commands::runCompound(name, {engine, parameters, id, toolkit});
+  run.isFixed ? run.parameters->borrowElements(given) : run.parameters->setElements(given);
+  if (run.isByOperations) {
+    return run.engine.doCompoundCommand(name, commands::ownList(run.parameters), run.id);
+  }
+  return commands::runCompound(name, {run.engine, run.parameters, run.id, run.toolkit});
 }
 
 }  // namespace
@@ -45,13 +56,19 @@ bool QZ_Plist_State_Parser::processCommandArray(Value list, ObjectId forObject) 
   // Outside the try block: a value without elements raises to the caller.
   const auto count = static_cast<std::int32_t>(list->count());
   state_->notify(&Observer::listWillRun, list, forObject);
+  const Run run{.engine = *this,
+                .toolkit = state_->toolkit,
+                .parameters = parameters,
+                .id = forObject,
+                .isFixed = list->isFixed(),
+                .isByOperations = state_->subclass != nullptr};
   bool result = false;
   for (std::int32_t i = 0; i < count; ++i) {
     const auto index = static_cast<std::size_t>(i);
     try {
       const Value& element = list->objectAtIndex(index);
       state_->notify(&Observer::commandWillRun, list, index);
-      result = runElement(*this, state_->toolkit, element, list->isFixed(), parameters, forObject);
+      result = runElement(run, element);
       state_->notify(&Observer::commandDidRun, list, index, result);
     } catch (const toolkit::Exception& exception) {
       state_->toolkit.log().write("Exception in processCommandArray: " + exception.reason());
