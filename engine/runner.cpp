@@ -28,7 +28,7 @@ struct Run {
 bool runElement(const Run& run, const Engine::Value& element) {
   if (element->kind() != toolkit::Value::Kind::array) {
     run.parameters->removeAllObjects();
-    const Engine::Value kept = element;
+    const Engine::Value kept = element;  // NOLINT(performance-unnecessary-copy-initialization)
     return run.isByOperations ? run.engine.doSimpleCommand(textOf(kept), run.parameters, run.id)
                               : commands::runSimple(textOf(kept), run.engine, run.id);
   }

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 #include "tools/check_progress.hpp"
 
-#include <signal.h>
+#include <signal.h>  // NOLINT(modernize-deprecated-headers): the standard one has no sigaction
 #include <unistd.h>
 
 #include <atomic>

@@ -34,7 +34,7 @@ struct LiftCommandOptions {
 /// Returns the path of the source. One that is there already is somebody's work.
 std::string sourcePath(const LiftCommandOptions& options) {
   if (options.output) return *options.output;
-  const std::string path = fs::path(options.script).replace_extension(".yaml").string();
+  std::string path = fs::path(options.script).replace_extension(".yaml").string();
   if (!fs::exists(path)) return path;
   throw Failure(ExitStatus::badInput,
                 path + ": is there already; expected -o with the file to write");

@@ -10,6 +10,7 @@
 #include <vector>
 
 #include "tests/check/small_scripts.hpp"
+#include "tools/walkthrough/host_window.hpp"
 
 namespace qz::naive {
 
@@ -40,7 +41,7 @@ std::vector<Finding> findingsOf(const Exploration& exploration, std::string_view
 
 /// A script with exactly these findings of their code, and one without any.
 struct Case {
-  HostWindow host;
+  tools::walkthrough::HostWindow host;
   std::string_view wrong;
   std::vector<Finding> findings;
   std::string_view right;

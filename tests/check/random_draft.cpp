@@ -36,7 +36,7 @@ class Filler {
   Value simpleForm(const Command& command);
   Value compoundForm(const Command& command, Tag list);
   Value parameter(const Command& command, ParameterType type, Tag list);
-  Value written(Tag number);
+  Value written(Tag value);
   Value flag();
   Tag targetOf(TargetKind kind, bool takesAway = false);
   bool takesAway(const Command& command);

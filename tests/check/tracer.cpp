@@ -132,7 +132,7 @@ void Tracer::pressed(toolkit::Tag tag) {
 // A list is known by the key under which the engine found it. The host may start at a key that is
 // not the plain form of its number.
 std::string Tracer::keyOf(const Value& list, const ObjectId& id) const {
-  const std::string plain = std::to_string(id->longValue());
+  std::string plain = std::to_string(id->longValue());
   if (!list || script_->objectForKey(plain) == list) return plain;
   for (const auto& entry : script_->entries()) {
     if (entry.value == list) return entry.key->description();

@@ -58,8 +58,8 @@ std::string TextNumbers::numberOf(const toolkit::AttributedString& text) {
   return std::to_string(number);
 }
 
-World::World(const Script& script, const HostWindow& host, const std::string& resources)
-    : script_(script),
+World::World(Script script, const HostWindow& host, const std::string& resources)
+    : script_(std::move(script)),
       window_(makeHostWindow(withResources(driver_, resources), host, "the host's window")),
       engine_(QZ_Plist_State_Parser::initWithWindow(driver_.toolkit(), window_)) {
   engine_->getGuiAssetsFromWindow(window_);
@@ -171,6 +171,7 @@ std::vector<PendingTimer> World::timers() const {
   }
   std::sort(order.begin(), order.end());
   std::vector<PendingTimer> timers;
+  timers.reserve(order.size());
   for (const auto& [left, unused, key] : order) timers.push_back({key, left});
   return timers;
 }

@@ -43,7 +43,7 @@ struct PendingTimer {
 class World {
  public:
   /// `resources` is the directory of the images; if it is empty, the toolkit's own.
-  World(const Script& script, const HostWindow& host, const std::string& resources = "");
+  World(Script script, const HostWindow& host, const std::string& resources = "");
   ~World();
   World(const World&) = delete;
   World& operator=(const World&) = delete;

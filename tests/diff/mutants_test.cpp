@@ -104,7 +104,7 @@ class Judge {
  private:
   static void judgeNames(const naive::JointDifference& theirs, const DiffedScripts& ours) {
     const auto& changes = ours.changes();
-    std::size_t fewest = static_cast<std::size_t>(-1);
+    auto fewest = static_cast<std::size_t>(-1);
     for (const Change& change : changes) {
       if (change.path.before.size() == change.path.after.size())
         fewest = std::min(fewest, change.path.after.size());

@@ -30,8 +30,8 @@ using toolkit::String;
 
 /// A toolkit that calls the host whenever it is used, and forwards to another toolkit.
 struct CallingToolkit final : toolkit::Toolkit {
-  CallingToolkit(toolkit::Toolkit& other, const std::function<void()>& host)
-      : real(other), call(host) {}
+  CallingToolkit(toolkit::Toolkit& other, std::function<void()> host)
+      : real(other), call(std::move(host)) {}
   toolkit::Toolkit& asked() const { return call(), real; }
 
   toolkit::Application& application() override { return asked().application(); }

@@ -331,7 +331,7 @@ TEST(CommandCatalogue, CommandsDoNotWorkOnABoxUnlessTheyWorkOnAnyView) {
 TEST(CommandCatalogue, ExtraParametersDoWhatTheRowsSay) {
   for (const Command& command : compoundCommands()) {
     Trial trial(command, viewOf(command.target));
-    trial.parameters.push_back(Number::withLong(1));
+    trial.parameters.emplace_back(Number::withLong(1));
     const bool result = trial.run();
     EXPECT_FALSE(trial.raised) << command.name;
     const auto extra = command.extraParameters;

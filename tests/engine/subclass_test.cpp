@@ -25,7 +25,7 @@ class Recorder final : public Subclass {
  public:
   bool overrides(std::string_view operation) override {
     asked.emplace_back(operation);
-    return overridden.empty() || overridden.count(std::string(operation)) > 0;
+    return overridden.empty() || overridden.contains(std::string(operation));
   }
   Result perform(std::string_view operation, std::span<const Argument> arguments) override {
     performed.emplace_back(operation);
@@ -154,7 +154,7 @@ TEST_F(Subclasses, PerformEveryOperationThatTheyOverride) {
         "pseudoButtonPush:",
         "flasherFired:",
         "QZ_Plist_State_Processor_TERMINATE_PARSER"};
-    EXPECT_EQ(answer, withoutResult.count(selector) == 0) << selector;
+    EXPECT_EQ(answer, !withoutResult.contains(selector)) << selector;
   }
   EXPECT_FALSE(engine->terminating());
   recorder->overridden = {"none"};

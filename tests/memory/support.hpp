@@ -96,7 +96,7 @@ class MemoryTest : public testing::Test {
   /// Returns a new button with this target and the action "pressed:".
   Ref<Button> makeButton(const std::shared_ptr<Responder>& target,
                          drivers::ViewKind kind = drivers::ViewKind::button, Tag tag = 1) {
-    const Ref<Button> button = asButton(make(kind, tag));
+    Ref<Button> button = asButton(make(kind, tag));
     button->setTarget(target);
     button->setAction("pressed:");
     return button;

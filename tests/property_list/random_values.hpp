@@ -52,7 +52,7 @@ class RandomValues {
   }
 
   ValueRef<> real() {
-    const double real = std::bit_cast<double>(word() << random_() % 2 * 52);
+    const auto real = std::bit_cast<double>(word() << random_() % 2 * 52);
     if (!isForXml_ && random_() % 2 == 0) return Number::withFloat(static_cast<float>(real));
     return Number::withDouble(real);
   }

@@ -1,8 +1,8 @@
 // SPDX-License-Identifier: MIT
 // The commands `build` and `texts`: what they write where, and what they say.
 #include <gtest/gtest.h>
-#include <signal.h>
 
+#include <csignal>
 #include <filesystem>
 #include <functional>
 #include <sstream>
@@ -114,7 +114,7 @@ TEST_F(BuildCommand, BuildsAgainAfterEachChangeUntilInterrupted) {
     EXPECT_NE(contents("tour.plist").find("<string>Hello</string>"), std::string::npos);
     folder_.writeSource("steps:\n  a: {text: Mended, next: {press: end}}\n");
   };
-  const auto interrupt = [] { ::raise(SIGINT); };
+  const auto interrupt = [] { std::raise(SIGINT); };
   Reader out(std::cout, {misspell, interrupt});
   Reader err(std::cerr, {remove, mend});
   EXPECT_EQ(runTool({"build", "tour.yaml", "--watch"}, {buildCommand}), 0);

@@ -1,7 +1,7 @@
 // SPDX-License-Identifier: MIT
 // The command line of `qz-walkthrough check`: what it refuses, its exit statuses, and its files.
 #include <gtest/gtest.h>
-#include <signal.h>
+#include <signal.h>  // NOLINT(modernize-deprecated-headers): the standard one has no kill
 #include <sys/inotify.h>
 #include <sys/socket.h>
 #include <sys/un.h>

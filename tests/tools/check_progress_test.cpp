@@ -5,10 +5,10 @@
 
 #include <fcntl.h>
 #include <gtest/gtest.h>
-#include <signal.h>
 #include <unistd.h>
 
 #include <chrono>
+#include <csignal>
 #include <cstdlib>
 #include <iostream>
 #include <thread>
@@ -103,14 +103,14 @@ TEST(CheckProgress, IsOnlyForTerminals) {
 TEST(CheckInterruption, IsWantedOnceTheUserInterrupts) {
   const Interruption interruption;
   EXPECT_FALSE(Interruption::isWanted());
-  ::raise(SIGINT);
+  std::raise(SIGINT);
   EXPECT_TRUE(Interruption::isWanted());
 }
 
 TEST(CheckInterruption, IsForgottenByTheNextWork) {
   {
     const Interruption interruption;
-    ::raise(SIGINT);
+    std::raise(SIGINT);
   }
   const Interruption interruption;
   EXPECT_FALSE(Interruption::isWanted());
@@ -118,8 +118,8 @@ TEST(CheckInterruption, IsForgottenByTheNextWork) {
 
 TEST(CheckInterruptionDeathTest, EndsTheProgramTheSecondTime) {
   const Interruption interruption;
-  ::raise(SIGINT);
-  EXPECT_EXIT(::raise(SIGINT), testing::KilledBySignal(SIGINT), "");
+  std::raise(SIGINT);
+  EXPECT_EXIT(std::raise(SIGINT), testing::KilledBySignal(SIGINT), "");
 }
 
 }  // namespace

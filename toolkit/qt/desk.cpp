@@ -27,7 +27,7 @@ Ref<View> Desk::viewOf(QAction& action) {
     known = std::make_shared<QtAction>(action, shared_from_this());
     entry = known;
   }
-  return Ref<View>(known);
+  return {known};
 }
 
 Ref<View> Desk::viewOf(QObject& object) {

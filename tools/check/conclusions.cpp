@@ -69,8 +69,7 @@ class Conclusions {
 
   void neverRuns() {
     const auto ran = listsThatRan();
-    for (std::size_t i = 0; i < script_.lists().size(); ++i) {
-      const ScriptList& list = script_.lists()[i];
+    for (const ScriptList& list : script_.lists()) {
       if (ran.contains(list.key) || !list.tag || !toolkit::asArray(list.value)) continue;
       Finding finding = findingOf(
           "never-runs",

@@ -58,6 +58,7 @@ std::vector<BriefText> ReadingTimes::briefTexts() const {
     }
   }
   std::vector<BriefText> texts;
+  texts.reserve(byCause.size());
   for (auto& [cause, text] : byCause) texts.push_back(std::move(text));
   return texts;
 }

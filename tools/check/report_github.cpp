@@ -40,7 +40,7 @@ std::string_view commandOf(Severity severity) {
 }
 
 std::string propertiesOf(const Finding& finding, const Report& report) {
-  const std::string file = " file=" + escaped(pathOf(finding, report.file), true);
+  std::string file = " file=" + escaped(pathOf(finding, report.file), true);
   if (finding.elsewhere) return file + ",line=" + std::to_string(finding.elsewhere->line);
   const auto position = positionOf(finding, report.file);
   if (!position) return file;

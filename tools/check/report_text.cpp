@@ -128,7 +128,7 @@ class TextReport {
   }
 
   static std::string whyIncomplete(const Explored& explored) {
-    const std::string rest =
+    std::string rest =
         " (the moves of " + counted(explored.frontier, "known place") + " were not made)";
     switch (explored.stop) {
       case Stop::places:

@@ -21,7 +21,7 @@ bool canBeName(const std::string& name) {
 std::string firstNameOf(const walkthrough::ControlPicture& control) {
   const auto& row = drivers::rowOf(control.view.kind);
   const std::string title = row.isButton ? control.view.title.string() : "";
-  const std::string name = slugOf(control.name.empty() ? title : control.name, longestName);
+  std::string name = slugOf(control.name.empty() ? title : control.name, longestName);
   if (canBeName(name)) return name;
   const std::string kind = slugOf(std::string(row.word), longestName);
   return name.empty() ? kind : kind + "-" + name;

@@ -274,7 +274,8 @@ class PairWalk {
     if (targets.before && targets.after && !isOver(targets)) {
       change.controls = differences({*targets.before, *targets.after});
     }
-    add(std::move(change), change.isStart ? Indices() : pairs_[way.parent].situations);
+    const auto from = change.isStart ? Indices() : pairs_[way.parent].situations;
+    add(std::move(change), from);
   }
 
   bool isOver(const Targets& targets) const {

@@ -11,8 +11,8 @@ std::string StepName::words() const {
 
 StepNames::StepNames(const comparison::Behavior& behavior) : behavior_(behavior) {}
 
-StepName StepNames::of(comparison::SituationIndex index) const {
-  const comparison::Situation& situation = behavior_.situations()[index];
+StepName StepNames::of(comparison::SituationIndex situationIndex) const {
+  const comparison::Situation& situation = behavior_.situations()[situationIndex];
   if (situation.isOver) return {"the end", ""};
   const std::string name = sourceName(situation.visit);
   if (!name.empty()) return {"the step " + quote(name), ""};

@@ -26,7 +26,7 @@ class StepNames {
  public:
   explicit StepNames(const comparison::Behavior& behavior);
 
-  StepName of(comparison::SituationIndex situation) const;
+  StepName of(comparison::SituationIndex situationIndex) const;
 
  private:
   std::string sourceName(std::uint32_t visit) const;

@@ -73,7 +73,7 @@ void Exploration::run(const ExplorationLimits& limits, unsigned threads, Explora
 // A round is short where places are large, so that it takes little memory and can be cancelled.
 std::size_t Exploration::roundSize() const {
   constexpr std::size_t roundBytes = std::size_t{1} << 20U;  // what near caches hold
-  const std::size_t buttons = static_cast<std::size_t>(
+  const auto buttons = static_cast<std::size_t>(
       std::count_if(setting_.kinds.begin(), setting_.kinds.end(), drivers::isButton));
   const std::size_t each = (buttons + 1) * (format_.size() + sizeof(Found));
   return std::clamp<std::size_t>(roundBytes / each, 1, Expansion::largestRound);
@@ -316,8 +316,7 @@ std::vector<std::size_t> Exploration::partsWithSeveralLooks(std::uint32_t place)
 
 void Exploration::makeAllMoves(unsigned threads, const See& see) {
   if (stop_ == Stop::time || stop_ == Stop::cancelled) return;
-  for (std::uint32_t number = 0; number < visits_.size(); ++number) {
-    const Visit& visit = visits_[number];
+  for (const Visit& visit : visits_) {
     if (visit.parent != noVisit) continue;
     for (const Arrival& start : starts_) {
       if (start.move == visit.move) {

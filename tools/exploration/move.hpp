@@ -15,7 +15,7 @@ namespace qz::tools::check {
 /// The walk-through starts with the list under a key.
 struct StartMove {
   std::string key;
-  friend bool operator==(const StartMove&, const StartMove&) = default;
+  friend auto operator<=>(const StartMove&, const StartMove&) = default;
 };
 
 /// The user presses a button.
@@ -23,13 +23,13 @@ struct PressMove {
   toolkit::Tag tag = 0;
   std::size_t control = 0;  ///< among the window's controls, back to front
   bool isShadowed = false;  ///< a control behind it has the same tag
-  friend bool operator==(const PressMove&, const PressMove&) = default;
+  friend auto operator<=>(const PressMove&, const PressMove&) = default;
 };
 
 /// Time passes until the first pending timer fires.
 struct WaitMove {
   double seconds = 0;
-  friend bool operator==(const WaitMove&, const WaitMove&) = default;
+  friend auto operator<=>(const WaitMove&, const WaitMove&) = default;
 };
 
 using Step = std::variant<StartMove, PressMove, WaitMove>;

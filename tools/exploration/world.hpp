@@ -75,15 +75,15 @@ class World final : private Surroundings {
   };
 
   // Surroundings:
-  void willTouch(const toolkit::Ref<toolkit::View>& control) override;
+  void willTouch(const toolkit::Ref<toolkit::View>& view) override;
   void tagWasSought(Tag tag) override;
-  void tagMayHaveChanged(const toolkit::Ref<toolkit::View>& control,
+  void tagMayHaveChanged(const toolkit::Ref<toolkit::View>& view,
                          std::uint32_t element) override;
   void tagsMayBeRestored() override;
-  void stateWasSet(const toolkit::Ref<toolkit::View>& control) override;
-  void lookMayHaveChanged(const toolkit::Ref<toolkit::View>& control) override;
+  void stateWasSet(const toolkit::Ref<toolkit::View>& view) override;
+  void lookMayHaveChanged(const toolkit::Ref<toolkit::View>& view) override;
   std::size_t controlsWithTag(Tag tag) override;
-  drivers::ViewKind kindOf(const toolkit::Ref<toolkit::View>& control) const override;
+  drivers::ViewKind kindOf(const toolkit::Ref<toolkit::View>& view) const override;
 
   void build(const std::optional<std::string>& startKey);
   void observe();

@@ -41,7 +41,7 @@ bool isPictureWord(const std::string& property) { return property == "picture"; 
 
 /// Returns how a source says which control of the window it is.
 std::string tagWords(const std::vector<steps::Control>& controls, ControlIndex control) {
-  const std::string tag = std::to_string(controls[control].tag);
+  std::string tag = std::to_string(controls[control].tag);
   const auto end = controls.begin() + static_cast<std::ptrdiff_t>(control);
   const auto behind = std::count_if(controls.begin(), end, [&](const steps::Control& each) {
     return each.tag == controls[control].tag;
@@ -62,7 +62,7 @@ std::string controlWords(const std::vector<std::pair<std::string, std::string>>&
 std::string blockEntry(const std::string& key,
                        const std::vector<std::pair<std::string, std::string>>& entries,
                        const std::string& indent) {
-  const std::string line = indent + key + ": " + flowTable(entries) + "\n";
+  std::string line = indent + key + ": " + flowTable(entries) + "\n";
   if (line.size() <= longestLine) return line;
   std::string block = indent + key + ":\n";
   for (const auto& [name, value] : entries) block += indent + "  " + name + ": " + value + "\n";

@@ -40,7 +40,7 @@ class Lifter {
         reason = failure;
       }
     }
-    throw *reason;
+    throw *reason;  // NOLINT(misc-throw-by-value-catch-by-reference): of an attempt before
   }
 
  private:

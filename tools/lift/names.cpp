@@ -89,7 +89,7 @@ class NameFinder {
       ++counts[textAt(step, control)];
     }
     counts.erase("");
-    const std::string own = controls_[control].caption.value_or("");
+    std::string own = controls_[control].caption.value_or("");
     if (counts.empty() || counts.contains(own)) return own;
     std::size_t all = 0;
     for (const auto& [title, count] : counts) all += count;

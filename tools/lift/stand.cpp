@@ -33,7 +33,7 @@ ValueRef<> standValue(const steps::Parameter& parameter) {
 ValueRef<> standCommand(const steps::Command& command, ControlIndex control) {
   std::vector<ValueRef<>> parts = {String::make(command.name)};
   for (const auto& parameter : command.parameters) parts.push_back(standValue(parameter));
-  parts.push_back(Number::withLong(standTag(control)));
+  parts.emplace_back(Number::withLong(standTag(control)));
   return Array::make(std::move(parts));
 }
 

@@ -75,7 +75,7 @@ class WayFinder {
   /// A press may lead back if something leads from there to here.
   void findCandidates() {
     std::map<std::pair<StepIndex, StepIndex>, std::set<ControlNumber>> leads;
-    constexpr ControlNumber wait = static_cast<ControlNumber>(-1);
+    constexpr auto wait = static_cast<ControlNumber>(-1);
     for (StepIndex i = 0; i < walk_.steps.size(); ++i) {
       for (ControlNumber c = 0; c < presses(i).size(); ++c) {
         if (isToStep(presses(i)[c])) leads[{i, presses(i)[c]->step}].insert(c);
@@ -205,12 +205,12 @@ class WayFinder {
       Step step = walk_.steps[from];
       for (ControlNumber c = 0; c < step.presses.size(); ++c) {
         auto& press = step.presses[c];
-        if (back_.contains({groups_[from], c}) && isToStep(press)) {
+        const bool isBack = isToStep(press) ? back_.contains({groups_[from], c})
+                                            : !press && isDisabledForWantOfAWay(from, c);
+        if (isBack) {
           press = Lead{Lead::Kind::back, 0};
         } else if (isToStep(press)) {
           press->step = numbers.at(groups_[press->step]);
-        } else if (!press && isDisabledForWantOfAWay(from, c)) {
-          press = Lead{Lead::Kind::back, 0};
         }
       }
       if (isToStep(step.wait)) step.wait.step = numbers.at(groups_[step.wait.step]);

@@ -81,6 +81,7 @@ std::string scalar(std::string_view text) {
 
 std::string flowTable(const std::vector<std::pair<std::string, std::string>>& entries) {
   std::vector<std::string> parts;
+  parts.reserve(entries.size());
   for (const auto& [key, value] : entries) parts.push_back(key + ": " + value);
   return "{" + joined(parts) + "}";
 }

@@ -25,6 +25,7 @@ StepIndex stepNamed(const Source& source, const std::string& name) {
 /// Returns the steps to start at. The first step is always one, so that the same steps are reached.
 std::vector<StepIndex> startsOf(const Source& source, const std::vector<std::string>& names) {
   std::vector<StepIndex> starts;
+  starts.reserve(names.size() + 1);
   for (const std::string& name : names) starts.push_back(stepNamed(source, name));
   if (std::find(starts.begin(), starts.end(), StepIndex{0}) == starts.end()) starts.push_back(0);
   return starts;

@@ -45,7 +45,7 @@ ValueRef<> ScriptWriter::make(const TaggedCommand& element) {
   } else {
     std::vector<ValueRef<>> parts = {String::make(command.name)};
     for (const auto& parameter : command.parameters) parts.push_back(valueOf(parameter));
-    if (tag) parts.push_back(Number::withLong(*tag));
+    if (tag) parts.emplace_back(Number::withLong(*tag));
     for (const auto& part : parts) offsets_.emplace_back(&*part, command.place);
     value = Array::make(std::move(parts));
   }

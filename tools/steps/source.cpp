@@ -212,6 +212,7 @@ class SourceReader {
     const auto found = bodies.find(name);
     if (found == bodies.end()) {
       std::vector<std::string_view> names;
+      names.reserve(bodies.size());
       for (const auto& [known, body] : bodies) names.push_back(known);
       mistakes_.add(at.place, "no step is called " + foundWords(at) + didYouMean(name, names));
       return;

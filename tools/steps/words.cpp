@@ -11,8 +11,8 @@
 namespace qz::tools::steps {
 namespace {
 
-void expect(const Node& node, std::string_view what, Mistakes& mistakes) {
-  mistakes.add(node.place, "expected " + std::string(what) + ", found " + foundWords(node));
+void expect(const Node& node, std::string_view expected, Mistakes& mistakes) {
+  mistakes.add(node.place, "expected " + std::string(expected) + ", found " + foundWords(node));
 }
 
 }  // namespace
@@ -31,10 +31,10 @@ std::string foundWords(const Node& node) {
   return "nothing";
 }
 
-std::vector<std::pair<NodeRef, NodeRef>> entriesOf(const Node& node, std::string_view what,
+std::vector<std::pair<NodeRef, NodeRef>> entriesOf(const Node& node, std::string_view expected,
                                                    Mistakes& mistakes) {
   if (node.kind != Node::Kind::table) {
-    expect(node, what, mistakes);
+    expect(node, expected, mistakes);
     return {};
   }
   std::vector<std::pair<NodeRef, NodeRef>> entries;
@@ -52,9 +52,9 @@ std::vector<std::pair<NodeRef, NodeRef>> entriesOf(const Node& node, std::string
   return entries;
 }
 
-std::optional<std::string> textOf(const Node& node, std::string_view what, Mistakes& mistakes) {
+std::optional<std::string> textOf(const Node& node, std::string_view expected, Mistakes& mistakes) {
   if (node.kind == Node::Kind::scalar) return node.text;
-  expect(node, what, mistakes);
+  expect(node, expected, mistakes);
   return std::nullopt;
 }
 
@@ -65,12 +65,12 @@ std::optional<bool> flagOf(const Node& node, Mistakes& mistakes) {
   return std::nullopt;
 }
 
-std::optional<int> numberOf(const Node& node, int least, int most, std::string_view what,
+std::optional<int> numberOf(const Node& node, int least, int most, std::string_view expected,
                             Mistakes& mistakes) {
   const auto number = walkthrough::parseNumber<int>(node.text);
   if (number && *number >= least && *number <= most) return number;
   expect(node,
-         std::string(what) + " (a whole number from " + std::to_string(least) + " to " +
+         std::string(expected) + " (a whole number from " + std::to_string(least) + " to " +
              std::to_string(most) + ")",
          mistakes);
   return std::nullopt;

@@ -69,13 +69,13 @@ class StepFinder {
 
   /// A list that leads to no step of the source leaves the walk-through where it was.
   std::string groupOf(const Visit& visit, const std::vector<BoardStep>& known) const {
-    const std::string key = visit.lastList == check::noList
+    std::string key = visit.lastList == check::noList
                                 ? exploration_.startKeys()[0]
                                 : exploration_.setting().script.lists()[visit.lastList].key;
     const auto& names = exploration_.setting().plan.names;
     if (names.isEmpty()) return key;
     if (isOver(visit.place)) return "the end";
-    const std::string name = names.stepOf(key);
+    std::string name = names.stepOf(key);
     if (!name.empty() || visit.parent == check::noVisit) return name;
     const Visit& parent = exploration_.visits()[visit.parent];
     return known[*find(parent.place, parent.look, parent.lastList)].group;

@@ -17,7 +17,7 @@ namespace qz::toolkit {
 
 /// The formats, in the order in which they are tried.
 enum class Format : std::uint8_t {
-#define QZ_FORMAT(name, value) name = value,
+#define QZ_FORMAT(name, value) name = (value),
 #include "qz/property_list/formats.inc"
 #undef QZ_FORMAT
 };
