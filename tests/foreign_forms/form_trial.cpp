@@ -287,7 +287,8 @@ void Trial::checkTrace(bool withPresses) {
   Snapshot after = hosts::pictureOfAll(*form_);
   for (const QString& name : hosts::differences(before_, after)) {
     if (isQtsOwn(name) || (withPresses && followsChoices(name))) continue;
-    QString was, is;
+    QString was;
+    QString is;
     QDebug(&was) << before_[name];
     QDebug(&is) << after[name];
     mistake(name.toStdString() + " was " + was.toStdString() + ", is " + is.toStdString());

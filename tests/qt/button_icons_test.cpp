@@ -32,7 +32,7 @@ bool isBluish(const QColor& color) {
 QIcon blueIcon() {
   QPixmap picture(16, 16);
   picture.fill(Qt::blue);
-  return QIcon(picture);
+  return {picture};
 }
 
 AttributedString inRed(const std::string& title) {

@@ -134,8 +134,7 @@ TEST_F(EmbeddingPage, TellsTheHost) {
   telling.press("906");
   settle();
   EXPECT_EQ(telling.told,
-            QStringList({"The walk-through none.plist is not played: the file does "
-                         "not exist",
+            QStringList({"The walk-through none.plist is not played: the file does not exist",
                          "the tour begins", "0", "2001", "906", "the user knows it all"}));
   ASSERT_TRUE(telling.begin());
   telling.tour.end();

@@ -56,7 +56,8 @@ TEST(FormFiles, AreTheWindowThatTheirProgramShows) {
   EXPECT_EQ(window.title, "Orders");
   EXPECT_EQ(window.content.width, 400);
   ASSERT_EQ(window.controls.size(), 2U);
-  const HostControl &button = window.controls[0], &edit = window.controls[1];
+  const HostControl& button = window.controls[0];
+  const HostControl& edit = window.controls[1];
   EXPECT_EQ(button.kind, ViewKind::button);
   EXPECT_EQ(button.tag, 2);
   EXPECT_EQ(button.caption, "Send");

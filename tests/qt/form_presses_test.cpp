@@ -243,7 +243,9 @@ TEST_F(FormPresses, OfAGroupReachItsHostOnlyOutsideTheWalkThrough) {
   }
   const auto order = group.buttons();
   std::vector<std::string> emitted;
-  const auto note = [&](const char* name) { return [&emitted, name] { emitted.push_back(name); }; };
+  const auto note = [&](const char* name) {
+    return [&emitted, name] { emitted.emplace_back(name); };
+  };
   QObject::connect(&group, &QButtonGroup::buttonClicked, note("clicked"));
   QObject::connect(&group, &QButtonGroup::idClicked, note("id clicked"));
   QObject::connect(&group, &QButtonGroup::idReleased, note("id released"));

@@ -85,13 +85,13 @@ void expectHangingLines(QWidget& widget, int edge, const char* words) {
   if (words == hebrew) picture = picture.mirrored(true, false);
   const auto lines = linesIn(picture);
   ASSERT_EQ(lines.size(), 4U);
-  for (const int level : {0, 1}) {
-    const int begin = edge + 36 * level;
-    const DrawnLine& first = lines[static_cast<std::size_t>(2 * level)];
+  for (const std::size_t level : {0U, 1U}) {
+    const int begin = edge + 36 * static_cast<int>(level);
+    const DrawnLine& first = lines[2 * level];
     EXPECT_GE(first.left, begin + 10) << "the marker of level " << level;
     EXPECT_LT(first.left, begin + 30);
     EXPECT_NEAR(first.behindGap, begin + 36, 3) << "the text of level " << level;
-    EXPECT_NEAR(lines[static_cast<std::size_t>(2 * level + 1)].left, begin + 36, 3) << "wrapped";
+    EXPECT_NEAR(lines[2 * level + 1].left, begin + 36, 3) << "wrapped";
   }
 }
 

@@ -161,7 +161,8 @@ TEST_F(NoTrace, OfAWalkThroughIsLeftInAnyProperty) {
   showEveryPage();
   Snapshot after = pictureOfAll(*form);
   for (const QString& name : hosts::differences(before, after)) {
-    QString was, is;
+    QString was;
+    QString is;
     QDebug(&was) << before[name];
     QDebug(&is) << after[name];
     ADD_FAILURE() << name.toStdString() << " was " << was.toStdString() << ", is "

@@ -41,7 +41,7 @@ struct ScriptSources : testing::Test {
   /// Plays the script; returns what it has shown on the button, or the last line of the log.
   std::string played(const ScriptSource& script) {
     if (!walkThrough.play(script, window)) return logged;
-    const std::string title = button.text().toStdString();
+    std::string title = button.text().toStdString();
     walkThrough.end();
     return title;
   }

@@ -64,7 +64,7 @@ struct Host : testing::Test {
 
   /// Makes the button send "go:" to the performer.
   toolkit::Ref<toolkit::Button> adopt(QAbstractButton& widget) {
-    const auto button = toolkit::asButton(toolkit.application().view(widget));
+    auto button = toolkit::asButton(toolkit.application().view(widget));
     button->setTarget(performer);
     button->setAction("go:");
     return button;

@@ -28,9 +28,7 @@ constexpr int lastButton = 9;  // its tag
 constexpr const char* randomCommands[] = {
     "(SET_TITLE_FOR_OBJECT_ID, \"A & longer title than it was\", %1)",
     "(SET_TEXT_FOR_OBJECT_ID, \"Another text\", %1)",
-    "(SET_ATTRIBUTED_STRING_AS_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID, \"<b>Bold</b>\", "
-    "Times, "
-    "30, %1)",
+    R"((SET_ATTRIBUTED_STRING_AS_HTML_WITH_FONT_NAME_WITH_SIZE_FOR_OBJECT_ID, "<b>Bold</b>", Times, 30, %1))",
     "(SET_FOREGROUND_COLOR_FOR_OBJECT_ID, red, %1)",
     "(SET_BACKGROUND_COLOR_FOR_OBJECT_ID, 1, %1)",
     "(SET_STATE_ON_FOR_OBJECT_ID, %1)",

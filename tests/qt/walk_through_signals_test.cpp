@@ -191,18 +191,18 @@ TEST_F(ToldHost, TakesUpPressesWithoutAListAndListsOfTimers) {
       "{ 0 = ((SET_TIMER_FOR_ID, 60, 8)); 8 = ((SET_TEXT_FOR_OBJECT_ID, Late, 6)); }";
   ASSERT_TRUE(walkThrough->play(script, *form));
   const auto timers = [this] { return walkThrough->engine()->objectIdTimers()->count(); };
-  EXPECT_EQ(timers(), 1u);
+  EXPECT_EQ(timers(), 1U);
   box->click();
-  EXPECT_EQ(timers(), 0u) << "every press cancels the timers";
+  EXPECT_EQ(timers(), 0U) << "every press cancels the timers";
   ASSERT_TRUE(walkThrough->resume(walkThrough->state(), *form));
-  EXPECT_EQ(timers(), 0u);
+  EXPECT_EQ(timers(), 0U);
   EXPECT_EQ(walkThrough->state()["steps"].toStringList(), (QStringList{"list 0", "press 5 on"}));
   ASSERT_TRUE(walkThrough->play(script, *form));
   QVariantMap state = walkThrough->state();
   state["steps"] = QStringList{"list 0", "list 8"};
   ASSERT_TRUE(walkThrough->resume(state, *form));
   EXPECT_EQ(field->text(), "Late");
-  EXPECT_EQ(timers(), 0u);
+  EXPECT_EQ(timers(), 0U);
 }
 
 TEST_F(ToldHost, RefusesStatesThatItCannotTakeUp) {

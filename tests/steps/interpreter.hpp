@@ -73,7 +73,7 @@ class Interpreter {
 
  private:
   bool leadsNowhere(const State& state, const std::string& target) const;
-  State go(State state, const std::string& target) const;
+  State go(State state, const std::string& said) const;
   State enter(State state, const std::string& step) const;
   Words said(const Part& part, std::size_t control) const;
   Words wordsOf(const std::string& step, std::size_t control) const;

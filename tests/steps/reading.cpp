@@ -18,7 +18,7 @@ bool take(std::string_view& rest, std::string_view start) {
 
 /// Takes the text up to `end`, and that too.
 std::string takeUpTo(std::string_view& rest, std::string_view end) {
-  const std::string taken(rest.substr(0, rest.find(end)));
+  std::string taken(rest.substr(0, rest.find(end)));
   rest.remove_prefix(taken.size() + end.size());
   return taken;
 }

@@ -24,9 +24,9 @@ using Reading = std::vector<Span>;  ///< no two neighbours look the same; none i
 void append(Reading& reading, const Span& span);
 
 /// Reads the Markdown of one paragraph: emphasis, strong emphasis, links, escaped characters.
-Reading readMarkdown(std::string_view written);
+Reading readMarkdown(std::string_view rest);
 
 /// Reads HTML with the tags b, i and a, and the references that begin with &amp; &lt; or &eacute;
-Reading readHtml(std::string_view written);
+Reading readHtml(std::string_view rest);
 
 }  // namespace qz::meaning

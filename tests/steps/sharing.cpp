@@ -26,7 +26,8 @@ void orElseEach(Said& said, Said& otherwise) {
 void fillIn(std::string& text, const Arguments& arguments) {
   for (const auto& [name, value] : arguments) {
     const std::string parameter = "{" + name + "}";
-    for (std::size_t at = 0; (at = text.find(parameter, at)) != text.npos; at += value.size()) {
+    for (std::size_t at = 0; (at = text.find(parameter, at)) != std::string::npos;
+         at += value.size()) {
       text.replace(at, parameter.size(), value);
     }
   }

@@ -3,6 +3,7 @@
 #include "tests/steps/smaller_tours.hpp"
 
 #include <functional>
+#include <utility>
 
 namespace qz::meaning {
 
@@ -12,7 +13,7 @@ using PartOf = std::function<Part&(Tour&)>;
 
 class Smaller {
  public:
-  explicit Smaller(const Tour& tour) : tour_(tour) {}
+  explicit Smaller(Tour tour) : tour_(std::move(tour)) {}
 
   std::vector<Tour> all() {
     for (std::size_t i = 1; i < tour_.steps.size(); ++i)

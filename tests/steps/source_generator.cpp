@@ -198,7 +198,9 @@ void Maker::addFragments() {
 
 /// Whether the part has the parameter.
 bool takes(const Part& part, const std::string& parameter) {
-  const auto has = [&](const std::string& text) { return text.find(parameter) != text.npos; };
+  const auto has = [&](const std::string& text) {
+    return text.find(parameter) != std::string::npos;
+  };
   return (part.wait && has(part.wait->go)) ||
          std::any_of(part.controls.begin(), part.controls.end(),
                      [&](const auto& said) {

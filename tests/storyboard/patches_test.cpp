@@ -12,7 +12,8 @@ using drivers::Pixels;
 /// Returns a picture of one colour.
 Pixels plainPicture(int width, int height, std::uint32_t color) {
   return {width, height,
-          std::vector<std::uint32_t>(static_cast<std::size_t>(width) * static_cast<std::size_t>(height), color)};
+          std::vector<std::uint32_t>(
+              static_cast<std::size_t>(width) * static_cast<std::size_t>(height), color)};
 }
 
 void setPixel(Pixels& picture, int x, int y, std::uint32_t color) {

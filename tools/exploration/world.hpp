@@ -77,8 +77,7 @@ class World final : private Surroundings {
   // Surroundings:
   void willTouch(const toolkit::Ref<toolkit::View>& view) override;
   void tagWasSought(Tag tag) override;
-  void tagMayHaveChanged(const toolkit::Ref<toolkit::View>& view,
-                         std::uint32_t element) override;
+  void tagMayHaveChanged(const toolkit::Ref<toolkit::View>& view, std::uint32_t element) override;
   void tagsMayBeRestored() override;
   void stateWasSet(const toolkit::Ref<toolkit::View>& view) override;
   void lookMayHaveChanged(const toolkit::Ref<toolkit::View>& view) override;

@@ -70,8 +70,8 @@ class StepFinder {
   /// A list that leads to no step of the source leaves the walk-through where it was.
   std::string groupOf(const Visit& visit, const std::vector<BoardStep>& known) const {
     std::string key = visit.lastList == check::noList
-                                ? exploration_.startKeys()[0]
-                                : exploration_.setting().script.lists()[visit.lastList].key;
+                          ? exploration_.startKeys()[0]
+                          : exploration_.setting().script.lists()[visit.lastList].key;
     const auto& names = exploration_.setting().plan.names;
     if (names.isEmpty()) return key;
     if (isOver(visit.place)) return "the end";
