@@ -290,7 +290,7 @@ TEST_F(Expectations, AreNamedAsTheFileHasThem) {
 
 TEST_F(Expectations, AFileThatCannotBeReadIsRefused) {
   CheckOptions options;
-  options.expectations = "none.expect";
+  options.expectations = std::string("none.expect");
   try {
     checkFolder("", options);
     FAIL() << "accepted";
