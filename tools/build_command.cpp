@@ -57,13 +57,17 @@ void judgeTexts(const steps::Source& source, const std::string& language) {
                         "toolkit that measures them, such as Qt"}));
 }
 
+void requireSource(const std::string& path) {
+  if (steps::isSourcePath(path)) return;
+  throw Failure(ExitStatus::badInput,
+                path +
+                    ": expected a walk-through in steps, a file whose name ends with .yaml or "
+                    ".yml");
+}
+
 /// Builds the script of the options, writes it, and returns it.
 steps::ScriptFile buildSource(const BuildOptions& options) {
-  if (!steps::isSourcePath(options.source)) {
-    throw Failure(ExitStatus::badInput, options.source +
-                                            ": expected a walk-through in steps, a file "
-                                            "whose name ends with .yaml or .yml");
-  }
+  requireSource(options.source);
   steps::ScriptFile script = steps::openScript(options.source, {}, translateOf(options));
   const std::string output = outputOf(options);
   const auto& format = toolkit::formatRow(formatBySuffix(output));
@@ -136,13 +140,12 @@ void describeBuild(Command& command) {
   command.flag("--watch", options->watch,
                "Build again whenever a file that the script depends on has changed, until "
                "interrupted");
-  command.action([options] {
+  command.task([options] {
     if (options->watch) {
       watch(*options);
     } else {
       buildSource(*options);
     }
-    return static_cast<int>(ExitStatus::fine);
   });
 }
 

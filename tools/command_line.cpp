@@ -68,19 +68,20 @@ std::string missingValue(std::string words) {
   return words.replace(at, required.size(), ": expected ");
 }
 
+/// Says what is wrong with the arguments of a command.
+std::string wrongArguments(const CLI::ParseError& error, const CLI::App& command) {
+  // An argument that is not understood comes first: it may cause the other errors.
+  if (command.remaining_size(true) > 0) return unexpectedArgument(command);
+  if (!dynamic_cast<const CLI::ArgumentMismatch*>(&error)) return error.what();
+  return givenTwice(flagWithValue(missingValue(error.what())));
+}
+
 /// Says what is wrong with the command line, in one line.
 std::string explain(const CLI::ParseError& error, const CLI::App& app) {
   const CLI::App& command = chosen(app);
-  std::string words = error.what();
-  if (&command == &app) {
-    words = commandExpected(app);
-  } else if (command.remaining_size(true) > 0) {
-    // An argument that is not understood comes first: it may cause the other errors.
-    words = unexpectedArgument(command);
-  } else if (dynamic_cast<const CLI::ArgumentMismatch*>(&error)) {
-    words = givenTwice(flagWithValue(missingValue(std::move(words))));
-  }
-  const std::string help = &command == &app ? "" : command.get_name() + " ";
+  const bool isCommand = &command != &app;
+  const std::string words = isCommand ? wrongArguments(error, command) : commandExpected(app);
+  const std::string help = isCommand ? command.get_name() + " " : "";
   return words + "; see " + app.get_name() + " " + help + "--help";
 }
 
@@ -223,6 +224,13 @@ Command::Option Command::repeatedList(const std::string& name, Take take, const 
 
 void Command::action(std::function<int()> run) {
   app_.callback([run = std::move(run), &status = status_] { status = translating(run); });
+}
+
+void Command::task(std::function<void()> run) {
+  action([run = std::move(run)] {
+    run();
+    return static_cast<int>(ExitStatus::fine);
+  });
 }
 
 namespace {

@@ -94,6 +94,8 @@ class Command {
   /// Sets what runs once the line is read; `run` returns the exit status, or throws a Failure or a
   /// UsageError.
   void action(std::function<int()> run);
+  /// The same for a command whose exit status is always 0: it does its work or throws.
+  void task(std::function<void()> run);
 
  private:
   CLI::App& app_;

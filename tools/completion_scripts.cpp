@@ -210,6 +210,11 @@ std::string fishArguments(const ValueHint& value) {
   return value.isFile ? " -F" : "";
 }
 
+std::string fishOption(const OptionOutline& option) {
+  return " -l " + option.name.substr(2) + (option.takesValue ? fishValue(option.value) : "") +
+         " -d " + fishQuoted(option.help) + "\n";
+}
+
 std::string fish(const std::vector<CommandOutline>& commands) {
   const std::string complete = "complete -c qz-walkthrough";
   std::string script = replaced(std::string(fishStart), "@files@", joined(fileOptions(commands)));
@@ -217,11 +222,7 @@ std::string fish(const std::vector<CommandOutline>& commands) {
     const std::string here = complete + " -n '__fish_seen_subcommand_from " + command.name + "'";
     script += complete + " -n __fish_use_subcommand -a " + command.name + " -d " +
               fishQuoted(command.summary) + "\n" + here + fishArguments(command.arguments) + "\n";
-    for (const OptionOutline& option : command.options) {
-      script += here + " -l " + option.name.substr(2) +
-                (option.takesValue ? fishValue(option.value) : "") + " -d " +
-                fishQuoted(option.help) + "\n";
-    }
+    for (const OptionOutline& option : command.options) script += here + fishOption(option);
   }
   return script;
 }

@@ -86,10 +86,7 @@ void describeConvert(Command& command) {
           writableList() + "; without it, " + suffixRules())
       .valueName("FORMAT")
       .choices(writableNames());
-  command.action([options] {
-    convert(*options);
-    return static_cast<int>(ExitStatus::fine);
-  });
+  command.task([options] { convert(*options); });
 }
 
 }  // namespace

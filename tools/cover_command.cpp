@@ -95,6 +95,12 @@ cover::Coverage coverageOf(const CoverOptions& options) {
   return cover::coverScript(script.file, own, options.directory, hooks);
 }
 
+void sayCounts(const cover::Coverage& coverage) {
+  std::cout << coverage.files.size() << " scenarios: " << coverage.steps << " steps, "
+            << coverage.moves << " moves between them"
+            << (coverage.isComplete ? "" : "; not everything was explored") << '\n';
+}
+
 int runCover(const CoverOptions& options) {
   makeDirectory(options.directory);
   const auto coverage = coverageOf(options);
@@ -102,9 +108,7 @@ int runCover(const CoverOptions& options) {
   const bool isDifferent = sayDifferences(before, coverage.files);
   const bool isStale = isDifferent && !before.empty() && !options.update;
   if (!isStale) write(options.directory, before, coverage.files);
-  std::cout << coverage.files.size() << " scenarios: " << coverage.steps << " steps, "
-            << coverage.moves << " moves between them"
-            << (coverage.isComplete ? "" : "; not everything was explored") << '\n';
+  sayCounts(coverage);
   if (!isStale) return static_cast<int>(ExitStatus::fine);
   std::cerr << "qz-walkthrough: the scenarios in " << options.directory
             << " do not fit the script; --update rewrites them\n";

@@ -41,10 +41,7 @@ void describeDump(Command& command) {
   command.flag("--canonical", options->canonical,
                "Print one line of ASCII that is the same for equal values");
   command.flag("--dictionary", options->dictionary, "Fail unless the root is a dictionary");
-  command.action([options] {
-    dump(*options);
-    return static_cast<int>(ExitStatus::fine);
-  });
+  command.task([options] { dump(*options); });
 }
 
 }  // namespace

@@ -39,14 +39,13 @@ void describeKeys(Command& command) {
   const auto path = std::make_shared<std::string>();
   command.argument("SCRIPT", *path, "The script, a property list; or its source, a YAML file")
       .file();
-  command.action([path] {
+  command.task([path] {
     const steps::ScriptFile script = steps::openScript(*path);
     if (script.from) {
       printSteps(script.from->source);
     } else {
       printKeys(script.file);
     }
-    return static_cast<int>(ExitStatus::fine);
   });
 }
 

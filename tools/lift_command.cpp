@@ -117,10 +117,7 @@ void describeLift(Command& command) {
           "Give up a script of more places (default: 1000000)")
       .valueName("PLACES");
   options->lift.threads = std::max(1U, std::thread::hardware_concurrency());
-  command.action([options] {
-    liftToFile(*options);
-    return static_cast<int>(ExitStatus::fine);
-  });
+  command.task([options] { liftToFile(*options); });
 }
 
 }  // namespace

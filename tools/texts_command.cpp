@@ -84,12 +84,11 @@ void describeTexts(Command& command) {
               "Write a picture of every step to this directory, and name it at the step's texts")
       .valueName("DIR")
       .directory();
-  command.action([options] {
+  command.task([options] {
     if (options->action != "extract") {
       throw UsageError("expected the action “extract”, found " + quote(options->action));
     }
     extract(*options);
-    return static_cast<int>(ExitStatus::fine);
   });
 }
 

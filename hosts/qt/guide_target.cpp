@@ -65,13 +65,17 @@ QRect visiblePartOf(const QWidget& widget) {
   return part;
 }
 
-void Follower::follow(QWidget* widget) {
+void Follower::leaveAll() {
   for (const auto& watched : watched_) {
     if (!watched) continue;
     watched->removeEventFilter(this);
     watched->disconnect(this);
   }
   watched_.clear();
+}
+
+void Follower::follow(QWidget* widget) {
+  leaveAll();
   widget_ = widget;
   for (; widget; widget = widget->isWindow() ? nullptr : widget->parentWidget()) {
     widget->installEventFilter(this);

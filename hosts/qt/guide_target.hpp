@@ -43,6 +43,8 @@ class Follower final : public QObject {
   bool eventFilter(QObject* receiver, QEvent* event) override;
 
  private:
+  void leaveAll();
+
   const std::function<void()> moved_;
   QPointer<QWidget> widget_;
   std::vector<QPointer<QWidget>> watched_;

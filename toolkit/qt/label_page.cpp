@@ -19,15 +19,18 @@ struct FrameDrawer : QFrame {
   using QFrame::drawFrame;
 };
 
+/// Returns the indent of a label's text; if the label sets none, a frame indents by half a letter.
+int indentOf(const QLabel& label) {
+  if (label.indent() >= 0 || label.frameWidth() <= 0) return label.indent();
+  return label.fontMetrics().horizontalAdvance(u'x') / 2 - label.margin();
+}
+
 /// Returns the area of a label's text: inside the margin, and indented from the edge at which the
 /// text is aligned.
 QRect textAreaOf(const QLabel& label) {
   const int margin = label.margin();
   QRect area = label.contentsRect().adjusted(margin, margin, -margin, -margin);
-  int indent = label.indent();
-  if (indent < 0 && label.frameWidth() > 0) {
-    indent = label.fontMetrics().horizontalAdvance(u'x') / 2 - margin;
-  }
+  const int indent = indentOf(label);
   if (indent <= 0) return area;
   const auto edges = QStyle::visualAlignment(Qt::LayoutDirectionAuto, label.alignment());
   if (edges & Qt::AlignLeft) area.setLeft(area.left() + indent);

@@ -20,14 +20,18 @@ namespace {
 
 using namespace Qt::StringLiterals;
 
+/// Returns how HTML writes a character; empty if as it is.
+QLatin1String entityFor(QChar character) {
+  if (character == u'&') return "&amp;"_L1;
+  if (character == u'<') return "&lt;"_L1;
+  if (character == u'>') return "&gt;"_L1;
+  return character == u'"' ? "&quot;"_L1 : QLatin1String();
+}
+
 void writeEscaped(QString& html, QStringView text) {
   qsizetype written = 0;
   for (qsizetype i = 0; i < text.size(); ++i) {
-    QLatin1String entity;
-    if (text[i] == u'&') entity = "&amp;"_L1;
-    if (text[i] == u'<') entity = "&lt;"_L1;
-    if (text[i] == u'>') entity = "&gt;"_L1;
-    if (text[i] == u'"') entity = "&quot;"_L1;
+    const QLatin1String entity = entityFor(text[i]);
     if (entity.isEmpty()) continue;
     html += text.sliced(written, i - written);
     html += entity;

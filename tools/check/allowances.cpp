@@ -21,6 +21,11 @@ bool matches(const Allowance& allowance, const Finding& finding) {
   return finding.tag && std::to_string(*finding.tag) == *allowance.key;
 }
 
+bool isNeeded(const Allowance& allowance, const std::vector<Finding>& findings) {
+  return std::any_of(findings.begin(), findings.end(),
+                     [&](const Finding& each) { return matches(allowance, each); });
+}
+
 std::string wordsOf(const Allowance& allowance) {
   return allowance.code + (allowance.key ? "=" + *allowance.key : "");
 }
@@ -65,10 +70,7 @@ std::vector<Finding> unneededAllowances(const std::vector<Finding>& findings,
                                         const std::vector<Allowance>& allowances) {
   std::vector<Finding> unneeded;
   for (const Allowance& allowance : allowances) {
-    const bool isNeeded = std::any_of(findings.begin(), findings.end(), [&](const Finding& each) {
-      return matches(allowance, each);
-    });
-    if (isNeeded || !allowance.place) continue;
+    if (isNeeded(allowance, findings) || !allowance.place) continue;
     unneeded.push_back(findingOf("unneeded-allowance",
                                  "the allowance " + wordsOf(allowance) + " takes nothing back",
                                  "delete the line"));

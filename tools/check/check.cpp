@@ -72,19 +72,20 @@ void requireTags(const std::vector<Expectation>& expectations, const Setting& se
   }
 }
 
+void watchLists(const Condition& condition, Setting& setting) {
+  if (condition.kind != Condition::Kind::listRan) return;
+  setting.watchedLists.resize(setting.script.lists().size());
+  for (const std::string& key : condition.keys) {
+    setting.watchedLists[*setting.script.listUnder(key)] = true;
+  }
+}
+
 /// Lets the exploration keep what the expectations need.
 void watchFor(const std::vector<Expectation>& expectations, Setting& setting) {
   setting.wholeLooks = compareLooks(expectations);
-  const auto watch = [&](const Condition& condition) {
-    if (condition.kind != Condition::Kind::listRan) return;
-    setting.watchedLists.resize(setting.script.lists().size());
-    for (const std::string& key : condition.keys) {
-      setting.watchedLists[*setting.script.listUnder(key)] = true;
-    }
-  };
   for (const Expectation& expectation : expectations) {
-    watch(expectation.condition);
-    if (expectation.consequence) watch(*expectation.consequence);
+    watchLists(expectation.condition, setting);
+    if (expectation.consequence) watchLists(*expectation.consequence, setting);
   }
 }
 

@@ -220,13 +220,15 @@ class Conclusions {
     if (format.isOver(bytes)) return presses;
     for (std::size_t i = 0; i < format.controls(); ++i) {
       const ControlState state = format.control(bytes, i);
-      const bool isSeen = !state.hidden && state.enabled;
-      if (isSeen && drivers::isButton(exploration_.setting().kinds[i]) &&
-          !script_.listOfTag(state.tag)) {
-        presses.push_back({.tag = state.tag, .control = i});
-      }
+      const bool isPressable = !state.hidden && state.enabled && isButton(i);
+      if (!isPressable || script_.listOfTag(state.tag)) continue;
+      presses.push_back({.tag = state.tag, .control = i});
     }
     return presses;
+  }
+
+  bool isButton(std::size_t control) const {
+    return drivers::isButton(exploration_.setting().kinds[control]);
   }
 
   bool wasRead(Subject subject) const {

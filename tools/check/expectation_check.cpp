@@ -11,6 +11,12 @@ namespace {
 using Kind = Condition::Kind;
 using Rule = Expectation::Rule;
 
+Finding failureAfter(Path path, std::string message) {
+  Finding finding = findingOf("expectation", std::move(message));
+  finding.path = std::move(path);
+  return finding;
+}
+
 }  // namespace
 
 ExpectationCheck::ExpectationCheck(const Exploration& exploration,
@@ -136,9 +142,7 @@ std::optional<Finding> ExpectationCheck::judge(const Expectation& expectation, E
   const bool isWish = expectation.rule == Rule::canReach || expectation.rule == Rule::within;
   if (expectation.rule == Rule::alwaysCanReach) return judgeAlways(expectation, evidence);
   if (!isWish && evidence.first) {
-    Finding finding = findingOf("expectation", failed + " after this path");
-    finding.path = exploration_.path(*evidence.first);
-    return finding;
+    return failureAfter(exploration_.path(*evidence.first), failed + " after this path");
   }
   if (isWish && evidence.first &&
       (expectation.rule == Rule::canReach || evidence.depth <= expectation.moves)) {
@@ -155,11 +159,9 @@ std::optional<Finding> ExpectationCheck::judge(const Expectation& expectation, E
                      failed + ": it never happens in all the places that can be reached (" +
                          std::to_string(exploration_.places()) + ")");
   }
-  Finding finding = findingOf("expectation", failed + ": the shortest path needs " +
-                                                 std::to_string(evidence.depth) +
-                                                 (evidence.depth == 1 ? " move" : " moves"));
-  finding.path = exploration_.path(*evidence.first);
-  return finding;
+  return failureAfter(exploration_.path(*evidence.first),
+                      failed + ": the shortest path needs " + std::to_string(evidence.depth) +
+                          (evidence.depth == 1 ? " move" : " moves"));
 }
 
 std::optional<Finding> ExpectationCheck::judgeAlways(const Expectation& expectation,
@@ -170,11 +172,9 @@ std::optional<Finding> ExpectationCheck::judgeAlways(const Expectation& expectat
   }
   const auto stuck = placeWithoutWay(std::move(evidence.leadsThere));
   if (!stuck) return std::nullopt;
-  Finding finding =
-      findingOf("expectation", quote(expectation.words) +
-                                   " does not hold: after this path no way leads there any more");
-  finding.path = exploration_.path(exploration_.firstVisit(*stuck));
-  return finding;
+  return failureAfter(
+      exploration_.path(exploration_.firstVisit(*stuck)),
+      quote(expectation.words) + " does not hold: after this path no way leads there any more");
 }
 
 /// Returns the first place before the end from which no way leads to the marked places.

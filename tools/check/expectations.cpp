@@ -106,7 +106,7 @@ class Parser {
 
   /// Returns the keys of the lists that lead to the step.
   std::vector<std::string> keysOfStep() {
-    const std::string word = next_ < line_.words.size() ? line_.words[next_] : "";
+    const std::string word = nextWord();
     std::vector<std::string> keys;
     std::vector<std::string_view> steps;
     for (const auto& [key, step] : names_.steps) {
@@ -120,9 +120,8 @@ class Parser {
 
   /// Takes the name that a source gives to a control, or its tag.
   void takeControl(Condition& condition) {
-    const std::string word = next_ < line_.words.size() ? line_.words[next_] : "";
-    std::vector<std::string_view> known;
-    for (const auto& [tag, name] : names_.controls) known.push_back(name);
+    const std::string word = nextWord();
+    const auto known = controlNames();
     if (std::find(known.begin(), known.end(), word) != known.end()) {
       condition.name = takeWord("the name of a control");
     } else if (const auto tag = walkthrough::parseNumber<Tag>(word)) {
@@ -132,6 +131,12 @@ class Parser {
       wrong(known.empty() ? "the tag of a control" : "the name of a control",
             didYouMean(word, known));
     }
+  }
+
+  std::vector<std::string_view> controlNames() const {
+    std::vector<std::string_view> names;
+    for (const auto& [tag, name] : names_.controls) names.push_back(name);
+    return names;
   }
 
   const KindRow* takeKind() {
@@ -157,6 +162,9 @@ class Parser {
     ++next_;
     return *number;
   }
+
+  /// Returns the next word; empty at the end of the line.
+  std::string nextWord() const { return next_ < line_.words.size() ? line_.words[next_] : ""; }
 
   std::string takeWord(const std::string& expected) {
     if (next_ == line_.words.size()) wrong(expected);

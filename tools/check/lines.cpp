@@ -74,16 +74,17 @@ Line lineOf(std::size_t number, std::string_view text) {
   return line;
 }
 
+std::string textOf(const std::string& path, std::string_view what) {
+  if (auto contents = wholeFile(path)) return *std::move(contents);
+  throw Failure(ExitStatus::badInput,
+                path + ": cannot be read; expected a file of " + std::string(what));
+}
+
 }  // namespace
 
 std::vector<Line> linesOf(const std::string& path, std::string_view what) {
-  const auto contents = wholeFile(path);
-  if (!contents) {
-    throw Failure(ExitStatus::badInput,
-                  path + ": cannot be read; expected a file of " + std::string(what));
-  }
   std::vector<Line> lines;
-  std::istringstream text(*contents);
+  std::istringstream text(textOf(path, what));
   std::size_t number = 0;
   for (std::string line; std::getline(text, line);) {
     Line found = lineOf(++number, line);

@@ -75,9 +75,7 @@ class ParameterReader {
  private:
   void readCount() {
     const std::size_t given = element_.parameterCount();
-    const auto needed = static_cast<std::size_t>(
-        std::count_if(command_.parameters.begin(), command_.parameters.end(),
-                      [](const CommandParameter& parameter) { return !parameter.isOptional; }));
+    const std::size_t needed = neededParameters();
     if (given < needed) {
       add(findingOf("missing-parameter",
                     command_.name + " needs " + plural(needed, "parameter") + " and has " +
@@ -86,6 +84,12 @@ class ParameterReader {
                         std::string(command_.parameters[given].meaning)));
     }
     if (given > command_.parameters.size()) tooMany(given);
+  }
+
+  std::size_t neededParameters() const {
+    const auto& all = command_.parameters;
+    const auto isNeeded = [](const CommandParameter& each) { return !each.isOptional; };
+    return static_cast<std::size_t>(std::count_if(all.begin(), all.end(), isNeeded));
   }
 
   void tooMany(std::size_t given) {
@@ -119,15 +123,19 @@ class ParameterReader {
     const auto value = element_.parameter(position);
     if (!isRead(position)) return;
     if (!hasRightType(parameter.type, value)) {
-      addAt(value, findingOf("wrong-type",
-                             "the " + std::string(parameter.name) + " of " + command_.name +
-                                 " is " + foundWords(value) + ", so the command fails",
-                             "write " + wanted(parameter.type)));
+      addAt(value, wrongType(parameter, value));
     } else if (isNumberType(parameter.type)) {
       readNumber(parameter, value);
     } else {
       readName(parameter, value);
     }
+  }
+
+  Finding wrongType(const CommandParameter& parameter, const ValueRef<>& value) const {
+    return findingOf("wrong-type",
+                     "the " + std::string(parameter.name) + " of " + command_.name + " is " +
+                         foundWords(value) + ", so the command fails",
+                     "write " + wanted(parameter.type));
   }
 
   /// Whether the command looks at the parameter: fonts do not matter for HTML as it is.

@@ -93,18 +93,19 @@ class PlaceConclusions {
 
   /// The same for the last move of a path.
   Blame blameOf(const Visit& visit) const {
-    const Occasion occasion{visit.parent, visit.move};
-    std::optional<std::size_t> list;
-    if (visit.parent == noVisit) {
-      list = script_.listUnder(exploration_.startKeys()[visit.move]);
-    } else if (visit.move == waitMove) {
-      list = script_.listUnder(
-          exploration_.timers(exploration_.visits()[visit.parent].place).front().key);
-    } else {
-      list = script_.listOfTag(*blameOf(occasion, std::nullopt).tag);
-    }
-    return blameOf(occasion,
+    const auto list = listRunBy(visit);
+    return blameOf(Occasion{visit.parent, visit.move},
                    list ? std::optional(static_cast<std::uint32_t>(*list)) : std::nullopt);
+  }
+
+  /// Returns the list that the last move of a path runs first; absent if it runs none.
+  std::optional<std::size_t> listRunBy(const Visit& visit) const {
+    if (visit.parent == noVisit) return script_.listUnder(exploration_.startKeys()[visit.move]);
+    if (visit.move == waitMove) {
+      const auto place = exploration_.visits()[visit.parent].place;
+      return script_.listUnder(exploration_.timers(place).front().key);
+    }
+    return script_.listOfTag(*blameOf(Occasion{visit.parent, visit.move}, std::nullopt).tag);
   }
 
   // Circles that one cause leads into are one finding, with the shortest path.

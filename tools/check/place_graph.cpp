@@ -71,16 +71,21 @@ class CircleFinder {
   void close(std::uint32_t root) {
     const auto number = static_cast<std::uint32_t>(circles_.size());
     PlaceCircle circle;
-    std::uint32_t place = root;
-    do {
-      place = open_.back();
-      open_.pop_back();
-      circleOf_[place] = number;
-      circle.places.push_back(place);
-    } while (place != root);
-    std::sort(circle.places.begin(), circle.places.end());
+    circle.places = takePlaces(root, number);
     for (const std::uint32_t each : circle.places) describe(circle, each, number);
     circles_.push_back(std::move(circle));
+  }
+
+  /// Takes the open places down to the root, as those of the circle with this number.
+  std::vector<std::uint32_t> takePlaces(std::uint32_t root, std::uint32_t number) {
+    std::vector<std::uint32_t> places;
+    do {
+      places.push_back(open_.back());
+      circleOf_[open_.back()] = number;
+      open_.pop_back();
+    } while (places.back() != root);
+    std::sort(places.begin(), places.end());
+    return places;
   }
 
   void describe(PlaceCircle& circle, std::uint32_t place, std::uint32_t number) {
@@ -90,12 +95,15 @@ class CircleFinder {
     const std::size_t count = exploration_.successorCount(place);
     for (std::size_t i = 0; i < count; ++i) {
       const std::uint32_t target = exploration_.successor(place, i);
-      if (circleOf_[target] == number) continue;
-      const PlaceCircle& next = circles_[circleOf_[target]];
-      circle.isLast = false;
-      circle.reachesEnd |= next.reachesEnd;
-      circle.reachesList |= next.reachesList;
+      if (circleOf_[target] != number) leadTo(circles_[circleOf_[target]], circle);
     }
+  }
+
+  /// Notes that a way leads from a circle to the next.
+  static void leadTo(const PlaceCircle& next, PlaceCircle& circle) {
+    circle.isLast = false;
+    circle.reachesEnd |= next.reachesEnd;
+    circle.reachesList |= next.reachesList;
   }
 
   const Exploration& exploration_;

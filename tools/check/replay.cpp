@@ -15,6 +15,7 @@ namespace {
 
 using walkthrough::ControlPicture;
 using walkthrough::StepPicture;
+using walkthrough::TimerPicture;
 
 std::string number(double value) {
   std::ostringstream text;
@@ -120,17 +121,19 @@ class Changes {
   std::string words_;
 };
 
+std::string timerWords(const TimerPicture& timer) {
+  const bool fires = timer.timeLeft <= longestDelay;
+  return (timer.step.empty() ? "timer " + timer.key : quote(timer.step)) +
+         (fires ? " in " + number(timer.timeLeft) + " s" : ", which never fires");
+}
+
 std::vector<std::string> changesBetween(const StepPicture& before, const StepPicture& after) {
   std::vector<std::string> changes;
   for (std::size_t i = 0; i < after.controls.size() && i < before.controls.size(); ++i) {
     std::string line = Changes(before.controls[i], after.controls[i]).line();
     if (!line.empty()) changes.push_back(std::move(line));
   }
-  for (const auto& timer : after.timers) {
-    const bool fires = timer.timeLeft <= longestDelay;
-    changes.push_back((timer.step.empty() ? "timer " + timer.key : quote(timer.step)) +
-                      (fires ? " in " + number(timer.timeLeft) + " s" : ", which never fires"));
-  }
+  for (const TimerPicture& timer : after.timers) changes.push_back(timerWords(timer));
   if (after.ended && !before.ended) changes.emplace_back("the end");
   return changes;
 }

@@ -40,13 +40,17 @@ void writeCase(const Report& report, const Finding& finding, std::ostream& out) 
   out << "    </testcase>\n";
 }
 
+std::size_t failuresIn(const Report& report) {
+  const auto& findings = report.verdict.findings;
+  return static_cast<std::size_t>(
+      std::count_if(findings.begin(), findings.end(),
+                    [&](const Finding& finding) { return isFailure(report, finding); }));
+}
+
 void writeSuite(const Report& report, std::ostream& out) {
   const auto& findings = report.verdict.findings;
-  const auto failures =
-      std::count_if(findings.begin(), findings.end(),
-                    [&](const Finding& finding) { return isFailure(report, finding); });
-  out << suiteOf(report.verdict.path, std::max<std::size_t>(findings.size(), 1),
-                 static_cast<std::size_t>(failures), 0);
+  out << suiteOf(report.verdict.path, std::max<std::size_t>(findings.size(), 1), failuresIn(report),
+                 0);
   for (const Finding& finding : findings) writeCase(report, finding, out);
   if (findings.empty()) {
     out << "    <testcase" << attribute("classname", report.verdict.path)

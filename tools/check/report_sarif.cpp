@@ -18,19 +18,20 @@ constexpr std::size_t mostSteps = 1000;
 
 Json messageOf(const std::string& text) { return {{"text", text}}; }
 
+std::string percentEncoded(char c) {
+  constexpr std::string_view digits = "0123456789ABCDEF";
+  const auto byte = static_cast<unsigned char>(c);
+  return {'%', digits[byte >> 4U], digits[byte & 0xfU]};
+}
+
 /// Returns a path as a URI reference.
 std::string uriOf(const std::string& path) {
   constexpr std::string_view plain =
       "abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ0123456789-._~/";
-  constexpr std::string_view digits = "0123456789ABCDEF";
   std::string uri;
   for (const char c : path) {
-    const auto byte = static_cast<unsigned char>(c);
-    if (plain.find(c) != std::string_view::npos) {
-      uri += c;
-    } else {
-      uri += {'%', digits[byte >> 4U], digits[byte & 0xfU]};
-    }
+    const bool isPlain = plain.find(c) != std::string_view::npos;
+    uri += isPlain ? std::string(1, c) : percentEncoded(c);
   }
   return uri;
 }
@@ -60,15 +61,18 @@ Json codeFlowOf(const Report& report, const Finding& finding) {
   return {{"threadFlows", Json::array({{{"locations", std::move(locations)}}})}};
 }
 
+/// Returns the message, and says if the path is too long to be shown in full.
+std::string messageWithLength(const Finding& finding) {
+  const std::size_t steps = finding.path.size();
+  if (steps <= mostSteps) return finding.message;
+  return finding.message + " (the path has " + std::to_string(steps) + " steps; the first " +
+         std::to_string(mostSteps) + " are here)";
+}
+
 Json resultOf(const Report& report, const Finding& finding) {
-  std::string message = finding.message;
-  if (finding.path.size() > mostSteps) {
-    message += " (the path has " + std::to_string(finding.path.size()) + " steps; the first " +
-               std::to_string(mostSteps) + " are here)";
-  }
   Json result = {{"ruleId", finding.code},
                  {"level", nameOf(finding.severity)},
-                 {"message", messageOf(message)},
+                 {"message", messageOf(messageWithLength(finding))},
                  {"locations", Json::array({locationOf(report, &finding)})}};
   if (!finding.path.empty()) {
     result["codeFlows"] = Json::array({codeFlowOf(report, finding)});

@@ -88,19 +88,17 @@ class SetUp {
   }
 
   void writeWindow() {
-    if (play_.setting.plan.sheet) out_ << "window parent\n";
-    const std::string parent = play_.setting.plan.sheet ? " parent" : "";
-    if (play_.setting.plan.description) {
-      out_ << "engine" << parent << "\nassets " << jsonOf(play_.setting.plan.description).dump()
-           << '\n';
+    const auto& plan = play_.setting.plan;
+    if (plan.sheet) out_ << "window parent\n";
+    const std::string parent = plan.sheet ? " parent" : "";
+    if (plan.description) {
+      out_ << "engine" << parent << "\nassets " << jsonOf(plan.description).dump() << '\n';
       return;
     }
-    out_ << "window host " << rectangle(play_.setting.plan.host.content) << '\n';
+    out_ << "window host " << rectangle(plan.host.content) << '\n';
     std::size_t number = 0;
-    for (const HostControl& control : play_.setting.plan.host.controls) {
-      writeControl(control, names_[number++]);
-    }
-    out_ << "engine" << (play_.setting.plan.sheet ? parent : " host") << "\nadopt host\n";
+    for (const HostControl& control : plan.host.controls) writeControl(control, names_[number++]);
+    out_ << "engine" << (plan.sheet ? parent : " host") << "\nadopt host\n";
   }
 
   void writeControl(const HostControl& control, const std::string& name) {

@@ -2,6 +2,20 @@
 #include "tools/exploration/flashing.hpp"
 
 namespace qz::tools::check {
+namespace {
+
+/// Whether no control behind this one has the same tag.
+bool isBackmost(const Exploration& exploration, std::uint32_t place, std::size_t control) {
+  const auto& format = exploration.format();
+  const std::uint8_t* const bytes = exploration.place(place);
+  const Tag tag = format.control(bytes, control).tag;
+  for (std::size_t behind = 0; behind < control; ++behind) {
+    if (format.control(bytes, behind).tag == tag) return false;
+  }
+  return true;
+}
+
+}  // namespace
 
 Flashing::Flashing(const Exploration& exploration) : exploration_(exploration) {
   std::size_t part = exploration.firstFlashPart();
@@ -18,17 +32,9 @@ std::optional<std::size_t> Flashing::partOf(std::uint32_t place, std::size_t con
 
 bool Flashing::flashes(std::uint32_t place, std::size_t control, const Looks::Parts& parts) const {
   const auto part = partOf(place, control);
-  if (!part || parts[*part] != flashingAllowed + notedYes ||
-      !drivers::isButton(exploration_.setting().kinds[control])) {
-    return false;
-  }
-  const auto& format = exploration_.format();
-  const std::uint8_t* const bytes = exploration_.place(place);
-  const Tag tag = format.control(bytes, control).tag;
-  for (std::size_t behind = 0; behind < control; ++behind) {  // only the backmost one flashes
-    if (format.control(bytes, behind).tag == tag) return false;
-  }
-  return true;
+  return part && parts[*part] == flashingAllowed + notedYes &&
+         drivers::isButton(exploration_.setting().kinds[control]) &&
+         isBackmost(exploration_, place, control);  // only the backmost one flashes
 }
 
 }  // namespace qz::tools::check

@@ -242,6 +242,12 @@ std::optional<std::pair<std::string, std::string>> Draft::waitWords(StepIndex st
   return std::pair(key, flowTable({{"go", go}, {"other presses", "give up"}}));
 }
 
+/// Whether the background is the same at all steps.
+bool Draft::hasOneBackground() const {
+  return std::all_of(backgrounds_.begin(), backgrounds_.end(),
+                     [&](const auto& each) { return each == backgrounds_[0]; });
+}
+
 std::vector<std::pair<std::string, std::string>> Draft::stepWords(StepIndex step) const {
   std::vector<std::pair<std::string, std::string>> words;
   std::vector<std::string> shown;
@@ -258,9 +264,8 @@ std::vector<std::pair<std::string, std::string>> Draft::stepWords(StepIndex step
   }
   if (!shown.empty()) words.emplace_back("show", flowList(shown));
   if (!hidden.empty()) words.emplace_back("hide", flowList(hidden));
-  const bool isCommon = std::all_of(backgrounds_.begin(), backgrounds_.end(),
-                                    [&](const auto& each) { return each == backgrounds_[0]; });
-  if (backgrounds_[step] && !isCommon) words.emplace_back("background", *backgrounds_[step]);
+  if (backgrounds_[step] && !hasOneBackground())
+    words.emplace_back("background", *backgrounds_[step]);
   if (const auto wait = waitWords(step)) words.push_back(*wait);
   return words;
 }
@@ -275,9 +280,7 @@ std::vector<std::pair<std::string, std::string>> Draft::everyStepWords() const {
     }
   }
   if (!hidden.empty()) words.emplace_back("hide", flowList(hidden));
-  const bool isCommon = std::all_of(backgrounds_.begin(), backgrounds_.end(),
-                                    [&](const auto& each) { return each == backgrounds_[0]; });
-  if (isCommon && backgrounds_[0]) words.emplace_back("background", *backgrounds_[0]);
+  if (hasOneBackground() && backgrounds_[0]) words.emplace_back("background", *backgrounds_[0]);
   return words;
 }
 

@@ -35,6 +35,7 @@ class Draft {
   void shareProperty(ControlIndex control, bool (*isOf)(const std::string& property));
   void chooseHidden();
 
+  bool hasOneBackground() const;
   bool isShown(StepIndex step, ControlIndex control) const;
   bool isShownUnsaid(StepIndex step, ControlIndex control) const;
   std::string lead(const Lead& lead) const;

@@ -152,13 +152,18 @@ class Lifter {
     return std::holds_alternative<check::WaitMove>(step) ? "a wait" : "the start";
   }
 
-  void requireNoDifference(const std::string& source) {
+  steps::Built build(const std::string& source) const {
     const auto readControls = [&](const walkthrough::StageOptions&) { return stand_.controls(); };
     const auto read = steps::readSourceText(
         "the source", source, {.readControls = readControls, .readText = {}});  // includes nothing
     steps::Mistakes mistakes;
-    const auto built = steps::build(read.tour, {0}, mistakes);
+    auto built = steps::build(read.tour, {0}, mistakes);
     mistakes.throwIfAny(read.files);
+    return built;
+  }
+
+  void requireNoDifference(const std::string& source) {
+    const auto built = build(source);
     Played again = played_;
     again.script = built.script;
     again.startKeys = built.startKeys;

@@ -73,22 +73,14 @@ class NameFinder {
       const std::string text = textAt(step, i);
       const bool isText = rowOf(controls_[i].kind).caption == Caption::text;
       if (!isText || text.empty() || shortened(text) == names[step]) continue;
-      for (StepIndex other = 0; other < step; ++other) {
-        if (names[other] != names[step] || textAt(other, i) == text) continue;
-        longer.push_back(names[step] + ": " + shortened(text));
-        break;
-      }
+      if (isTelling(i, step, names)) longer.push_back(names[step] + ": " + shortened(text));
     }
     return longer;
   }
 
   /// Returns the title that the button mostly has; empty if that changes all the time.
   std::string titleOf(ControlIndex control) const {
-    std::map<std::string, std::size_t> counts;
-    for (StepIndex step = 0; step < walk_.steps.size(); ++step) {
-      ++counts[textAt(step, control)];
-    }
-    counts.erase("");
+    const auto counts = textsOf(control);
     std::string own = controls_[control].caption.value_or("");
     if (counts.empty() || counts.contains(own)) return own;
     std::size_t all = 0;
@@ -101,6 +93,26 @@ class NameFinder {
  private:
   const comparison::Situation& situation(StepIndex step) const {
     return behavior_.situations()[walk_.steps[step].situation];
+  }
+
+  /// Whether the control says something else at an earlier step of the same name.
+  bool isTelling(ControlIndex control, StepIndex step,
+                 const std::vector<std::string>& names) const {
+    const std::string text = textAt(step, control);
+    for (StepIndex other = 0; other < step; ++other) {
+      if (names[other] == names[step] && textAt(other, control) != text) return true;
+    }
+    return false;
+  }
+
+  /// Returns what the control says, and at how many steps.
+  std::map<std::string, std::size_t> textsOf(ControlIndex control) const {
+    std::map<std::string, std::size_t> counts;
+    for (StepIndex step = 0; step < walk_.steps.size(); ++step) {
+      ++counts[textAt(step, control)];
+    }
+    counts.erase("");
+    return counts;
   }
 
   /// Of headings: they say something else at many steps, in large letters, and are short. Empty if

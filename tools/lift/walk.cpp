@@ -202,6 +202,17 @@ class Walker {
   /// Returns the step of the class that does one of these things to the states; a new one if there
   /// is none.
   StepIndex stepFor(ClassIndex of, const AllEffects& effects) {
+    if (const auto known = narrowedStep(of, effects)) return *known;
+    for (std::size_t i = 0; i < effects.size(); ++i) {
+      if (!effects[i].any()) refuseState(of, i);
+    }
+    variants_.push_back({of, effects});
+    walk_.steps.push_back({.situation = members_[of].front(), .seconds = one(of).wait});
+    return variants_.size() - 1;
+  }
+
+  /// Returns a step of the class that can do one of these things, and from now on does no other.
+  std::optional<StepIndex> narrowedStep(ClassIndex of, const AllEffects& effects) {
     for (StepIndex i = 0; i < variants_.size(); ++i) {
       if (variants_[i].of != of) continue;
       const AllEffects both = common(variants_[i].effects, effects);
@@ -209,12 +220,7 @@ class Walker {
       variants_[i].effects = both;
       return i;
     }
-    for (std::size_t i = 0; i < effects.size(); ++i) {
-      if (!effects[i].any()) refuseState(of, i);
-    }
-    variants_.push_back({of, effects});
-    walk_.steps.push_back({.situation = members_[of].front(), .seconds = one(of).wait});
-    return variants_.size() - 1;
+    return std::nullopt;
   }
 
   [[noreturn]] void refuseState(ClassIndex of, std::size_t control) const {

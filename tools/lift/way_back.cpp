@@ -126,11 +126,7 @@ class WayFinder {
 
   /// Makes every step of the group a group of its own.
   void split(GroupIndex torn) {
-    std::set<ControlNumber> controls;
-    for (const auto& [each, control] : back_) {
-      if (each == torn) controls.insert(control);
-    }
-    for (const ControlNumber c : controls) back_.erase({torn, c});
+    const auto controls = takeMarks(torn);
     bool isFirst = true;
     for (StepIndex i = 0; i < groups_.size(); ++i) {
       if (groups_[i] != torn) continue;
@@ -139,6 +135,16 @@ class WayFinder {
         if (isToStep(presses(i)[c])) back_.emplace(groups_[i], c);
       }
     }
+  }
+
+  /// Returns the controls that lead back from a group, which from now on has none.
+  std::set<ControlNumber> takeMarks(GroupIndex group) {
+    std::set<ControlNumber> controls;
+    for (const auto& [each, control] : back_) {
+      if (each == group) controls.insert(control);
+    }
+    for (const ControlNumber c : controls) back_.erase({group, c});
+    return controls;
   }
 
   using Marks = std::set<std::pair<GroupIndex, ControlNumber>>;

@@ -139,18 +139,19 @@ auto pairUp(const StepPicture& before, const StepPicture& now) {
   return pairs;
 }
 
+std::string firingWords(const TimerPicture* timer) {
+  return timer ? "fires " + whenWords(timer->timeLeft) : "none";
+}
+
 void compareTimers(const StepPicture& before, const StepPicture& now,
                    std::vector<Change>& changes) {
   for (const auto& [key, pair] : pairUp(before, now)) {
     const auto [old, current] = pair;
     if (old && current && old->identity == current->identity) continue;
-    const auto words = [](const TimerPicture* timer) {
-      return timer ? "fires " + whenWords(timer->timeLeft) : "none";
-    };
     const std::string anew = old && current ? "armed again, " : "";
     const std::string& step = (current ? current : old)->step;
     const std::string what = step.empty() ? "timer of list " + key : "wait for " + quote(step);
-    changes.push_back({what, words(old), anew + words(current)});
+    changes.push_back({what, firingWords(old), anew + firingWords(current)});
   }
 }
 

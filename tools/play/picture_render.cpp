@@ -133,6 +133,11 @@ class Renderer {
       tagWidth_ = std::max(tagWidth_, displayWidth(row.tag));
       kindWidth_ = std::max(kindWidth_, displayWidth(row.kind));
     }
+    measureContents(rows);
+  }
+
+  /// Computes how wide the contents are, in the room that the columns before them leave.
+  void measureContents(const std::vector<Row>& rows) {
     const std::size_t room = widthFrom(contentColumn()) - gap.size();
     const std::size_t widest =
         std::clamp(room - std::min(room, narrowestRemarks), narrowestContent, widestContent);

@@ -19,6 +19,12 @@ std::string pressableWords(const StepPicture& picture) {
   return buttons.empty() ? "; no button can be pressed" : "; press " + enumerate(buttons);
 }
 
+std::string wayOf(const TimerPicture& timer) {
+  return (timer.step.empty() ? "list " + timer.key + " to run "
+                             : "the step " + quote(timer.step) + " ") +
+         whenWords(timer.timeLeft);
+}
+
 /// Returns what can happen next: presses that run a list, and timers.
 std::vector<std::string> waysOn(const StepPicture& picture) {
   std::vector<std::string> ways;
@@ -28,11 +34,7 @@ std::vector<std::string> waysOn(const StepPicture& picture) {
     if (moves) buttons.push_back(pressWords(picture, control.view.tag));
   }
   if (!buttons.empty()) ways.push_back("a press of " + enumerate(buttons));
-  for (const TimerPicture& timer : picture.timers) {
-    ways.push_back(timer.step.empty()
-                       ? "list " + timer.key + " to run " + whenWords(timer.timeLeft)
-                       : "the step " + quote(timer.step) + " " + whenWords(timer.timeLeft));
-  }
+  for (const TimerPicture& timer : picture.timers) ways.push_back(wayOf(timer));
   return ways;
 }
 

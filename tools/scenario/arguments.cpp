@@ -25,6 +25,15 @@ Json changedJson(const Json& value, const Change& change) {
   return changed;
 }
 
+Word changedWord(Word word, const Change& change) {
+  if (word.kind == Word::Kind::json) {
+    word.value = changedJson(word.value, change);
+  } else {
+    word.text = change(word.text);
+  }
+  return word;
+}
+
 }  // namespace
 
 bool Arguments::has(std::string_view slot) const {
@@ -62,15 +71,7 @@ std::uint64_t Arguments::unsignedWhole(std::string_view slot) const {
 Arguments Arguments::changed(const Change& change) const {
   Arguments changed;
   changed.nested_ = nested_;
-  for (const auto& [slot, word] : words_) {
-    auto copy = word;
-    if (word.kind == Word::Kind::json) {
-      copy.value = changedJson(word.value, change);
-    } else {
-      copy.text = change(word.text);
-    }
-    changed.add(slot, std::move(copy));
-  }
+  for (const auto& [slot, word] : words_) changed.add(slot, changedWord(word, change));
   return changed;
 }
 

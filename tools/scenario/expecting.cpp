@@ -145,9 +145,7 @@ Outcome property(Stage& stage, const Arguments& a) {
   }
   const auto& names = stage.classNames;
   const Wanted unified{wanted.kind, names.unifiedTexts(wanted.value)};
-  if (!unified.holdsFor(names.unifiedTexts(*shown.reading))) {
-    refuse(wanted, shown.reading);
-  }
+  if (!unified.holdsFor(names.unifiedTexts(*shown.reading))) refuse(wanted, shown.reading);
   return {};
 }
 

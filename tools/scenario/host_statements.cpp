@@ -17,17 +17,21 @@ Outcome setConstant(Stage& stage, const Arguments& a) {
   return {};
 }
 
+/// Returns the value that a statement gives to one of these properties.
+Wanted settingOf(const Arguments& a, const std::vector<PropertyInfo>& known,
+                 const std::string& property) {
+  return readValue(a.word("SETTING"), infoNamed(known, property).written).value();
+}
+
 Outcome setProperty(Stage& stage, const Arguments& a) {
   const auto path = splitPath(a.text("SETTABLE"));
   const auto& property = path.property.value();
   if (path.subject == "engine") {
-    const auto value =
-        readValue(a.word("SETTING"), infoNamed(vocabulary().engine, property).written);
-    writeEngineProperty(stage, *stage.engines.held(), property, value.value());
+    const Wanted value = settingOf(a, vocabulary().engine, property);
+    writeEngineProperty(stage, *stage.engines.held(), property, value);
   } else {
-    const auto value =
-        readValue(a.word("SETTING"), infoNamed(vocabulary().control, property).written);
-    writeControlProperty(stage, stage.cast.control(path.subject), property, value.value());
+    const Wanted value = settingOf(a, vocabulary().control, property);
+    writeControlProperty(stage, stage.cast.control(path.subject), property, value);
   }
   return {};
 }

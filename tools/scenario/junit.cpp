@@ -66,6 +66,13 @@ std::string testCase(const Report& report) {
          "</failure>\n    </testcase>\n";
 }
 
+/// Returns the suite of the reports on one file.
+std::string testSuite(const Report* first, const Report* last) {
+  std::string xml = "  <testsuite" + attribute("name", first->file) + totals(first, last) + ">\n";
+  for (; first != last; ++first) xml += testCase(*first);
+  return xml + "  </testsuite>\n";
+}
+
 }  // namespace
 
 std::string junitReport(const std::vector<Report>& reports) {
@@ -76,9 +83,8 @@ std::string junitReport(const std::vector<Report>& reports) {
   for (const auto* first = reports.data(); first != end;) {
     const auto* const last =
         std::find_if(first, end, [&](const Report& report) { return report.file != first->file; });
-    xml += "  <testsuite" + attribute("name", first->file) + totals(first, last) + ">\n";
-    for (; first != last; ++first) xml += testCase(*first);
-    xml += "  </testsuite>\n";
+    xml += testSuite(first, last);
+    first = last;
   }
   return xml + "</testsuites>\n";
 }

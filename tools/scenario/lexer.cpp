@@ -259,9 +259,7 @@ void requireText(std::string_view text) {
     if (length == 0) throw SyntaxError(at, "a byte that is not valid UTF-8");
     const auto c = static_cast<unsigned char>(text[0]);
     const bool endsLine = c == '\n' || text.starts_with("\r\n");
-    if (c < 0x20 && c != '\t' && !endsLine) {
-      throw SyntaxError(at, "a control character");
-    }
+    if (c < 0x20 && c != '\t' && !endsLine) throw SyntaxError(at, "a control character");
     at = c == '\n' ? Position{at.line + 1, 1} : Position{at.line, at.column + 1};
     text.remove_prefix(length);
   }

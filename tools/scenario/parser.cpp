@@ -63,12 +63,16 @@ class FileParser {
     }
     names_ = commonNames_;
     currentAt_ = line.words.front().at;
-    Scenario scenario{"", currentAt_.line, common.only, {}};
-    for (const auto& word : match(line).arguments.texts("TEXT")) {
-      scenario.title += (scenario.title.empty() ? "" : " ") + word;
-    }
-    file_.scenarios.push_back(std::move(scenario));
+    file_.scenarios.push_back({titleOf(line), currentAt_.line, common.only, {}});
     return file_.scenarios.back();
+  }
+
+  std::string titleOf(const Line& line) {
+    std::string title;
+    for (const auto& word : match(line).arguments.texts("TEXT")) {
+      title += (title.empty() ? "" : " ") + word;
+    }
+    return title;
   }
 
   // An empty scenario would pass without testing anything.
@@ -103,9 +107,7 @@ class FileParser {
 
   /// `words` begins with the arrow.
   Clause clause(std::span<const Word> words, Position end, Result result) {
-    if (result == Result::never) {
-      throw SyntaxError(words[0].at, "this statement has no result");
-    }
+    if (result == Result::never) throw SyntaxError(words[0].at, "this statement has no result");
     if (words.size() > 2) {
       throw SyntaxError(words[2].at,
                         "found " + describe(words[2]) + ", expected the end of the line");

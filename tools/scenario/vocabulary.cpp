@@ -63,6 +63,12 @@ constexpr KindName kindNames[] = {
     {Takes::present, "present"},  {Takes::empty, "empty"},
 };
 
+/// Whether a value is an empty text, list or object.
+bool isEmptyValue(const Json& value) {
+  if (value.is_string()) return value.get_ref<const std::string&>().empty();
+  return value.is_structured() && value.empty();
+}
+
 }  // namespace
 
 bool Wanted::holdsFor(const std::optional<Json>& actual) const {
@@ -72,8 +78,7 @@ bool Wanted::holdsFor(const std::optional<Json>& actual) const {
     case Kind::present:
       return actual.has_value();
     case Kind::empty:
-      return actual && (actual->is_string() ? actual->get_ref<const std::string&>().empty()
-                                            : actual->is_structured() && actual->empty());
+      return actual && isEmptyValue(*actual);
     case Kind::value:
       break;
   }

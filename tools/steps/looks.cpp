@@ -79,15 +79,9 @@ Commands textCommands(const Control& control, const ControlWords& words) {
 }
 
 Commands contentCommands(const Control& control, const ControlWords& words) {
-  switch (rowOf(control.kind).caption) {
-    case Caption::title:
-    case Caption::text:
-      return textCommands(control, words);
-    case Caption::imageName:
-      break;
-    case Caption::none:
-      return {};
-  }
+  const Caption caption = rowOf(control.kind).caption;
+  if (caption == Caption::none) return {};
+  if (caption != Caption::imageName) return textCommands(control, words);
   const auto image = words.content ? words.content->text : control.caption;
   if (!image) return {};
   return {{"LOAD_GRAPHIC_OBJECT_WITH_PATH_AND_ID", {*image}, words.place}};

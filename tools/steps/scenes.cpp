@@ -174,17 +174,23 @@ std::size_t classOf(const Exit& exit, const Classes& classes) {
                                         : static_cast<std::size_t>(exit.kind);
 }
 
+/// Returns the class of a situation, and those of the situations to which its moves lead.
+std::vector<std::size_t> classesAround(SceneIndex scene, const Scene& here,
+                                       const Classes& classes) {
+  std::vector<std::size_t> around = {classes[scene]};
+  for (const auto& press : here.presses) {
+    around.push_back(press ? 1 + classOf(*press, classes) : 0);
+  }
+  if (here.wait) around.push_back(classOf(*here.wait, classes));
+  return around;
+}
+
 /// Divides the classes by where the moves lead, and returns how many classes there are.
 std::size_t refine(const std::vector<Situation>& all, Classes& classes) {
   std::map<std::vector<std::size_t>, std::size_t> numbers;
   Classes refined;
   for (SceneIndex i = 0; i < all.size(); ++i) {
-    const Scene& scene = all[i].scene;
-    std::vector<std::size_t> signature = {classes[i]};
-    for (const auto& press : scene.presses) {
-      signature.push_back(press ? 1 + classOf(*press, classes) : 0);
-    }
-    if (scene.wait) signature.push_back(classOf(*scene.wait, classes));
+    const auto signature = classesAround(i, all[i].scene, classes);
     refined.push_back(numbers.try_emplace(signature, numbers.size()).first->second);
   }
   classes = std::move(refined);

@@ -99,17 +99,7 @@ class SourceReader {
 
   void readControls() {
     for (const auto& [name, value] : entriesOf(*part("controls"), "names with tags", mistakes_)) {
-      const auto which = readControl(*value);
-      if (!which) continue;
-      Control* const found = findControl(*which);
-      if (!found) {
-        mistakes_.add(value->place, "the window has no " + wordsFor(*which));
-      } else if (!found->name.empty()) {
-        mistakes_.add(name->place,
-                      "the " + wordsFor(*which) + " is called " + quote(found->name) + " already");
-      } else {
-        found->name = name->text;
-      }
+      if (const auto which = readControl(*value)) nameControl(*which, *name, value->place);
     }
   }
 
@@ -118,6 +108,18 @@ class SourceReader {
     int tag = 0;
     int number = 1;  ///< from 1: the back-most, as commands find it
   };
+
+  void nameControl(const WhichControl& which, const Node& name, Place place) {
+    Control* const found = findControl(which);
+    if (!found) {
+      mistakes_.add(place, "the window has no " + wordsFor(which));
+    } else if (!found->name.empty()) {
+      mistakes_.add(name.place,
+                    "the " + wordsFor(which) + " is called " + quote(found->name) + " already");
+    } else {
+      found->name = name.text;
+    }
+  }
 
   std::optional<WhichControl> readControl(const Node& value) {
     constexpr int mostControls = 10000;

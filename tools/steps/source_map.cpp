@@ -39,21 +39,25 @@ Json listOf(const InputFile& file, const toolkit::Dictionary::Entry& entry,
   return list;
 }
 
+Json listsOf(const InputFile& file, const walkthrough::Names& names) {
+  Json lists = Json::object();
+  const auto dictionary = file.dictionary();  // held: its entries live only as long
+  for (const auto& entry : dictionary->entries()) {
+    lists[entry.key->description()] = listOf(file, entry, names);
+  }
+  return lists;
+}
+
 }  // namespace
 
 std::string sourceMap(const ScriptFile& script) {
   const walkthrough::Names names = script.names();
   Json controls = Json::object();
   for (const auto& [tag, name] : names.controls) controls[std::to_string(tag)] = name;
-  Json lists = Json::object();
-  const auto dictionary = script.file.dictionary();  // held: its entries live only as long
-  for (const auto& entry : dictionary->entries()) {
-    lists[entry.key->description()] = listOf(script.file, entry, names);
-  }
   const Json map = {{"version", 1},
                     {"source", std::filesystem::path(script.file.path()).filename().string()},
                     {"controls", controls},
-                    {"lists", lists}};
+                    {"lists", listsOf(script.file, names)}};
   return map.dump(1) + "\n";
 }
 

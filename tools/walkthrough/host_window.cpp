@@ -95,6 +95,15 @@ void expectImage(toolkit::Toolkit& toolkit, std::string_view name, std::string_v
                                           toolkit.files().resourcePath());
 }
 
+/// Throws a Failure if the window shows an image that there is not.
+void expectImages(const HostWindow& host, toolkit::Toolkit& toolkit, std::string_view file) {
+  for (const HostControl& control : host.controls) {
+    if (rowOf(control.kind).caption == Caption::imageName && control.caption) {
+      expectImage(toolkit, *control.caption, file);
+    }
+  }
+}
+
 void makeControl(drivers::Driver& driver, const HostControl& control,
                  const toolkit::Ref<toolkit::View>& parent) {
   const auto view = driver.makeView(control.kind, control.tag, control.frame, parent);
@@ -136,11 +145,7 @@ HostWindow readHostWindow(const std::string& path) {
 
 toolkit::Ref<toolkit::Window> makeHostWindow(drivers::Driver& driver, const HostWindow& host,
                                              std::string_view file) {
-  for (const HostControl& control : host.controls) {
-    if (rowOf(control.kind).caption == Caption::imageName && control.caption) {
-      expectImage(driver.toolkit(), *control.caption, file);
-    }
-  }
+  expectImages(host, driver.toolkit(), file);
   auto window = driver.makeWindow(host.content);
   if (!host.title.empty()) driver.setWindowTitle(window, host.title);
   for (const HostControl& control : host.controls) {

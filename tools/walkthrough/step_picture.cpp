@@ -74,18 +74,22 @@ void addTo(Hash& hash, const drivers::ViewPicture& view) {
   hash.add(view.image);
 }
 
+void addTo(Hash& hash, const ControlPicture& control) {
+  addTo(hash, control.view);
+  hash.add(control.flashing);
+}
+
+void addTo(Hash& hash, const TimerPicture& timer) {
+  hash.add(timer.key);
+  hash.add(timer.timeLeft);
+}
+
 }  // namespace
 
 std::size_t hashOf(const StepPicture& picture) {
   Hash hash;
-  for (const ControlPicture& control : picture.controls) {
-    addTo(hash, control.view);
-    hash.add(control.flashing);
-  }
-  for (const TimerPicture& timer : picture.timers) {
-    hash.add(timer.key);
-    hash.add(timer.timeLeft);
-  }
+  for (const ControlPicture& control : picture.controls) addTo(hash, control);
+  for (const TimerPicture& timer : picture.timers) addTo(hash, timer);
   hash.add(picture.lastList);
   hash.add(picture.flashingAllowed);
   hash.add(picture.ended);
