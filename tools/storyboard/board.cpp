@@ -83,7 +83,7 @@ class StepFinder {
     const auto& names = exploration_.setting().plan.names;
     if (names.isEmpty()) return key;
     if (isOver(visit.place)) return "the end";
-    const std::string name = names.stepOf(key);
+    std::string name = names.stepOf(key);
     if (!name.empty() || visit.parent == check::noVisit) return name;
     const Visit& parent = exploration_.visits()[visit.parent];
     return known[*find(parent.place, parent.look, parent.lastList)].group;

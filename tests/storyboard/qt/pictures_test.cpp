@@ -200,7 +200,7 @@ void paste(const PagePatch& patch, const Pixels& pixels, Pixels& picture) {
   const auto y = static_cast<int>(std::lround(patch.area.y * picture.height));
   ASSERT_EQ(std::lround(patch.area.width * picture.width), pixels.width);
   ASSERT_EQ(std::lround(patch.area.height * picture.height), pixels.height);
-  for (int row = 0; row < pixels.height; ++row) {
+  for (std::ptrdiff_t row = 0; row < pixels.height; ++row) {
     std::copy_n(pixels.argb.begin() + row * pixels.width, pixels.width,
                 picture.argb.begin() + (y + row) * picture.width + x);
   }
