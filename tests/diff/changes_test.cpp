@@ -138,6 +138,45 @@ TEST(Diff, FindsAMoveThatLeadsElsewhere) {
   EXPECT_TRUE(change.controls.empty());  // nothing is to be seen at an end
 }
 
+/// Returns the original with another list in place of the first that a press runs.
+DiffedScripts diffedToList19(const std::string& commands) {
+  return diffedTo(R"({
+    0 = ((SET_TEXT_FOR_OBJECT_ID, Hello, 1), (SET_TAG_FOR_OBJECT_ID, 19, 2));
+    19 = ()" + commands +
+                  R"(, (SET_TAG_FOR_OBJECT_ID, 20, 19), (SET_TIMER_FOR_ID, 5, 7));
+    3 = (); 7 = (TERMINATE_PARSER); 20 = (TERMINATE_PARSER);
+  })");
+}
+
+TEST(Diff, TakesAStepForTheSameIfNoOtherIsMuchMoreAlike) {
+  const auto found =
+      diffedToList19("(SET_TEXT_FOR_OBJECT_ID, Goodbye, 1), (SET_TOOL_TIP_FOR_ID, More, 3)");
+  ASSERT_EQ(found.changes().size(), 2U) << found.text();
+  for (const Change& change : found.changes()) EXPECT_EQ(change.kind, Kind::look);
+  EXPECT_EQ(found.changes()[0].controls.front().property.property, "text");
+  EXPECT_EQ(found.changes()[1].controls.front().property.property, "tooltip");
+}
+
+TEST(Diff, TakesAStepForAnotherIfBothHaveOneThatIsMoreAlike) {
+  const auto found = diffedToList19("(SET_TOOL_TIP_FOR_ID, More, 3)");
+  const Change& change = changeOf(found, Kind::move);
+  EXPECT_EQ(change.target.before.words(), "the step of list “2” (“Bye”)");
+  EXPECT_EQ(change.target.after.words(), "the step of list “19” (“Hello”)");
+}
+
+TEST(Diff, TakesAStepForAnotherIfOneIsMuchMoreAlikeAndCountsWhatIsDifferent) {
+  const auto found = diffedToList19(
+      "(SET_TEXT_FOR_OBJECT_ID, Goodbye, 1), (SET_TOOL_TIP_FOR_ID, One, 1),"
+      "(SET_TITLE_FOR_OBJECT_ID, Go, 19), (SET_TOOL_TIP_FOR_ID, Two, 19),"
+      "(SET_TITLE_FOR_OBJECT_ID, Box, 3), (SET_TOOL_TIP_FOR_ID, Three, 3),"
+      "(SET_STATE_ON_FOR_OBJECT_ID, 3)");
+  const Change& change = changeOf(found, Kind::move);
+  EXPECT_EQ(change.pressed, 1U) << "the button";
+  EXPECT_EQ(change.controls.size(), 7U);
+  EXPECT_NE(found.text().find("\n    there: 2 other differences\n"), std::string::npos)
+      << found.text();
+}
+
 TEST(Diff, FindsListsThatRunEachOtherWithoutEnd) {
   const auto found = diffedTo(changed("3 = ()", "3 = ((PROCESS_COMMANDS_FOR_ID, 3))"));
   const Change& change = changeOf(found, Kind::move);

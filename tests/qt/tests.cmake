@@ -1,6 +1,6 @@
 # SPDX-License-Identifier: MIT
 # The tests of the Qt toolkit.
-find_package(Qt6 6.4 REQUIRED COMPONENTS Test)
+find_package(Qt6 6.4 REQUIRED COMPONENTS Test Widgets)
 qz_tests(qt qz::qt_driver qz::engine qz::tools qz::progress qt-host-forms Qt6::Test)
 # Some wait for a real clock, so they begin first, and the others run beside them.
 set_tests_properties(qt:part-0 qt:part-1 qt:part-2 qt:part-3 PROPERTIES COST 100)
@@ -12,6 +12,10 @@ add_test(NAME qt:outliving COMMAND qt-outliving-test)
 set_tests_properties(qt:outliving PROPERTIES ENVIRONMENT ${qz_leaks})
 add_test(NAME qt-scenarios COMMAND qz-walkthrough test --toolkit qt ${PROJECT_SOURCE_DIR}/scenarios)
 set_tests_properties(qt-scenarios PROPERTIES ENVIRONMENT "QT_QPA_PLATFORM=offscreen;${qz_leaks}" TIMEOUT 1200)
+
+# Storyboards with pictures.
+target_sources(storyboard-tests PRIVATE storyboard/qt/pictures_test.cpp)
+target_link_libraries(storyboard-tests PRIVATE Qt6::Widgets)
 
 # Needs forms and Qt's form loader, which scripts/foreign-forms installs.
 if(TARGET Qt6::UiTools)

@@ -5,26 +5,20 @@
 #include <gtest/gtest.h>
 
 #include <filesystem>
-#include <regex>
-#include <set>
 
 #include "drivers/memory/memory_driver.hpp"
+#include "tests/storyboard/pages.hpp"
 #include "tests/tools/play_files.hpp"
-#include "tests/tools/tool_run.hpp"
 #include "tools/check/replay.hpp"
-#include "tools/commands.hpp"
 #include "tools/drawing/look_stage.hpp"
 #include "tools/play/words.hpp"
 #include "tools/steps/script_file.hpp"
 #include "tools/storyboard/board.hpp"
-#include "tools/support/whole_file.hpp"
 
 namespace qz::tools::storyboard {
 namespace {
 
 namespace fs = std::filesystem;
-
-const std::string repository = QZ_SOURCE_DIR;
 
 /// A script of the repository and its window.
 struct Shown {
@@ -105,28 +99,6 @@ INSTANTIATE_TEST_SUITE_P(All, StoryboardOf, testing::ValuesIn(shownScripts()),
                            std::replace(name.begin(), name.end(), '-', '_');
                            return name;
                          });
-
-/// Runs the command in the working directory and returns the page.
-std::string pageOf(const std::vector<std::string>& arguments) {
-  std::vector<std::string> line = {"storyboard", "-o", "page.html", "--toolkit", "memory"};
-  line.insert(line.end(), arguments.begin(), arguments.end());
-  const Result result = run(storyboardCommand, line);
-  EXPECT_EQ(result.err, "");
-  EXPECT_EQ(result.status, 0);
-  return wholeFile("page.html").value_or("");
-}
-
-/// Returns the first group of each match.
-std::multiset<std::string> all(const std::string& text, const std::string& pattern) {
-  const std::regex regex(pattern);
-  std::multiset<std::string> found;
-  for (std::sregex_iterator each(text.begin(), text.end(), regex), end; each != end; ++each) {
-    found.insert((*each)[1]);
-  }
-  return found;
-}
-
-const std::string backup = repository + "/examples/first-steps/backup.yaml";
 
 TEST(Storyboards, LinkToTheirOwnStepsAndToNothingElse) {
   const play::WorkingDirectory directory;

@@ -77,6 +77,9 @@ TEST(CheckProgress, AppearsAfterASecondAndDisappears) {
     EXPECT_NE(error.text().find("a\\u{1b}.plist: 1000 places, "), std::string::npos)
         << error.text();
     EXPECT_NE(error.text().find("20 to go on from"), std::string::npos) << error.text();
+    std::this_thread::sleep_for(std::chrono::milliseconds(200));
+    line.show("drawing", 3, 9, "pictures");
+    EXPECT_TRUE(error.text().ends_with("\r\x1b[Kdrawing 3 of 9 pictures")) << error.text();
   }
   EXPECT_TRUE(error.text().ends_with("\r\x1b[K")) << error.text();
   EXPECT_EQ(error.text().find('\n'), std::string::npos);

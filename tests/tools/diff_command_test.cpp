@@ -139,7 +139,30 @@ TEST_F(DiffCommand, SaysThatNotEverythingWasCompared) {
   EXPECT_EQ(result.status, 3);
 }
 
+// Everything is explored, but two steps and three in turn are six pairs.
+TEST_F(DiffCommand, SaysThatNotAllPairsOfStepsWereCompared) {
+  directory_.write("two.plist",
+                   "{ 2 = ((SET_TAG_FOR_OBJECT_ID, 3, 2)); 3 = ((SET_TAG_FOR_OBJECT_ID, 2, 3)); }");
+  directory_.write("three.plist",
+                   "{ 2 = ((SET_TAG_FOR_OBJECT_ID, 3, 2)); 3 = ((SET_TAG_FOR_OBJECT_ID, 4, 3));"
+                   "  4 = ((SET_TAG_FOR_OBJECT_ID, 2, 4)); }");
+  const auto after = [&](const std::string& limit) {
+    return diff({"two.plist", "three.plist", "--window", "host.plist", "--limit", limit});
+  };
+  const Result limited = after("5");
+  EXPECT_NE(limited.out.find("no difference was found; not everything was compared"),
+            std::string::npos)
+      << limited.out;
+  EXPECT_EQ(limited.status, 3);
+  EXPECT_EQ(after("6").status, 0);
+}
+
 TEST_F(DiffCommand, SaysWhatIsWrong) {
+  EXPECT_EQ(diff({"old.plist", "new.plist", "old.plist"}).err,
+            "qz-walkthrough: expected OLD and NEW, or the seven or nine words of git, found 3\n");
+  EXPECT_EQ(diff({"old.plist", "new.plist", "--limit", "0"}).err,
+            "qz-walkthrough: --limit: expected a whole number above 0, found “0”; see "
+            "qz-walkthrough diff --help\n");
   EXPECT_EQ(diff({"old.plist"}).err,
             "qz-walkthrough: expected OLD and NEW, found only “old.plist”\n");
   EXPECT_EQ(diff({"old.plist", "missing.plist"}).err,

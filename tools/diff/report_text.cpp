@@ -112,7 +112,7 @@ class TextReport {
       out_ << "    there: " << oneLine(controlWords(controls[i])) << '\n';
     }
     if (controls.size() > mostShown) {
-      out_ << "    there: " << counted(controls.size() - mostShown, "other property") << '\n';
+      out_ << "    there: " << counted(controls.size() - mostShown, "other difference") << '\n';
     }
   }
 

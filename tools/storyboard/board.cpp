@@ -67,11 +67,19 @@ class StepFinder {
     return step;
   }
 
+  /// Returns the key of the list that had the last word; of the start while nothing had a command.
+  const std::string& lastKey(const Visit& visit) const {
+    if (visit.lastList != check::noList) {
+      return exploration_.setting().script.lists()[visit.lastList].key;
+    }
+    const Visit* start = &visit;
+    while (start->parent != check::noVisit) start = &exploration_.visits()[start->parent];
+    return exploration_.startKeys()[start->move];
+  }
+
   /// A list that leads to no step of the source leaves the walk-through where it was.
   std::string groupOf(const Visit& visit, const std::vector<BoardStep>& known) const {
-    std::string key = visit.lastList == check::noList
-                          ? exploration_.startKeys()[0]
-                          : exploration_.setting().script.lists()[visit.lastList].key;
+    const std::string& key = lastKey(visit);
     const auto& names = exploration_.setting().plan.names;
     if (names.isEmpty()) return key;
     if (isOver(visit.place)) return "the end";
@@ -116,10 +124,10 @@ Board::Board(check::Exploration& exploration, unsigned threads) : exploration_(e
 std::optional<StepIndex> Board::after(StepIndex step, const check::Step& move) const {
   const auto* const press = std::get_if<check::PressMove>(&move);
   const check::Move wanted = press ? static_cast<check::Move>(press->control) : check::waitMove;
-  for (const BoardMove& each : steps_[step].moves) {
-    if (each.move == wanted) return each.to;
-  }
-  return std::nullopt;
+  const auto& moves = steps_[step].moves;
+  const auto found = std::find_if(moves.begin(), moves.end(),
+                                  [&](const BoardMove& each) { return each.move == wanted; });
+  return found == moves.end() ? std::nullopt : found->to;
 }
 
 std::vector<StepIndex> Board::stepsOf(const check::Path& path) const {

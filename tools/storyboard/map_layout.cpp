@@ -74,8 +74,8 @@ class Layouter {
     MapLayout layout{.width = box.UR.x, .height = box.UR.y};
     for (Agnode_t* const node : nodes_) {
       const pointf middle = ND_coord(node);
-      layout.nodes.emplace_back(middle.x - map_.width / 2,
-                                layout.height - middle.y - map_.height / 2);
+      const double top = layout.height - middle.y - map_.height / 2;
+      layout.nodes.emplace_back(middle.x - map_.width / 2, top);
     }
     for (Agedge_t* const edge : edges_) layout.edges.push_back(pathOf(edge, layout.height));
     return layout;
