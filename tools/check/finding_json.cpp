@@ -2,10 +2,9 @@
 #include "tools/check/finding_json.hpp"
 
 namespace qz::tools::check {
+namespace {
 
 using Json = nlohmann::ordered_json;
-
-namespace {
 
 Json jsonOfStep(const Step& step) {
   if (const auto* start = std::get_if<StartMove>(&step)) return {{"start", start->key}};
