@@ -9,6 +9,7 @@
 #include <QStyle>
 #include <QWidget>
 #include <algorithm>
+#include <map>
 #include <optional>
 
 #include "drivers/qt/qt_driver.hpp"
@@ -82,13 +83,23 @@ Pixels pixelsOf(const QImage& picture) {
   return pixels;
 }
 
+/// Returns Qt's number of a font, -1 if it cannot be read. Adds each font once: with two of the same
+/// name Qt may draw some texts with the other one, whose shades differ.
+int idOf(std::string_view font) {
+  static std::map<const char*, int> ids;
+  const auto [known, isNew] = ids.try_emplace(font.data(), -1);
+  if (isNew) {
+    known->second = QFontDatabase::addApplicationFontFromData(
+        QByteArray(font.data(), static_cast<qsizetype>(font.size())));
+  }
+  return known->second;
+}
+
 /// Returns the family of the first font that can be read; empty if none can.
 QString familyOf(std::span<const std::string_view> fonts) {
   QString family;
   for (const std::string_view font : fonts) {
-    const int id = QFontDatabase::addApplicationFontFromData(
-        QByteArray(font.data(), static_cast<qsizetype>(font.size())));
-    const auto families = QFontDatabase::applicationFontFamilies(id);
+    const auto families = QFontDatabase::applicationFontFamilies(idOf(font));
     if (family.isEmpty() && !families.isEmpty()) family = families.first();
   }
   return family;
