@@ -83,8 +83,8 @@ Pixels pixelsOf(const QImage& picture) {
   return pixels;
 }
 
-/// Returns Qt's number of a font, -1 if it cannot be read. Adds each font once: with two of the same
-/// name Qt may draw some texts with the other one, whose shades differ.
+/// Returns Qt's number of a font, -1 if it cannot be read. Adds each font once: with two of the
+/// same name Qt may draw some texts with the other one, whose shades differ.
 int idOf(std::string_view font) {
   static std::map<const char*, int> ids;
   const auto [known, isNew] = ids.try_emplace(font.data(), -1);

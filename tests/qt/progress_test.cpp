@@ -123,7 +123,9 @@ TEST_F(Progress, IsExploredWithinBoundsAndKnownOnlyWhereItIsCertain) {
 }
 
 TEST_F(Progress, IsLeftUnknownByTheEndOfTheWalkThrough) {
-  walkThrough.setProgressMeter(exploringMeter({.places = 10'000'000, .seconds = 600}));
+  // Bounds that the exploration does not reach before the end, even on a busy machine.
+  walkThrough.setProgressMeter(
+      exploringMeter({.places = 100'000'000, .bytes = std::size_t{8} << 30U, .seconds = 600}));
   const QByteArray script = counter(window, 30);
   for (int i = 0; i < 20; ++i) {
     ASSERT_TRUE(walkThrough.play(script, window));
