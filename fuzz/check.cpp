@@ -37,7 +37,7 @@ namespace {
 
 using fuzz::require;
 
-constexpr std::size_t mostPlaces = 1'000;  // enough for a round that several threads share
+constexpr std::size_t mostPlaces = 300;  // enough for a round that several threads share
 constexpr std::size_t mostControls = 40;
 constexpr std::size_t longestPath = 100;       // moves; playing a longer one takes too long
 constexpr double longestWait = 24 * 3600.0;    // seconds; the flasher ticks twice a second
