@@ -14,10 +14,12 @@ using drivers::ViewKind;
 constexpr std::size_t mostSmallPairs = 200;
 
 LiftedScript lift(const std::string& script) {
-  return {naive::test::script(script), naive::test::window({{ViewKind::textField, 1},
-                                                            {ViewKind::button, 2},
-                                                            {ViewKind::button, 3},
-                                                            {ViewKind::toggle, 4}})};
+  return {naive::test::script(script),
+          naive::test::window({{ViewKind::textField, 1},
+                               {ViewKind::button, 2},
+                               {ViewKind::button, 3},
+                               {ViewKind::toggle, 4}}),
+          QZ_SOURCE_DIR "/examples/first-steps"};
 }
 
 /// Returns the source, or why there is none. What was lifted is the same for users.
@@ -46,6 +48,22 @@ steps:
   Hello: {heading: Hello, next: {press: Middle}}
   Middle: {heading: Middle, next: {press: Last}}
   Last: {heading: Last, next: {press: end}}
+)");
+}
+
+TEST(Lifting, GivesEachStepItsBackground) {
+  EXPECT_EQ(sourceOf(R"({
+    0 = ((SET_TEXT_FOR_OBJECT_ID, Begin, 1), (LOAD_BACKGROUND_WITH_IMAGE, disk));
+    2 = ((SET_TEXT_FOR_OBJECT_ID, Ready, 1), (LOAD_BACKGROUND_WITH_IMAGE, done), (SET_TAG_FOR_OBJECT_ID, 12, 2));
+    4 = ();
+    12 = (TERMINATE_PARSER);
+  })"),
+            R"(window: host.plist
+controls: {heading: 1, button: 2}
+back over: 0
+steps:
+  Begin: {heading: Begin, button: {press: Ready}, background: disk}
+  Ready: {heading: Ready, button: {press: end}, background: done}
 )");
 }
 
